@@ -1,0 +1,15 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+/// Everything a host needs, in one include.
+
+#include "brindle/Version.h"
+#include "brindle/chords/CChordLite.h"
+#include "brindle/theory/CHarmCenterLite.h"
+#include "brindle/theory/CKeyEnh.h"
+#include "brindle/theory/CScaleLite.h"
+#include "brindle/theory/CSemitones.h"
+#include "brindle/theory/CSignKeyLite.h"
+#include "brindle/theory/TEnh.h"
+#include "brindle/theory/TSignKeyType.h"
+#include "brindle/theory/Trace.h"

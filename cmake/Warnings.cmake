@@ -1,0 +1,10 @@
+# Warnings and sanitizers for our own targets only: hosts that add us as a sub-project keep theirs.
+add_library(brindle_warnings INTERFACE)
+target_compile_options(brindle_warnings INTERFACE
+    -Wall -Wextra -Wpedantic -Wshadow -Wconversion -Wsign-conversion -Wnon-virtual-dtor
+    $<$<BOOL:${BRINDLE_WERROR}>:-Werror>)
+
+if(BRINDLE_SANITIZE)
+    add_compile_options(-fsanitize=address,undefined -fno-sanitize-recover=all -fno-omit-frame-pointer)
+    add_link_options(-fsanitize=address,undefined)
+endif()

@@ -1,0 +1,85 @@
+// SPDX-License-Identifier: MIT
+#include "tests/support/Expected.h"
+#include "tests/support/Forms.h"
+
+#include "brindle/theory/Trace.h"
+
+#include <doctest/doctest.h>
+
+using namespace brindle;
+using namespace brindle::test;
+using nlohmann::json;
+
+namespace {
+
+CChordLite ChordOf(const json& in) {
+    return {KeyEnhOf(in.at(0)), KeyEnhOf(in.at(1)), SemitonesOf(in.at(2))};
+}
+
+std::string Substring(const CChordLite& chord) {
+    std::ostringstream stream;
+    chord.AppendJSONClassSubstring(stream);
+    return stream.str();
+}
+
+json NonChord(const CChordLite& chord) {
+    json form = FormOf(chord);
+    form["IsUndef"] = chord.IsUndef();
+    form["IsNoChordYield"] = chord.IsNoChordYield();
+    form["IsNoChordForce"] = chord.IsNoChordForce();
+    return form;
+}
+
+/// {"TEnh": n} or {"TSignKeyType": n}
+std::string Printed(const json& in) {
+    if (in.contains("TEnh")) return TraceString(EnhOf(in.at("TEnh")));
+    return TraceString(static_cast<TSignKeyType>(in.at("TSignKeyType").get<int>()));
+}
+
+}  // namespace
+
+TEST_CASE("Records print, order and read back as expected") {
+    test::CheckExpected(
+        "theory-records",
+        {
+            {"CKeyEnh::AppendJSONString",
+             [](const json& in) { return JSONStringOf(KeyEnhOf(in.at(0))); }},
+            {"CKeyEnh::JSONDeserializer_Helper::CKeyEnhFromJSONDictionary",
+             [](const json& in) {
+                 return test::FormOf(
+                     CKeyEnh::JSONDeserializer_Helper::CKeyEnhFromJSONDictionary(in.at(0)));
+             }},
+            {"CKeyEnh::operator<",
+             [](const json& in) { return KeyEnhOf(in.at(0)) < KeyEnhOf(in.at(1)); }},
+            {"CSemitones::AppendJSONString",
+             [](const json& in) { return JSONStringOf(SemitonesOf(in.at(0))); }},
+            {"CScaleLite::AppendJSONString",
+             [](const json& in) { return JSONStringOf(ScaleLiteOf(in.at(0))); }},
+            {"CScaleLite::operator<",
+             [](const json& in) { return ScaleLiteOf(in.at(0)) < ScaleLiteOf(in.at(1)); }},
+            {"CSignKeyLite::AppendJSONString",
+             [](const json& in) { return JSONStringOf(SignKeyLiteOf(in.at(0))); }},
+            {"CSignKeyLite::operator<",
+             [](const json& in) { return SignKeyLiteOf(in.at(0)) < SignKeyLiteOf(in.at(1)); }},
+            {"CChordLite::AppendJSONString",
+             [](const json& in) { return JSONStringOf(ChordOf(in)); }},
+            {"CChordLite::AppendJSONClassSubstring",
+             [](const json& in) { return Substring(ChordOf(in)); }},
+            {"CChordLite_Undef", [](const json&) { return NonChord(CChordLite_Undef); }},
+            {"CChordLite_NoChordYield",
+             [](const json&) { return NonChord(CChordLite_NoChordYield); }},
+            {"CChordLite_NoChordForce",
+             [](const json&) { return NonChord(CChordLite_NoChordForce); }},
+            {"EnhFromStdString",
+             [](const json& in) {
+                 return static_cast<int>(EnhFromStdString(in.at(0).get<std::string>()));
+             }},
+            {"EnhFromString",
+             [](const json& in) {
+                 return static_cast<int>(in.at(0).is_null()
+                                             ? EnhFromString(nullptr)
+                                             : EnhFromString(in.at(0).get<std::string>().c_str()));
+             }},
+            {"operator<<", [](const json& in) { return Printed(in.at(0)); }},
+        });
+}
