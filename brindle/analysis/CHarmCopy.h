@@ -1,0 +1,29 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/analysis/Positions.h"
+
+#include <cstdint>
+#include <iosfwd>
+#include <vector>
+
+namespace brindle {
+
+/// A passage that repeats an earlier one, chord for chord.
+struct CHarmCopy {
+    /// Where the copy starts, in beats.
+    double mTargetPos = kPosUndef;
+    /// From the copy back to its source, in bars: negative.
+    std::int32_t mSourceOffsetBars = 0;
+    std::uint64_t mLengthBars = 0;
+    /// Always 0.
+    std::uint64_t mChords = 0;
+
+    friend constexpr bool operator==(const CHarmCopy&, const CHarmCopy&) = default;
+};
+
+std::ostream& operator<<(std::ostream& stream, const CHarmCopy& copy);
+
+using CHarmCopies = std::vector<CHarmCopy>;
+
+}  // namespace brindle

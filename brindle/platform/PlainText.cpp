@@ -1,0 +1,47 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/platform/PlainText.h"
+
+#include <fmt/format.h>
+#include <iterator>
+#include <ostream>
+
+namespace brindle::PlainText {
+
+namespace {
+
+// Room for the longest number: 309 digits of the largest double, sign, point, two decimals.
+using TBuffer = fmt::basic_memory_buffer<char, 320>;
+
+void Write(std::ostream& stream, const TBuffer& buffer) {
+    PlainText::Write(stream, std::string_view(buffer.data(), buffer.size()));
+}
+
+}  // namespace
+
+void Write(std::ostream& stream, std::string_view text) {
+    stream.write(text.data(), static_cast<std::streamsize>(text.size()));
+}
+
+void WriteInteger(std::ostream& stream, std::int64_t value, int width) {
+    TBuffer buffer;
+    fmt::format_to(std::back_inserter(buffer), "{:{}}", value, width);
+    Write(stream, buffer);
+}
+
+void WriteUnsigned(std::ostream& stream, std::uint64_t value) {
+    TBuffer buffer;
+    fmt::format_to(std::back_inserter(buffer), "{}", value);
+    Write(stream, buffer);
+}
+
+void WriteFixed(std::ostream& stream, double value) {
+    TBuffer buffer;
+    fmt::format_to(std::back_inserter(buffer), "{:6.2f}", value);
+    Write(stream, buffer);
+}
+
+void EndLine(std::ostream& stream) {
+    stream.put('\n').flush();
+}
+
+}  // namespace brindle::PlainText

@@ -1,0 +1,21 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <cstdint>
+#include <iosfwd>
+#include <string_view>
+
+/// Output that looks the same whatever width, flags, precision and locale the stream was given, and
+/// that leaves all of these as they were.
+namespace brindle::PlainText {
+
+void Write(std::ostream& stream, std::string_view text);
+/// Decimal, right-aligned in at least `width` places.
+void WriteInteger(std::ostream& stream, std::int64_t value, int width = 0);
+void WriteUnsigned(std::ostream& stream, std::uint64_t value);
+/// Two digits after the point, right-aligned in at least 6 places: "  1.00".
+void WriteFixed(std::ostream& stream, double value);
+/// A line feed, and flushes the stream.
+void EndLine(std::ostream& stream);
+
+}  // namespace brindle::PlainText
