@@ -3,12 +3,21 @@
 
 #include "brindle/theory/CKeyEnh.h"
 #include "brindle/theory/CSemitones.h"
+#include "brindle/theory/TBasicChord.h"
 
 #include <cstdint>
 #include <iosfwd>
+#include <nlohmann/json_fwd.hpp>
+#include <string_view>
 #include <type_traits>
 
 namespace brindle {
+
+class CChordHeavy;
+struct CChordNamePrefs;
+class CSignKeyHeavy;
+struct CSignKeyLite;
+enum TQuantizeDirection : std::int32_t;
 
 /// The compact form of a chord: a spelled root, a spelled bass or none, and the semitones that
 /// sound above the root. No octaves, no heap data.
@@ -29,6 +38,27 @@ public:
     constexpr CChordLite() = default;
     constexpr CChordLite(CKeyEnh root, CKeyEnh bass, CSemitones semitones)
         : mRootKeyEnh(root), mBassKeyEnh(bass), mSemitones(semitones) {}
+    /// Reads a chord symbol such as `F#m7/C#`; a text without one gives the undefined root.
+    CChordLite(std::string_view symbol, const CChordNamePrefs& prefs);
+    /// A null pointer gives the undefined chord.
+    CChordLite(const char* symbol, const CChordNamePrefs& prefs);
+
+    /// Becomes the chord of a symbol; the whole record is written, directions included.
+    void SetFromString(std::string_view symbol, const CChordNamePrefs& prefs);
+
+    /// Reads what AppendJSONString wrote, or the older form with bare "RootKeyNr" and "BassKeyNr".
+    /// A key that is missing altogether reads as the unspelled key 0, missing semitones as none.
+    [[nodiscard]] static CChordLite FromDictionary(const nlohmann::json& dictionary);
+
+    /// The same chord with notes: root and bass in octave -1, the tones in the comping range.
+    [[nodiscard]] CChordHeavy ToChordHeavy(int wrapIntvl) const;
+    /// Takes root, bass and semitones of a chord with notes; the lowest note is a bass only in
+    /// octave -1. Semitones stay as they were when the root is undefined.
+    void SetFromChordHeavy(const CChordHeavy& chord);
+
+    /// All fields but the directions in 40 bits; equal codes are equal chords.
+    [[nodiscard]] std::int64_t GetChordHashCode() const;
+    void SetFromChordHashCode(std::int64_t code);
 
     /// True for all three non-chords.
     [[nodiscard]] constexpr bool IsUndef() const { return mRootKeyEnh.IsUndef(); }
@@ -40,9 +70,73 @@ public:
     void SetNoChordYield();
     void SetNoChordForce();
 
+    [[nodiscard]] constexpr bool HasBassNote() const { return !mBassKeyEnh.IsUndef(); }
+    /// Root and bass are there and differ, if only in spelling.
+    [[nodiscard]] bool IsSlashChord() const;
+
+    // The ways to measure from root to bass. All give `kIntvlUndef` when one of them is missing.
+
+    /// Bass minus root, not reduced: -11 to 11.
+    [[nodiscard]] int KeyIntvlFromRootToBass() const;
+    /// The same reduced to 0 to 11.
+    [[nodiscard]] int AbsKeyIntvlFromRootToBass() const;
+    /// The nearer way, -6 to 5; a tritone is -6.
+    [[nodiscard]] int SmallestKeyIntvlBetweenRootAndBass() const;
+    /// Semitones on the shorter way round, 0 to 6.
+    [[nodiscard]] int KeyDistanceBetweenRootAndBass() const;
+
+    /// No chord tone doubles the bass. A bass key below the root key counts as alone, whatever the
+    /// semitones, and so does no bass.
+    [[nodiscard]] bool BassKeyEnhHasIntvlAlone() const;
+    [[nodiscard]] bool BassKeyEnhHasThisIntvlAlone(int intvl) const;
+    /// Whether a tone of the semitones has this interval, 0 to 11.
+    [[nodiscard]] bool HasIntvlButNotInBassKeyEnhAlone(int intvl) const;
+
+    /// The skeleton of the semitones: its third decides, the fifth only chooses within that.
+    [[nodiscard]] TBasicChord BasicChord() const;
+    /// The same, but a half-diminished seventh chord is named as a minor chord with a flat five.
+    [[nodiscard]] TBasicChord BasicChordForNaming() const;
+    [[nodiscard]] CSemitones BasicChordSemitones() const;
+    /// What the chord has beyond its skeleton.
+    [[nodiscard]] CSemitones OptionsSemitones() const;
+    [[nodiscard]] bool HasBasicChordIntvl(int intvl) const;
+    [[nodiscard]] bool HasOptionsIntvl(int intvl) const;
+
+    /// Semitones above the root; 15 if either key is undefined.
+    [[nodiscard]] int ChordKeyNrFromKeyNr(int keyNr) const;
+    [[nodiscard]] int KeyNrFromChordKeyNr(int chordKeyNr) const;
+
+    /// Scale step of the root (the bass) in a key, counted from 0, whatever the spelling; -1 if it
+    /// is not in the key.
+    [[nodiscard]] int RootNoteDegreeNrInSignKey(const CSignKeyHeavy& signKey) const;
+    [[nodiscard]] int BassNoteDegreeNrInSignKey(const CSignKeyHeavy& signKey) const;
+
+    /// Whether the chord belongs to a key. Major and augmented triads and dominant sevenths pass
+    /// on the root alone: A7 belongs to C major.
+    [[nodiscard]] bool IsInSignKeyRegardlessOfEnh(const CSignKeyHeavy& signKey) const;
+    [[nodiscard]] bool IsInSignKeyRegardlessOfEnh(const CSignKeyLite& signKey) const;
+
+    /// The note moved to the chord tone that `direction` asks for, within the octave that begins
+    /// at the chord's root. An undefined chord leaves the note as it is.
+    [[nodiscard]] std::int64_t QuantizeToChord(std::int64_t noteNr,
+                                               TQuantizeDirection direction) const;
+    [[nodiscard]] std::int64_t QuantizeToBasicChord(std::int64_t noteNr,
+                                                    TQuantizeDirection direction) const;
+    [[nodiscard]] std::int64_t _QuantizeToSemitones(std::int64_t noteNr,
+                                                    TQuantizeDirection direction,
+                                                    const CSemitones& semitones) const;
+
     /// Writes root, bass and semitones as JSON members without braces.
     void AppendJSONClassSubstring(std::ostream& stream) const;
     void AppendJSONString(std::ostream& stream) const;
+
+    /// Same semitones.
+    [[nodiscard]] bool EqualExceptRootAndBass(const CChordLite& other) const;
+    /// Same sound: key numbers and semitones.
+    [[nodiscard]] bool EqualWithoutEnh(const CChordLite& other) const;
+    /// What operator== compares.
+    [[nodiscard]] bool EqualWithoutDir(const CChordLite& other) const;
+    [[nodiscard]] bool EqualIncludingDir(const CChordLite& other) const;
 
     friend constexpr bool operator==(const CChordLite& a, const CChordLite& b) {
         return a.mRootKeyEnh == b.mRootKeyEnh && a.mBassKeyEnh == b.mBassKeyEnh &&
@@ -57,6 +151,9 @@ public:
 };
 
 static_assert(std::is_trivially_copyable_v<CChordLite>);
+
+/// Reads a chord symbol into `chord`, which is reset first.
+void SetFromString(std::string_view symbol, CChordLite& chord, const CChordNamePrefs& prefs);
 
 inline constexpr CChordLite CChordLite_Undef{};
 inline constexpr CChordLite CChordLite_NoChordYield{{kKeyNrUndef, TEnh{0}}, CKeyEnh_Undef, {}};

@@ -1,0 +1,273 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/theory/CIntvlSet.h"
+#include "brindle/theory/CKeyEnh.h"
+#include "brindle/theory/CMySet.h"
+#include "brindle/theory/CNote.h"
+#include "brindle/theory/CSemitones.h"
+#include "brindle/theory/TBasicChord.h"
+
+#include <array>
+#include <concepts>
+#include <cstddef>
+#include <cstdint>
+#include <iosfwd>
+#include <span>
+#include <string>
+#include <string_view>
+
+namespace brindle {
+
+struct CChordNamePrefs;
+class CSignKeyHeavy;
+
+/// The full form of a chord: a root note, the sounding notes with octaves and spellings, and the
+/// intervals of the notes above the root.
+///
+/// The lowest note is the bass. Octave -1 (note numbers 0 to 11) holds the bass of a chord that
+/// was made from keys or intervals: the root itself, or the key behind the slash.
+///
+/// The intervals are worked out when they are first read, also by const functions: one chord is
+/// not to be read from two threads at once.
+class CChordHeavy {
+public:
+    using TBasicChord = brindle::TBasicChord;
+    using enum brindle::TBasicChord;
+
+    static constexpr int DefaultWrapIntvl = 24;
+
+    /// An empty chord with an undefined root. `wrapIntvl` is the span in semitones, 24 or 12 as a
+    /// rule, within which the intervals are counted; 0 counts them as they stand.
+    explicit CChordHeavy(int wrapIntvl = DefaultWrapIntvl);
+
+    /// Exactly these notes, in their octaves. An undefined root follows the lowest note.
+    CChordHeavy(const CNote& root, CMySet<CNote> notes, int wrapIntvl = DefaultWrapIntvl);
+    CChordHeavy(const CNote& root, const CMySet<unsigned char>& noteNrs,
+                int wrapIntvl = DefaultWrapIntvl);
+
+    // From tones above a root: they go to the comping range and keep their interval exactly, while
+    // the bass, or else the root, stands in octave -1. An undefined bass is no bass.
+
+    CChordHeavy(const CNote& root, const CSemitones& semitones, const CNote& bass);
+    CChordHeavy(const CNote& root, const CIntvlSet& intvls, const CNote& bass);
+    CChordHeavy(const CNote& root, TBasicChord basicChord, int wrapIntvl = DefaultWrapIntvl);
+    CChordHeavy(CKeyEnh root, const CSemitones& semitones, CKeyEnh bass,
+                int wrapIntvl = DefaultWrapIntvl);
+    CChordHeavy(CKeyEnh root, const CIntvlSet& intvls, CKeyEnh bass,
+                int wrapIntvl = DefaultWrapIntvl);
+    CChordHeavy(CKeyEnh root, TBasicChord basicChord, CKeyEnh bass);
+    CChordHeavy(int rootKeyNr, TBasicChord basicChord, int wrapIntvl = DefaultWrapIntvl);
+
+    /// From a chord symbol such as `F#m7/C#`.
+    CChordHeavy(std::string_view symbol, const CChordNamePrefs& prefs);
+
+    // Root
+
+    [[nodiscard]] const CNote& RootNote() const { return mRootNote; }
+    [[nodiscard]] CKeyEnh RootKeyEnh() const;
+    /// False while the root follows the lowest note.
+    [[nodiscard]] bool RootNoteSpecified() const { return mRootNoteSpecified; }
+
+    /// Sets the root as it stands. If it is defined, it also becomes the only note of octave -1,
+    /// so that a former bass is lost.
+    void SetRootNote(const CNote& root);
+    /// Sets the root and nothing else.
+    void SetRootNoteWithoutSpecify(const CNote& root);
+    /// Moves the root into the comping range, empties octave -1 and adds the moved root as a note.
+    void SetRootNoteInCompingRange(const CNote& root);
+    /// SetRootNote of the key in octave -1, with its usual spelling.
+    void SetRootKeyNr(int keyNr);
+    void SetRootKeyEnh(CKeyEnh root);
+    void SetRootNoteToIntvlIx(std::size_t ix);
+    /// Respells root and bass so that the scale of the chord needs the fewest signs; the present
+    /// spelling wins a tie, then the one to the flat side.
+    void SetRootNoteEnhWithLeastSigns();
+
+    // Notes
+
+    /// In ascending order.
+    [[nodiscard]] const CMySet<CNote>& Notes() const { return mNotes; }
+    /// The note at an index of that order; undefined behind the end.
+    [[nodiscard]] CNote Note(std::size_t ix) const;
+    /// Undefined for a chord without notes, like HighestNote.
+    [[nodiscard]] CNote LowestNote() const;
+    [[nodiscard]] CNote HighestNote() const;
+    [[nodiscard]] bool HasNote(const CNote& note) const;
+    [[nodiscard]] bool HasNoteNr(std::int64_t noteNr) const;
+    [[nodiscard]] bool HasKeyNr(int keyNr) const;
+    /// Whether all listed keys sound. A list ends at the first value outside 0 to 127.
+    [[nodiscard]] bool HasKeyNrs(std::span<const int> keyNrs) const;
+    template <std::same_as<int>... Rest>
+    [[nodiscard]] bool HasKeyNrs(int first, Rest... rest) const {
+        return HasKeyNrs(std::to_array({first, rest...}));
+    }
+    /// Whether the listed keys sound and no other key does.
+    [[nodiscard]] bool HasExactTheseKeyNrs(std::span<const int> keyNrs) const;
+    template <std::same_as<int>... Rest>
+    [[nodiscard]] bool HasExactTheseKeyNrs(int first, Rest... rest) const {
+        return HasExactTheseKeyNrs(std::to_array({first, rest...}));
+    }
+    /// The keys of the defined notes, the bass among them.
+    [[nodiscard]] CMySet<int> KeyNrSet() const;
+    [[nodiscard]] int CountNotesInOctave(int octave) const;
+    /// All notes lie within an octave.
+    [[nodiscard]] bool IsNarrowChord() const;
+
+    /// These three replace the notes. A root that was not specified follows the lowest note.
+    void SetFromNoteSet(CMySet<CNote> notes);
+    void SetFromNoteNrSet(const CMySet<unsigned char>& noteNrs);
+    /// The keys go to the comping range.
+    void SetFromKeyNrSet(const CMySet<int>& keyNrs);
+    /// These replace the notes by the tones above the root, with the root in octave -1.
+    void SetSemitones(const CSemitones& semitones);
+    void SetBasicChord(TBasicChord basicChord);
+    void SetRootKeyNrAndBasicChord(int rootKeyNr, TBasicChord basicChord);
+
+    void AddNote(const CNote& note);
+    void DelNote(const CNote& note);
+    /// Deletes the note at an index of the ascending order.
+    void DelNote(std::size_t ix);
+    void DeleteAllNotesInOctave(int octave);
+    void ClearAllExceptRoot();
+
+    // The tone at an interval above the root, added unless a note of its number is there already.
+    // An undefined root or interval adds the undefined note.
+
+    /// In the octave above the root, or the nearest one on the keyboard.
+    void AddIntvl(int intvl);
+    void AddIntvlSetAboveRootNote(const CIntvlSet& intvls);
+    /// In the comping range; an interval beyond the octave is folded into it.
+    void AddIntvlInCompingRange(int intvl);
+    void AddIntvlSetInCompingRange(const CIntvlSet& intvls);
+    /// In the span of the wrap interval above the lowest note of the comping range, so that the
+    /// interval stays what it is.
+    void AddIntvlInCompingPlusWrapIntvlRange(int intvl);
+
+    void SetUndef();
+    void SetNoChordYield();
+    void SetNoChordForce();
+
+    /// Moves root and notes, limited to 0 to 127.
+    void Transpose(int intvl);
+    /// Lays the lowest note above the highest one. The root stays.
+    void Invert();
+    /// Moves the notes at the intervals `lo` to `hi` above the root by their distance to interval
+    /// `target`. Kept: where that distance is above 5 they move down instead of up.
+    void ChangeAllNotesWithinIntvlRange(int lo, int hi, int target);
+
+    // Bass
+
+    /// Key and spelling of the lowest note.
+    [[nodiscard]] CKeyEnh BassKeyEnh() const;
+    /// Root and lowest note are defined and are different keys.
+    [[nodiscard]] bool IsSlashChord() const;
+    /// No other note has the interval that the lowest note has above the root.
+    [[nodiscard]] bool BassNoteHasIntvlAlone() const;
+    [[nodiscard]] bool BassNoteHasThisIntvlAlone(int intvl) const;
+
+    /// Makes the key the only note of octave -1; the undefined key empties that octave.
+    void SetBassKeyEnh(const CKeyEnh& bass);
+    void RemoveBassNote();
+    void SetBassNoteInOctave(int keyNr, int octave, TEnh enh);
+    /// The same after deleting every note of that key.
+    void SetBassNoteAloneInOctave(int keyNr, int octave, TEnh enh);
+    /// Adds the note in octave -1; a note that stood there as the lowest goes to the comping range.
+    void AddBassNoteKeepingFormer(const CNote& note);
+    void SetBassNoteDeletingFormer(const CNote& note);
+
+    // Intervals
+
+    /// The interval of each note above the root, reduced by the wrap interval.
+    [[nodiscard]] const CIntvlSet& IntvlSet() const;
+    [[nodiscard]] int WrapIntvl() const;
+    void IntvlSet_SetWrapIntvl(int wrapIntvl);
+    /// The intervals and the answer about the bass are older than the notes.
+    [[nodiscard]] bool IntvlSetAndBassNoteHasIntvlAloneNeedsUpdate() const {
+        return mIntvlSetNeedsUpdate;
+    }
+    void UpdateIntvlSetAndBassNoteHasIntvlAlone() const;
+
+    /// The interval set folded into one octave.
+    [[nodiscard]] CSemitones Semitones() const;
+    /// The interval at an index of the ascending order; `kIntvlUndef` behind the end.
+    [[nodiscard]] int Intvl(std::size_t ix) const;
+    /// Exactly this interval.
+    [[nodiscard]] bool HasIntvl(int intvl) const;
+    [[nodiscard]] bool HasIntvlInAnyOctave(int intvl) const;
+    [[nodiscard]] bool HasIntvlInAnyOctaveButNotInBassNoteAlone(int intvl) const;
+    [[nodiscard]] bool HasIntvlInAnyOctaveOrRootButNotInBassNoteAlone(int intvl) const;
+    /// Has an interval that is neither in a triad nor `intvl`.
+    [[nodiscard]] bool HasOtherStackedThirdsOptionThan(int intvl) const;
+    /// The lowest note that has the interval of this index; undefined behind the end.
+    [[nodiscard]] CNote IntvlIxToNote(int ix) const;
+    [[nodiscard]] int IntvlIxToKeyNr(int ix) const;
+    [[nodiscard]] std::string IntvlIxToKeyName(int ix) const;
+
+    /// The skeleton that is heard; a bass on a tone of its own is not part of it. A half-diminished
+    /// chord is Minor here.
+    [[nodiscard]] TBasicChord BasicChord() const;
+    [[nodiscard]] CSemitones BasicChordSemitones() const;
+    /// Index in the XG chord table, 0 to 34.
+    [[nodiscard]] int XGChordIx() const;
+
+    // Relation to keys and notes
+
+    /// Signs of the scale that belongs to the chord, flats and sharps alike.
+    [[nodiscard]] int SignsCountAbs() const;
+    /// All intervals are in the key; on the fifth degree of a minor key the chord needs a major
+    /// third instead.
+    [[nodiscard]] bool IsInSignKeyRegardlessOfEnh(const CSignKeyHeavy& signKey) const;
+    [[nodiscard]] int CountIntvlsInSignKey(const CSignKeyHeavy& signKey) const;
+    [[nodiscard]] int CountIntvlsNotInSignKey(const CSignKeyHeavy& signKey) const;
+    [[nodiscard]] int CountNotesNotInSignKey(const CSignKeyHeavy& signKey) const;
+    /// Intervals in the key less those outside, and 0 to 2 more for a chord at home on that degree.
+    [[nodiscard]] int ClosenessToSignKey(const CSignKeyHeavy& signKey) const;
+
+    /// See CChordLite.
+    [[nodiscard]] std::int64_t QuantizeToChord(std::int64_t noteNr,
+                                               TQuantizeDirection direction) const;
+    [[nodiscard]] std::int64_t QuantizeToBasicChord(std::int64_t noteNr,
+                                                    TQuantizeDirection direction) const;
+    [[nodiscard]] int ChordKeyNrFromKeyNr(int keyNr) const;
+    [[nodiscard]] int KeyNrFromChordKeyNr(int chordKeyNr) const;
+
+    /// Same root, notes and intervals.
+    [[nodiscard]] bool IsExactlyTheSame(const CChordHeavy& other) const;
+    /// Same keys.
+    [[nodiscard]] bool IsHarmonicallyTheSame(const CChordHeavy& other) const;
+
+    /// Writes `{"root":...,"basic":1,"notes":[...]}` without blanks.
+    void AppendJSONString(std::ostream& stream) const;
+
+private:
+    void _AddTonesAndBass(const CIntvlSet& intvls, const CKeyEnh& bass);
+    void _AddNoteNrAndIntvlIfNotAlreadyContained(std::int64_t noteNr);
+    void _SetNotesAndFollow(CMySet<CNote> notes);
+    void _FollowLowestNote();
+    void _NotesChanged();
+    [[nodiscard]] int _IntvlOfNote(const CNote& note) const;
+    [[nodiscard]] int _BassIntvl() const;
+
+    CNote mRootNote;
+    CMySet<CNote> mNotes;
+    mutable CIntvlSet mIntvlSet;
+    bool mRootNoteSpecified = false;
+    mutable bool mIntvlSetNeedsUpdate = false;
+    mutable bool mBassNoteHasIntvlAlone = true;
+};
+
+/// IsExactlyTheSame.
+[[nodiscard]] bool operator==(const CChordHeavy& a, const CChordHeavy& b);
+
+std::ostream& operator<<(std::ostream& stream, const CChordHeavy& chord);
+
+/// Reads a chord symbol into `chord`, which keeps its wrap interval.
+void SetFromString(std::string_view symbol, CChordHeavy& chord, const CChordNamePrefs& prefs);
+
+/// The three chords that are none: without notes, told apart by the spelling of the root.
+[[nodiscard]] const CChordHeavy& CChordHeavy_Undef();
+[[nodiscard]] const CChordHeavy& CChordHeavy_NoChordYield();
+[[nodiscard]] const CChordHeavy& CChordHeavy_NoChordForce();
+
+}  // namespace brindle
