@@ -6,9 +6,12 @@
 #include "brindle/theory/CSemitones.h"
 
 #include <iosfwd>
+#include <string>
 #include <tuple>
 
 namespace brindle {
+
+struct CSignKeyLite;
 
 /// A tonal center that holds for a passage: a root and a modal mask.
 struct CHarmCenterLite {
@@ -20,10 +23,23 @@ struct CHarmCenterLite {
         : mRootKeyEnh(root), mSemitones(semitones) {}
     constexpr explicit CHarmCenterLite(const CScaleLite& scale)
         : CHarmCenterLite(scale.mRootKeyEnh, scale.mSemitones) {}
+    /// The tonic of a sign key, 2741 or 1453 above its root; undefined for an undefined type.
+    explicit CHarmCenterLite(const CSignKeyLite& signKey);
 
     [[nodiscard]] constexpr bool IsUndef() const { return mRootKeyEnh.IsUndef(); }
     /// The same root and mask as a scale.
     [[nodiscard]] constexpr CScaleLite ToScaleLite() const { return {mRootKeyEnh, mSemitones}; }
+
+    /// The key counted from the root, 0 to 11; 15 when either is undefined.
+    [[nodiscard]] int KeyNrToHarmCenterKeyNr(int keyNr) const;
+    /// The key that stands `harmCenterKeyNr` semitones above the root; 15 when either is undefined.
+    [[nodiscard]] int HarmCenterKeyNrToKeyNr(int harmCenterKeyNr) const;
+
+    /// The name of the root, with "m" behind it for natural minor only; "Undef".
+    [[nodiscard]] std::string NameShort(const CChordNamePrefs& prefs) const;
+    /// The name of the root and of the mode, as in "D Dorian". A mask that is no mode prints the
+    /// root alone; "Undef".
+    [[nodiscard]] std::string NameLong(const CChordNamePrefs& prefs) const;
 
     friend constexpr bool operator==(const CHarmCenterLite&, const CHarmCenterLite&) = default;
     friend constexpr bool operator<(const CHarmCenterLite& a, const CHarmCenterLite& b) {

@@ -1,0 +1,84 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/theory/CKeyEnh.h"
+#include "brindle/theory/CSemitones.h"
+#include "brindle/theory/TSignKeyType.h"
+
+#include <iosfwd>
+#include <nlohmann/json_fwd.hpp>
+#include <string>
+#include <string_view>
+#include <type_traits>
+
+namespace brindle {
+
+class CSignKeyHeavy;
+struct CChordNamePrefs;
+struct CHarmCenterLite;
+struct CScaleLite;
+struct CSignKeyLite;
+
+/// A major or minor key whose root has no spelling. Where a spelling is needed, the root is
+/// spelled as the root of a major scale with few signs, also in minor: key 1 minor is D flat minor.
+struct CSignKeyNoEnh {
+    int mRootKeyNr = kKeyNrUndef;
+    TSignKeyType mSignKeyType = TSignKeyType_Undef;
+
+    constexpr CSignKeyNoEnh() = default;
+    constexpr CSignKeyNoEnh(int rootKeyNr, TSignKeyType type)
+        : mRootKeyNr(rootKeyNr), mSignKeyType(type) {}
+    explicit CSignKeyNoEnh(const CSignKeyHeavy& signKey);
+    /// The sign key that a text such as "F# minor" names, read with CurrentChordNamePrefs.
+    explicit CSignKeyNoEnh(std::string_view text);
+    explicit CSignKeyNoEnh(const char* text);
+
+    /// True when the root or the type is undefined.
+    [[nodiscard]] constexpr bool IsUndef() const {
+        return mRootKeyNr == kKeyNrUndef || mSignKeyType == TSignKeyType_Undef;
+    }
+
+    /// The spelled form.
+    [[nodiscard]] CSignKeyLite SignKey() const;
+    /// The scale of the spelled form.
+    [[nodiscard]] CScaleLite Scale() const;
+    [[nodiscard]] constexpr CSemitones Semitones() const {
+        return SemitonesFromSignKeyType(mSignKeyType);
+    }
+    /// The full form of the spelled form.
+    [[nodiscard]] CSignKeyHeavy ToSignKeyHeavy() const;
+    [[nodiscard]] CHarmCenterLite ToHarmCenter() const;
+
+    /// Distances and keys as in CSignKeyLite.
+    [[nodiscard]] int DistToSignKeyRoot(int keyNr) const;
+    [[nodiscard]] int KeyNrToSignKeyKeyNr(int keyNr) const;
+    [[nodiscard]] int SignKeyKeyNrToKeyNr(int signKeyKeyNr) const;
+
+    /// Sharps of the spelled form, flats as a negative number.
+    [[nodiscard]] int SignsCount() const;
+    [[nodiscard]] int SignsCountAbs() const;
+
+    /// The key with the same signature in the other type: A minor for C major, and back.
+    [[nodiscard]] CSignKeyNoEnh ParallelSignKey() const;
+    /// The major key with the same signature.
+    [[nodiscard]] CSignKeyNoEnh IonicSignKey() const;
+
+    /// Names of the spelled form.
+    [[nodiscard]] std::string NameShort(const CChordNamePrefs& prefs) const;
+    [[nodiscard]] std::string NameLong(const CChordNamePrefs& prefs) const;
+
+    /// Writes `{"RootKeyNr":3,"Type":"major"}`.
+    void AppendJSONString(std::ostream& stream) const;
+    /// Reads what AppendJSONString wrote. A missing or unreadable root or type is undefined.
+    [[nodiscard]] static CSignKeyNoEnh FromJSONDict(const nlohmann::json& dictionary);
+
+    friend constexpr bool operator==(const CSignKeyNoEnh&, const CSignKeyNoEnh&) = default;
+};
+
+static_assert(std::is_trivially_copyable_v<CSignKeyNoEnh>);
+
+std::ostream& operator<<(std::ostream& stream, const CSignKeyNoEnh& signKey);
+
+inline constexpr CSignKeyNoEnh CSignKeyNoEnh_Undef{};
+
+}  // namespace brindle
