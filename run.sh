@@ -1,7 +1,6 @@
 #!/usr/bin/env bash
 # Sets up what is missing, builds, and runs the program with the given arguments.
 set -euo pipefail
-cd_root=$(cd "$(dirname "${BASH_SOURCE[0]}")" && pwd)
-source "$cd_root/cmake/setup.sh"
-build_release brindle_cli
-exec "$cd_root/build/release/bin/brindle" "$@"
+source "$(dirname "$(readlink -f "${BASH_SOURCE[0]}")")/cmake/setup.sh"
+build release brindle_cli
+exec "$root/build/release/bin/brindle" "$@"

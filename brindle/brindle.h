@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-/// Everything a host needs, in one include.
+/// Everything a host needs, in one include. Made by tools/make_umbrella.sh.
 
 #include "brindle/Version.h"
 #include "brindle/chords/CChordLite.h"
@@ -10,6 +10,8 @@
 #include "brindle/theory/CScaleLite.h"
 #include "brindle/theory/CSemitones.h"
 #include "brindle/theory/CSignKeyLite.h"
+#include "brindle/theory/TBasicChord.h"
 #include "brindle/theory/TEnh.h"
+#include "brindle/theory/TScaleType.h"
 #include "brindle/theory/TSignKeyType.h"
 #include "brindle/theory/Trace.h"

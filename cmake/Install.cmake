@@ -1,0 +1,44 @@
+# The installed package: headers under include/brindle, the library, a CMake package `Brindle` and a
+# pkg-config file `brindle`.
+include(CMakePackageConfigHelpers)
+
+set(package_dir ${CMAKE_INSTALL_LIBDIR}/cmake/Brindle)
+
+install(TARGETS brindle EXPORT BrindleTargets)
+install(DIRECTORY ${PROJECT_SOURCE_DIR}/brindle DESTINATION ${CMAKE_INSTALL_INCLUDEDIR}
+        FILES_MATCHING PATTERN "*.h")
+install(EXPORT BrindleTargets NAMESPACE brindle:: DESTINATION ${package_dir})
+
+configure_package_config_file(${CMAKE_CURRENT_LIST_DIR}/BrindleConfig.cmake.in
+    ${PROJECT_BINARY_DIR}/BrindleConfig.cmake INSTALL_DESTINATION ${package_dir})
+write_basic_package_version_file(${PROJECT_BINARY_DIR}/BrindleConfigVersion.cmake
+    COMPATIBILITY SameMinorVersion)
+install(FILES ${PROJECT_BINARY_DIR}/BrindleConfig.cmake
+              ${PROJECT_BINARY_DIR}/BrindleConfigVersion.cmake
+        DESTINATION ${package_dir})
+
+# A static library leaves its own libraries to the host's link line, a shared one brings them.
+get_target_property(library_type brindle TYPE)
+set(pc_requires "")
+set(pc_requires_private "")
+if(library_type STREQUAL SHARED_LIBRARY)
+    string(JOIN ", " pc_requires_private ${brindle_pc_libraries})
+else()
+    string(JOIN ", " pc_requires ${brindle_pc_libraries})
+endif()
+cmake_path(IS_ABSOLUTE CMAKE_INSTALL_INCLUDEDIR includedir_is_absolute)
+cmake_path(IS_ABSOLUTE CMAKE_INSTALL_LIBDIR libdir_is_absolute)
+if(includedir_is_absolute OR libdir_is_absolute)
+    set(pc_prefix ${CMAKE_INSTALL_PREFIX})
+    set(pc_includedir ${CMAKE_INSTALL_FULL_INCLUDEDIR})
+    set(pc_libdir ${CMAKE_INSTALL_FULL_LIBDIR})
+else()
+    # Relative to the file itself, so that the installed folder can be moved.
+    file(RELATIVE_PATH up /prefix/${CMAKE_INSTALL_LIBDIR}/pkgconfig /prefix)
+    string(REGEX REPLACE "/$" "" up ${up})
+    set(pc_prefix "\${pcfiledir}/${up}")
+    set(pc_includedir "\${prefix}/${CMAKE_INSTALL_INCLUDEDIR}")
+    set(pc_libdir "\${prefix}/${CMAKE_INSTALL_LIBDIR}")
+endif()
+configure_file(${CMAKE_CURRENT_LIST_DIR}/brindle.pc.in ${PROJECT_BINARY_DIR}/brindle.pc @ONLY)
+install(FILES ${PROJECT_BINARY_DIR}/brindle.pc DESTINATION ${CMAKE_INSTALL_LIBDIR}/pkgconfig)

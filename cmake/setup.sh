@@ -1,48 +1,96 @@
-# Shared by run.sh and test.sh: installs the missing packages and builds the release preset.
-# Everything it says goes to standard error, so that the program's output stays clean.
+# Shared by run.sh, test.sh and .ci/run: installs the packages that are missing and builds. All that
+# it says goes to standard error, so that the program's own output stays clean.
 
-packages=(g++ cmake ninja-build libboost-dev libfmt-dev nlohmann-json3-dev libcli11-dev
-          libxml2-dev libzip-dev libplist-dev doctest-dev libbenchmark-dev gettext clang-format)
+root=$(cd "$(dirname "$(readlink -f "${BASH_SOURCE[0]}")")/.." && pwd)
+
+# Debian's names of what the library, the program, the tests and the benches are built with.
+build_packages=(g++ cmake ninja-build pkg-config libboost-dev libfmt-dev nlohmann-json3-dev
+                libcli11-dev libxml2-dev libzip-dev libplist-dev gettext doctest-dev libbenchmark-dev)
 
 say() { printf 'brindle: %s\n' "$*" >&2; }
 
+# Those of the named packages that are not installed.
 missing_packages() {
-    local package
-    for package in "${packages[@]}"; do
-        [ "$(dpkg-query -W -f='${db:Status-Status}' "$package" 2>/dev/null)" = installed ] || echo "$package"
+    local installed package
+    installed=$'\n'$(dpkg-query -W -f='${Package} ${db:Status-Status}\n' "$@" 2>/dev/null || true)$'\n'
+    for package in "$@"; do
+        [[ $installed == *$'\n'"$package installed"$'\n'* ]] || printf '%s ' "$package"
     done
 }
 
-install_missing() {
-    local missing sudo=()
-    missing=$(missing_packages | tr '\n' ' ')
+# need_packages NAME...: installs what is missing of them.
+need_packages() {
+    # Without Debian's package manager the configuration tells what it does not find.
+    command -v dpkg-query >/dev/null || return 0
+    local missing as_root=() log="$root/build/packages.log"
+    missing=$(missing_packages "$@")
     [ -n "$missing" ] || return 0
-    [ "$(id -u)" -eq 0 ] || sudo=(sudo)
-    say "installing $missing(log: build/setup.log)"
-    if ! { "${sudo[@]}" apt-get update && DEBIAN_FRONTEND=noninteractive \
-           "${sudo[@]}" apt-get install -y --no-install-recommends $missing; } \
-           >"$cd_root/build/setup.log" 2>&1 </dev/null; then
-        say "could not install them; these packages are needed: $missing"
-        exit 1
+    missing=${missing% }
+    [ "$(id -u)" -eq 0 ] || as_root=(sudo)
+    mkdir -p "$root/build"
+    if [ "$(id -u)" -ne 0 ] && ! command -v sudo >/dev/null; then
+        echo "neither root nor sudo" >"$log"
+    else
+        say "installing $missing (log: build/packages.log)"
+        # A stale or broken source elsewhere need not keep these packages from being found.
+        { "${as_root[@]}" apt-get update || true
+          "${as_root[@]}" env DEBIAN_FRONTEND=noninteractive apt-get -o DPkg::Lock::Timeout=120 \
+              install -y --no-install-recommends $missing || true; } >"$log" 2>&1 </dev/null
+        missing=$(missing_packages "$@")
+        [ -n "$missing" ] || return 0
+        grep -E '^(E:|sudo:)' "$log" | head -3 >&2 || true
     fi
+    say "these packages are needed and could not be installed: ${missing% }"
+    say "as root: apt-get install ${missing% }"
+    exit 1
 }
 
-# build_release TARGET: configures once, then builds; quick when there is nothing to do.
-build_release() {
-    local build="$cd_root/build/release" log="$cd_root/build/build.log"
-    mkdir -p "$cd_root/build"
-    if [ ! -f "$build/build.ninja" ]; then
-        install_missing
-        say "building (log: build/build.log)"
-        if ! (cd "$cd_root" && cmake --preset release) >"$log" 2>&1; then
-            tail -20 "$log" >&2
-            say "the configuration failed"
-            exit 1
+# Copies the build's lines to the log; says on the terminal how far it is, elsewhere only once that
+# there is something to build.
+show_progress() {
+    local line said=
+    while IFS= read -r line; do
+        printf '%s\n' "$line"
+        [[ $line =~ ^\[([0-9]+)/([0-9]+)\]\ (Building|Linking) ]] || continue
+        if [ -t 2 ]; then
+            printf '\rbrindle: building, step %d of %d ' "${BASH_REMATCH[1]}" "${BASH_REMATCH[2]}" >&2
+        elif [ -z "$said" ]; then
+            say "building (log: build/build.log)"
         fi
-    fi
-    if ! cmake --build "$build" --target "$1" >"$log" 2>&1; then
-        tail -40 "$log" >&2
-        say "the build failed"
-        exit 1
-    fi
+        said=yes
+    done
+    if [ -n "$said" ] && [ -t 2 ]; then printf '\r\033[K' >&2; fi
 }
+
+# fail_with_log LOG MESSAGE: the first error of the log in a few lines.
+fail_with_log() {
+    { grep -E -m1 -A11 '^FAILED|error:|^CMake Error' "$1" || tail -12 "$1"; } | cut -c1-200 >&2
+    say "$2 (log: ${1#"$root"/})"
+    exit 1
+}
+
+# configure PRESET [OPTION...]: once; again when the last time did not come to its end, was for other
+# options, or was for a folder of another name.
+configure() {
+    local preset=$1 build="$root/build/$1" log="$root/build/configure.log" wanted
+    wanted="$root $*"
+    [ "$(cat "$build/configured" 2>/dev/null || true)" != "$wanted" ] || return 0
+    rm -f "$build/configured"
+    say "configuring the $preset build"
+    (cd "$root" && cmake --fresh --preset "$preset" "${@:2}") >"$log" 2>&1 </dev/null ||
+        fail_with_log "$log" "the configuration failed"
+    printf '%s' "$wanted" >"$build/configured"
+}
+
+# build PRESET TARGET [OPTION...]: a configured and built target, on all cores.
+build() (
+    mkdir -p "$root/build"
+    if command -v flock >/dev/null; then
+        exec 9>"$root/build/lock"
+        flock -n 9 || { say "waiting for another build"; flock 9; }
+    fi
+    need_packages "${build_packages[@]}"
+    configure "$1" "${@:3}"
+    cmake --build "$root/build/$1" --target "$2" 2>&1 </dev/null | show_progress \
+        >"$root/build/build.log" || fail_with_log "$root/build/build.log" "the build failed"
+)

@@ -1,0 +1,29 @@
+#!/usr/bin/env bash
+# consume.sh SOURCE BUILD WAY: builds examples/host as a stranger would, outside of this build, and
+# compares what it prints. WAY is find_package or pkg_config, both with the package installed from
+# BUILD into a folder and then moved to another, or add_subdirectory.
+set -euo pipefail
+source_dir=$1 build_dir=$2 way=$3
+work="$build_dir/consume/$way"
+prefix="$work/prefix"
+project="$source_dir/tests/consume/$way"
+options=(-DBRINDLE_SOURCE_DIR="$source_dir" -DCMAKE_BUILD_TYPE=Debug)
+
+mkdir -p "$work"
+if [ "$way" != add_subdirectory ]; then
+    rm -rf "$prefix" "$work/first"
+    cmake --install "$build_dir" --prefix "$work/first" >"$work/install.log"
+    mv "$work/first" "$prefix"
+fi
+case $way in
+    find_package)
+        project="$source_dir/examples/host"
+        options=(-DCMAKE_PREFIX_PATH="$prefix") ;;
+    pkg_config)
+        PKG_CONFIG_PATH=$(dirname "$(find "$prefix" -name brindle.pc)")
+        export PKG_CONFIG_PATH ;;
+esac
+
+cmake --fresh -G Ninja -S "$project" -B "$work/host" "${options[@]}"
+cmake --build "$work/host" --target host
+"$work/host/host" | diff "$source_dir/examples/host/expected.txt" -
