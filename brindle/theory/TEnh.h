@@ -3,6 +3,7 @@
 
 #include <cstdint>
 #include <iosfwd>
+#include <string>
 #include <string_view>
 
 namespace brindle {
@@ -20,11 +21,27 @@ enum TEnh : std::int8_t {
     TEnh_Undef = 7,
 };
 
+/// By how many semitones the accidental raises the letter, -3 to 3; 0 for `TEnh_Undef`.
+[[nodiscard]] constexpr int EnhToSemitone(TEnh enh) {
+    return enh >= TEnh_bbb && enh <= TEnh_sss ? enh - TEnh_n : 0;
+}
+
+/// The accidental that raises a letter by so many semitones. Beyond -3 to 3 it stays at
+/// `TEnh_bbb` or `TEnh_sss`.
+[[nodiscard]] constexpr TEnh SemitoneToEnh(int semitones) {
+    if (semitones < -3) return TEnh_bbb;
+    return semitones > 3 ? TEnh_sss : static_cast<TEnh>(semitones + TEnh_n);
+}
+
 /// The spelling of an exact lower-case word ("flat", "double sharp"); `TEnh_Undef` for any other
 /// text, "undef" included.
 [[nodiscard]] TEnh EnhFromStdString(std::string_view word);
 /// The same for a C string; a null pointer gives `TEnh_Undef`.
 [[nodiscard]] TEnh EnhFromString(const char* word);
+
+/// The enumerator's name as it stands in code: "TEnh_bb". A value without one gives the cast that
+/// makes it: "TEnh(6)".
+[[nodiscard]] std::string StringForInitializerList(TEnh enh);
 
 /// Writes the word of the spelling, or "unknown TEnh " and its number.
 std::ostream& operator<<(std::ostream& stream, TEnh enh);

@@ -1,0 +1,113 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/theory/CKeyEnh.h"
+
+#include <cstdint>
+#include <iosfwd>
+#include <string>
+#include <string_view>
+#include <utility>
+
+namespace brindle {
+
+class CScaleHeavy;
+
+/// Note number of no note. Real note numbers are 0 to 127 as in MIDI, 60 is middle C.
+inline constexpr std::int64_t kNoteNrUndef = -1;
+/// The undefined note number of one unsigned byte. It counts as undefined wherever a note number
+/// arrives.
+inline constexpr std::int64_t kNoteNrSmallUndef = 255;
+
+/// Whether the note number is -1 or 255.
+[[nodiscard]] constexpr bool IsNoteNrUndef(std::int64_t noteNr) {
+    return noteNr == kNoteNrUndef || noteNr == kNoteNrSmallUndef;
+}
+/// The note number limited to 0 to 127, -1 if undefined.
+[[nodiscard]] std::int64_t ClampNoteNr(std::int64_t noteNr);
+/// The key of a note number, 0 to 11; 15 if undefined.
+[[nodiscard]] int KeyNrOfNoteNr(std::int64_t noteNr);
+
+/// A note with its octave and its spelling.
+///
+/// Fields that are set directly are not checked; a note number beyond 0 to 127 is off the keyboard.
+struct CNote {
+    std::int64_t mNoteNr = kNoteNrUndef;
+    TEnh mEnh = TEnh_Undef;
+
+    constexpr CNote() = default;
+    /// The note number is limited to 0 to 127. The spelling is repaired, unless `TEnh_Undef`.
+    CNote(std::int64_t noteNr, TEnh enh);
+    /// The key in an octave, where octave -1 is the notes 0 to 11. The spelling stays as it is.
+    ///
+    /// An octave of 10 or more gives 108 plus the key, one below -1 gives minus the key.
+    CNote(const CKeyEnh& keyEnh, int oct);
+    CNote(const std::pair<int, TEnh>& keyEnh, int oct);
+
+    [[nodiscard]] constexpr bool IsUndef() const { return IsNoteNrUndef(mNoteNr); }
+    /// 0 to 11, or 15.
+    [[nodiscard]] int KeyNr() const;
+    [[nodiscard]] CKeyEnh KeyEnh() const;
+    /// Of the key number: the undefined note counts as black.
+    [[nodiscard]] bool IsBlackKey() const;
+    [[nodiscard]] bool HasSensefulEnh() const;
+
+    /// Limits the number to 0 to 127 and keeps the spelling.
+    void SetNoteNr(std::int64_t noteNr);
+    /// Sets the spelling, repaired unless `TEnh_Undef`.
+    void SetEnh(TEnh enh);
+    void SetEnhAndDontMakeSenseful(TEnh enh);
+    /// As the constructor.
+    void SetNoteNrAndEnh(std::int64_t noteNr, TEnh enh);
+    /// As SetNoteNr, then repairs the present spelling, `TEnh_Undef` too.
+    void SetNoteNrAndMakeSensefulEnhAssumingCMajor(std::int64_t noteNr);
+    /// Changes the key within the octave; key 15 makes the note undefined. An undefined note counts
+    /// as one of the lowest octave. Not limited: B in the octave of note 127 is 131.
+    void SetKeyNr(int keyNr);
+    /// As SetKeyNr, then repairs the present spelling.
+    void SetKeyNrAndEnhAssumingCMajor(int keyNr);
+    /// Keeps the key and sets the octave as the constructor does. An undefined note counts as a C.
+    void SetOct(int oct);
+    /// Makes the note undefined.
+    void Clear();
+
+    /// One step of respelling as the free functions of these names do it, except that triple
+    /// accidentals are not taken as double ones.
+    void EnhShiftToFlats();
+    void EnhShiftToSharps();
+    void EnhShift();
+    /// Takes the spelling that the scale gives to this key.
+    void AdjustEnhToScale(const CScaleHeavy& scale);
+
+    /// Adds the interval, then moves by whole octaves into 0 to 127. The spelling stays; so does an
+    /// undefined note.
+    void AddIntvlAndClampToKey(int intvl);
+
+    [[nodiscard]] std::string KeyName(const CChordNamePrefs& prefs) const;
+    [[nodiscard]] std::string KeyNameWithoutEnh(const CChordNamePrefs& prefs) const;
+    /// The octave as a number; note 60 is octave 3, 4 or 5 by `mOctaveNaming`. Empty if undefined.
+    [[nodiscard]] std::string OctName(const CChordNamePrefs& prefs) const;
+
+    /// Reads a key name and an octave number behind it: "C#4". A missing number reads as 0. False,
+    /// and the undefined note, when there is no key name.
+    bool SetFromString(std::string_view text, const CChordNamePrefs& prefs);
+    /// Reads a key name, keeps the octave and gives the count of characters used. Without a key
+    /// name the note becomes undefined and the count is 0.
+    int SetKeyNrAndEnhAssumingCMajorFromString(std::string_view text, const CChordNamePrefs& prefs);
+
+    /// Writes `{"name":"<key name>","nr":<number>,"enh":"<word>"}`, with the key named by
+    /// `CurrentChordNamePrefs`.
+    void AppendJSONString(std::ostream& stream) const;
+
+    friend constexpr bool operator==(const CNote&, const CNote&) = default;
+    /// By note number, then by spelling, smaller first.
+    friend constexpr bool operator<(const CNote& a, const CNote& b) {
+        return a.mNoteNr != b.mNoteNr ? a.mNoteNr < b.mNoteNr : a.mEnh < b.mEnh;
+    }
+};
+
+std::ostream& operator<<(std::ostream& stream, const CNote& note);
+
+inline constexpr CNote CNote_Undef{};
+
+}  // namespace brindle

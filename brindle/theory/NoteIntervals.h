@@ -1,0 +1,46 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/theory/CNote.h"
+#include "brindle/theory/KeyIntervals.h"
+
+#include <cstdint>
+#include <iosfwd>
+
+namespace brindle {
+
+/// Which way a melody goes or a search looks.
+enum TKeyDirection : std::int32_t {
+    TKeyDirection_Closest = 0,
+    TKeyDirection_Up = 1,
+    TKeyDirection_Down = 2,
+};
+
+/// Writes "Closest", "Up" or "Down", or "unknown TKeyDirection " and the number.
+std::ostream& operator<<(std::ostream& stream, TKeyDirection direction);
+
+/// Down when b lies below a, Up otherwise; Closest when either is undefined.
+[[nodiscard]] TKeyDirection KeyDirectionFrom(std::int64_t a, std::int64_t b);
+[[nodiscard]] TKeyDirection KeyDirectionFrom(const CNote& a, const CNote& b);
+
+/// From note a to note b in semitones. `kIntvlUndef` when either is undefined.
+[[nodiscard]] int IntvlFromTo(std::int64_t a, std::int64_t b);
+[[nodiscard]] int IntvlFromTo(const CNote& a, const CNote& b);
+/// The same where 255 is a number, and only -1 is undefined.
+[[nodiscard]] int IntvlFromToTolerateNoteNrSmallUndef(std::int64_t a, std::int64_t b);
+/// How far two notes lie apart in semitones. `kIntvlUndef` when either is undefined.
+[[nodiscard]] int DistanceBetween(const CNote& a, const CNote& b);
+
+// The functions of KeyIntervals.h on the keys of two notes.
+
+[[nodiscard]] int KeyIntvlFromTo(const CNote& a, const CNote& b);
+[[nodiscard]] int AbsKeyIntvlFromTo(const CNote& a, const CNote& b);
+[[nodiscard]] int SmallestKeyIntvlBetween(const CNote& a, const CNote& b);
+[[nodiscard]] int KeyDistanceBetween(const CNote& a, const CNote& b);
+
+/// The lowest note number at which an interval still sounds clear. Intervals above 14 semitones
+/// count as the one whole octaves below that lies in 3 to 14; 0 for an octave, which has no limit,
+/// and for intervals below 1.
+[[nodiscard]] int LowIntervalLimit(int intvl);
+
+}  // namespace brindle
