@@ -2,6 +2,8 @@
 #pragma once
 
 #include <cstdint>
+#include <iosfwd>
+#include <string_view>
 
 namespace brindle {
 
@@ -40,5 +42,26 @@ enum TScaleType : std::int32_t {
     DoubleHarmonic = 30,
     st_Count = 31,
 };
+
+/// Whether the scale is one of the seven modes of the major scale.
+[[nodiscard]] constexpr bool IsScaleTypeModal(TScaleType type) {
+    return type == st_maj || type == st_min || (type >= st_lydian && type <= st_locrian);
+}
+
+/// The word of the type in JSON text: "maj", "dori", "TScaleType::Altered". A value outside the
+/// enumeration gives "undef".
+[[nodiscard]] std::string_view ToJSONString(TScaleType type);
+/// The type of an exact JSON word of the types 1 to 20; `st_Undef` for any other text, so the
+/// later types do not come back by name.
+[[nodiscard]] TScaleType ScaleTypeFromJSONString(std::string_view word);
+
+/// Step to the next or the previous number, without end.
+TScaleType& operator++(TScaleType& type);
+TScaleType operator++(TScaleType& type, int);
+TScaleType& operator--(TScaleType& type);
+TScaleType operator--(TScaleType& type, int);
+
+/// Writes the enumerator, as "st_dorian"; a value outside the enumeration writes "undef".
+std::ostream& operator<<(std::ostream& stream, TScaleType type);
 
 }  // namespace brindle

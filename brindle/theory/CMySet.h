@@ -1,0 +1,52 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <algorithm>
+#include <boost/container/flat_set.hpp>
+#include <boost/container/small_vector.hpp>
+#include <functional>
+#include <iterator>
+
+namespace brindle {
+
+/// An ordered set with unique members, such as the key numbers of a chord or its notes.
+///
+/// It has the interface of `std::set` and keeps its members in one sorted array; up to twelve of
+/// them, one per key, need no allocation. Inserting or erasing makes iterators invalid.
+template <class T>
+class CMySet
+    : public boost::container::flat_set<T, std::less<T>, boost::container::small_vector<T, 12>> {
+    using Base = boost::container::flat_set<T, std::less<T>, boost::container::small_vector<T, 12>>;
+
+public:
+    using Base::Base;
+    CMySet() = default;
+
+    /// The members of both sets.
+    [[nodiscard]] friend CMySet operator+(const CMySet& a, const CMySet& b) {
+        CMySet both;
+        both.reserve(a.size() + b.size());
+        std::set_union(a.begin(), a.end(), b.begin(), b.end(), std::inserter(both, both.end()));
+        return both;
+    }
+    /// The members of `a` that are not in `b`.
+    [[nodiscard]] friend CMySet operator-(const CMySet& a, const CMySet& b) {
+        CMySet rest;
+        std::set_difference(a.begin(), a.end(), b.begin(), b.end(),
+                            std::inserter(rest, rest.end()));
+        return rest;
+    }
+    /// The members that are in both sets.
+    [[nodiscard]] friend CMySet operator&(const CMySet& a, const CMySet& b) {
+        CMySet common;
+        std::set_intersection(a.begin(), a.end(), b.begin(), b.end(),
+                              std::inserter(common, common.end()));
+        return common;
+    }
+    /// Whether every member of `other` is in this set.
+    [[nodiscard]] bool Includes(const CMySet& other) const {
+        return std::includes(this->begin(), this->end(), other.begin(), other.end());
+    }
+};
+
+}  // namespace brindle

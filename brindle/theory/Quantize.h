@@ -1,0 +1,34 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <cstdint>
+
+namespace brindle {
+
+/// Where a tone outside a set of tones goes: to the closest one, or always up or down.
+enum TQuantizeDirection : std::int32_t {
+    TQuantizeDirection_ClosestTieRight = 0,
+    TQuantizeDirection_ClosestTieLeft = 1,
+    TQuantizeDirection_Right = 2,
+    TQuantizeDirection_Left = 3,
+};
+
+/// Whether a search beyond B comes back in at C (and the other way) or runs on into the next
+/// octave.
+enum TWrapAtOctave : std::int32_t {
+    TWrapAtOctave_Yes = 0,
+    TWrapAtOctave_No = 1,
+};
+
+struct TQuantizeSemitonesOptions {
+    TQuantizeDirection mDirection = TQuantizeDirection_ClosestTieRight;
+    TWrapAtOctave mWrapAtOctave = TWrapAtOctave_Yes;
+};
+
+/// The side taken when two degrees of a scale are equally near. Any value other than 0 is left.
+enum TQuantizeToScaleDirection : std::int32_t {
+    TQuantizeToScaleDirection_ClosestTieRight = 0,
+    TQuantizeToScaleDirection_ClosestTieLeft = 1,
+};
+
+}  // namespace brindle
