@@ -1,0 +1,250 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/theory/CIntvlSet.h"
+#include "brindle/theory/CNote.h"
+#include "brindle/theory/CSemitones.h"
+#include "brindle/theory/Quantize.h"
+#include "brindle/theory/ScaleCatalogue.h"
+#include "brindle/theory/TScaleType.h"
+
+#include <array>
+#include <cstdint>
+#include <iosfwd>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <type_traits>
+
+namespace brindle {
+
+class CChordHeavy;
+struct CChordNamePrefs;
+
+/// A scale in full: a root, the steps above it and the spelling of each of the twelve keys, also
+/// of those between the steps. It tells which keys belong to it, counts its sharps and flats, and
+/// moves notes along its degrees (0 for the root).
+///
+/// A scale of type `st_custom` holds steps of its own. A set of steps that is in the table of
+/// scales always gets its named type. An undefined root makes an undefined scale: no key belongs
+/// to it.
+class CScaleHeavy {
+public:
+    // The table of scales, in its own order
+
+    /// All named scales and, last, the empty row of the undefined scale.
+    static constexpr const std::array<TScaleRow, 30>& mScaleData = kScaleCatalogue;
+
+    /// 30: the named scales and the empty row.
+    [[nodiscard]] static constexpr int NumAvailableScales() {
+        return static_cast<int>(mScaleData.size());
+    }
+    /// The type of row `index`; `st_maj` when there is no such row.
+    [[nodiscard]] static TScaleType GetTypeForScaleAtIndex(int index);
+    /// The name of row `index`; "Major" when there is no such row.
+    [[nodiscard]] static std::string_view GetNameForScaleAtIndex(int index);
+    /// The row of a type; 0, the row of major, for a type without one.
+    [[nodiscard]] static int ScaleIndexFromType(TScaleType type);
+
+    // A field of the row of a type, of major for a type without one
+
+    [[nodiscard]] static std::string_view GetNameForScaleType(TScaleType type);
+    [[nodiscard]] static TScaleMode GetModeForScaleType(TScaleType type);
+    [[nodiscard]] static int GetDegreesPerOctaveForScaleType(TScaleType type);
+    [[nodiscard]] static const std::array<int, 12>& GetDegreeToRootOffsetIntvlArrayForScaleType(
+        TScaleType type);
+    [[nodiscard]] static const std::array<TEnh, 12>& GetDegreeEnhForScaleType(TScaleType type);
+    /// The name in the user's language, "Major (Ionian)" where there is no translation; none for
+    /// a type outside 1 to 30.
+    [[nodiscard]] static std::optional<std::string> LocalizedNameForScaleType(TScaleType type);
+
+    // Making a scale. The root takes the key alone, in the lowest octave, with a repaired spelling.
+
+    constexpr CScaleHeavy() { mEnhOfKeyNr.fill(TEnh_Undef); }
+    CScaleHeavy(const CKeyEnh& root, TScaleType type);
+    CScaleHeavy(const CNote& root, TScaleType type);
+    /// The root in the spelling whose major scale has the fewest signs.
+    CScaleHeavy(int rootKeyNr, TScaleType type);
+    CScaleHeavy(const CKeyEnh& root, CSemitones semitones);
+    CScaleHeavy(const CKeyEnh& root, const CIntvlSet& intvls);
+    CScaleHeavy(const CNote& root, const CIntvlSet& intvls);
+    CScaleHeavy(const CKeyEnh& root, const CMySet<int>& keyNrs);
+    CScaleHeavy(const CNote& root, const CMySet<int>& keyNrs);
+    /// The scale that a text such as "C dorian" names, see ScaleStrings.h.
+    CScaleHeavy(std::string_view text, const CChordNamePrefs& prefs);
+    CScaleHeavy(const char* text, const CChordNamePrefs& prefs);
+
+    void SetUndef() { *this = CScaleHeavy(); }
+    void SetFromRootKeyEnhAndScaleType_ResetCustomScaleData(const CKeyEnh& root, TScaleType type);
+    /// Keeps the steps of a custom scale, for the type `st_custom`.
+    void SetFromRootKeyEnhAndScaleType_DontResetCustomScaleData(const CKeyEnh& root,
+                                                                TScaleType type);
+    void SetFromRootKeyEnhAndCustomScaleSemitones_ResetCustomScaleData(const CKeyEnh& root,
+                                                                       CSemitones semitones);
+    /// Members from the thirteenth on are left out. Members above 11 stay as they are.
+    void SetFromRootKeyEnhAndCustomScaleIntvlSet_ResetCustomScaleData(const CKeyEnh& root,
+                                                                      const CIntvlSet& intvls);
+    void SetFromRootKeyEnhAndCustomScaleKeyNrSet_ResetCustomScaleData(const CKeyEnh& root,
+                                                                      const CMySet<int>& keyNrs);
+    /// Reads a text such as "C dorian", see ScaleStrings.h.
+    void SetFromString(std::string_view text, const CChordNamePrefs& prefs);
+
+    // Changing one thing; the WithoutCalcEnh forms leave the old spellings.
+
+    /// Repairs the spelling of the root as the constructors do.
+    void SetRootKeyEnh(const CKeyEnh& root);
+    void SetRootKeyEnhWithoutCalcEnh(const CKeyEnh& root);
+    /// Takes the note as it is, octave and spelling included.
+    void SetRootNote(const CNote& root);
+    void SetScaleType(TScaleType type);
+    void SetScaleTypeWithoutCalcEnh(TScaleType type);
+    /// Sets the steps that count for the type `st_custom`; type, root and spellings stay.
+    void SetCustomScaleRootOffsetIntvlSet_ResetCustomScaleData(const CIntvlSet& intvls);
+    /// The same, keeping what else the custom row holds.
+    void SetCustomScaleRootOffsetIntvlSet_DontResetCustomScaleData(const CIntvlSet& intvls);
+    /// Works out the spelling of the twelve keys: first the seven letters under the signs of the
+    /// scale, then the keys between them from their neighbours. A custom scale has no spellings,
+    /// and some keys of some scales have none either.
+    void CalcEnh();
+
+    // Reading
+
+    [[nodiscard]] constexpr const CNote& RootNote() const { return mRootNote; }
+    [[nodiscard]] CKeyEnh RootKeyEnh() const { return mRootNote.KeyEnh(); }
+    /// 0 to 11, or 15.
+    [[nodiscard]] int RootKeyNr() const { return mRootNote.KeyNr(); }
+    [[nodiscard]] constexpr TScaleType ScaleType() const { return mScaleType; }
+    [[nodiscard]] constexpr bool IsUndef() const { return mRootNote.IsUndef(); }
+    /// The row in use: of the table of scales, or the scale's own.
+    [[nodiscard]] constexpr const TScaleRow& ScaleRow() const {
+        return mScaleRow < 0 ? mCustomScaleData : mScaleData[static_cast<std::size_t>(mScaleRow)];
+    }
+    /// The row of a type; for `st_custom` the scale's own, for other types without a row major.
+    [[nodiscard]] const TScaleRow& ScaleDataFromType(TScaleType type) const;
+    /// The first type of the table whose steps are those of the own row; `st_custom` if none is.
+    [[nodiscard]] TScaleType FindScaleTypeForCustomScale() const;
+
+    [[nodiscard]] bool IsModalScale() const { return IsScaleTypeModal(mScaleType); }
+    [[nodiscard]] int DegreesPerOctave() const { return ScaleRow().mDegreesPerOctave; }
+
+    // Which degree an interval above the root, a key, or a note is; -1 for none
+
+    [[nodiscard]] int IntvlToDegreeNr(int intvl) const;
+    [[nodiscard]] int KeyNrToDegreeNr(int keyNr) const;
+    [[nodiscard]] int NoteNrToDegreeNr(std::int64_t noteNr) const;
+    [[nodiscard]] int NoteToDegreeNr(const CNote& note) const;
+    [[nodiscard]] bool HasIntvl(int intvl) const { return IntvlToDegreeNr(intvl) >= 0; }
+    [[nodiscard]] bool HasKeyNr(int keyNr) const { return KeyNrToDegreeNr(keyNr) >= 0; }
+    [[nodiscard]] bool HasNoteNr(std::int64_t noteNr) const {
+        return NoteNrToDegreeNr(noteNr) >= 0;
+    }
+    [[nodiscard]] bool HasNote(const CNote& note) const { return NoteToDegreeNr(note) >= 0; }
+
+    // What stands on a degree, counted on through the octaves. A negative degree, and any degree of
+    // a scale without steps, is the root. Undefined for an undefined root.
+
+    /// 0 to 11, or 15.
+    [[nodiscard]] int DegreeNrToKeyNr(int degree) const;
+    [[nodiscard]] CKeyEnh DegreeNrToKeyEnh(int degree) const;
+    /// The note with a number of 0 to 11.
+    [[nodiscard]] CNote DegreeNrToNoteInLowestOctave(int degree) const;
+    /// The key of the degree in octave `oct`, where octave -1 is the lowest. Degree 0 of C major in
+    /// octave 4 is 60.
+    [[nodiscard]] std::int64_t DegreeNrToNoteNr(int degree, int oct) const;
+    [[nodiscard]] CNote DegreeNrToNote(int degree, int oct) const;
+
+    // The spelling of a key; `TEnh_Undef` where the scale has none. Key numbers and steps are
+    // reduced into the octave, an undefined note reads as key 3.
+
+    [[nodiscard]] TEnh EnhForKeyNr(int keyNr) const;
+    /// Of the key `step` semitones above the root.
+    [[nodiscard]] TEnh EnhForChromStep(int step) const;
+    [[nodiscard]] TEnh EnhForNote(const CNote& note) const;
+    /// By key number.
+    [[nodiscard]] constexpr const std::array<TEnh, 12>& EnhOfKeyNr() const { return mEnhOfKeyNr; }
+    // Stores a spelling, repaired.
+    void SetEnhForKeyNr(int keyNr, TEnh enh);
+    void SetEnhForChromStep(int step, TEnh enh);
+    void SetEnhForNote(const CNote& note, TEnh enh);
+
+    [[nodiscard]] CSemitones ToSemitones() const { return ScaleRow().Semitones(); }
+    /// The steps, with the octave as wrap interval.
+    [[nodiscard]] CIntvlSet ToIntvlSet() const;
+    /// The keys of the scale; empty for an undefined root.
+    [[nodiscard]] CMySet<int> ToKeyNrSet() const;
+
+    /// The sharps of the scale, negative for flats: -1 for F major, 0 for E phrygian.
+    [[nodiscard]] int SignsCount() const;
+    [[nodiscard]] int SignsCountAbs() const;
+    /// The root of the major scale that has the notes of this modal scale; undefined if it is none.
+    [[nodiscard]] CKeyEnh RelatedIonianScaleRootKeyEnh() const;
+    [[nodiscard]] CScaleHeavy RelatedIonianScale() const;
+
+    /// "D Dorian".
+    [[nodiscard]] std::string FullName(const CChordNamePrefs& prefs) const;
+    /// Writes `{"root":<note>,"type":"dori"}`.
+    void AppendJSONString(std::ostream& stream) const;
+
+    // Moving along the scale
+
+    /// The note `steps` degrees higher, lower if negative. A note beside the scale first goes back
+    /// to the degree before it. The result may lie outside 0 to 127 unless `fold` brings it back
+    /// by whole octaves. An undefined scale leaves the note as it is; an undefined note gives -1.
+    [[nodiscard]] std::int64_t MoveInScale(std::int64_t noteNr, int steps, bool fold = false) const;
+    /// The same with `fold`, spelled by the scale.
+    [[nodiscard]] CNote MoveInScale(const CNote& note, int steps) const;
+
+    /// The degree whose key is nearest to the key, with `octave` -1, 0 or 1 when it lies in the
+    /// octave below, the same or the one above. -1 if the scale or the key is undefined.
+    [[nodiscard]] int QuantizeToScaleDegreeNr(int keyNr, TQuantizeToScaleDirection direction,
+                                              int& octave) const;
+    /// The nearest key of the scale, in the spelling of the scale.
+    [[nodiscard]] CKeyEnh QuantizeToScaleKeyEnh(const CKeyEnh& keyEnh,
+                                                TQuantizeToScaleDirection direction) const;
+    /// The nearest note of the scale.
+    [[nodiscard]] CNote NoteQuantizeToScaleNote(const CNote& note,
+                                                TQuantizeToScaleDirection direction) const;
+
+    // Chords. Defined in chords/.
+
+    /// The chord of the degrees that lie `steps` above the root, the first step being its root.
+    [[nodiscard]] CChordHeavy ChordFromScaleStepSet(const CMySet<int>& steps) const;
+    /// The triad on the root.
+    [[nodiscard]] CChordHeavy ChordTriadForScale() const;
+    /// Whether every key of the chord is in the scale; true for a chord without notes.
+    [[nodiscard]] bool ChordIsDiatonicInScaleDisregardingEnh(const CChordHeavy& chord) const;
+    /// Whether the keys of the basic chord and the bass are in the scale.
+    [[nodiscard]] bool ChordBasicChordAndBassNoteIsDiatonicInScaleDisregardingEnh(
+        const CChordHeavy& chord) const;
+    /// A scale on the root of the chord with all its keys, filled from this scale where the chord
+    /// leaves a degree open; an undefined scale stands for major or minor on the root of the chord.
+    [[nodiscard]] CScaleHeavy ConstructScaleForChord(const CChordHeavy& chord) const;
+
+    /// Root with octave and spelling, type, and the steps of a custom scale.
+    friend bool operator==(const CScaleHeavy& a, const CScaleHeavy& b);
+
+private:
+    static constexpr std::int8_t kOwnRow = -1;
+    static constexpr std::int8_t kEmptyRow = 29;
+
+    [[nodiscard]] CKeyEnh _SignsCount_MajorKeyToSearch() const;
+    [[nodiscard]] static int _SignsCount_DetermineSignsCountBySearchingCycleOfFifths(
+        const CKeyEnh& majorKey);
+    void _CalcEnh_DiatonicNotes();
+    void _CalcEnh_ChromaticNotes();
+
+    CNote mRootNote;
+    TScaleType mScaleType = st_Undef;
+    std::array<TEnh, 12> mEnhOfKeyNr{};
+    /// Index of the row in use in mScaleData, or kOwnRow.
+    std::int8_t mScaleRow = kEmptyRow;
+    TScaleRow mCustomScaleData = kCustomScaleRow;
+};
+
+static_assert(std::is_trivially_copyable_v<CScaleHeavy>);
+
+std::ostream& operator<<(std::ostream& stream, const CScaleHeavy& scale);
+
+inline constexpr CScaleHeavy CScaleHeavy_Undef{};
+
+}  // namespace brindle
