@@ -1,0 +1,65 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/analysis/CHarmAnlsChord.h"
+
+#include "brindle/platform/PlainText.h"
+
+#include <ostream>
+
+namespace brindle {
+
+namespace {
+
+template <class TChord>
+void WriteInBraces(std::ostream& stream, const TChord& chord) {
+    PlainText::Write(stream, "{");
+    chord.AppendJSONClassSubstring(stream);
+    PlainText::Write(stream, "}");
+}
+
+}  // namespace
+
+bool CHarmAnlsChord::EqualWithoutEnh(const CHarmAnlsChord& other) const {
+    return mRootKeyEnh.mKeyNr == other.mRootKeyEnh.mKeyNr &&
+           mBassKeyEnh.mKeyNr == other.mBassKeyEnh.mKeyNr && EqualExceptRootAndBass(other);
+}
+
+bool CHarmAnlsChord::EqualExceptRootAndBass(const CHarmAnlsChord& other) const {
+    return mRootDistToHarmCenter == other.mRootDistToHarmCenter &&
+           mBassDistToHarmCenter == other.mBassDistToHarmCenter && mSemitones == other.mSemitones;
+}
+
+void CHarmAnlsChord::AppendJSONClassSubstring(std::ostream& stream) const {
+    CChordLite::AppendJSONClassSubstring(stream);
+    PlainText::Write(stream, R"(, "RootDistToHarmCenter":)");
+    PlainText::WriteInteger(stream, mRootDistToHarmCenter, 2);
+    PlainText::Write(stream, R"(, "BassDistToHarmCenter":)");
+    PlainText::WriteInteger(stream, mBassDistToHarmCenter, 2);
+}
+
+void CHarmAnlsChord::AppendJSONString(std::ostream& stream) const {
+    WriteInBraces(stream, *this);
+}
+
+void CHarmAnlsChordWithPos::AppendJSONClassSubstring(std::ostream& stream) const {
+    PlainText::Write(stream, R"("Position":)");
+    PlainText::WriteFixed(stream, mPosition);
+    PlainText::Write(stream, ", ");
+    CHarmAnlsChord::AppendJSONClassSubstring(stream);
+}
+
+void CHarmAnlsChordWithPos::AppendJSONString(std::ostream& stream) const {
+    WriteInBraces(stream, *this);
+}
+
+void CHarmAnlsChordWithLength::AppendJSONClassSubstring(std::ostream& stream) const {
+    PlainText::Write(stream, R"("Length":)");
+    PlainText::WriteFixed(stream, mLength);
+    PlainText::Write(stream, ", ");
+    CHarmAnlsChord::AppendJSONClassSubstring(stream);
+}
+
+void CHarmAnlsChordWithLength::AppendJSONString(std::ostream& stream) const {
+    WriteInBraces(stream, *this);
+}
+
+}  // namespace brindle
