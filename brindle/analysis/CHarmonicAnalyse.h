@@ -2,6 +2,7 @@
 #pragma once
 
 #include "brindle/analysis/CHarmAnlsChords.h"
+#include "brindle/analysis/CHarmAnlsProgressions.h"
 #include "brindle/analysis/CHarmAnlsSignKeys.h"
 #include "brindle/analysis/CHarmCopy.h"
 #include "brindle/analysis/TAnalyse.h"
@@ -31,6 +32,8 @@ public:
     CHarmAnlsSignKeys mSignKeys;
     /// From a lead sheet: the numbers of the harmonies that stand at measures with a slash.
     std::vector<std::uint64_t> mChordSequences;
+    /// The table of the last run by tonic progressions or cadences.
+    CHarmAnlsProgressions mProgressions;
 
     void AnalyseFromChords(const CHarmAnlsChords& chords, const CHarmAnlsSignKeys& signKeys,
                            TAnalyse analyse);

@@ -11,12 +11,14 @@ namespace brindle {
 
 /// What stands between the tokens of a text: a regular expression in ECMAScript grammar.
 ///
-/// The default, white space `\s+`, is split by hand in one pass and knows the six white space
-/// characters of ASCII whatever the locale; a UTF-8 no-break space separates nothing.
+/// The default, the pattern text `\s+`, is split by hand in one pass and knows the six white space
+/// characters of ASCII whatever the locale; a UTF-8 no-break space separates nothing. Any other
+/// pattern is searched through small windows of the text, so that time and stack stay bounded on
+/// long texts: a separator may be up to 256 bytes long, a longer one counts as several.
 class CSeparatorPattern {
 public:
     CSeparatorPattern() = default;
-    /// A pattern that is no regular expression separates nothing.
+    /// A text that is no regular expression, a null pointer too, separates nothing.
     CSeparatorPattern(const std::string& pattern);
     CSeparatorPattern(const char* pattern);
     CSeparatorPattern(std::regex regex);
@@ -26,7 +28,8 @@ public:
     [[nodiscard]] std::vector<std::string> Split(std::string_view text) const;
 
 private:
-    /// Empty for white space.
+    bool mIsWhiteSpace = true;
+    /// Empty for white space, and for a pattern that is no regular expression.
     std::optional<std::regex> mRegex;
 };
 
