@@ -6,7 +6,7 @@ set(package_dir ${CMAKE_INSTALL_LIBDIR}/cmake/Brindle)
 
 install(TARGETS brindle EXPORT BrindleTargets)
 install(DIRECTORY ${PROJECT_SOURCE_DIR}/brindle DESTINATION ${CMAKE_INSTALL_INCLUDEDIR}
-        FILES_MATCHING PATTERN "*.h")
+        FILES_MATCHING PATTERN "*.h" PATTERN internal EXCLUDE)
 install(EXPORT BrindleTargets NAMESPACE brindle:: DESTINATION ${package_dir})
 
 configure_package_config_file(${CMAKE_CURRENT_LIST_DIR}/BrindleConfig.cmake.in

@@ -1,0 +1,20 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <filesystem>
+#include <optional>
+#include <string>
+#include <string_view>
+
+namespace brindle {
+
+/// Replaces the file at `path` as a whole: the bytes are written beside it under a name that nobody
+/// can foresee, flushed to the disk and renamed over it. A full disk or a kill leaves the old file
+/// as it was. False when that failed; nothing is left behind then.
+[[nodiscard]] bool WriteFileAtomically(const std::filesystem::path& path, std::string_view bytes);
+
+/// The whole file, or nothing when it cannot be read or is larger than `limit` bytes.
+[[nodiscard]] std::optional<std::string> ReadWholeFile(const std::filesystem::path& path,
+                                                       std::size_t limit = std::size_t{2} << 30);
+
+}  // namespace brindle

@@ -1,0 +1,23 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <map>
+#include <string>
+#include <string_view>
+
+namespace brindle {
+
+/// A file or a folder in memory: a folder has children by name, a file has contents.
+struct FileNode {
+    bool mIsFolder = false;
+    std::string mContents;
+    std::map<std::string, FileNode, std::less<>> mChildren;
+
+    /// The child of that name, or null.
+    [[nodiscard]] const FileNode* Child(std::string_view name) const {
+        const auto it = mChildren.find(name);
+        return it == mChildren.end() ? nullptr : &it->second;
+    }
+};
+
+}  // namespace brindle

@@ -1,0 +1,143 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/platform/XmlDocument.h"
+
+#include "brindle/platform/internal/XmlSafety.h"
+
+#include <libxml/tree.h>
+#include <libxml/xpath.h>
+#include <libxml/xpathInternals.h>
+
+#include <limits>
+#include <new>
+
+namespace brindle {
+
+namespace {
+
+std::string_view TextOf(const xmlChar* text) {
+    return text == nullptr ? std::string_view() : reinterpret_cast<const char*>(text);
+}
+
+std::string TakeText(xmlChar* text) {
+    const std::unique_ptr<xmlChar, decltype(xmlFree)> owner(text, xmlFree);
+    return std::string(TextOf(text));
+}
+
+xmlNodePtr ElementFrom(xmlNodePtr node) {
+    while (node != nullptr && node->type != XML_ELEMENT_NODE) node = node->next;
+    return node;
+}
+
+using XPathContext = std::unique_ptr<xmlXPathContext, decltype(&xmlXPathFreeContext)>;
+using XPathResult = std::unique_ptr<xmlXPathObject, decltype(&xmlXPathFreeObject)>;
+
+XPathResult Evaluate(xmlXPathCompExpr* compiled, xmlNodePtr node) {
+    if (compiled == nullptr || node == nullptr) return {nullptr, xmlXPathFreeObject};
+    const XPathContext context(xmlXPathNewContext(node->doc), xmlXPathFreeContext);
+    if (!context) throw std::bad_alloc();
+    context->node = node;
+    context->error = [](void*, xmlErrorPtr) {};
+    return {xmlXPathCompiledEval(compiled, context.get()), xmlXPathFreeObject};
+}
+
+}  // namespace
+
+std::string_view XmlNode::name() const {
+    return mNode == nullptr ? std::string_view() : TextOf(mNode->name);
+}
+
+std::string XmlNode::stringValue() const {
+    return mNode == nullptr ? std::string() : TakeText(xmlNodeGetContent(mNode));
+}
+
+std::optional<std::string> XmlNode::attribute(std::string_view name) const {
+    if (mNode == nullptr || mNode->type != XML_ELEMENT_NODE) return std::nullopt;
+    for (xmlAttrPtr attribute = mNode->properties; attribute != nullptr;
+         attribute = attribute->next) {
+        if (TextOf(attribute->name) != name) continue;
+        return TakeText(xmlNodeListGetString(mNode->doc, attribute->children, 1));
+    }
+    return std::nullopt;
+}
+
+std::vector<XmlNode> XmlNode::children() const {
+    std::vector<XmlNode> result;
+    for (XmlNode node = firstChild(); node; node = node.nextSibling()) result.push_back(node);
+    return result;
+}
+
+XmlNode XmlNode::child(std::string_view name) const {
+    XmlNode node = firstChild();
+    while (node && node.name() != name) node = node.nextSibling();
+    return node;
+}
+
+XmlNode XmlNode::firstChild() const {
+    if (mNode == nullptr || mNode->type != XML_ELEMENT_NODE) return {};
+    return XmlNode(ElementFrom(mNode->children));
+}
+
+XmlNode XmlNode::nextSibling() const {
+    return mNode == nullptr ? XmlNode() : XmlNode(ElementFrom(mNode->next));
+}
+
+XmlNode XmlNode::parent() const {
+    if (mNode == nullptr || mNode->parent == nullptr) return {};
+    return XmlNode(mNode->parent->type == XML_ELEMENT_NODE ? mNode->parent : nullptr);
+}
+
+int XmlNode::line() const {
+    return mNode == nullptr ? 0 : static_cast<int>(xmlGetLineNo(mNode));
+}
+
+std::vector<XmlNode> XmlNode::nodesForXPath(const XmlPath& path) const {
+    std::vector<XmlNode> nodes;
+    const XPathResult result = Evaluate(path.mCompiled.get(), mNode);
+    if (!result || result->nodesetval == nullptr) return nodes;
+    xmlXPathNodeSetSort(result->nodesetval);
+    nodes.reserve(static_cast<std::size_t>(result->nodesetval->nodeNr));
+    for (int i = 0; i < result->nodesetval->nodeNr; ++i) {
+        const xmlNodePtr found = result->nodesetval->nodeTab[i];
+        if (found->type != XML_NAMESPACE_DECL) nodes.emplace_back(found);
+    }
+    return nodes;
+}
+
+XmlNode XmlNode::firstForXPath(const XmlPath& path) const {
+    const std::vector<XmlNode> nodes = nodesForXPath(path);
+    return nodes.empty() ? XmlNode() : nodes.front();
+}
+
+XmlPath::XmlPath(const char* path) {
+    const XPathContext context(xmlXPathNewContext(nullptr), xmlXPathFreeContext);
+    if (!context) throw std::bad_alloc();
+    context->error = [](void*, xmlErrorPtr) {};
+    mCompiled.reset(xmlXPathCtxtCompile(context.get(), reinterpret_cast<const xmlChar*>(path)),
+                    [](xmlXPathCompExpr* compiled) {
+                        if (compiled != nullptr) xmlXPathFreeCompExpr(compiled);
+                    });
+}
+
+XmlDocument::XmlDocument(_xmlDoc* document) : mDocument(document, xmlFreeDoc) {}
+
+std::variant<XmlDocument, XmlError> XmlDocument::FromBytes(std::string_view bytes) {
+    if (bytes.size() > std::numeric_limits<int>::max()) {
+        return XmlError{XML_ERR_DOCUMENT_END, "Document too long", 1, 1};
+    }
+    const std::unique_ptr<xmlParserCtxt, decltype(&xmlFreeParserCtxt)> context(xmlNewParserCtxt(),
+                                                                               xmlFreeParserCtxt);
+    if (!context) throw std::bad_alloc();
+    xml::RefuseOutsideWorld(*context->sax);
+    context->sax->serror = [](void*, xmlErrorPtr) {};
+    xmlDocPtr document =
+        xmlCtxtReadMemory(context.get(), bytes.data(), static_cast<int>(bytes.size()), nullptr,
+                          nullptr, xml::kOptions | XML_PARSE_BIG_LINES);
+    if (document == nullptr) return xml::ErrorFrom(context->lastError);
+    return XmlDocument(document);
+}
+
+XmlNode XmlDocument::rootElement() const {
+    return XmlNode(xmlDocGetRootElement(mDocument.get()));
+}
+
+}  // namespace brindle

@@ -1,0 +1,84 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/platform/XmlError.h"
+
+#include <memory>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <variant>
+#include <vector>
+
+struct _xmlNode;
+struct _xmlDoc;
+struct _xmlXPathCompExpr;
+
+namespace brindle {
+
+class XmlPath;
+
+/// A small handle to an element or attribute of a document; valid while the document lives. A
+/// handle may be empty, and every question to an empty one has the empty answer.
+class XmlNode {
+public:
+    XmlNode() = default;
+    explicit XmlNode(_xmlNode* node) : mNode(node) {}
+
+    [[nodiscard]] explicit operator bool() const { return mNode != nullptr; }
+    /// Name without prefix.
+    [[nodiscard]] std::string_view name() const;
+    /// All text below, joined; the value of an attribute.
+    [[nodiscard]] std::string stringValue() const;
+    /// Value of an attribute of this element; nothing if it is not there.
+    [[nodiscard]] std::optional<std::string> attribute(std::string_view name) const;
+    /// The elements directly below, in document order.
+    [[nodiscard]] std::vector<XmlNode> children() const;
+    /// The first element directly below with this name, else an empty handle.
+    [[nodiscard]] XmlNode child(std::string_view name) const;
+    [[nodiscard]] XmlNode firstChild() const;
+    /// The next element with the same parent.
+    [[nodiscard]] XmlNode nextSibling() const;
+    [[nodiscard]] XmlNode parent() const;
+    /// Line of the element in the text, from 1.
+    [[nodiscard]] int line() const;
+
+    /// All nodes that the path finds from here, in document order.
+    [[nodiscard]] std::vector<XmlNode> nodesForXPath(const XmlPath& path) const;
+    /// The first of them, else an empty handle.
+    [[nodiscard]] XmlNode firstForXPath(const XmlPath& path) const;
+
+    friend bool operator==(const XmlNode&, const XmlNode&) = default;
+
+private:
+    _xmlNode* mNode = nullptr;
+};
+
+/// An XPath 1.0 expression, compiled once; a wrong one finds nothing. Safe to share as a
+/// function-local static.
+class XmlPath {
+public:
+    XmlPath(const char* path);  // NOLINT: a path is written as text where it is used
+    explicit XmlPath(const std::string& path) : XmlPath(path.c_str()) {}
+
+private:
+    friend class XmlNode;
+    std::shared_ptr<_xmlXPathCompExpr> mCompiled;
+};
+
+/// A whole XML document as a tree. The same limits hold as for XmlStreamParser: nothing outside the
+/// bytes is read.
+class XmlDocument {
+public:
+    /// The tree of the bytes, or the first fault that makes them not well-formed.
+    [[nodiscard]] static std::variant<XmlDocument, XmlError> FromBytes(std::string_view bytes);
+
+    [[nodiscard]] XmlNode rootElement() const;
+
+private:
+    explicit XmlDocument(_xmlDoc* document);
+
+    std::shared_ptr<_xmlDoc> mDocument;
+};
+
+}  // namespace brindle

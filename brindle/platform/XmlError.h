@@ -1,0 +1,16 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <string>
+
+namespace brindle {
+
+/// The first error of an XML text that is not well-formed, and where it stands.
+struct XmlError {
+    int mCode = 0;
+    std::string mDescription;
+    int mLine = 0;    ///< from 1; 0 if unknown
+    int mColumn = 0;  ///< from 1; 0 if unknown
+};
+
+}  // namespace brindle
