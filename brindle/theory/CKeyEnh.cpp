@@ -1,11 +1,22 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/theory/CKeyEnh.h"
 
+#include "brindle/platform/DictionaryValues.h"
+#include "brindle/theory/MakeSensefulEnh.h"
+
 #include <iomanip>
-#include <nlohmann/json.hpp>
 #include <ostream>
 
 namespace brindle {
+
+bool CKeyEnh::HasSensefulEnh() const {
+    return IsSensefulEnhForKeyNr(mKeyNr, mEnh);
+}
+
+std::string CKeyEnh::StringForInitializerList() const {
+    return "CKeyEnh(" + std::to_string(mKeyNr) + ", " + brindle::StringForInitializerList(mEnh) +
+           ")";
+}
 
 void CKeyEnh::AppendJSONString(std::ostream& stream) const {
     stream << R"({"KeyNr":")" << std::setw(2) << mKeyNr << R"(","Enh":")" << mEnh << "\"}";
@@ -13,15 +24,10 @@ void CKeyEnh::AppendJSONString(std::ostream& stream) const {
 
 CKeyEnh CKeyEnh::JSONDeserializer_Helper::CKeyEnhFromJSONDictionary(
     const nlohmann::json& dictionary) {
-    CKeyEnh keyEnh;
-    if (const auto it = dictionary.find(CKeyEnhJSONKey_KeyNr); it != dictionary.end()) {
-        keyEnh.mKeyNr =
-            it->is_string() ? std::atoi(it->get_ref<const std::string&>().c_str()) : it->get<int>();
-    }
-    if (const auto it = dictionary.find(CKeyEnhJSONKey_Enh); it != dictionary.end()) {
-        keyEnh.mEnh = EnhFromStdString(it->get_ref<const std::string&>());
-    }
-    return keyEnh;
+    const int keyNr = IntegerIn(dictionary, CKeyEnhJSONKey_KeyNr).value_or(kKeyNrUndef);
+    const bool isKey = keyNr >= 0 && keyNr < 12;
+    return {isKey ? keyNr : kKeyNrUndef,
+            EnhFromStdString(TextIn(dictionary, CKeyEnhJSONKey_Enh).value_or(""))};
 }
 
 std::ostream& operator<<(std::ostream& stream, const CKeyEnh& keyEnh) {

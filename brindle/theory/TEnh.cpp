@@ -11,18 +11,21 @@ namespace {
 struct TWord {
     TEnh mEnh;
     std::string_view mWord;
+    std::string_view mEnumerator;
 };
 
+// clang-format off
 constexpr auto kWords = std::to_array<TWord>({
-    {TEnh_bbb, "triple flat"},
-    {TEnh_bb, "double flat"},
-    {TEnh_b, "flat"},
-    {TEnh_n, "neutral"},
-    {TEnh_s, "sharp"},
-    {TEnh_ss, "double sharp"},
-    {TEnh_sss, "triple sharp"},
-    {TEnh_Undef, "undef"},
+    {TEnh_bbb,   "triple flat",  "TEnh_bbb"},
+    {TEnh_bb,    "double flat",  "TEnh_bb"},
+    {TEnh_b,     "flat",         "TEnh_b"},
+    {TEnh_n,     "neutral",      "TEnh_n"},
+    {TEnh_s,     "sharp",        "TEnh_s"},
+    {TEnh_ss,    "double sharp", "TEnh_ss"},
+    {TEnh_sss,   "triple sharp", "TEnh_sss"},
+    {TEnh_Undef, "undef",        "TEnh_Undef"},
 });
+// clang-format on
 
 }  // namespace
 
@@ -35,6 +38,13 @@ TEnh EnhFromStdString(std::string_view word) {
 
 TEnh EnhFromString(const char* word) {
     return word == nullptr ? TEnh_Undef : EnhFromStdString(word);
+}
+
+std::string StringForInitializerList(TEnh enh) {
+    for (const TWord& row : kWords) {
+        if (row.mEnh == enh) return std::string(row.mEnumerator);
+    }
+    return "TEnh(" + std::to_string(static_cast<int>(enh)) + ")";
 }
 
 std::ostream& operator<<(std::ostream& stream, TEnh enh) {

@@ -1,0 +1,63 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/platform/DictionaryValues.h"
+
+#include <algorithm>
+#include <limits>
+#include <nlohmann/json.hpp>
+
+namespace brindle {
+
+namespace {
+
+constexpr std::int32_t kMin = std::numeric_limits<std::int32_t>::min();
+constexpr std::int32_t kMax = std::numeric_limits<std::int32_t>::max();
+
+/// The value under the key, null when there is none.
+const nlohmann::json* ValueIn(const nlohmann::json& dictionary, const char* key) {
+    if (!dictionary.is_object()) return nullptr;
+    const auto it = dictionary.find(key);
+    return it == dictionary.end() ? nullptr : &*it;
+}
+
+std::int32_t Limited(const nlohmann::json& number) {
+    if (number.is_number_float()) {
+        return static_cast<std::int32_t>(
+            std::clamp<double>(number.get<double>(), double{kMin}, double{kMax}));
+    }
+    if (number.is_number_unsigned()) {
+        constexpr auto kMaxUnsigned = static_cast<std::uint64_t>(kMax);
+        return static_cast<std::int32_t>(std::min(number.get<std::uint64_t>(), kMaxUnsigned));
+    }
+    return static_cast<std::int32_t>(
+        std::clamp<std::int64_t>(number.get<std::int64_t>(), kMin, kMax));
+}
+
+}  // namespace
+
+std::int32_t IntegerAtStartOf(std::string_view text) {
+    std::size_t i = std::min(text.find_first_not_of(" \t\n\v\f\r"), text.size());
+    const bool isNegative = i < text.size() && text[i] == '-';
+    if (i < text.size() && (text[i] == '-' || text[i] == '+')) ++i;
+    std::int64_t magnitude = 0;
+    for (; i < text.size() && text[i] >= '0' && text[i] <= '9'; ++i) {
+        magnitude = std::min<std::int64_t>(magnitude * 10 + (text[i] - '0'), -std::int64_t{kMin});
+    }
+    return static_cast<std::int32_t>(isNegative ? -magnitude
+                                                : std::min<std::int64_t>(magnitude, kMax));
+}
+
+std::optional<std::int32_t> IntegerIn(const nlohmann::json& dictionary, const char* key) {
+    const nlohmann::json* value = ValueIn(dictionary, key);
+    if (value == nullptr) return std::nullopt;
+    if (value->is_string()) return IntegerAtStartOf(value->get_ref<const std::string&>());
+    if (!value->is_number()) return std::nullopt;
+    return Limited(*value);
+}
+
+std::optional<std::string_view> TextIn(const nlohmann::json& dictionary, const char* key) {
+    const nlohmann::json* value = ValueIn(dictionary, key);
+    if (value == nullptr || !value->is_string()) return std::nullopt;
+    return value->get_ref<const std::string&>();
+}
+
+}  // namespace brindle
