@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "brindle/theory/KeyIntervals.h"
 #include "brindle/theory/Quantize.h"
 #include "brindle/theory/TBasicChord.h"
 
@@ -103,8 +104,7 @@ public:
 
     /// The interval reduced into 0 to 11.
     [[nodiscard]] static constexpr int SemitoneIxFromIntvl(int intvl) {
-        const int remainder = intvl % 12;
-        return remainder < 0 ? remainder + 12 : remainder;
+        return FoldIntoOctave(intvl);
     }
     /// Packs element n into bit n; elements beyond the mask's width are ignored.
     [[nodiscard]] static std::uint64_t VectorBoolToInt(const std::vector<bool>& bits);

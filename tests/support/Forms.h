@@ -2,6 +2,7 @@
 #pragma once
 
 #include "brindle/chords/CChordLite.h"
+#include "brindle/theory/CIntvlSet.h"
 #include "brindle/theory/CKeyEnh.h"
 #include "brindle/theory/CScaleLite.h"
 #include "brindle/theory/CSignKeyLite.h"
@@ -60,6 +61,13 @@ inline nlohmann::json FormOf(const CChordLite& chord) {
     return {{"root", FormOf(chord.mRootKeyEnh)},
             {"bass", FormOf(chord.mBassKeyEnh)},
             {"semitones", chord.mSemitones.Mask()}};
+}
+
+/// [interval, ...], in any number and range
+inline CIntvlSet IntvlSetOf(const nlohmann::json& members) {
+    CIntvlSet intvls;
+    for (const nlohmann::json& member : members) intvls.insert(member.get<int>());
+    return intvls;
 }
 
 template <class T>
