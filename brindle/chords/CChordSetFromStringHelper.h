@@ -1,6 +1,11 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "brindle/theory/CKeyEnh.h"
+#include "brindle/theory/CSemitones.h"
+#include "brindle/theory/TBasicChord.h"
+
+#include <cstdint>
 #include <string_view>
 
 namespace brindle {
@@ -18,6 +23,28 @@ public:
     /// semitones are read all the same.
     static void SetFromString(std::string_view symbol, CChordLite& chord,
                               const CChordNamePrefs& prefs);
+
+private:
+    /// Masks of intervals above the root, an octave and more: bit 14 is the ninth, bit 2 the
+    /// second.
+    struct TIntvlsOfOptions {
+        std::uint32_t mAdd = 0;
+        std::uint32_t mErase = 0;
+    };
+
+    explicit CChordSetFromStringHelper(std::string_view lowercaseText)
+        : mLowercaseText(lowercaseText) {}
+
+    [[nodiscard]] bool _StringShouldSetUndefOrNoChord(CChordLite& chord);
+    [[nodiscard]] CSemitones _BasicChordSemitonesFromString(int& pos);
+    [[nodiscard]] CKeyEnh _BassKeyNrAndEnhFromString(const CChordNamePrefs& prefs) const;
+    [[nodiscard]] TIntvlsOfOptions _AddAndEraseIntvlsForOptionsFromString(int pos) const;
+    void _AddAndEraseIntvlsForSingleOptionFromString(std::string_view text, int& pos,
+                                                     TIntvlsOfOptions& options) const;
+
+    /// What the text names itself; None for a major chord.
+    TBasicChord mBasicChord = TBasicChord::None;
+    std::string_view mLowercaseText;
 };
 
 }  // namespace brindle

@@ -52,4 +52,14 @@ CKeywordsAndNames::iterator CKeywordsAndNames::FindFirstMatching(
     return begin() + (found - cbegin());
 }
 
+CKeywordsAndNames::const_iterator CKeywordsAndNames::FindWholeRemainderAndAdvance(
+    std::string_view text, int& pos) const {
+    const std::string lowered = SetFromStringHelper::ToLowercase(text);
+    SetFromStringHelper::SkipLeadingBlanks(lowered, pos);
+    return std::find_if(begin(), end(), [&](const CKeywordsAndName& record) {
+        return SetFromStringHelper::CompareLowercaseStrsAndOnMatchAdvanceStringPos(
+            SetFromStringHelper::TSpaces_WholeRemainder, record.mKeywords, lowered, pos);
+    });
+}
+
 }  // namespace brindle

@@ -127,6 +127,10 @@ public:
                                                    std::string_view text) const;
     [[nodiscard]] iterator FindFirstMatching(SetFromStringHelper::TSpaces spaces,
                                              std::string_view text);
+
+    /// Skips blanks from `pos`, then finds the first record with a keyword that is all of `text`
+    /// from there on, in any letter case and blanks apart. On a match moves `pos` behind it.
+    const_iterator FindWholeRemainderAndAdvance(std::string_view text, int& pos) const;
 };
 
 }  // namespace brindle
