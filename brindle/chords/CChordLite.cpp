@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/chords/CChordLite.h"
 
+#include "brindle/platform/PlainText.h"
+
 #include <ostream>
 
 namespace brindle {
@@ -30,7 +32,8 @@ void CChordLite::AppendJSONClassSubstring(std::ostream& stream) const {
     mRootKeyEnh.AppendJSONString(stream);
     stream << R"(, "BassKeyEnh":)";
     mBassKeyEnh.AppendJSONString(stream);
-    stream << R"(, "Semitones":)" << mSemitones.Mask();
+    PlainText::Write(stream, R"(, "Semitones":)");
+    PlainText::WriteUnsigned(stream, mSemitones.Mask());
 }
 
 void CChordLite::AppendJSONString(std::ostream& stream) const {

@@ -19,6 +19,7 @@ void Write(std::ostream& stream, const TBuffer& buffer) {
 }  // namespace
 
 void Write(std::ostream& stream, std::string_view text) {
+    stream.width(0);
     stream.write(text.data(), static_cast<std::streamsize>(text.size()));
 }
 

@@ -5,8 +5,8 @@
 #include <iosfwd>
 #include <string_view>
 
-/// Output that looks the same whatever width, flags, precision and locale the stream was given, and
-/// that leaves all of these as they were.
+/// Output that looks the same whatever width, fill, flags, precision and locale the stream was
+/// given. It uses up the width, as all output does, and leaves the others as they were.
 namespace brindle::PlainText {
 
 void Write(std::ostream& stream, std::string_view text);

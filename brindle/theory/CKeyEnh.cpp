@@ -2,9 +2,9 @@
 #include "brindle/theory/CKeyEnh.h"
 
 #include "brindle/platform/DictionaryValues.h"
+#include "brindle/platform/PlainText.h"
 #include "brindle/theory/MakeSensefulEnh.h"
 
-#include <iomanip>
 #include <ostream>
 
 namespace brindle {
@@ -19,7 +19,9 @@ std::string CKeyEnh::StringForInitializerList() const {
 }
 
 void CKeyEnh::AppendJSONString(std::ostream& stream) const {
-    stream << R"({"KeyNr":")" << std::setw(2) << mKeyNr << R"(","Enh":")" << mEnh << "\"}";
+    PlainText::Write(stream, R"({"KeyNr":")");
+    PlainText::WriteInteger(stream, mKeyNr, 2);
+    stream << R"(","Enh":")" << mEnh << "\"}";
 }
 
 CKeyEnh CKeyEnh::JSONDeserializer_Helper::CKeyEnhFromJSONDictionary(

@@ -99,7 +99,7 @@ void CSemitones::ToVectorBool(std::vector<bool>& out) const {
 
 void CSemitones::AppendJSONString(std::ostream& stream) const {
     for (int i = 0; i < 12; ++i) {
-        stream << (i == 0 ? '[' : ',') << (mMask >> i & 1);
+        stream << (i == 0 ? '[' : ',') << ((mMask >> i & 1) != 0 ? '1' : '0');
     }
     stream << ']';
 }
