@@ -2,6 +2,7 @@
 #include "brindle/platform/DictionaryValues.h"
 
 #include <algorithm>
+#include <cmath>
 #include <limits>
 #include <nlohmann/json.hpp>
 
@@ -21,6 +22,7 @@ const nlohmann::json* ValueIn(const nlohmann::json& dictionary, const char* key)
 
 std::int32_t Limited(const nlohmann::json& number) {
     if (number.is_number_float()) {
+        if (std::isnan(number.get<double>())) return 0;
         return static_cast<std::int32_t>(
             std::clamp<double>(number.get<double>(), double{kMin}, double{kMax}));
     }
@@ -52,6 +54,12 @@ std::optional<std::int32_t> IntegerIn(const nlohmann::json& dictionary, const ch
     if (value->is_string()) return IntegerAtStartOf(value->get_ref<const std::string&>());
     if (!value->is_number()) return std::nullopt;
     return Limited(*value);
+}
+
+std::optional<double> NumberIn(const nlohmann::json& dictionary, const char* key) {
+    const nlohmann::json* value = ValueIn(dictionary, key);
+    if (value == nullptr || !value->is_number()) return std::nullopt;
+    return value->get<double>();
 }
 
 std::optional<std::string_view> TextIn(const nlohmann::json& dictionary, const char* key) {

@@ -18,6 +18,7 @@ namespace brindle {
 /// A number without its fraction, or the integer at the start of a text.
 [[nodiscard]] std::optional<std::int32_t> IntegerIn(const nlohmann::json& dictionary,
                                                     const char* key);
+[[nodiscard]] std::optional<double> NumberIn(const nlohmann::json& dictionary, const char* key);
 /// A text; valid as long as the dictionary is.
 [[nodiscard]] std::optional<std::string_view> TextIn(const nlohmann::json& dictionary,
                                                      const char* key);
