@@ -2,6 +2,7 @@
 #pragma once
 
 #include "brindle/chords/CChordLite.h"
+#include "brindle/theory/CChordNamePrefs.h"
 #include "brindle/theory/CIntvlSet.h"
 #include "brindle/theory/CKeyEnh.h"
 #include "brindle/theory/CScaleLite.h"
@@ -68,6 +69,34 @@ inline CIntvlSet IntvlSetOf(const nlohmann::json& members) {
     CIntvlSet intvls;
     for (const nlohmann::json& member : members) intvls.insert(member.get<int>());
     return intvls;
+}
+
+/// The fields that differ from their defaults.
+inline CChordNamePrefs NamePrefsOf(const nlohmann::json& fields) {
+    CChordNamePrefs prefs;
+    const auto read = [&fields](const char* name, auto& field) {
+        if (fields.contains(name)) fields.at(name).get_to(field);
+    };
+    read("mHForB", prefs.mHForB);
+    read("mBForBFlat", prefs.mBForBFlat);
+    read("mGermanNames", prefs.mGermanNames);
+    read("mAsciiAccidentals", prefs.mAsciiAccidentals);
+    read("mSolfege", prefs.mSolfege);
+    read("mLocalizeSolfege", prefs.mLocalizeSolfege);
+    read("mOctaveNaming", prefs.mOctaveNaming);
+    read("mLowerCaseMinorRoot", prefs.mLowerCaseMinorRoot);
+    read("mChordPrefB", prefs.mChordPrefB);
+    read("mOmitBassOption", prefs.mOmitBassOption);
+    read("mChordPrefC", prefs.mChordPrefC);
+    read("mChordPrefD", prefs.mChordPrefD);
+    read("mCommaParts", prefs.mCommaParts);
+    read("mChordPrefE", prefs.mChordPrefE);
+    read("mOptionBrackets", prefs.mOptionBrackets);
+    read("mChordPrefF", prefs.mChordPrefF);
+    read("mNoSpaceBetweenNameParts", prefs.mNoSpaceBetweenNameParts);
+    read("mNoSpaceAroundSlash", prefs.mNoSpaceAroundSlash);
+    read("mSlashText", prefs.mSlashText);
+    return prefs;
 }
 
 template <class T>
