@@ -39,11 +39,16 @@ struct TScaleRow {
     [[nodiscard]] constexpr int StoredDegreeCount() const {
         return std::clamp(mDegreesPerOctave, 0, 12);
     }
+    /// Semitones above the root of a degree; 0 when the row does not hold it.
+    [[nodiscard]] constexpr int OffsetIntvl(int degree) const {
+        if (degree < 0 || degree >= StoredDegreeCount()) return 0;
+        return mDegreeToRootOffsetIntvl[static_cast<std::size_t>(degree)];
+    }
     /// The offsets as a mask, each reduced into the octave.
     [[nodiscard]] constexpr CSemitones Semitones() const {
         CSemitones semitones;
         for (int degree = 0; degree < StoredDegreeCount(); ++degree) {
-            semitones.AddIntvl(mDegreeToRootOffsetIntvl[static_cast<std::size_t>(degree)]);
+            semitones.AddIntvl(OffsetIntvl(degree));
         }
         return semitones;
     }
