@@ -14,7 +14,7 @@ constexpr std::string_view kWhiteSpace = " \t\n\v\f\r";
 // The matcher of the standard library may recurse once per character, and its time may grow with
 // the square of the text. It therefore sees one window at a time, and a match counts when it begins
 // in the first half, so that it could have been as long as the other half.
-constexpr std::ptrdiff_t kHalfWindow = 256;
+constexpr std::ptrdiff_t kHalfWindow = 128;
 
 struct TSeparator {
     const char* mBegin;

@@ -14,7 +14,7 @@ namespace brindle {
 /// The default, the pattern text `\s+`, is split by hand in one pass and knows the six white space
 /// characters of ASCII whatever the locale; a UTF-8 no-break space separates nothing. Any other
 /// pattern is searched through small windows of the text, so that time and stack stay bounded on
-/// long texts: a separator may be up to 256 bytes long, a longer one counts as several.
+/// long texts: a separator may be up to 128 bytes long, a longer one counts as several.
 class CSeparatorPattern {
 public:
     CSeparatorPattern() = default;

@@ -2,6 +2,7 @@
 #include "brindle/analysis/ParseStringIntoHarmAnlsChords.h"
 
 #include "brindle/analysis/TChordStringParse.h"
+#include "brindle/chords/CChordSetFromStringHelper.h"
 
 #include <algorithm>
 #include <cmath>
@@ -54,7 +55,7 @@ public:
         }
         if (!Contains(mParse.mHoldTokens, token)) {
             CChordLite chord;
-            chord.SetFromString(token, mParse.mChordNamePrefs);
+            CChordSetFromStringHelper::SetFromString(token, chord, mParse.mChordNamePrefs);
             mChords.emplace_back(chord, mPosition);
         }
         mPosition += mParse.mBeatsPerChord;
