@@ -2,7 +2,9 @@
 #pragma once
 
 #include "brindle/theory/CKeyEnh.h"
+#include "brindle/theory/MakeSensefulEnh.h"
 
+#include <algorithm>
 #include <cstdint>
 #include <iosfwd>
 #include <string>
@@ -24,9 +26,19 @@ inline constexpr std::int64_t kNoteNrSmallUndef = 255;
     return noteNr == kNoteNrUndef || noteNr == kNoteNrSmallUndef;
 }
 /// The note number limited to 0 to 127, -1 if undefined.
-[[nodiscard]] std::int64_t ClampNoteNr(std::int64_t noteNr);
+[[nodiscard]] constexpr std::int64_t ClampNoteNr(std::int64_t noteNr) {
+    return IsNoteNrUndef(noteNr) ? kNoteNrUndef : std::clamp<std::int64_t>(noteNr, 0, 127);
+}
 /// The key of a note number, 0 to 11; 15 if undefined.
-[[nodiscard]] int KeyNrOfNoteNr(std::int64_t noteNr);
+[[nodiscard]] constexpr int KeyNrOfNoteNr(std::int64_t noteNr) {
+    return IsNoteNrUndef(noteNr) ? kKeyNrUndef : FoldIntoOctave(noteNr);
+}
+
+/// The plain sum. A number far off the keyboard wraps around, where signed numbers would overflow.
+[[nodiscard]] constexpr std::int64_t NoteNrAddIntvl(std::int64_t noteNr, int intvl) {
+    return static_cast<std::int64_t>(static_cast<std::uint64_t>(noteNr) +
+                                     static_cast<std::uint64_t>(std::int64_t{intvl}));
+}
 
 /// A note with its octave and its spelling.
 ///
@@ -37,26 +49,34 @@ struct CNote {
 
     constexpr CNote() = default;
     /// The note number is limited to 0 to 127. The spelling is repaired, unless `TEnh_Undef`.
-    CNote(std::int64_t noteNr, TEnh enh);
+    constexpr CNote(std::int64_t noteNr, TEnh enh) : mNoteNr(ClampNoteNr(noteNr)) { SetEnh(enh); }
     /// The key in an octave, where octave -1 is the notes 0 to 11. The spelling stays as it is.
     ///
     /// An octave of 10 or more gives 108 plus the key, one below -1 gives minus the key.
-    CNote(const CKeyEnh& keyEnh, int oct);
-    CNote(const std::pair<int, TEnh>& keyEnh, int oct);
+    constexpr CNote(const CKeyEnh& keyEnh, int oct) : mEnh(keyEnh.mEnh) {
+        if (!keyEnh.IsUndef()) mNoteNr = _NoteNrFromKeyNrAndOct(keyEnh.mKeyNr, oct);
+    }
+    constexpr CNote(const std::pair<int, TEnh>& keyEnh, int oct)
+        : CNote(CKeyEnh{keyEnh.first, keyEnh.second}, oct) {}
 
     [[nodiscard]] constexpr bool IsUndef() const { return IsNoteNrUndef(mNoteNr); }
     /// 0 to 11, or 15.
-    [[nodiscard]] int KeyNr() const;
-    [[nodiscard]] CKeyEnh KeyEnh() const;
+    [[nodiscard]] constexpr int KeyNr() const { return KeyNrOfNoteNr(mNoteNr); }
+    [[nodiscard]] constexpr CKeyEnh KeyEnh() const { return {KeyNr(), mEnh}; }
     /// Of the key number: the undefined note counts as black.
-    [[nodiscard]] bool IsBlackKey() const;
-    [[nodiscard]] bool HasSensefulEnh() const;
+    [[nodiscard]] constexpr bool IsBlackKey() const { return brindle::IsBlackKey(KeyNr()); }
+    [[nodiscard]] constexpr bool HasSensefulEnh() const {
+        return IsSensefulEnhForKeyNr(KeyNr(), mEnh);
+    }
 
     /// Limits the number to 0 to 127 and keeps the spelling.
-    void SetNoteNr(std::int64_t noteNr);
+    constexpr void SetNoteNr(std::int64_t noteNr) { mNoteNr = ClampNoteNr(noteNr); }
     /// Sets the spelling, repaired unless `TEnh_Undef`.
-    void SetEnh(TEnh enh);
-    void SetEnhAndDontMakeSenseful(TEnh enh);
+    constexpr void SetEnh(TEnh enh) {
+        const bool keep = enh == TEnh_Undef;
+        mEnh = keep ? enh : MakeSensefulEnhForKeyNrAssumingCMajor(KeyNr(), enh);
+    }
+    constexpr void SetEnhAndDontMakeSenseful(TEnh enh) { mEnh = enh; }
     /// As the constructor.
     void SetNoteNrAndEnh(std::int64_t noteNr, TEnh enh);
     /// As SetNoteNr, then repairs the present spelling, `TEnh_Undef` too.
@@ -103,6 +123,14 @@ struct CNote {
     /// By note number, then by spelling, smaller first.
     friend constexpr bool operator<(const CNote& a, const CNote& b) {
         return a.mNoteNr != b.mNoteNr ? a.mNoteNr < b.mNoteNr : a.mEnh < b.mEnh;
+    }
+
+private:
+    /// The ends are kept as they are, without a check.
+    static constexpr std::int64_t _NoteNrFromKeyNrAndOct(int keyNr, int oct) {
+        if (oct >= 10) return std::int64_t{108} + keyNr;
+        if (oct < -1) return -std::int64_t{keyNr};
+        return (std::int64_t{oct} + 1) * 12 + keyNr;
     }
 };
 

@@ -5,6 +5,7 @@
 #include "brindle/theory/CChordNamePrefs.h"
 #include "brindle/theory/CIntvlSet.h"
 #include "brindle/theory/CKeyEnh.h"
+#include "brindle/theory/CNote.h"
 #include "brindle/theory/CScaleLite.h"
 #include "brindle/theory/CSignKeyLite.h"
 
@@ -26,6 +27,18 @@ inline CKeyEnh KeyEnhOf(const nlohmann::json& pair) {
 
 inline nlohmann::json FormOf(const CKeyEnh& keyEnh) {
     return {keyEnh.mKeyNr, static_cast<int>(keyEnh.mEnh)};
+}
+
+/// [noteNr, enh], taken as they stand
+inline CNote NoteOf(const nlohmann::json& pair) {
+    CNote note;
+    note.mNoteNr = pair.at(0).get<std::int64_t>();
+    note.mEnh = EnhOf(pair.at(1));
+    return note;
+}
+
+inline nlohmann::json FormOf(const CNote& note) {
+    return {note.mNoteNr, static_cast<int>(note.mEnh)};
 }
 
 inline CSemitones SemitonesOf(const nlohmann::json& mask) {
