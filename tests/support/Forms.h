@@ -6,6 +6,7 @@
 #include "brindle/theory/CIntvlSet.h"
 #include "brindle/theory/CKeyEnh.h"
 #include "brindle/theory/CNote.h"
+#include "brindle/theory/CScaleHeavy.h"
 #include "brindle/theory/CScaleLite.h"
 #include "brindle/theory/CSignKeyLite.h"
 
@@ -43,6 +44,11 @@ inline nlohmann::json FormOf(const CNote& note) {
 
 inline CSemitones SemitonesOf(const nlohmann::json& mask) {
     return CSemitones(mask.get<std::uint64_t>());
+}
+
+/// [[keyNr, enh], TScaleType]
+inline CScaleHeavy ScaleOf(const nlohmann::json& form) {
+    return {KeyEnhOf(form.at(0)), static_cast<TScaleType>(form.at(1).get<int>())};
 }
 
 /// {"mRootKeyEnh": [keyNr, enh], "mSemitones": mask}
