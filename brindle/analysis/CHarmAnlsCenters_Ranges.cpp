@@ -35,26 +35,31 @@ CHarmAnlsCenter UndefCenterFor(const CHarmAnlsChords& chords) {
     return center;
 }
 
-void Insert(CHarmAnlsCenter& center, const CHarmAnlsChords& chords) {
-    center.mChords.InsertAtCorrectPosition(chords.begin(), chords.end());
+void Insert(CHarmAnlsCenter& center, CHarmAnlsChords&& chords) {
+    if (center.mChords.empty()) {
+        center.mChords = std::move(chords);
+        center.mChords.SortByPosition();
+    } else {
+        center.mChords.InsertAtCorrectPosition(chords.begin(), chords.end());
+    }
 }
 
 /// Both return the iterator to the center that `it` pointed to.
 CHarmAnlsCenters::iterator GiveToPreceding(CHarmAnlsCenters& centers, CHarmAnlsCenters::iterator it,
-                                           const CHarmAnlsChords& chords) {
+                                           CHarmAnlsChords&& chords) {
     if (chords.empty()) return it;
     if (it == centers.begin()) it = std::next(centers.insert(it, UndefCenterFor(chords)));
-    Insert(*std::prev(it), chords);
+    Insert(*std::prev(it), std::move(chords));
     return it;
 }
 
 CHarmAnlsCenters::iterator GiveToFollowing(CHarmAnlsCenters& centers, CHarmAnlsCenters::iterator it,
-                                           const CHarmAnlsChords& chords) {
+                                           CHarmAnlsChords&& chords) {
     if (chords.empty()) return it;
     if (std::next(it) == centers.end()) {
         it = std::prev(centers.insert(centers.end(), UndefCenterFor(chords)));
     }
-    Insert(*std::next(it), chords);
+    Insert(*std::next(it), std::move(chords));
     return it;
 }
 
@@ -81,12 +86,12 @@ CHarmAnlsCenters::iterator CHarmAnlsCenters::ChangeRangeOfHarmCenter(iterator it
     if (low == oldStart && high == oldEnd) return it;
 
     it->mPosition = low;
-    const auto before = CollectAndEraseChordsFromSmallerUntilBeforeLarger(oldStart, low);
-    const auto inside = CollectAndEraseChordsFromSmallerUntilBeforeLarger(low, high);
-    const auto behind = CollectAndEraseChordsFromSmallerUntilBeforeLarger(high, oldEnd);
-    it = GiveToPreceding(*this, it, before);
-    Insert(*it, inside);
-    return GiveToFollowing(*this, it, behind);
+    auto before = CollectAndEraseChordsFromSmallerUntilBeforeLarger(oldStart, low);
+    auto inside = CollectAndEraseChordsFromSmallerUntilBeforeLarger(low, high);
+    auto behind = CollectAndEraseChordsFromSmallerUntilBeforeLarger(high, oldEnd);
+    it = GiveToPreceding(*this, it, std::move(before));
+    Insert(*it, std::move(inside));
+    return GiveToFollowing(*this, it, std::move(behind));
 }
 
 CHarmAnlsCenters::iterator CHarmAnlsCenters::CreateNewHarmCenterWithChordsAfterPos(iterator it,
