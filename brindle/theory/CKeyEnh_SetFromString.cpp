@@ -4,6 +4,9 @@
 #include "brindle/theory/KeyIntervals.h"
 #include "brindle/theory/KeyNames.h"
 
+#include <array>
+#include <cstddef>
+
 namespace brindle {
 
 namespace {
@@ -43,35 +46,26 @@ private:
     int mUsed = 0;
 };
 
+// A to H; H is the German B.
+constexpr auto kKeysOfLetters = std::to_array<CKeyEnh>({
+    CKeyEnh_A,
+    CKeyEnh_B,
+    CKeyEnh_C,
+    CKeyEnh_D,
+    CKeyEnh_E,
+    CKeyEnh_F,
+    CKeyEnh_G,
+    CKeyEnh_B,
+});
+
+/// The key of a letter in either case; undefined for any other character.
 CKeyEnh KeyOfLetter(char letter, const CChordNamePrefs& prefs) {
-    switch (letter) {
-        case 'A':
-        case 'a':
-            return CKeyEnh_A;
-        case 'B':
-        case 'b':
-            return prefs.mBForBFlat ? CKeyEnh_Bb : CKeyEnh_B;
-        case 'C':
-        case 'c':
-            return CKeyEnh_C;
-        case 'D':
-        case 'd':
-            return CKeyEnh_D;
-        case 'E':
-        case 'e':
-            return CKeyEnh_E;
-        case 'F':
-        case 'f':
-            return CKeyEnh_F;
-        case 'G':
-        case 'g':
-            return CKeyEnh_G;
-        case 'H':
-        case 'h':
-            return CKeyEnh_B;
-        default:
-            return CKeyEnh_Undef;
-    }
+    const bool isLowerCase = letter >= 'a' && letter <= 'h';
+    const bool isUpperCase = letter >= 'A' && letter <= 'H';
+    if (!isLowerCase && !isUpperCase) return CKeyEnh_Undef;
+    const auto place = static_cast<std::size_t>(letter - (isLowerCase ? 'a' : 'A'));
+    if (place == 1 && prefs.mBForBFlat) return CKeyEnh_Bb;
+    return kKeysOfLetters[place];
 }
 
 /// An accidental behind a letter and the count of characters it takes.

@@ -56,8 +56,8 @@ constexpr TStems kGermanPlainEndings = {
     "", "is", "", "es", "", "", "is", "", "is", "", "es", ""};
 // clang-format on
 
-/// The double accidentals that the flat and the sharp side have no name for: their letter is that
-/// of the key a whole tone away. 12 for no such key.
+// The double accidentals that the flat and the sharp side have no name for. Their letter is that of
+// the key a whole tone away.
 constexpr bool HasDoubleFlatOfItsOwn(std::size_t key) {
     return key == 3 || key == 10;  // Fbb, Cbb
 }
