@@ -160,6 +160,8 @@ public:
 
     /// Key and spelling of the lowest note.
     [[nodiscard]] CKeyEnh BassKeyEnh() const;
+    /// The lowest note is one of 0 to 11, where the bass of a chord made from keys stands.
+    [[nodiscard]] bool BassNoteIsInLowestOctave() const;
     /// Root and lowest note are defined and are different keys.
     [[nodiscard]] bool IsSlashChord() const;
     /// No other note has the interval that the lowest note has above the root.
@@ -243,11 +245,12 @@ public:
 private:
     void _AddTonesAndBass(const CIntvlSet& intvls, const CKeyEnh& bass);
     void _AddNoteNrAndIntvlIfNotAlreadyContained(std::int64_t noteNr);
-    void _SetNotesAndFollow(CMySet<CNote> notes);
     void _FollowLowestNote();
-    void _NotesChanged();
+    void _DelNotesOfKeyNr(int keyNr);
     [[nodiscard]] int _IntvlOfNote(const CNote& note) const;
+    /// From the root up to the key of the lowest note, 0 to 11.
     [[nodiscard]] int _BassIntvl() const;
+    [[nodiscard]] bool _IsDominantOfMinor(const CSignKeyHeavy& signKey) const;
 
     CNote mRootNote;
     CMySet<CNote> mNotes;
