@@ -12,7 +12,6 @@
 #include <bit>
 #include <boost/container/small_vector.hpp>
 #include <limits>
-#include <string>
 
 namespace brindle {
 
@@ -77,17 +76,16 @@ void CChordSetFromStringHelper::SetFromString(std::string_view symbol, CChordLit
 }
 
 bool CChordSetFromStringHelper::_StringShouldSetUndefOrNoChord(CChordLite& chord) {
-    int pos = 0;
-    if (MatchesAndAdvances(kUndefKeywords, mLowercaseText, pos)) {
+    if (Matches(kUndefKeywords, LowercaseText(), 0)) {
         chord = CChordLite_Undef;
         mBasicChord = TBasicChord::None;
         return true;
     }
-    if (MatchesAndAdvances(kNoChordForceKeywords, mLowercaseText, pos)) {
+    if (Matches(kNoChordForceKeywords, LowercaseText(), 0)) {
         chord = CChordLite_NoChordForce;
         return true;
     }
-    if (MatchesAndAdvances(kNoChordYieldKeywords, mLowercaseText, pos)) {
+    if (Matches(kNoChordYieldKeywords, LowercaseText(), 0)) {
         chord = CChordLite_NoChordYield;
         return true;
     }
@@ -97,15 +95,15 @@ bool CChordSetFromStringHelper::_StringShouldSetUndefOrNoChord(CChordLite& chord
 CSemitones CChordSetFromStringHelper::_BasicChordSemitonesFromString(int& pos) {
     CSemitones semitones;
     semitones.SetFromBasicChord(TBasicChord::Major);
-    SkipLeadingBlanks(mLowercaseText, pos);
-    if (RemainderFrom(mLowercaseText, pos).empty()) return semitones;
+    SkipLeadingBlanks(LowercaseText(), pos);
+    if (RemainderFrom(LowercaseText(), pos).empty()) return semitones;
 
     // The "m" of "maj 7" is not minor. The option itself is read later.
-    const bool isMajorOption =
-        Matches(kMaj7Keywords, mLowercaseText, pos) || Matches(kMaj9Keywords, mLowercaseText, pos);
+    const bool isMajorOption = Matches(kMaj7Keywords, LowercaseText(), pos) ||
+                               Matches(kMaj9Keywords, LowercaseText(), pos);
     for (const TBasicChordRow& row : kBasicChordRows) {
         if (isMajorOption && row.mBasicChord == TBasicChord::Minor) continue;
-        if (!MatchesAndAdvances(row.mKeywords, mLowercaseText, pos)) continue;
+        if (!MatchesAndAdvances(row.mKeywords, LowercaseText(), pos)) continue;
         mBasicChord = row.mBasicChord;
         semitones.SetFromBasicChord(row.mBasicChord);
         return semitones;
@@ -115,23 +113,16 @@ CSemitones CChordSetFromStringHelper::_BasicChordSemitonesFromString(int& pos) {
 
 CKeyEnh CChordSetFromStringHelper::_BassKeyNrAndEnhFromString(const CChordNamePrefs& prefs) const {
     CKeyEnh bass;
-    const std::size_t slash = mLowercaseText.find_last_of(prefs.mSlashText);
+    const std::size_t slash = LowercaseText().find_last_of(prefs.mSlashText);
     if (slash == std::string_view::npos) return bass;
-    bass.SetFromString(mLowercaseText.substr(slash + 1), nullptr, prefs);
+    bass.SetFromString(LowercaseText().substr(slash + 1), nullptr, prefs);
     return bass;
 }
 
 CChordSetFromStringHelper::TIntvlsOfOptions
-CChordSetFromStringHelper::_AddAndEraseIntvlsForOptionsFromString(int pos) const {
-    std::string folded;
-    std::string_view text = mLowercaseText;
-    if (text.find(kUtf8Sharp) != std::string_view::npos ||
-        text.find(kUtf8Flat) != std::string_view::npos) {
-        folded = text;
-        ConvertUtf8SharpAndFlatToAscii(folded);
-        text = folded;
-    }
-
+CChordSetFromStringHelper::_AddAndEraseIntvlsForOptionsFromString(int pos) {
+    mLowercaseText = ConvertUtf8SharpAndFlatToAscii(mLowercaseText);
+    const std::string_view text = LowercaseText();
     TIntvlsOfOptions options;
     SkipLeadingBlanks(text, pos);
     while (static_cast<std::size_t>(pos) < text.size()) {

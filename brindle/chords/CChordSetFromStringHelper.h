@@ -6,6 +6,7 @@
 #include "brindle/theory/TBasicChord.h"
 
 #include <cstdint>
+#include <span>
 #include <string_view>
 
 namespace brindle {
@@ -32,19 +33,24 @@ private:
         std::uint32_t mErase = 0;
     };
 
-    explicit CChordSetFromStringHelper(std::string_view lowercaseText)
+    explicit CChordSetFromStringHelper(std::span<char> lowercaseText)
         : mLowercaseText(lowercaseText) {}
+
+    [[nodiscard]] std::string_view LowercaseText() const {
+        return {mLowercaseText.data(), mLowercaseText.size()};
+    }
 
     [[nodiscard]] bool _StringShouldSetUndefOrNoChord(CChordLite& chord);
     [[nodiscard]] CSemitones _BasicChordSemitonesFromString(int& pos);
     [[nodiscard]] CKeyEnh _BassKeyNrAndEnhFromString(const CChordNamePrefs& prefs) const;
-    [[nodiscard]] TIntvlsOfOptions _AddAndEraseIntvlsForOptionsFromString(int pos) const;
+    /// Folds UTF-8 signs in the text, so it comes last.
+    [[nodiscard]] TIntvlsOfOptions _AddAndEraseIntvlsForOptionsFromString(int pos);
     void _AddAndEraseIntvlsForSingleOptionFromString(std::string_view text, int& pos,
                                                      TIntvlsOfOptions& options) const;
 
     /// What the text names itself; None for a major chord.
     TBasicChord mBasicChord = TBasicChord::None;
-    std::string_view mLowercaseText;
+    std::span<char> mLowercaseText;
 };
 
 }  // namespace brindle

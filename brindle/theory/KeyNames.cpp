@@ -199,8 +199,19 @@ std::string_view FlatAsUTF8OrNot(const CChordNamePrefs& prefs) {
 }
 
 void ConvertUtf8SharpAndFlatToAscii(std::string& text) {
-    ReplaceAll(text, kUtf8Sharp, "#");
-    ReplaceAll(text, kUtf8Flat, "b");
+    text.resize(ConvertUtf8SharpAndFlatToAscii(std::span<char>(text)).size());
+}
+
+std::span<char> ConvertUtf8SharpAndFlatToAscii(std::span<char> text) {
+    // A sign becomes shorter, so what is written never overtakes what is read.
+    std::size_t size = 0;
+    for (std::string_view rest(text.data(), text.size()); !rest.empty();) {
+        const bool isSharp = rest.starts_with(kUtf8Sharp);
+        const bool isSign = isSharp || rest.starts_with(kUtf8Flat);
+        text[size++] = isSharp ? '#' : isSign ? 'b' : rest.front();
+        rest.remove_prefix(isSign ? kUtf8Sharp.size() : 1);
+    }
+    return text.first(size);
 }
 
 std::string_view OptionalSpaceBetweenNameParts(const CChordNamePrefs& prefs) {

@@ -3,6 +3,7 @@
 
 #include "brindle/theory/TEnh.h"
 
+#include <span>
 #include <string>
 #include <string_view>
 
@@ -30,6 +31,8 @@ inline constexpr std::string_view kUtf8Flat = "\xE2\x99\xAD";
 
 /// Replaces every `kUtf8Sharp` by "#" and every `kUtf8Flat` by "b", in place.
 void ConvertUtf8SharpAndFlatToAscii(std::string& text);
+/// The same on characters; gives those that are left, at the start of `text`.
+std::span<char> ConvertUtf8SharpAndFlatToAscii(std::span<char> text);
 
 /// A blank or nothing, by `mNoSpaceBetweenNameParts`.
 [[nodiscard]] std::string_view OptionalSpaceBetweenNameParts(const CChordNamePrefs& prefs);
