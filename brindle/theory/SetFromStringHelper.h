@@ -15,8 +15,9 @@ namespace brindle {
 ///
 /// A keyword list is any sequence of texts. Its order matters, since the first match wins, and it
 /// keeps three rules: no keyword is empty, all are lower case, and a longer keyword stands before
-/// a shorter one that it begins with. Positions count bytes. Lower case is that of ASCII alone:
-/// other bytes never change, whatever the locale.
+/// a shorter one that it begins with (where a keyword must be the whole remainder, the last rule
+/// does not matter). Positions count bytes. Lower case is that of ASCII alone: other bytes never
+/// change, whatever the locale.
 namespace SetFromStringHelper {
 
 /// How much of the remaining text a keyword must account for.
