@@ -54,6 +54,8 @@ public:
     void SetRootNoteEnhWithLeastSigns();
     /// Walks `signs` fifths up from C, for minor from A; down if negative.
     void SetFromSignsCountAndType(int signs, TSignKeyTypeNoUndef type);
+    /// Reads a text such as "F# minor", see SignKeyStrings.h.
+    void SetFromString(std::string_view text, const CChordNamePrefs& prefs);
 
     /// The name of the root, with "m" behind it for minor; "Undef".
     [[nodiscard]] std::string NameShort(const CChordNamePrefs& prefs) const;
