@@ -227,11 +227,9 @@ private:
     static constexpr std::int8_t kOwnRow = -1;
     static constexpr std::int8_t kEmptyRow = 29;
 
-    [[nodiscard]] CKeyEnh _SignsCount_MajorKeyToSearch() const;
-    [[nodiscard]] static int _SignsCount_DetermineSignsCountBySearchingCycleOfFifths(
-        const CKeyEnh& majorKey);
-    void _CalcEnh_DiatonicNotes();
-    void _CalcEnh_ChromaticNotes();
+    /// The type of this scale, or for a custom scale one whose signs it shares: the signs of a
+    /// minor scale for a minor third without a major one, else those of the major scale.
+    [[nodiscard]] TScaleType _SignsCount_NamedType() const;
 
     CNote mRootNote;
     TScaleType mScaleType = st_Undef;

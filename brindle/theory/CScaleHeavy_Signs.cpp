@@ -1,21 +1,37 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/theory/CKeyEnhUtil.h"
 #include "brindle/theory/CScaleHeavy.h"
-#include "brindle/theory/KeyIntervals.h"
 #include "brindle/theory/Spelling.h"
 
-#include <algorithm>
+#include <cstdlib>
+
+// The signs of a scale are those of a major scale: its own, the one with the same notes, or the
+// one a minor third above a minor root. How many sharps or flats that major scale has is found by
+// walking the cycle of fifths from C. Scales are spelled so often (24 keys for each chord, when a
+// key is looked for) that all answers are worked out once, for each root and each named scale.
 
 namespace brindle {
 
 namespace {
 
 constexpr int kFifth = 7;
-constexpr int kMinorToMajor = -9;  // from A down to C
 constexpr int kFifthsToSearch = 24;
+constexpr int kMinorToMajor = -9;  // from A down to C
 
-/// How many fifths up or down from C the key is, by a walk; 25 or -25 when the walk misses it.
-int WalkFifthsTo(const CKeyEnh& majorKey) {
+/// 12 sharps more or less are the same keys, so very many signs are written as fewer.
+int FoldSignsCount(int signsCount) {
+    if (signsCount >= 19) return signsCount - 12;
+    return signsCount < -14 ? signsCount + 12 : signsCount;
+}
+
+CKeyEnh MajorKeyToSearch(const CKeyEnh& root, TScaleType type) {
+    if (IsScaleTypeModal(type)) return CKeyEnhUtil::RelatedIonianScaleRootKeyEnh(root, type);
+    const bool isMinor = CScaleHeavy::GetModeForScaleType(type) == TScaleMode_Minor;
+    return isMinor ? root + kMinorToMajor : root;
+}
+
+/// How many fifths up (or down, negative) from C the key is; 25 or -25 when the walk misses it.
+int FifthsFromC(const CKeyEnh& majorKey) {
     if (majorKey == CKeyEnh_C) return 0;
     const int direction = majorKey.mEnh >= TEnh_n && majorKey != CKeyEnh_F ? 1 : -1;
     CKeyEnh key = CKeyEnh_C;
@@ -26,69 +42,65 @@ int WalkFifthsTo(const CKeyEnh& majorKey) {
     return direction * (kFifthsToSearch + 1);
 }
 
-/// The results of the walk for every key and every spelling from `TEnh_bbb` to `TEnh_Undef`.
-class TFifthsFromC {
+int CountSigns(const CKeyEnh& root, TScaleType type) {
+    CKeyEnh majorKey = MajorKeyToSearch(root, type);
+    if (majorKey.IsUndef()) return 0;
+    if (root.mEnh == TEnh_Undef) {
+        majorKey.mEnh =
+            MakeSensefulEnhForKeyNrMajorScaleRootWithLeastSigns(majorKey.mKeyNr, majorKey.mEnh);
+    }
+    return FoldSignsCount(FifthsFromC(majorKey));
+}
+
+/// The signs of every named scale on every root, spelled `TEnh_bbb` to `TEnh_Undef`.
+class TSignsOfScales {
 public:
-    TFifthsFromC() {
-        for (int keyNr = 0; keyNr < 12; ++keyNr) {
-            for (int enh = TEnh_bbb; enh <= TEnh_Undef; ++enh) {
-                const CKeyEnh key{keyNr, static_cast<TEnh>(enh)};
-                mFifths[Index(key)] = static_cast<std::int8_t>(WalkFifthsTo(key));
+    TSignsOfScales() {
+        for (int type = 0; type < st_Count; ++type) {
+            for (int root = 0; root < kRoots; ++root) {
+                mSigns[static_cast<std::size_t>(type * kRoots + root)] =
+                    static_cast<std::int8_t>(CountSigns(Root(root), static_cast<TScaleType>(type)));
             }
         }
     }
 
-    [[nodiscard]] int To(const CKeyEnh& key) const { return mFifths[Index(key)]; }
-
-    [[nodiscard]] static bool Holds(const CKeyEnh& key) {
-        return key.mKeyNr >= 0 && key.mKeyNr < 12 && key.mEnh >= TEnh_bbb && key.mEnh <= TEnh_Undef;
+    [[nodiscard]] static bool Holds(const CKeyEnh& root, TScaleType type) {
+        return type >= 0 && type < st_Count && root.mKeyNr >= 0 && root.mKeyNr < 12 &&
+               root.mEnh >= TEnh_bbb && root.mEnh <= TEnh_Undef;
+    }
+    [[nodiscard]] int Of(const CKeyEnh& root, TScaleType type) const {
+        const int ix = root.mKeyNr * kSpellings + (root.mEnh - TEnh_bbb);
+        return mSigns[static_cast<std::size_t>(type * kRoots + ix)];
     }
 
 private:
-    static constexpr std::size_t kSpellings = TEnh_Undef - TEnh_bbb + 1;
+    static constexpr int kSpellings = TEnh_Undef - TEnh_bbb + 1;
+    static constexpr int kRoots = 12 * kSpellings;
 
-    [[nodiscard]] static std::size_t Index(const CKeyEnh& key) {
-        return static_cast<std::size_t>(key.mKeyNr) * kSpellings +
-               static_cast<std::size_t>(key.mEnh - TEnh_bbb);
+    [[nodiscard]] static CKeyEnh Root(int ix) {
+        return {ix / kSpellings, static_cast<TEnh>(ix % kSpellings + TEnh_bbb)};
     }
 
-    std::array<std::int8_t, 12 * kSpellings> mFifths{};
+    std::array<std::int8_t, st_Count * kRoots> mSigns{};
 };
-
-/// 12 sharps and 12 flats are the same keys, so very many signs are written as fewer.
-int FoldSignsCount(int signsCount) {
-    if (signsCount >= 19) return signsCount - 12;
-    return signsCount < -14 ? signsCount + 12 : signsCount;
-}
 
 }  // namespace
 
 int CScaleHeavy::SignsCount() const {
     if (IsUndef()) return 0;
-    CKeyEnh majorKey = _SignsCount_MajorKeyToSearch();
-    if (majorKey.IsUndef()) return 0;
-    if (mRootNote.mEnh == TEnh_Undef) {
-        majorKey.mEnh =
-            MakeSensefulEnhForKeyNrMajorScaleRootWithLeastSigns(majorKey.mKeyNr, majorKey.mEnh);
-    }
-    return FoldSignsCount(_SignsCount_DetermineSignsCountBySearchingCycleOfFifths(majorKey));
+    static const TSignsOfScales signs;
+    const CKeyEnh root = RootKeyEnh();
+    const TScaleType type = _SignsCount_NamedType();
+    return TSignsOfScales::Holds(root, type) ? signs.Of(root, type) : CountSigns(root, type);
 }
 
 int CScaleHeavy::SignsCountAbs() const {
     return std::abs(SignsCount());
 }
 
-CKeyEnh CScaleHeavy::_SignsCount_MajorKeyToSearch() const {
-    if (IsModalScale()) return RelatedIonianScaleRootKeyEnh();
-    const TScaleMode mode = ScaleRow().mMode;
-    const bool isCustom = mScaleType == st_custom && mode == TScaleMode_Custom;
-    const bool isMinor = isCustom ? HasIntvl(3) && !HasIntvl(4) : mode == TScaleMode_Minor;
-    return isMinor ? RootKeyEnh() + kMinorToMajor : RootKeyEnh();
-}
-
-int CScaleHeavy::_SignsCount_DetermineSignsCountBySearchingCycleOfFifths(const CKeyEnh& majorKey) {
-    static const TFifthsFromC fifths;
-    return TFifthsFromC::Holds(majorKey) ? fifths.To(majorKey) : WalkFifthsTo(majorKey);
+TScaleType CScaleHeavy::_SignsCount_NamedType() const {
+    if (mScaleType != st_custom) return mScaleType;
+    return HasIntvl(3) && !HasIntvl(4) ? st_min_harm : st_chrom;
 }
 
 }  // namespace brindle

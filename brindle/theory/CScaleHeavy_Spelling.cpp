@@ -9,31 +9,101 @@ namespace brindle {
 
 namespace {
 
-// The keys of F C G D A E B, the order in which sharps come; flats come in the reverse order.
-constexpr std::array<int, 7> kNaturalKeysInFifths{5, 0, 7, 2, 9, 4, 11};
+using TSpellings = std::array<TEnh, 12>;
 
 // By semitone above the root, where the neighbour lies that spells a key between the seven
 // letters: 1 above, -1 below. In C major C sharp is spelled from C and E flat from E, while minor
-// scales prefer D flat. Steps of 0 are letters in the scales that the tables were made for.
+// scales prefer D flat.
 constexpr std::array<int, 12> kNeighbourInMinor{0, 1, 0, 0, -1, 0, -1, 0, 0, -1, 0, -1};
 constexpr std::array<int, 12> kNeighbourInMajor{0, -1, 0, 1, 0, 0, -1, 0, 1, 0, 1, 0};
+
+constexpr bool StaysWithinOctave(const std::array<int, 12>& neighbours) {
+    for (int step = 0; step < 12; ++step) {
+        const int neighbour = step + neighbours[static_cast<std::size_t>(step)];
+        if (neighbour < 0 || neighbour > 11) return false;
+    }
+    return true;
+}
+static_assert(StaysWithinOctave(kNeighbourInMinor) && StaysWithinOctave(kNeighbourInMajor));
 
 constexpr bool IsOfMinorColour(TScaleType type) {
     return type == st_min || type == st_min_harm || type == st_min_melo || type == st_min_pent ||
            type == st_dorian;
 }
 
-constexpr int FloorDivide(int value, int divisor) {
-    return (value - (value % divisor + divisor) % divisor) / divisor;
+// The row of fifths, F C G D A E B and then the same letters one sharp higher, or before them one
+// flat lower. C is 0. A scale with n signs has seven neighbours of it: those from F to B (-1 to 5)
+// moved up by n, which gives F and the letters after it a sharp, or B and those before it a flat.
+constexpr int kFewestSigns = -14;
+constexpr int kMostSigns = 18;
+constexpr int kFirstFifth = kFewestSigns - 1;
+constexpr auto kKeysInFifths = [] {
+    std::array<CKeyEnh, kMostSigns - kFewestSigns + 7> keys{};
+    for (std::size_t n = 0; n < keys.size(); ++n) {
+        const int fifth = kFirstFifth + static_cast<int>(n);
+        const int octavesOfLetters = (fifth + 1 + 21) / 7 - 3;  // rounded down
+        keys[n] = {FoldIntoOctave(7 * fifth), static_cast<TEnh>(TEnh_n + octavesOfLetters)};
+    }
+    return keys;
+}();
+static_assert(kKeysInFifths[0 - kFirstFifth] == CKeyEnh_C);
+static_assert(kKeysInFifths.front() == CKeyEnh_Fbb && kKeysInFifths.back() == CKeyEnh_Dxs);
+
+/// By semitone above the root, the seven letters under the signs; the others stay undefined.
+constexpr TSpellings DiatonicSpellings(int rootKeyNr, int signsCount) {
+    TSpellings spellings{};
+    spellings.fill(TEnh_Undef);
+    const auto f = static_cast<std::size_t>(signsCount - kFewestSigns);
+    for (std::size_t n = f; n < f + 7; ++n) {
+        const CKeyEnh& key = kKeysInFifths[n];
+        const int step = key.mKeyNr - rootKeyNr;
+        spellings[static_cast<std::size_t>(step < 0 ? step + 12 : step)] = key.mEnh;
+    }
+    return spellings;
 }
 
-/// The spelling of the key whose neighbour at `distance` is spelled `neighbour`.
-TEnh SpellFromNeighbour(TEnh neighbour, int distance) {
+/// The spelling of a key whose neighbour at `distance` is spelled `neighbour`.
+constexpr TEnh SpellFromNeighbour(TEnh neighbour, int distance) {
     // Kept: one accidental too far turns back, so that a triple flat comes out as a single one.
-    const int value = std::abs(neighbour - distance);
+    const int difference = neighbour - distance;
+    const int value = difference < 0 ? -difference : difference;
     const int folded = value < 5 ? value : 8 - value;
     return static_cast<TEnh>(std::clamp<int>(folded, TEnh_bb, TEnh_ss));
 }
+
+constexpr void AddChromaticSpellings(TSpellings& spellings, const std::array<int, 12>& neighbours) {
+    for (std::size_t step = 0; step < 12; ++step) {
+        if (spellings[step] != TEnh_Undef) continue;
+        const int distance = neighbours[step];
+        const TEnh neighbour =
+            spellings[static_cast<std::size_t>(static_cast<int>(step) + distance)];
+        if (neighbour != TEnh_Undef) spellings[step] = SpellFromNeighbour(neighbour, distance);
+    }
+}
+
+/// The spelling of each key number.
+constexpr TSpellings SpellingsByKey(int rootKeyNr, int signsCount, bool isMinorColour) {
+    TSpellings byStep = DiatonicSpellings(rootKeyNr, signsCount);
+    AddChromaticSpellings(byStep, isMinorColour ? kNeighbourInMinor : kNeighbourInMajor);
+    TSpellings byKey{};
+    std::rotate_copy(byStep.begin(), byStep.end() - rootKeyNr, byStep.end(), byKey.begin());
+    return byKey;
+}
+
+// Everything that can come out, since scales are spelled very often.
+constexpr auto kSpellings = [] {
+    std::array<std::array<std::array<TSpellings, kMostSigns - kFewestSigns + 1>, 12>, 2> all{};
+    for (std::size_t colour = 0; colour < 2; ++colour) {
+        for (int rootKeyNr = 0; rootKeyNr < 12; ++rootKeyNr) {
+            for (int signs = kFewestSigns; signs <= kMostSigns; ++signs) {
+                all[colour][static_cast<std::size_t>(rootKeyNr)]
+                   [static_cast<std::size_t>(signs - kFewestSigns)] =
+                       SpellingsByKey(rootKeyNr, signs, colour == 1);
+            }
+        }
+    }
+    return all;
+}();
 
 std::size_t IndexOfKey(std::int64_t keyNr) {
     return static_cast<std::size_t>(FoldIntoOctave(keyNr));
@@ -42,32 +112,12 @@ std::size_t IndexOfKey(std::int64_t keyNr) {
 }  // namespace
 
 void CScaleHeavy::CalcEnh() {
-    mEnhOfKeyNr.fill(TEnh_Undef);
-    if (IsUndef() || ScaleRow().mMode == TScaleMode_Custom) return;
-    _CalcEnh_DiatonicNotes();
-    _CalcEnh_ChromaticNotes();
-}
-
-void CScaleHeavy::_CalcEnh_DiatonicNotes() {
-    const int signsCount = SignsCount();
-    for (int letter = 0; letter < 7; ++letter) {
-        // Each sharp raises the next letter of the row, round and round; each flat lowers one.
-        const int accidental = FloorDivide(signsCount + 6 - letter, 7);
-        const int naturalKey = kNaturalKeysInFifths[static_cast<std::size_t>(letter)];
-        mEnhOfKeyNr[IndexOfKey(naturalKey + accidental)] = static_cast<TEnh>(TEnh_n + accidental);
+    if (IsUndef() || ScaleRow().mMode == TScaleMode_Custom) {
+        mEnhOfKeyNr.fill(TEnh_Undef);
+        return;
     }
-}
-
-void CScaleHeavy::_CalcEnh_ChromaticNotes() {
-    const auto& neighbours = IsOfMinorColour(mScaleType) ? kNeighbourInMinor : kNeighbourInMajor;
-    const int rootKeyNr = RootKeyNr();
-    for (int step = 0; step < 12; ++step) {
-        TEnh& enh = mEnhOfKeyNr[IndexOfKey(rootKeyNr + step)];
-        if (enh != TEnh_Undef) continue;
-        const int distance = neighbours[static_cast<std::size_t>(step)];
-        const TEnh neighbour = mEnhOfKeyNr[IndexOfKey(rootKeyNr + step + distance)];
-        if (neighbour != TEnh_Undef) enh = SpellFromNeighbour(neighbour, distance);
-    }
+    const auto& ofRoot = kSpellings[IsOfMinorColour(mScaleType)][IndexOfKey(RootKeyNr())];
+    mEnhOfKeyNr = ofRoot[static_cast<std::size_t>(SignsCount() - kFewestSigns)];
 }
 
 TEnh CScaleHeavy::EnhForKeyNr(int keyNr) const {

@@ -161,6 +161,18 @@ TEST_CASE("The root is repaired when it is set as a key and kept when it is set 
     CHECK(scale.RootKeyEnh() == CKeyEnh_Gis);
 }
 
+TEST_CASE("A root without a place in the cycle of fifths counts as far out") {
+    CScaleHeavy scale(CKeyEnh_C, st_maj);
+    CNote strange(60, TEnh_n);
+    for (const int enh : {6, 100, -128}) {
+        strange.SetEnhAndDontMakeSenseful(static_cast<TEnh>(enh));
+        scale.SetRootNote(strange);
+        CHECK(scale.SignsCount() == (enh < 0 ? -13 : 13));
+        scale.SetScaleType(enh == 100 ? static_cast<TScaleType>(-3) : st_maj);
+        CHECK(scale.EnhForKeyNr(0) != TEnh_Undef);
+    }
+}
+
 TEST_CASE("Nothing belongs to an undefined scale") {
     for (const CScaleHeavy& scale :
          {CScaleHeavy(), CScaleHeavy(CKeyEnh_Undef, st_maj), CScaleHeavy(CKeyEnh_C, st_Undef)}) {
