@@ -17,6 +17,7 @@ namespace brindle {
 
 struct CHarmCenterWeightAnalysisParams;
 struct TChordStringParse;
+struct TMusicXMLDoc;
 
 /// Harmonic analysis: takes a chord sequence, and the sign keys if the score states them, and finds
 /// the harmonic centers and the function of each chord.
@@ -44,6 +45,11 @@ public:
     /// default settings: the other arguments are ignored. An unreadable file is an empty text.
     void AnalyseFromChordStringFile(const std::string& path, const CHarmAnlsSignKeys& signKeys,
                                     TAnalyse analyse, const TChordStringParse& parse);
+    /// Analyses a plain MusicXML file as TMusicXMLDoc::LoadFromMusicXMLFile reads it. Sign keys are
+    /// added to those that the object holds.
+    void AnalyseFromMusicXMLFile(const std::string& path, TAnalyse analyse);
+    /// Analyses a lead sheet that was loaded before, in the same way.
+    void AnalyseFromMusicXMLDoc(const TMusicXMLDoc& doc, TAnalyse analyse);
     /// Analyses what the object holds. May be called again on its own result.
     void Analyse(TAnalyse analyse);
 

@@ -5,6 +5,8 @@
 #include <doctest/doctest.h>
 #include <zip.h>
 
+#include <unistd.h>
+
 #include <filesystem>
 #include <string>
 #include <vector>
@@ -15,7 +17,9 @@ namespace {
 
 class CFolder {
 public:
-    CFolder() : mPath(std::filesystem::temp_directory_path() / "brindle_files_test") {
+    CFolder()
+        : mPath(std::filesystem::temp_directory_path() /
+                ("brindle_files_test_" + std::to_string(getpid()))) {
         std::filesystem::remove_all(mPath);
         std::filesystem::create_directories(mPath);
     }

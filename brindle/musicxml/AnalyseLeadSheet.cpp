@@ -1,0 +1,84 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/analysis/CHarmonicAnalyse.h"
+#include "brindle/chords/CChordHeavy.h"
+#include "brindle/musicxml/CChordSetFromMusicXml.h"
+#include "brindle/musicxml/TMusicXMLDoc.h"
+#include "brindle/theory/CChordNamePrefs.h"
+
+#include <algorithm>
+#include <limits>
+#include <vector>
+
+namespace brindle {
+
+namespace {
+
+bool IsNoChord(const TMusicXMLHarmony& harmony) {
+    return harmony.mRoot.mStep == "N.C." || harmony.mKind == "none";
+}
+
+CHarmAnlsChordWithPos ChordOf(const TMusicXMLHarmony& harmony) {
+    CChordLite chord;
+    chord.SetFromChordHeavy(CChordSetFromMusicXml(harmony, 24, CurrentChordNamePrefs));
+    return CHarmAnlsChordWithPos(CHarmAnlsChord(chord), harmony.mPosition);
+}
+
+/// Finds the last sign key that starts at or before a position, in any order of sign keys.
+class CSignKeyFinder {
+public:
+    explicit CSignKeyFinder(CHarmAnlsSignKeys& signKeys) : mSignKeys(signKeys) {
+        mLowestFromHere.resize(signKeys.size());
+        double lowest = std::numeric_limits<double>::infinity();
+        for (std::size_t i = signKeys.size(); i-- > 0;) {
+            lowest = std::min(lowest, signKeys[i].mPosition);
+            mLowestFromHere[i] = lowest;
+        }
+    }
+
+    [[nodiscard]] CHarmAnlsSignKey* At(double position) const {
+        const auto behind =
+            std::upper_bound(mLowestFromHere.begin(), mLowestFromHere.end(), position);
+        if (behind == mLowestFromHere.begin()) return nullptr;
+        return &mSignKeys[static_cast<std::size_t>(behind - mLowestFromHere.begin() - 1)];
+    }
+
+private:
+    CHarmAnlsSignKeys& mSignKeys;
+    std::vector<double> mLowestFromHere;  // ascending
+};
+
+}  // namespace
+
+void CHarmonicAnalyse::AnalyseFromMusicXMLFile(const std::string& path, TAnalyse analyse) {
+    TMusicXMLDoc doc;
+    (void)doc.LoadFromMusicXMLFile(path);
+    AnalyseFromMusicXMLDoc(doc, analyse);
+}
+
+void CHarmonicAnalyse::AnalyseFromMusicXMLDoc(const TMusicXMLDoc& doc, TAnalyse analyse) {
+    mChords.clear();
+    mSignKeys.insert(mSignKeys.end(), doc.HarmSignKeys.begin(), doc.HarmSignKeys.end());
+    if (mSignKeys.empty()) mSignKeys.emplace_back();
+    const CSignKeyFinder finder(mSignKeys);
+    bool wasPlaced = false;
+    double endPosition = kPosUndef;
+    for (const TMusicXMLHarmony& harmony : doc.Harmonies) {
+        if (IsNoChord(harmony)) continue;
+        const CHarmAnlsChordWithPos chord = ChordOf(harmony);
+        mChords.push_back(chord);
+        if (CHarmAnlsSignKey* signKey = finder.At(harmony.mPosition)) {
+            if (signKey->mHarmCenters.empty()) signKey->mHarmCenters.emplace_back();
+            signKey->mHarmCenters.back().mChords.push_back(chord);
+            wasPlaced = true;
+        }
+        endPosition = harmony.mPosition + harmony.mDuration;
+    }
+    CHarmAnlsCenters& lastCenters = mSignKeys.back().mHarmCenters;
+    if (wasPlaced && !lastCenters.empty() && endPosition != kPosUndef) {
+        lastCenters.back().mChords.push_back(CHarmAnlsChordWithPos(CHarmAnlsChord(), endPosition));
+    }
+    mChordSequences = doc.ChordSequences;
+    Analyse(analyse);
+}
+
+}  // namespace brindle

@@ -1,0 +1,29 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/musicxml/TMusicXMLMeasure.h"
+
+#include <cstdint>
+#include <span>
+#include <string_view>
+#include <utility>
+
+namespace brindle {
+
+struct TMusicXMLDoc;
+
+/// The written measures of a lead sheet and the jumps between them.
+struct TWrittenMeasures {
+    std::span<const TMusicXMLMeasure> mMeasures;
+    std::span<const std::pair<std::int32_t, std::int32_t>> mCodaPairs;
+    std::span<const std::pair<std::int32_t, std::int32_t>> mSegnoPairs;
+};
+
+/// Walks the measures in playing order and appends what they hold to `doc`. False when the walk was
+/// cut at kMaxPlayedMeasures or kMaxPlayedBytes.
+bool PlayMeasures(const TWrittenMeasures& written, TMusicXMLDoc& doc);
+
+/// Whether a text tells how often a repeat is played: 2 to 4 characters with an "x", as in "3x".
+[[nodiscard]] bool IsRepeatWord(std::string_view text);
+
+}  // namespace brindle

@@ -1,0 +1,27 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/musicxml/TMusicXMLDoc.h"
+
+#include "brindle/musicxml/MusicXmlParserHarmonyDelegate.h"
+#include "brindle/platform/AtomicFile.h"
+#include "brindle/platform/XmlStreamParser.h"
+
+namespace brindle {
+
+void TMusicXMLDoc::clear() {
+    Title.clear();
+    HarmSignKeys.clear();
+    Harmonies.clear();
+}
+
+bool TMusicXMLDoc::LoadFromMusicXMLFile(const std::string& path) {
+    clear();
+    const std::string bytes = ReadWholeFile(path).value_or(std::string());
+    XmlStreamParser parser;
+    MusicXmlParserHarmonyDelegate delegate;
+    parser.setDelegate(&delegate);
+    const bool isWellFormed = parser.parse(bytes);
+    *this = delegate.takeDoc();
+    return isWellFormed && !delegate.WasCut();
+}
+
+}  // namespace brindle

@@ -1,0 +1,74 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/analysis/CHarmAnlsSignKeys.h"
+#include "brindle/analysis/CHarmCopy.h"
+#include "brindle/analysis/Positions.h"
+#include "brindle/musicxml/TMusicXMLHarmony.h"
+
+#include <cstddef>
+#include <cstdint>
+#include <string>
+#include <vector>
+
+namespace brindle {
+
+/// Most measures that one song may play, repeats and jumps counted. A song that goes on is cut
+/// there, and its load reports failure.
+inline constexpr std::size_t kMaxPlayedMeasures = 1'000'000;
+/// Most room in bytes that the played harmonies of one song may take; the same happens beyond.
+inline constexpr std::size_t kMaxPlayedBytes = std::size_t{1} << 30;
+
+struct TMusicXMLTimeSignature {
+    double mPosition = kPosUndef;
+    std::int32_t mNumerator = 4;
+    std::int32_t mDenominator = 4;
+
+    friend bool operator==(const TMusicXMLTimeSignature&, const TMusicXMLTimeSignature&) = default;
+};
+
+/// A part of a song that begins at a rehearsal mark.
+struct CHarmSection {
+    double mPosition = kPosUndef;
+    bool mFlag1 = false;
+    bool mFlag2 = true;
+    /// True only for the first section of a song.
+    bool mIsFirst = false;
+
+    friend bool operator==(const CHarmSection&, const CHarmSection&) = default;
+};
+
+/// The start of a bar as it is played.
+struct CHarmBarline {
+    double mPosition = kPosUndef;
+
+    friend bool operator==(const CHarmBarline&, const CHarmBarline&) = default;
+};
+
+/// The harmonies of a lead sheet in playing order, with repeats, endings and jumps played through.
+/// All positions are quarter notes from the start of the song.
+struct TMusicXMLDoc {
+    std::string Title;
+    /// The keys as read, at unknown positions, then each change where it is played.
+    CHarmAnlsSignKeys HarmSignKeys;
+    std::vector<TMusicXMLHarmony> Harmonies;
+    /// Indexes into `Harmonies`, one for each measure with the word "/".
+    std::vector<std::uint64_t> ChordSequences;
+    std::vector<TMusicXMLTimeSignature> TimeSignatures;
+    std::vector<CHarmSection> HarmSections;
+    /// One entry for each jump back.
+    CHarmCopies HarmCopies;
+    /// Left empty by LoadFromMusicXMLFile.
+    std::vector<CHarmBarline> HarmBarlines;
+
+    /// Empties the title, the sign keys and the harmonies; the other fields stay.
+    void clear();
+
+    /// Reads a plain MusicXML file. A harmony lasts as long as the last duration read behind it,
+    /// measures without harmonies take no time, and all parts are read as one song. False when the
+    /// file cannot be read or is not well-formed (what was read before the fault stays), or when
+    /// the song does not end.
+    bool LoadFromMusicXMLFile(const std::string& path);
+};
+
+}  // namespace brindle

@@ -1,0 +1,66 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/analysis/Positions.h"
+#include "brindle/theory/CKeyEnh.h"
+
+#include <cstdint>
+#include <string>
+#include <vector>
+
+namespace brindle {
+
+struct CChordNamePrefs;
+
+/// A tone of a lead-sheet chord as it is written: a letter and how far it is altered.
+struct TMusicXMLPitch {
+    std::string mStep;
+    /// Semitones, negative for flats.
+    std::int32_t mAlter = 0;
+
+    [[nodiscard]] bool IsDefined() const { return !mStep.empty(); }
+    /// The spelled key; the alteration is limited to double flat and double sharp. Undefined when
+    /// the step is no letter of a note.
+    [[nodiscard]] CKeyEnh ToKeyEnh(const CChordNamePrefs& prefs) const;
+    [[nodiscard]] CKeyEnh ToKeyNrAndEnh(const CChordNamePrefs& prefs) const {
+        return ToKeyEnh(prefs);
+    }
+    [[nodiscard]] int ToKeyNr(const CChordNamePrefs& prefs) const { return ToKeyEnh(prefs).mKeyNr; }
+
+    friend bool operator==(const TMusicXMLPitch&, const TMusicXMLPitch&) = default;
+};
+
+/// A tone that is added to a chord, altered in it or left out.
+struct TMusicXMLDegree {
+    std::string mValue;
+    std::int32_t mAlter = 0;
+    /// "add", "alter" or "subtract".
+    std::string mType;
+
+    friend bool operator==(const TMusicXMLDegree&, const TMusicXMLDegree&) = default;
+};
+
+/// Whether TMusicXMLHarmony::CompareAllMembers looks at the position.
+enum TComparePos : std::int32_t {
+    TComparePos_Yes = 0,
+    TComparePos_No = 1,
+};
+
+/// One chord symbol of a lead sheet where it is played. Positions and lengths are quarter notes.
+struct TMusicXMLHarmony {
+    double mPosition = kPosUndef;
+    double mDuration = kPosUndef;
+    TMusicXMLPitch mRoot;
+    std::string mExtraText1;
+    /// A word such as "major-seventh", see HarmonyKinds.h.
+    std::string mKind;
+    TMusicXMLPitch mBass;
+    std::vector<TMusicXMLDegree> mDegrees;
+    std::string mExtraText2;
+
+    /// Equality of position (if asked for), kind, root, bass, duration and first text. The degrees
+    /// are not compared.
+    [[nodiscard]] bool CompareAllMembers(const TMusicXMLHarmony& other, TComparePos mode) const;
+};
+
+}  // namespace brindle

@@ -1,0 +1,51 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/musicxml/XPathHelpers.h"
+
+#include "brindle/platform/PlainNumber.h"
+
+#include <algorithm>
+
+namespace brindle {
+
+std::optional<std::string> NSStringValueForXPath(const XmlNode& node, const XmlPath& path,
+                                                 std::optional<std::string> defaultValue) {
+    const XmlNode found = node.firstForXPath(path);
+    return found ? found.stringValue() : std::move(defaultValue);
+}
+
+std::string StringValueForXPath(const XmlNode& node, const XmlPath& path,
+                                std::string_view defaultValue) {
+    const XmlNode found = node.firstForXPath(path);
+    return found ? found.stringValue() : std::string(defaultValue);
+}
+
+std::string LowercaseStringValueForXPath(const XmlNode& node, const XmlPath& path,
+                                         std::string_view defaultValue) {
+    const XmlNode found = node.firstForXPath(path);
+    if (!found) return std::string(defaultValue);
+    std::string text = found.stringValue();
+    std::transform(text.begin(), text.end(), text.begin(), [](char letter) {
+        return letter >= 'A' && letter <= 'Z' ? static_cast<char>(letter - 'A' + 'a') : letter;
+    });
+    return text;
+}
+
+std::int32_t IntValueForXPath(const XmlNode& node, const XmlPath& path, std::int32_t defaultValue) {
+    const XmlNode found = node.firstForXPath(path);
+    return found ? PlainNumber::ReadInteger(found.stringValue()) : defaultValue;
+}
+
+double DoubleValueForXPath(const XmlNode& node, const XmlPath& path, double defaultValue) {
+    const XmlNode found = node.firstForXPath(path);
+    return found ? PlainNumber::ReadDouble(found.stringValue()) : defaultValue;
+}
+
+XmlNode XMLElementForXPath(const XmlNode& node, const XmlPath& path) {
+    return node.firstForXPath(path);
+}
+
+bool XPathExists(const XmlNode& node, const XmlPath& path) {
+    return static_cast<bool>(node.firstForXPath(path));
+}
+
+}  // namespace brindle
