@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-#include "brindle/neural/NetTexts.h"
 #include "brindle/neural/NeuronalNet.h"
+#include "brindle/neural/internal/NetTexts.h"
 
 #include <fmt/core.h>
 
