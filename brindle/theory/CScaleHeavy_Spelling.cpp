@@ -11,6 +11,10 @@ namespace {
 
 using TSpellings = std::array<TEnh, 12>;
 
+constexpr std::size_t IndexOfKey(std::int64_t keyNr) {
+    return static_cast<std::size_t>(FoldIntoOctave(keyNr));
+}
+
 // By semitone above the root, where the neighbour lies that spells a key between the seven
 // letters: 1 above, -1 below. In C major C sharp is spelled from C and E flat from E, while minor
 // scales prefer D flat.
@@ -41,8 +45,8 @@ constexpr auto kKeysInFifths = [] {
     std::array<CKeyEnh, kMostSigns - kFewestSigns + 7> keys{};
     for (std::size_t n = 0; n < keys.size(); ++n) {
         const int fifth = kFirstFifth + static_cast<int>(n);
-        const int octavesOfLetters = (fifth + 1 + 21) / 7 - 3;  // rounded down
-        keys[n] = {FoldIntoOctave(7 * fifth), static_cast<TEnh>(TEnh_n + octavesOfLetters)};
+        const int timesRound = (fifth + 1 + 21) / 7 - 3;  // rounded down
+        keys[n] = {FoldIntoOctave(7 * fifth), static_cast<TEnh>(TEnh_n + timesRound)};
     }
     return keys;
 }();
@@ -53,11 +57,10 @@ static_assert(kKeysInFifths.front() == CKeyEnh_Fbb && kKeysInFifths.back() == CK
 constexpr TSpellings DiatonicSpellings(int rootKeyNr, int signsCount) {
     TSpellings spellings{};
     spellings.fill(TEnh_Undef);
-    const auto f = static_cast<std::size_t>(signsCount - kFewestSigns);
-    for (std::size_t n = f; n < f + 7; ++n) {
+    const auto first = static_cast<std::size_t>(signsCount - kFewestSigns);
+    for (std::size_t n = first; n < first + 7; ++n) {
         const CKeyEnh& key = kKeysInFifths[n];
-        const int step = key.mKeyNr - rootKeyNr;
-        spellings[static_cast<std::size_t>(step < 0 ? step + 12 : step)] = key.mEnh;
+        spellings[IndexOfKey(key.mKeyNr - rootKeyNr)] = key.mEnh;
     }
     return spellings;
 }
@@ -104,10 +107,6 @@ constexpr auto kSpellings = [] {
     }
     return all;
 }();
-
-std::size_t IndexOfKey(std::int64_t keyNr) {
-    return static_cast<std::size_t>(FoldIntoOctave(keyNr));
-}
 
 }  // namespace
 
