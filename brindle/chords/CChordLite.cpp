@@ -106,8 +106,7 @@ bool CChordLite::EqualWithoutDir(const CChordLite& other) const {
 }
 
 bool CChordLite::EqualIncludingDir(const CChordLite& other) const {
-    return EqualWithoutDir(other) && mRootDirection == other.mRootDirection &&
-           mBassDirection == other.mBassDirection;
+    return EqualWithoutDir(other) && mRootDir == other.mRootDir && mBassDir == other.mBassDir;
 }
 
 }  // namespace brindle

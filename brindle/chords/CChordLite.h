@@ -28,10 +28,10 @@ class CChordLite {
 public:
     CKeyEnh mRootKeyEnh;
     /// Carried and compared for the host by EqualIncludingDir, never interpreted.
-    std::int32_t mRootDirection = 0;
+    std::int32_t mRootDir = 0;
     /// (15, TEnh_Undef) is no bass.
     CKeyEnh mBassKeyEnh;
-    std::int32_t mBassDirection = 0;
+    std::int32_t mBassDir = 0;
     /// Bit 0 is the root. A bass that is no chord tone has its bit clear.
     CSemitones mSemitones;
 

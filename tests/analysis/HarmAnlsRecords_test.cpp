@@ -81,7 +81,7 @@ TEST_CASE("Chords go into a list at their place, behind those of the same positi
 TEST_CASE("Each chord comparison leaves out what its name says") {
     const CHarmAnlsChord cSharp(CChordLite(kCSharp, kE, kTriad), 1, 4);
     CHarmAnlsChord other = cSharp;
-    other.mRootDirection = 1;
+    other.mRootDir = 1;
     CHECK(cSharp == other);
     other.mRootKeyEnh = kDFlat;
     CHECK_FALSE(cSharp == other);

@@ -225,12 +225,12 @@ TEST_CASE("The hash code tells the three non-chords apart and keeps the directio
     CHECK(CChordLite_NoChordYield.GetChordHashCode() == 0x7F0F000000);
 
     CChordLite chord;
-    chord.mRootDirection = 1;
-    chord.mBassDirection = 2;
+    chord.mRootDir = 1;
+    chord.mBassDir = 2;
     chord.SetFromChordHashCode(CChordLite(kC, kBFlat, CSemitones{0, 4, 7}).GetChordHashCode());
     CHECK(chord == CChordLite(kC, kBFlat, CSemitones{0, 4, 7}));
-    CHECK(chord.mRootDirection == 1);
-    CHECK(chord.mBassDirection == 2);
+    CHECK(chord.mRootDir == 1);
+    CHECK(chord.mBassDir == 2);
 }
 
 TEST_CASE("A triple flat borrows from the next field of the hash code") {

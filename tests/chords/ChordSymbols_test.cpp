@@ -102,12 +102,12 @@ TEST_CASE("Words for no chord need no more than the start of a text") {
 
 TEST_CASE("Reading a symbol replaces the whole record") {
     CChordLite chord(CKeyEnh_D, CKeyEnh_A, CSemitones{0, 3});
-    chord.mRootDirection = 1;
-    chord.mBassDirection = -1;
+    chord.mRootDir = 1;
+    chord.mBassDir = -1;
     chord.SetFromString("G", {});
     CHECK(chord == CChordLite(CKeyEnh_G, kNoBass, CSemitones{0, 4, 7}));
-    CHECK(chord.mRootDirection == 0);
-    CHECK(chord.mBassDirection == 0);
+    CHECK(chord.mRootDir == 0);
+    CHECK(chord.mBassDir == 0);
 }
 
 TEST_CASE("Long texts read in time that grows with their length") {
