@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/neural/NeuronalNet.h"
 #include "brindle/neural/internal/NetTexts.h"
-#include "brindle/platform/ReadDouble.h"
+#include "brindle/platform/ReadNumber.h"
 
 #include <fmt/core.h>
 
@@ -44,20 +44,6 @@ std::string_view Trimmed(std::string_view text) {
     return text.substr(begin, text.find_last_not_of(kWhiteSpace) - begin + 1);
 }
 
-/// The whole number at the start of a trimmed text: 0 where there is none, at most the greatest
-/// (or least) that an int can hold.
-int ReadInt(std::string_view text) {
-    constexpr std::int64_t kGreatest = std::numeric_limits<int>::max();
-    const bool isNegative = text.starts_with('-');
-    if (isNegative || text.starts_with('+')) text.remove_prefix(1);
-    std::int64_t value = 0;
-    for (const char digit : text) {
-        if (digit < '0' || digit > '9') break;
-        value = std::min(value * 10 + (digit - '0'), kGreatest);
-    }
-    return static_cast<int>(isNegative ? -value : value);
-}
-
 template <class Type, std::size_t size>
 void ReadType(std::string_view value, const std::array<TNetTypeWords, size>& table, Type& type) {
     for (std::size_t i = 0; i < size; ++i) {
@@ -81,21 +67,21 @@ struct TLabel {
 
 template <std::size_t layer>
 void ReadLayerSize(std::string_view value, TLoadedProperties& properties) {
-    properties.mDyn.mHiddenLayerSizes[layer] = ReadInt(value);
+    properties.mDyn.mHiddenLayerSizes[layer] = ReadInteger(value);
 }
 
 constexpr TLabel kLabels[] = {
     {"Number Input Neurons", "Number Input Neurons",
      [](std::string_view value, TLoadedProperties& properties) {
-         properties.mFixed.mInputNeuronCount = ReadInt(value);
+         properties.mFixed.mInputNeuronCount = ReadInteger(value);
      }},
     {"Number Output Neurons", "Number Output Neurons",
      [](std::string_view value, TLoadedProperties& properties) {
-         properties.mFixed.mOutputNeuronCount = ReadInt(value);
+         properties.mFixed.mOutputNeuronCount = ReadInteger(value);
      }},
     {"Number Hidden Layers", "Number Hidden Layers",
      [](std::string_view value, TLoadedProperties& properties) {
-         properties.mDyn.mHiddenLayerCount = ReadInt(value);
+         properties.mDyn.mHiddenLayerCount = ReadInteger(value);
      }},
     // Kept: the size of a fifth hidden layer is written but not read.
     {"Number Neurons in Hidden Layer 0", "Number Neurons Hidden Layers", ReadLayerSize<0>},

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/platform/DictionaryValues.h"
 
+#include "brindle/platform/ReadNumber.h"
+
 #include <algorithm>
 #include <cmath>
 #include <limits>
@@ -36,22 +38,10 @@ std::int32_t Limited(const nlohmann::json& number) {
 
 }  // namespace
 
-std::int32_t IntegerAtStartOf(std::string_view text) {
-    std::size_t i = std::min(text.find_first_not_of(" \t\n\v\f\r"), text.size());
-    const bool isNegative = i < text.size() && text[i] == '-';
-    if (i < text.size() && (text[i] == '-' || text[i] == '+')) ++i;
-    std::int64_t magnitude = 0;
-    for (; i < text.size() && text[i] >= '0' && text[i] <= '9'; ++i) {
-        magnitude = std::min<std::int64_t>(magnitude * 10 + (text[i] - '0'), -std::int64_t{kMin});
-    }
-    return static_cast<std::int32_t>(isNegative ? -magnitude
-                                                : std::min<std::int64_t>(magnitude, kMax));
-}
-
 std::optional<std::int32_t> IntegerIn(const nlohmann::json& dictionary, const char* key) {
     const nlohmann::json* value = ValueIn(dictionary, key);
     if (value == nullptr) return std::nullopt;
-    if (value->is_string()) return IntegerAtStartOf(value->get_ref<const std::string&>());
+    if (value->is_string()) return ReadInteger(value->get_ref<const std::string&>());
     if (!value->is_number()) return std::nullopt;
     return Limited(*value);
 }

@@ -8,10 +8,6 @@
 
 namespace brindle {
 
-/// The integer at the start of `text`: white space, a sign, digits. Whatever follows is ignored.
-/// Without digits it is 0, and beyond 32 bits the nearest limit.
-[[nodiscard]] std::int32_t IntegerAtStartOf(std::string_view text);
-
 // What a dictionary, a JSON object, holds under a key. Nothing when `dictionary` is no object, the
 // key is missing, or the value is of another type.
 

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-#include "brindle/platform/DictionaryValues.h"
 #include "brindle/platform/PlainText.h"
+#include "brindle/platform/ReadNumber.h"
 #include "brindle/theory/CChordNamePrefs.h"
 #include "brindle/theory/CNote.h"
 #include "brindle/theory/KeyNames.h"
@@ -39,7 +39,7 @@ bool CNote::SetFromString(std::string_view text, const CChordNamePrefs& prefs) {
     ConvertUtf8SharpAndFlatToAscii(folded);
     const int used = SetKeyNrAndEnhAssumingCMajorFromString(folded, prefs);
     if (used == 0) return false;
-    const auto number = IntegerAtStartOf(std::string_view(folded).substr(std::size_t(used)));
+    const auto number = ReadInteger(std::string_view(folded).substr(std::size_t(used)));
     // SetOct counts the lowest octave as -1.
     const std::int64_t oct = std::int64_t{number} - NumberOfLowestOct(prefs) - 1;
     SetOct(static_cast<int>(std::clamp<std::int64_t>(oct, -2, 10)));

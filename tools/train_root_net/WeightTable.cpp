@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "tools/train_root_net/WeightTable.h"
 
-#include "brindle/platform/ReadDouble.h"
+#include "brindle/platform/ReadNumber.h"
 
 #include <fmt/format.h>
 
