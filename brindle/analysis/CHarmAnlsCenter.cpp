@@ -3,6 +3,7 @@
 
 #include "brindle/analysis/CHarmAnlsSignKey.h"
 #include "brindle/analysis/JsonText.h"
+#include "brindle/theory/KeyIntervals.h"
 
 namespace brindle {
 
@@ -10,8 +11,7 @@ namespace {
 
 /// Semitones from one key up to another, 0 to 11.
 std::int32_t DistanceUp(int fromKeyNr, int toKeyNr) {
-    const std::int64_t distance = (std::int64_t{toKeyNr} - fromKeyNr) % 12;
-    return static_cast<std::int32_t>(distance < 0 ? distance + 12 : distance);
+    return FoldIntoOctave(std::int64_t{toKeyNr} - fromKeyNr);
 }
 
 /// A chord without a root has no function, even if it has a bass.

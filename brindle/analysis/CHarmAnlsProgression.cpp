@@ -2,6 +2,7 @@
 #include "brindle/analysis/CHarmAnlsProgression.h"
 
 #include "brindle/theory/CScaleLite.h"
+#include "brindle/theory/KeyIntervals.h"
 
 #include <algorithm>
 #include <array>
@@ -13,10 +14,6 @@
 namespace brindle {
 
 namespace {
-
-int Modulo12(std::int64_t number) {
-    return static_cast<int>(((number % 12) + 12) % 12);
-}
 
 std::int64_t Distance(std::int32_t from, std::int32_t to) {
     return std::int64_t{to} - std::int64_t{from};
@@ -88,7 +85,7 @@ bool CHarmAnlsProgression::MatchesHarmChordsFrom(const CHarmAnlsChords& chords,
             Distance(std::prev(element)->mRootDistToHarmCenter, element->mRootDistToHarmCenter);
         const auto played =
             Distance(std::prev(chord)->mRootKeyEnh.mKeyNr, chord->mRootKeyEnh.mKeyNr);
-        if (Modulo12(wanted) != Modulo12(played)) return false;
+        if (FoldIntoOctave(wanted) != FoldIntoOctave(played)) return false;
     }
     return true;
 }
@@ -123,7 +120,7 @@ CHarmCenterLite CHarmAnlsProgression::HarmCenterCalculatedFromFoundProgressionNt
     }
     const auto chord = it + static_cast<std::ptrdiff_t>(n);
     const std::int32_t rootDist = (*this)[n].mRootDistToHarmCenter;
-    const int key = Modulo12(Distance(rootDist, chord->mRootKeyEnh.mKeyNr));
+    const int key = FoldIntoOctave(Distance(rootDist, chord->mRootKeyEnh.mKeyNr));
     CHarmCenterLite center{{key, TEnh_n}, SemitonesFromSignKeyType(mSignKeyType)};
     _SetEnhForHarmCenter(center, it, chords, rootDist, chord);
     return center;
