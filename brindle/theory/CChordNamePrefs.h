@@ -25,16 +25,20 @@ struct CChordNamePrefs {
     std::int32_t mOctaveNaming = 0;
     /// The root of a minor chord begins in lower case.
     bool mLowerCaseMinorRoot = false;
+    /// A chord within one octave is named without its slash.
     bool mChordPrefB = true;
     /// An option that only repeats the bass note is left out.
     bool mOmitBassOption = true;
+    /// A major seventh is "j7" for 1, "maj7" for 2, otherwise "ma7".
     std::int32_t mChordPrefC = 0;
+    /// Carried for the host, as mChordPrefE; nothing here reads them.
     std::int32_t mChordPrefD = 0;
     /// Parts of a chord name are joined by ",".
     bool mCommaParts = false;
     std::int32_t mChordPrefE = 4;
     /// 1: options after the first stand in "(" and ")"; otherwise options are joined by "/".
     std::int32_t mOptionBrackets = 0;
+    /// 1: harmonic functions are letters; otherwise they are Roman numerals.
     std::int32_t mChordPrefF = 0;
     /// Zero: OptionalSpaceBetweenNameParts gives a blank.
     std::int32_t mNoSpaceBetweenNameParts = 1;

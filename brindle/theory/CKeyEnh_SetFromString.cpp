@@ -4,47 +4,26 @@
 #include "brindle/theory/KeyIntervals.h"
 #include "brindle/theory/KeyNames.h"
 
+#include <algorithm>
 #include <array>
 #include <cstddef>
+#include <span>
 
 namespace brindle {
 
 namespace {
 
-/// Walks over a text as if its UTF-8 signs were "#" and "b", without copying it.
-class FoldedReader {
-public:
-    explicit FoldedReader(std::string_view text) : mRest(text) {}
-
-    /// Count of characters walked over, a sign counted as one.
-    [[nodiscard]] int Used() const { return mUsed; }
-    [[nodiscard]] bool IsAtEnd() const { return mRest.empty(); }
-
-    /// The next character; 0 at the end.
-    [[nodiscard]] char Peek() const {
-        if (mRest.empty()) return '\0';
-        if (StartsWith(kUtf8Sharp)) return '#';
-        return StartsWith(kUtf8Flat) ? 'b' : mRest.front();
-    }
-    void Drop() {
-        const bool isSign = StartsWith(kUtf8Sharp) || StartsWith(kUtf8Flat);
-        mRest.remove_prefix(isSign ? kUtf8Sharp.size() : 1);
-        ++mUsed;
-    }
-    /// The next character but one; 0 if there is none.
-    [[nodiscard]] char PeekSecond() const {
-        if (IsAtEnd()) return '\0';
-        FoldedReader second = *this;
-        second.Drop();
-        return second.Peek();
-    }
-
-private:
-    [[nodiscard]] bool StartsWith(std::string_view sign) const { return mRest.starts_with(sign); }
-
-    std::string_view mRest;
-    int mUsed = 0;
-};
+/// The first three characters of a text, a UTF-8 sign counted as the one that it stands for; 0
+/// beyond the end.
+std::array<char, 3> FirstThreeCharacters(std::string_view text) {
+    std::array<char, 3 * kUtf8Sharp.size()> bytes{};
+    const std::string_view head = text.substr(0, bytes.size());
+    std::copy(head.begin(), head.end(), bytes.begin());
+    const auto folded = ConvertUtf8SharpAndFlatToAscii(std::span(bytes).first(head.size()));
+    std::array<char, 3> characters{};
+    std::copy_n(folded.begin(), std::min(folded.size(), characters.size()), characters.begin());
+    return characters;
+}
 
 // A to H; H is the German B.
 constexpr auto kKeysOfLetters = std::to_array<CKeyEnh>({
@@ -71,12 +50,11 @@ CKeyEnh KeyOfLetter(char letter, const CChordNamePrefs& prefs) {
 /// An accidental behind a letter and the count of characters it takes.
 struct TAccidental {
     TEnh mEnh = TEnh_n;
-    int mLength = 0;
+    std::size_t mLength = 0;
 };
 
-TAccidental AccidentalAt(const FoldedReader& reader) {
-    const char second = reader.PeekSecond();
-    switch (reader.Peek()) {
+TAccidental AccidentalOf(char first, char second) {
+    switch (first) {
         case '#':
             return {TEnh_s, 1};
         case 'i':
@@ -96,18 +74,17 @@ TAccidental AccidentalAt(const FoldedReader& reader) {
 void CKeyEnh::SetFromString(std::string_view text, int* consumed, const CChordNamePrefs& prefs) {
     *this = CKeyEnh_Undef;
     if (consumed != nullptr) *consumed = 0;
-    FoldedReader reader(text);
-    while (reader.Peek() == ' ') reader.Drop();
-    const CKeyEnh letter = KeyOfLetter(reader.Peek(), prefs);
+    const std::size_t blanks = std::min(text.find_first_not_of(' '), text.size());
+    const auto [first, second, third] = FirstThreeCharacters(text.substr(blanks));
+    const CKeyEnh letter = KeyOfLetter(first, prefs);
     if (letter.IsUndef()) return;
-    reader.Drop();
     *this = letter;
-    const TAccidental accidental = AccidentalAt(reader);
+    const TAccidental accidental = AccidentalOf(second, third);
     if (accidental.mLength > 0) {
         // Kept: counted from the letter's key, which may be B flat already: then "Bb" is key 9.
         *this = {FoldIntoOctave(letter.mKeyNr + EnhToSemitone(accidental.mEnh)), accidental.mEnh};
     }
-    if (consumed != nullptr) *consumed = reader.Used() + accidental.mLength;
+    if (consumed != nullptr) *consumed = static_cast<int>(blanks + 1 + accidental.mLength);
 }
 
 }  // namespace brindle

@@ -32,29 +32,37 @@ constexpr TStems OneEach(std::string_view letters) {
     return stems;
 }
 
+// In the tables a blank is no sign and no ending.
 // clang-format off
-constexpr TStemRows kLetters = {
-    OneEach("DDEEFGGAABBC"),
-    OneEach("BCCDDEFFGGAA"),
-    OneEach("CCDEEFFGGABB"),
-};
 
-constexpr TStemRows kSyllables = {
-    {"Re", "Re", "Mi", "Mi", "Fa", "Sol", "Sol", "La", "La", "Ti", "Ti", "Do"},
-    {"Ti", "Do", "Do", "Re", "Re", "Mi", "Fa", "Fa", "Sol", "Sol", "La", "La"},
-    {"Do", "Do", "Re", "Mi", "Mi", "Fa", "Fa", "Sol", "Sol", "La", "Ti", "Ti"},
-};
+// Syllables of the flat side, of the sharp side and of the plain row.
+constexpr TStems RomanString1 = {
+    "Re", "Re", "Mi", "Mi", "Fa", "Sol", "Sol", "La", "La", "Ti", "Ti", "Do"};
+constexpr TStems RomanString2 = {
+    "Ti", "Do", "Do", "Re", "Re", "Mi", "Fa", "Fa", "Sol", "Sol", "La", "La"};
+constexpr TStems RomanString3 = {
+    "Do", "Do", "Re", "Mi", "Mi", "Fa", "Fa", "Sol", "Sol", "La", "Ti", "Ti"};
 
-// A blank is no sign. The flat side has one "b" on every key, and this is the second.
+constexpr TStemRows kLetters = {OneEach("DDEEFGGAABBC"),
+                                OneEach("BCCDDEFFGGAA"),
+                                OneEach("CCDEEFFGGABB")};
+constexpr TStemRows kSyllables = {RomanString1, RomanString2, RomanString3};
+
+// The flat side has one "b" on every key, and this is the second.
 constexpr std::string_view kSecondFlatSigns = "b b  b b b  ";
 constexpr std::string_view kSharpSigns      = "##x#x##x#x#x";
 constexpr std::string_view kPlainSigns      = " # b  # # b ";
 
-constexpr TStems kGermanSharpEndings = {
+// German endings of the sharp side and of the plain row; those of the flat side are regular.
+constexpr std::array<std::string_view, 12> SpellEnharm1 = {
     "is", "is", "isis", "is", "isis", "is", "is", "isis", "is", "isis", "is", "isis"};
-constexpr TStems kGermanPlainEndings = {
-    "", "is", "", "es", "", "", "is", "", "is", "", "es", ""};
+constexpr std::array<std::string_view, 12> SpellEnharm2 = {
+    " ", "is", " ", "es", " ", " ", "is", " ", "is", " ", "es", " "};
 // clang-format on
+
+std::string_view UnlessBlank(std::string_view sign) {
+    return sign == " " ? std::string_view() : sign;
+}
 
 // The double accidentals that the flat and the sharp side have no name for. Their letter is that of
 // the key a whole tone away.
@@ -103,7 +111,7 @@ std::string_view Signs(std::size_t key, TEnh enh) {
         case TEnh_Undef:
             break;
     }
-    return kPlainSigns[key] == ' ' ? std::string_view() : kPlainSigns.substr(key, 1);
+    return UnlessBlank(kPlainSigns.substr(key, 1));
 }
 
 std::string_view GermanEnding(std::size_t key, TEnh enh) {
@@ -119,14 +127,14 @@ std::string_view GermanEnding(std::size_t key, TEnh enh) {
             if (HasDoubleSharpOfItsOwn(key)) return "isis";
             [[fallthrough]];
         case TEnh_s:
-            return kGermanSharpEndings[key];
+            return SpellEnharm1[key];
         case TEnh_bbb:
         case TEnh_n:
         case TEnh_sss:
         case TEnh_Undef:
             break;
     }
-    return kGermanPlainEndings[key];
+    return UnlessBlank(SpellEnharm2[key]);
 }
 
 /// German musicians call B natural H, and some call B flat B.

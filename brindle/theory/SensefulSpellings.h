@@ -9,7 +9,7 @@
 
 namespace brindle {
 
-/// Keys that have the same senseful spellings: those that are an accidental away from a letter.
+/// The spellings by which some keys can be written down, each with a letter of its own.
 struct TSensefulSpellings {
     std::uint32_t mKeyNrs;  ///< bit k: key k
     std::uint32_t mEnhs;    ///< bit n: the spelling of value n - 1
@@ -19,8 +19,8 @@ template <class... TKeyNr>
 consteval std::uint32_t KeyNrBits(TKeyNr... keyNrs) {
     return ((1U << keyNrs) | ...);
 }
-template <class... T>
-consteval std::uint32_t EnhBits(T... enhs) {
+template <class... TSpelling>
+consteval std::uint32_t EnhBits(TSpelling... enhs) {
     return ((1U << (enhs - TEnh_bbb)) | ...);
 }
 
