@@ -78,18 +78,18 @@ void CChordLite::SetNoChordForce() {
 }
 
 void CChordLite::AppendJSONClassSubstring(std::ostream& stream) const {
-    stream << R"("RootKeyEnh":)";
+    PlainText::Write(stream, R"("RootKeyEnh":)");
     mRootKeyEnh.AppendJSONString(stream);
-    stream << R"(, "BassKeyEnh":)";
+    PlainText::Write(stream, R"(, "BassKeyEnh":)");
     mBassKeyEnh.AppendJSONString(stream);
     PlainText::Write(stream, R"(, "Semitones":)");
     PlainText::WriteUnsigned(stream, mSemitones.Mask());
 }
 
 void CChordLite::AppendJSONString(std::ostream& stream) const {
-    stream << '{';
+    PlainText::Write(stream, "{");
     AppendJSONClassSubstring(stream);
-    stream << '}';
+    PlainText::Write(stream, "}");
 }
 
 bool CChordLite::EqualExceptRootAndBass(const CChordLite& other) const {

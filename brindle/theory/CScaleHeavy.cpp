@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/theory/CScaleHeavy.h"
 
+#include "brindle/platform/PlainText.h"
 #include "brindle/theory/CChordNamePrefs.h"
 #include "brindle/theory/CKeyEnhUtil.h"
 #include "brindle/theory/Spelling.h"
@@ -124,7 +125,7 @@ std::string CScaleHeavy::FullName(const CChordNamePrefs& prefs) const {
 }
 
 void CScaleHeavy::AppendJSONString(std::ostream& stream) const {
-    stream << R"({"root":)";
+    PlainText::Write(stream, R"({"root":)");
     mRootNote.AppendJSONString(stream);
     stream << R"(,"type":")" << ToJSONString(mScaleType) << "\"}";
 }

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/theory/CScaleLite.h"
 
+#include "brindle/platform/PlainText.h"
 #include "brindle/theory/CKeyEnhUtil.h"
 #include "brindle/theory/CScaleHeavy.h"
 #include "brindle/theory/KeyIntervals.h"
@@ -63,7 +64,7 @@ void CScaleLite::RotateRootToKeyEnh(CKeyEnh root) {
 }
 
 void CScaleLite::AppendJSONString(std::ostream& stream) const {
-    stream << R"({"CKeyEnh":)";
+    PlainText::Write(stream, R"({"CKeyEnh":)");
     mRootKeyEnh.AppendJSONString(stream);
     stream << R"(,"Semitones":")";
     mSemitones.AppendJSONString(stream);

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/theory/CSemitones.h"
 
+#include "brindle/platform/PlainText.h"
 #include "brindle/theory/CIntvlSet.h"
 
 #include <optional>
@@ -98,10 +99,11 @@ void CSemitones::ToVectorBool(std::vector<bool>& out) const {
 }
 
 void CSemitones::AppendJSONString(std::ostream& stream) const {
-    for (int i = 0; i < 12; ++i) {
-        stream << (i == 0 ? '[' : ',') << ((mMask >> i & 1) != 0 ? '1' : '0');
+    char list[] = "[0,0,0,0,0,0,0,0,0,0,0,0]";
+    for (int ix = 0; ix < 12; ++ix) {
+        if (HasIntvl(ix)) list[1 + 2 * ix] = '1';
     }
-    stream << ']';
+    PlainText::Write(stream, list);
 }
 
 std::ostream& operator<<(std::ostream& stream, const CSemitones& semitones) {

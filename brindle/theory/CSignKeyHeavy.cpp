@@ -2,6 +2,7 @@
 #include "brindle/theory/CSignKeyHeavy.h"
 
 #include "brindle/platform/DictionaryValues.h"
+#include "brindle/platform/PlainText.h"
 #include "brindle/theory/CHarmCenterLite.h"
 #include "brindle/theory/CSignKeyLite.h"
 #include "brindle/theory/CSignKeyNoEnh.h"
@@ -130,7 +131,7 @@ std::string CSignKeyHeavy::NameLong(const CChordNamePrefs& prefs) const {
 }
 
 void CSignKeyHeavy::AppendJSONString(std::ostream& stream) const {
-    stream << R"({"root":)";
+    PlainText::Write(stream, R"({"root":)");
     RootNote().AppendJSONString(stream);
     stream << R"(,"type":")" << JSONWord(SignKeyType()) << "\"}";
 }

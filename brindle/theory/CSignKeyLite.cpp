@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/theory/CSignKeyLite.h"
 
+#include "brindle/platform/PlainText.h"
 #include "brindle/theory/CChordNamePrefs.h"
 #include "brindle/theory/CHarmCenterLite.h"
 #include "brindle/theory/CScaleLite.h"
@@ -118,7 +119,7 @@ std::string CSignKeyLite::NameLong(const CChordNamePrefs& prefs) const {
 }
 
 void CSignKeyLite::AppendJSONString(std::ostream& stream) const {
-    stream << R"({"CKeyEnh":)";
+    PlainText::Write(stream, R"({"CKeyEnh":)");
     mRootKeyEnh.AppendJSONString(stream);
     stream << R"(,"Type":")" << JSONWord(mSignKeyType) << "\"}";
 }

@@ -2,6 +2,7 @@
 #include "brindle/theory/CSignKeyNoEnh.h"
 
 #include "brindle/platform/DictionaryValues.h"
+#include "brindle/platform/PlainText.h"
 #include "brindle/theory/CChordNamePrefs.h"
 #include "brindle/theory/CHarmCenterLite.h"
 #include "brindle/theory/CScaleLite.h"
@@ -80,7 +81,9 @@ std::string CSignKeyNoEnh::NameLong(const CChordNamePrefs& prefs) const {
 }
 
 void CSignKeyNoEnh::AppendJSONString(std::ostream& stream) const {
-    stream << R"({"RootKeyNr":)" << mRootKeyNr << R"(,"Type":")" << JSONWord(mSignKeyType) << "\"}";
+    PlainText::Write(stream, R"({"RootKeyNr":)");
+    PlainText::WriteInteger(stream, mRootKeyNr);
+    stream << R"(,"Type":")" << JSONWord(mSignKeyType) << "\"}";
 }
 
 CSignKeyNoEnh CSignKeyNoEnh::FromJSONDict(const nlohmann::json& dictionary) {

@@ -51,7 +51,7 @@ std::ostream& operator<<(std::ostream& stream, TEnh enh) {
     for (const TWord& row : kWords) {
         if (row.mEnh == enh) return stream << row.mWord;
     }
-    return stream << "unknown TEnh " << static_cast<int>(enh);
+    return stream << "unknown TEnh " + std::to_string(static_cast<int>(enh));
 }
 
 }  // namespace brindle

@@ -2,9 +2,13 @@
 #include "tests/support/Expected.h"
 #include "tests/support/Forms.h"
 
+#include "brindle/theory/CSignKeyHeavy.h"
+#include "brindle/theory/CSignKeyNoEnh.h"
 #include "brindle/theory/Trace.h"
 
 #include <doctest/doctest.h>
+
+#include <iomanip>
 
 using namespace brindle;
 using namespace brindle::test;
@@ -28,6 +32,15 @@ json NonChord(const CChordLite& chord) {
     form["IsNoChordYield"] = chord.IsNoChordYield();
     form["IsNoChordForce"] = chord.IsNoChordForce();
     return form;
+}
+
+/// The JSON text on a stream that pads to 40 places and writes its own numbers in hexadecimal.
+template <class T>
+std::string JSONStringOnPaddedStream(const T& value) {
+    std::ostringstream stream;
+    stream << std::hex << std::showbase << std::setfill('*') << std::setw(40);
+    value.AppendJSONString(stream);
+    return stream.str();
 }
 
 /// {"TEnh": n} or {"TSignKeyType": n}
@@ -82,4 +95,19 @@ TEST_CASE("Records print, order and read back as expected") {
              }},
             {"operator<<", [](const json& in) { return Printed(in.at(0)); }},
         });
+}
+
+TEST_CASE("The JSON text of a record does not depend on how the stream writes other things") {
+    const auto isPlain = [](const auto& value) {
+        return JSONStringOnPaddedStream(value) == JSONStringOf(value);
+    };
+    CHECK(isPlain(CKeyEnh{11, TEnh{6}}));
+    CHECK(isPlain(kSemitonesMajor));
+    CHECK(isPlain(CNote(60, TEnh_n)));
+    CHECK(isPlain(CScaleLite(CKeyEnh_B, kSemitonesMajor)));
+    CHECK(isPlain(CScaleHeavy(CKeyEnh_B, st_dorian)));
+    CHECK(isPlain(CSignKeyLite(CKeyEnh_B, TSignKeyType_Major)));
+    CHECK(isPlain(CSignKeyHeavy(CKeyEnh_B, TSignKeyTypeNoUndef_Minor)));
+    CHECK(isPlain(CSignKeyNoEnh(11, TSignKeyType_Major)));
+    CHECK(isPlain(CChordLite(CKeyEnh_B, CKeyEnh_Undef, CSemitones{0, 4, 7})));
 }
