@@ -1,12 +1,12 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/analysis/CHarmAnlsProgression.h"
 
+#include "brindle/analysis/JsonText.h"
 #include "brindle/theory/CScaleLite.h"
 #include "brindle/theory/KeyIntervals.h"
 
 #include <algorithm>
 #include <array>
-#include <iomanip>
 #include <iterator>
 #include <ostream>
 #include <utility>
@@ -59,11 +59,13 @@ void TakeEnh(CHarmCenterLite& center, TEnh enh) {
 }  // namespace
 
 void CHarmAnlsProgressionEl::AppendJSONString(std::ostream& stream) const {
-    stream << R"({"RootDistToHarmCenter":)" << std::setw(2) << mRootDistToHarmCenter
-           << R"(, "BassDistToHarmCenter":)" << std::setw(2) << mBassDistToHarmCenter
-           << R"(, "SemitonesMatch":)";
+    PlainText::Write(stream, R"({"RootDistToHarmCenter":)");
+    PlainText::WriteInteger(stream, mRootDistToHarmCenter, 2);
+    PlainText::Write(stream, R"(, "BassDistToHarmCenter":)");
+    PlainText::WriteInteger(stream, mBassDistToHarmCenter, 2);
+    PlainText::Write(stream, R"(, "SemitonesMatch":)");
     mSemitonesMatch.AppendJSONString(stream);
-    stream << '}';
+    PlainText::Write(stream, "}");
 }
 
 CHarmAnlsProgression::CHarmAnlsProgression(std::vector<CHarmAnlsProgressionEl> elements,
@@ -166,12 +168,7 @@ void CHarmAnlsProgression::_SetEnhForHarmCenter(CHarmCenterLite& center, chord_i
 }
 
 void CHarmAnlsProgression::AppendJSONString(std::ostream& stream) const {
-    stream << '[' << std::endl;
-    for (const CHarmAnlsProgressionEl& element : *this) {
-        element.AppendJSONString(stream);
-        stream << ',' << std::endl;
-    }
-    stream << ']' << std::endl;
+    JsonText::WriteList(stream, *this);
 }
 
 std::ostream& operator<<(std::ostream& stream, const CHarmAnlsProgressionEl& element) {

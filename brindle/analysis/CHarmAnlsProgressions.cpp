@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/analysis/CHarmAnlsProgressions.h"
 
+#include "brindle/analysis/JsonText.h"
+
 #include <algorithm>
 #include <ostream>
 
@@ -62,12 +64,7 @@ CHarmAnlsProgressions CHarmAnlsProgressions::SortAndGetBestMatchingProgressions(
 }
 
 void CHarmAnlsProgressions::AppendJSONString(std::ostream& stream) const {
-    stream << '[' << std::endl;
-    for (const CHarmAnlsProgression& row : *this) {
-        row.AppendJSONString(stream);
-        stream << ',' << std::endl;
-    }
-    stream << ']' << std::endl;
+    JsonText::WriteList(stream, *this);
 }
 
 std::ostream& operator<<(std::ostream& stream, const CHarmAnlsProgressions& progressions) {

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/analysis/CSemitonesMatch.h"
 
+#include "brindle/analysis/JsonText.h"
+#include "brindle/theory/CIntvlSet.h"
+
 #include <algorithm>
 #include <ostream>
 
@@ -11,27 +14,33 @@ namespace {
 void WriteEntry(std::ostream& stream, TSemiMatch entry) {
     switch (entry) {
         case TSemiMatch_Absent:
-            stream << '0';
-            return;
+            return PlainText::Write(stream, "0");
         case TSemiMatch_Present:
-            stream << '1';
-            return;
+            return PlainText::Write(stream, "1");
         case TSemiMatch_Any:
-            stream << 'x';
-            return;
+            return PlainText::Write(stream, "x");
     }
-    stream << "unknown TSemiMatch: " << static_cast<std::int32_t>(entry);
+    PlainText::Write(stream, "unknown TSemiMatch: ");
+    PlainText::WriteInteger(stream, static_cast<std::int32_t>(entry));
 }
 
 }  // namespace
 
+void CSemitonesMatch::SetFromIntvlSet(const CIntvlSet& intvls) {
+    Reset();
+    const std::uint64_t sounding = intvls.ToSemitones().Mask();
+    for (unsigned n = 0; n < 12; ++n) {
+        if ((sounding >> n & 1) != 0) SetSemitone(n, TSemiMatch_Present);
+    }
+}
+
 void CSemitonesMatch::AppendJSONString(std::ostream& stream) const {
-    stream << '[';
+    PlainText::Write(stream, "[");
     for (std::size_t n = 0; n < size(); ++n) {
-        if (n > 0) stream << ',';
+        if (n > 0) PlainText::Write(stream, ",");
         WriteEntry(stream, mEntries[n]);
     }
-    stream << ']';
+    PlainText::Write(stream, "]");
 }
 
 std::ostream& operator<<(std::ostream& stream, const CSemitonesMatch& match) {
@@ -45,12 +54,7 @@ bool CSemitonesMatches::Matches(CSemitones semitones) const {
 }
 
 void CSemitonesMatches::AppendJSONString(std::ostream& stream) const {
-    stream << '[' << std::endl;
-    for (const CSemitonesMatch& pattern : *this) {
-        pattern.AppendJSONString(stream);
-        stream << ',' << std::endl;
-    }
-    stream << ']' << std::endl;
+    JsonText::WriteList(stream, *this);
 }
 
 }  // namespace brindle

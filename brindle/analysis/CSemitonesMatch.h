@@ -51,13 +51,9 @@ public:
     }
     /// Whether a chord of these semitones fits the pattern. Nothing fits a cleared pattern.
     [[nodiscard]] constexpr bool Matches(CSemitones semitones) const {
-        return !empty() && (semitones.Mask() & PresentMask()) == PresentMask() &&
-               (semitones.Mask() & AbsentMask()) == 0;
+        return !mIsCleared && (semitones.Mask() & mPresent) == mPresent &&
+               (semitones.Mask() & mAbsent) == 0;
     }
-    /// The semitones that must sound, as a mask.
-    [[nodiscard]] constexpr std::uint64_t PresentMask() const { return Mask(TSemiMatch_Present); }
-    /// The semitones that must not sound, as a mask.
-    [[nodiscard]] constexpr std::uint64_t AbsentMask() const { return Mask(TSemiMatch_Absent); }
 
     [[nodiscard]] constexpr std::size_t size() const { return mIsCleared ? 0 : mEntries.size(); }
     [[nodiscard]] constexpr bool empty() const { return mIsCleared; }
@@ -65,12 +61,16 @@ public:
     /// All entries `TSemiMatch_Any`.
     constexpr void Reset() { ResetToValue(TSemiMatch_Any); }
     constexpr void ResetToValue(TSemiMatch value) {
-        mEntries.fill(value);
         mIsCleared = false;
+        for (unsigned n = 0; n < 12; ++n) SetSemitone(n, value);
     }
     /// Sets the entry of semitone n, 12 counting as 0. Does nothing above 12 or after `clear`.
     constexpr void SetSemitone(unsigned n, TSemiMatch value) {
-        if (n <= 12 && !empty()) mEntries[n % 12] = value;
+        if (n > 12 || empty()) return;
+        mEntries[n % 12] = value;
+        const std::uint64_t bit = std::uint64_t{1} << n % 12;
+        mPresent = value == TSemiMatch_Present ? mPresent | bit : mPresent & ~bit;
+        mAbsent = value == TSemiMatch_Absent ? mAbsent | bit : mAbsent & ~bit;
     }
     /// The intervals of the set, folded into one octave, must sound; all else may.
     void SetFromIntvlSet(const CIntvlSet& intvls);
@@ -85,15 +85,10 @@ public:
     }
 
 private:
-    [[nodiscard]] constexpr std::uint64_t Mask(TSemiMatch value) const {
-        std::uint64_t mask = 0;
-        for (std::size_t n = 0; n < size(); ++n) {
-            if (mEntries[n] == value) mask |= std::uint64_t{1} << n;
-        }
-        return mask;
-    }
-
     std::array<TSemiMatch, 12> mEntries{};
+    // The entries once more, as masks: patterns are tried on every chord of a piece.
+    std::uint64_t mPresent = 0;
+    std::uint64_t mAbsent = 0;
     bool mIsCleared = false;
 };
 
