@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/analysis/CHarmonicAnalyse.h"
 
+#include "brindle/analysis/CHarmCenterWeightAnalysis.h"
 #include "brindle/analysis/ParseStringIntoHarmAnlsChords.h"
 #include "brindle/analysis/TChordStringParse.h"
 #include "brindle/platform/PlainText.h"
@@ -58,10 +59,29 @@ void CHarmonicAnalyse::AnalyseFromChordStringFile(const std::string& path,
 }
 
 void CHarmonicAnalyse::Analyse(TAnalyse analyse) {
-    static_cast<void>(analyse);
+    _FindAndInsertHarmCenters(analyse);
     _MergeAdjacentSameSignKeys();
     _MergeAdjacentSameHarmCenters();
     _FillSignKeysAndCentersAndSetHarmFunctions();
+}
+
+void CHarmonicAnalyse::_FindAndInsertHarmCenters(TAnalyse analyse) {
+    switch (analyse) {
+        case TAnalyse_TonicProgressions:
+            mProgressions = CHarmAnlsProgressions::TonicProgressions();
+            _FindAndInsertHarmCentersUsingTonicProgressions(TOnlyUndefCenters_No);
+            break;
+        case TAnalyse_CadenceProgressions:
+            mProgressions = CHarmAnlsProgressions::CadenceProgressions();
+            _FindAndInsertHarmCentersUsingCadenceProgressions(TOnlyUndefCenters_No);
+            break;
+        case TAnalyse_CenterWeights:
+            break;
+        case TAnalyse_None:
+        default:
+            return;
+    }
+    _FindAndInsertHarmCentersUsingCenterWeightAnalysis({}, TOnlyUndefCenters_No);
 }
 
 CHarmAnlsSignKeys::iterator CHarmonicAnalyse::FillManually_AppendSignKey(

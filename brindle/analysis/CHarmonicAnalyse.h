@@ -88,6 +88,8 @@ private:
                                                  const TChordStringParse& parse);
     void _FillAnalyserWithSignKeysOrCreateDefault(const CHarmAnlsSignKeys& signKeys);
 
+    /// The route of `analyse`, and then the weights; nothing without a route.
+    void _FindAndInsertHarmCenters(TAnalyse analyse);
     void _FindAndInsertHarmCentersUsingTonicProgressions(TOnlyUndefCenters onlyUndef);
     void _FindAndInsertHarmCenterUsingTonicProgressions_ForSignKey(CHarmAnlsSignKey& signKey,
                                                                    TOnlyUndefCenters onlyUndef);
