@@ -68,7 +68,7 @@ struct CSignKeyLite {
     [[nodiscard]] CSignKeyLite IonicSignKey() const;
 
     /// Spells the root so that the signature has the fewest signs. At a tie the given spelling
-    /// stays, and flats win over sharps: G flat major stays, but D sharp minor too.
+    /// stays, so both F sharp and G flat major do; otherwise flats win over sharps.
     void SetRootNoteEnhWithLeastSigns();
 
     /// The name of the root, with "m" behind it for minor; "Undef".
