@@ -32,8 +32,10 @@ need_packages() {
         echo "neither root nor sudo" >"$log"
     else
         say "installing $missing (log: build/packages.log)"
-        # A stale or broken source elsewhere need not keep these packages from being found.
-        { "${as_root[@]}" apt-get update || true
+        # An installation that was cut off is finished first; a source that does not answer need not
+        # keep these packages from being found in another.
+        { "${as_root[@]}" dpkg --configure -a || true
+          "${as_root[@]}" apt-get update || true
           "${as_root[@]}" env DEBIAN_FRONTEND=noninteractive apt-get -o DPkg::Lock::Timeout=120 \
               install -y --no-install-recommends $missing || true; } >"$log" 2>&1 </dev/null
         missing=$(missing_packages "$@")

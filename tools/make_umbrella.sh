@@ -12,7 +12,7 @@ umbrella() {
 /// Everything a host needs, in one include. Made by tools/make_umbrella.sh.
 
 TEXT
-    find brindle -name '*.h' ! -path brindle/brindle.h ! -path '*/internal/*' | LC_ALL=C sort | sed 's/.*/#include "&"/'
+    find brindle -name '*.h' ! -path brindle/brindle.h ! -path '*/internal/*' ! -path '*/internal/*' | LC_ALL=C sort | sed 's/.*/#include "&"/'
 }
 
 if [ "${1:-}" = --check ]; then

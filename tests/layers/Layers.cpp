@@ -67,6 +67,11 @@ bool IsHeader(std::string_view path) {
     return path.size() > 2 && path.substr(path.size() - 2) == ".h";
 }
 
+// Headers that are not installed.
+bool IsInternal(std::string_view path) {
+    return path.find("/internal/") != path.npos;
+}
+
 // True for a name that is in the list or begins with an entry that names a folder ("sys/").
 template <class List>
 bool IsListed(const List& list, std::string_view name) {
@@ -113,7 +118,8 @@ std::vector<std::string> IncludeFaults(std::string_view path, std::string_view t
     const auto report = [&](const std::string& name, std::string_view what) {
         faults.push_back(std::string(path) + ": " + name + ": " + std::string(what));
     };
-    const bool isPublicHeader = IsHeader(path) && FloorOf(path) < kProgram;
+    const bool isLibrary = FloorOf(path) < kProgram;
+    const bool isPublicHeader = isLibrary && IsHeader(path) && !IsInternal(path);
     for (const auto& name : Includes(text)) {
         if (IsOurs(name)) {
             if (FloorOf(name) == kNowhere) report(name, "no floor of the house");
@@ -122,7 +128,7 @@ std::vector<std::string> IncludeFaults(std::string_view path, std::string_view t
                 report(name, "no music in the adapters");
             }
         } else {
-            if (FolderOf(path) != "platform" && IsListed(kPlatformLibraries, name)) {
+            if (isLibrary && FolderOf(path) != "platform" && IsListed(kPlatformLibraries, name)) {
                 report(name, "only the adapters name it");
             }
             if (isPublicHeader && IsListed(kNotInHeaders, name)) report(name, "not in a header");

@@ -1,0 +1,26 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "cli/Output.h"
+#include "cli/Song.h"
+
+#include <string>
+
+namespace brindle::cli {
+
+class CChordSymbols;
+
+// The presentations of an analysis.
+
+/// For people: a line for each sign key, under it its centers, under these their chords.
+[[nodiscard]] std::string AnalysisText(const TSong& song, const CPaint& paint);
+
+/// Strict JSON, see docs/json.md. `readings` may be null.
+[[nodiscard]] std::string AnalysisJson(const CHarmonicAnalyse& analyse,
+                                       const CHarmAnlsCenters* readings,
+                                       const CChordSymbols& symbols);
+
+/// A picture: chords along a time axis, bands for sign keys, centers and readings.
+[[nodiscard]] std::string AnalysisSvg(const TSong& song);
+
+}  // namespace brindle::cli

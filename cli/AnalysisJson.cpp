@@ -1,0 +1,81 @@
+// SPDX-License-Identifier: MIT
+#include "cli/Analysis.h"
+
+#include "cli/ChordSymbols.h"
+#include "cli/Json.h"
+#include "cli/Names.h"
+
+namespace brindle::cli {
+namespace {
+
+Json DistanceToJson(int distance) {
+    return distance < 0 ? Json(nullptr) : Json(distance);
+}
+
+Json NameToJson(bool isUndef, const std::string& name) {
+    return isUndef ? Json(nullptr) : Json(name);
+}
+
+class CJsonMaker {
+public:
+    explicit CJsonMaker(const CChordSymbols& symbols) : mSymbols(symbols) {}
+
+    [[nodiscard]] Json Make(const CHarmAnlsChordWithPos& chord) const {
+        const std::string& symbol = mSymbols.SymbolOf(chord);
+        return {{"Position", NumberToJson(chord.mPosition)},
+                {"Symbol", NameToJson(symbol.empty(), symbol)},
+                {"RootKeyEnh", KeyEnhToJson(chord.mRootKeyEnh)},
+                {"BassKeyEnh", KeyEnhToJson(chord.mBassKeyEnh)},
+                {"Semitones", chord.mSemitones.Mask()},
+                {"Intervals", IntervalsToJson(chord.mSemitones)},
+                {"RootDistToHarmCenter", DistanceToJson(chord.mRootDistToHarmCenter)},
+                {"BassDistToHarmCenter", DistanceToJson(chord.mBassDistToHarmCenter)}};
+    }
+
+    [[nodiscard]] Json Make(const CHarmAnlsCenter& center) const {
+        const CHarmCenterLite& harmCenter = center.mHarmCenter;
+        return {{"Probability", NumberToJson(center.mProbability)},
+                {"Position", NumberToJson(center.mPosition)},
+                {"HarmCenter",
+                 {{"Name", NameToJson(center.IsUndef(), harmCenter.NameLong(NamePrefs()))},
+                  {"CKeyEnh", KeyEnhToJson(harmCenter.mRootKeyEnh)},
+                  {"Semitones", harmCenter.mSemitones.Mask()},
+                  {"Intervals", IntervalsToJson(harmCenter.mSemitones)}}},
+                {"HarmChords", List(center.mChords)}};
+    }
+
+    [[nodiscard]] Json Make(const CHarmAnlsSignKey& signKey) const {
+        const CSignKeyLite& key = signKey.mSignKey;
+        return {{"Probability", NumberToJson(signKey.mProbability)},
+                {"Position", NumberToJson(signKey.mPosition)},
+                {"SignKey",
+                 {{"Name", NameToJson(signKey.IsUndef(), key.NameLong(NamePrefs()))},
+                  {"CKeyEnh", KeyEnhToJson(key.mRootKeyEnh)},
+                  {"Type", NameToJson(key.mSignKeyType == TSignKeyType_Undef,
+                                      std::string(JSONWord(key.mSignKeyType)))}}},
+                {"HarmCenters", List(signKey.mHarmCenters)}};
+    }
+
+    template <class TList>
+    [[nodiscard]] Json List(const TList& list) const {
+        Json array = Json::array();
+        for (const auto& element : list) array.push_back(Make(element));
+        return array;
+    }
+
+private:
+    const CChordSymbols& mSymbols;
+};
+
+}  // namespace
+
+std::string AnalysisJson(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings,
+                         const CChordSymbols& symbols) {
+    const CJsonMaker maker(symbols);
+    Json json;
+    json["HarmSignKeys"] = maker.List(analyse.mSignKeys);
+    if (readings != nullptr) json["Readings"] = maker.List(*readings);
+    return JsonText(json);
+}
+
+}  // namespace brindle::cli

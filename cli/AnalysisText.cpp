@@ -1,0 +1,139 @@
+// SPDX-License-Identifier: MIT
+#include "cli/Analysis.h"
+
+#include "cli/Bars.h"
+#include "cli/Names.h"
+#include "cli/Table.h"
+
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <utility>
+
+namespace brindle::cli {
+namespace {
+
+// "bar 3", "bars 1 to 4"
+std::string BarsOf(const TRange& range, const CBars& bars) {
+    const long first = bars.BarOf(range.mBegin);
+    // A range that ends on a bar line does not reach into the bar behind it.
+    const long last = std::max(first, bars.LastBarBefore(range.mEnd));
+    return first == last ? fmt::format("bar {}", first) : fmt::format("bars {} to {}", first, last);
+}
+
+std::string DistanceText(int distance) {
+    return distance < 0 ? " -" : fmt::format("{:2} {}", distance, DegreeName(distance));
+}
+
+class CTextWriter {
+public:
+    CTextWriter(const TSong& song, const CPaint& paint) : mPaint(paint), mBars(song.mBeatsPerBar) {}
+
+    void Write(const TShownSignKey& signKey) {
+        StartParagraph();
+        mText += mPaint.Strong("Sign key " + signKey.mName);
+        mText += mPaint.Faint(fmt::format(", from bar {}\n", mBars.BarOf(signKey.mBegin)));
+        bool isAfterChords = true;
+        for (const TShownCenter& center : signKey.mCenters) {
+            const bool hasChords = !center.mChords.empty();
+            if (isAfterChords || hasChords) StartParagraph();
+            WriteHead(center);
+            if (hasChords) WriteChords(center.mChords);
+            isAfterChords = hasChords;
+        }
+    }
+
+    void WriteLooseChords(const std::vector<TShownChord>& chords) {
+        if (chords.empty()) return;
+        StartParagraph();
+        mText += mPaint.Strong("Chords outside of every center") + "\n\n";
+        WriteChords(chords);
+    }
+
+    void WriteReadings(const std::vector<TShownCenter>& readings) {
+        StartParagraph();
+        mText += mPaint.Strong("Readings") + "\n\n";
+        if (readings.empty()) {
+            mText += "    none: no progression of this song ends on a tonic\n";
+            return;
+        }
+        CTable table({"center", "where", "probability", "chords"});
+        for (const TShownCenter& reading : readings) {
+            table.AddRow({reading.mName, BarsOf(reading.mRange, mBars),
+                          fmt::format("{:.2f}", reading.mProbability), SymbolsOf(reading)});
+        }
+        Write(table);
+    }
+
+    [[nodiscard]] std::string Text() && { return std::move(mText); }
+
+private:
+    void StartParagraph() {
+        if (!mText.empty()) mText += '\n';
+    }
+
+    void WriteHead(const TShownCenter& center) {
+        const bool hasChords = !center.mChords.empty();
+        std::string details = hasChords ? ", " + BarsOf(center.mRange, mBars)
+                                        : fmt::format(", from bar {}, without chords of its own",
+                                                      mBars.BarOf(center.mRange.mBegin));
+        if (center.mProbability != kPosUndef) {
+            details += fmt::format(", probability {:.2f}", center.mProbability);
+        }
+        mText += "  " + mPaint.Accent("Center " + center.mName) + mPaint.Faint(details) + '\n';
+        if (hasChords) mText += '\n';
+    }
+
+    // The first and the last symbols of a passage.
+    [[nodiscard]] static std::string SymbolsOf(const TShownCenter& center) {
+        constexpr std::size_t shown = 4;
+        std::string symbols;
+        const std::size_t count = center.mChords.size();
+        for (std::size_t i = 0; i < count; ++i) {
+            if (count > 2 * shown && i == shown) {
+                symbols += " ...";
+                i = count - shown;
+            }
+            if (!symbols.empty()) symbols += ' ';
+            symbols += center.mChords[i].mSymbol;
+        }
+        return symbols;
+    }
+
+    void WriteChords(const std::vector<TShownChord>& chords) {
+        CTable table({" bar", " beat", "chord", "root", "bass"});
+        long barBefore = 0;
+        for (const TShownChord& chord : chords) {
+            const long bar = mBars.BarOf(chord.mRange.mBegin);
+            table.AddRow({bar == barBefore ? "" : fmt::format("{}", bar),
+                          ShortNumber(mBars.BeatOf(chord.mRange.mBegin)), chord.mSymbol,
+                          DistanceText(chord.mRootDist),
+                          chord.mBassDist < 0 ? "" : DistanceText(chord.mBassDist)});
+            barBefore = bar;
+        }
+        Write(table);
+    }
+
+    void Write(const CTable& table) {
+        mText += "    " + mPaint.Faint(table.Head()) + '\n';
+        for (std::size_t row = 0; row < table.RowCount(); ++row) {
+            mText += "    " + table.Row(row) + '\n';
+        }
+    }
+
+    const CPaint& mPaint;
+    CBars mBars;
+    std::string mText;
+};
+
+}  // namespace
+
+std::string AnalysisText(const TSong& song, const CPaint& paint) {
+    CTextWriter writer(song, paint);
+    for (const TShownSignKey& signKey : song.mSignKeys) writer.Write(signKey);
+    writer.WriteLooseChords(song.mLooseChords);
+    if (song.mHasReadings) writer.WriteReadings(song.mReadings);
+    return std::move(writer).Text();
+}
+
+}  // namespace brindle::cli

@@ -1,0 +1,106 @@
+// SPDX-License-Identifier: MIT
+#include "cli/CommandLine.h"
+#include "cli/Input.h"
+#include "cli/Json.h"
+#include "cli/Names.h"
+#include "cli/Table.h"
+
+#include "brindle/chords/CChordLite.h"
+
+#include <fmt/format.h>
+
+#include <memory>
+
+namespace brindle::cli {
+namespace {
+
+constexpr TCommandHelp kHelp{
+    "chord",
+    "Read chord symbols: root, bass, semitones, basic chord and hash code",
+    "  brindle chord F#m7/C# Bb13\n"
+    "  brindle chord \"C maj 7\" --json\n"
+    "  cat symbols.txt | brindle chord -\n",
+};
+
+struct TChordOptions {
+    std::vector<std::string> mSymbols;
+    CFormatOptions mFormat;
+};
+
+struct TReadChord {
+    std::string mSymbol;
+    CChordLite mChord;
+};
+
+std::string HashCode(const CChordLite& chord) {
+    return fmt::format("0x{:010X}", chord.GetChordHashCode());
+}
+
+std::string NonChordName(const CChordLite& chord) {
+    if (chord.IsNoChordYield()) return "no chord, yield";
+    return chord.IsNoChordForce() ? "no chord, force" : "undefined";
+}
+
+Json ChordToJson(const TReadChord& read) {
+    const CChordLite& chord = read.mChord;
+    return {{"Symbol", read.mSymbol},
+            {"RootKeyEnh", KeyEnhToJson(chord.mRootKeyEnh)},
+            {"BassKeyEnh", KeyEnhToJson(chord.mBassKeyEnh)},
+            {"Semitones", chord.mSemitones.Mask()},
+            {"Intervals", IntervalsToJson(chord.mSemitones)},
+            {"BasicChord", BasicChordName(chord.BasicChord())},
+            {"NonChord", chord.IsUndef() ? Json(NonChordName(chord)) : Json(nullptr)},
+            {"HashCode", chord.GetChordHashCode()}};
+}
+
+std::string ChordsJson(const std::vector<TReadChord>& chords) {
+    Json list = Json::array();
+    for (const TReadChord& chord : chords) list.push_back(ChordToJson(chord));
+    return JsonText({{"Chords", list}});
+}
+
+std::string ChordsText(const std::vector<TReadChord>& chords, const CPaint& paint) {
+    CTable table({"chord", "root", "bass", "basic chord", "semitones", " mask", "hash code"});
+    for (const auto& [symbol, chord] : chords) {
+        table.AddRow({symbol, chord.IsUndef() ? NonChordName(chord) : KeyName(chord.mRootKeyEnh),
+                      chord.HasBassNote() ? KeyName(chord.mBassKeyEnh) : "-",
+                      std::string(BasicChordName(chord.BasicChord())),
+                      SemitonesText(chord.mSemitones), fmt::format("{}", chord.mSemitones.Mask()),
+                      HashCode(chord)});
+    }
+    std::string text = paint.Faint(table.Head()) + '\n';
+    for (std::size_t row = 0; row < table.RowCount(); ++row) text += table.Row(row) + '\n';
+    return text;
+}
+
+std::optional<std::vector<std::string>> TypedSymbols(const std::vector<std::string>& words) {
+    if (!IsStandardInput(words)) return words;
+    const auto text = ReadInput("-");
+    if (!text) return std::nullopt;
+    return WordsOf(*text);
+}
+
+TStatus Chord(const TChordOptions& options) {
+    const auto symbols = TypedSymbols(options.mSymbols);
+    if (!symbols) return TStatus::BadInput;
+    std::vector<TReadChord> chords;
+    for (const std::string& symbol : *symbols) {
+        chords.push_back({Printable(symbol), {FoldAccidentals(symbol), NamePrefs()}});
+    }
+    return Print(options.mFormat.Format() == TFormat::Json ? ChordsJson(chords)
+                                                           : ChordsText(chords, CPaint()));
+}
+
+}  // namespace
+
+void AddChord(CLI::App& program, TStatus& status) {
+    CLI::App& command = AddCommand(program, kHelp);
+    const auto options = std::make_shared<TChordOptions>();
+    command.add_option("SYMBOL", options->mSymbols, "Chord symbols; - reads standard input")
+        ->required()
+        ->option_text("...");
+    options->mFormat.AddTo(command, {"text", "json"});
+    command.callback([options, &status] { status = Chord(*options); });
+}
+
+}  // namespace brindle::cli

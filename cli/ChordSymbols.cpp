@@ -1,0 +1,53 @@
+// SPDX-License-Identifier: MIT
+#include "cli/ChordSymbols.h"
+
+#include "cli/Output.h"
+
+#include "brindle/analysis/ParseStringIntoHarmAnlsChords.h"
+#include "brindle/analysis/TChordStringParse.h"
+
+#include <algorithm>
+
+namespace brindle::cli {
+namespace {
+
+// What the reader of chord texts leaves out before it looks for tokens.
+constexpr std::string_view kLeftOut = "{}-";
+
+bool Contains(const std::vector<std::string>& list, const std::string& token) {
+    return std::find(list.begin(), list.end(), token) != list.end();
+}
+
+// The chord tokens of a text, one for each chord that the library reads from it.
+std::vector<std::string> ChordTokens(std::string_view text, const TChordStringParse& parse) {
+    std::string kept(text);
+    std::erase_if(kept, [](char c) { return kLeftOut.find(c) != kLeftOut.npos; });
+    std::vector<std::string> tokens = parse.mSeparator.Split(kept);
+    ParseStringIntoHarmAnlsChords::_CorrectTokenizationOf(tokens);
+    std::erase_if(tokens, [&](const std::string& token) {
+        return token.empty() || Contains(parse.mBarTokens, token) ||
+               Contains(parse.mHoldTokens, token);
+    });
+    return tokens;
+}
+
+}  // namespace
+
+CChordSymbols::CChordSymbols(std::string_view text, const TChordStringParse& parse,
+                             const CHarmAnlsChords& chords) {
+    const std::vector<std::string> tokens = ChordTokens(text, parse);
+    const std::size_t count = std::min(tokens.size(), chords.size());
+    for (std::size_t i = 0; i < count; ++i) {
+        mPositions.push_back(chords[i].mPosition);
+        mSymbols.push_back(Printable(tokens[i]));
+    }
+}
+
+const std::string& CChordSymbols::SymbolOf(const CHarmAnlsChordWithPos& chord) const {
+    static const std::string none;
+    const auto found = std::lower_bound(mPositions.begin(), mPositions.end(), chord.mPosition);
+    if (found == mPositions.end() || *found != chord.mPosition) return none;
+    return mSymbols[static_cast<std::size_t>(found - mPositions.begin())];
+}
+
+}  // namespace brindle::cli

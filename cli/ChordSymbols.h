@@ -1,0 +1,33 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/analysis/CHarmAnlsChords.h"
+
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace brindle {
+struct TChordStringParse;
+}
+
+namespace brindle::cli {
+
+/// The symbol that stands for a chord of an analysis: what the user typed at its position. Every
+/// presentation asks here, so that printed chord names have one place.
+class CChordSymbols {
+public:
+    /// `text` is the chord text and `chords` what the analysis read from it.
+    CChordSymbols(std::string_view text, const TChordStringParse& parse,
+                  const CHarmAnlsChords& chords);
+
+    /// Empty for the end marker and for a chord that does not come from the text.
+    [[nodiscard]] const std::string& SymbolOf(const CHarmAnlsChordWithPos& chord) const;
+
+private:
+    // Ascending, and the symbol of each.
+    std::vector<double> mPositions;
+    std::vector<std::string> mSymbols;
+};
+
+}  // namespace brindle::cli

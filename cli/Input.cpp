@@ -1,0 +1,94 @@
+// SPDX-License-Identifier: MIT
+#include "cli/Input.h"
+
+#include "brindle/theory/KeyNames.h"
+
+#include <fmt/format.h>
+
+#include <array>
+#include <cerrno>
+#include <cstdio>
+#include <cstring>
+#include <memory>
+
+namespace brindle::cli {
+namespace {
+
+// A song has a few kilobytes; what is larger than this is no chord text but a mistake.
+constexpr std::size_t kMaxInputBytes = std::size_t{64} << 20;
+
+constexpr std::string_view kWhiteSpace = " \t\n\v\f\r";
+
+struct TCloser {
+    void operator()(std::FILE* file) const { std::fclose(file); }
+};
+
+std::optional<std::string> Unreadable(const std::string& name, std::string_view reason) {
+    Fail(TStatus::BadInput, fmt::format("{} cannot be read: {}", Printable(name), reason));
+    return std::nullopt;
+}
+
+std::optional<std::string> ReadAll(std::FILE* file, const std::string& name) {
+    std::string content;
+    std::array<char, 1 << 16> buffer;
+    while (const std::size_t count = std::fread(buffer.data(), 1, buffer.size(), file)) {
+        content.append(buffer.data(), count);
+        if (content.size() > kMaxInputBytes) return Unreadable(name, "it is larger than 64 MiB");
+    }
+    if (std::ferror(file) != 0) return Unreadable(name, std::strerror(errno));
+    return content;
+}
+
+std::vector<std::string> Split(std::string_view text, std::string_view separators) {
+    std::vector<std::string> pieces;
+    while (true) {
+        const std::size_t begin = text.find_first_not_of(separators);
+        if (begin == text.npos) return pieces;
+        text.remove_prefix(begin);
+        pieces.emplace_back(text.substr(0, text.find_first_of(separators)));
+        text.remove_prefix(pieces.back().size());
+    }
+}
+
+}  // namespace
+
+bool IsStandardInput(const std::vector<std::string>& words) {
+    return words.size() == 1 && words.front() == "-";
+}
+
+std::optional<std::string> ReadInput(const std::string& path) {
+    if (path == "-") return ReadAll(stdin, "standard input");
+    const std::unique_ptr<std::FILE, TCloser> file(std::fopen(path.c_str(), "rb"));
+    if (file == nullptr) return Unreadable(path, std::strerror(errno));
+    return ReadAll(file.get(), path);
+}
+
+std::optional<std::string> TextFromWords(const std::vector<std::string>& words) {
+    if (IsStandardInput(words)) return ReadInput("-");
+    return fmt::format("{}", fmt::join(words, " "));
+}
+
+std::string FoldAccidentals(std::string_view text) {
+    std::string folded(text);
+    ConvertUtf8SharpAndFlatToAscii(folded);
+    return folded;
+}
+
+std::optional<std::vector<std::string>> TypedLines(const std::vector<std::string>& words) {
+    const auto text = TextFromWords(words);
+    if (!text) return std::nullopt;
+    if (!IsStandardInput(words)) return std::vector<std::string>{*text};
+    std::vector<std::string> lines;
+    for (const std::string& line : Split(*text, "\n")) {
+        const std::size_t begin = line.find_first_not_of(kWhiteSpace);
+        if (begin == line.npos) continue;
+        lines.push_back(line.substr(begin, line.find_last_not_of(kWhiteSpace) + 1 - begin));
+    }
+    return lines;
+}
+
+std::vector<std::string> WordsOf(std::string_view text) {
+    return Split(text, kWhiteSpace);
+}
+
+}  // namespace brindle::cli

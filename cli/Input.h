@@ -1,0 +1,34 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "cli/Output.h"
+
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace brindle::cli {
+
+/// Whether the words of a command line are the single word "-".
+[[nodiscard]] bool IsStandardInput(const std::vector<std::string>& words);
+
+/// The content of a file, or of standard input for "-". Nothing when it cannot be read; then the
+/// error has been printed.
+[[nodiscard]] std::optional<std::string> ReadInput(const std::string& path);
+
+/// The words of a command line as one text; "-" reads standard input.
+[[nodiscard]] std::optional<std::string> TextFromWords(const std::vector<std::string>& words);
+
+/// What people type with the signs U+266F and U+266D, with # and b instead.
+[[nodiscard]] std::string FoldAccidentals(std::string_view text);
+
+/// The words of a command line as one line; the single word "-" reads the lines of standard input,
+/// without blank ones and without the white space around the others.
+[[nodiscard]] std::optional<std::vector<std::string>> TypedLines(
+    const std::vector<std::string>& words);
+
+/// The pieces of a text between white space.
+[[nodiscard]] std::vector<std::string> WordsOf(std::string_view text);
+
+}  // namespace brindle::cli

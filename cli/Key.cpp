@@ -1,0 +1,97 @@
+// SPDX-License-Identifier: MIT
+#include "cli/CommandLine.h"
+#include "cli/Input.h"
+#include "cli/Json.h"
+#include "cli/KeyText.h"
+#include "cli/Names.h"
+
+#include "brindle/theory/CSignKeyHeavy.h"
+#include "brindle/theory/SignKeyCode.h"
+
+#include <fmt/format.h>
+
+#include <memory>
+
+namespace brindle::cli {
+namespace {
+
+constexpr TCommandHelp kHelp{
+    "key",
+    "Read a key: its signs, notes, relative key and one-byte code",
+    "  brindle key \"F# minor\"\n"
+    "  brindle key Bb --json\n"
+    "  cat keys.txt | brindle key -\n",
+};
+
+struct TKeyOptions {
+    std::vector<std::string> mWords;
+    CFormatOptions mFormat;
+};
+
+// 15 stands for a key that has no code, G# major for instance.
+bool HasCode(unsigned char code) {
+    return code != kSignKeyCodeUndef;
+}
+
+std::vector<CKeyEnh> NotesOf(const CSignKeyLite& key) {
+    return KeysOf(CScaleHeavy(key.mRootKeyEnh, key.Semitones()));
+}
+
+Json KeyToJson(const CSignKeyLite& key) {
+    const CSignKeyLite relative = key.ParallelSignKey();
+    const unsigned char code = ToSignKeyInEv(key.mRootKeyEnh, key.mSignKeyType);
+    return {{"Name", key.NameLong(NamePrefs())},
+            {"CKeyEnh", KeyEnhToJson(key.mRootKeyEnh)},
+            {"Type", JSONWord(key.mSignKeyType)},
+            {"SignsCount", key.SignsCount()},
+            {"Notes", KeyEnhsToJson(NotesOf(key))},
+            {"Relative",
+             {{"Name", relative.NameLong(NamePrefs())},
+              {"CKeyEnh", KeyEnhToJson(relative.mRootKeyEnh)},
+              {"Type", JSONWord(relative.mSignKeyType)}}},
+            {"Code", HasCode(code) ? Json(code) : Json(nullptr)}};
+}
+
+std::string KeyText(const CSignKeyLite& key, const CPaint& paint) {
+    const unsigned char code = ToSignKeyInEv(key.mRootKeyEnh, key.mSignKeyType);
+    return fmt::format(
+        "{}\n"
+        "  signs     {}\n"
+        "  notes     {}\n"
+        "  relative  {}\n"
+        "  code      {}\n",
+        paint.Strong(key.NameLong(NamePrefs())), SignsText(key.SignsCount()),
+        NotesText(NotesOf(key)), key.ParallelSignKey().NameLong(NamePrefs()),
+        HasCode(code) ? fmt::format("{}", code) : "none");
+}
+
+TStatus Key(const TKeyOptions& options) {
+    const auto lines = TypedLines(options.mWords);
+    if (!lines) return TStatus::BadInput;
+    Json list = Json::array();
+    std::string text;
+    for (const std::string& line : *lines) {
+        const std::string typed = FoldAccidentals(line);
+        const TKeyText read = ReadKeyText(typed);
+        if (!read.mError.empty()) {
+            return FailAt(TStatus::BadInput, read.mError, typed, read.mColumn);
+        }
+        list.push_back(KeyToJson(read.mSignKey));
+        text += (text.empty() ? "" : "\n") + KeyText(read.mSignKey, CPaint());
+    }
+    return Print(options.mFormat.Format() == TFormat::Json ? JsonText({{"Keys", list}}) : text);
+}
+
+}  // namespace
+
+void AddKey(CLI::App& program, TStatus& status) {
+    CLI::App& command = AddCommand(program, kHelp);
+    const auto options = std::make_shared<TKeyOptions>();
+    command.add_option("KEY", options->mWords, "A key, major or minor; - reads one a line")
+        ->required()
+        ->option_text("...");
+    options->mFormat.AddTo(command, {"text", "json"});
+    command.callback([options, &status] { status = Key(*options); });
+}
+
+}  // namespace brindle::cli

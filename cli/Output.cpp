@@ -1,0 +1,113 @@
+// SPDX-License-Identifier: MIT
+#include "cli/Output.h"
+
+#include "cli/Utf8.h"
+
+#include <fmt/format.h>
+#include <unistd.h>
+
+#include <cerrno>
+#include <cstdio>
+#include <cstdlib>
+#include <cstring>
+
+namespace brindle::cli {
+namespace {
+
+constexpr std::string_view kReplacement = "\xEF\xBF\xBD";  // U+FFFD
+
+bool IsControl(std::string_view character) {
+    const auto lead = static_cast<unsigned char>(character[0]);
+    if (character.size() == 1) return lead < 0x20 || lead == 0x7F;
+    // U+0080 to U+009F, which some terminals obey.
+    if (lead == 0xC2) return static_cast<unsigned char>(character[1]) < 0xA0;
+    // U+FFFE and U+FFFF, which XML does not allow.
+    return character == "\xEF\xBF\xBE" || character == "\xEF\xBF\xBF";
+}
+
+bool WantsColor() {
+    const char* const noColor = std::getenv("NO_COLOR");
+    if (noColor != nullptr && *noColor != '\0') return false;
+    const char* const terminal = std::getenv("TERM");
+    if (terminal != nullptr && std::string_view(terminal) == "dumb") return false;
+    return isatty(STDOUT_FILENO) == 1;
+}
+
+}  // namespace
+
+TStatus Fail(TStatus status, std::string_view message) {
+    fmt::print(stderr, "brindle: {}\n", message);
+    return status;
+}
+
+TStatus FailAt(TStatus status, std::string_view message, std::string_view input,
+               std::size_t column) {
+    const std::string before = Printable(input.substr(0, column));
+    fmt::print(stderr, "brindle: {}\n  {}\n  {}^\n", message, Printable(input),
+               std::string(Width(before), ' '));
+    return status;
+}
+
+TStatus Print(std::string_view text) {
+    const bool written = std::fwrite(text.data(), 1, text.size(), stdout) == text.size();
+    if (written && std::fflush(stdout) == 0) return TStatus::Success;
+    return Fail(TStatus::BadInput,
+                fmt::format("the output cannot be written: {}", std::strerror(errno)));
+}
+
+std::string Printable(std::string_view text) {
+    std::string printable;
+    printable.reserve(text.size());
+    while (!text.empty()) {
+        const std::size_t length = Utf8Length(text);
+        const std::string_view character = text.substr(0, length == 0 ? 1 : length);
+        const bool isFine = length > 0 && !IsControl(character);
+        printable += isFine ? character : kReplacement;
+        text.remove_prefix(character.size());
+    }
+    return printable;
+}
+
+std::size_t Width(std::string_view text) {
+    std::size_t width = 0;
+    for (const char c : text) width += (static_cast<unsigned char>(c) & 0xC0) != 0x80;
+    return width;
+}
+
+std::string PadRight(std::string_view text, std::size_t width) {
+    const std::size_t used = Width(text);
+    return std::string(text) + std::string(used < width ? width - used : 0, ' ');
+}
+
+std::string PadLeft(std::string_view text, std::size_t width) {
+    const std::size_t used = Width(text);
+    return std::string(used < width ? width - used : 0, ' ') + std::string(text);
+}
+
+std::string ShortNumber(double number) {
+    std::string text = fmt::format("{:.3f}", number);
+    text.erase(text.find_last_not_of('0') + 1);
+    if (!text.empty() && text.back() == '.') text.pop_back();
+    return text;
+}
+
+CPaint::CPaint() : mColored(WantsColor()) {}
+
+std::string CPaint::Strong(std::string_view text) const {
+    return Wrapped("1", text);
+}
+
+std::string CPaint::Accent(std::string_view text) const {
+    return Wrapped("36", text);
+}
+
+std::string CPaint::Faint(std::string_view text) const {
+    return Wrapped("2", text);
+}
+
+std::string CPaint::Wrapped(std::string_view code, std::string_view text) const {
+    if (!mColored) return std::string(text);
+    return fmt::format("\x1B[{}m{}\x1B[0m", code, text);
+}
+
+}  // namespace brindle::cli

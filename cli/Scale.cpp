@@ -1,0 +1,96 @@
+// SPDX-License-Identifier: MIT
+#include "cli/CommandLine.h"
+#include "cli/Input.h"
+#include "cli/Json.h"
+#include "cli/KeyText.h"
+#include "cli/Names.h"
+
+#include "brindle/theory/CScaleLite.h"
+
+#include <fmt/format.h>
+
+#include <memory>
+#include <sstream>
+
+namespace brindle::cli {
+namespace {
+
+constexpr TCommandHelp kHelp{
+    "scale",
+    "Read a scale: its notes as they are spelled, mask, type and signs",
+    "  brindle scale \"D dorian\"\n"
+    "  brindle scale Bb blues minor --json\n"
+    "  cat scales.txt | brindle scale -\n",
+};
+
+struct TScaleOptions {
+    std::vector<std::string> mWords;
+    CFormatOptions mFormat;
+};
+
+std::string TypeName(TScaleType type) {
+    std::ostringstream name;
+    name << type;
+    return name.str();
+}
+
+std::string_view NameOf(const CScaleHeavy& scale) {
+    return scale.ScaleType() == st_custom ? "Custom" : scale.ScaleRow().mName;
+}
+
+Json ScaleToJson(const CScaleHeavy& scale) {
+    const CSemitones semitones = CScaleLite(scale).mSemitones;
+    return {{"Name", fmt::format("{} {}", KeyName(scale.RootKeyEnh()), NameOf(scale))},
+            {"CKeyEnh", KeyEnhToJson(scale.RootKeyEnh())},
+            {"Type", TypeName(scale.ScaleType())},
+            {"Semitones", semitones.Mask()},
+            {"Intervals", IntervalsToJson(semitones)},
+            {"Notes", KeyEnhsToJson(KeysOf(scale))},
+            {"SignsCount", scale.SignsCount()}};
+}
+
+std::string ScaleText(const CScaleHeavy& scale, const CPaint& paint) {
+    const CSemitones semitones = CScaleLite(scale).mSemitones;
+    return fmt::format(
+        "{}\n"
+        "  notes      {}\n"
+        "  semitones  {}\n"
+        "  mask       {}\n"
+        "  type       {}\n"
+        "  signs      {}\n",
+        paint.Strong(fmt::format("{} {}", KeyName(scale.RootKeyEnh()), NameOf(scale))),
+        NotesText(KeysOf(scale)), SemitonesText(semitones), semitones.Mask(),
+        TypeName(scale.ScaleType()), SignsText(scale.SignsCount()));
+}
+
+TStatus Scale(const TScaleOptions& options) {
+    const auto lines = TypedLines(options.mWords);
+    if (!lines) return TStatus::BadInput;
+    Json list = Json::array();
+    std::string text;
+    for (const std::string& line : *lines) {
+        const std::string typed = FoldAccidentals(line);
+        const TScaleText read = ReadScaleText(typed);
+        if (!read.mError.empty()) {
+            return FailAt(TStatus::BadInput, read.mError, typed, read.mColumn);
+        }
+        list.push_back(ScaleToJson(read.mScale));
+        text += (text.empty() ? "" : "\n") + ScaleText(read.mScale, CPaint());
+    }
+    return Print(options.mFormat.Format() == TFormat::Json ? JsonText({{"Scales", list}}) : text);
+}
+
+}  // namespace
+
+void AddScale(CLI::App& program, TStatus& status) {
+    CLI::App& command = AddCommand(program, kHelp);
+    const auto options = std::make_shared<TScaleOptions>();
+    command
+        .add_option("SCALE", options->mWords, "A key and the name of a scale; - reads one a line")
+        ->required()
+        ->option_text("...");
+    options->mFormat.AddTo(command, {"text", "json"});
+    command.callback([options, &status] { status = Scale(*options); });
+}
+
+}  // namespace brindle::cli

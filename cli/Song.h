@@ -1,0 +1,74 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/analysis/CHarmAnlsCenters.h"
+#include "brindle/analysis/CHarmonicAnalyse.h"
+
+#include <string>
+#include <vector>
+
+namespace brindle::cli {
+
+class CChordSymbols;
+
+/// A range of time in beats.
+struct TRange {
+    double mBegin = 0.0;
+    double mEnd = 0.0;
+
+    [[nodiscard]] bool IsEmpty() const { return !(mBegin < mEnd); }
+};
+
+/// A chord as it is shown.
+struct TShownChord {
+    TRange mRange;
+    std::string mSymbol;
+    int mRootDist = -1;  ///< semitones above the center, -1 for none
+    int mBassDist = -1;
+};
+
+/// A center as it is shown. Its range is that of its chords; without chords it is empty and begins
+/// where the center does.
+struct TShownCenter {
+    CHarmCenterLite mHarmCenter;
+    std::string mName;
+    double mProbability = kPosUndef;
+    TRange mRange;
+    std::vector<TShownChord> mChords;
+};
+
+struct TShownSignKey {
+    std::string mName;
+    CSignKeyLite mSignKey;
+    double mBegin = 0.0;
+    std::vector<TShownCenter> mCenters;
+};
+
+/// An analysis prepared for the eye: named, with the length of each chord, each chord once, and
+/// without the end marker.
+struct TSong {
+    double mBeatsPerBar = 4.0;
+    double mEnd = 0.0;
+    std::vector<TShownSignKey> mSignKeys;
+    /// Chords of the text that stand in no center.
+    std::vector<TShownChord> mLooseChords;
+    std::vector<TShownCenter> mReadings;
+    bool mHasReadings = false;
+};
+
+/// Calls `function` with every chord of the text: those of the centers, then the loose ones.
+template <class TFunction>
+void ForEachChord(const TSong& song, const TFunction& function) {
+    for (const TShownSignKey& signKey : song.mSignKeys) {
+        for (const TShownCenter& center : signKey.mCenters) {
+            for (const TShownChord& chord : center.mChords) function(chord);
+        }
+    }
+    for (const TShownChord& chord : song.mLooseChords) function(chord);
+}
+
+/// `readings` may be null.
+[[nodiscard]] TSong MakeSong(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings,
+                             const CChordSymbols& symbols, double beatsPerBar);
+
+}  // namespace brindle::cli

@@ -1,0 +1,50 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "cli/Song.h"
+
+#include <cstddef>
+#include <vector>
+
+namespace brindle::cli {
+
+/// A piece of a range that lies on one line of a picture, in pixels from the left of the line.
+struct TSegment {
+    std::size_t mLine = 0;
+    double mLeft = 0.0;
+    double mRight = 0.0;
+
+    [[nodiscard]] double Width() const { return mRight - mLeft; }
+};
+
+/// A bar line, and the number of the bar that begins there.
+struct TBarLine {
+    double mX = 0.0;
+    long mBar = 0;
+};
+
+/// How the time of a song breaks into lines as text does, at bar lines where a bar fits into a
+/// line.
+class CTimeAxis {
+public:
+    /// Makes room for the widest chord in the time of the shortest, but never more lines than there
+    /// are chords.
+    CTimeAxis(const TSong& song, double lineWidth, double widestChord);
+
+    [[nodiscard]] std::size_t LineCount() const { return mLineCount; }
+    /// The pieces of a range from the first line to the last.
+    [[nodiscard]] std::vector<TSegment> SegmentsOf(const TRange& range) const;
+    /// The whole of a line that belongs to the song.
+    [[nodiscard]] TSegment Line(std::size_t line) const;
+    /// The bar lines of a line; where bars are narrow only every second, fourth, ... one.
+    [[nodiscard]] std::vector<TBarLine> BarLines(std::size_t line) const;
+
+private:
+    double mEnd;
+    double mBeatsPerBar;
+    double mLineWidth;
+    double mBeatsPerLine;
+    std::size_t mLineCount;
+};
+
+}  // namespace brindle::cli
