@@ -120,20 +120,27 @@ void CChordHeavy::SetRootNoteToIntvlIx(std::size_t ix) {
 
 void CChordHeavy::SetRootNoteEnhWithLeastSigns() {
     if (mRootNote.IsUndef()) return;
-    CChordHeavy respelled = *this;
-    const auto signsCountAbs = [&](const CNote& root) {
-        respelled.SetRootNote(root);
-        return respelled.SignsCountAbs();
-    };
+    const TEnh enh = _RootWithLeastSigns(mRootNote).mEnh;
+    const bool rootIsBass = BassNoteIsInLowestOctave() && LowestNote().KeyNr() == mRootNote.KeyNr();
+    mRootNote.SetEnhAndDontMakeSenseful(enh);
+    mIntvlSetNeedsUpdate = true;
+    if (rootIsBass) SetBassKeyEnh(mRootNote.KeyEnh());
+}
 
-    CNote given = mRootNote;
+CNote CChordHeavy::_RootWithLeastSigns(CNote given) const {
     given.SetEnhAndDontMakeSenseful(
         MakeSensefulEnhForKeyNrAssumingCMajor(given.KeyNr(), given.mEnh));
+    if (given.IsUndef()) return given;
     CNote flatter = given;
     flatter.EnhShiftToFlats();
     CNote sharper = given;
     sharper.EnhShiftToSharps();
 
+    CChordHeavy respelled = *this;
+    const auto signsCountAbs = [&](const CNote& root) {
+        respelled.SetRootNote(root);
+        return respelled.SignsCountAbs();
+    };
     const CNote* best = &given;
     int leastSigns = signsCountAbs(given);
     for (const CNote* candidate : {&flatter, &sharper}) {
@@ -143,11 +150,7 @@ void CChordHeavy::SetRootNoteEnhWithLeastSigns() {
             leastSigns = signs;
         }
     }
-
-    const bool rootIsBass = BassNoteIsInLowestOctave() && LowestNote().KeyNr() == mRootNote.KeyNr();
-    mRootNote.SetEnhAndDontMakeSenseful(best->mEnh);
-    mIntvlSetNeedsUpdate = true;
-    if (rootIsBass) SetBassKeyEnh(mRootNote.KeyEnh());
+    return *best;
 }
 
 void CChordHeavy::SetUndef() {

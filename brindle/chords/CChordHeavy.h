@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "brindle/chords/TChordOption.h"
 #include "brindle/theory/CIntvlSet.h"
 #include "brindle/theory/CKeyEnh.h"
 #include "brindle/theory/CMySet.h"
@@ -16,6 +17,7 @@
 #include <span>
 #include <string>
 #include <string_view>
+#include <vector>
 
 namespace brindle {
 
@@ -28,12 +30,13 @@ class CSignKeyHeavy;
 /// The lowest note is the bass. Octave -1 (note numbers 0 to 11) holds the bass of a chord that
 /// was made from keys or intervals: the root itself, or the key behind the slash.
 ///
-/// The intervals are worked out when they are first read, also by const functions: one chord is
-/// not to be read from two threads at once.
+/// The intervals are worked out when they are first read, and naming a chord spells its bass, also
+/// by const functions: one chord is not to be read from two threads at once.
 class CChordHeavy {
 public:
     using TBasicChord = brindle::TBasicChord;
     using enum brindle::TBasicChord;
+    using TChordOption = brindle::TChordOption;
 
     static constexpr int DefaultWrapIntvl = 24;
 
@@ -234,6 +237,39 @@ public:
     [[nodiscard]] int ChordKeyNrFromKeyNr(int keyNr) const;
     [[nodiscard]] int KeyNrFromChordKeyNr(int chordKeyNr) const;
 
+    // Names. They are told from the intervals, so that any set of notes has one.
+
+    /// "Dm7/G". With `mChordPrefB` a chord within an octave has no slash.
+    [[nodiscard]] std::string Name(const CChordNamePrefs& prefs) const;
+    /// Names the bass behind the slash where its key is not the root's, and spells it as the scale
+    /// of the chord does: the lowest note keeps that spelling.
+    [[nodiscard]] std::string NameWithSlash(const CChordNamePrefs& prefs) const;
+    /// "Dm7". A chord of a single note is named by its root alone, one without a root is "No
+    /// Chord", "No Chord Yield" or "No Chord Force".
+    [[nodiscard]] std::string NameWithoutSlash(const CChordNamePrefs& prefs) const;
+    /// The name that the notes have with another root; that root becomes the bass in octave -1.
+    [[nodiscard]] std::string NameForThisRootNote(const CNote& note,
+                                                  const CChordNamePrefs& prefs) const;
+    /// The same with the root in the spelling that needs the fewest signs, which `note` takes.
+    [[nodiscard]] std::string NameWithLeastSignsForThisRootNote(CNote& note,
+                                                                const CChordNamePrefs& prefs) const;
+
+    /// What stands behind the root: "m7", "7sus4".
+    [[nodiscard]] std::string BasicChordAndOptionsName(const CChordNamePrefs& prefs) const;
+    /// True for suspended chords, as in "7sus4".
+    [[nodiscard]] bool BasicChordNameAfterOptionsName() const;
+    [[nodiscard]] TChordOptionsMap OptionsMap(const CChordNamePrefs& prefs) const;
+    /// The options in their order, "7/9/13" or "7(9)(13)"; empty for an undefined root.
+    [[nodiscard]] std::string OptionsNameFromMap(const TChordOptionsMap& options,
+                                                 const CChordNamePrefs& prefs) const;
+    /// "add 9"; empty for a value that is no option.
+    [[nodiscard]] static std::string OptionName(TChordOption option, const CChordNamePrefs& prefs);
+    [[nodiscard]] std::string OptionsName(const CChordNamePrefs& prefs) const;
+    [[nodiscard]] std::string OptionsNameWithPreceedingOptionalSpace(
+        const CChordNamePrefs& prefs) const;
+    /// One text for each option.
+    [[nodiscard]] std::vector<std::string> OptionsStringVector(const CChordNamePrefs& prefs) const;
+
     /// Same root, notes and intervals.
     [[nodiscard]] bool IsExactlyTheSame(const CChordHeavy& other) const;
     /// Same keys.
@@ -251,9 +287,14 @@ private:
     /// From the root up to the key of the lowest note, 0 to 11.
     [[nodiscard]] int _BassIntvl() const;
     [[nodiscard]] bool _IsDominantOfMinor(const CSignKeyHeavy& signKey) const;
+    /// The note, its spelling repaired, in that of itself and its neighbours with which the chord
+    /// on it needs the fewest signs.
+    [[nodiscard]] CNote _RootWithLeastSigns(CNote given) const;
 
     CNote mRootNote;
-    CMySet<CNote> mNotes;
+    /// Naming a chord spells the lowest one. The order by number always holds, the order by
+    /// spelling among notes of one number may not.
+    mutable CMySet<CNote> mNotes;
     mutable CIntvlSet mIntvlSet;
     bool mRootNoteSpecified = false;
     mutable bool mIntvlSetNeedsUpdate = false;

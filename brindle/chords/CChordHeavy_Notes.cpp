@@ -21,9 +21,7 @@ std::int64_t OctaveOf(const CNote& note) {
 
 template <class Predicate>
 void EraseNotesIf(CMySet<CNote>& notes, Predicate predicate) {
-    auto sequence = notes.extract_sequence();
-    sequence.erase(std::remove_if(sequence.begin(), sequence.end(), predicate), sequence.end());
-    notes.adopt_sequence(boost::container::ordered_unique_range, std::move(sequence));
+    notes.erase(std::remove_if(notes.begin(), notes.end(), predicate), notes.end());
 }
 
 /// The listed values up to the first that is no key number.

@@ -123,20 +123,13 @@ json Described(const json& in) {
             {"SetFromChordHeavy", FormOf(LiteOf(chord))}};
 }
 
-/// The name of a chord that is none, as the spelling of its root tells it.
-const char* NonChordName(const CChordHeavy& chord) {
-    if (chord.RootNote() == CChordHeavy_NoChordYield().RootNote()) return "No Chord Yield";
-    if (chord.RootNote() == CChordHeavy_NoChordForce().RootNote()) return "No Chord Force";
-    return "No Chord";
-}
-
 json Unfolded(const json& in) {
     const CChordLite compact = ChordLiteOf(in.at(0));
     const CChordHeavy chord = compact.ToChordHeavy(24);
     if (chord.RootNote().IsUndef()) {
         json form = NumbersOf(chord);
         form["BasicChord"] = static_cast<int>(chord.BasicChord());
-        form["Name"] = NonChordName(chord);
+        form["Name"] = chord.Name(CurrentChordNamePrefs);
         return form;
     }
     json form = {
