@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/chords/CChordHeavy.h"
 
+#include "brindle/platform/PlainText.h"
 #include "brindle/theory/CompingRange.h"
 #include "brindle/theory/KeyIntervals.h"
 #include "brindle/theory/Spelling.h"
@@ -115,7 +116,7 @@ void CChordHeavy::SetRootKeyEnh(CKeyEnh root) {
 }
 
 void CChordHeavy::SetRootNoteToIntvlIx(std::size_t ix) {
-    SetRootNote(IntvlIxToNote(static_cast<int>(ix)));
+    SetRootNote(ix < IntvlSet().size() ? IntvlIxToNote(static_cast<int>(ix)) : CNote_Undef);
 }
 
 void CChordHeavy::SetRootNoteEnhWithLeastSigns() {
@@ -180,14 +181,16 @@ bool operator==(const CChordHeavy& a, const CChordHeavy& b) {
 }
 
 void CChordHeavy::AppendJSONString(std::ostream& stream) const {
-    stream << R"({"root":)";
+    PlainText::Write(stream, R"({"root":)");
     mRootNote.AppendJSONString(stream);
-    stream << R"(,"basic":)" << static_cast<int>(BasicChord()) << R"(,"notes":[)";
+    PlainText::Write(stream, R"(,"basic":)");
+    PlainText::WriteInteger(stream, static_cast<int>(BasicChord()));
+    PlainText::Write(stream, R"(,"notes":[)");
     for (std::size_t ix = 0; ix < mNotes.size(); ++ix) {
-        if (ix > 0) stream << ',';
+        if (ix > 0) PlainText::Write(stream, ",");
         Note(ix).AppendJSONString(stream);
     }
-    stream << "]}";
+    PlainText::Write(stream, "]}");
 }
 
 std::ostream& operator<<(std::ostream& stream, const CChordHeavy& chord) {

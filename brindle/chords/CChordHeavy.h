@@ -7,6 +7,7 @@
 #include "brindle/theory/CMySet.h"
 #include "brindle/theory/CNote.h"
 #include "brindle/theory/CSemitones.h"
+#include "brindle/theory/Quantize.h"
 #include "brindle/theory/TBasicChord.h"
 
 #include <array>

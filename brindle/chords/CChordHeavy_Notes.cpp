@@ -3,7 +3,6 @@
 
 #include "brindle/theory/CompingRange.h"
 #include "brindle/theory/KeyIntervals.h"
-#include "brindle/theory/NoteSearch.h"
 
 #include <algorithm>
 #include <limits>
@@ -29,15 +28,6 @@ CMySet<int> ListedKeyNrs(std::span<const int> keyNrs) {
     const auto end = std::find_if(keyNrs.begin(), keyNrs.end(),
                                   [](int keyNr) { return keyNr < 0 || keyNr > 127; });
     return {keyNrs.begin(), end};
-}
-
-/// The note moved and limited to 0 to 127, in a spelling that suits its new key.
-CNote Moved(CNote note, std::int64_t distance) {
-    constexpr std::int64_t farAway = std::int64_t{1} << 40;
-    const std::int64_t from = std::clamp(note.mNoteNr, -farAway, farAway);
-    note.SetNoteNrAndMakeSensefulEnhAssumingCMajor(
-        std::clamp<std::int64_t>(from + distance, 0, 127));
-    return note;
 }
 
 }  // namespace
@@ -121,27 +111,6 @@ void CChordHeavy::SetFromKeyNrSet(const CMySet<int>& keyNrs) {
     SetFromNoteSet(std::move(notes));
 }
 
-void CChordHeavy::SetSemitones(const CSemitones& semitones) {
-    ClearAllExceptRoot();
-    if (!mRootNote.IsUndef()) {
-        CNote root(mRootNote.KeyEnh(), -1);
-        root.SetEnh(mRootNote.mEnh);
-        mNotes.insert(root);
-    }
-    for (const int intvl : semitones.IntvlSet()) AddIntvlInCompingPlusWrapIntvlRange(intvl);
-}
-
-void CChordHeavy::SetBasicChord(TBasicChord basicChord) {
-    CSemitones semitones;
-    semitones.SetFromBasicChord(basicChord);
-    SetSemitones(semitones);
-}
-
-void CChordHeavy::SetRootKeyNrAndBasicChord(int rootKeyNr, TBasicChord basicChord) {
-    SetRootKeyNr(rootKeyNr);
-    SetBasicChord(basicChord);
-}
-
 void CChordHeavy::AddNote(const CNote& note) {
     mNotes.insert(note);
     mIntvlSetNeedsUpdate = true;
@@ -170,78 +139,6 @@ void CChordHeavy::_DelNotesOfKeyNr(int keyNr) {
 
 void CChordHeavy::ClearAllExceptRoot() {
     mNotes.clear();
-    mIntvlSetNeedsUpdate = true;
-}
-
-void CChordHeavy::AddIntvl(int intvl) {
-    CNote note = mRootNote;
-    note.AddIntvlAndClampToKey(intvl);
-    _AddNoteNrAndIntvlIfNotAlreadyContained(intvl == kIntvlUndef ? kNoteNrUndef : note.mNoteNr);
-}
-
-void CChordHeavy::AddIntvlSetAboveRootNote(const CIntvlSet& intvls) {
-    for (const int intvl : intvls) AddIntvl(intvl);
-}
-
-void CChordHeavy::AddIntvlInCompingRange(int intvl) {
-    const bool undefined = mRootNote.IsUndef() || intvl == kIntvlUndef;
-    const int keyNr = FoldIntoOctave(std::int64_t{mRootNote.KeyNr()} + intvl);
-    _AddNoteNrAndIntvlIfNotAlreadyContained(undefined ? kNoteNrUndef : ToCompingRangeNoteNr(keyNr));
-}
-
-void CChordHeavy::AddIntvlSetInCompingRange(const CIntvlSet& intvls) {
-    for (const int intvl : intvls) AddIntvlInCompingRange(intvl);
-}
-
-void CChordHeavy::AddIntvlInCompingPlusWrapIntvlRange(int intvl) {
-    _AddNoteNrAndIntvlIfNotAlreadyContained(
-        NoteNrAddIntvlToCompingPlusWrapIntvlRange(mRootNote.mNoteNr, intvl, WrapIntvl()));
-}
-
-void CChordHeavy::_AddNoteNrAndIntvlIfNotAlreadyContained(std::int64_t noteNr) {
-    const CNote note(noteNr, TEnh_n);
-    if (HasNoteNr(note.mNoteNr)) return;
-    // The root does not follow: the interval was counted from it.
-    mNotes.insert(note);
-    mIntvlSetNeedsUpdate = true;
-}
-
-void CChordHeavy::Transpose(int intvl) {
-    CMySet<CNote> moved;
-    for (const CNote& note : mNotes) moved.insert(note.IsUndef() ? note : Moved(note, intvl));
-    mNotes = std::move(moved);
-    if (!mRootNote.IsUndef()) mRootNote = Moved(mRootNote, intvl);
-    mIntvlSetNeedsUpdate = true;
-}
-
-void CChordHeavy::Invert() {
-    CNote note = LowestNote();
-    if (note.IsUndef()) return;
-    const std::int64_t highest = HighestNote().mNoteNr;
-    mNotes.erase(mNotes.begin());
-    note.mNoteNr =
-        highest >= 116 ? 108 + note.KeyNr() : NoteNrOfKeyNrLargerThan(note.KeyNr(), highest);
-    mNotes.insert(note);
-    mIntvlSetNeedsUpdate = true;
-}
-
-void CChordHeavy::ChangeAllNotesWithinIntvlRange(int lo, int hi, int target) {
-    if (mRootNote.IsUndef()) return;
-    bool anyMoved = false;
-    CMySet<CNote> moved;
-    for (const CNote& note : mNotes) {
-        const int intvl = AbsKeyIntvlFromTo(mRootNote.KeyNr(), note.KeyNr());
-        if (note.IsUndef() || intvl < lo || intvl > hi) {
-            moved.insert(note);
-            continue;
-        }
-        const std::int64_t distance = std::int64_t{target} - intvl;
-        anyMoved = anyMoved || distance != 0;
-        // Kept: a far target is left behind instead of reached.
-        moved.insert(Moved(note, distance > 5 ? -distance : distance));
-    }
-    if (!anyMoved) return;
-    mNotes = std::move(moved);
     mIntvlSetNeedsUpdate = true;
 }
 

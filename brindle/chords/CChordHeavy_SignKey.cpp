@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/chords/CChordHeavy.h"
-#include "brindle/chords/CChordLite.h"
 #include "brindle/theory/CSignKeyHeavy.h"
 #include "brindle/theory/KeyIntervals.h"
 
@@ -78,24 +77,6 @@ int CChordHeavy::ClosenessToSignKey(const CSignKeyHeavy& signKey) const {
     const int distance = AbsKeyIntvlFromTo(signKey.RootKeyEnh().mKeyNr, mRootNote.KeyNr());
     return CountIntvlsInSignKey(signKey) - CountIntvlsNotInSignKey(signKey) +
            Bonus(BasicChord(), distance, IsMinorType(signKey.ScaleType()));
-}
-
-std::int64_t CChordHeavy::QuantizeToChord(std::int64_t noteNr, TQuantizeDirection direction) const {
-    return CChordLite(RootKeyEnh(), {}, Semitones()).QuantizeToChord(noteNr, direction);
-}
-
-std::int64_t CChordHeavy::QuantizeToBasicChord(std::int64_t noteNr,
-                                               TQuantizeDirection direction) const {
-    return CChordLite(RootKeyEnh(), {}, {})
-        ._QuantizeToSemitones(noteNr, direction, BasicChordSemitones());
-}
-
-int CChordHeavy::ChordKeyNrFromKeyNr(int keyNr) const {
-    return CChordLite(RootKeyEnh(), {}, {}).ChordKeyNrFromKeyNr(keyNr);
-}
-
-int CChordHeavy::KeyNrFromChordKeyNr(int chordKeyNr) const {
-    return CChordLite(RootKeyEnh(), {}, {}).KeyNrFromChordKeyNr(chordKeyNr);
 }
 
 }  // namespace brindle

@@ -3,6 +3,7 @@
 
 #include "brindle/theory/CKeyEnh.h"
 #include "brindle/theory/CSemitones.h"
+#include "brindle/theory/Quantize.h"
 #include "brindle/theory/TBasicChord.h"
 
 #include <cstdint>
@@ -17,7 +18,6 @@ class CChordHeavy;
 struct CChordNamePrefs;
 class CSignKeyHeavy;
 struct CSignKeyLite;
-enum TQuantizeDirection : std::int32_t;
 
 /// The compact form of a chord: a spelled root, a spelled bass or none, and the semitones that
 /// sound above the root. No octaves, no heap data.
