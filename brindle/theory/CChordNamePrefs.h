@@ -2,6 +2,7 @@
 #pragma once
 
 #include <cstdint>
+#include <iosfwd>
 #include <string>
 
 namespace brindle {
@@ -47,6 +48,8 @@ struct CChordNamePrefs {
     /// What stands for the slash of a slash chord.
     std::string mSlashText = "/";
 };
+
+std::ostream& operator<<(std::ostream& stream, const CChordNamePrefs& prefs);
 
 // The global preferences. A host may change them; nothing locks them.
 

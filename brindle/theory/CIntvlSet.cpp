@@ -5,7 +5,6 @@
 #include "brindle/theory/KeyIntervals.h"
 
 #include <cstdint>
-#include <ostream>
 #include <utility>
 
 namespace brindle {
@@ -121,16 +120,6 @@ void CIntvlSet::EraseIntvlInAnyOct(int intvl) {
     auto members = extract_sequence();
     members.erase(std::remove_if(members.begin(), members.end(), isErased), members.end());
     adopt_sequence(boost::container::ordered_unique_range, std::move(members));
-}
-
-std::ostream& operator<<(std::ostream& stream, const CIntvlSet& intvls) {
-    stream << '{';
-    const char* separator = "";
-    for (const int intvl : intvls) {
-        stream << separator << intvl;
-        separator = ", ";
-    }
-    return stream << '}';
 }
 
 CIntvlSet ConvertKeyNrSetToIntvlSet(const CMySet<int>& keyNrs, int root) {

@@ -5,7 +5,6 @@
 
 #include <array>
 #include <concepts>
-#include <iosfwd>
 #include <span>
 
 namespace brindle {
@@ -95,9 +94,6 @@ public:
 private:
     int mWrapIntvl = kDefaultWrapIntvl;
 };
-
-/// Writes the members as `{0, 4, 7}`.
-std::ostream& operator<<(std::ostream& stream, const CIntvlSet& intvls);
 
 /// The intervals of the keys above `root`, 0 to 11. Empty for an undefined root.
 [[nodiscard]] CIntvlSet ConvertKeyNrSetToIntvlSet(const CMySet<int>& keyNrs, int root);

@@ -6,6 +6,8 @@
 #include <boost/container/small_vector.hpp>
 #include <functional>
 #include <iterator>
+#include <ostream>
+#include <type_traits>
 
 namespace brindle {
 
@@ -48,5 +50,22 @@ public:
         return std::includes(this->begin(), this->end(), other.begin(), other.end());
     }
 };
+
+/// Writes the members as `{0, 4, 7}`; bytes are numbers too.
+template <class T>
+std::ostream& operator<<(std::ostream& stream, const CMySet<T>& set) {
+    stream << '{';
+    const char* separator = "";
+    for (const T& member : set) {
+        stream << separator;
+        if constexpr (std::is_integral_v<T>) {
+            stream << +member;
+        } else {
+            stream << member;
+        }
+        separator = ", ";
+    }
+    return stream << '}';
+}
 
 }  // namespace brindle

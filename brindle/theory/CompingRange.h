@@ -12,6 +12,7 @@ inline constexpr std::int64_t kCompingRangeStartNoteNr = 53;
 /// In semitones.
 inline constexpr int kCompingRangeWidth = 12;
 inline constexpr std::int64_t kCompingRangeEndNoteNr = 65;
+/// An octave number for hosts; nothing here reads it.
 inline constexpr int kCompingRangeBelowOctNr = 4;
 
 /// Whether the note number is 53 to 65, both included.

@@ -5,10 +5,11 @@
 
 namespace brindle {
 
-// One step of respelling. A key number is first reduced into 0 to 11, unless it is 15.
+// One step of respelling, towards flats, towards sharps, or to and fro. A key number is first
+// reduced into 0 to 11, unless it is 15. `TEnh_Undef` counts as natural.
 //
-// The three steps come in two forms: a key takes triple accidentals as double ones, a note takes
-// them as they are. To both, `TEnh_Undef` is natural.
+// Each step comes in two forms: keys take triple accidentals as double ones; notes take them as
+// they are, by the forms named Unclamped.
 
 [[nodiscard]] constexpr TEnh EnhShiftToFlatsUnclamped(int keyNr, TEnh enh) {
     const TEnh c = enh == TEnh_Undef ? TEnh_n : enh;

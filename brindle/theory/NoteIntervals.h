@@ -38,9 +38,9 @@ std::ostream& operator<<(std::ostream& stream, TKeyDirection direction);
 [[nodiscard]] int SmallestKeyIntvlBetween(const CNote& a, const CNote& b);
 [[nodiscard]] int KeyDistanceBetween(const CNote& a, const CNote& b);
 
-/// The lowest note number at which an interval still sounds clear. Intervals above 14 semitones
-/// count as the one whole octaves below that lies in 3 to 14; 0 for an octave, which has no limit,
-/// and for intervals below 1.
+/// The lowest note number at which an interval still sounds clear; 0 for an octave, which has no
+/// limit, and for intervals below 1. An interval above 14 semitones counts as the one that lies
+/// whole octaves below it in 3 to 14.
 [[nodiscard]] int LowIntervalLimit(int intvl);
 
 }  // namespace brindle

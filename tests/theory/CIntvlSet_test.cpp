@@ -4,6 +4,7 @@
 
 #include "brindle/theory/CIntvlSet.h"
 #include "brindle/theory/KeyIntervals.h"
+#include "brindle/theory/Trace.h"
 
 #include <doctest/doctest.h>
 
@@ -137,4 +138,10 @@ TEST_CASE("Sets unite, subtract and intersect") {
     CHECK((cMajor & aMinor) == CMySet<int>{0, 4});
     CHECK(cMajor.Includes({0, 7}));
     CHECK_FALSE(cMajor.Includes(aMinor));
+}
+
+TEST_CASE("Sets print their members as numbers or as the records they are") {
+    CHECK(TraceString(CIntvlSet(7, 4, 0)) == "{0, 4, 7}");
+    CHECK(TraceString(CMySet<unsigned char>{64, 60}) == "{60, 64}");
+    CHECK(TraceString(CMySet<CNote>{CNote(61, TEnh_b)}) == "{61 flat}");
 }

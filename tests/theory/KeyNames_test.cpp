@@ -4,6 +4,7 @@
 #include "brindle/platform/Localization.h"
 #include "brindle/theory/CChordNamePrefs.h"
 #include "brindle/theory/CKeyEnh.h"
+#include "brindle/theory/Trace.h"
 #include "tests/support/Expected.h"
 #include "tests/support/Forms.h"
 
@@ -35,6 +36,24 @@ std::string NextSyllableOf(const std::string& syllable) {
 }
 
 }  // namespace
+
+TEST_CASE("The preferences of each name are those that a host finds") {
+    const std::string plain = TraceString(CChordNamePrefs());
+    CHECK(plain ==
+          "CChordNamePrefs: HForB 0, BForBFlat 0, GermanNames 0, AsciiAccidentals 0, Solfege 0, "
+          "LocalizeSolfege 0, OctaveNaming 0, LowerCaseMinorRoot 0, ChordPrefB 1, "
+          "OmitBassOption 1, ChordPrefC 0, ChordPrefD 0, CommaParts 0, ChordPrefE 4, "
+          "OptionBrackets 0, ChordPrefF 0, NoSpaceBetweenNameParts 1, NoSpaceAroundSlash 1, "
+          "SlashText /");
+    CHECK(TraceString(CurrentChordNamePrefs) == plain);
+    CHECK(TraceString(CurrentChordNamePrefs_Fernhill) ==
+          "CChordNamePrefs: HForB 0, BForBFlat 0, GermanNames 0, AsciiAccidentals 0, Solfege 0, "
+          "LocalizeSolfege 0, OctaveNaming 0, LowerCaseMinorRoot 0, ChordPrefB 1, "
+          "OmitBassOption 1, ChordPrefC 0, ChordPrefD 0, CommaParts 1, ChordPrefE 4, "
+          "OptionBrackets 0, ChordPrefF 0, NoSpaceBetweenNameParts 0, NoSpaceAroundSlash 0, "
+          "SlashText /");
+    CHECK(ChordNamePrefsNonUTF8.mAsciiAccidentals == 1);
+}
 
 TEST_CASE("Keys are named as expected under every mix of preferences") {
     test::CheckExpected(
