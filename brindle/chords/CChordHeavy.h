@@ -23,7 +23,10 @@
 namespace brindle {
 
 struct CChordNamePrefs;
+struct CHarmCenterLite;
+class CScaleHeavy;
 class CSignKeyHeavy;
+struct CSignKeyLite;
 
 /// The full form of a chord: a root note, the sounding notes with octaves and spellings, and the
 /// intervals of the notes above the root.
@@ -237,6 +240,26 @@ public:
                                                     TQuantizeDirection direction) const;
     [[nodiscard]] int ChordKeyNrFromKeyNr(int keyNr) const;
     [[nodiscard]] int KeyNrFromChordKeyNr(int chordKeyNr) const;
+
+    // Function in a key
+
+    /// The harmonic function by the scale degree of the root and the basic chord: 0 to 12 for I,
+    /// Im, II, IIm, IIdim, III, IIIm, IV, IVm, V, Vm, VI and VIm, 14 for VIIdim; -1 for none.
+    [[nodiscard]] int HarmFuncIn(const CScaleHeavy& scale) const;
+    /// "IIm", or with `mChordPrefF` 1 the function letters "Sp"; "undef".
+    [[nodiscard]] std::string_view HarmFuncName(const CSignKeyHeavy& signKey,
+                                                const CChordNamePrefs& prefs) const;
+    /// Scale step of the root (the lowest note) in a key, counted from 0, whatever the spelling; -1
+    /// if it is not in the key.
+    [[nodiscard]] int RootNoteDegreeNrInSignKey(const CSignKeyHeavy& signKey) const;
+    [[nodiscard]] int BassNoteDegreeNrInSignKey(const CSignKeyHeavy& signKey) const;
+    /// The scale that belongs to the chord in a key, see CScaleHeavy::ConstructScaleForChord.
+    [[nodiscard]] CScaleHeavy ConstructScaleInSignKey(const CSignKeyHeavy& signKey) const;
+    [[nodiscard]] CScaleHeavy ConstructScaleInSignKey(const CSignKeyLite& signKey) const;
+    [[nodiscard]] CScaleHeavy ConstructScaleInHarmCenter(const CHarmCenterLite& center) const;
+    /// Spells the notes, but not the root, by the scale that the chord has of itself: `TEnh_Undef`
+    /// where that scale is not in the catalogue. `changed` may be null; it is always set to false.
+    void AdjustEnhOfChordNotesToRootScale(bool* changed);
 
     // Names. They are told from the intervals, so that any set of notes has one.
 

@@ -16,6 +16,7 @@ namespace brindle {
 
 class CChordHeavy;
 struct CChordNamePrefs;
+class CScaleHeavy;
 class CSignKeyHeavy;
 struct CSignKeyLite;
 
@@ -110,6 +111,11 @@ public:
     /// is not in the key.
     [[nodiscard]] int RootNoteDegreeNrInSignKey(const CSignKeyHeavy& signKey) const;
     [[nodiscard]] int BassNoteDegreeNrInSignKey(const CSignKeyHeavy& signKey) const;
+
+    /// The harmonic function, see CChordHeavy::HarmFuncIn and HarmFuncName.
+    [[nodiscard]] int HarmFuncIn(const CScaleHeavy& scale) const;
+    [[nodiscard]] std::string_view HarmFuncNameIn(const CSignKeyHeavy& signKey,
+                                                  const CChordNamePrefs& prefs) const;
 
     /// Whether the chord belongs to a key. Major and augmented triads and dominant sevenths pass
     /// on the root alone: A7 belongs to C major.
