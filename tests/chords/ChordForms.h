@@ -35,6 +35,11 @@ inline CChordHeavy ChordHeavyOf(const nlohmann::json& form) {
     return chord;
 }
 
+/// The same, or a compact chord in full
+inline CChordHeavy AnyChordOf(const nlohmann::json& form) {
+    return form.contains("semitones") ? ChordLiteOf(form).ToChordHeavy(24) : ChordHeavyOf(form);
+}
+
 inline nlohmann::json FormOf(const CChordHeavy& chord) {
     return {{"root", FormOf(chord.RootNote())}, {"notes", NotesFormOf(chord)}};
 }

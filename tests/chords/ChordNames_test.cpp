@@ -15,11 +15,6 @@ using nlohmann::json;
 
 namespace {
 
-/// A compact chord in full, or a chord of notes.
-CChordHeavy AnyChordOf(const json& form) {
-    return form.contains("semitones") ? ChordLiteOf(form).ToChordHeavy(24) : ChordHeavyOf(form);
-}
-
 using TNaming = std::string (CChordHeavy::*)(const CChordNamePrefs&) const;
 
 /// in: [chord, preferences]
