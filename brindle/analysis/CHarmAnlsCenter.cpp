@@ -2,7 +2,7 @@
 #include "brindle/analysis/CHarmAnlsCenter.h"
 
 #include "brindle/analysis/CHarmAnlsSignKey.h"
-#include "brindle/analysis/JsonText.h"
+#include "brindle/analysis/internal/JsonText.h"
 #include "brindle/theory/KeyIntervals.h"
 
 namespace brindle {

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/analysis/CHarmAnlsProgression.h"
 
-#include "brindle/analysis/JsonText.h"
+#include "brindle/analysis/internal/JsonText.h"
 #include "brindle/theory/CScaleLite.h"
 #include "brindle/theory/KeyIntervals.h"
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/analysis/CHarmAnlsProgressions.h"
 
-#include "brindle/analysis/JsonText.h"
+#include "brindle/analysis/internal/JsonText.h"
 
 #include <algorithm>
 #include <ostream>

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/analysis/CHarmAnlsSignKeys.h"
 
-#include "brindle/analysis/JsonText.h"
-#include "brindle/analysis/MergeAdjacent.h"
+#include "brindle/analysis/internal/JsonText.h"
+#include "brindle/analysis/internal/MergeAdjacent.h"
 
 #include <iterator>
 

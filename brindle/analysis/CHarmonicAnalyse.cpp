@@ -66,20 +66,14 @@ void CHarmonicAnalyse::Analyse(TAnalyse analyse) {
 }
 
 void CHarmonicAnalyse::_FindAndInsertHarmCenters(TAnalyse analyse) {
-    switch (analyse) {
-        case TAnalyse_TonicProgressions:
-            mProgressions = CHarmAnlsProgressions::TonicProgressions();
-            _FindAndInsertHarmCentersUsingTonicProgressions(TOnlyUndefCenters_No);
-            break;
-        case TAnalyse_CadenceProgressions:
-            mProgressions = CHarmAnlsProgressions::CadenceProgressions();
-            _FindAndInsertHarmCentersUsingCadenceProgressions(TOnlyUndefCenters_No);
-            break;
-        case TAnalyse_CenterWeights:
-            break;
-        case TAnalyse_None:
-        default:
-            return;
+    if (analyse == TAnalyse_TonicProgressions) {
+        mProgressions = CHarmAnlsProgressions::TonicProgressions();
+        _FindAndInsertHarmCentersUsingTonicProgressions(TOnlyUndefCenters_No);
+    } else if (analyse == TAnalyse_CadenceProgressions) {
+        mProgressions = CHarmAnlsProgressions::CadenceProgressions();
+        _FindAndInsertHarmCentersUsingCadenceProgressions(TOnlyUndefCenters_No);
+    } else if (analyse != TAnalyse_CenterWeights) {
+        return;
     }
     _FindAndInsertHarmCentersUsingCenterWeightAnalysis({}, TOnlyUndefCenters_No);
 }

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/analysis/CSemitonesMatch.h"
 
-#include "brindle/analysis/JsonText.h"
+#include "brindle/analysis/internal/JsonText.h"
 #include "brindle/theory/CIntvlSet.h"
 
 #include <algorithm>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "brindle/analysis/JsonText.h"
+#include "brindle/analysis/internal/JsonText.h"
 
 #include "brindle/analysis/Positions.h"
 

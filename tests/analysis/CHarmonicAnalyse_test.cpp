@@ -32,6 +32,11 @@ json AnalyseFromChordString(const json& in) {
     return JSONStringOf(analyse);
 }
 
+std::filesystem::path TemporaryPath() {
+    return std::filesystem::temp_directory_path() /
+           ("brindle_analysis_" + std::to_string(std::random_device()()));
+}
+
 std::string ContentOf(const std::filesystem::path& path) {
     std::ifstream file(path, std::ios::binary);
     return {std::istreambuf_iterator<char>(file), {}};
@@ -108,13 +113,33 @@ TEST_CASE(
     }
 }
 
+TEST_CASE("A file is analysed by tonic progressions whatever the arguments ask for") {
+    const auto path = TemporaryPath();
+    std::ofstream(path) << "Dm7 G7\n\nC";
+    TChordStringParse slow;
+    slow.mBeatsPerChord = 8.0;
+    CHarmonicAnalyse fromFile;
+    fromFile.AnalyseFromChordStringFile(path.string(), CHarmAnlsSignKeys(3), TAnalyse_CenterWeights,
+                                        slow);
+    std::filesystem::remove(path);
+    CHarmonicAnalyse fromText;
+    fromText.AnalyseFromChordString("Dm7 G7 C", {}, TAnalyse_TonicProgressions, {});
+    CHECK(JSONStringOf(fromFile) == JSONStringOf(fromText));
+
+    // A file that is missing, or a folder, is an empty text.
+    fromText.AnalyseFromChordString("", {}, TAnalyse_TonicProgressions, {});
+    for (const auto& unreadable : {path, path.parent_path()}) {
+        fromFile.AnalyseFromChordStringFile(unreadable.string(), {}, TAnalyse_None, {});
+        CHECK(JSONStringOf(fromFile) == JSONStringOf(fromText));
+    }
+}
+
 TEST_CASE(
     "The result goes to a file in the given mode, and a file that cannot be written is no harm") {
     CHarmonicAnalyse analyse;
     analyse.AnalyseFromChordString("C G7", {}, TAnalyse_None, TChordStringParse());
     const std::string text = JSONStringOf(analyse);
-    const auto path = std::filesystem::temp_directory_path() /
-                      ("brindle_analysis_" + std::to_string(std::random_device()()) + ".json");
+    const auto path = TemporaryPath();
     analyse.WriteAnalysisResultToFile(path.string(), 0);
     CHECK(ContentOf(path) == text);
     analyse.WriteAnalysisResultToFile(path.string(), 1);
