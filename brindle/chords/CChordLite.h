@@ -158,6 +158,10 @@ public:
 
 static_assert(std::is_trivially_copyable_v<CChordLite>);
 
+/// Writes the chord's name under `CurrentChordNamePrefs`, with the bass of a slash chord, and then
+/// root, bass and mask: `CChordLite: C/E  RootKeyEnh CKeyEnh(0, TEnh_n), BassKeyEnh ...`.
+std::ostream& operator<<(std::ostream& stream, const CChordLite& chord);
+
 /// Reads a chord symbol into `chord`, which is reset first.
 void SetFromString(std::string_view symbol, CChordLite& chord, const CChordNamePrefs& prefs);
 

@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/chords/CChordHeavy.h"
 #include "brindle/chords/CChordLite.h"
+#include "brindle/platform/PlainText.h"
+#include "brindle/theory/CChordNamePrefs.h"
+
+#include <ostream>
 
 namespace brindle {
 
@@ -25,6 +29,17 @@ void CChordLite::SetFromChordHeavy(const CChordHeavy& chord) {
     if (IsUndef()) return;
     semitones.AddIntvl(0);
     mSemitones = semitones;
+}
+
+std::ostream& operator<<(std::ostream& stream, const CChordLite& chord) {
+    const CChordHeavy named = chord.ToChordHeavy(CChordHeavy::DefaultWrapIntvl);
+    stream << "CChordLite: "
+           << (chord.IsSlashChord() ? named.NameWithSlash(CurrentChordNamePrefs)
+                                    : named.NameWithoutSlash(CurrentChordNamePrefs))
+           << "  RootKeyEnh " << chord.mRootKeyEnh.StringForInitializerList() << ", BassKeyEnh "
+           << chord.mBassKeyEnh.StringForInitializerList() << ", Semitones ";
+    PlainText::WriteUnsigned(stream, chord.mSemitones.Mask());
+    return stream;
 }
 
 }  // namespace brindle

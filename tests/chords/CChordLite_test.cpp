@@ -3,6 +3,7 @@
 #include "tests/support/Expected.h"
 
 #include "brindle/theory/KeyIntervals.h"
+#include "brindle/theory/Trace.h"
 
 #include <doctest/doctest.h>
 
@@ -217,6 +218,18 @@ TEST_CASE("Half-diminished chords are named as minor only with their own seventh
     CHECK(halfDiminished.BasicChordForNaming() == TBasicChord::Minor);
     const CChordLite seventhInBass(kC, kBFlat, CSemitones{0, 3, 6});
     CHECK(seventhInBass.BasicChordForNaming() == TBasicChord::Diminished);
+}
+
+TEST_CASE("A compact chord is traced by its name and its fields") {
+    CHECK(TraceString(CChordLite(kC, {4, TEnh_n}, CSemitones{0, 4, 7})) ==
+          "CChordLite: C/E  RootKeyEnh CKeyEnh(0, TEnh_n), BassKeyEnh CKeyEnh(4, TEnh_n), "
+          "Semitones 145");
+    CHECK(TraceString(CChordLite(kC, kC, CSemitones{0, 3, 7})) ==
+          "CChordLite: Cm  RootKeyEnh CKeyEnh(0, TEnh_n), BassKeyEnh CKeyEnh(0, TEnh_n), "
+          "Semitones 137");
+    CHECK(TraceString(CChordLite_Undef) ==
+          "CChordLite: No Chord  RootKeyEnh CKeyEnh(15, TEnh_Undef), "
+          "BassKeyEnh CKeyEnh(15, TEnh_Undef), Semitones 0");
 }
 
 TEST_CASE("The hash code tells the three non-chords apart and keeps the directions") {
