@@ -6,6 +6,7 @@
 #include "cli/KeyText.h"
 #include "cli/Names.h"
 
+#include "brindle/analysis/CAnalyseHarmCenterAlternatives.h"
 #include "brindle/analysis/TChordStringParse.h"
 
 #include <fmt/format.h>
@@ -21,7 +22,7 @@ constexpr TCommandHelp kHelp{
     "analyse",
     "Find the keys, the harmonic centers and the function of each chord of a song",
     "  brindle analyse \"Dm7 G7 | C\"\n"
-    "  brindle analyse --key \"A minor\" \"Am Dm | E7 Am\"\n"
+    "  brindle analyse --key \"A minor\" --readings \"Am Dm | E7 Am\"\n"
     "  brindle analyse --file song.txt --beats-per-bar 3 --format svg >song.svg\n"
     "  cat song.txt | brindle analyse - --json\n"
     "\n"
@@ -40,6 +41,7 @@ struct TAnalyseOptions {
     std::string mKey;
     double mBeatsPerBar = 4.0;
     double mBeatsPerChord = 1.0;
+    bool mReadings = false;
     CFormatOptions mFormat;
 };
 
@@ -60,6 +62,9 @@ std::optional<std::string> Contradiction(const TAnalyseOptions& options) {
     for (const double beats : {options.mBeatsPerBar, options.mBeatsPerChord}) {
         if (beats >= kShortest && beats <= kLongest) continue;
         return "--beats-per-bar and --beats-per-chord take 1/1024 to 1024 beats";
+    }
+    if (options.mReadings && options.mFormat.Format() == TFormat::Native) {
+        return "--readings has no native form; --format json shows them";
     }
     return std::nullopt;
 }
@@ -109,8 +114,12 @@ TStatus Analyse(const TAnalyseOptions& options) {
     CHarmonicAnalyse analyse;
     analyse.AnalyseFromChordString(FoldAccidentals(*typed), signKeys, RouteOf(options.mRoute),
                                    parse);
+    CHarmAnlsCenters readings;
+    if (options.mReadings) {
+        readings = CAnalyseHarmCenterAlternatives(analyse.mChords).BestResults();
+    }
     const CChordSymbols symbols(*typed, parse, analyse.mChords);
-    return Print(Present(analyse, nullptr, symbols, options));
+    return Print(Present(analyse, options.mReadings ? &readings : nullptr, symbols, options));
 }
 
 }  // namespace
@@ -134,6 +143,8 @@ void AddAnalyse(CLI::App& program, TStatus& status) {
         .add_option("--beats-per-chord", options->mBeatsPerChord,
                     "Length of a chord in beats (default: 1)")
         ->option_text("BEATS");
+    command.add_flag("--readings", options->mReadings,
+                     "Show all readings that progressions to a tonic allow");
     options->mFormat.AddTo(command, {"text", "json", "native", "svg"});
     command.callback([options, &status] { status = Analyse(*options); });
 }

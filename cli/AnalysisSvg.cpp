@@ -119,6 +119,11 @@ public:
     explicit CSongPicture(const TSong& song)
         : mSong(song), mAxis(song, kLineWidth, WidestChord(song)), mLanes(song.mReadings) {
         PlaceLines();
+        if (song.mEnd <= 0.0) {
+            mSvg.Text(kMargin + kPadding, kMargin + kChordTop, "no chords",
+                      {.mSize = kSymbolSize, .mColor = kFaintInk});
+            return;
+        }
         DrawBars();
         DrawSignKeys();
         for (const TShownSignKey& signKey : song.mSignKeys) {
@@ -209,10 +214,10 @@ private:
         const double x = kMargin + first.mLeft + kPadding;
         const double room = first.Width() - kPadding - kGap;
         const double top = mTops[first.mLine];
-        mSvg.TextIfItFits(x, top + kChordTop + 22, room, chord.mSymbol,
-                          {.mSize = kSymbolSize, .mColor = kInk, .mBold = true});
-        mSvg.TextIfItFits(x, top + kFunctionTop + 11, room, FunctionOf(chord),
-                          {.mSize = kFunctionSize, .mColor = kFaintInk});
+        mSvg.TextCut(x, top + kChordTop + 22, room, chord.mSymbol,
+                     {.mSize = kSymbolSize, .mColor = kInk, .mBold = true});
+        mSvg.TextCut(x, top + kFunctionTop + 11, room, FunctionOf(chord),
+                     {.mSize = kFunctionSize, .mColor = kFaintInk});
     }
 
     void DrawReadings() {
@@ -234,8 +239,8 @@ private:
             const double x = kMargin + segment.mLeft + kGap;
             const double y = mTops[segment.mLine] + top;
             mSvg.Rect(x, y, std::max(0.5, segment.Width() - 2 * kGap), height, color, label);
-            mSvg.TextIfItFits(x + kPadding, y + height / 2 + font.mSize * 0.36,
-                              segment.Width() - kPadding, label, font);
+            mSvg.TextCut(x + kPadding, y + height / 2 + font.mSize * 0.36,
+                         segment.Width() - kPadding, label, font);
         }
     }
 

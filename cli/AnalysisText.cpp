@@ -54,7 +54,7 @@ public:
         StartParagraph();
         mText += mPaint.Strong("Readings") + "\n\n";
         if (readings.empty()) {
-            mText += "    none: no progression of this song ends on a tonic\n";
+            mText += "    none found\n";
             return;
         }
         CTable table({"center", "where", "probability", "chords"});

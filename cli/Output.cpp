@@ -6,6 +6,7 @@
 #include <fmt/format.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <cerrno>
 #include <cstdio>
 #include <cstdlib>
@@ -23,6 +24,10 @@ bool IsControl(std::string_view character) {
     if (lead == 0xC2) return static_cast<unsigned char>(character[1]) < 0xA0;
     // U+FFFE and U+FFFF, which XML does not allow.
     return character == "\xEF\xBF\xBE" || character == "\xEF\xBF\xBF";
+}
+
+bool BeginsCharacter(char c) {
+    return (static_cast<unsigned char>(c) & 0xC0) != 0x80;
 }
 
 bool WantsColor() {
@@ -69,9 +74,16 @@ std::string Printable(std::string_view text) {
 }
 
 std::size_t Width(std::string_view text) {
-    std::size_t width = 0;
-    for (const char c : text) width += (static_cast<unsigned char>(c) & 0xC0) != 0x80;
-    return width;
+    return static_cast<std::size_t>(std::count_if(text.begin(), text.end(), BeginsCharacter));
+}
+
+std::string FirstCharacters(std::string_view text, std::size_t count) {
+    std::size_t begun = 0;
+    const auto* const end = std::find_if(text.begin(), text.end(), [&](char c) {
+        begun += BeginsCharacter(c);
+        return begun > count;
+    });
+    return {text.begin(), end};
 }
 
 std::string PadRight(std::string_view text, std::size_t width) {

@@ -34,6 +34,9 @@ TStatus Print(std::string_view text);
 /// The number of characters of UTF-8 text.
 [[nodiscard]] std::size_t Width(std::string_view text);
 
+/// The first `count` characters of UTF-8 text.
+[[nodiscard]] std::string FirstCharacters(std::string_view text, std::size_t count);
+
 /// The text, filled with blanks on the right (left) side to so many characters.
 [[nodiscard]] std::string PadRight(std::string_view text, std::size_t width);
 [[nodiscard]] std::string PadLeft(std::string_view text, std::size_t width);

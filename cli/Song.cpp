@@ -19,7 +19,7 @@ public:
     [[nodiscard]] TShownCenter Show(const CHarmAnlsCenter& center) const {
         TShownCenter shown;
         shown.mHarmCenter = center.mHarmCenter;
-        shown.mName = center.IsUndef() ? "no center" : center.mHarmCenter.NameLong(NamePrefs());
+        shown.mName = center.IsUndef() ? "unknown" : center.mHarmCenter.NameLong(NamePrefs());
         shown.mProbability = center.mProbability;
         for (const CHarmAnlsChordWithPos& chord : center.mChords) {
             // A center that was put together from several readings holds a chord once for each.
@@ -39,7 +39,7 @@ public:
     [[nodiscard]] TShownSignKey Show(const CHarmAnlsSignKey& signKey) const {
         TShownSignKey shown;
         shown.mSignKey = signKey.mSignKey;
-        shown.mName = signKey.IsUndef() ? "no sign key" : signKey.mSignKey.NameLong(NamePrefs());
+        shown.mName = signKey.IsUndef() ? "unknown" : signKey.mSignKey.NameLong(NamePrefs());
         shown.mBegin = std::max(0.0, signKey.mPosition);
         for (const CHarmAnlsCenter& center : signKey.mHarmCenters) {
             shown.mCenters.push_back(Show(center));

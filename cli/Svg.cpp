@@ -15,6 +15,8 @@ namespace {
 // The mean width of a letter in the usual sans-serif fonts, with some room to spare.
 constexpr double kLetterWidth = 0.62;
 
+constexpr std::string_view kEllipsis = "\xE2\x80\xA6";
+
 // Two digits are finer than any screen, and make small files.
 std::string Coordinate(double value) {
     std::string text = fmt::format("{:.2f}", value);
@@ -88,9 +90,12 @@ void CSvg::Text(double x, double y, std::string_view text, const TSvgFont& font)
     mBody += ">" + XmlEscaped(text) + "</text>\n";
 }
 
-void CSvg::TextIfItFits(double x, double y, double width, std::string_view text,
-                        const TSvgFont& font) {
-    if (TextWidth(text, font.mSize) <= width) Text(x, y, text, font);
+void CSvg::TextCut(double x, double y, double width, std::string_view text, const TSvgFont& font) {
+    if (TextWidth(text, font.mSize) <= width) return Text(x, y, text, font);
+    const auto letters =
+        static_cast<std::size_t>(std::max(0.0, width / TextWidth("x", font.mSize)));
+    if (letters < 2) return;
+    Text(x, y, FirstCharacters(text, letters - 1) + std::string(kEllipsis), font);
 }
 
 std::string CSvg::File(double width, double height, std::string_view title) const {

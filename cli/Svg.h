@@ -29,9 +29,8 @@ public:
               std::string_view tooltip = {});
     void Line(double x1, double y1, double x2, double y2, std::string_view color);
     void Text(double x, double y, std::string_view text, const TSvgFont& font);
-    /// Writes the text only if it fits into the width.
-    void TextIfItFits(double x, double y, double width, std::string_view text,
-                      const TSvgFont& font);
+    /// Writes as much of the text as fits into the width.
+    void TextCut(double x, double y, double width, std::string_view text, const TSvgFont& font);
 
     /// The whole file; `title` is read out by screen readers.
     [[nodiscard]] std::string File(double width, double height, std::string_view title) const;

@@ -76,14 +76,14 @@ std::vector<TBarLine> CTimeAxis::BarLines(std::size_t line) const {
 
     std::vector<TBarLine> lines;
     const double start = static_cast<double>(line) * mBeatsPerLine;
-    const double end = start + Line(line).mRight * mBeatsPerLine / mLineWidth;
     // A hair to the left, so that rounding does not lose the bar that begins with the line.
     double bar = std::ceil((start / mBeatsPerBar - 1e-6) / step) * step;
-    for (; bar * mBeatsPerBar < end; bar += step) {
+    for (;; bar += step) {
         const double x = (bar * mBeatsPerBar - start) * mLineWidth / mBeatsPerLine;
+        // The bar line at the right end is drawn at the begin of the next line.
+        if (!(x < Line(line).mRight - 1.0)) return lines;
         lines.push_back({std::max(0.0, x), std::lround(bar) + 1});
     }
-    return lines;
 }
 
 }  // namespace brindle::cli

@@ -118,6 +118,7 @@ std::vector<std::string> IncludeFaults(std::string_view path, std::string_view t
     const auto report = [&](const std::string& name, std::string_view what) {
         faults.push_back(std::string(path) + ": " + name + ": " + std::string(what));
     };
+    if (FloorOf(path) == kNowhere) report("", "stands on no floor of the house");
     const bool isLibrary = FloorOf(path) < kProgram;
     const bool isPublicHeader = isLibrary && IsHeader(path) && !IsInternal(path);
     for (const auto& name : Includes(text)) {

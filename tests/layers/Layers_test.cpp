@@ -72,6 +72,7 @@ TEST_CASE("The checker finds what is planted") {
         {"brindle/chords/A.cpp", "#include \"brindle/brindle.h\"", true},
         {"brindle/chords/A.cpp", "#include \"cli/Output.h\"", true},
         {"brindle/chords/A.cpp", "#include \"brindle/cellar/A.h\"", true},
+        {"brindle/cellar/A.cpp", "", true},
         {"brindle/platform/A.cpp", "#include \"brindle/theory/CNote.h\"", true},
         {"brindle/platform/A.cpp", "#include <libxml/parser.h>", false},
         {"brindle/musicxml/A.cpp", "#include <libxml/parser.h>", true},
