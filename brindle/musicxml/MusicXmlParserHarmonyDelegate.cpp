@@ -2,12 +2,10 @@
 #include "brindle/musicxml/MusicXmlParserHarmonyDelegate.h"
 
 #include "brindle/musicxml/PlayedMeasures.h"
-#include "brindle/platform/PlainNumber.h"
+#include "brindle/platform/ReadNumber.h"
 #include "brindle/theory/CSignKeyHeavy.h"
 
 namespace brindle {
-
-using PlainNumber::ReadInteger;
 
 void MusicXmlParserHarmonyDelegate::didStartDocument(XmlStreamParser&) {
     lastSegno = -1;

@@ -2,7 +2,7 @@
 #include "brindle/musicxml/PlayedMeasures.h"
 
 #include "brindle/musicxml/TMusicXMLDoc.h"
-#include "brindle/platform/PlainNumber.h"
+#include "brindle/platform/ReadNumber.h"
 
 #include <algorithm>
 
@@ -124,7 +124,7 @@ private:
 
     void JumpToRepeatStart() {
         if (!mMeasure->mRepeatWords.empty()) {
-            mRepeatTimes = PlainNumber::ReadInteger(mMeasure->mRepeatWords.back());
+            mRepeatTimes = ReadInteger(mMeasure->mRepeatWords.back());
         }
         if (mPass >= mRepeatTimes || (mMeasure->mCoda && mToCoda)) {
             mInRepeat = false;

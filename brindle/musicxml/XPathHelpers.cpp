@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/musicxml/XPathHelpers.h"
 
-#include "brindle/platform/PlainNumber.h"
+#include "brindle/platform/ReadNumber.h"
 
 #include <algorithm>
 
@@ -32,12 +32,12 @@ std::string LowercaseStringValueForXPath(const XmlNode& node, const XmlPath& pat
 
 std::int32_t IntValueForXPath(const XmlNode& node, const XmlPath& path, std::int32_t defaultValue) {
     const XmlNode found = node.firstForXPath(path);
-    return found ? PlainNumber::ReadInteger(found.stringValue()) : defaultValue;
+    return found ? ReadInteger(found.stringValue()) : defaultValue;
 }
 
 double DoubleValueForXPath(const XmlNode& node, const XmlPath& path, double defaultValue) {
     const XmlNode found = node.firstForXPath(path);
-    return found ? PlainNumber::ReadDouble(found.stringValue()) : defaultValue;
+    return found ? ReadDecimal(found.stringValue()) : defaultValue;
 }
 
 XmlNode XMLElementForXPath(const XmlNode& node, const XmlPath& path) {

@@ -11,15 +11,61 @@
 
 namespace brindle {
 
+namespace {
+
+constexpr std::string_view kWhiteSpace = " \t\n\v\f\r";
+
+bool IsDigit(char character) {
+    return character >= '0' && character <= '9';
+}
+
+std::string_view WithoutWhiteSpace(std::string_view text) {
+    const std::size_t first = text.find_first_not_of(kWhiteSpace);
+    return first == std::string_view::npos ? std::string_view() : text.substr(first);
+}
+
+// Moves `pos` over decimal digits and tells whether there were any.
+bool SkipDigits(std::string_view text, std::size_t& pos) {
+    const std::size_t first = pos;
+    while (pos < text.size() && IsDigit(text[pos])) ++pos;
+    return pos > first;
+}
+
+bool SkipSign(std::string_view text, std::size_t& pos) {
+    const bool isSign = pos < text.size() && (text[pos] == '-' || text[pos] == '+');
+    if (isSign) ++pos;
+    return isSign;
+}
+
+// The longest front of the text that is a decimal number; empty if there is none.
+std::string_view NumberAtFront(std::string_view text) {
+    std::size_t pos = 0;
+    SkipSign(text, pos);
+    bool hasDigits = SkipDigits(text, pos);
+    if (pos < text.size() && text[pos] == '.') {
+        ++pos;
+        hasDigits = SkipDigits(text, pos) || hasDigits;
+    }
+    if (!hasDigits) return {};
+    std::size_t exponent = pos + 1;
+    if (pos < text.size() && (text[pos] == 'e' || text[pos] == 'E')) {
+        SkipSign(text, exponent);
+        if (SkipDigits(text, exponent)) pos = exponent;
+    }
+    return text.substr(0, pos);
+}
+
+}  // namespace
+
 std::int32_t ReadInteger(std::string_view text) {
     constexpr std::int64_t kMin = std::numeric_limits<std::int32_t>::min();
     constexpr std::int64_t kMax = std::numeric_limits<std::int32_t>::max();
-    text.remove_prefix(std::min(text.find_first_not_of(" \t\n\v\f\r"), text.size()));
+    text = WithoutWhiteSpace(text);
     const bool isNegative = text.starts_with('-');
     if (isNegative || text.starts_with('+')) text.remove_prefix(1);
     std::int64_t magnitude = 0;
     for (const char c : text) {
-        if (c < '0' || c > '9') break;
+        if (!IsDigit(c)) break;
         magnitude = std::min(magnitude * 10 + (c - '0'), -kMin);
     }
     return static_cast<std::int32_t>(isNegative ? -magnitude : std::min(magnitude, kMax));
@@ -28,6 +74,10 @@ std::int32_t ReadInteger(std::string_view text) {
 double ReadDouble(const std::string& text) {
     static const locale_t kClassic = newlocale(LC_ALL_MASK, "C", nullptr);
     return strtod_l(text.c_str(), nullptr, kClassic);
+}
+
+double ReadDecimal(std::string_view text) {
+    return ReadDouble(std::string(NumberAtFront(WithoutWhiteSpace(text))));
 }
 
 }  // namespace brindle

@@ -16,4 +16,8 @@ namespace brindle {
 /// As `atof` reads it in the "C" locale: 0.0 where there is none, infinity where it is too great.
 [[nodiscard]] double ReadDouble(const std::string& text);
 
+/// A sign, decimal digits, a point and an exponent; no hexadecimal form and no words such as "nan".
+/// Without digits it is 0.
+[[nodiscard]] double ReadDecimal(std::string_view text);
+
 }  // namespace brindle

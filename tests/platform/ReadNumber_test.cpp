@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "brindle/platform/PlainNumber.h"
+#include "brindle/platform/ReadNumber.h"
 
 #include <doctest/doctest.h>
 
@@ -28,7 +28,7 @@ TEST_CASE("Numbers at the front of a text are read free of the locale and within
     };
     for (const TRow& row : rows) {
         CAPTURE(row.mText);
-        CHECK(PlainNumber::ReadInteger(row.mText) == row.mInteger);
-        CHECK(PlainNumber::ReadDouble(row.mText) == row.mDouble);
+        CHECK(ReadInteger(row.mText) == row.mInteger);
+        CHECK(ReadDecimal(row.mText) == row.mDouble);
     }
 }
