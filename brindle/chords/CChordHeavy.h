@@ -2,6 +2,7 @@
 #pragma once
 
 #include "brindle/chords/TChordOption.h"
+#include "brindle/chords/TSingleChordAnalysisAlgo.h"
 #include "brindle/theory/CIntvlSet.h"
 #include "brindle/theory/CKeyEnh.h"
 #include "brindle/theory/CMySet.h"
@@ -90,6 +91,21 @@ public:
     /// Respells root and bass so that the scale of the chord needs the fewest signs; the present
     /// spelling wins a tie, then the one to the flat side.
     void SetRootNoteEnhWithLeastSigns();
+
+    // Finding the root (defined in neural/)
+
+    /// Takes the key that is most likely the root, by the notes alone, as root and only note of
+    /// octave -1, and respells the notes by it. A chord without notes becomes undefined.
+    ///
+    /// The net hears two octaves above the lowest note if the wrap interval is 24, as it is by
+    /// default. Several threads may search at once, each in a chord of its own; for the net see
+    /// NetForSingleChordAnalysis.
+    void SetRootNoteAndEnh_ToLikeliestRegardingNoteSet(TSingleChordAnalysisAlgo algo);
+    /// The points of a note's key as root of this chord, whose intervals are taken above its
+    /// present root; the more, the likelier.
+    [[nodiscard]] int ProbThatNoteIsRootNote(const CNote& note) const;
+    /// Sets the wrap interval to the 24 semitones that the net hears.
+    void SetWrapIntvlToNeuronalNetInputCount();
 
     // Notes
 
@@ -303,6 +319,9 @@ public:
     void AppendJSONString(std::ostream& stream) const;
 
 private:
+    [[nodiscard]] CNote _LikeliestRootByScore() const;
+    [[nodiscard]] bool _WinsTie(const CNote& candidate, const CNote& best) const;
+    [[nodiscard]] CNote _LikeliestRootByNet();
     void _AddTonesAndBass(const CIntvlSet& intvls, const CKeyEnh& bass);
     void _AddNoteNrAndIntvlIfNotAlreadyContained(std::int64_t noteNr);
     void _FollowLowestNote();

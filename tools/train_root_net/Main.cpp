@@ -103,7 +103,7 @@ int main(int argc, char** argv) {
 
     const std::vector<TChordRootPattern> patterns = ChordRootPatterns();
     const std::vector<double> weights = TrainedWeights(patterns, seed, cycles);
-    const THeardRoots heard[] = {HeardByNet(patterns, weights)};
+    const THeardRoots heard[] = {HeardByNet(patterns, weights), FoundByScore(patterns)};
     const std::string table = WeightTableText(weights);
     const std::string figures = fmt::format(
         "Trained with seed {}, {} cycles. The output of the right root stands at least {:.3f} "

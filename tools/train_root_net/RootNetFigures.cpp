@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "tools/train_root_net/RootNetFigures.h"
 
+#include "brindle/chords/CChordHeavy.h"
 #include "brindle/neural/ChordAnalysisNeuronalNet.h"
 #include "brindle/neural/NeuronalNet.h"
 
@@ -134,6 +135,24 @@ THeardRoots HeardByNet(std::span<const TChordRootPattern> patterns,
     for (const TChordRootPattern& pattern : patterns) {
         net.use(InputsOf(pattern));
         heard.mRootIntvls.push_back(static_cast<int>(net.winner()));
+    }
+    return heard;
+}
+
+THeardRoots FoundByScore(std::span<const TChordRootPattern> patterns) {
+    constexpr unsigned kLowestC = 48;
+    THeardRoots heard{"score", {}};
+    for (const TChordRootPattern& pattern : patterns) {
+        CMySet<unsigned char> noteNrs;
+        for (unsigned i = 0; i < kChordRootInputCount; ++i) {
+            if ((pattern.mInputs >> i & 1U) != 0) {
+                noteNrs.insert(static_cast<unsigned char>(kLowestC + i));
+            }
+        }
+        CChordHeavy chord;
+        chord.SetFromNoteNrSet(noteNrs);
+        chord.SetRootNoteAndEnh_ToLikeliestRegardingNoteSet(TSingleChordAnalysisAlgo_Score);
+        heard.mRootIntvls.push_back(chord.RootNote().KeyNr());
     }
     return heard;
 }

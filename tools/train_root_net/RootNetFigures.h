@@ -18,6 +18,9 @@ struct THeardRoots {
 /// The roots that the net with these weights hears.
 [[nodiscard]] THeardRoots HeardByNet(std::span<const TChordRootPattern> patterns,
                                      std::span<const double> weights);
+/// The roots that the score finds, for the same notes upwards from C.
+[[nodiscard]] THeardRoots FoundByScore(std::span<const TChordRootPattern> patterns);
+
 /// How far the right output of the net stands above the others, at least.
 [[nodiscard]] double LeastMargin(std::span<const TChordRootPattern> patterns,
                                  std::span<const double> weights);
