@@ -38,6 +38,7 @@
 #include "brindle/chords/ChordAndScaleStrings.h"
 #include "brindle/chords/ChordSymbolKeywords.h"
 #include "brindle/chords/TChordOption.h"
+#include "brindle/chords/TSingleChordAnalysisAlgo.h"
 #include "brindle/musicxml/CChordSetFromMusicXml.h"
 #include "brindle/musicxml/HarmonyKinds.h"
 #include "brindle/musicxml/MusicXmlParserHarmonyDelegate.h"
