@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 // How long it takes to find the root of a chord, by the score and by the net: the points or the
-// forward pass alone, and the whole call, which also spells the chord by its new root. Usual chords in
-// all keys and inversions; that each root is right is checked.
+// forward pass alone, and the whole call, which also spells the chord by its new root. Usual chords
+// in all keys and inversions; that each root is right is checked.
 
 #include "brindle/chords/CChordHeavy.h"
 #include "brindle/neural/NetForSingleChordAnalysis.h"
