@@ -1,8 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "cli/CommandLine.h"
-#include "cli/Input.h"
-#include "cli/Json.h"
 #include "cli/KeyText.h"
+#include "cli/LineByLine.h"
 #include "cli/Names.h"
 
 #include "brindle/theory/CSignKeyHeavy.h"
@@ -21,11 +20,6 @@ constexpr TCommandHelp kHelp{
     "  brindle key \"F# minor\"\n"
     "  brindle key Bb --json\n"
     "  cat keys.txt | brindle key -\n",
-};
-
-struct TKeyOptions {
-    std::vector<std::string> mWords;
-    CFormatOptions mFormat;
 };
 
 // 15 stands for a key that has no code, G# major for instance.
@@ -65,28 +59,17 @@ std::string KeyText(const CSignKeyLite& key, const CPaint& paint) {
         HasCode(code) ? fmt::format("{}", code) : "none");
 }
 
-TStatus Key(const TKeyOptions& options) {
-    const auto lines = TypedLines(options.mWords);
-    if (!lines) return TStatus::BadInput;
-    Json list = Json::array();
-    std::string text;
-    for (const std::string& line : *lines) {
-        const std::string typed = FoldAccidentals(line);
-        const TKeyText read = ReadKeyText(typed);
-        if (!read.mError.empty()) {
-            return FailAt(TStatus::BadInput, read.mError, typed, read.mColumn);
-        }
-        list.push_back(KeyToJson(read.mSignKey));
-        text += (text.empty() ? "" : "\n") + KeyText(read.mSignKey, CPaint());
-    }
-    return Print(options.mFormat.Format() == TFormat::Json ? JsonText({{"Keys", list}}) : text);
+TStatus Key(const TLineOptions& options) {
+    return PrintLineByLine(
+        options, "Keys", ReadKeyText, [](const TKeyText& read) { return KeyToJson(read.mSignKey); },
+        [](const TKeyText& read) { return KeyText(read.mSignKey, CPaint()); });
 }
 
 }  // namespace
 
 void AddKey(CLI::App& program, TStatus& status) {
     CLI::App& command = AddCommand(program, kHelp);
-    const auto options = std::make_shared<TKeyOptions>();
+    const auto options = std::make_shared<TLineOptions>();
     command.add_option("KEY", options->mWords, "A key, major or minor; - reads one a line")
         ->required()
         ->option_text("...");

@@ -1,8 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "cli/CommandLine.h"
-#include "cli/Input.h"
-#include "cli/Json.h"
 #include "cli/KeyText.h"
+#include "cli/LineByLine.h"
 #include "cli/Names.h"
 
 #include "brindle/theory/CScaleLite.h"
@@ -21,11 +20,6 @@ constexpr TCommandHelp kHelp{
     "  brindle scale \"D dorian\"\n"
     "  brindle scale Bb blues minor --json\n"
     "  cat scales.txt | brindle scale -\n",
-};
-
-struct TScaleOptions {
-    std::vector<std::string> mWords;
-    CFormatOptions mFormat;
 };
 
 std::string TypeName(TScaleType type) {
@@ -63,28 +57,18 @@ std::string ScaleText(const CScaleHeavy& scale, const CPaint& paint) {
         TypeName(scale.ScaleType()), SignsText(scale.SignsCount()));
 }
 
-TStatus Scale(const TScaleOptions& options) {
-    const auto lines = TypedLines(options.mWords);
-    if (!lines) return TStatus::BadInput;
-    Json list = Json::array();
-    std::string text;
-    for (const std::string& line : *lines) {
-        const std::string typed = FoldAccidentals(line);
-        const TScaleText read = ReadScaleText(typed);
-        if (!read.mError.empty()) {
-            return FailAt(TStatus::BadInput, read.mError, typed, read.mColumn);
-        }
-        list.push_back(ScaleToJson(read.mScale));
-        text += (text.empty() ? "" : "\n") + ScaleText(read.mScale, CPaint());
-    }
-    return Print(options.mFormat.Format() == TFormat::Json ? JsonText({{"Scales", list}}) : text);
+TStatus Scale(const TLineOptions& options) {
+    return PrintLineByLine(
+        options, "Scales", ReadScaleText,
+        [](const TScaleText& read) { return ScaleToJson(read.mScale); },
+        [](const TScaleText& read) { return ScaleText(read.mScale, CPaint()); });
 }
 
 }  // namespace
 
 void AddScale(CLI::App& program, TStatus& status) {
     CLI::App& command = AddCommand(program, kHelp);
-    const auto options = std::make_shared<TScaleOptions>();
+    const auto options = std::make_shared<TLineOptions>();
     command
         .add_option("SCALE", options->mWords, "A key and the name of a scale; - reads one a line")
         ->required()

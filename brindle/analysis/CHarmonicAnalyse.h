@@ -4,7 +4,6 @@
 #include "brindle/analysis/CHarmAnlsChords.h"
 #include "brindle/analysis/CHarmAnlsProgressions.h"
 #include "brindle/analysis/CHarmAnlsSignKeys.h"
-#include "brindle/analysis/CHarmCopy.h"
 #include "brindle/analysis/TAnalyse.h"
 
 #include <cstdint>
@@ -62,10 +61,6 @@ public:
 
     /// Replaces `chords` with the chords of all centers of all sign keys.
     void ListAllHarmChords(CHarmAnlsChords& chords) const;
-    /// Replaces `chords` with the input chords and their lengths; the last one has no length.
-    void ListAllHarmChordsWithLength(CHarmAnlsChordsWithLength& chords) const;
-    /// Replaces `copies` with the passages of the input that repeat an earlier one, by position.
-    void FindHarmCopies(CHarmCopies& copies) const;
 
     /// Writes the result as JSON text. Not strict JSON: each list ends with a comma.
     void AppendJSONString(std::ostream& stream) const;
