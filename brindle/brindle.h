@@ -37,6 +37,7 @@
 #include "brindle/chords/CChordTypes.h"
 #include "brindle/chords/ChordAndScaleStrings.h"
 #include "brindle/chords/ChordSymbolKeywords.h"
+#include "brindle/chords/HarmFuncNames.h"
 #include "brindle/chords/TChordOption.h"
 #include "brindle/chords/TSingleChordAnalysisAlgo.h"
 #include "brindle/musicxml/CChordSetFromMusicXml.h"

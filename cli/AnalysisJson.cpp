@@ -20,8 +20,10 @@ class CJsonMaker {
 public:
     explicit CJsonMaker(const CChordSymbols& symbols) : mSymbols(symbols) {}
 
-    [[nodiscard]] Json Make(const CHarmAnlsChordWithPos& chord) const {
+    [[nodiscard]] Json Make(const CHarmAnlsChordWithPos& chord,
+                            const CHarmCenterLite& center) const {
         const std::string& symbol = mSymbols.SymbolOf(chord);
+        const std::string numeral(NumeralOf(chord, center));
         return {{"Position", NumberToJson(chord.mPosition)},
                 {"Symbol", NameToJson(symbol.empty(), symbol)},
                 {"RootKeyEnh", KeyEnhToJson(chord.mRootKeyEnh)},
@@ -29,11 +31,14 @@ public:
                 {"Semitones", chord.mSemitones.Mask()},
                 {"Intervals", IntervalsToJson(chord.mSemitones)},
                 {"RootDistToHarmCenter", DistanceToJson(chord.mRootDistToHarmCenter)},
-                {"BassDistToHarmCenter", DistanceToJson(chord.mBassDistToHarmCenter)}};
+                {"BassDistToHarmCenter", DistanceToJson(chord.mBassDistToHarmCenter)},
+                {"Numeral", NameToJson(numeral.empty(), numeral)}};
     }
 
     [[nodiscard]] Json Make(const CHarmAnlsCenter& center) const {
         const CHarmCenterLite& harmCenter = center.mHarmCenter;
+        Json chords = Json::array();
+        for (const auto& chord : center.mChords) chords.push_back(Make(chord, harmCenter));
         return {{"Probability", NumberToJson(center.mProbability)},
                 {"Position", NumberToJson(center.mPosition)},
                 {"HarmCenter",
@@ -41,7 +46,7 @@ public:
                   {"CKeyEnh", KeyEnhToJson(harmCenter.mRootKeyEnh)},
                   {"Semitones", harmCenter.mSemitones.Mask()},
                   {"Intervals", IntervalsToJson(harmCenter.mSemitones)}}},
-                {"HarmChords", List(center.mChords)}};
+                {"HarmChords", chords}};
     }
 
     [[nodiscard]] Json Make(const CHarmAnlsSignKey& signKey) const {

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
 // A song as a picture. Time runs from left to right and breaks into lines as text does. Each line
 // has, from above: the numbers of the bars, a band for the sign key, a band for the center, the
-// chords in boxes with their function under them, and thin bands for the readings. The color of a
-// band is that of its key: neighbours on the circle of fifths have neighbouring colors, and minor
-// keys are darker.
+// chords in boxes with their function or else their degree under them, and thin bands for the
+// readings. The color of a band is that of its key: neighbours on the circle of fifths have
+// neighbouring colors, and minor keys are darker.
 
 #include "cli/Analysis.h"
 #include "cli/Names.h"
@@ -67,7 +67,8 @@ std::string ColorOf(const CHarmCenterLite& center, TShade shade) {
 }
 
 std::string FunctionOf(const TShownChord& chord) {
-    std::string function(DegreeName(chord.mRootDist));
+    std::string function = chord.mNumeral;
+    if (function.empty()) function = DegreeName(chord.mRootDist);
     if (chord.mBassDist >= 0) function += fmt::format("/{}", DegreeName(chord.mBassDist));
     return function;
 }

@@ -101,12 +101,13 @@ private:
     }
 
     void WriteChords(const std::vector<TShownChord>& chords) {
-        CTable table({" bar", " beat", "chord", "root", "bass"});
+        CTable table({" bar", " beat", "chord", "function", "root", "bass"});
         long barBefore = 0;
         for (const TShownChord& chord : chords) {
             const long bar = mBars.BarOf(chord.mRange.mBegin);
             table.AddRow({bar == barBefore ? "" : fmt::format("{}", bar),
                           ShortNumber(mBars.BeatOf(chord.mRange.mBegin)), chord.mSymbol,
+                          chord.mNumeral.empty() ? "-" : chord.mNumeral,
                           DistanceText(chord.mRootDist),
                           chord.mBassDist < 0 ? "" : DistanceText(chord.mBassDist)});
             barBefore = bar;

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: MIT
 #include "cli/Names.h"
 
+#include "brindle/chords/CChordLite.h"
+#include "brindle/chords/HarmFuncNames.h"
+#include "brindle/theory/CHarmCenterLite.h"
 #include "brindle/theory/CScaleHeavy.h"
 #include "brindle/theory/KeyNames.h"
 
@@ -24,6 +27,12 @@ std::string_view DegreeName(int distance) {
         {"I", "bII", "II", "bIII", "III", "IV", "#IV", "V", "bVI", "VI", "bVII", "VII"});
     if (distance < 0 || distance > 11) return {};
     return names[static_cast<std::size_t>(distance)];
+}
+
+std::string_view NumeralOf(const CChordLite& chord, const CHarmCenterLite& center) {
+    const CScaleHeavy scale(center.mRootKeyEnh, center.mSemitones);
+    const int function = chord.HarmFuncIn(scale);
+    return function < 0 ? "" : HarmFuncName(function, scale.ScaleType(), NamePrefs());
 }
 
 std::string SemitonesText(CSemitones semitones) {

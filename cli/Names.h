@@ -11,8 +11,10 @@
 #include <vector>
 
 namespace brindle {
+class CChordLite;
+struct CHarmCenterLite;
 class CScaleHeavy;
-}
+}  // namespace brindle
 
 namespace brindle::cli {
 
@@ -25,6 +27,9 @@ namespace brindle::cli {
 /// The scale degree that lies `distance` semitones above a tonic, in Roman numerals: "V" for 7,
 /// "bIII" for 3. Empty for -1.
 [[nodiscard]] std::string_view DegreeName(int distance);
+
+/// The function of a chord in a center in Roman numerals: "V", "IIm". Empty where it has none.
+[[nodiscard]] std::string_view NumeralOf(const CChordLite& chord, const CHarmCenterLite& center);
 
 /// The semitones of a mask: "0 4 7".
 [[nodiscard]] std::string SemitonesText(CSemitones semitones);

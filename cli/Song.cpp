@@ -25,7 +25,9 @@ public:
             // A center that was put together from several readings holds a chord once for each.
             const bool isRepeated =
                 !shown.mChords.empty() && shown.mChords.back().mRange.mBegin == chord.mPosition;
-            if (!isRepeated && chord.mPosition < End()) shown.mChords.push_back(Show(chord));
+            if (isRepeated || chord.mPosition >= End()) continue;
+            shown.mChords.push_back(Show(chord));
+            shown.mChords.back().mNumeral = NumeralOf(chord, center.mHarmCenter);
         }
         if (shown.mChords.empty()) {
             const double begin = std::clamp(center.mPosition, 0.0, End());
@@ -71,7 +73,8 @@ private:
         return {{chord.mPosition, end},
                 mSymbols.SymbolOf(chord),
                 chord.mRootDistToHarmCenter,
-                chord.mBassDistToHarmCenter};
+                chord.mBassDistToHarmCenter,
+                {}};
     }
 
     const CHarmAnlsChords& mChords;

@@ -25,6 +25,7 @@ struct TShownChord {
     std::string mSymbol;
     int mRootDist = -1;  ///< semitones above the center, -1 for none
     int mBassDist = -1;
+    std::string mNumeral;  ///< the function in the center, empty for none
 };
 
 /// A center as it is shown. Its range is that of its chords; without chords it is empty and begins

@@ -2,7 +2,7 @@
 // What a chord means in a key: its function, its degrees and the scale that belongs to it.
 #include "brindle/chords/CChordHeavy.h"
 #include "brindle/chords/CChordLite.h"
-#include "brindle/theory/CChordNamePrefs.h"
+#include "brindle/chords/HarmFuncNames.h"
 #include "brindle/theory/CHarmCenterLite.h"
 #include "brindle/theory/CScaleHeavy.h"
 #include "brindle/theory/CScaleLite.h"
@@ -12,7 +12,6 @@
 
 #include <array>
 #include <cstddef>
-#include <cstdint>
 
 namespace brindle {
 
@@ -32,49 +31,7 @@ constexpr auto kHarmFuncs = std::to_array<std::array<int, 7>>({
     { 11,   12,   -1,  -1,  -1,  -1,  -1},
     { -1,   -1,   -1,  14,  -1,  -1,  -1},
 });
-
-struct THarmFuncName {
-    std::string_view roman;
-    std::string_view inMajor;
-    std::string_view inMinor;
-};
-
-// By the number of the function. The "##" mark the spots that have no function letter of their own.
-constexpr auto kHarmFuncNames = std::to_array<THarmFuncName>({
-    {"I",      "T",                "T"},
-    {"Im",     "t",                "t"},
-    {"II",     "DD / SP",          "DD / SP"},
-    {"IIm",    "Sp",               "Sp"},
-    {"IIdim",  "IIdim##",          "IIdim##"},
-    {"III",    "TG",               "P"},
-    {"IIIm",   "Sp",               "IIIm##in minor"},
-    {"IV",     "S",                "S"},
-    {"IVm",    "s",                "s"},
-    {"V",      "D",                "D"},
-    {"Vm",     "d",                "d"},
-    {"VI",     "TP",               "sP = G"},
-    {"VIm",    "Tp",               "sp"},
-    {"bVII",   "SS",               "sp"},
-    {"VIIdim", "VIIdim##in minor", "VIIdim##in minor"},
-});
 // clang-format on
-
-/// The scale types whose functions have the names of major, type 2 at bit 0. Kept: they are not
-/// the complement of the minor colours that decide whether a chord belongs to a key.
-constexpr std::uint32_t kFunctionMajorTypes = 36174;
-
-bool IsFunctionMinorType(TScaleType type) {
-    const auto bit = static_cast<std::uint32_t>(type) - 2;
-    return bit <= 17 && (kFunctionMajorTypes >> bit & 1) == 0;
-}
-
-std::string_view NameOfHarmFunc(int harmFunc, TScaleType type, const CChordNamePrefs& prefs) {
-    const auto ix = static_cast<std::size_t>(harmFunc);
-    if (ix >= kHarmFuncNames.size()) return "undef";
-    const THarmFuncName& name = kHarmFuncNames[ix];
-    if (prefs.mChordPrefF != 1) return name.roman;
-    return IsFunctionMinorType(type) ? name.inMinor : name.inMajor;
-}
 
 }  // namespace
 
@@ -88,7 +45,7 @@ int CChordHeavy::HarmFuncIn(const CScaleHeavy& scale) const {
 
 std::string_view CChordHeavy::HarmFuncName(const CSignKeyHeavy& signKey,
                                            const CChordNamePrefs& prefs) const {
-    return NameOfHarmFunc(HarmFuncIn(signKey), signKey.ScaleType(), prefs);
+    return brindle::HarmFuncName(HarmFuncIn(signKey), signKey.ScaleType(), prefs);
 }
 
 int CChordLite::HarmFuncIn(const CScaleHeavy& scale) const {
