@@ -73,13 +73,6 @@ std::string ChordsText(const std::vector<TReadChord>& chords, const CPaint& pain
     return text;
 }
 
-std::optional<std::vector<std::string>> TypedSymbols(const std::vector<std::string>& words) {
-    if (!IsStandardInput(words)) return words;
-    const auto text = ReadInput("-");
-    if (!text) return std::nullopt;
-    return WordsOf(*text);
-}
-
 TStatus Chord(const TChordOptions& options) {
     const auto symbols = TypedSymbols(options.mSymbols);
     if (!symbols) return TStatus::BadInput;

@@ -91,4 +91,11 @@ std::vector<std::string> WordsOf(std::string_view text) {
     return Split(text, kWhiteSpace);
 }
 
+std::optional<std::vector<std::string>> TypedSymbols(const std::vector<std::string>& words) {
+    if (!IsStandardInput(words)) return words;
+    const auto text = ReadInput("-");
+    if (!text) return std::nullopt;
+    return WordsOf(*text);
+}
+
 }  // namespace brindle::cli

@@ -31,4 +31,8 @@ namespace brindle::cli {
 /// The pieces of a text between white space.
 [[nodiscard]] std::vector<std::string> WordsOf(std::string_view text);
 
+/// The words of a command line; the single word "-" reads those of standard input.
+[[nodiscard]] std::optional<std::vector<std::string>> TypedSymbols(
+    const std::vector<std::string>& words);
+
 }  // namespace brindle::cli

@@ -7,6 +7,8 @@
 #include "cli/Output.h"
 
 #include <string>
+#include <type_traits>
+#include <variant>
 #include <vector>
 
 namespace brindle::cli {
@@ -17,23 +19,34 @@ struct TLineOptions {
     CFormatOptions mFormat;
 };
 
+/// What each typed line means. The first line with a fault, or with nothing to read, gives an error
+/// status instead. `read` gives a record with `mError` and `mColumn`.
+template <class Read>
+std::variant<TStatus, std::vector<std::invoke_result_t<Read, const std::string&>>> ReadLines(
+    const std::vector<std::string>& words, Read read) {
+    const auto lines = TypedLines(words);
+    if (!lines) return TStatus::BadInput;
+    std::vector<std::invoke_result_t<Read, const std::string&>> readings;
+    for (const std::string& line : *lines) {
+        const std::string typed = FoldAccidentals(line);
+        readings.push_back(read(typed));
+        if (readings.back().mError.empty()) continue;
+        return FailAt(TStatus::BadInput, readings.back().mError, typed, readings.back().mColumn);
+    }
+    return readings;
+}
+
 /// Reads each typed line and prints what the lines mean: one JSON list of that name, or texts with
-/// a blank line between. The first line with a fault ends it. `read` gives a record with `mError`
-/// and `mColumn`, which `toJson` and `toText` take.
+/// a blank line between. `read` is that of ReadLines; `toJson` and `toText` take its records.
 template <class Read, class ToJson, class ToText>
 TStatus PrintLineByLine(const TLineOptions& options, const char* listName, Read read, ToJson toJson,
                         ToText toText) {
-    const auto lines = TypedLines(options.mWords);
-    if (!lines) return TStatus::BadInput;
+    const auto lines = ReadLines(options.mWords, read);
+    if (lines.index() == 0) return std::get<0>(lines);
     const bool isJson = options.mFormat.Format() == TFormat::Json;
     Json list = Json::array();
     std::string text;
-    for (const std::string& line : *lines) {
-        const std::string typed = FoldAccidentals(line);
-        const auto reading = read(typed);
-        if (!reading.mError.empty()) {
-            return FailAt(TStatus::BadInput, reading.mError, typed, reading.mColumn);
-        }
+    for (const auto& reading : std::get<1>(lines)) {
         if (isJson) {
             list.push_back(toJson(reading));
         } else {

@@ -14,7 +14,9 @@ constexpr const char* kExamples =
     "  brindle analyse --file song.txt --format svg >song.svg\n"
     "  brindle chord F#m7/C# Bb13\n"
     "  brindle scale \"D dorian\"\n"
-    "  brindle key \"F# minor\" --json\n";
+    "  brindle key \"F# minor\" --json\n"
+    "  brindle name E2 G3 C4\n"
+    "  brindle function Dm7 G7 --key C\n";
 
 std::string SubcommandNames(const CLI::App& program) {
     std::vector<std::string> names;
@@ -55,6 +57,10 @@ int main(int argc, char** argv) {
     AddChord(program, status);
     AddScale(program, status);
     AddKey(program, status);
+    AddName(program, status);
+    AddFunction(program, status);
+    AddTypes(program, status);
+    AddNet(program, status);
     try {
         program.parse(argc, argv);
     } catch (const CLI::ParseError& error) {

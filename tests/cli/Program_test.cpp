@@ -68,7 +68,10 @@ TEST_CASE("All JSON of the program is strict") {
           "brindle analyse --json --readings 'Dm7 G7 C F#m7b5 B7 Em'",
           "brindle analyse --json $'C\\xff\"\\\\<&>\\x01 G'",
           "brindle chord --json 'C\"\xff' undef X", "brindle scale --json 'Fb mm7'",
-          "brindle key --json 'G# major'"}) {
+          "brindle key --json 'G# major'",
+          "brindle name --json --all-roots C4 E4 --slash-text $'\\xff\"'",
+          "brindle function --json X --key C", "brindle types --json",
+          "brindle net weights --json"}) {
         INFO(command);
         const auto json = nlohmann::json::parse(RunCommand(command).mShown, nullptr, false);
         CHECK_FALSE(json.is_discarded());

@@ -1,0 +1,30 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/theory/CChordNamePrefs.h"
+
+#include <CLI/CLI.hpp>
+#include <string>
+
+namespace brindle::cli {
+
+/// The options that tell how names are written, one for each naming preference that has an effect.
+class CNamingOptions {
+public:
+    void AddTo(CLI::App& command);
+
+    [[nodiscard]] CChordNamePrefs Prefs() const;
+
+private:
+    CChordNamePrefs mPrefs;
+    bool mAscii = false;
+    bool mSlash = false;
+    bool mKeepBassOption = false;
+    bool mBrackets = false;
+    bool mSpaces = false;
+    bool mSpacesAroundSlash = false;
+    std::string mMiddleC = "4";
+    std::string mMajorSeventh = "ma7";
+};
+
+}  // namespace brindle::cli

@@ -1,0 +1,97 @@
+// SPDX-License-Identifier: MIT
+#include "cli/NotesText.h"
+
+#include "brindle/theory/CChordNamePrefs.h"
+
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <charconv>
+#include <optional>
+#include <utility>
+
+namespace brindle::cli {
+namespace {
+
+constexpr std::int64_t kMiddleC = 60;
+constexpr std::int64_t kHighestNoteNr = 127;
+
+/// The whole text as a number.
+std::optional<int> WholeNumber(std::string_view text) {
+    int number = 0;
+    const char* const end = text.data() + text.size();
+    const auto read = std::from_chars(text.data(), end, number);
+    if (read.ec != std::errc() || read.ptr != end) return std::nullopt;
+    return number;
+}
+
+/// The lowest note of a key that is not below `limit`.
+std::int64_t NoteNrFrom(std::int64_t limit, int keyNr) {
+    return limit + (keyNr - limit % 12 + 12) % 12;
+}
+
+class CNotesReader {
+public:
+    explicit CNotesReader(const CChordNamePrefs& prefs) : mPrefs(prefs) {}
+
+    /// What is wrong with the word; empty if it is a note.
+    std::string Read(std::string_view word) {
+        if (const auto number = WholeNumber(word)) return Add(*number, TEnh_n, word);
+        CKeyEnh key;
+        int consumed = 0;
+        key.SetFromString(std::string(word), &consumed, mPrefs);
+        if (key.IsUndef()) {
+            return "a note is a key and its octave, as in Eb4, or a number of 0 to 127";
+        }
+        const std::string_view octave = word.substr(static_cast<std::size_t>(consumed));
+        if (octave.empty()) return Add(NoteNrFrom(mNext, key.mKeyNr), key.mEnh, word);
+        const auto octaveNr = WholeNumber(octave);
+        if (!octaveNr) return fmt::format("behind the key stands its octave, not {}", octave);
+        const int octaveOfMiddleC = 3 + mPrefs.mOctaveNaming;
+        return Add((std::int64_t{*octaveNr} - octaveOfMiddleC) * 12 + kMiddleC + key.mKeyNr,
+                   key.mEnh, word);
+    }
+
+    [[nodiscard]] CMySet<CNote> Notes() && { return std::move(mNotes); }
+
+private:
+    std::string Add(std::int64_t noteNr, TEnh enh, std::string_view word) {
+        if (noteNr < 0 || noteNr > kHighestNoteNr) {
+            return fmt::format("{} is outside of the notes 0 to 127", word);
+        }
+        const bool isThere = std::any_of(mNotes.begin(), mNotes.end(),
+                                         [&](const CNote& note) { return note.mNoteNr == noteNr; });
+        if (!isThere) mNotes.insert(CNote(noteNr, enh));
+        mNext = noteNr + 1;
+        return {};
+    }
+
+    const CChordNamePrefs& mPrefs;
+    CMySet<CNote> mNotes;
+    std::int64_t mNext = kMiddleC;
+};
+
+}  // namespace
+
+TNotesText ReadNotesText(std::string_view text, const CChordNamePrefs& prefs) {
+    constexpr std::string_view blanks = " \t\r\n";
+    CNotesReader reader(prefs);
+    std::size_t begin = text.find_first_not_of(blanks);
+    while (begin != text.npos) {
+        const std::size_t end = std::min(text.find_first_of(blanks, begin), text.size());
+        std::string error = reader.Read(text.substr(begin, end - begin));
+        if (!error.empty()) return {{}, std::move(error), begin};
+        begin = text.find_first_not_of(blanks, end);
+    }
+    return {std::move(reader).Notes(), {}, 0};
+}
+
+std::string NotesName(const CMySet<CNote>& notes, const CChordNamePrefs& prefs) {
+    std::string name;
+    for (const CNote& note : notes) {
+        name += (name.empty() ? "" : " ") + note.KeyName(prefs) + note.OctName(prefs);
+    }
+    return name;
+}
+
+}  // namespace brindle::cli

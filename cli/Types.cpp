@@ -1,0 +1,64 @@
+// SPDX-License-Identifier: MIT
+#include "cli/CommandLine.h"
+#include "cli/Json.h"
+#include "cli/Names.h"
+#include "cli/Table.h"
+
+#include "brindle/chords/CChordHeavy.h"
+#include "brindle/chords/CChordTypes.h"
+
+#include <fmt/format.h>
+
+#include <memory>
+
+namespace brindle::cli {
+namespace {
+
+constexpr TCommandHelp kHelp{
+    "types",
+    "List the catalogue of chord types: id, name, intervals, and the name on C",
+    "  brindle types\n"
+    "  brindle types --json\n",
+};
+
+std::string NameOnC(const CChordType& type) {
+    return CChordHeavy(CKeyEnh_C, type.mIntvls, CKeyEnh_Undef).NameWithSlash(NamePrefs());
+}
+
+std::string TypesJson(const CChordTypeVec& types) {
+    Json list = Json::array();
+    for (const CChordType& type : types) {
+        list.push_back({{"Id", type.mId},
+                        {"Name", type.mName},
+                        {"Intervals", std::vector<int>(type.mIntvls.begin(), type.mIntvls.end())},
+                        {"NameOnC", NameOnC(type)}});
+    }
+    return JsonText({{"ChordTypes", list}});
+}
+
+std::string TypesText(const CChordTypeVec& types, const CPaint& paint) {
+    CTable table({" id", "name", "intervals", "on C"});
+    for (const CChordType& type : types) {
+        table.AddRow({fmt::format("{}", type.mId), type.mName,
+                      fmt::format("{}", fmt::join(type.mIntvls, " ")), NameOnC(type)});
+    }
+    std::string text = paint.Faint(table.Head()) + '\n';
+    for (std::size_t row = 0; row < table.RowCount(); ++row) text += table.Row(row) + '\n';
+    return text;
+}
+
+TStatus Types(const CFormatOptions& format) {
+    const CChordTypeVec& types = _s_chordTypes().BuiltIn();
+    return Print(format.Format() == TFormat::Json ? TypesJson(types) : TypesText(types, CPaint()));
+}
+
+}  // namespace
+
+void AddTypes(CLI::App& program, TStatus& status) {
+    CLI::App& command = AddCommand(program, kHelp);
+    const auto format = std::make_shared<CFormatOptions>();
+    format->AddTo(command, {"text", "json"});
+    command.callback([format, &status] { status = Types(*format); });
+}
+
+}  // namespace brindle::cli
