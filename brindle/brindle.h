@@ -11,6 +11,7 @@
 #include "brindle/analysis/CHarmAnlsCenterInChords.h"
 #include "brindle/analysis/CHarmAnlsCenters.h"
 #include "brindle/analysis/CHarmAnlsChord.h"
+#include "brindle/analysis/CHarmAnlsChordForMetro.h"
 #include "brindle/analysis/CHarmAnlsChords.h"
 #include "brindle/analysis/CHarmAnlsProgression.h"
 #include "brindle/analysis/CHarmAnlsProgressions.h"

@@ -125,6 +125,15 @@ public:
     friend constexpr bool operator==(const CSemitones&, const CSemitones&) = default;
     friend constexpr auto operator<=>(const CSemitones&, const CSemitones&) = default;
 
+    // The masks of small chord vocabularies. The first two rows of each are no chord and all tones.
+    static constexpr std::array<std::uint64_t, 4> _sSemitones_Chords_MajorMinorMode{0, 4095, 145,
+                                                                                    137};
+    static constexpr std::array<std::uint64_t, 18> _sSemitones_Chords_CommonMode{
+        0,    4095, 145, 137,  657, 649,  1169, 2193, 149,
+        1161, 73,   585, 1097, 273, 1297, 133,  161,  129};
+    static constexpr std::array<std::uint64_t, 18> _sSemitones_Chords_MetroRecognizedMode{
+        0, 4095, 1, 145, 137, 1169, 2193, 149, 1161, 2185, 73, 585, 273, 1297, 133, 161, 129, 1153};
+
 private:
     static constexpr std::uint64_t kOctaveMask = 0xFFF;
 
