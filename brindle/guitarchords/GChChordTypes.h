@@ -1,0 +1,20 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/chords/CChordTypes.h"
+
+#include <string>
+
+namespace brindle {
+
+// The built-in chord types, as a list that a host shows.
+
+[[nodiscard]] int GChNumberOfChordTypes();
+/// A negative index counts as 0; empty at or above the number of rows.
+[[nodiscard]] std::string GChChordTypeNameForIndex(int index);
+/// A negative index counts as 0; 0 at or above the number of rows.
+[[nodiscard]] CChordTypeId GChChordTypeIdForIndex(int index);
+/// Empty if there is none.
+[[nodiscard]] std::string GChChordTypeNameForId(CChordTypeId id);
+
+}  // namespace brindle

@@ -1,0 +1,33 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <optional>
+#include <string>
+
+namespace brindle {
+
+class GChChord;
+class GChChordDescr;
+class GChTuningDescr;
+
+// Names of fingerings, told from what sounds. The root is a key number: 0 to 11, -1 for none, below
+// that 0; above 11 there is no name. `enhType` spells it: 1 with a sharp, 2 with a flat, any other
+// value naturally. Names are written by `CurrentChordNamePrefs` with "maj7" and blanks between the
+// parts; the comma forms join the parts by commas. A missing chord or tuning has no name.
+
+[[nodiscard]] std::optional<std::string> GChHarmonyStringFromChord(const GChChord* chord, int root,
+                                                                   int enhType, int capo);
+[[nodiscard]] std::optional<std::string> GChHarmonyCommaSeparatedStringFromChord(
+    const GChChord* chord, int root, int enhType, int capo);
+[[nodiscard]] std::optional<std::string> GChHarmonyStringFromChordDescr(
+    const GChChordDescr* chordDescr, const GChTuningDescr* tuningDescr, int root, int enhType);
+[[nodiscard]] std::optional<std::string> GChHarmonyCommaSeparatedStringFromChordDescr(
+    const GChChordDescr* chordDescr, const GChTuningDescr* tuningDescr, int root, int enhType);
+
+/// The root over which the name has the fewest characters, the lowest of several; -1 for a missing
+/// chord.
+[[nodiscard]] int GChProposedRootNoteFromChord(const GChChord* chord, int capo);
+[[nodiscard]] int GChProposedRootNoteFromChordDescr(const GChChordDescr* chordDescr,
+                                                    const GChTuningDescr* tuningDescr);
+
+}  // namespace brindle

@@ -1,0 +1,62 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/guitarchords/GChShortTuning.h"
+
+#include <cstddef>
+#include <cstdint>
+#include <filesystem>
+#include <memory>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace brindle {
+
+class GChLibrary;
+
+/// A tuning of a database with the libraries of fingerings that were made for it, which it owns.
+/// Made by std::make_shared, since its libraries refer back to it.
+class GChTuning : public std::enable_shared_from_this<GChTuning> {
+public:
+    /// initWithShortTuning1: an invalid tuning leaves it without strings.
+    explicit GChTuning(const GChShortTuning& shortTuning);
+    GChTuning(const GChTuning&) = delete;
+    GChTuning& operator=(const GChTuning&) = delete;
+
+    [[nodiscard]] bool isValid() const { return GChIsValidShortTuning(mShortTuning); }
+    [[nodiscard]] const GChShortTuning& shortTuning() const { return mShortTuning; }
+    [[nodiscard]] int numberOfStrings() const;
+    /// Empty for none.
+    [[nodiscard]] const std::string& tuningName() const { return mTuningName; }
+    void setTuningName(std::string_view name) { mTuningName = name; }
+    [[nodiscard]] int capodasterOffset() const { return mCapodasterOffset; }
+    void setCapodasterOffset(int offset) { mCapodasterOffset = offset; }
+    /// Rises by one with each tuning made in this process.
+    [[nodiscard]] std::int64_t runTimeID() const { return mRunTimeID; }
+
+    /// The same strings at the same pitches, other than GChIsEqualShortTuning.
+    [[nodiscard]] bool isEqualToTuning(const GChTuning& other) const;
+    /// "E2 A2 D3 G3 B3 E4".
+    [[nodiscard]] std::string tuningPitchesString() const;
+
+    [[nodiscard]] const std::vector<std::shared_ptr<GChLibrary>>& tuningLibraries() const {
+        return mTuningLibraries;
+    }
+    /// Adds an empty library; an empty path is a library without a file.
+    std::shared_ptr<GChLibrary> createLibraryWithPath(const std::filesystem::path& path);
+    /// False if it is not one of these.
+    bool removeLibrary(const std::shared_ptr<GChLibrary>& library);
+    // Of all libraries. Fingerings are not transposed, so that both numbers are the same.
+    [[nodiscard]] std::size_t numberOfChords() const { return numberOfBasicChords(); }
+    [[nodiscard]] std::size_t numberOfBasicChords() const;
+
+private:
+    GChShortTuning mShortTuning{};
+    std::vector<std::shared_ptr<GChLibrary>> mTuningLibraries;
+    std::string mTuningName;
+    int mCapodasterOffset = 0;
+    std::int64_t mRunTimeID;
+};
+
+}  // namespace brindle
