@@ -1,0 +1,62 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/analysis/internal/KeyChords.h"
+
+#include "brindle/analysis/CHarmAnlsChords.h"
+#include "brindle/theory/KeyIntervals.h"
+
+namespace brindle {
+namespace {
+
+// No song is longer; what seems so is a broken position.
+constexpr double kLongestInBeats = 1e12;
+
+double BeatsOf(const CHarmAnlsChords& chords, std::size_t ix) {
+    // Without an end marker the last chord sounds for a beat.
+    if (ix + 1 == chords.size()) return chords[ix].IsUndef() ? 0.0 : 1.0;
+    const double beats = chords[ix + 1].mPosition - chords[ix].mPosition;
+    return beats > 0.0 && beats <= kLongestInBeats ? beats : 0.0;
+}
+
+TKeyChord KeyChordOf(const CHarmAnlsChords& chords, std::size_t ix) {
+    const CHarmAnlsChord& chord = chords[ix];
+    const CKeyEnh& bass = chord.HasBassNote() ? chord.mBassKeyEnh : chord.mRootKeyEnh;
+    return {KeyChordClassOf(chord.mSemitones),
+            FoldIntoOctave(chord.mRootKeyEnh.mKeyNr),
+            FoldIntoOctave(bass.mKeyNr),
+            chord.mSemitones,
+            BeatsOf(chords, ix),
+            ix};
+}
+
+bool IsSameChord(const TKeyChord& a, const TKeyChord& b) {
+    return a.mRoot == b.mRoot && a.mBass == b.mBass && a.mSemitones == b.mSemitones;
+}
+
+}  // namespace
+
+std::vector<TKeyChord> KeyChordsOf(const CHarmAnlsChords& chords) {
+    std::vector<TKeyChord> heard;
+    double total = 0.0;
+    for (std::size_t ix = 0; ix < chords.size(); ++ix) {
+        if (chords[ix].IsUndef()) {
+            if (heard.empty()) continue;
+            const double beats = BeatsOf(chords, ix);
+            heard.back().mBeats += beats;
+            total += beats;
+            continue;
+        }
+        const TKeyChord chord = KeyChordOf(chords, ix);
+        total += chord.mBeats;
+        if (!heard.empty() && IsSameChord(heard.back(), chord)) {
+            heard.back().mBeats += chord.mBeats;
+        } else {
+            heard.push_back(chord);
+        }
+    }
+    if (!(total > 0.0)) {
+        for (TKeyChord& chord : heard) chord.mBeats = 1.0;
+    }
+    return heard;
+}
+
+}  // namespace brindle
