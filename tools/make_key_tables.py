@@ -25,9 +25,9 @@ TABLES = [
 
 HEAD = """\
 // SPDX-License-Identifier: MIT
-// Made by tools/make_key_tables.py from data/key-tables.json. The figures were counted and fitted by
-// us on annotated chord corpora: When in Rome, Jazz Harmony Treebank, a jazz chord corpus, McGill
-// Billboard and Nottingham.
+// Made by tools/make_key_tables.py from data/key-tables.json. The figures were counted and fitted
+// by us on annotated chord corpora: When in Rome, Jazz Harmony Treebank, a jazz chord corpus,
+// McGill Billboard and Nottingham.
 
 #include "brindle/analysis/internal/KeyTables.h"
 

@@ -12,7 +12,8 @@ namespace brindle {
 
 class CHarmAnlsChords;
 
-/// How FindKeys weighs. A value that is not a number, or that makes no sense, counts as the default.
+/// How FindKeys weighs. A value that is not a number, or that makes no sense, counts as the
+/// default.
 struct CKeyOptions {
     double mBeatsPerBar = 4.0;
     /// What a chord gains in the key of the song. More keeps passages at home.

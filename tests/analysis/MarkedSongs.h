@@ -26,9 +26,14 @@ struct TMarkedSong {
 inline constexpr auto kMarkedSongs = std::to_array<TMarkedSong>({
     // Blues
     {"Twelve-bar blues", "C Major",
-     "[C Major] C7 | F7 | C7 | C7 | F7 | F7 | C7 | C7 | G7 | F7 | C7 | G7 ."},
+     "[C Major] C7 | F7 | C7 | C7 | F7 | F7 | C7 | C7 | G7 | F7 | C7 | G7 .",
+     {},
+     "[F Major] C7 | F7 | C7 | C7 | F7 | F7 | C7 | C7 | G7 | F7 | C7 | G7 ."},
     {"Blues with a turnaround", "F Major",
-     "[F Major] F7 | Bb7 | F7 | Cm7 F7 | Bb7 | Bdim7 | F7 | D7 | Gm7 | C7 | F7 D7 | Gm7 C7"},
+     "[F Major] F7 | Bb7 | F7 | Cm7 F7 | Bb7 | Bdim7 | F7 | D7 | Gm7 | C7 | F7 D7 | Gm7 C7",
+     {},
+     "[Bb Major] F7 | Bb7 | F7 | Cm7 F7 | Bb7 | Bdim7 | F7 | [F Major] D7 | Gm7 | C7 | F7 D7 "
+     "| Gm7 C7"},
     {"Minor blues", "A Minor",
      "[A Minor] Am7 | Dm7 | Am7 | Am7 | Dm7 | Dm7 | Am7 | Am7 | F7 | E7 | Am7 | E7 ."},
 
@@ -40,10 +45,15 @@ inline constexpr auto kMarkedSongs = std::to_array<TMarkedSong>({
     {"Diatonic circle in major", "C Major",
      "[C Major] Cmaj7 | Fmaj7 | Bm7b5 | Em7 | Am7 | Dm7 | G7 | Cmaj7 ."},
     {"Diatonic circle in minor", "A Minor",
-     "[A Minor] Am7 | Dm7 | G7 | Cmaj7 | Fmaj7 | Bm7b5 | E7 | Am ."},
+     "[A Minor] Am7 | Dm7 | G7 | Cmaj7 | Fmaj7 | Bm7b5 | E7 | Am .",
+     {},
+     "[C Major] Am7 | Dm7 | G7 | Cmaj7 | [A Minor] Fmaj7 | Bm7b5 | E7 | Am ."},
     {"Relative keys by fifths", "G Minor",
      "[Bb Major] Cm7 | F7 | Bbmaj7 | Ebmaj7 | [G Minor] Am7b5 | D7 | Gm | Gm "
-     "| [Bb Major] Cm7 | F7 | Bbmaj7 | Ebmaj7 | [G Minor] Am7b5 | D7 | Gm | Gm ."},
+     "| [Bb Major] Cm7 | F7 | Bbmaj7 | Ebmaj7 | [G Minor] Am7b5 | D7 | Gm | Gm .",
+     "Bb Major",
+     "[Bb Major] Cm7 | F7 | Bbmaj7 | Ebmaj7 | Am7b5 | D7 | Gm | Gm | Cm7 | F7 | Bbmaj7 | Ebmaj7 "
+     "| [G Minor] Am7b5 | D7 | Gm | Gm ."},
     {"Ragtime chain", "C Major",
      "[C Major] C | A7 | D7 | G7 | C | A7 | D7 G7 | C ."},
     {"Salty Dog", "G Major",
@@ -84,19 +94,27 @@ inline constexpr auto kMarkedSongs = std::to_array<TMarkedSong>({
     // Songs that modulate
     {"Hymn to the dominant and back (Nicaea)", "D Major",
      "[D Major] D Bm | A D | G | D | [A Major] A D | A/C# A | Bm E7 | A "
-     "| [D Major] D Bm | A D | G | D | Bm F#m | G D | Em7 A7 | D ."},
+     "| [D Major] D Bm | A D | G | D | Bm F#m | G D | Em7 A7 | D .",
+     {},
+     "[D Major] D Bm | A D | G | D | A D | A/C# A | Bm E7 | A | D Bm | A D | G | D | Bm F#m | G D "
+     "| Em7 A7 | D ."},
     {"Hymn by way of the relative minor", "C Major",
      "[C Major] C F | C G | Am F | C G7 | C | [A Minor] E7 Am | Dm Am | E E7 | Am "
      "| [C Major] G C | F C | Dm7 G7 | C ."},
     {"Chorale to the dominant and the second degree", "F Major",
      "[F Major] F Bb | F C | F | [C Major] C F | C G7 | C "
-     "| [G Minor] D7 | Gm Cm | D7 | Gm | [F Major] C7 | F Bb | C7 | F ."},
+     "| [G Minor] D7 | Gm Cm | D7 | Gm | [F Major] C7 | F Bb | C7 | F .",
+     {},
+     "[F Major] F Bb | F C | F | C F | C G7 | C | D7 | Gm Cm | D7 | Gm | C7 | F Bb | C7 | F ."},
     {"Cadences down in whole tones", "D Major",
      "[D Major] Dmaj7 | Dmaj7 | [C Major] Dm7 | G7 | Cmaj7 | Cmaj7 | [Bb Major] Cm7 | F7 | Bbmaj7 "
      "| Bbmaj7 | [D Major] Em7 | A7 | Dmaj7 | Dmaj7 ."},
     {"Cycle of major thirds", "B Major",
      "[B Major] Bmaj7 [G Major] D7 | Gmaj7 [Eb Major] Bb7 | Ebmaj7 | [G Major] Am7 D7 "
-     "| Gmaj7 [Eb Major] Bb7 | Ebmaj7 [B Major] F#7 | Bmaj7 ."},
+     "| Gmaj7 [Eb Major] Bb7 | Ebmaj7 [B Major] F#7 | Bmaj7 .",
+     {},
+     "[G Major] Bmaj7 D7 | Gmaj7 Bb7 | Ebmaj7 | Am7 D7 | Gmaj7 [Eb Major] Bb7 | Ebmaj7 "
+     "[B Major] F#7 | Bmaj7 ."},
     {"Last verse a semitone up", "C Major",
      "[C Major] C Am | F G | C Am | F G | C | [Db Major] Ab7 | Db Bbm | Gb Ab | Db Bbm | Gb Ab "
      "| Db ."},

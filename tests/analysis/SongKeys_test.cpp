@@ -1,0 +1,297 @@
+// SPDX-License-Identifier: MIT
+#include "MarkedSongs.h"
+#include "RandomChordTexts.h"
+
+#include "brindle/analysis/CHarmAnlsChords.h"
+#include "brindle/analysis/CKeyOfSong.h"
+#include "brindle/analysis/RomanNumeral.h"
+#include "brindle/analysis/TChordStringParse.h"
+#include "brindle/theory/KeyIntervals.h"
+
+#include <doctest/doctest.h>
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <cmath>
+#include <limits>
+#include <sstream>
+
+namespace brindle::test {
+namespace {
+
+constexpr double kNan = std::numeric_limits<double>::quiet_NaN();
+constexpr double kInfinity = std::numeric_limits<double>::infinity();
+
+std::string NameOf(const CSignKeyLite& key) {
+    return key.NameLong(ChordNamePrefsNonUTF8);
+}
+
+CHarmAnlsChords Read(std::string_view text, double beatsPerBar, double beatsPerChord) {
+    TChordStringParse parse;
+    parse.mBeatsPerBar = beatsPerBar;
+    parse.mBeatsPerChord = beatsPerChord;
+    return {text, parse};
+}
+
+CKeyOfSong KeysOf(std::string_view text) {
+    return FindKeys(Read(text, 4.0, 2.0));
+}
+
+// "C Major: ii7 V7 I^7; G Minor: ..."
+std::string RegionsText(const CHarmAnlsChords& chords, const CKeyOfSong& keys) {
+    const auto numerals = NumeralsOf(chords, keys);
+    std::string text;
+    for (const CKeyRegion& region : keys.mRegions) {
+        text += (text.empty() ? "" : "; ") + NameOf(region.mKey) + ":";
+        for (std::size_t i = region.mBegin; i < region.mEnd; ++i) text += " " + numerals[i];
+    }
+    return text;
+}
+
+TEST_CASE("Three cadences in a row are three regions, and the first is the key of the song") {
+    const CHarmAnlsChords chords = Read("Dm7 G7 Cmaj7 | Fm7 Bb7 Ebmaj7 | Am7b5 D7 Gm", 3.0, 1.0);
+    const CKeyOfSong keys = FindKeys(chords, {.mBeatsPerBar = 3.0});
+    CHECK(NameOf(keys.mKey) == "C Major");
+    CHECK(fmt::format("{:.2f} {:.2f} {:.2f}", keys.mScores[0], keys.mScores[12 + 7],
+                      keys.mScores[7]) == "5.64 3.72 3.39");
+    CHECK(RegionsText(chords, keys) ==
+          "C Major: ii7 V7 I^7; Eb Major: ii7 V7 I^7; G Minor: iih7 V7 i");
+    REQUIRE(keys.mRegions.size() == 3);
+    CHECK(keys.mRegions[1].mPosition == 3.0);
+    CHECK(keys.mRegions[1].mEndPosition == 6.0);
+    CHECK(keys.mRegions[2].mEndPosition == 9.0);
+    // The winner against the two that follow and 21 that lie far below.
+    CHECK(keys.mConfidence > 0.6);
+    CHECK(keys.mConfidence < 0.8);
+}
+
+/// A text with the keys of its regions in brackets, taken apart.
+struct TMarks {
+    std::string mChords;
+    std::vector<std::string> mKeyOfChord;
+};
+
+TMarks MarksOf(std::string_view marked) {
+    TMarks marks;
+    std::istringstream words{std::string(marked)};
+    std::string key;
+    for (std::string word; words >> word;) {
+        if (word.front() == '[') {
+            std::string type;
+            words >> type;
+            key = word.substr(1) + " " + type.substr(0, type.size() - 1);
+            continue;
+        }
+        marks.mChords += word + " ";
+        if (word != "|" && word != ".") marks.mKeyOfChord.push_back(key);
+    }
+    return marks;
+}
+
+std::vector<std::string> KeyOfChord(const CKeyOfSong& keys) {
+    std::vector<std::string> names;
+    for (const CKeyRegion& region : keys.mRegions) {
+        names.resize(region.mEnd, NameOf(region.mKey));
+    }
+    return names;
+}
+
+// The text with the keys that were found, in the form of the marks.
+std::string Marked(const TMarks& marks, const std::vector<std::string>& keys) {
+    std::istringstream words(marks.mChords);
+    std::string text;
+    std::string key;
+    std::size_t chord = 0;
+    for (std::string word; words >> word;) {
+        if (word != "|" && word != "." && keys[chord++] != key) {
+            key = keys[chord - 1];
+            text += "[" + key + "] ";
+        }
+        text += word + " ";
+    }
+    text.pop_back();
+    return text;
+}
+
+TEST_CASE("Well-known songs pass through the keys that musicians hear in them") {
+    std::size_t songs = 0;
+    std::size_t chords = 0;
+    std::size_t agreed = 0;
+    for (const TMarkedSong& song : kMarkedSongs) {
+        INFO(song.mName);
+        const TMarks marks = MarksOf(song.mMarked);
+        const CKeyOfSong keys = KeysOf(marks.mChords);
+        const std::vector<std::string> found = KeyOfChord(keys);
+        CHECK(NameOf(keys.mKey) == (song.mFoundKey.empty() ? song.mKey : song.mFoundKey));
+        REQUIRE(found.size() == marks.mKeyOfChord.size());
+        CHECK(Marked(marks, found) == (song.mFound.empty() ? song.mMarked : song.mFound));
+        songs += NameOf(keys.mKey) == song.mKey ? 1U : 0U;
+        chords += found.size();
+        for (std::size_t i = 0; i < found.size(); ++i) {
+            agreed += found[i] == marks.mKeyOfChord[i] ? 1U : 0U;
+        }
+    }
+    // docs/keys.md quotes these.
+    CHECK(fmt::format("{} of {} songs, {} of {} chords", songs, kMarkedSongs.size(), agreed,
+                      chords) == "29 of 30 songs, 433 of 481 chords");
+}
+
+// Chords of all kinds in lengths of their own, so that no two keys have equal points by chance.
+CHarmAnlsChords RandomSong(CChance& chance) {
+    constexpr auto kinds = std::to_array<std::uint64_t>({
+        0x091,  // major
+        0x089,  // minor
+        0x491,  // dominant seventh
+        0x891,  // major seventh
+        0x489,  // minor seventh
+        0x449,  // half-diminished
+        0x249,  // diminished seventh
+        0x111,  // augmented
+        0x0A1,  // sus4
+    });
+    CHarmAnlsChords song;
+    double position = 0.0;
+    const std::size_t count = 1 + chance.Below(40);
+    for (std::size_t i = 0; i < count; ++i) {
+        CChordLite chord;
+        if (!chance.OneIn(12)) {
+            chord.mRootKeyEnh = {static_cast<int>(chance.Below(12)), TEnh_Undef};
+            chord.mSemitones = CSemitones(chance.Of<std::uint64_t>(kinds));
+            if (chance.OneIn(5)) {
+                chord.mBassKeyEnh = {static_cast<int>(chance.Below(12)), TEnh_Undef};
+            }
+        }
+        song.emplace_back(chord, position);
+        position += 0.5 + static_cast<double>(chance.Below(100000)) / 12347.0;
+    }
+    song.emplace_back(CChordLite_Undef, position);
+    return song;
+}
+
+CKeyEnh Moved(const CKeyEnh& keyEnh, int up) {
+    return keyEnh.IsUndef() ? keyEnh : CKeyEnh{FoldIntoOctave(keyEnh.mKeyNr + up), keyEnh.mEnh};
+}
+
+TEST_CASE("A song in another key has its keys there, and all else the same") {
+    for (std::uint32_t seed = 1; seed <= 100; ++seed) {
+        CChance chance(seed);
+        const CHarmAnlsChords song = RandomSong(chance);
+        const CKeyOfSong keys = FindKeys(song);
+        for (int up = 1; up < 12; ++up) {
+            CAPTURE(seed);
+            CAPTURE(up);
+            CHarmAnlsChords other = song;
+            for (CHarmAnlsChordWithPos& chord : other) {
+                chord.mRootKeyEnh = Moved(chord.mRootKeyEnh, up);
+                chord.mBassKeyEnh = Moved(chord.mBassKeyEnh, up);
+            }
+            const CKeyOfSong otherKeys = FindKeys(other);
+            const auto isMoved = [&](const CSignKeyLite& key, const CSignKeyLite& otherKey) {
+                return otherKey.mRootKeyEnh.mKeyNr == Moved(key.mRootKeyEnh, up).mKeyNr &&
+                       otherKey.mSignKeyType == key.mSignKeyType;
+            };
+            CHECK(isMoved(keys.mKey, otherKeys.mKey));
+            CHECK(otherKeys.mConfidence == doctest::Approx(keys.mConfidence));
+            REQUIRE(otherKeys.mRegions.size() == keys.mRegions.size());
+            for (std::size_t i = 0; i < keys.mRegions.size(); ++i) {
+                CHECK(isMoved(keys.mRegions[i].mKey, otherKeys.mRegions[i].mKey));
+                CHECK(otherKeys.mRegions[i].mBegin == keys.mRegions[i].mBegin);
+            }
+            CHECK(NumeralsOf(other, otherKeys) == NumeralsOf(song, keys));
+        }
+    }
+}
+
+TEST_CASE("Lengths count against each other, not by themselves") {
+    for (std::uint32_t seed = 1; seed <= 100; ++seed) {
+        CChance chance(seed);
+        CHarmAnlsChords song = RandomSong(chance);
+        const CKeyOfSong keys = FindKeys(song);
+        for (const double factor : {3.0, 0.001, 1e6}) {
+            CAPTURE(seed);
+            CAPTURE(factor);
+            CHarmAnlsChords other = song;
+            for (CHarmAnlsChordWithPos& chord : other) chord.mPosition *= factor;
+            const CKeyOfSong otherKeys = FindKeys(other);
+            CHECK(otherKeys.mKey == keys.mKey);
+            CHECK(otherKeys.mConfidence == doctest::Approx(keys.mConfidence));
+        }
+    }
+}
+
+TEST_CASE("What is written twice, or as no chord, makes the chord before longer") {
+    const CKeyOfSong keys = KeysOf("Dm7 . . . | G7 . | C .");
+    for (const char* text :
+         {"Dm7 Dm7 . . | G7 . | C .", "Dm7 . X X | G7 . | C C", "Dm7 X Dm7 . | G7 X | C ."}) {
+        INFO(text);
+        const CHarmAnlsChords chords = Read(text, 4.0, 2.0);
+        const CKeyOfSong same = FindKeys(chords);
+        CHECK(same.mScores == keys.mScores);
+        REQUIRE(same.mRegions.size() == 1);
+        CHECK(same.mRegions[0].mBegin == 0);
+        CHECK(same.mRegions[0].mEnd == chords.size() - 1);
+        CHECK(same.mRegions[0].mEndPosition == 16.0);
+    }
+}
+
+TEST_CASE("A song without chords has no key, and chords before the first do not count") {
+    for (const char* text : {"", "| . |", "X X X"}) {
+        INFO(text);
+        const CKeyOfSong keys = KeysOf(text);
+        CHECK(keys.mKey.IsUndef());
+        CHECK(keys.mConfidence == kPosUndef);
+        CHECK(keys.mRegions.empty());
+    }
+    const CKeyOfSong keys = KeysOf("X X G D7 G");
+    CHECK(NameOf(keys.mKey) == "G Major");
+    REQUIRE(keys.mRegions.size() == 1);
+    CHECK(keys.mRegions[0].mBegin == 2);
+    CHECK(keys.mRegions[0].mPosition == 4.0);
+    CHECK(NameOf(KeysOf("Ebm").mKey) == "Eb Minor");
+}
+
+TEST_CASE("Six sharps or six flats are spelled as the song is") {
+    CHECK(NameOf(KeysOf("F# C#7 F#").mKey) == "F# Major");
+    CHECK(NameOf(KeysOf("Gb Db7 Gb").mKey) == "Gb Major");
+    CHECK(NameOf(KeysOf("D#m A#7 D#m").mKey) == "D# Minor");
+    CHECK(NameOf(KeysOf("C# G#7 C#").mKey) == "Db Major");
+}
+
+TEST_CASE("The home bonus and the cost of a change decide how many regions there are") {
+    const CHarmAnlsChords chords = Read("Dm7 G7 Cmaj7 | Fm7 Bb7 Ebmaj7 | Am7b5 D7 Gm", 3.0, 1.0);
+    CHECK(FindKeys(chords, {.mBeatsPerBar = 3.0, .mHomeBonus = 20.0}).mRegions.size() == 1);
+    CHECK(FindKeys(chords, {.mBeatsPerBar = 3.0, .mChangeCost = 100.0}).mRegions.size() == 1);
+    CHECK(FindKeys(chords, {.mBeatsPerBar = 3.0, .mChangeCost = 0.1}).mRegions.size() == 3);
+}
+
+TEST_CASE("Broken positions, lengths, keys and options are survived") {
+    const CChordLite c{CKeyEnh_C, CKeyEnh_Undef, CSemitones{0, 4, 7}};
+    const CChordLite g7{CKeyEnh_G, CKeyEnh_Undef, CSemitones{0, 4, 7, 10}};
+    const CChordLite odd{{-1234567890, static_cast<TEnh>(99)},
+                         {2147483647, static_cast<TEnh>(-99)},
+                         CSemitones(~std::uint64_t{0})};
+    const double broken[] = {kNan, kInfinity, -kInfinity, -1.0, 0.0, kPosUndef, kPosEnd, 1e-320};
+    for (const double first : broken) {
+        for (const double second : broken) {
+            CHarmAnlsChords chords;
+            chords.emplace_back(c, first);
+            chords.emplace_back(g7, second);
+            chords.emplace_back(odd, 1.0);
+            chords.emplace_back(c, second);
+            for (const double option : broken) {
+                const CKeyOfSong keys = FindKeys(chords, {option, option, option});
+                CHECK(std::isfinite(keys.mConfidence));
+                REQUIRE_FALSE(keys.mRegions.empty());
+                CHECK(keys.mRegions.back().mEnd == 4);
+                CHECK(NumeralsOf(chords, keys).size() == 4);
+            }
+        }
+    }
+    // Without any length the chords count alike.
+    CHarmAnlsChords chords;
+    for (const CChordLite& chord : {c, g7, c}) chords.emplace_back(chord, kPosUndef);
+    CHECK(NameOf(FindKeys(chords).mKey) == "C Major");
+}
+
+}  // namespace
+}  // namespace brindle::test
