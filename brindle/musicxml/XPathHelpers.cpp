@@ -19,15 +19,17 @@ std::string StringValueForXPath(const XmlNode& node, const XmlPath& path,
     return found ? found.stringValue() : std::string(defaultValue);
 }
 
-std::string LowercaseStringValueForXPath(const XmlNode& node, const XmlPath& path,
-                                         std::string_view defaultValue) {
-    const XmlNode found = node.firstForXPath(path);
-    if (!found) return std::string(defaultValue);
-    std::string text = found.stringValue();
+std::string LowercaseString(std::string text) {
     std::transform(text.begin(), text.end(), text.begin(), [](char letter) {
         return letter >= 'A' && letter <= 'Z' ? static_cast<char>(letter - 'A' + 'a') : letter;
     });
     return text;
+}
+
+std::string LowercaseStringValueForXPath(const XmlNode& node, const XmlPath& path,
+                                         std::string_view defaultValue) {
+    const XmlNode found = node.firstForXPath(path);
+    return found ? LowercaseString(found.stringValue()) : std::string(defaultValue);
 }
 
 std::int32_t IntValueForXPath(const XmlNode& node, const XmlPath& path, std::int32_t defaultValue) {

@@ -16,6 +16,8 @@ namespace brindle {
     const XmlNode& node, const XmlPath& path, std::optional<std::string> defaultValue);
 [[nodiscard]] std::string StringValueForXPath(const XmlNode& node, const XmlPath& path,
                                               std::string_view defaultValue);
+/// The letters A to Z in lower case.
+[[nodiscard]] std::string LowercaseString(std::string text);
 /// In lower case; the default as it stands.
 [[nodiscard]] std::string LowercaseStringValueForXPath(const XmlNode& node, const XmlPath& path,
                                                        std::string_view defaultValue);

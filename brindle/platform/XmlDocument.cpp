@@ -28,6 +28,27 @@ xmlNodePtr ElementFrom(xmlNodePtr node) {
     return node;
 }
 
+// Nodes and bytes of the texts and attributes of a node and all below it. Stops soon after `limit`.
+std::size_t SizeOf(const xmlNode* node, std::size_t limit) {
+    std::size_t size = 1;
+    if (node->type != XML_ELEMENT_NODE && node->content != nullptr) {
+        size += TextOf(node->content).size();
+    }
+    if (node->type == XML_ELEMENT_NODE) {
+        for (const xmlAttr* attribute = node->properties; attribute != nullptr;
+             attribute = attribute->next) {
+            for (const xmlNode* text = attribute->children; text != nullptr; text = text->next) {
+                size += TextOf(text->content).size() + 1;
+            }
+        }
+    }
+    for (const xmlNode* child = node->children; child != nullptr && size <= limit;
+         child = child->next) {
+        size += SizeOf(child, limit - size);
+    }
+    return size;
+}
+
 using XPathContext = std::unique_ptr<xmlXPathContext, decltype(&xmlXPathFreeContext)>;
 using XPathResult = std::unique_ptr<xmlXPathObject, decltype(&xmlXPathFreeObject)>;
 
@@ -84,6 +105,39 @@ XmlNode XmlNode::nextSibling() const {
 XmlNode XmlNode::parent() const {
     if (mNode == nullptr || mNode->parent == nullptr) return {};
     return XmlNode(mNode->parent->type == XML_ELEMENT_NODE ? mNode->parent : nullptr);
+}
+
+XmlNode XmlNode::nextBelow(const XmlNode& top) const {
+    if (const XmlNode child = firstChild()) return child;
+    for (xmlNodePtr node = mNode; node != nullptr && node != top.mNode; node = node->parent) {
+        if (const xmlNodePtr next = ElementFrom(node->next)) return XmlNode(next);
+    }
+    return {};
+}
+
+std::vector<XmlNode> XmlNode::descendants(std::string_view name) const {
+    std::vector<XmlNode> found;
+    for (XmlNode node = firstChild(); node; node = node.nextBelow(*this)) {
+        if (node.name() == name) found.push_back(node);
+    }
+    return found;
+}
+
+XmlNode XmlNode::firstDescendant(std::string_view name) const {
+    XmlNode node = firstChild();
+    while (node && node.name() != name) node = node.nextBelow(*this);
+    return node;
+}
+
+bool XmlNode::addCopyOf(const XmlNode& element, std::size_t& room) {
+    if (mNode == nullptr || element.mNode == nullptr) return false;
+    const std::size_t size = SizeOf(element.mNode, room);
+    if (size > room) return false;
+    const xmlNodePtr copy = xmlDocCopyNode(element.mNode, mNode->doc, 1);
+    if (copy == nullptr) throw std::bad_alloc();
+    xmlAddChild(mNode, copy);
+    room -= size;
+    return true;
 }
 
 int XmlNode::line() const {

@@ -40,6 +40,15 @@ public:
     /// The next element with the same parent.
     [[nodiscard]] XmlNode nextSibling() const;
     [[nodiscard]] XmlNode parent() const;
+    /// The next element below `top` in document order: the first one directly below this one, else
+    /// the one that follows its end. Empty at the end of `top`.
+    [[nodiscard]] XmlNode nextBelow(const XmlNode& top) const;
+    /// All elements below with this name, as the path ".//name" finds them, and the first of them.
+    [[nodiscard]] std::vector<XmlNode> descendants(std::string_view name) const;
+    [[nodiscard]] XmlNode firstDescendant(std::string_view name) const;
+    /// Adds a copy of the element, with all below it, as last child. Its nodes and the bytes of its
+    /// texts are subtracted from `room`; nothing is added when they are more than that.
+    bool addCopyOf(const XmlNode& element, std::size_t& room);
     /// Line of the element in the text, from 1.
     [[nodiscard]] int line() const;
 
