@@ -78,6 +78,7 @@
 #include "brindle/musicxml/MuxmlJson.h"
 #include "brindle/musicxml/MuxmlNotations.h"
 #include "brindle/musicxml/PlayedMeasures.h"
+#include "brindle/musicxml/ScoreContainer.h"
 #include "brindle/musicxml/TMusicXMLDoc.h"
 #include "brindle/musicxml/TMusicXMLHarmony.h"
 #include "brindle/musicxml/TMusicXMLMeasure.h"

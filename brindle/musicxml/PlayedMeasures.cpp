@@ -10,16 +10,6 @@ namespace brindle {
 
 namespace {
 
-std::size_t BytesOf(const TMusicXMLHarmony& harmony) {
-    std::size_t bytes = sizeof harmony + harmony.mRoot.mStep.size() + harmony.mKind.size() +
-                        harmony.mBass.mStep.size() +
-                        harmony.mDegrees.size() * sizeof(TMusicXMLDegree);
-    for (const TMusicXMLDegree& degree : harmony.mDegrees) {
-        bytes += degree.mValue.size() + degree.mType.size();
-    }
-    return bytes;
-}
-
 /// The walk in playing order. A repeat is played in passes, counted from 1; an ending with a number
 /// is played in the pass of that number. After "D.S. al Coda" the next measure with a coda sign
 /// jumps to the coda that belongs to it.
@@ -177,6 +167,16 @@ private:
 };
 
 }  // namespace
+
+std::size_t BytesOf(const TMusicXMLHarmony& harmony) {
+    std::size_t bytes = sizeof harmony + harmony.mRoot.mStep.size() + harmony.mKind.size() +
+                        harmony.mBass.mStep.size() +
+                        harmony.mDegrees.size() * sizeof(TMusicXMLDegree);
+    for (const TMusicXMLDegree& degree : harmony.mDegrees) {
+        bytes += degree.mValue.size() + degree.mType.size();
+    }
+    return bytes;
+}
 
 bool PlayMeasures(const TWrittenMeasures& written, TMusicXMLDoc& doc) {
     return CWalk(written, doc).Run();

@@ -3,6 +3,7 @@
 
 #include "brindle/musicxml/TMusicXMLMeasure.h"
 
+#include <cstddef>
 #include <cstdint>
 #include <span>
 #include <string_view>
@@ -11,6 +12,7 @@
 namespace brindle {
 
 struct TMusicXMLDoc;
+struct TMusicXMLHarmony;
 
 /// The written measures of a lead sheet and the jumps between them.
 struct TWrittenMeasures {
@@ -22,6 +24,9 @@ struct TWrittenMeasures {
 /// Walks the measures in playing order and appends what they hold to `doc`. False when the walk was
 /// cut at kMaxPlayedMeasures or kMaxPlayedBytes.
 bool PlayMeasures(const TWrittenMeasures& written, TMusicXMLDoc& doc);
+
+/// The room in bytes that a harmony takes, about.
+[[nodiscard]] std::size_t BytesOf(const TMusicXMLHarmony& harmony);
 
 /// Whether a text tells how often a repeat is played: 2 to 4 characters with an "x", as in "3x".
 [[nodiscard]] bool IsRepeatWord(std::string_view text);

@@ -14,8 +14,11 @@ void TMusicXMLDoc::clear() {
 }
 
 bool TMusicXMLDoc::LoadFromMusicXMLFile(const std::string& path) {
+    return LoadFromMusicXML(ReadWholeFile(path).value_or(std::string()));
+}
+
+bool TMusicXMLDoc::LoadFromMusicXML(std::string_view bytes) {
     clear();
-    const std::string bytes = ReadWholeFile(path).value_or(std::string());
     XmlStreamParser parser;
     MusicXmlParserHarmonyDelegate delegate;
     parser.setDelegate(&delegate);

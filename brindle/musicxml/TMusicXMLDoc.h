@@ -9,9 +9,12 @@
 #include <cstddef>
 #include <cstdint>
 #include <string>
+#include <string_view>
 #include <vector>
 
 namespace brindle {
+
+struct Error;
 
 /// Most measures that one song may play, repeats and jumps counted. A song that goes on is cut
 /// there, and its load reports failure.
@@ -69,6 +72,20 @@ struct TMusicXMLDoc {
     /// file cannot be read or is not well-formed (what was read before the fault stays), or when
     /// the song does not end.
     bool LoadFromMusicXMLFile(const std::string& path);
+    /// The same for a plain MusicXML text in memory.
+    bool LoadFromMusicXML(std::string_view bytes);
+
+    /// Reads a MusicXML file, plain or compressed, as a musician plays it: the chords of the first
+    /// part that has any stand where the notes are and last to the next one, all measures take
+    /// their time, and repeats, endings, D.C., D.S., Coda and Fine are followed, whether signs,
+    /// words or sound instructions tell them. Keys stand only where they begin to hold; a key
+    /// without mode has the undefined type. Copies are told backwards, as CHarmCopy says, and are
+    /// as long as the same measures follow on each other. Replaces all fields. False when the file
+    /// is no score that can be read, or when the song does not end (what was played up to there
+    /// stays); `error`, if given, then tells why, with line and column of a fault in the text.
+    bool LoadAsPlayed(const std::string& path, Error* error = nullptr);
+    /// The same for a file in memory.
+    bool LoadAsPlayedFromBytes(std::string_view bytes, Error* error = nullptr);
 };
 
 }  // namespace brindle

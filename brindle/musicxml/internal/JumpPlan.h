@@ -1,0 +1,68 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/musicxml/internal/WrittenScore.h"
+
+#include <cstddef>
+#include <cstdint>
+#include <limits>
+#include <optional>
+#include <vector>
+
+namespace brindle {
+
+inline constexpr std::size_t kNoMeasure = std::numeric_limits<std::size_t>::max();
+
+/// One ending of a repeat: the measures under one bracket, up to the sign that goes back.
+struct TEnding {
+    std::size_t mFirst = 0;
+    std::size_t mLast = 0;
+    std::vector<std::int32_t> mNumbers;
+    std::size_t mGroup = 0;
+    bool mGoesBack = false;
+    bool mHasFine = false;
+    bool mHasToCoda = false;
+
+    [[nodiscard]] bool IsOfPass(std::int32_t pass) const {
+        return std::find(mNumbers.begin(), mNumbers.end(), pass) != mNumbers.end();
+    }
+};
+
+/// Endings side by side, of which each pass plays one.
+struct TEndingGroup {
+    std::size_t mFirstEnding = 0;
+    std::size_t mEndingCount = 0;
+    /// Where the repeat goes back to.
+    std::size_t mRepeatStart = 0;
+    /// The measure behind the last ending.
+    std::size_t mBehind = 0;
+    std::int32_t mHighestNumber = 0;
+    bool mIsForAfterJump = false;
+};
+
+/// What a measure is for the player.
+struct TMeasurePlan {
+    /// Where its backward repeat goes, kNoMeasure without one.
+    std::size_t mRepeatStart = kNoMeasure;
+    /// The measure that ends the repeat around this one, itself included; kNoMeasure for none.
+    std::size_t mRepeatEnd = kNoMeasure;
+    /// How often the repeat that ends here is played.
+    std::int32_t mRepeatTimes = 2;
+    /// Index into the endings, kNoMeasure for none.
+    std::size_t mEnding = kNoMeasure;
+    /// Where D.C. or D.S. at its end lead.
+    std::size_t mJumpTarget = kNoMeasure;
+    /// Where "To Coda" at its end leads.
+    std::size_t mCodaTarget = kNoMeasure;
+};
+
+/// All ways through a score, told from its marks.
+struct TJumpPlan {
+    std::vector<TMeasurePlan> mMeasures;
+    std::vector<TEnding> mEndings;
+    std::vector<TEndingGroup> mGroups;
+};
+
+[[nodiscard]] TJumpPlan MakeJumpPlan(const TScoreMeasures& measures);
+
+}  // namespace brindle

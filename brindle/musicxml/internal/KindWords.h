@@ -1,0 +1,15 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <string_view>
+
+namespace brindle {
+
+struct TMusicXMLHarmony;
+
+/// Puts the kind of a chord into the words of HarmonyKinds.h. An empty kind is major. One that is
+/// none of these words is told by another name of it, by how it is printed ("m7" in `printed`), or
+/// else by its degrees above the root alone.
+void SetKind(TMusicXMLHarmony& harmony, std::string_view printed);
+
+}  // namespace brindle

@@ -1,0 +1,24 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/musicxml/internal/WrittenScore.h"
+
+namespace brindle {
+
+void TPlayMarks::Add(const TPlayMarks& other) {
+    mRepeatForward |= other.mRepeatForward;
+    mRepeatBackward |= other.mRepeatBackward;
+    mRepeatAfterJump |= other.mRepeatAfterJump;
+    if (mRepeatTimes == 0) mRepeatTimes = other.mRepeatTimes;
+    mEndingStarts |= other.mEndingStarts;
+    mEndingStops |= other.mEndingStops;
+    if (mEndingNumbers.empty()) mEndingNumbers = other.mEndingNumbers;
+    mDaCapo |= other.mDaCapo;
+    mDalSegno.Add(other.mDalSegno);
+    mAlFine |= other.mAlFine;
+    mAlCoda |= other.mAlCoda;
+    mSegno.Add(other.mSegno);
+    mCoda.Add(other.mCoda);
+    mToCoda.Add(other.mToCoda);
+    mFine |= other.mFine;
+}
+
+}  // namespace brindle

@@ -1,0 +1,149 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/musicxml/internal/PlayedScore.h"
+
+#include "brindle/musicxml/PlayedMeasures.h"
+#include "brindle/musicxml/TMusicXMLDoc.h"
+#include "brindle/musicxml/internal/PlayingOrder.h"
+#include "brindle/musicxml/internal/WrittenScore.h"
+#include "brindle/theory/CSignKeyHeavy.h"
+
+#include <algorithm>
+#include <optional>
+
+namespace brindle {
+
+namespace {
+
+CSignKeyLite SignKeyOf(const TScoreKey& key) {
+    CSignKeyHeavy signKey;
+    signKey.SetFromSignsCountAndType(key.mFifths, key.mType == TSignKeyType_Minor
+                                                      ? TSignKeyTypeNoUndef_Minor
+                                                      : TSignKeyTypeNoUndef_Major);
+    CSignKeyLite lite(signKey);
+    lite.mSignKeyType = key.mType;
+    return lite;
+}
+
+/// Lays the measures out in playing order.
+class CLayout {
+public:
+    CLayout(const TWrittenScore& score, TMusicXMLDoc& doc) : mScore(score), mDoc(doc) {}
+
+    /// False when the song was cut.
+    bool Run() {
+        FindWhatHolds();
+        const TPlayingOrder order = PlayScore(mScore.mMeasures);
+        bool isWhole = !order.mWasCut;
+        for (const std::uint32_t ix : order.mMeasures) {
+            if (mBytes > kMaxPlayedBytes) {
+                isWhole = false;
+                break;
+            }
+            Play(ix);
+        }
+        SetDurations();
+        AppendCopies(order);
+        return isWhole;
+    }
+
+private:
+    // The time and the key of a measure may be told in an earlier one.
+    void FindWhatHolds() {
+        std::optional<TScoreTime> time;
+        std::optional<TScoreKey> key;
+        for (const TScoreMeasure& measure : mScore.mMeasures) {
+            if (measure.mTime) time = measure.mTime;
+            if (measure.mKey) key = measure.mKey;
+            mTimes.push_back(time);
+            mKeys.push_back(key);
+        }
+    }
+
+    void Play(std::size_t ix) {
+        const TScoreMeasure& measure = mScore.mMeasures[ix];
+        mDoc.HarmBarlines.push_back({QuartersOf(mPosition)});
+        if (measure.mHasRehearsal) {
+            mDoc.HarmSections.push_back(
+                {.mPosition = QuartersOf(mPosition), .mIsFirst = mDoc.HarmSections.empty()});
+        }
+        AppendTime(mTimes[ix]);
+        AppendKey(mKeys[ix]);
+        if (measure.mHasSlash) mDoc.ChordSequences.push_back(mDoc.Harmonies.size());
+        for (const TWrittenHarmony& written : measure.mHarmonies) {
+            mBytes += BytesOf(written.mHarmony);
+            if (mBytes > kMaxPlayedBytes) return;
+            TMusicXMLHarmony& harmony = mDoc.Harmonies.emplace_back(written.mHarmony);
+            harmony.mPosition =
+                QuartersOf(std::max(TTicks{0}, AddTicks(mPosition, written.mOffset)));
+        }
+        mPosition = AddTicks(mPosition, measure.mLength);
+    }
+
+    void AppendTime(const std::optional<TScoreTime>& time) {
+        if (!time || time == mTime) return;
+        mTime = time;
+        mDoc.TimeSignatures.push_back({QuartersOf(mPosition), time->mBeats, time->mBeatType});
+    }
+
+    // A key that begins later than the song leaves the beginning without one.
+    void AppendKey(const std::optional<TScoreKey>& key) {
+        if (!key || key == mKey) return;
+        mKey = key;
+        if (mDoc.HarmSignKeys.empty() && mPosition > 0) {
+            mDoc.HarmSignKeys.emplace_back().mPosition = 0.0;
+        }
+        CHarmAnlsSignKey& signKey = mDoc.HarmSignKeys.emplace_back();
+        signKey.mPosition = QuartersOf(mPosition);
+        signKey.mSignKey = SignKeyOf(*key);
+    }
+
+    // An offset may move a harmony across a bar line, past harmonies of other measures.
+    void SetDurations() {
+        auto& harmonies = mDoc.Harmonies;
+        const auto isEarlier = [](const TMusicXMLHarmony& a, const TMusicXMLHarmony& b) {
+            return a.mPosition < b.mPosition;
+        };
+        if (!std::is_sorted(harmonies.begin(), harmonies.end(), isEarlier)) {
+            std::stable_sort(harmonies.begin(), harmonies.end(), isEarlier);
+        }
+        double next = QuartersOf(mPosition);
+        for (std::size_t i = harmonies.size(); i-- > 0;) {
+            harmonies[i].mDuration = std::max(0.0, next - harmonies[i].mPosition);
+            next = harmonies[i].mPosition;
+        }
+    }
+
+    // A copy reaches as far as the same measures follow on each other.
+    void AppendCopies(const TPlayingOrder& order) {
+        const auto& played = order.mMeasures;
+        for (const TJumpBack& jump : order.mJumpsBack) {
+            if (jump.mTo >= mDoc.HarmBarlines.size()) break;
+            std::size_t length = 0;
+            while (jump.mTo + length < mDoc.HarmBarlines.size() && jump.mFrom + length < jump.mTo &&
+                   played[jump.mFrom + length] == played[jump.mTo + length]) {
+                ++length;
+            }
+            const auto back = static_cast<std::int32_t>(jump.mTo - jump.mFrom);
+            mDoc.HarmCopies.push_back({.mTargetPos = mDoc.HarmBarlines[jump.mTo].mPosition,
+                                       .mSourceOffsetBars = -back,
+                                       .mLengthBars = length});
+        }
+    }
+
+    const TWrittenScore& mScore;
+    TMusicXMLDoc& mDoc;
+    std::vector<std::optional<TScoreTime>> mTimes;  // that hold in each measure
+    std::vector<std::optional<TScoreKey>> mKeys;
+    TTicks mPosition = 0;
+    std::optional<TScoreTime> mTime;
+    std::optional<TScoreKey> mKey;
+    std::size_t mBytes = 0;
+};
+
+}  // namespace
+
+bool LayOutAsPlayed(const TWrittenScore& score, TMusicXMLDoc& doc) {
+    return CLayout(score, doc).Run();
+}
+
+}  // namespace brindle

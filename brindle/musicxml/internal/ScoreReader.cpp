@@ -1,0 +1,191 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/musicxml/internal/ScoreReader.h"
+
+#include "brindle/musicxml/TMusicXMLDoc.h"
+#include "brindle/musicxml/internal/MeasureReader.h"
+#include "brindle/musicxml/internal/ScoreElements.h"
+#include "brindle/platform/XmlStreamParser.h"
+
+#include <cmath>
+#include <deque>
+#include <map>
+#include <string>
+#include <utility>
+
+namespace brindle {
+
+namespace {
+
+using enum TScoreElement;
+
+std::string_view Trimmed(std::string_view text) {
+    constexpr std::string_view white = " \t\r\n";
+    const std::size_t begin = text.find_first_not_of(white);
+    if (begin == text.npos) return {};
+    return text.substr(begin, text.find_last_not_of(white) + 1 - begin);
+}
+
+/// Finds its way through the parts and measures of a score and hands each measure to the reader of
+/// measures. A score lists the measures of each part, or the parts of each measure.
+class CScoreReader : public XmlStreamDelegate {
+public:
+    void didStartElement(XmlStreamParser&, std::string_view name,
+                         const XmlAttributes& attributes) override {
+        const TScoreElement element = ScoreElementOf(name);
+        const TScoreElement parent = Parent();
+        mOpen.push_back(element);
+        mText.clear();
+        if (mOpen.size() == 1) {
+            mIsScore = element == ScorePartwise || element == ScoreTimewise;
+        } else if (element == Part && parent != Measure) {
+            OpenPart(attributes.Value("id"));
+        } else if (element == Measure && parent != Part) {
+            ++mMeasureCount;
+        } else if (element == Measure || element == Part) {
+            if (element == Part) {
+                OpenPart(attributes.Value("id"));
+                AppendMissedMeasures();
+            }
+            OpenMeasure();
+        } else if (mReader) {
+            mReader->Started(element, parent, attributes);
+        }
+    }
+
+    void didEndElement(XmlStreamParser&, std::string_view) override {
+        const TScoreElement element = mOpen.back();
+        mOpen.pop_back();
+        const TScoreElement parent = Parent();
+        const std::string_view text = Trimmed(mText);
+        if (element == MovementTitle) {
+            mMovementTitle = text;
+        } else if (element == WorkTitle) {
+            mWorkTitle = text;
+        } else if ((element == Measure && parent == Part) ||
+                   (element == Part && parent == Measure)) {
+            CloseMeasure();
+        } else if (mReader) {
+            mReader->Ended(element, parent, text);
+        }
+        mText.clear();
+    }
+
+    void foundCharacters(XmlStreamParser&, std::string_view text) override {
+        if (mOpen.empty() || mOpen.back() == Other) return;
+        if (mText.size() + text.size() <= kXmlMaxTextLength) mText += text;
+    }
+
+    [[nodiscard]] bool IsScore() const { return mIsScore; }
+    [[nodiscard]] bool WasCut() const { return mAllMeasures > kMaxPlayedMeasures; }
+
+    [[nodiscard]] TWrittenScore Take() {
+        TWrittenScore score;
+        score.mTitle = mMovementTitle.empty() ? mWorkTitle : mMovementTitle;
+        score.mMeasures = JoinParts();
+        return score;
+    }
+
+private:
+    [[nodiscard]] TScoreElement Parent() const { return mOpen.empty() ? Other : mOpen.back(); }
+
+    void OpenPart(std::string_view id) {
+        const auto [it, isNew] = mPartOfId.try_emplace(std::string(id), mParts.size());
+        if (isNew) mParts.emplace_back();
+        mPart = &mParts[it->second];
+    }
+
+    void Append(std::size_t count) {
+        mAllMeasures += count;
+        if (WasCut()) return;
+        mPart->mMeasures.resize(mPart->mMeasures.size() + count);
+    }
+
+    // Measures in which a score that lists the parts of each measure did not name this part.
+    void AppendMissedMeasures() {
+        const std::size_t count = mPart->mMeasures.size() + 1;
+        if (count < mMeasureCount) Append(mMeasureCount - count);
+    }
+
+    void OpenMeasure() {
+        Append(1);
+        if (WasCut()) return;
+        mPart->mMeasures.back().mMarks.mRepeatForward = mPart->mRepeatBeginsNext;
+        mPart->mRepeatBeginsNext = false;
+        mReader.emplace(*mPart);
+    }
+
+    void CloseMeasure() {
+        if (mReader) mReader->Finish();
+        mReader.reset();
+    }
+
+    // The harmonies, keys and times are those of one part, the marks those of all.
+    [[nodiscard]] TScoreMeasures JoinParts() {
+        if (mParts.empty()) return {};
+        std::size_t chosen = 0;
+        while (chosen < mParts.size() && !mParts[chosen].mHasHarmonies) ++chosen;
+        if (chosen == mParts.size()) chosen = 0;
+        TScoreMeasures measures = std::move(mParts[chosen].mMeasures);
+        for (std::size_t i = 0; i < mParts.size(); ++i) {
+            if (i != chosen) Join(mParts[i], measures);
+        }
+        return measures;
+    }
+
+    static void Join(const TScorePart& part, TScoreMeasures& measures) {
+        if (measures.size() < part.mMeasures.size()) measures.resize(part.mMeasures.size());
+        for (std::size_t i = 0; i < part.mMeasures.size(); ++i) {
+            const TScoreMeasure& other = part.mMeasures[i];
+            TScoreMeasure& measure = measures[i];
+            measure.mMarks.Add(other.mMarks);
+            measure.mHasRehearsal |= other.mHasRehearsal;
+            measure.mHasSlash |= other.mHasSlash;
+            if (!measure.mTime) measure.mTime = other.mTime;
+            if (!measure.mKey) measure.mKey = other.mKey;
+            measure.mOtherLength = std::max(measure.mOtherLength, other.mLength);
+        }
+    }
+
+    std::vector<TScoreElement> mOpen;
+    std::string mText;  // of the innermost element, up to here
+    bool mIsScore = false;
+    std::string mMovementTitle;
+    std::string mWorkTitle;
+    std::deque<TScorePart> mParts;  // a deque, since readers of measures point into it
+    std::map<std::string, std::size_t, std::less<>> mPartOfId;
+    TScorePart* mPart = nullptr;
+    std::size_t mMeasureCount = 0;  // begun in a score that lists the parts of each measure
+    std::size_t mAllMeasures = 0;   // of all parts
+    std::optional<CMeasureReader> mReader;
+};
+
+// The length of a bar that no part fills is that of its time.
+void FillLengths(TScoreMeasures& measures) {
+    std::optional<TScoreTime> time;
+    for (TScoreMeasure& measure : measures) {
+        if (measure.mTime) time = measure.mTime;
+        if (measure.mLength <= 0) measure.mLength = measure.mOtherLength;
+        if (measure.mLength <= 0 && time) measure.mLength = time->BarLength();
+    }
+}
+
+}  // namespace
+
+TScoreReading ReadScore(std::string_view bytes) {
+    XmlStreamParser parser;
+    CScoreReader reader;
+    parser.setDelegate(&reader);
+    TScoreReading reading;
+    if (!parser.parse(bytes)) {
+        reading.mError = parser.parserError();
+    } else if (!reader.IsScore()) {
+        reading.mError = XmlError{0, "no MusicXML score", 1, 1};
+    } else {
+        reading.mWasCut = reader.WasCut();
+        reading.mScore = reader.Take();
+        FillLengths(reading.mScore.mMeasures);
+    }
+    return reading;
+}
+
+}  // namespace brindle
