@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "cli/CommandLine.h"
+#include "cli/Language.h"
 
 #include "brindle/Version.h"
 
@@ -47,6 +48,7 @@ TStatus Report(const CLI::App& program, const CLI::ParseError& error, const char
 }  // namespace
 
 int main(int argc, char** argv) {
+    UseLanguageOfUser();
     CLI::App program{"Music theory and harmony analysis", "brindle"};
     program.set_version_flag("--version", brindle::BrindleVersionString);
     program.require_subcommand(1);

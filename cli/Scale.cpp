@@ -28,6 +28,11 @@ std::string TypeName(TScaleType type) {
     return name.str();
 }
 
+// In the language of the user; empty for a scale without a type.
+std::string LocalizedName(TScaleType type) {
+    return CScaleHeavy::LocalizedNameForScaleType(type).value_or(std::string());
+}
+
 std::string_view NameOf(const CScaleHeavy& scale) {
     return scale.ScaleType() == st_custom ? "Custom" : scale.ScaleRow().mName;
 }
@@ -37,10 +42,15 @@ Json ScaleToJson(const CScaleHeavy& scale) {
     return {{"Name", fmt::format("{} {}", KeyName(scale.RootKeyEnh()), NameOf(scale))},
             {"CKeyEnh", KeyEnhToJson(scale.RootKeyEnh())},
             {"Type", TypeName(scale.ScaleType())},
+            {"TypeName", LocalizedName(scale.ScaleType())},
             {"Semitones", semitones.Mask()},
             {"Intervals", IntervalsToJson(semitones)},
             {"Notes", KeyEnhsToJson(KeysOf(scale))},
             {"SignsCount", scale.SignsCount()}};
+}
+
+std::string TypeText(TScaleType type) {
+    return fmt::format("{} ({})", LocalizedName(type), TypeName(type));
 }
 
 std::string ScaleText(const CScaleHeavy& scale, const CPaint& paint) {
@@ -54,7 +64,7 @@ std::string ScaleText(const CScaleHeavy& scale, const CPaint& paint) {
         "  signs      {}\n",
         paint.Strong(fmt::format("{} {}", KeyName(scale.RootKeyEnh()), NameOf(scale))),
         NotesText(KeysOf(scale)), SemitonesText(semitones), semitones.Mask(),
-        TypeName(scale.ScaleType()), SignsText(scale.SignsCount()));
+        TypeText(scale.ScaleType()), SignsText(scale.SignsCount()));
 }
 
 TStatus Scale(const TLineOptions& options) {
