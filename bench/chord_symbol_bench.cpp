@@ -5,6 +5,7 @@
 // error.
 
 #include "brindle/chords/CChordLite.h"
+#include "brindle/chords/ReadChordText.h"
 #include "brindle/theory/CChordNamePrefs.h"
 
 #include <benchmark/benchmark.h>
@@ -69,6 +70,46 @@ void ReadUsualSymbols(benchmark::State& state) {
 }
 BENCHMARK(ReadUsualSymbols);
 
+template <std::size_t N>
+void ReadTexts(benchmark::State& state, const std::array<std::string_view, N>& texts) {
+    std::size_t ix = 0;
+    for (auto _ : state) {
+        const CChordTextReading reading = ReadChordText(texts[ix]);
+        benchmark::DoNotOptimize(&reading);
+        if (reading.mKind != TChordText_Chord) state.SkipWithError("a text is not understood");
+        ix = ix + 1 < texts.size() ? ix + 1 : 0;
+    }
+    state.SetItemsProcessed(static_cast<std::int64_t>(state.iterations()));
+}
+
+void ReadUsualTexts(benchmark::State& state) {
+    ReadTexts(state, kUsualSymbols);
+}
+BENCHMARK(ReadUsualTexts);
+
+void ReadTextsOfOtherSpellings(benchmark::State& state) {
+    constexpr auto kTexts = std::to_array<std::string_view>({
+        "C-7",
+        "CM7",
+        "CΔ7",
+        "Co7",
+        "Cø7",
+        "C+",
+        "C7alt",
+        "C:min7",
+        "F♯m7♭5/B",
+        "Csus24",
+        "C7(b9,13)",
+        "E flat major",
+        "CmM7",
+        "C half-diminished",
+        "D/f+",
+        "C7M(9)",
+    });
+    ReadTexts(state, kTexts);
+}
+BENCHMARK(ReadTextsOfOtherSpellings);
+
 void ReadOneSymbol(benchmark::State& state, std::string_view symbol) {
     const CChordNamePrefs prefs;
     CChordLite chord;
@@ -95,6 +136,16 @@ void ReadLongText(benchmark::State& state) {
                             static_cast<std::int64_t>(text.size()));
 }
 BENCHMARK(ReadLongText)->Arg(1 << 10)->Arg(1 << 13)->Arg(1 << 16)->Arg(1 << 19);
+
+void ReadLongChordText(benchmark::State& state) {
+    std::string text = "C";
+    while (text.size() < static_cast<std::size_t>(state.range(0))) text += "7 add ♯11 omit3,5/";
+    text += 'E';
+    for (auto _ : state) benchmark::DoNotOptimize(ReadChordText(text));
+    state.SetBytesProcessed(static_cast<std::int64_t>(state.iterations()) *
+                            static_cast<std::int64_t>(text.size()));
+}
+BENCHMARK(ReadLongChordText)->Arg(1 << 10)->Arg(1 << 13)->Arg(1 << 16)->Arg(1 << 19);
 
 }  // namespace
 

@@ -41,6 +41,7 @@
 #include "brindle/chords/ChordAndScaleStrings.h"
 #include "brindle/chords/ChordSymbolKeywords.h"
 #include "brindle/chords/HarmFuncNames.h"
+#include "brindle/chords/ReadChordText.h"
 #include "brindle/chords/TChordOption.h"
 #include "brindle/chords/TSingleChordAnalysisAlgo.h"
 #include "brindle/guitarchords/GChBasicChord.h"

@@ -1,0 +1,235 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/chords/internal/WriteParserText.h"
+
+#include "brindle/chords/internal/CTextScan.h"
+#include "brindle/theory/CChordNamePrefs.h"
+#include "brindle/theory/KeyIntervals.h"
+
+#include <algorithm>
+#include <array>
+#include <cstdint>
+
+namespace brindle::ChordText {
+namespace {
+
+using TTones = std::uint32_t;  // bit n is the tone n semitones above the root
+
+template <class... T>
+constexpr TTones Tones(T... tones) {
+    return (TTones{0} | ... | (TTones{1} << tones));
+}
+
+constexpr bool Has(TTones tones, TTones wanted) {
+    return (tones & wanted) == wanted;
+}
+constexpr bool HasAny(TTones tones, TTones wanted) {
+    return (tones & wanted) != 0;
+}
+
+constexpr bool CanBeSaid(TTones tones) {
+    return Has(tones, Tones(0)) && HasAny(tones, Tones(6, 7, 8)) &&
+           (Has(tones, Tones(10)) || !Has(tones, Tones(1)));
+}
+
+/// No text leaves the root or the fifth out, and a flat nine always brings a minor seventh.
+constexpr TTones NearestThatCanBeSaid(TTones tones) {
+    tones |= Tones(0);
+    if (!HasAny(tones, Tones(6, 7, 8))) tones |= Tones(7);
+    if (Has(tones, Tones(1)) && !Has(tones, Tones(10))) {
+        if (Has(tones, Tones(11))) {
+            tones &= ~Tones(1);
+        } else {
+            tones |= Tones(10);
+        }
+    }
+    return tones;
+}
+
+struct TWholeChordRow {
+    TTones mTones;
+    std::string_view mText;
+};
+
+constexpr auto kWholeChordRows = std::to_array<TWholeChordRow>({
+    {Tones(0, 3, 6), "dim"},
+    {Tones(0, 3, 6, 9), "dim7"},
+    {Tones(0, 4, 8), "aug"},
+    {Tones(0, 7), "5"},
+});
+
+struct TFirstNumberRow {
+    TTones mTones;
+    std::string_view mText;
+    bool mIsForSus4Alone = false;
+};
+
+// The first that is contained.
+constexpr auto kFirstNumberRows = std::to_array<TFirstNumberRow>({
+    {Tones(2, 9, 10), "13", true},
+    {Tones(2, 5, 9, 10), "13"},
+    {Tones(2, 5, 10), "11"},
+    {Tones(2, 10), "9"},
+    {Tones(10), "7"},
+    {Tones(2, 11), "maj9"},
+    {Tones(11), "maj7"},
+    {Tones(9), "6"},
+});
+
+struct TOptionRow {
+    int mTone;
+    std::string_view mBehindNumber;
+    std::string_view mWithoutNumber;
+};
+
+// In the order in which they are written. Tone 6 as #11 or b5, and 8 as b13 or #5, are told apart
+// by the fifth.
+constexpr int kFlatFive = 12;
+constexpr int kSharpFive = 13;
+constexpr auto kOptionRows = std::to_array<TOptionRow>({
+    {10, "7", "7"},
+    {11, "maj7", "maj7"},
+    {1, "b9", "b9"},
+    {2, "9", "add9"},
+    {3, "#9", "#9"},
+    {5, "11", "add11"},
+    {6, "#11", "add#11"},
+    {kFlatFive, "b5", "b5"},
+    {kSharpFive, "#5", "#5"},
+    {8, "b13", "b13"},
+    {9, "13", "6"},
+});
+
+bool CanBeFlat(std::string_view number) {
+    return number == "5" || number == "6" || number == "9" || number == "13";
+}
+
+class CParserTextWriter {
+public:
+    CParserTextWriter(std::string root, TTones tones)
+        : mText(std::move(root)), mRootLength(mText.size()), mTones(tones) {}
+
+    std::string Write() && {
+        const auto* const whole =
+            std::find_if(kWholeChordRows.begin(), kWholeChordRows.end(),
+                         [&](const TWholeChordRow& row) { return row.mTones == mTones; });
+        if (whole != kWholeChordRows.end()) {
+            Append(whole->mText);
+            return std::move(mText);
+        }
+        mRest = mTones & ~Tones(0);
+        WriteThird();
+        WriteFirstNumber();
+        TakeFifth();
+        WriteOptions();
+        mText += mTail;
+        return std::move(mText);
+    }
+
+private:
+    bool Drop(int tone) {
+        if (!Has(mRest, Tones(tone))) return false;
+        mRest &= ~Tones(tone);
+        return true;
+    }
+
+    void WriteThird() {
+        if (Drop(4)) return;
+        if (Drop(3)) {
+            mText += 'm';
+        } else if (Drop(5)) {
+            mTail = "sus4";
+        } else if (Drop(2)) {
+            mTail = "sus2";
+        } else {
+            mTail = "no3";
+        }
+    }
+
+    void WriteFirstNumber() {
+        const auto* const row =
+            std::find_if(kFirstNumberRows.begin(), kFirstNumberRows.end(),
+                         [&](const TFirstNumberRow& number) { return IsFirstNumber(number); });
+        if (row == kFirstNumberRows.end()) return;
+        Append(row->mText);
+        mRest &= ~row->mTones;
+        mHasNumber = true;
+    }
+
+    /// A number that brings several tones brings none that is altered as well.
+    [[nodiscard]] bool IsFirstNumber(const TFirstNumberRow& row) const {
+        if (!Has(mRest, row.mTones)) return false;
+        if (row.mIsForSus4Alone && mTail != "sus4") return false;
+        const bool isSingle = (row.mTones & (row.mTones - 1)) == 0;
+        if (isSingle) return true;
+        const bool hasFifth = Has(mTones, Tones(7));
+        if (Has(row.mTones, Tones(2)) && HasAny(mRest, Tones(1, 3))) return false;
+        if (Has(row.mTones, Tones(10)) && Has(mRest, Tones(11))) return false;
+        if (Has(row.mTones, Tones(5)) && Has(mRest, Tones(6)) && hasFifth) return false;
+        return !(Has(row.mTones, Tones(9)) && Has(mRest, Tones(8)) && hasFifth);
+    }
+
+    void TakeFifth() {
+        if (Drop(7)) return;
+        if (Drop(6)) mRest |= Tones(kFlatFive);
+        if (Drop(8)) mRest |= Tones(kSharpFive);
+    }
+
+    void WriteOptions() {
+        for (const TOptionRow& row : kOptionRows) {
+            if (!Drop(row.mTone)) continue;
+            Append(mHasNumber ? row.mBehindNumber : row.mWithoutNumber);
+        }
+    }
+
+    /// A blank keeps numbers apart, and the root from what could be read as its accidental or, as
+    /// in `Ebb 5`, could take one of it away.
+    void Append(std::string_view part) {
+        const bool isAtRoot = mText.size() == mRootLength;
+        const bool beginsWithSign = part.front() == 'b' || part.front() == '#';
+        const bool takesFlat = mText.ends_with("bb") && CanBeFlat(part);
+        const bool digitsMeet = IsDigit(mText.back()) && IsDigit(part.front());
+        if (digitsMeet || (isAtRoot && (beginsWithSign || takesFlat))) mText += ' ';
+        mText += part;
+    }
+
+    std::string mText;
+    std::size_t mRootLength;
+    TTones mTones;
+    TTones mRest = 0;
+    std::string_view mTail;
+    bool mHasNumber = false;
+};
+
+std::string NoteText(CKeyEnh key, const CChordNamePrefs& prefs) {
+    constexpr std::string_view kLetters = "C D EF G A B";
+    constexpr std::array<std::string_view, 5> kSigns{"bb", "b", "", "#", "x"};
+    const int accidental = std::clamp(EnhToSemitone(key.mEnh), -2, 2);
+    const int natural = FoldIntoOctave(key.mKeyNr - accidental);
+    std::string text(1, kLetters[static_cast<std::size_t>(natural)]);
+    if (prefs.mBForBFlat && text == "B") {
+        if (accidental == -1) return text;
+        text = "H";
+    }
+    return text += kSigns[static_cast<std::size_t>(accidental + 2)];
+}
+
+}  // namespace
+
+bool IsExpressible(CSemitones semitones) {
+    return CanBeSaid(static_cast<TTones>(semitones.Mask()));
+}
+
+TParserText WriteParserText(const CChordLite& chord, const CChordNamePrefs& prefs) {
+    const auto tones = static_cast<TTones>(chord.mSemitones.Mask());
+    TParserText written;
+    written.mIsExact = CanBeSaid(tones);
+    CParserTextWriter writer(NoteText(chord.mRootKeyEnh, prefs), NearestThatCanBeSaid(tones));
+    written.mText = std::move(writer).Write();
+    if (chord.HasBassNote() && !prefs.mSlashText.empty()) {
+        written.mText += prefs.mSlashText.front();
+        written.mText += NoteText(chord.mBassKeyEnh, prefs);
+    }
+    return written;
+}
+
+}  // namespace brindle::ChordText
