@@ -9,6 +9,8 @@
 #include <array>
 #include <cerrno>
 #include <cstdlib>
+#include <ostream>
+#include <streambuf>
 
 namespace brindle {
 
@@ -41,13 +43,38 @@ void FlushFolder(const std::filesystem::path& folder) {
     close(file);
 }
 
-}  // namespace
+/// The buffer of a stream that writes to an open file.
+class CFileBuffer : public std::streambuf {
+public:
+    explicit CFileBuffer(int file) : mFile(file) { StartAgain(); }
 
-bool WriteFileAtomically(const std::filesystem::path& path, std::string_view bytes) {
+protected:
+    int_type overflow(int_type c) override {
+        if (sync() != 0) return traits_type::eof();
+        if (!traits_type::eq_int_type(c, traits_type::eof())) {
+            sputc(traits_type::to_char_type(c));
+        }
+        return traits_type::not_eof(c);
+    }
+    int sync() override {
+        const bool ok = WriteAll(mFile, {pbase(), static_cast<std::size_t>(pptr() - pbase())});
+        StartAgain();
+        return ok ? 0 : -1;
+    }
+
+private:
+    void StartAgain() { setp(mBytes.data(), mBytes.data() + mBytes.size()); }
+
+    int mFile;
+    std::array<char, 65536> mBytes;
+};
+
+template <class WriteBytes>
+bool ReplaceFile(const std::filesystem::path& path, WriteBytes writeBytes) {
     std::string beside = path.string() + ".XXXXXX";
     const int file = mkostemp(beside.data(), O_CLOEXEC);
     if (file < 0) return false;
-    bool ok = fchmod(file, RightsFor(path)) == 0 && WriteAll(file, bytes) && fsync(file) == 0;
+    bool ok = fchmod(file, RightsFor(path)) == 0 && writeBytes(file) && fsync(file) == 0;
     ok = close(file) == 0 && ok;
     ok = ok && rename(beside.c_str(), path.c_str()) == 0;
     if (!ok) {
@@ -56,6 +83,22 @@ bool WriteFileAtomically(const std::filesystem::path& path, std::string_view byt
     }
     FlushFolder(path.parent_path());
     return true;
+}
+
+}  // namespace
+
+bool WriteFileAtomically(const std::filesystem::path& path, std::string_view bytes) {
+    return ReplaceFile(path, [bytes](int file) { return WriteAll(file, bytes); });
+}
+
+bool WriteFileAtomically(const std::filesystem::path& path,
+                         const std::function<void(std::ostream&)>& write) {
+    return ReplaceFile(path, [&write](int file) {
+        CFileBuffer buffer(file);
+        std::ostream stream(&buffer);
+        write(stream);
+        return stream.flush().good();
+    });
 }
 
 std::optional<std::string> ReadWholeFile(const std::filesystem::path& path, std::size_t limit) {

@@ -2,6 +2,8 @@
 #pragma once
 
 #include <filesystem>
+#include <functional>
+#include <iosfwd>
 #include <optional>
 #include <string>
 #include <string_view>
@@ -12,6 +14,10 @@ namespace brindle {
 /// can foresee, flushed to the disk and renamed over it. A full disk or a kill leaves the old file
 /// as it was. False when that failed; nothing is left behind then.
 [[nodiscard]] bool WriteFileAtomically(const std::filesystem::path& path, std::string_view bytes);
+
+/// The same for bytes that `write` puts on a stream, so that they never are in memory as a whole.
+[[nodiscard]] bool WriteFileAtomically(const std::filesystem::path& path,
+                                       const std::function<void(std::ostream&)>& write);
 
 /// The whole file, or nothing when it cannot be read or is larger than `limit` bytes.
 [[nodiscard]] std::optional<std::string> ReadWholeFile(const std::filesystem::path& path,
