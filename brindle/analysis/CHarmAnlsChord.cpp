@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/analysis/CHarmAnlsChord.h"
 
+#include "brindle/analysis/CSemitonesMatch.h"
 #include "brindle/platform/PlainText.h"
 
 #include <ostream>
@@ -49,6 +50,15 @@ void CHarmAnlsChordWithPos::AppendJSONClassSubstring(std::ostream& stream) const
 
 void CHarmAnlsChordWithPos::AppendJSONString(std::ostream& stream) const {
     WriteInBraces(stream, *this);
+}
+
+void CHarmAnlsChordWithLength::SimplifyChord() {
+    // The two patterns exclude each other. Kept: a chord without a fifth becomes major.
+    mSemitones =
+        ChordPattern::Minor.Matches(mSemitones) ? CSemitones{0, 3, 7} : CSemitones{0, 4, 7};
+    mBassDistToHarmCenter = -1;
+    mBassKeyEnh = CKeyEnh_Undef;
+    mLength = 4.0;
 }
 
 void CHarmAnlsChordWithLength::AppendJSONClassSubstring(std::ostream& stream) const {

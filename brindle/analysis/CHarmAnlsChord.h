@@ -82,6 +82,10 @@ public:
     constexpr explicit CHarmAnlsChordWithLength(const CChordLite& chord, double length = kPosUndef)
         : CHarmAnlsChord(chord), mLength(length) {}
 
+    /// Leaves of the chord its minor triad, or else the major triad on its root, without a bass and
+    /// four beats long.
+    void SimplifyChord();
+
     void AppendJSONClassSubstring(std::ostream& stream) const;
     void AppendJSONString(std::ostream& stream) const;
 

@@ -1,0 +1,91 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/markov/CMarkovObject.h"
+
+#include <boost/container/flat_map.hpp>
+#include <boost/container/flat_set.hpp>
+
+#include <cstdint>
+#include <iosfwd>
+#include <list>
+#include <map>
+#include <nlohmann/json_fwd.hpp>
+#include <span>
+#include <unordered_map>
+#include <vector>
+
+namespace brindle {
+
+/// A symbol in the store of a model.
+struct TMarkovStoredObject : CMarkovObject {
+    /// Its place in the store, counted from 0.
+    std::uint32_t mPlace = 0;
+    /// The same for symbols that have one place in tables, see `operator<`: C sharp and D flat.
+    std::uint32_t mOrderClass = 0;
+};
+
+/// Where a symbol stands in the store of its model; valid as long as that is not cleared.
+using MarkovIterator = std::list<TMarkovStoredObject>::const_iterator;
+
+/// The order of tables, which compare their symbols and never where these are stored.
+struct TMarkovLess {
+    bool operator()(MarkovIterator a, MarkovIterator b) const { return *a < *b; }
+};
+
+/// Symbols in the order of time.
+using MarkovSequence = std::vector<MarkovIterator>;
+using MarkovSequenceView = std::span<const MarkovIterator>;
+/// How often each symbol followed. Grows symbol by symbol.
+using MarkovCounts = std::map<MarkovIterator, std::uint32_t, TMarkovLess>;
+/// The probability, or another weight, of each symbol. Filled in order, then asked.
+using MarkovProbabilities = boost::container::flat_map<MarkovIterator, double, TMarkovLess>;
+using MarkovSymbolSet = boost::container::flat_set<MarkovIterator, TMarkovLess>;
+
+/// The store of symbols: a list without repetitions, in the order in which the symbols came.
+///
+/// Nothing is removed but by Clear, so iterators stay valid. A symbol is found by hash.
+class CMarkovObjects {
+public:
+    CMarkovObjects() = default;
+    // Tables hold iterators, so a copy would point into the list that it was made from.
+    CMarkovObjects(const CMarkovObjects&) = delete;
+    CMarkovObjects& operator=(const CMarkovObjects&) = delete;
+    CMarkovObjects(CMarkovObjects&&) = default;
+    CMarkovObjects& operator=(CMarkovObjects&&) = default;
+    ~CMarkovObjects() = default;
+
+    /// The symbol that equals `object` in all fields, appended if it was not there.
+    MarkovIterator insertObjectIfUnique(const CMarkovObject& object);
+    /// The same without appending: the end of the list if there is none.
+    [[nodiscard]] MarkovIterator getIteratorToObject(const CMarkovObject& object) const;
+    /// The symbol at a place counted from 0; the end of the list outside of it.
+    [[nodiscard]] MarkovIterator At(std::int64_t place) const;
+
+    [[nodiscard]] MarkovIterator begin() const { return mList.begin(); }
+    [[nodiscard]] MarkovIterator end() const { return mList.end(); }
+    [[nodiscard]] std::size_t size() const { return mList.size(); }
+    [[nodiscard]] bool empty() const { return mList.empty(); }
+    void Clear();
+
+    /// An array of the symbols in list order.
+    void AppendJSONString(std::ostream& stream) const;
+
+    struct JSONDeserialization_Helper {
+        /// Reads the array under "CMarkovObjects". Symbols that read as equal become one, so that
+        /// the places behind them are one lower.
+        [[nodiscard]] static CMarkovObjects CMarkovObjectsFromJSONDictionary(
+            const nlohmann::json& dictionary);
+    };
+
+    /// The same symbols in the same order.
+    friend bool operator==(const CMarkovObjects& a, const CMarkovObjects& b);
+
+private:
+    std::list<TMarkovStoredObject> mList;
+    std::vector<MarkovIterator> mByPlace;
+    std::unordered_multimap<std::size_t, MarkovIterator> mByHash;
+    std::map<MarkovIterator, std::uint32_t, TMarkovLess> mOrderClasses;
+};
+
+}  // namespace brindle
