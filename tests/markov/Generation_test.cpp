@@ -1,0 +1,137 @@
+// SPDX-License-Identifier: MIT
+#include "MarkovForms.h"
+
+#include "tests/support/Expected.h"
+
+#include "brindle/markov/TMarkovSamplingInformation.h"
+
+#include <doctest/doctest.h>
+
+#include <algorithm>
+#include <cmath>
+
+using namespace brindle;
+using namespace brindle::test;
+using nlohmann::json;
+
+namespace {
+
+/// Plays the given numbers, then zeros.
+VariableLengthMarkovModel::RandomSource NumbersOf(const json& form) {
+    return [numbers = form.get<std::vector<std::uint32_t>>(), next = std::size_t{0}]() mutable {
+        return next < numbers.size() ? numbers[next++] : 0;
+    };
+}
+
+/// {field: value, ...}, the template as a chord string
+TMarkovGenerateOptions OptionsOf(VariableLengthMarkovModel& model, const json& wanted,
+                                 const json& fields) {
+    TMarkovGenerateOptions options;
+    options.mTemplate = model.IteratorSequenceForObjects(SymbolsOf(wanted.get<std::string>()));
+    fields.at("mMaxHistoryLength").get_to(options.mMaxHistoryLength);
+    fields.at("mMinHistoryLength").get_to(options.mMinHistoryLength);
+    fields.at("mEvidenceHistoryLength").get_to(options.mEvidenceHistoryLength);
+    fields.at("mAcceptAtMinHistory").get_to(options.mAcceptAtMinHistory);
+    fields.at("mAcceptExactFill").get_to(options.mAcceptExactFill);
+    fields.at("mMinNormalizedEntropy").get_to(options.mMinNormalizedEntropy);
+    fields.at("mAllEqualFactor").get_to(options.mAllEqualFactor);
+    fields.at("mSampleCount").get_to(options.mSampleCount);
+    return options;
+}
+
+/// [N, sequences, template, options, random numbers]
+struct TRun {
+    VariableLengthMarkovModel mModel;
+    TMarkovGenerateOptions mOptions;
+    TMarkovSampledSequence mSequence;
+    std::vector<TMarkovSampledSequence> mSequences;
+
+    explicit TRun(const json& in)
+        : mModel(ModelOf(in)), mOptions(OptionsOf(mModel, in.at(2), in.at(3))) {
+        mModel.SetRandomSource(NumbersOf(in.at(4)));
+    }
+};
+
+json FormOfSampled(const TMarkovSampledSequence& sequence) {
+    auto form = json::array();
+    for (const TMarkovSampledObject& object : sequence.mSampledObjects) {
+        form.push_back({object.mObject->mPlace, NumberForm(object.mProbability),
+                        NumberForm(object.mNormalizedEntropy), NumberForm(object.mMaxEntropy),
+                        object.mHistoryLength});
+    }
+    return form;
+}
+
+json Filled(const json& in) {
+    TRun run(in);
+    TMarkovSamplingInformation info;
+    const bool result = run.mModel.RecursiveGenerateSequence(run.mSequence, run.mOptions, info);
+    if (!result) return {{"result", false}};
+    return {{"result", true}, {"mSampledObjects", FormOfSampled(run.mSequence)}};
+}
+
+json Free(const json& in) {
+    TRun run(in);
+    run.mModel.GenerateSequenceWithFixedLength(run.mOptions.mMaxHistoryLength, run.mSequence,
+                                               run.mOptions);
+    return {{"mSampledObjects", FormOfSampled(run.mSequence)}};
+}
+
+json Sampled(const json& in, bool recursive) {
+    TRun run(in);
+    run.mModel.SampleSequenceWithLength(run.mSequence, run.mSequences, recursive, run.mOptions);
+    std::vector<json> sequences;
+    for (const TMarkovSampledSequence& sequence : run.mSequences) {
+        sequences.push_back({test::FormOf(sequence.mSymbols), sequence.mCount});
+    }
+    std::sort(sequences.begin(), sequences.end());
+    return {{"mSymbols", test::FormOf(run.mSequence.mSymbols)}, {"sequences", sequences}};
+}
+
+/// The place of the chosen value
+json Chosen(const json& in) {
+    VariableLengthMarkovModel model;
+    const MarkovProbabilities table = TableOf(model, in.at(0));
+    model.SetRandomSource(NumbersOf(in.at(1)));
+    return model.ChooseFromProbabilities(table)->mIndex;
+}
+
+json Normalized(const json& in) {
+    std::vector<TMarkovWeightedSequence> sequences;
+    for (const json& weight : in.at(0)) sequences.push_back({{}, weight.get<double>()});
+    VariableLengthMarkovModel::NormalizeLogProbabilities(sequences);
+    auto form = json::array();
+    for (const auto& sequence : sequences) form.push_back(sequence.mWeight);
+    return form;
+}
+
+/// [N, longest, shortest, evidence]
+json Validated(const json& in) {
+    VariableLengthMarkovModel model(in.at(0).get<std::uint64_t>());
+    TMarkovGenerateOptions options;
+    options.mTemplate = model.IteratorSequenceForObjects(SymbolsOf("(4,U)"));
+    in.at(1).get_to(options.mMaxHistoryLength);
+    in.at(2).get_to(options.mMinHistoryLength);
+    in.at(3).get_to(options.mEvidenceHistoryLength);
+    const bool isValid = options.IsValid(model);
+    const bool hasTemplate = options.Validate(model);
+    return {isValid, hasTemplate, options.mMaxHistoryLength, options.mMinHistoryLength,
+            options.mEvidenceHistoryLength};
+}
+
+}  // namespace
+
+TEST_CASE("Given random numbers make the expected sequences") {
+    CheckExpected("markov_generation",
+                  {
+                      {"VariableLengthMarkovModel::RecursiveGenerateSequence", Filled},
+                      {"VariableLengthMarkovModel::GenerateSequenceWithFixedLength", Free},
+                      {"VariableLengthMarkovModel::SampleSequenceWithLength (recursive)",
+                       [](const json& in) { return Sampled(in, true); }},
+                      {"VariableLengthMarkovModel::SampleSequenceWithLength (free)",
+                       [](const json& in) { return Sampled(in, false); }},
+                      {"VariableLengthMarkovModel::ChooseFromProbabilities", Chosen},
+                      {"VariableLengthMarkovModel::NormalizeLogProbabilities", Normalized},
+                      {"TMarkovGenerateOptions::Validate", Validated},
+                  });
+}
