@@ -1,0 +1,33 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/markov/CIteratorIndexConverter.h"
+#include "brindle/markov/CMarkovTransitionMap.h"
+
+#include <cstdint>
+#include <nlohmann/json_fwd.hpp>
+#include <vector>
+
+namespace brindle {
+
+/// The entries of "TransitionMap" in a model file, as numbers. They take a fraction of the room
+/// that the JSON takes, so that a reader can let go of that entry by entry.
+class CMarkovFileTransitions {
+public:
+    /// `entry` is `[[h1,h2,...],[[s,c],[s,c],...]]`. What has another form is left out.
+    void Add(const nlohmann::json& entry);
+    void Clear() { mNumbers.clear(); }
+
+    /// The map with all shorter histories. Entries and successors whose index names no symbol are
+    /// left out.
+    [[nodiscard]] CMarkovTransitionMap ToMap(const CIteratorIndexConverter& converter) const;
+
+private:
+    /// Each entry: the length of its history, the number of its pairs, the history, the pairs.
+    std::vector<std::uint32_t> mNumbers;
+};
+
+/// The index that a JSON value holds; -1 for one that can be no index.
+[[nodiscard]] int MarkovIndexOf(const nlohmann::json& value);
+
+}  // namespace brindle
