@@ -19,6 +19,7 @@ std::string_view NameOfNonChord(const CNote& root) {
 }
 
 void LowerFirstLetter(std::string& name) {
+    if (name.empty()) return;  // a syllable may be translated by nothing
     constexpr int capitalToSmall = 'a' - 'A';
     char& first = name.front();
     if (first >= 'A' && first <= 'Z') first = static_cast<char>(first + capitalToSmall);

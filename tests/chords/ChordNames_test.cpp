@@ -4,6 +4,7 @@
 
 #include "brindle/chords/BasicChordNames.h"
 #include "brindle/chords/ChordAndScaleStrings.h"
+#include "brindle/platform/Localization.h"
 
 #include <doctest/doctest.h>
 
@@ -146,6 +147,14 @@ TEST_CASE("A chord without a root says which of the three it is") {
     smallUndef.mEnh = TEnh_b;
     CHECK(triad.NameForThisRootNote(smallUndef, prefs) == "No Chord");
     CHECK(triad.NameWithLeastSignsForThisRootNote(smallUndef, prefs) == "No Chord");
+}
+
+TEST_CASE("A minor root in a language without a word for it has no letter to lower") {
+    SetLocalizer([](const std::string&) { return std::string(); });
+    const CChordNamePrefs prefs{
+        .mSolfege = true, .mLocalizeSolfege = true, .mLowerCaseMinorRoot = true};
+    CHECK(CChordHeavy(kC, CSemitones{0, 3, 7}, CKeyEnh_Undef).Name(prefs) == "m");
+    SetLocalizer(nullptr);
 }
 
 TEST_CASE("A bass behind the slash is spelled by the scale of its chord and stays so") {
