@@ -63,6 +63,10 @@ constexpr const char* kOtherTexts[] = {
     "Could not decompress (compressed MusicXML file)",
     "Compressed MusicXML file seems to be malformed (could not find ‘full-path’)",
     "Could not create temporary conversion file",
+    "MusicXML Parsing Error",
+    "Parsing error %zd, Description: %@, Line: %zd, Column: %zd",
+    "MusicXML Validation Error",
+    "Validation error %zd, Description: %@, Line: %zd, Column: %zd",
     "GChStr_6StrgsGuitarRegTuning",
 };
 
