@@ -5,6 +5,7 @@
 
 #include <cstdint>
 #include <iosfwd>
+#include <utility>
 #include <vector>
 
 namespace brindle {
@@ -25,5 +26,10 @@ struct CHarmCopy {
 std::ostream& operator<<(std::ostream& stream, const CHarmCopy& copy);
 
 using CHarmCopies = std::vector<CHarmCopy>;
+
+/// The places in a chord list where a sequence of chords starts, ascending, and how many chords it
+/// has.
+using THarmRepeatingSequence = std::pair<std::vector<std::uint64_t>, std::uint64_t>;
+using THarmRepeatingSequences = std::vector<THarmRepeatingSequence>;
 
 }  // namespace brindle

@@ -4,6 +4,7 @@
 #include "brindle/analysis/CHarmAnlsChords.h"
 #include "brindle/analysis/CHarmAnlsProgressions.h"
 #include "brindle/analysis/CHarmAnlsSignKeys.h"
+#include "brindle/analysis/CHarmCopy.h"
 #include "brindle/analysis/TAnalyse.h"
 
 #include <cstdint>
@@ -61,6 +62,32 @@ public:
 
     /// Replaces `chords` with the chords of all centers of all sign keys.
     void ListAllHarmChords(CHarmAnlsChords& chords) const;
+    /// Replaces `chords` with those of `mChords`, each as long as the next one begins after it; the
+    /// length of the last is undefined, and so are all distances.
+    void ListAllHarmChordsWithLength(CHarmAnlsChordsWithLength& chords) const;
+
+    /// Replaces `copies` with the passages of `mChords` that repeat earlier ones, by position. A
+    /// bar has four beats here. Spelling, bass and length of each chord must agree.
+    void FindHarmCopies(CHarmCopies& copies) const;
+
+    // The steps of FindHarmCopies.
+
+    /// Replaces `sequences` with all sequences of two or more chords that stand at two or more
+    /// places, sorted.
+    void GenerateVectorWithRepeatingSequenceIndices(THarmRepeatingSequences& sequences,
+                                                    CHarmAnlsChordsWithLength chords) const;
+    /// Replaces `indices` with the later places of the chord at `start`. Kept: the last chord of
+    /// the list is not looked at.
+    void FindRecurringChordIndices(std::vector<std::uint64_t>& indices,
+                                   CHarmAnlsChordsWithLength chords, std::uint64_t start) const;
+    /// Appends `start` unless it is there or less than `length` behind an entry.
+    void InsertRangeStartIfNoCollision(std::vector<std::uint64_t>& indices, std::uint64_t start,
+                                       std::uint64_t length) const;
+    /// Appends the copies in a passage: `chords`, whose first is number `start` of the list that
+    /// the sequences count from, and begins at `position` in beats.
+    void RecursiveFillWithSequences(const CHarmAnlsChordsWithLength& chords,
+                                    const THarmRepeatingSequences& sequences, std::uint64_t start,
+                                    std::int32_t position, CHarmCopies& copies) const;
 
     /// Writes the result as JSON text. Not strict JSON: each list ends with a comma.
     void AppendJSONString(std::ostream& stream) const;

@@ -1,0 +1,48 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/analysis/internal/CSuffixes.h"
+
+namespace brindle {
+
+/// All places where one passage of a list of symbols stands, its occurrences.
+///
+/// Two occurrences are partners when they do not overlap and the passage is all that they share:
+/// they go on with different symbols, or the second begins where the first ends (a tandem).
+class COccurrences {
+public:
+    /// `ranks` are those of the suffixes that begin with the passage.
+    COccurrences(const CSuffixes& suffixes, TRanks ranks, TPlace length)
+        : mSuffixes(&suffixes), mRanks(ranks), mLength(length) {}
+
+    [[nodiscard]] TPlace Length() const { return mLength; }
+    [[nodiscard]] bool Has(TPlace place) const {
+        return place < mSuffixes->Count() && mRanks.Has(mSuffixes->RankOf(place));
+    }
+    /// The ranks of the occurrences that go on as this one does.
+    [[nodiscard]] TRanks Continuation(TPlace place) const {
+        return mSuffixes->RanksOfPassage(place, mLength + 1);
+    }
+    /// Whether the occurrence has a partner behind it.
+    [[nodiscard]] bool HasPartner(TPlace place) const;
+
+    // These find the first occurrence from `place` on; `kNoPlace` if there is none.
+
+    [[nodiscard]] TPlace Next(TPlace place) const { return mSuffixes->NextPlace(mRanks, place); }
+    /// That goes on otherwise.
+    [[nodiscard]] TPlace NextContinuedOtherwise(TPlace place, TRanks continuation) const;
+    /// That has a partner behind it.
+    [[nodiscard]] TPlace NextWithPartner(TPlace place) const;
+    /// That another occurrence follows at once.
+    [[nodiscard]] TPlace NextTandem(TPlace place) const;
+
+private:
+    [[nodiscard]] TPlace LastOfRow(TPlace place, TPlace period) const;
+    [[nodiscard]] TPlace PlaceBehindFailedTandem(TPlace place, TPlace follower) const;
+
+    const CSuffixes* mSuffixes;
+    TRanks mRanks;
+    TPlace mLength;
+};
+
+}  // namespace brindle

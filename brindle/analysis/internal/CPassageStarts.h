@@ -1,0 +1,60 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/analysis/internal/COccurrences.h"
+#include "brindle/analysis/internal/RepeatedPassages.h"
+
+#include <cstdint>
+#include <span>
+#include <vector>
+
+namespace brindle {
+
+/// Chooses the starts of a repeated passage among its occurrences.
+///
+/// By definition every occurrence, from left to right, takes its partners from left to right and
+/// then itself; a start is taken unless it lies inside a passage that was taken before it.
+///
+/// Most of these steps take nothing, and they are passed over. Call two occurrences alike if they
+/// go on with the same symbol. Behind the first occurrence with a partner nothing is free that is
+/// not like it, so until the first one unlike it only tandems are left to be taken, and behind that
+/// one nothing is free at all. From then on each occurrence can only take itself. What is left
+/// costs a few searches for each start, of which there are at most 3 in the length of a passage.
+class CPassageStarts {
+public:
+    explicit CPassageStarts(const CSuffixes& suffixes)
+        : mSuffixes(suffixes), mTaken(suffixes.Count()) {}
+
+    /// The starts of a group of forms in ascending order; none if no form has partners.
+    [[nodiscard]] std::vector<std::uint64_t> StartsOf(std::span<const TPassageForm> forms);
+
+private:
+    enum TStage { Stage_First, Stage_Tandems, Stage_Alone };
+
+    /// The way over the occurrences of one form.
+    struct TWalk {
+        COccurrences mOccurrences;
+        TStage mStage = Stage_First;
+        TPlace mNext = kNoPlace;
+        /// The first occurrence unlike the first with a partner.
+        TPlace mUnlike = kNoPlace;
+    };
+
+    static bool ComesLater(const TWalk& a, const TWalk& b) { return a.mNext > b.mNext; }
+
+    void Visit(TWalk& walk);
+    void FindNext(TWalk& walk, TPlace place) const;
+    [[nodiscard]] TPlace NextToTakeItself(const COccurrences& occurrences, TPlace place) const;
+    [[nodiscard]] TPlace NextToTakeTandem(const COccurrences& occurrences, TPlace place) const;
+    void TakePartners(const COccurrences& occurrences, TPlace place, TRanks continuation);
+    void TakeIfFree(TPlace place, TPlace length);
+    /// The end of the passage that was taken over a place; the place itself if it is free.
+    [[nodiscard]] TPlace FreeFrom(TPlace place, TPlace length) const;
+
+    const CSuffixes& mSuffixes;
+    CPlaceSet mTaken;
+    std::vector<TPlace> mStarts;
+    std::vector<TWalk> mWalks;  // a heap, the next to visit on top
+};
+
+}  // namespace brindle
