@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "cli/Output.h"
 
-#include "cli/Utf8.h"
+#include "brindle/platform/Utf8.h"
 
 #include <fmt/format.h>
 #include <unistd.h>

@@ -156,6 +156,15 @@ public:
 
     [[nodiscard]] nlohmann::json propertyList() const;
 
+    // Its chunk in a library file (in LibraryFile.cpp)
+
+    [[nodiscard]] std::size_t chordChunkSize() const;
+    /// writeChordChunkToBuffer:remLength: the size of the chunk, 0 if it does not fit.
+    ///
+    /// Kept: a file has 15 elements at most, frets up to 7 above the lowest one, and cannot tell an
+    /// optional point that was read from a file from a real one.
+    std::size_t writeChordChunkToBuffer(std::uint8_t* buffer, std::size_t remLength) const;
+
 private:
     std::weak_ptr<GChLibrary> mGchLibrary;
     GChShortTuning mShortTuning;

@@ -51,6 +51,23 @@ public:
     void replaceChordRange2(const std::shared_ptr<GChBasicChord>& chord,
                             const std::shared_ptr<GChBasicChord>& withChord);
 
+    // Its file (the layout is in LibraryFile.cpp)
+
+    /// 0 when the tuning is gone. A name that is no UTF-8 counts and is written as a missing one.
+    [[nodiscard]] std::size_t tuningChunkSize() const;
+    /// writeTuningChunkToBuffer:remLength: the size of the chunk, 0 if it does not fit.
+    std::size_t writeTuningChunkToBuffer(std::uint8_t* buffer, std::size_t remLength) const;
+    /// The bytes of the whole file; empty on failure.
+    [[nodiscard]] std::string wholeLibraryFileContent() const;
+    /// readChordChunksFromBuffer:withLength:dbChordCount: adds the chords of the chunks, numbered
+    /// from the counter on. False at the first bad chunk; the chords before it stay.
+    bool readChordChunksFromBuffer(const std::uint8_t* buffer, std::size_t length,
+                                   std::int32_t& dbChordCount);
+    /// updateLibraryFile: replaces its file as a whole. A library without a path gets a new file in
+    /// the folder of the package, unless that is empty; one whose file is gone is not written.
+    /// False when the file could not be written; then the old one is as it was.
+    bool updateLibraryFile(const std::filesystem::path& packagePath);
+
 private:
     std::weak_ptr<GChTuning> mGchTuning;
     std::vector<std::shared_ptr<GChBasicChord>> mBasicChords;

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/platform/AtomicFile.h"
 
+#include "brindle/platform/internal/WholeFiles.h"
+
 #include <fcntl.h>
 #include <sys/stat.h>
 #include <unistd.h>
@@ -16,33 +18,6 @@ namespace brindle {
 
 namespace {
 
-bool WriteAll(int file, std::string_view bytes) {
-    while (!bytes.empty()) {
-        const ssize_t count = write(file, bytes.data(), bytes.size());
-        if (count < 0 && errno == EINTR) continue;
-        if (count <= 0) return false;
-        bytes.remove_prefix(static_cast<std::size_t>(count));
-    }
-    return true;
-}
-
-// The rights of the file that is replaced, else those that a new file gets.
-mode_t RightsFor(const std::filesystem::path& path) {
-    struct stat status {};
-    if (stat(path.c_str(), &status) == 0) return status.st_mode & 07777;
-    const mode_t mask = umask(0);
-    umask(mask);
-    return 0666 & ~mask;
-}
-
-void FlushFolder(const std::filesystem::path& folder) {
-    const int file =
-        open(folder.empty() ? "." : folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC);
-    if (file < 0) return;
-    fsync(file);
-    close(file);
-}
-
 /// The buffer of a stream that writes to an open file.
 class CFileBuffer : public std::streambuf {
 public:
@@ -57,7 +32,8 @@ protected:
         return traits_type::not_eof(c);
     }
     int sync() override {
-        const bool ok = WriteAll(mFile, {pbase(), static_cast<std::size_t>(pptr() - pbase())});
+        const bool ok =
+            WholeFiles::WriteAll(mFile, {pbase(), static_cast<std::size_t>(pptr() - pbase())});
         StartAgain();
         return ok ? 0 : -1;
     }
@@ -69,31 +45,38 @@ private:
     std::array<char, 65536> mBytes;
 };
 
+/// `scratch` is the path with whose name, and some letters behind it, the bytes are first written.
 template <class WriteBytes>
-bool ReplaceFile(const std::filesystem::path& path, WriteBytes writeBytes) {
-    std::string beside = path.string() + ".XXXXXX";
+bool ReplaceFile(const std::filesystem::path& path, const std::filesystem::path& scratch,
+                 WriteBytes writeBytes) {
+    std::string beside = scratch.string() + ".XXXXXX";
     const int file = mkostemp(beside.data(), O_CLOEXEC);
     if (file < 0) return false;
-    bool ok = fchmod(file, RightsFor(path)) == 0 && writeBytes(file) && fsync(file) == 0;
+    bool ok = fchmod(file, WholeFiles::RightsFor(path, 0666)) == 0 && writeBytes(file) &&
+              fsync(file) == 0;
     ok = close(file) == 0 && ok;
     ok = ok && rename(beside.c_str(), path.c_str()) == 0;
     if (!ok) {
         unlink(beside.c_str());
         return false;
     }
-    FlushFolder(path.parent_path());
+    WholeFiles::FlushFolder(path.parent_path());
     return true;
 }
 
 }  // namespace
 
-bool WriteFileAtomically(const std::filesystem::path& path, std::string_view bytes) {
-    return ReplaceFile(path, [bytes](int file) { return WriteAll(file, bytes); });
+bool WriteFileAtomically(const std::filesystem::path& path, std::string_view bytes,
+                         const std::filesystem::path& scratchFolder) {
+    const std::filesystem::path scratch =
+        scratchFolder.empty() ? path : scratchFolder / path.filename();
+    return ReplaceFile(path, scratch,
+                       [bytes](int file) { return WholeFiles::WriteAll(file, bytes); });
 }
 
 bool WriteFileAtomically(const std::filesystem::path& path,
                          const std::function<void(std::ostream&)>& write) {
-    return ReplaceFile(path, [&write](int file) {
+    return ReplaceFile(path, path, [&write](int file) {
         CFileBuffer buffer(file);
         std::ostream stream(&buffer);
         write(stream);

@@ -13,7 +13,11 @@ namespace brindle {
 /// Replaces the file at `path` as a whole: the bytes are written beside it under a name that nobody
 /// can foresee, flushed to the disk and renamed over it. A full disk or a kill leaves the old file
 /// as it was. False when that failed; nothing is left behind then.
-[[nodiscard]] bool WriteFileAtomically(const std::filesystem::path& path, std::string_view bytes);
+///
+/// With a folder, of the same file system, the bytes are first written there: a kill leaves nothing
+/// beside the file.
+[[nodiscard]] bool WriteFileAtomically(const std::filesystem::path& path, std::string_view bytes,
+                                       const std::filesystem::path& scratchFolder = {});
 
 /// The same for bytes that `write` puts on a stream, so that they never are in memory as a whole.
 [[nodiscard]] bool WriteFileAtomically(const std::filesystem::path& path,

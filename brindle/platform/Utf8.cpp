@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
-#include "cli/Utf8.h"
+#include "brindle/platform/Utf8.h"
 
 #include <array>
 
-namespace brindle::cli {
+namespace brindle {
 namespace {
 
 struct TLeadByte {
@@ -50,4 +50,4 @@ std::size_t Utf8Length(std::string_view text) {
     return 0;
 }
 
-}  // namespace brindle::cli
+}  // namespace brindle

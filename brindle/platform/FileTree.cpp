@@ -1,0 +1,144 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/platform/FileTree.h"
+
+#include "brindle/platform/AtomicFile.h"
+#include "brindle/platform/internal/WholeFiles.h"
+
+#include <fcntl.h>
+#include <pwd.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include <algorithm>
+#include <cstdio>
+#include <cstdlib>
+#include <string>
+
+namespace brindle {
+
+namespace fs = std::filesystem;
+
+namespace {
+
+constexpr mode_t kUsualFileRights = 0666;
+constexpr unsigned kUsualFolderRights = 0777;
+
+bool IsEntryName(std::string_view name) {
+    return !name.empty() && name != "." && name != ".." && name.find('/') == name.npos &&
+           name.find('\0') == name.npos;
+}
+
+bool WriteNewFile(const fs::path& path, std::string_view bytes) {
+    const int file = open(path.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, kUsualFileRights);
+    if (file < 0) return false;
+    const bool ok = WholeFiles::WriteAll(file, bytes) && fsync(file) == 0;
+    return close(file) == 0 && ok;
+}
+
+/// Fills a folder that is there and empty.
+bool FillFolder(const fs::path& folder, const FileNode& tree) {
+    for (const auto& [name, child] : tree.mChildren) {
+        const fs::path path = folder / name;
+        if (!IsEntryName(name)) return false;
+        if (child.mIsFolder) {
+            if (mkdir(path.c_str(), kUsualFolderRights) != 0 || !FillFolder(path, child)) {
+                return false;
+            }
+        } else if (!WriteNewFile(path, child.mContents)) {
+            return false;
+        }
+    }
+    WholeFiles::FlushFolder(folder);
+    return true;
+}
+
+/// Exchanges two folders in one step; false where the system cannot.
+bool Exchange(const fs::path& a, const fs::path& b) {
+#if defined(RENAME_EXCHANGE)
+    return renameat2(AT_FDCWD, a.c_str(), AT_FDCWD, b.c_str(), RENAME_EXCHANGE) == 0;
+#elif defined(RENAME_SWAP)
+    return renamex_np(a.c_str(), b.c_str(), RENAME_SWAP) == 0;
+#else
+    (void)a, (void)b;
+    return false;
+#endif
+}
+
+bool MoveAside(const fs::path& fresh, const fs::path& path) {
+    const fs::path aside = fresh.string() + ".old";
+    if (rename(path.c_str(), aside.c_str()) != 0) return false;
+    if (rename(fresh.c_str(), path.c_str()) == 0) {
+        return rename(aside.c_str(), fresh.c_str()) == 0;
+    }
+    (void)rename(aside.c_str(), path.c_str());
+    return false;
+}
+
+/// The folder itself for a path that ends with "/" or is a link to it.
+fs::path TargetOf(const fs::path& path) {
+    const fs::path named = path.has_filename() ? path : path.parent_path();
+    std::error_code error;
+    fs::path linked = fs::is_symlink(named, error) ? fs::canonical(named, error) : named;
+    return error ? named : linked;
+}
+
+/// Puts a folder to where it belongs; what stood there has its name then.
+bool PutInPlace(const fs::path& fresh, const fs::path& path) {
+    std::error_code ignored;
+    const fs::file_status status = fs::symlink_status(path, ignored);
+    if (!fs::exists(status)) return rename(fresh.c_str(), path.c_str()) == 0;
+    if (!fs::is_directory(status)) return false;
+    return Exchange(fresh, path) || MoveAside(fresh, path);
+}
+
+}  // namespace
+
+std::optional<FileNode> ReadFolder(const fs::path& path, std::uint64_t limit) {
+    std::error_code error;
+    fs::directory_iterator entries(path, error);
+    if (error) return std::nullopt;
+    FileNode root;
+    root.mIsFolder = true;
+    for (; entries != fs::directory_iterator(); entries.increment(error)) {
+        std::error_code ignored;
+        FileNode node;
+        node.mIsFolder = entries->is_directory(ignored);
+        if (!node.mIsFolder) {
+            if (!entries->is_regular_file(ignored)) continue;
+            auto bytes = ReadWholeFile(entries->path(), static_cast<std::size_t>(limit));
+            if (!bytes) continue;
+            limit -= bytes->size();
+            node.mContents = std::move(*bytes);
+        }
+        root.mChildren.emplace(entries->path().filename().string(), std::move(node));
+    }
+    return root;
+}
+
+bool WriteFolderAtomically(const fs::path& path, const FileNode& tree) {
+    if (!tree.mIsFolder) return false;
+    const fs::path target = TargetOf(path);
+    std::string beside = target.string() + ".XXXXXX";
+    if (mkdtemp(beside.data()) == nullptr) return false;
+    const bool ok = FillFolder(beside, tree) &&
+                    chmod(beside.c_str(), WholeFiles::RightsFor(target, kUsualFolderRights)) == 0 &&
+                    PutInPlace(beside, target);
+    // Now it is the old folder, or what could not be put in its place.
+    std::error_code ignored;
+    fs::remove_all(beside, ignored);
+    if (ok) WholeFiles::FlushFolder(target.parent_path());
+    return ok;
+}
+
+fs::path ExpandTilde(std::string_view path) {
+    if (path.empty() || path[0] != '~' || (path.size() > 1 && path[1] != '/')) return path;
+    const char* home = std::getenv("HOME");
+    if (home == nullptr || *home == '\0') {
+        const passwd* const user = getpwuid(getuid());
+        home = user == nullptr ? nullptr : user->pw_dir;
+    }
+    if (home == nullptr) return path;
+    return std::string(home).append(path.substr(1));
+}
+
+}  // namespace brindle
