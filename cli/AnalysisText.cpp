@@ -115,12 +115,7 @@ private:
         Write(table);
     }
 
-    void Write(const CTable& table) {
-        mText += "    " + mPaint.Faint(table.Head()) + '\n';
-        for (std::size_t row = 0; row < table.RowCount(); ++row) {
-            mText += "    " + table.Row(row) + '\n';
-        }
-    }
+    void Write(const CTable& table) { mText += table.Text(mPaint, "    "); }
 
     const CPaint& mPaint;
     CBars mBars;

@@ -68,9 +68,7 @@ std::string ChordsText(const std::vector<TReadChord>& chords, const CPaint& pain
                       SemitonesText(chord.mSemitones), fmt::format("{}", chord.mSemitones.Mask()),
                       HashCode(chord)});
     }
-    std::string text = paint.Faint(table.Head()) + '\n';
-    for (std::size_t row = 0; row < table.RowCount(); ++row) text += table.Row(row) + '\n';
-    return text;
+    return table.Text(paint);
 }
 
 TStatus Chord(const TChordOptions& options) {

@@ -94,9 +94,7 @@ std::string FunctionsText(const std::vector<TChordFunction>& functions, const CP
         table.AddRow({function.mSymbol, OrDash(function.mNumeral), OrDash(function.mLetters),
                       DegreeText(function.mRootDegree), DegreeText(function.mBassDegree)});
     }
-    std::string text = paint.Faint(table.Head()) + '\n';
-    for (std::size_t row = 0; row < table.RowCount(); ++row) text += table.Row(row) + '\n';
-    return text;
+    return table.Text(paint);
 }
 
 TStatus Function(const TFunctionOptions& options) {

@@ -183,9 +183,7 @@ std::string NamesText(const std::vector<TNamedNotes>& chords, const TNameOptions
                           std::string(BasicChordName(named.mBasicChord))});
         }
     }
-    std::string text = paint.Faint(table.Head()) + '\n';
-    for (std::size_t row = 0; row < table.RowCount(); ++row) text += table.Row(row) + '\n';
-    return text;
+    return table.Text(paint);
 }
 
 TStatus Name(const TNameOptions& options) {

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "cli/Table.h"
 
-#include "cli/Output.h"
+#include <fmt/format.h>
 
 #include <algorithm>
 #include <utility>
@@ -29,6 +29,12 @@ std::string CTable::Head() const {
 
 std::string CTable::Row(std::size_t row) const {
     return Line(mRows[row]);
+}
+
+std::string CTable::Text(const CPaint& paint, std::string_view margin) const {
+    std::string text = fmt::format("{}{}\n", margin, paint.Faint(Head()));
+    for (const auto& cells : mRows) text += fmt::format("{}{}\n", margin, Line(cells));
+    return text;
 }
 
 std::string CTable::Line(const std::vector<std::string>& cells) const {

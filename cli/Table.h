@@ -1,7 +1,10 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "cli/Output.h"
+
 #include <string>
+#include <string_view>
 #include <vector>
 
 namespace brindle::cli {
@@ -18,6 +21,8 @@ public:
     [[nodiscard]] std::string Head() const;
     [[nodiscard]] std::size_t RowCount() const { return mRows.size(); }
     [[nodiscard]] std::string Row(std::size_t row) const;
+    /// All lines behind a margin, the head faint.
+    [[nodiscard]] std::string Text(const CPaint& paint, std::string_view margin = {}) const;
 
 private:
     [[nodiscard]] std::string Line(const std::vector<std::string>& cells) const;

@@ -42,9 +42,7 @@ std::string TypesText(const CChordTypeVec& types, const CPaint& paint) {
         table.AddRow({fmt::format("{}", type.mId), type.mName,
                       fmt::format("{}", fmt::join(type.mIntvls, " ")), NameOnC(type)});
     }
-    std::string text = paint.Faint(table.Head()) + '\n';
-    for (std::size_t row = 0; row < table.RowCount(); ++row) text += table.Row(row) + '\n';
-    return text;
+    return table.Text(paint);
 }
 
 TStatus Types(const CFormatOptions& format) {
