@@ -4,6 +4,7 @@
 #include "cli/CommandLine.h"
 #include "cli/Input.h"
 #include "cli/KeyText.h"
+#include "cli/LeadSheet.h"
 #include "cli/Names.h"
 
 #include "brindle/analysis/CAnalyseHarmCenterAlternatives.h"
@@ -24,10 +25,12 @@ constexpr TCommandHelp kHelp{
     "  brindle analyse \"Dm7 G7 | C\"\n"
     "  brindle analyse --key \"A minor\" --readings \"Am Dm | E7 Am\"\n"
     "  brindle analyse --file song.txt --beats-per-bar 3 --format svg >song.svg\n"
+    "  brindle analyse song.musicxml --format svg >song.svg\n"
     "  cat song.txt | brindle analyse - --json\n"
     "\n"
     "A chord text has chord symbols between white space; | goes on to the next bar\n"
-    "line, and . holds the chord before it for one more step.\n",
+    "line, and . holds the chord before it for one more step. A score in MusicXML\n"
+    "(.musicxml, .xml, .mxl) is played through its repeats, endings and jumps.\n",
 };
 
 // A step or a bar this short or long is a slip of the finger.
@@ -39,6 +42,7 @@ struct TAnalyseOptions {
     std::string mFile;
     std::string mRoute = "tonic";
     std::string mKey;
+    std::string mTiming = "played";
     double mBeatsPerBar = 4.0;
     double mBeatsPerChord = 1.0;
     bool mReadings = false;
@@ -54,7 +58,7 @@ TAnalyse RouteOf(const std::string& name) {
 // What is wrong with options that are fine one by one.
 std::optional<std::string> Contradiction(const TAnalyseOptions& options) {
     if (options.mWords.empty() && options.mFile.empty()) {
-        return "a chord text is needed: a TEXT, --file PATH, or - for standard input";
+        return "a song is needed: a TEXT, a score, --file PATH, or - for standard input";
     }
     if (!options.mWords.empty() && !options.mFile.empty()) {
         return "a TEXT and --file PATH are two songs, one is needed";
@@ -69,22 +73,72 @@ std::optional<std::string> Contradiction(const TAnalyseOptions& options) {
     return std::nullopt;
 }
 
-std::string Present(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings,
-                    const CChordSymbols& symbols, const TAnalyseOptions& options) {
+/// A song that has been analysed, and what its presentations need beside that.
+struct TAnalysedSong {
+    CHarmonicAnalyse mAnalyse;
+    CHarmAnlsCenters mReadings;
+    std::optional<CChordSymbols> mSymbols;
+    std::optional<TMusicXMLDoc> mSheet;
+};
+
+TSong SongOf(const TAnalysedSong& analysed, const TAnalyseOptions& options) {
+    const CHarmAnlsCenters* readings = options.mReadings ? &analysed.mReadings : nullptr;
+    if (analysed.mSheet) {
+        return MakeSong(analysed.mAnalyse, readings, *analysed.mSymbols, *analysed.mSheet);
+    }
+    return MakeSong(analysed.mAnalyse, readings, *analysed.mSymbols, options.mBeatsPerBar);
+}
+
+std::string Present(const TAnalysedSong& analysed, const TAnalyseOptions& options) {
     switch (options.mFormat.Format()) {
         case TFormat::Json:
-            return AnalysisJson(analyse, readings, symbols);
+            return AnalysisJson(analysed.mAnalyse,
+                                options.mReadings ? &analysed.mReadings : nullptr,
+                                *analysed.mSymbols, analysed.mSheet ? &*analysed.mSheet : nullptr);
         case TFormat::Native: {
             std::ostringstream native;
-            analyse.AppendJSONString(native);
+            analysed.mAnalyse.AppendJSONString(native);
             return native.str();
         }
         case TFormat::Svg:
-            return AnalysisSvg(MakeSong(analyse, readings, symbols, options.mBeatsPerBar));
+            return AnalysisSvg(SongOf(analysed, options));
         case TFormat::Text:
             break;
     }
-    return AnalysisText(MakeSong(analyse, readings, symbols, options.mBeatsPerBar), CPaint());
+    return AnalysisText(SongOf(analysed, options), CPaint());
+}
+
+void AnalyseText(const TTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
+                 const TAnalyseOptions& options, TAnalysedSong& analysed) {
+    TChordStringParse parse;
+    parse.mBeatsPerBar = options.mBeatsPerBar;
+    parse.mBeatsPerChord = options.mBeatsPerChord;
+    parse.mChordNamePrefs = NamePrefs();
+    analysed.mAnalyse.AnalyseFromChordString(FoldAccidentals(typed.mText), signKeys,
+                                             RouteOf(options.mRoute), parse);
+    analysed.mSymbols.emplace(typed.mText, parse, analysed.mAnalyse.mChords);
+}
+
+TStatus AnalyseScore(const TTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
+                     const TAnalyseOptions& options, TAnalysedSong& analysed) {
+    analysed.mSheet =
+        ReadLeadSheet(typed, options.mTiming == "native" ? TTiming::Native : TTiming::Played);
+    if (!analysed.mSheet) return TStatus::BadInput;
+    TMusicXMLDoc& sheet = *analysed.mSheet;
+    const TFormat format = options.mFormat.Format();
+    if ((format == TFormat::Text || format == TFormat::Svg) && !HasTimes(sheet)) {
+        return Fail(
+            TStatus::BadInput,
+            fmt::format("{}: in this timing some chords have no length; --format json shows "
+                        "them",
+                        Printable(typed.mName)));
+    }
+    if (!signKeys.empty()) sheet.HarmSignKeys = signKeys;
+    CHarmonicAnalyse& analyse = analysed.mAnalyse;
+    analyse.AnalyseFromMusicXMLDoc(sheet, RouteOf(options.mRoute));
+    analyse.mChords = WithRests(analyse.mChords, sheet);
+    analysed.mSymbols.emplace(sheet, analyse.mChords);
+    return TStatus::Success;
 }
 
 TStatus Analyse(const TAnalyseOptions& options) {
@@ -103,23 +157,21 @@ TStatus Analyse(const TAnalyseOptions& options) {
         given.mSignKey = key.mSignKey;
         signKeys.push_back(given);
     }
-    const auto typed =
-        options.mFile.empty() ? TextFromWords(options.mWords) : ReadInput(options.mFile);
+    const auto typed = ReadTypedSong(options.mWords, options.mFile);
     if (!typed) return TStatus::BadInput;
 
-    TChordStringParse parse;
-    parse.mBeatsPerBar = options.mBeatsPerBar;
-    parse.mBeatsPerChord = options.mBeatsPerChord;
-    parse.mChordNamePrefs = NamePrefs();
-    CHarmonicAnalyse analyse;
-    analyse.AnalyseFromChordString(FoldAccidentals(*typed), signKeys, RouteOf(options.mRoute),
-                                   parse);
-    CHarmAnlsCenters readings;
-    if (options.mReadings) {
-        readings = CAnalyseHarmCenterAlternatives(analyse.mChords).BestResults();
+    TAnalysedSong analysed;
+    if (typed->mIsScore) {
+        const TStatus status = AnalyseScore(*typed, signKeys, options, analysed);
+        if (status != TStatus::Success) return status;
+    } else {
+        AnalyseText(*typed, signKeys, options, analysed);
     }
-    const CChordSymbols symbols(*typed, parse, analyse.mChords);
-    return Print(Present(analyse, options.mReadings ? &readings : nullptr, symbols, options));
+    if (options.mReadings) {
+        analysed.mReadings =
+            CAnalyseHarmCenterAlternatives(analysed.mAnalyse.mChords).BestResults();
+    }
+    return Print(Present(analysed, options));
 }
 
 }  // namespace
@@ -127,9 +179,11 @@ TStatus Analyse(const TAnalyseOptions& options) {
 void AddAnalyse(CLI::App& program, TStatus& status) {
     CLI::App& command = AddCommand(program, kHelp);
     const auto options = std::make_shared<TAnalyseOptions>();
-    command.add_option("TEXT", options->mWords, "Chord text; - reads standard input")
+    command
+        .add_option("TEXT", options->mWords,
+                    "Chord text, or the name of a score; - reads standard input")
         ->option_text("...");
-    command.add_option("--file", options->mFile, "Read the chord text from a file")
+    command.add_option("--file", options->mFile, "Read the chord text or the score from a file")
         ->option_text("PATH");
     AddChoice(command, "--route", options->mRoute, {"tonic", "cadence", "weights", "none"},
               "How centers are searched");
@@ -143,6 +197,8 @@ void AddAnalyse(CLI::App& program, TStatus& status) {
         .add_option("--beats-per-chord", options->mBeatsPerChord,
                     "Length of a chord in beats (default: 1)")
         ->option_text("BEATS");
+    AddChoice(command, "--timing", options->mTiming, {"played", "native"},
+              "How the chords of a score follow each other");
     command.add_flag("--readings", options->mReadings,
                      "Show all readings that progressions to a tonic allow");
     options->mFormat.AddTo(command, {"text", "json", "native", "svg"});

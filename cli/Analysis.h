@@ -15,10 +15,11 @@ class CChordSymbols;
 /// For people: a line for each sign key, under it its centers, under these their chords.
 [[nodiscard]] std::string AnalysisText(const TSong& song, const CPaint& paint);
 
-/// Strict JSON, see docs/json.md. `readings` may be null.
+/// Strict JSON, see docs/json.md. `readings` and `sheet` may be null.
 [[nodiscard]] std::string AnalysisJson(const CHarmonicAnalyse& analyse,
                                        const CHarmAnlsCenters* readings,
-                                       const CChordSymbols& symbols);
+                                       const CChordSymbols& symbols,
+                                       const TMusicXMLDoc* sheet = nullptr);
 
 /// A picture: chords along a time axis, bands for sign keys, centers and readings.
 [[nodiscard]] std::string AnalysisSvg(const TSong& song);

@@ -4,6 +4,9 @@
 #include "cli/ChordSymbols.h"
 #include "cli/Json.h"
 #include "cli/Names.h"
+#include "cli/Output.h"
+
+#include "brindle/musicxml/TMusicXMLDoc.h"
 
 namespace brindle::cli {
 namespace {
@@ -72,12 +75,40 @@ private:
     const CChordSymbols& mSymbols;
 };
 
+Json ScoreToJson(const TMusicXMLDoc& sheet) {
+    Json times = Json::array();
+    for (const TMusicXMLTimeSignature& time : sheet.TimeSignatures) {
+        times.push_back({{"Position", NumberToJson(time.mPosition)},
+                         {"Numerator", time.mNumerator},
+                         {"Denominator", time.mDenominator}});
+    }
+    Json sections = Json::array();
+    for (const CHarmSection& section : sheet.HarmSections) {
+        sections.push_back(
+            {{"Position", NumberToJson(section.mPosition)}, {"IsFirst", section.mIsFirst}});
+    }
+    Json copies = Json::array();
+    for (const CHarmCopy& copy : sheet.HarmCopies) {
+        copies.push_back({{"Position", NumberToJson(copy.mTargetPos)},
+                          {"SourceOffsetBars", copy.mSourceOffsetBars},
+                          {"LengthBars", copy.mLengthBars}});
+    }
+    Json bars = Json::array();
+    for (const CHarmBarline& barline : sheet.HarmBarlines) bars.push_back(barline.mPosition);
+    return {{"Title", Printable(sheet.Title)},
+            {"TimeSignatures", times},
+            {"Sections", sections},
+            {"Copies", copies},
+            {"Bars", bars}};
+}
+
 }  // namespace
 
 std::string AnalysisJson(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings,
-                         const CChordSymbols& symbols) {
+                         const CChordSymbols& symbols, const TMusicXMLDoc* sheet) {
     const CJsonMaker maker(symbols);
     Json json;
+    if (sheet != nullptr) json["Score"] = ScoreToJson(*sheet);
     json["HarmSignKeys"] = maker.List(analyse.mSignKeys);
     if (readings != nullptr) json["Readings"] = maker.List(*readings);
     return JsonText(json);

@@ -2,7 +2,8 @@
 // A song as a picture. Time runs from left to right and breaks into lines as text does. Each line
 // has, from above: the numbers of the bars, a band for the sign key, a band for the center, the
 // chords in boxes with their function or else their degree under them, and thin bands for the
-// readings. The color of a band is that of its key: neighbours on the circle of fifths have
+// readings. A score has its title above, and its times and rehearsal marks beside the numbers of
+// the bars. The color of a band is that of its key: neighbours on the circle of fifths have
 // neighbouring colors, and minor keys are darker.
 
 #include "cli/Analysis.h"
@@ -33,6 +34,13 @@ constexpr double kLineGap = 24.0;
 constexpr double kBandHeight = 18.0;
 constexpr double kChordHeight = 34.0;
 constexpr double kReadingHeight = 14.0;
+
+constexpr double kTitleHeight = 30.0;
+constexpr double kTitleSize = 18.0;
+// Right of a bar line, behind the number of the bar.
+constexpr double kSectionLeft = 22.0;
+constexpr double kSectionSize = 8.0;
+constexpr double kTimeLeft = 34.0;
 
 constexpr double kSymbolSize = 14.0;
 constexpr double kFunctionSize = 11.0;
@@ -126,6 +134,7 @@ public:
             return;
         }
         DrawBars();
+        DrawScore();
         DrawSignKeys();
         for (const TShownSignKey& signKey : song.mSignKeys) {
             for (const TShownCenter& center : signKey.mCenters) Draw(center);
@@ -148,7 +157,7 @@ public:
 
 private:
     [[nodiscard]] std::string Title() const {
-        std::string title = "Harmony";
+        std::string title = mSong.mScore.mTitle.empty() ? "Harmony" : mSong.mScore.mTitle;
         for (const TShownSignKey& signKey : mSong.mSignKeys) title += ", " + signKey.mName;
         return title;
     }
@@ -162,7 +171,7 @@ private:
                 lanes[segment.mLine] = std::max(lanes[segment.mLine], mLanes.LaneOf(i) + 1);
             }
         }
-        mBottom = kMargin;
+        mBottom = mSong.mScore.mTitle.empty() ? kMargin : kMargin + kTitleHeight;
         for (const std::size_t count : lanes) {
             mTops.push_back(mBottom);
             mBottom += kReadingsTop + static_cast<double>(count) * kReadingPitch + kLineGap;
@@ -182,6 +191,33 @@ private:
             const double right = kMargin + mAxis.Line(line).mRight;
             mSvg.Line(right, top + kBarNumberTop + 4, right, top + kFunctionTop, kBarLine);
         }
+    }
+
+    // The title above all, and beside the numbers of the bars the times and the rehearsal marks.
+    void DrawScore() {
+        const TShownScore& score = mSong.mScore;
+        if (!score.mTitle.empty()) {
+            mSvg.TextCut(kMargin, kMargin + kTitleSize, kLineWidth, score.mTitle,
+                         {.mSize = kTitleSize, .mColor = kInk, .mBold = true});
+        }
+        for (const TShownScore::TTime& time : score.mTimes) {
+            DrawMark(time.mPosition, [&](double x, double top) {
+                mSvg.Text(x + kTimeLeft, top + kBarNumberTop + 13, time.mName,
+                          {.mSize = kSmallSize, .mColor = kInk, .mBold = true});
+            });
+        }
+        for (const double section : score.mSections) {
+            DrawMark(section, [&](double x, double top) {
+                mSvg.Rect(x + kSectionLeft, top + kBarNumberTop + 5, kSectionSize, kSectionSize,
+                          kInk, "Rehearsal mark");
+            });
+        }
+    }
+
+    template <class TDraw>
+    void DrawMark(double position, const TDraw& draw) {
+        const auto segments = mAxis.SegmentsOf({position, mSong.mEnd});
+        if (!segments.empty()) draw(kMargin + segments[0].mLeft, mTops[segments[0].mLine]);
     }
 
     void DrawSignKeys() {

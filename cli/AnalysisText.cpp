@@ -27,7 +27,31 @@ std::string DistanceText(int distance) {
 
 class CTextWriter {
 public:
-    CTextWriter(const TSong& song, const CPaint& paint) : mPaint(paint), mBars(song.mBeatsPerBar) {}
+    CTextWriter(const TSong& song, const CPaint& paint)
+        : mPaint(paint), mBars(song.mBeatsPerBar, song.mBarStarts) {}
+
+    void WriteScore(const TSong& song) {
+        const TShownScore& score = song.mScore;
+        if (!score.mTitle.empty()) mText += mPaint.Strong(score.mTitle) + '\n';
+        if (song.mBarStarts.empty()) return;
+        if (!mText.empty()) mText += '\n';
+        std::string times;
+        for (const TShownScore::TTime& time : score.mTimes) {
+            Append(times, time.mName);
+            if (score.mTimes.size() > 1)
+                times += fmt::format(" from bar {}", mBars.BarOf(time.mPosition));
+        }
+        std::string sections;
+        for (const double section : score.mSections) {
+            Append(sections, fmt::format("{}", mBars.BarOf(section)));
+        }
+        WriteFact("bars", fmt::format("{}", song.mBarStarts.size()));
+        if (!times.empty()) WriteFact("time", times);
+        if (!sections.empty()) WriteFact("sections", "from bars " + sections);
+        for (const TShownScore::TCopy& copy : score.mCopies) {
+            WriteFact("copy", CopyText(copy));
+        }
+    }
 
     void Write(const TShownSignKey& signKey) {
         StartParagraph();
@@ -68,6 +92,26 @@ public:
     [[nodiscard]] std::string Text() && { return std::move(mText); }
 
 private:
+    static void Append(std::string& list, const std::string& element) {
+        if (!list.empty()) list += ", ";
+        list += element;
+    }
+
+    void WriteFact(std::string_view name, const std::string& fact) {
+        mText += mPaint.Faint(fmt::format("  {:<8}  ", name)) + fact + '\n';
+    }
+
+    // "bars 17 to 32 as bars 1 to 16"
+    [[nodiscard]] std::string CopyText(const TShownScore::TCopy& copy) const {
+        const auto bars = [&](double position) {
+            const long first = mBars.BarOf(position);
+            const long last = first + static_cast<long>(copy.mBarCount) - 1;
+            return last <= first ? fmt::format("bar {}", first)
+                                 : fmt::format("bars {} to {}", first, last);
+        };
+        return bars(copy.mBegin) + " as " + bars(copy.mSource);
+    }
+
     void StartParagraph() {
         if (!mText.empty()) mText += '\n';
     }
@@ -126,6 +170,7 @@ private:
 
 std::string AnalysisText(const TSong& song, const CPaint& paint) {
     CTextWriter writer(song, paint);
+    writer.WriteScore(song);
     for (const TShownSignKey& signKey : song.mSignKeys) writer.Write(signKey);
     writer.WriteLooseChords(song.mLooseChords);
     if (song.mHasReadings) writer.WriteReadings(song.mReadings);

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "cli/ChordSymbols.h"
 
+#include "cli/LeadSheet.h"
 #include "cli/Output.h"
 
 #include "brindle/analysis/ParseStringIntoHarmAnlsChords.h"
@@ -39,15 +40,32 @@ CChordSymbols::CChordSymbols(std::string_view text, const TChordStringParse& par
     const std::size_t count = std::min(tokens.size(), chords.size());
     for (std::size_t i = 0; i < count; ++i) {
         mPositions.push_back(chords[i].mPosition);
+        mChords.push_back(chords[i]);
         mSymbols.push_back(Printable(tokens[i]));
     }
 }
 
+CChordSymbols::CChordSymbols(const TMusicXMLDoc& sheet, const CHarmAnlsChords& chords) {
+    const std::size_t count = std::min(sheet.Harmonies.size(), chords.size());
+    for (std::size_t i = 0; i < count; ++i) {
+        mPositions.push_back(chords[i].mPosition);
+        mChords.push_back(chords[i]);
+        mSymbols.push_back(cli::SymbolOf(sheet.Harmonies[i]));
+    }
+}
+
+// Several chords may stand at one place.
 const std::string& CChordSymbols::SymbolOf(const CHarmAnlsChordWithPos& chord) const {
     static const std::string none;
-    const auto found = std::lower_bound(mPositions.begin(), mPositions.end(), chord.mPosition);
-    if (found == mPositions.end() || *found != chord.mPosition) return none;
-    return mSymbols[static_cast<std::size_t>(found - mPositions.begin())];
+    const auto [first, behind] =
+        std::equal_range(mPositions.begin(), mPositions.end(), chord.mPosition);
+    if (first == behind) return none;
+    const auto begin = static_cast<std::size_t>(first - mPositions.begin());
+    const auto end = static_cast<std::size_t>(behind - mPositions.begin());
+    for (std::size_t i = begin; i < end; ++i) {
+        if (mChords[i] == chord) return mSymbols[i];
+    }
+    return mSymbols[begin];
 }
 
 }  // namespace brindle::cli

@@ -9,7 +9,8 @@
 
 namespace brindle {
 struct TChordStringParse;
-}
+struct TMusicXMLDoc;
+}  // namespace brindle
 
 namespace brindle::cli {
 
@@ -21,12 +22,16 @@ public:
     CChordSymbols(std::string_view text, const TChordStringParse& parse,
                   const CHarmAnlsChords& chords);
 
+    /// `chords` are those of the score, with rests.
+    CChordSymbols(const TMusicXMLDoc& sheet, const CHarmAnlsChords& chords);
+
     /// Empty for the end marker and for a chord that does not come from the text.
     [[nodiscard]] const std::string& SymbolOf(const CHarmAnlsChordWithPos& chord) const;
 
 private:
-    // Ascending, and the symbol of each.
+    // Ascending, and the chord and the symbol of each.
     std::vector<double> mPositions;
+    std::vector<CChordLite> mChords;
     std::vector<std::string> mSymbols;
 };
 

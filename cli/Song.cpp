@@ -2,12 +2,19 @@
 #include "cli/Song.h"
 
 #include "cli/ChordSymbols.h"
+#include "cli/LeadSheet.h"
 #include "cli/Names.h"
+#include "cli/Output.h"
+
+#include <fmt/format.h>
 
 #include <algorithm>
+#include <utility>
 
 namespace brindle::cli {
 namespace {
+
+constexpr double kUsualBeatsPerBar = 4.0;
 
 class CSongMaker {
 public:
@@ -23,11 +30,14 @@ public:
         shown.mProbability = center.mProbability;
         for (const CHarmAnlsChordWithPos& chord : center.mChords) {
             // A center that was put together from several readings holds a chord once for each.
-            const bool isRepeated =
-                !shown.mChords.empty() && shown.mChords.back().mRange.mBegin == chord.mPosition;
-            if (isRepeated || chord.mPosition >= End()) continue;
-            shown.mChords.push_back(Show(chord));
-            shown.mChords.back().mNumeral = NumeralOf(chord, center.mHarmCenter);
+            if (chord.mPosition >= End()) continue;
+            TShownChord next = Show(chord);
+            const bool isRepeated = !shown.mChords.empty() &&
+                                    shown.mChords.back().mRange.mBegin == next.mRange.mBegin &&
+                                    shown.mChords.back().mSymbol == next.mSymbol;
+            if (isRepeated) continue;
+            next.mNumeral = NumeralOf(chord, center.mHarmCenter);
+            shown.mChords.push_back(std::move(next));
         }
         if (shown.mChords.empty()) {
             const double begin = std::clamp(center.mPosition, 0.0, End());
@@ -49,7 +59,8 @@ public:
         return shown;
     }
 
-    /// The chords of the text that no center of the song holds.
+    /// The chords of the text that no center of the song holds; a sign that no chord sounds is
+    /// none.
     [[nodiscard]] std::vector<TShownChord> LooseChords(const TSong& song) const {
         std::vector<double> held;
         ForEachChord(song, [&](const TShownChord& chord) { held.push_back(chord.mRange.mBegin); });
@@ -57,19 +68,24 @@ public:
         std::vector<TShownChord> loose;
         for (const CHarmAnlsChordWithPos& chord : mChords) {
             if (chord.mPosition >= End()) break;
-            if (!std::binary_search(held.begin(), held.end(), chord.mPosition)) {
-                loose.push_back(Show(chord));
-            }
+            if (std::binary_search(held.begin(), held.end(), chord.mPosition)) continue;
+            TShownChord shown = Show(chord);
+            if (shown.mSymbol != kNoChordSymbol) loose.push_back(std::move(shown));
         }
         return loose;
     }
 
 private:
+    // Of several chords at one place the last one sounds.
     [[nodiscard]] TShownChord Show(const CHarmAnlsChordWithPos& chord) const {
         const auto next = std::upper_bound(
             mChords.begin(), mChords.end(), chord.mPosition,
             [](double position, const auto& other) { return position < other.mPosition; });
-        const double end = next == mChords.end() ? End() : next->mPosition;
+        double end = next == mChords.end() ? End() : next->mPosition;
+        const bool isAnother = next != mChords.begin() &&
+                               (next - 1)->mPosition == chord.mPosition &&
+                               mSymbols.SymbolOf(*(next - 1)) != mSymbols.SymbolOf(chord);
+        if (isAnother) end = chord.mPosition;
         return {{chord.mPosition, end},
                 mSymbols.SymbolOf(chord),
                 chord.mRootDistToHarmCenter,
@@ -81,7 +97,53 @@ private:
     const CChordSymbols& mSymbols;
 };
 
+std::string TimeName(const TMusicXMLTimeSignature& time) {
+    return fmt::format("{}/{}", time.mNumerator, time.mDenominator);
+}
+
+TShownScore ScoreOf(const TMusicXMLDoc& sheet) {
+    TShownScore score;
+    score.mTitle = Printable(sheet.Title);
+    for (const auto& time : sheet.TimeSignatures) {
+        score.mTimes.push_back({time.mPosition, TimeName(time)});
+    }
+    for (const CHarmSection& section : sheet.HarmSections) {
+        score.mSections.push_back(section.mPosition);
+    }
+    // A reading that tells no bar lines tells the places of its copies in another way.
+    const auto& bars = sheet.HarmBarlines;
+    for (const CHarmCopy& copy : sheet.HarmCopies) {
+        const auto bar = std::lower_bound(
+            bars.begin(), bars.end(), copy.mTargetPos,
+            [](const CHarmBarline& line, double position) { return line.mPosition < position; });
+        const auto source = (bar - bars.begin()) + copy.mSourceOffsetBars;
+        if (bar == bars.end() || source < 0 || copy.mSourceOffsetBars >= 0) continue;
+        score.mCopies.push_back({copy.mTargetPos, bars[static_cast<std::size_t>(source)].mPosition,
+                                 static_cast<std::size_t>(copy.mLengthBars)});
+    }
+    return score;
+}
+
+// The length of the bars of a score whose bar lines are not known.
+double FirstBarLength(const TMusicXMLDoc& sheet) {
+    if (sheet.TimeSignatures.empty()) return kUsualBeatsPerBar;
+    const TMusicXMLTimeSignature& time = sheet.TimeSignatures.front();
+    if (time.mNumerator < 1 || time.mDenominator < 1) return kUsualBeatsPerBar;
+    const double length = 4.0 * time.mNumerator / time.mDenominator;
+    return length >= 1.0 / 64 && length <= 1024.0 ? length : kUsualBeatsPerBar;
+}
+
 }  // namespace
+
+TSong MakeSong(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings,
+               const CChordSymbols& symbols, const TMusicXMLDoc& sheet) {
+    TSong song = MakeSong(analyse, readings, symbols, FirstBarLength(sheet));
+    song.mScore = ScoreOf(sheet);
+    for (const CHarmBarline& barline : sheet.HarmBarlines) {
+        song.mBarStarts.push_back(barline.mPosition);
+    }
+    return song;
+}
 
 TSong MakeSong(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings,
                const CChordSymbols& symbols, double beatsPerBar) {

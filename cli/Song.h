@@ -4,8 +4,13 @@
 #include "brindle/analysis/CHarmAnlsCenters.h"
 #include "brindle/analysis/CHarmonicAnalyse.h"
 
+#include <cstddef>
 #include <string>
 #include <vector>
+
+namespace brindle {
+struct TMusicXMLDoc;
+}
 
 namespace brindle::cli {
 
@@ -45,11 +50,34 @@ struct TShownSignKey {
     std::vector<TShownCenter> mCenters;
 };
 
+/// What a score tells beside its chords.
+struct TShownScore {
+    std::string mTitle;
+    /// "6/8", where it begins to hold.
+    struct TTime {
+        double mPosition = 0.0;
+        std::string mName;
+    };
+    std::vector<TTime> mTimes;
+    /// Rehearsal marks.
+    std::vector<double> mSections;
+    /// Passages that are played again: the bars from `mBegin` are those from `mSource`.
+    struct TCopy {
+        double mBegin = 0.0;
+        double mSource = 0.0;
+        std::size_t mBarCount = 0;
+    };
+    std::vector<TCopy> mCopies;
+};
+
 /// An analysis prepared for the eye: named, with the length of each chord, each chord once, and
 /// without the end marker.
 struct TSong {
     double mBeatsPerBar = 4.0;
+    /// Where the bars of a score begin; empty where all bars are equal.
+    std::vector<double> mBarStarts;
     double mEnd = 0.0;
+    TShownScore mScore;
     std::vector<TShownSignKey> mSignKeys;
     /// Chords of the text that stand in no center.
     std::vector<TShownChord> mLooseChords;
@@ -71,5 +99,9 @@ void ForEachChord(const TSong& song, const TFunction& function) {
 /// `readings` may be null.
 [[nodiscard]] TSong MakeSong(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings,
                              const CChordSymbols& symbols, double beatsPerBar);
+
+/// The same for the chords of a score.
+[[nodiscard]] TSong MakeSong(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings,
+                             const CChordSymbols& symbols, const TMusicXMLDoc& sheet);
 
 }  // namespace brindle::cli

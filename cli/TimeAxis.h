@@ -40,10 +40,15 @@ public:
     [[nodiscard]] std::vector<TBarLine> BarLines(std::size_t line) const;
 
 private:
+    [[nodiscard]] double StartOf(std::size_t line) const;
+    [[nodiscard]] std::vector<TBarLine> EqualBarLines(std::size_t line) const;
+
     double mEnd;
     double mBeatsPerBar;
     double mLineWidth;
     double mBeatsPerLine;
+    std::vector<double> mBarStarts;   // empty where all bars are equal
+    std::vector<double> mLineStarts;  // likewise
     std::size_t mLineCount;
 };
 

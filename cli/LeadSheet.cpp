@@ -1,0 +1,195 @@
+// SPDX-License-Identifier: MIT
+#include "cli/LeadSheet.h"
+
+#include "cli/Input.h"
+#include "cli/Names.h"
+#include "cli/Output.h"
+
+#include "brindle/chords/CChordHeavy.h"
+#include "brindle/chords/CChordLite.h"
+#include "brindle/musicxml/CChordSetFromMusicXml.h"
+#include "brindle/musicxml/ScoreContainer.h"
+#include "brindle/platform/Error.h"
+#include "brindle/theory/CChordNamePrefs.h"
+
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <array>
+#include <cmath>
+
+namespace brindle::cli {
+namespace {
+
+struct TSuffix {
+    std::string_view mKind;
+    std::string_view mSuffix;
+};
+
+// What lead sheets print behind the root for each kind of chord.
+constexpr auto kSuffixes = std::to_array<TSuffix>({
+    {"major", ""},
+    {"minor", "m"},
+    {"augmented", "aug"},
+    {"diminished", "dim"},
+    {"dominant", "7"},
+    {"major-seventh", "maj7"},
+    {"minor-seventh", "m7"},
+    {"diminished-seventh", "dim7"},
+    {"augmented-seventh", "7#5"},
+    {"half-diminished", "m7b5"},
+    {"major-minor", "mmaj7"},
+    {"major-sixth", "6"},
+    {"minor-sixth", "m6"},
+    {"dominant-ninth", "9"},
+    {"major-ninth", "maj9"},
+    {"minor-ninth", "m9"},
+    {"dominant-11th", "11"},
+    {"major-11th", "maj11"},
+    {"minor-11th", "m11"},
+    {"dominant-13th", "13"},
+    {"major-13th", "maj13"},
+    {"minor-13th", "m13"},
+    {"suspended-second", "sus2"},
+    {"suspended-fourth", "sus4"},
+    {"power", "5"},
+});
+
+std::string DegreeText(const TMusicXMLDegree& degree) {
+    std::string text;
+    if (degree.mType == "subtract") return "no" + degree.mValue;
+    if (degree.mType == "add" && degree.mAlter == 0) text = "add";
+    if (degree.mAlter < 0) text = "b";
+    if (degree.mAlter > 0) text = "#";
+    return text + degree.mValue;
+}
+
+// As it is printed; empty for a kind that lead sheets have no sign for.
+std::string PrintedSymbol(const TMusicXMLHarmony& harmony) {
+    const auto row = std::find_if(kSuffixes.begin(), kSuffixes.end(), [&](const TSuffix& suffix) {
+        return suffix.mKind == harmony.mKind;
+    });
+    if (row == kSuffixes.end()) return {};
+    std::string symbol = KeyName(harmony.mRoot.ToKeyEnh(NamePrefs()));
+    symbol += row->mSuffix;
+    for (const TMusicXMLDegree& degree : harmony.mDegrees) symbol += DegreeText(degree);
+    const CKeyEnh bass = harmony.mBass.ToKeyEnh(NamePrefs());
+    if (!bass.IsUndef()) symbol += '/' + KeyName(bass);
+    return symbol;
+}
+
+std::string_view LastDot(std::string_view name) {
+    const std::size_t dot = name.rfind('.');
+    return dot == name.npos ? std::string_view() : name.substr(dot);
+}
+
+bool HasScoreName(std::string_view name) {
+    std::string ending(LastDot(name));
+    std::transform(ending.begin(), ending.end(), ending.begin(), [](char c) {
+        return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
+    });
+    return ending == ".musicxml" || ending == ".xml" || ending == ".mxl";
+}
+
+// No chord text begins with a tag, a mark of the byte order, or the letters of a zip archive and
+// what follows them.
+bool HasScoreBytes(std::string_view bytes) {
+    for (const std::string_view mark : {"\xEF\xBB\xBF", "\xFF\xFE", "\xFE\xFF"}) {
+        if (bytes.substr(0, mark.size()) == mark) bytes.remove_prefix(mark.size());
+    }
+    const std::size_t first = bytes.find_first_not_of(std::string_view(" \t\r\n\0", 5));
+    return bytes.substr(0, 4) == "PK\x03\x04" || (first != bytes.npos && bytes[first] == '<');
+}
+
+std::optional<TMusicXMLDoc> Unreadable(const TTypedSong& song, std::string_view reason) {
+    Fail(TStatus::BadInput, fmt::format("{}: {}", Printable(song.mName), Printable(reason)));
+    return std::nullopt;
+}
+
+// The library tells only that it cannot read a plain score; the other reading tells why.
+std::string FaultOf(std::string_view bytes) {
+    Error error;
+    if (TMusicXMLDoc().LoadAsPlayedFromBytes(bytes, &error)) return "the score cannot be laid out";
+    return error.description;
+}
+
+}  // namespace
+
+std::optional<TTypedSong> ReadTypedSong(const std::vector<std::string>& words,
+                                        const std::string& file) {
+    TTypedSong song;
+    song.mName = file;
+    if (file.empty() && words.size() == 1 && (words[0] == "-" || HasScoreName(words[0]))) {
+        song.mName = words[0];
+    }
+    auto text = song.mName.empty() ? TextFromWords(words) : ReadInput(song.mName);
+    if (!text) return std::nullopt;
+    song.mText = std::move(*text);
+    song.mIsScore = !song.mName.empty() && (HasScoreName(song.mName) || HasScoreBytes(song.mText));
+    if (song.mName == "-") song.mName = "standard input";
+    return song;
+}
+
+std::optional<TMusicXMLDoc> ReadLeadSheet(const TTypedSong& song, TTiming timing) {
+    TMusicXMLDoc sheet;
+    if (timing == TTiming::Played) {
+        Error error;
+        if (!sheet.LoadAsPlayedFromBytes(song.mText, &error)) {
+            return Unreadable(song, error.description);
+        }
+        return sheet;
+    }
+    std::optional<std::string> unpacked;
+    if (IsScoreContainer(song.mText)) {
+        unpacked = ScoreInContainer(song.mText);
+        if (!unpacked) return Unreadable(song, FaultOf(song.mText));
+    }
+    const std::string& bytes = unpacked ? *unpacked : song.mText;
+    if (!sheet.LoadFromMusicXML(bytes)) return Unreadable(song, FaultOf(bytes));
+    return sheet;
+}
+
+bool HasTimes(const TMusicXMLDoc& sheet) {
+    return std::all_of(sheet.Harmonies.begin(), sheet.Harmonies.end(), [](const auto& harmony) {
+        return harmony.mPosition >= 0.0 && harmony.mDuration >= 0.0 &&
+               harmony.mPosition + harmony.mDuration < 1e9;
+    });
+}
+
+double EndOf(const TMusicXMLDoc& sheet) {
+    if (sheet.Harmonies.empty()) return 0.0;
+    return sheet.Harmonies.back().mPosition + sheet.Harmonies.back().mDuration;
+}
+
+CHarmAnlsChords WithRests(const CHarmAnlsChords& chords, const TMusicXMLDoc& sheet) {
+    CHarmAnlsChords all;
+    auto chord = chords.begin();
+    for (const TMusicXMLHarmony& harmony : sheet.Harmonies) {
+        if (IsNoChord(harmony)) {
+            all.push_back(CHarmAnlsChordWithPos(CHarmAnlsChord(), harmony.mPosition));
+        } else if (chord != chords.end()) {
+            all.push_back(*chord++);
+        }
+    }
+    if (!all.empty()) all.push_back(CHarmAnlsChordWithPos(CHarmAnlsChord(), EndOf(sheet)));
+    return all;
+}
+
+bool IsNoChord(const TMusicXMLHarmony& harmony) {
+    return harmony.mRoot.mStep == kNoChordSymbol || harmony.mKind == "none";
+}
+
+std::string SymbolOf(const TMusicXMLHarmony& harmony) {
+    if (IsNoChord(harmony)) return std::string(kNoChordSymbol);
+    const CChordHeavy heavy = CChordSetFromMusicXml(harmony, 24, NamePrefs());
+    if (heavy.RootKeyEnh().IsUndef()) return "?";
+    CChordLite chord;
+    chord.SetFromChordHeavy(heavy);
+    std::string printed = PrintedSymbol(harmony);
+    if (!printed.empty() && CChordLite(printed, NamePrefs()) == chord) return printed;
+    std::string name = heavy.NameWithSlash(NamePrefs());
+    if (printed.empty() || CChordLite(name, NamePrefs()) == chord) return Printable(name);
+    return Printable(printed);
+}
+
+}  // namespace brindle::cli
