@@ -172,7 +172,7 @@ TEST_CASE("A printed chord type is read back as the same chord, but for those li
     for (const CChordNamePrefs& style : ReadableStyles()) {
         for (const CChordNamePrefs& prefs : Variants(style)) {
             for (const CKeyEnh& root : SpelledRoots()) {
-                for (const CChordType& type : CChordTypes().BuiltIn()) {
+                for (const CChordType& type : _s_chordTypes().BuiltIn()) {
                     check.Check(type, root, prefs);
                 }
             }
