@@ -48,12 +48,11 @@ private:
 /// `scratch` is the path with whose name, and some letters behind it, the bytes are first written.
 template <class WriteBytes>
 bool ReplaceFile(const std::filesystem::path& path, const std::filesystem::path& scratch,
-                 WriteBytes writeBytes) {
+                 mode_t rights, WriteBytes writeBytes) {
     std::string beside = scratch.string() + ".XXXXXX";
     const int file = mkostemp(beside.data(), O_CLOEXEC);
     if (file < 0) return false;
-    bool ok = fchmod(file, WholeFiles::RightsFor(path, 0666)) == 0 && writeBytes(file) &&
-              fsync(file) == 0;
+    bool ok = fchmod(file, rights) == 0 && writeBytes(file) && fsync(file) == 0;
     ok = close(file) == 0 && ok;
     ok = ok && rename(beside.c_str(), path.c_str()) == 0;
     if (!ok) {
@@ -70,13 +69,18 @@ bool WriteFileAtomically(const std::filesystem::path& path, std::string_view byt
                          const std::filesystem::path& scratchFolder) {
     const std::filesystem::path scratch =
         scratchFolder.empty() ? path : scratchFolder / path.filename();
-    return ReplaceFile(path, scratch,
+    return ReplaceFile(path, scratch, WholeFiles::RightsFor(path, 0666),
+                       [bytes](int file) { return WholeFiles::WriteAll(file, bytes); });
+}
+
+bool WritePrivateFileAtomically(const std::filesystem::path& path, std::string_view bytes) {
+    return ReplaceFile(path, path, 0600,
                        [bytes](int file) { return WholeFiles::WriteAll(file, bytes); });
 }
 
 bool WriteFileAtomically(const std::filesystem::path& path,
                          const std::function<void(std::ostream&)>& write) {
-    return ReplaceFile(path, path, [&write](int file) {
+    return ReplaceFile(path, path, WholeFiles::RightsFor(path, 0666), [&write](int file) {
         CFileBuffer buffer(file);
         std::ostream stream(&buffer);
         write(stream);

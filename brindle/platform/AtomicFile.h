@@ -23,6 +23,11 @@ namespace brindle {
 [[nodiscard]] bool WriteFileAtomically(const std::filesystem::path& path,
                                        const std::function<void(std::ostream&)>& write);
 
+/// The same for a file that only its owner may read and write. A link at `path` is replaced and not
+/// followed.
+[[nodiscard]] bool WritePrivateFileAtomically(const std::filesystem::path& path,
+                                              std::string_view bytes);
+
 /// The whole file, or nothing when it cannot be read or is larger than `limit` bytes.
 [[nodiscard]] std::optional<std::string> ReadWholeFile(const std::filesystem::path& path,
                                                        std::size_t limit = std::size_t{2} << 30);

@@ -129,15 +129,17 @@ XmlNode XmlNode::firstDescendant(std::string_view name) const {
     return node;
 }
 
-bool XmlNode::addCopyOf(const XmlNode& element, std::size_t& room) {
-    if (mNode == nullptr || element.mNode == nullptr) return false;
+XmlNode XmlNode::addCopyOf(const XmlNode& element, std::size_t& room) {
+    if (mNode == nullptr || element.mNode == nullptr || room == 0) return {};
     const std::size_t size = SizeOf(element.mNode, room);
-    if (size > room) return false;
+    if (size > room) {
+        room = 0;
+        return {};
+    }
     const xmlNodePtr copy = xmlDocCopyNode(element.mNode, mNode->doc, 1);
     if (copy == nullptr) throw std::bad_alloc();
-    xmlAddChild(mNode, copy);
     room -= size;
-    return true;
+    return XmlNode(xmlAddChild(mNode, copy));
 }
 
 int XmlNode::line() const {

@@ -47,8 +47,9 @@ public:
     [[nodiscard]] std::vector<XmlNode> descendants(std::string_view name) const;
     [[nodiscard]] XmlNode firstDescendant(std::string_view name) const;
     /// Adds a copy of the element, with all below it, as last child. Its nodes and the bytes of its
-    /// texts are subtracted from `room`; nothing is added when they are more than that.
-    bool addCopyOf(const XmlNode& element, std::size_t& room);
+    /// texts are subtracted from `room`; when they are more, `room` is used up and
+    /// nothing is added. Gives the copy.
+    XmlNode addCopyOf(const XmlNode& element, std::size_t& room);
     /// Line of the element in the text, from 1.
     [[nodiscard]] int line() const;
 

@@ -23,6 +23,15 @@ xmlParserCtxtPtr ContextOf(void* context) {
     return static_cast<xmlParserCtxtPtr>(context);
 }
 
+// A streaming parse makes a document for the entities that are defined inside.
+struct TContextEnd {
+    void operator()(xmlParserCtxtPtr context) const {
+        xmlFreeDoc(context->myDoc);
+        context->myDoc = nullptr;
+        xmlFreeParserCtxt(context);
+    }
+};
+
 }  // namespace
 
 std::pair<std::string_view, std::string_view> XmlAttributes::At(int n) const {
@@ -45,29 +54,46 @@ struct XmlStreamParser::Callbacks {
         return *static_cast<XmlStreamParser*>(ContextOf(context)->_private);
     }
 
+    // No exception may pass the C library: it waits until the parse has been stopped.
+    template <class Step>
+    static void Guarded(void* context, Step step) {
+        XmlStreamParser& self = Self(context);
+        if (self.mThrown) return;
+        try {
+            step(self);
+        } catch (...) {
+            self.mThrown = std::current_exception();
+            xmlStopParser(ContextOf(context));
+        }
+    }
+
     static void StartElement(void* context, const xmlChar* name, const xmlChar*, const xmlChar*,
                              int, const xmlChar**, int attributeCount, int,
                              const xmlChar** attributes) {
-        XmlStreamParser& self = Self(context);
-        self.Deliver();
-        if (self.mDelegate == nullptr) return;
-        self.mDelegate->didStartElement(self, TextOf(name), {attributes, attributeCount});
+        Guarded(context, [&](XmlStreamParser& self) {
+            self.Deliver();
+            if (self.mDelegate == nullptr) return;
+            self.mDelegate->didStartElement(self, TextOf(name), {attributes, attributeCount});
+        });
     }
 
     static void EndElement(void* context, const xmlChar* name, const xmlChar*, const xmlChar*) {
-        XmlStreamParser& self = Self(context);
-        self.Deliver();
-        if (self.mDelegate != nullptr) self.mDelegate->didEndElement(self, TextOf(name));
+        Guarded(context, [&](XmlStreamParser& self) {
+            self.Deliver();
+            if (self.mDelegate != nullptr) self.mDelegate->didEndElement(self, TextOf(name));
+        });
     }
 
     static void Characters(void* context, const xmlChar* text, int length) {
-        XmlStreamParser& self = Self(context);
-        self.mText.append(reinterpret_cast<const char*>(text), static_cast<std::size_t>(length));
-        if (self.mText.size() <= kXmlMaxTextLength) return;
-        self.Fail(
-            {XML_ERR_INTERNAL_ERROR, "text too long", self.lineNumber(), self.columnNumber()});
-        self.mText.clear();
-        xmlStopParser(ContextOf(context));
+        Guarded(context, [&](XmlStreamParser& self) {
+            const auto size = static_cast<std::size_t>(length);
+            self.mText.append(reinterpret_cast<const char*>(text), size);
+            if (self.mText.size() <= kXmlMaxTextLength) return;
+            self.Fail(
+                {XML_ERR_INTERNAL_ERROR, "text too long", self.lineNumber(), self.columnNumber()});
+            self.mText.clear();
+            xmlStopParser(ContextOf(context));
+        });
     }
 
     // Only the first fault is kept, and only one that makes the text not well-formed.
@@ -99,6 +125,7 @@ int XmlStreamParser::columnNumber() const {
 
 bool XmlStreamParser::parse(std::string_view bytes) {
     mError.reset();
+    mThrown = nullptr;
     mText.clear();
     if (bytes.empty() || bytes.size() > std::numeric_limits<int>::max()) {
         mError = {XML_ERR_DOCUMENT_EMPTY, bytes.empty() ? "Document is empty" : "Document too long",
@@ -106,8 +133,8 @@ bool XmlStreamParser::parse(std::string_view bytes) {
         if (mDelegate != nullptr) mDelegate->parseErrorOccurred(*this, *mError);
         return false;
     }
-    const std::unique_ptr<xmlParserCtxt, decltype(&xmlFreeParserCtxt)> context(
-        xmlCreateMemoryParserCtxt(bytes.data(), static_cast<int>(bytes.size())), xmlFreeParserCtxt);
+    const std::unique_ptr<xmlParserCtxt, TContextEnd> context(
+        xmlCreateMemoryParserCtxt(bytes.data(), static_cast<int>(bytes.size())));
     if (!context) throw std::bad_alloc();
     xmlCtxtUseOptions(context.get(), xml::kOptions);
     xmlSAXHandler& handler = *context->sax;
@@ -125,6 +152,7 @@ bool XmlStreamParser::parse(std::string_view bytes) {
 
     if (mDelegate != nullptr) mDelegate->didStartDocument(*this);
     xmlParseDocument(context.get());
+    if (mThrown) std::rethrow_exception(std::exchange(mThrown, nullptr));
     if (context->wellFormed == 0) Fail({XML_ERR_INTERNAL_ERROR, "not well-formed", 0, 0});
     if (mDelegate != nullptr) {
         if (mError) {
@@ -134,8 +162,6 @@ bool XmlStreamParser::parse(std::string_view bytes) {
         }
     }
     mContext = nullptr;
-    if (context->myDoc != nullptr) xmlFreeDoc(context->myDoc);
-    context->myDoc = nullptr;
     return !mError;
 }
 

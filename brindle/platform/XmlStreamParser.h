@@ -4,6 +4,7 @@
 #include "brindle/platform/XmlError.h"
 
 #include <cstddef>
+#include <exception>
 #include <memory>
 #include <optional>
 #include <string>
@@ -70,7 +71,7 @@ public:
     [[nodiscard]] XmlStreamDelegate* delegate() const { return mDelegate; }
 
     /// True when the text is well-formed; else parserError tells the first fault. Events before the
-    /// fault have been delivered.
+    /// fault have been delivered. What the delegate throws ends the parse and is passed on.
     bool parse(std::string_view bytes);
 
     [[nodiscard]] const std::optional<XmlError>& parserError() const { return mError; }
@@ -85,8 +86,9 @@ private:
     void Fail(XmlError error);
 
     XmlStreamDelegate* mDelegate = nullptr;
-    void* mContext = nullptr;  // of the parse that runs
-    std::string mText;         // gathered since the last tag
+    void* mContext = nullptr;    // of the parse that runs
+    std::string mText;           // gathered since the last tag
+    std::exception_ptr mThrown;  // by the delegate
     std::optional<XmlError> mError;
 };
 

@@ -1,0 +1,69 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/musicxml/CMuxmlNote.h"
+
+#include <compare>
+#include <cstddef>
+#include <list>
+#include <map>
+#include <vector>
+
+namespace brindle {
+
+/// A chain of tied notes that has not ended yet.
+struct CTiePendingInfo {
+    std::int32_t mStaff = 0;
+    std::int32_t mVoice = 0;
+    CMuxmlPitch mPitch;
+    std::int32_t mPendingLengthAsDuration = 0;
+    std::int32_t mPendingLengthAsMidiTicks = 0;
+    std::vector<XmlNode> mNoteXMLs;
+    std::vector<CMuxmlNote> mNotes;  ///< the first one first
+
+    /// Makes the closing note of the chain stand for the whole: it becomes the first note, but
+    /// keeps its own place and length, and the longer of both graphical types. The lyrics of the
+    /// chain are copied below the element of the note, as long as there is `room` for them, which
+    /// is used up.
+    void TransferRelevantObjectsToLastNote(CMuxmlNote& note, std::size_t& room) const;
+};
+
+/// The chains of tied notes that are open while a part is read. Notes belong to one chain when
+/// staff, voice and written pitch are the same.
+///
+/// Several chains may be open on one pitch; only the one that was opened first is ever asked for.
+/// They are therefore kept by pitch, in their order of opening, so that a file in which no tie ends
+/// does not become slow.
+class CTiePendingInfos {
+public:
+    /// Opens a chain.
+    void StartEncounteredFor(const CMuxmlNote& note, std::int32_t ticks);
+    /// Adds the note to its chain, if there is one.
+    void ContinueEncounteredFor(const CMuxmlNote& note, std::int32_t ticks);
+    /// The chain of the note; null when there is none.
+    [[nodiscard]] const CTiePendingInfo* PendingDurationFor(const CMuxmlNote& note) const;
+    [[nodiscard]] CTiePendingInfo* PendingDurationFor(const CMuxmlNote& note);
+    /// Forgets the chain of the note, if there is one.
+    void StopEncounteredFor(const CMuxmlNote& note);
+
+    [[nodiscard]] std::size_t size() const { return mCount; }
+    [[nodiscard]] bool empty() const { return mCount == 0; }
+
+private:
+    struct TKey {
+        std::int32_t mStaff;
+        std::int32_t mVoice;
+        TMuxmlEnum_Step mStep;
+        float mAlteration;
+        std::int32_t mOctave;
+
+        friend auto operator<=>(const TKey&, const TKey&) = default;
+    };
+
+    static TKey KeyOf(const CMuxmlNote& note);
+
+    std::map<TKey, std::list<CTiePendingInfo>> mInfos;  ///< no list is empty
+    std::size_t mCount = 0;
+};
+
+}  // namespace brindle

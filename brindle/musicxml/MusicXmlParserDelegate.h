@@ -1,0 +1,71 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/musicxml/CMuxmlClef.h"
+#include "brindle/musicxml/CMuxmlMeasure.h"
+#include "brindle/musicxml/CMuxmlNote.h"
+#include "brindle/musicxml/CMuxmlPart.h"
+#include "brindle/musicxml/CMuxmlPartGatheredInfo.h"
+#include "brindle/musicxml/CMuxmlSignKey.h"
+#include "brindle/musicxml/CMuxmlSignTime.h"
+#include "brindle/musicxml/CMuxmlTranspose.h"
+#include "brindle/musicxml/CPositionedXMLElement.h"
+
+#include <cstdint>
+#include <functional>
+#include <string_view>
+
+namespace brindle {
+
+/// How much there is to import.
+struct TMuxmlProgressBarInfo {
+    std::int32_t mPartCount = 0;
+};
+
+/// A tempo that holds from a position on.
+struct CMuxmlTempoChange {
+    std::int32_t mPositionAsMidiTicks = 0;
+    float mTempo = 0;  ///< quarters a minute
+};
+
+/// What a host is told while a score is read. An empty member is a method that the host does not
+/// have. Records, and the elements that they refer to, are valid during the call only.
+///
+/// In a well-formed file of parts the order is: document start; for each part the time signature
+/// 4/4 if its first measure has none, the part start, then for each measure its start, its contents
+/// in their order, and its end; then the part end; at last the document end. Notes that are tied
+/// come once, when the last of them is read.
+struct MusicXmlParserDelegate {
+    std::function<void(const TMuxmlProgressBarInfo& info)>
+        didEncounterDocumentStartWithProgressBarInfo;
+    std::function<void()> didEncounterDocumentEnd;
+    std::function<void(const CMuxmlPart& part)> didEncounterPartStart;
+    std::function<void(const CMuxmlPartGatheredInfo& info)> didEncounterPartEnd;
+    std::function<void(std::int32_t barStartAsMidiTicks)> didEncounterMeasureStart;
+    std::function<void(const CMuxmlMeasure& measure)> didEncounterMeasureEnd;
+    std::function<void(const CMuxmlSignTime& signTime)> didEncounterSignTime;
+    std::function<void(const CMuxmlSignKey& signKey)> didEncounterSignKey;
+    /// Kept: clefs are only told to a host that has didEncounterSignKey, too.
+    std::function<void(const CMuxmlClef& clef)> didEncounterClef;
+    std::function<void(const CMuxmlTranspose& transpose)> didEncounterTranspose;
+    std::function<void(const CMuxmlTempoChange& tempoChange)> didEncounterTempoChange;
+    /// `didEncounterInstrumentWithName:midiChannel:` Not sent.
+    std::function<void(std::string_view name, std::int32_t midiChannel)>
+        didEncounterInstrumentWithName;
+    std::function<void(const CMuxmlNote& note)> didEncounterNote;
+    std::function<void(const CPositionedXMLElement& direction)> didEncounterDirection;
+    /// `didEncounterCtrChangePedal:pedalType:value:` Not sent.
+    std::function<void(std::int32_t position, std::int32_t pedalType, std::int32_t value)>
+        didEncounterCtrChangePedal;
+    /// `didEncounterCtrChangeVol:midiChannel:value:` Not sent.
+    std::function<void(std::int32_t position, std::int32_t midiChannel, std::int32_t value)>
+        didEncounterCtrChangeVol;
+    /// `didEncounterCtrChangeBank:midiChannel:value:` Not sent.
+    std::function<void(std::int32_t position, std::int32_t midiChannel, std::int32_t value)>
+        didEncounterCtrChangeBank;
+    /// `didEncounterCtrChangePrg:midiChannel:value:` Not sent.
+    std::function<void(std::int32_t position, std::int32_t midiChannel, std::int32_t value)>
+        didEncounterCtrChangePrg;
+};
+
+}  // namespace brindle

@@ -1,0 +1,62 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/musicxml/XMLParserDelegate_RecursiveMuxml.h"
+
+#include <optional>
+
+namespace brindle {
+
+/// Reads a `measure`: its bounds in time, its attributes, `backup` and `forward`. Notes and sounds
+/// have delegates of their own.
+///
+/// The end of a bar follows from the time signature and not from what the bar holds, so that a
+/// faulty bar cannot shift what follows.
+class XMLParserDelegate_RecursiveMuxml_Measure final : public XMLParserDelegate_RecursiveMuxml {
+public:
+    CMuxmlMeasure EncounteredMeasure;
+    CMuxmlSignTime EncounteredSignTime;
+    CMuxmlSignKey EncounteredSignKey;
+    CMuxmlClef EncounteredClef;
+    CMuxmlTranspose EncounteredTranspose;
+
+    void didStartMyElement(XmlStreamParser& parser, std::string_view name,
+                           const XmlAttributes& attributes) override;
+    void didStartElement(XmlStreamParser& parser, std::string_view name,
+                         const XmlAttributes& attributes) override;
+    void didEndElement(XmlStreamParser& parser, std::string_view name) override;
+    void parseErrorOccurred(XmlStreamParser& parser, const XmlError& error) override;
+
+    void encounteredMeasureStart(const XmlAttributes& attributes);
+    void encounteredMeasureEnd();
+    void encounteredSignTime();
+    void encounteredSignKey();
+    void encounteredClef();
+    void encounteredTranspose();
+    void encounteredDirection();
+
+protected:
+    void foundTrimmedCharacters(XmlStreamParser& parser, std::string_view text) override;
+
+private:
+    /// What is done with the text of an element inside `attributes`.
+    struct TAttributesRow;
+    static const TAttributesRow* FindAttributesRow(
+        const XMLParserDelegate_RecursiveMuxml_Measure& self);
+
+    void _encounteredMeasureStart_detectIncompleteFirstBar();
+    std::int32_t
+    _encounteredMeasureStart_detectIncompleteFirstBar_barLengthOfFirstSignTimeAsDuration();
+    [[nodiscard]] std::int32_t _findMaxPosInCurrentPartMeasureAsDuration() const;
+    [[nodiscard]] std::int32_t _NextBarStart() const;
+    void FindElementsOfMeasure();
+    void FoundDivisions(XmlStreamParser& parser, std::string_view text);
+    void FoundDuration(std::string_view text);
+    [[nodiscard]] XmlNode FirstTransposeOfMeasure();
+
+    std::vector<XmlNode> mBarlines;
+    std::optional<XmlNode> mFirstTranspose;  // looked for once
+    XmlNode mFirstStaffDetails;
+};
+
+}  // namespace brindle

@@ -1,0 +1,58 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/musicxml/XMLParserDelegate_RecursiveMuxml.h"
+
+#include <string>
+
+namespace brindle {
+
+/// Reads a `note` and makes of it a note in time. A delegate reads one note.
+class XMLParserDelegate_RecursiveMuxml_Note final : public XMLParserDelegate_RecursiveMuxml {
+public:
+    CMuxmlNote EncounteredNote;
+    std::string InstrumentName;
+
+    void didStartMyElement(XmlStreamParser& parser, std::string_view name,
+                           const XmlAttributes& attributes) override;
+    void didStartElement(XmlStreamParser& parser, std::string_view name,
+                         const XmlAttributes& attributes) override;
+    void didEndElement(XmlStreamParser& parser, std::string_view name) override;
+    void parseErrorOccurred(XmlStreamParser& parser, const XmlError& error) override;
+
+    /// Works out pitch, loudness, place and length, joins ties, gathers what is learned about the
+    /// part and tells the note to the host. Throws boost::bad_rational when the file told divisions
+    /// of 0.
+    void encounteredNote();
+
+    // For the table of elements:
+
+    /// The elements of that name below the note; looked for once.
+    void FindNotations();
+    void FindNotehead();
+    void FindNoteheadText();
+    void FoundTie();
+    /// The side of the ratio of a tuplet that is open now; null outside a tuplet.
+    [[nodiscard]] CMuxmlTupletPortion* OpenTupletPortion();
+
+protected:
+    void foundTrimmedCharacters(XmlStreamParser& parser, std::string_view text) override;
+
+private:
+    enum TDeliver : bool { TDeliver_No = false, TDeliver_Yes = true };
+
+    void SetElements();
+    void SetNoteNr();
+    void SetVelocities();
+    TDeliver SetPlaceAndJoinTies(std::int32_t& ticks);
+    TDeliver SetPlaceOfGraceNote(std::int32_t position, std::int32_t& ticks);
+    TDeliver CloseChain(std::int32_t position, std::int32_t& ticks);
+    void GatherInfo() const;
+    void AdvancePosition(std::int32_t ticks);
+
+    bool mHasLookedForNotehead = false;
+    bool mHasLookedForNoteheadText = false;
+    bool mHasLookedForNotations = false;
+};
+
+}  // namespace brindle

@@ -1,0 +1,47 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/musicxml/CMuxmlPart.h"
+#include "brindle/musicxml/XMLParserDelegate_RecursiveMuxml.h"
+
+#include <map>
+#include <string>
+
+namespace brindle {
+
+/// Reads a `part` and hands its measures to their delegates.
+class XMLParserDelegate_RecursiveMuxml_Part final : public XMLParserDelegate_RecursiveMuxml {
+public:
+    std::string CurrentPartID;
+    // Instruments by the identifier of their part. Nothing fills them.
+    std::multimap<std::string, CMuxmlScoreInstrument> ScoreInstruments;
+    std::multimap<std::string, CMuxmlScoreInstrument> MidiInstruments;
+
+    void didStartMyElement(XmlStreamParser& parser, std::string_view name,
+                           const XmlAttributes& attributes) override;
+    void didStartElement(XmlStreamParser& parser, std::string_view name,
+                         const XmlAttributes& attributes) override;
+    void didEndElement(XmlStreamParser& parser, std::string_view name) override;
+    void parseErrorOccurred(XmlStreamParser& parser, const XmlError& error) override;
+
+    void encounteredPartStart(const XmlAttributes& attributes);
+    void encounteredPartEnd();
+
+protected:
+    void foundTrimmedCharacters(XmlStreamParser&, std::string_view) override {}
+
+private:
+    void _encounteredPartStart_setRootDelegateMusicXMLContext(const XmlAttributes& attributes);
+    void _tellSignTimeBeforeFirstMeasure();
+    void _encounteredPartStart_setupEncounteredPart(CMuxmlPart& part) const;
+    void _encounteredPartStart_queryScoreToSetMembersOf(CMuxmlPart& part) const;
+    void _encounteredPartStart_queryScoreInstrumentToSetMembersOf(CMuxmlPart& part) const;
+
+    void visit_Start_MidiDevice() {}
+    void visit_Start_ScorePart(std::string_view id) { CurrentPartID = id; }
+    void visit_End_MidiInstrument() {}
+    void visit_End_ScorePart() { CurrentPartID.clear(); }
+    void visit_End_ScoreInstrument() {}
+};
+
+}  // namespace brindle
