@@ -24,6 +24,8 @@
 #include "brindle/analysis/CSemitonesMatch.h"
 #include "brindle/analysis/CSeparatorPattern.h"
 #include "brindle/analysis/ChordRanges.h"
+#include "brindle/analysis/ChordVectorText.h"
+#include "brindle/analysis/CopiedPassages.h"
 #include "brindle/analysis/ModalCenters.h"
 #include "brindle/analysis/ParseStringIntoHarmAnlsChords.h"
 #include "brindle/analysis/Positions.h"

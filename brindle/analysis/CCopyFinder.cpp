@@ -45,12 +45,12 @@ CCopyFinder::CCopyFinder(const CHarmAnlsChordsWithLength& chords,
     }
 }
 
-void CCopyFinder::AppendCopies(std::int32_t position, CHarmCopies& copies) {
+void CCopyFinder::AppendCopies(std::int32_t position, std::vector<TCopiedPassage>& copies) {
     Fill(0, static_cast<TPlace>(mChords.size()), position, mStarts, copies);
 }
 
 void CCopyFinder::Fill(TPlace first, TPlace end, std::int32_t position, const TStarts& starts,
-                       CHarmCopies& copies) {
+                       std::vector<TCopiedPassage>& copies) {
     std::vector<std::int32_t> beatsTo;
     TStarts free;
     for (auto next = starts.begin(); next != starts.end();) {
@@ -67,7 +67,7 @@ void CCopyFinder::Fill(TPlace first, TPlace end, std::int32_t position, const TS
 
 void CCopyFinder::FillFromSequence(const TStarts& places, TPlace first,
                                    const std::vector<std::int32_t>& beatsTo, std::int32_t position,
-                                   CHarmCopies& copies) {
+                                   std::vector<TCopiedPassage>& copies) {
     const TPlace source = places.front().mPlace;
     const TPlace length = LengthOf(places.front().mSequence);
     for (const TStart& start : places) {
@@ -76,8 +76,9 @@ void CCopyFinder::FillFromSequence(const TStarts& places, TPlace first,
         if (&start == &places.front()) {
             FillFromSource(source, length, target, copies);
         } else {
-            copies.push_back({static_cast<double>(target), mLengths.BarsBack(source, place),
-                              mLengths.Bars(place, place + length), 0});
+            const CHarmCopy copy{static_cast<double>(target), mLengths.BarsBack(source, place),
+                                 mLengths.Bars(place, place + length), 0};
+            copies.push_back({copy, source, place, length});
         }
         Cover(start);
     }
@@ -85,7 +86,7 @@ void CCopyFinder::FillFromSequence(const TStarts& places, TPlace first,
 
 // The chords of the source are still free, and are covered as soon as this returns.
 void CCopyFinder::FillFromSource(TPlace source, TPlace length, std::int32_t position,
-                                 CHarmCopies& copies) {
+                                 std::vector<TCopiedPassage>& copies) {
     TStarts starts;
     for (TPlace place = source; place < source + length; ++place) {
         for (std::size_t n = mFirstAtPlace[place]; n < mFirstAtPlace[place + 1]; ++n) {

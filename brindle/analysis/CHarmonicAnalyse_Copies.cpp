@@ -8,6 +8,7 @@
 // can take less.
 
 #include "brindle/analysis/CHarmonicAnalyse.h"
+#include "brindle/analysis/CopiedPassages.h"
 #include "brindle/analysis/internal/CCopyFinder.h"
 #include "brindle/analysis/internal/CPassageStarts.h"
 #include "brindle/analysis/internal/RepeatedPassages.h"
@@ -81,18 +82,29 @@ void SeparateNotNumbers(const CHarmAnlsChordsWithLength& chords, std::vector<TPl
     }
 }
 
+void Append(const std::vector<TCopiedPassage>& passages, CHarmCopies& copies) {
+    for (const TCopiedPassage& passage : passages) copies.push_back(passage.mCopy);
+}
+
 }  // namespace
+
+std::vector<TCopiedPassage> FindCopiedPassages(const CHarmonicAnalyse& analyse) {
+    CHarmAnlsChordsWithLength chords;
+    analyse.ListAllHarmChordsWithLength(chords);
+    THarmRepeatingSequences sequences;
+    analyse.GenerateVectorWithRepeatingSequenceIndices(sequences, chords);
+    std::vector<TCopiedPassage> passages;
+    CCopyFinder(chords, sequences, 0).AppendCopies(0, passages);
+    std::stable_sort(passages.begin(), passages.end(),
+                     [](const TCopiedPassage& a, const TCopiedPassage& b) {
+                         return a.mCopy.mTargetPos < b.mCopy.mTargetPos;
+                     });
+    return passages;
+}
 
 void CHarmonicAnalyse::FindHarmCopies(CHarmCopies& copies) const {
     copies.clear();
-    CHarmAnlsChordsWithLength chords;
-    ListAllHarmChordsWithLength(chords);
-    THarmRepeatingSequences sequences;
-    GenerateVectorWithRepeatingSequenceIndices(sequences, chords);
-    RecursiveFillWithSequences(chords, sequences, 0, 0, copies);
-    std::stable_sort(copies.begin(), copies.end(), [](const CHarmCopy& a, const CHarmCopy& b) {
-        return a.mTargetPos < b.mTargetPos;
-    });
+    Append(FindCopiedPassages(*this), copies);
 }
 
 void CHarmonicAnalyse::ListAllHarmChordsWithLength(CHarmAnlsChordsWithLength& chords) const {
@@ -150,7 +162,9 @@ void CHarmonicAnalyse::RecursiveFillWithSequences(const CHarmAnlsChordsWithLengt
                                                   const THarmRepeatingSequences& sequences,
                                                   std::uint64_t start, std::int32_t position,
                                                   CHarmCopies& copies) const {
-    CCopyFinder(chords, sequences, start).AppendCopies(position, copies);
+    std::vector<TCopiedPassage> passages;
+    CCopyFinder(chords, sequences, start).AppendCopies(position, passages);
+    Append(passages, copies);
 }
 
 }  // namespace brindle

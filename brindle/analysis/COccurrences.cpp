@@ -15,7 +15,7 @@ bool COccurrences::HasPartner(TPlace place) const {
            NextContinuedOtherwise(place + mLength, Continuation(place)) != kNoPlace;
 }
 
-TPlace COccurrences::NextWithPartner(TPlace place) const {
+TPlace COccurrences::NextWithPartner(TPlace place) {
     TPlace next = Next(place);
     while (next != kNoPlace && Next(next + mLength) != kNoPlace) {
         if (HasPartner(next)) return next;
@@ -25,7 +25,15 @@ TPlace COccurrences::NextWithPartner(TPlace place) const {
     return kNoPlace;
 }
 
-TPlace COccurrences::NextTandem(TPlace place) const {
+TPlace COccurrences::NextTandem(TPlace place) {
+    if (place < mAskedFrom || place > mTandem) {
+        mAskedFrom = place;
+        mTandem = SearchTandem(place);
+    }
+    return mTandem;
+}
+
+TPlace COccurrences::SearchTandem(TPlace place) const {
     TPlace next = Next(place);
     while (next != kNoPlace) {
         const TPlace follower = Next(next + mLength);

@@ -52,12 +52,15 @@ void CPassageStarts::Visit(TWalk& walk) {
 }
 
 void CPassageStarts::FindNext(TWalk& walk, TPlace place) const {
-    walk.mNext = NextToTakeItself(walk.mOccurrences, place);
+    COccurrences& occurrences = walk.mOccurrences;
+    walk.mNextAlone = NextToTakeItself(occurrences, std::max(place, walk.mNextAlone));
+    walk.mNext = walk.mNextAlone;
     if (walk.mStage != Stage_Tandems) return;
-    walk.mNext = std::min({walk.mNext, walk.mUnlike, NextToTakeTandem(walk.mOccurrences, place)});
+    walk.mNextTandem = NextToTakeTandem(occurrences, std::max(place, walk.mNextTandem));
+    walk.mNext = std::min({walk.mNext, walk.mUnlike, walk.mNextTandem});
 }
 
-TPlace CPassageStarts::NextToTakeItself(const COccurrences& occurrences, TPlace place) const {
+TPlace CPassageStarts::NextToTakeItself(COccurrences& occurrences, TPlace place) const {
     for (TPlace next = occurrences.Next(place); next != kNoPlace;) {
         const TPlace free = FreeFrom(next, occurrences.Length());
         if (free == next) {
@@ -71,7 +74,7 @@ TPlace CPassageStarts::NextToTakeItself(const COccurrences& occurrences, TPlace 
     return kNoPlace;
 }
 
-TPlace CPassageStarts::NextToTakeTandem(const COccurrences& occurrences, TPlace place) const {
+TPlace CPassageStarts::NextToTakeTandem(COccurrences& occurrences, TPlace place) const {
     const TPlace length = occurrences.Length();
     for (TPlace next = occurrences.NextTandem(place); next != kNoPlace;) {
         const TPlace free = FreeFrom(next + length, length);

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "brindle/analysis/CHarmCopy.h"
+#include "brindle/analysis/CopiedPassages.h"
 #include "brindle/analysis/internal/CPassageLengths.h"
 #include "brindle/analysis/internal/CPlaceSet.h"
 
@@ -25,8 +25,9 @@ public:
     CCopyFinder(const CHarmAnlsChordsWithLength& chords, const THarmRepeatingSequences& sequences,
                 std::uint64_t start);
 
-    /// Appends the copies; the passage begins at `position` in beats.
-    void AppendCopies(std::int32_t position, CHarmCopies& copies);
+    /// Appends the copies; the passage begins at `position` in beats. Their chords are counted from
+    /// the first of the passage.
+    void AppendCopies(std::int32_t position, std::vector<TCopiedPassage>& copies);
 
 private:
     struct TStart {
@@ -40,11 +41,12 @@ private:
     }
 
     void Fill(TPlace first, TPlace end, std::int32_t position, const TStarts& starts,
-              CHarmCopies& copies);
+              std::vector<TCopiedPassage>& copies);
     void FillFromSequence(const TStarts& places, TPlace first,
                           const std::vector<std::int32_t>& beatsTo, std::int32_t position,
-                          CHarmCopies& copies);
-    void FillFromSource(TPlace source, TPlace length, std::int32_t position, CHarmCopies& copies);
+                          std::vector<TCopiedPassage>& copies);
+    void FillFromSource(TPlace source, TPlace length, std::int32_t position,
+                        std::vector<TCopiedPassage>& copies);
     [[nodiscard]] TPlace LengthOf(TPlace sequence) const;
     [[nodiscard]] bool IsFree(const TStart& start) const;
     void Cover(const TStart& start);

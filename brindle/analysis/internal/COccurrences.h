@@ -32,17 +32,22 @@ public:
     /// That goes on otherwise.
     [[nodiscard]] TPlace NextContinuedOtherwise(TPlace place, TRanks continuation) const;
     /// That has a partner behind it.
-    [[nodiscard]] TPlace NextWithPartner(TPlace place) const;
-    /// That another occurrence follows at once.
-    [[nodiscard]] TPlace NextTandem(TPlace place) const;
+    [[nodiscard]] TPlace NextWithPartner(TPlace place);
+    /// That another occurrence follows at once. Remembers the last answer, so that places in
+    /// ascending order ask for each occurrence once.
+    [[nodiscard]] TPlace NextTandem(TPlace place);
 
 private:
+    [[nodiscard]] TPlace SearchTandem(TPlace place) const;
     [[nodiscard]] TPlace LastOfRow(TPlace place, TPlace period) const;
     [[nodiscard]] TPlace PlaceBehindFailedTandem(TPlace place, TPlace follower) const;
 
     const CSuffixes* mSuffixes;
     TRanks mRanks;
     TPlace mLength;
+    // The next tandem from mAskedFrom on.
+    TPlace mAskedFrom = kNoPlace;
+    TPlace mTandem = 0;
 };
 
 }  // namespace brindle

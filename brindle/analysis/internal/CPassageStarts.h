@@ -36,6 +36,9 @@ private:
         COccurrences mOccurrences;
         TStage mStage = Stage_First;
         TPlace mNext = kNoPlace;
+        /// Nothing that is to be taken stands before these: what is not free stays so.
+        TPlace mNextAlone = 0;
+        TPlace mNextTandem = 0;
         /// The first occurrence unlike the first with a partner.
         TPlace mUnlike = kNoPlace;
     };
@@ -44,8 +47,8 @@ private:
 
     void Visit(TWalk& walk);
     void FindNext(TWalk& walk, TPlace place) const;
-    [[nodiscard]] TPlace NextToTakeItself(const COccurrences& occurrences, TPlace place) const;
-    [[nodiscard]] TPlace NextToTakeTandem(const COccurrences& occurrences, TPlace place) const;
+    [[nodiscard]] TPlace NextToTakeItself(COccurrences& occurrences, TPlace place) const;
+    [[nodiscard]] TPlace NextToTakeTandem(COccurrences& occurrences, TPlace place) const;
     void TakePartners(const COccurrences& occurrences, TPlace place, TRanks continuation);
     void TakeIfFree(TPlace place, TPlace length);
     /// The end of the passage that was taken over a place; the place itself if it is free.

@@ -1,0 +1,28 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <cstddef>
+#include <span>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace brindle {
+
+/// What a text says about the vector of a chord (see CHarmAnlsChordForMetro).
+struct TChordVectorText {
+    /// 46 places of 0.0 or 1.0; empty if the text is no vector.
+    std::vector<float> mVector;
+    /// What is wrong, and where, counted from 0 in bytes; empty if nothing is.
+    std::string mError;
+    std::size_t mColumn = 0;
+};
+
+/// Reads 46 digits 0 and 1 with any white space and commas between, or a JSON list of 46 numbers,
+/// or the JSON object that CHarmAnlsChordForMetro writes.
+[[nodiscard]] TChordVectorText ReadChordVector(std::string_view text);
+
+/// The digits in groups: special chords, root, basic chord, semitones, bass.
+[[nodiscard]] std::string WriteChordVector(std::span<const float> vector);
+
+}  // namespace brindle
