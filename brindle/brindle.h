@@ -30,6 +30,7 @@
 #include "brindle/analysis/ParseStringIntoHarmAnlsChords.h"
 #include "brindle/analysis/Positions.h"
 #include "brindle/analysis/ProgressionFinder.h"
+#include "brindle/analysis/ReadChordSheet.h"
 #include "brindle/analysis/RomanNumeral.h"
 #include "brindle/analysis/RouteRanges.h"
 #include "brindle/analysis/ScaleLite.h"

@@ -50,6 +50,7 @@ CChordTextReading ReadChordText(std::string_view text, const CChordTextPrefs& pr
     CChordTextReading reading;
     reading.mKind = TChordText_Chord;
     reading.mChord = parser.Chord();
+    reading.mHasH = parser.HasH();
     SetParserText(reading, text, prefs.mBIsBFlat);
     return reading;
 }

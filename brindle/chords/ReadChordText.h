@@ -45,6 +45,8 @@ struct CChordTextReading {
     std::string mParserText;
     /// False: `mParserText` is only the nearest chord, since no such text says this one.
     bool mParserTextIsExact = false;
+    /// Root or bass is written with the letter H.
+    bool mHasH = false;
     /// Where the fault is: characters (not bytes) from 1; 0 without a fault.
     int mFaultPos = 0;
     /// What is wrong, as in `"x" at 4 is not understood`. Only the first fault is told.

@@ -325,9 +325,9 @@ TEST_CASE("Every printed name reads back") {
     for (const CChordNamePrefs& style : styles) {
         const CChordTextPrefs prefs{
             .mBIsBFlat = style.mHForB, .mSolfege = style.mSolfege, .mOwnName = true};
-        // Each style has its share of the sets, and each set comes in every eighth style.
-        const std::uint64_t first = 1 + 2 * (static_cast<std::uint64_t>(&style - &styles[0]) % 8);
-        for (std::uint64_t mask = first; mask < 4096; mask += 16) {
+        // Each style has its share of the sets, and each set comes in eight of them.
+        const std::uint64_t first = 1 + 2 * (static_cast<std::uint64_t>(&style - &styles[0]) % 32);
+        for (std::uint64_t mask = first; mask < 4096; mask += 64) {
             key = (key + 1) % kKeyCount;
             const CChordLite chord(CKeyEnh_AllUpToOneAccidental[key], CKeyEnh_Undef,
                                    CSemitones(mask));

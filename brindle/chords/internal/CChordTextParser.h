@@ -24,6 +24,7 @@ public:
     [[nodiscard]] bool Read();
     [[nodiscard]] const TFaultAt& Fault() const { return mFault; }
     [[nodiscard]] CChordLite Chord() const;
+    [[nodiscard]] bool HasH() const { return mRoot.mIsH || (mBass && mBass->mIsH); }
 
 private:
     bool Fail(TFault fault, std::size_t pos, std::size_t length = 0);

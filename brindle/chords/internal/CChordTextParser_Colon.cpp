@@ -140,7 +140,7 @@ bool CChordTextParser::ReadColonBass() {
         Fail(TFault::OneAccidentalTooMany, degreePos);
         return true;
     }
-    mBass = TWrittenNote{letter, accidental};
+    mBass = TWrittenNote{letter, accidental, false};
     return true;
 }
 

@@ -129,7 +129,7 @@ CKeyEnh TWrittenNote::KeyEnh() const {
 std::optional<TWrittenNote> TakeNote(CTextScan& scan, const CChordTextPrefs& prefs) {
     if (prefs.mSolfege) {
         if (const auto letter = TakeSyllable(scan)) {
-            return TWrittenNote{*letter, TakeAccidental(scan, '\0').value_or(0)};
+            return TWrittenNote{*letter, TakeAccidental(scan, '\0').value_or(0), false};
         }
     }
     const char typed = scan.Peek();
@@ -139,7 +139,7 @@ std::optional<TWrittenNote> TakeNote(CTextScan& scan, const CChordTextPrefs& pre
     const auto accidental = TakeAccidental(scan, letter);
     const int withoutOne = prefs.mBIsBFlat && letter == 'b' ? -1 : 0;
     return TWrittenNote{kLettersFromA[static_cast<std::size_t>(letter - 'a')],
-                        accidental.value_or(withoutOne)};
+                        accidental.value_or(withoutOne), letter == 'h'};
 }
 
 bool SeesOneAccidentalTooMany(const CTextScan& scan, const TWrittenNote& note) {

@@ -14,6 +14,8 @@ struct TWrittenNote {
     int mLetter = 0;
     /// -2 to 2 from the notes that are read.
     int mAccidental = 0;
+    /// Written with H for B.
+    bool mIsH = false;
 
     /// Accidentals beyond -3 to 3 have no spelling.
     [[nodiscard]] CKeyEnh KeyEnh() const;
