@@ -6,6 +6,7 @@
 #include "cli/KeyText.h"
 #include "cli/LeadSheet.h"
 #include "cli/Names.h"
+#include "cli/SongCopies.h"
 
 #include "brindle/analysis/CAnalyseHarmCenterAlternatives.h"
 #include "brindle/analysis/TChordStringParse.h"
@@ -100,8 +101,11 @@ std::string Present(const TAnalysedSong& analysed, const TAnalyseOptions& option
             analysed.mAnalyse.AppendJSONString(native);
             return native.str();
         }
-        case TFormat::Svg:
-            return AnalysisSvg(SongOf(analysed, options));
+        case TFormat::Svg: {
+            TSong song = SongOf(analysed, options);
+            song.mCopies = MakeSongCopies(analysed.mAnalyse, *analysed.mSymbols);
+            return AnalysisSvg(song);
+        }
         case TFormat::Text:
             break;
     }

@@ -2,11 +2,12 @@
 // A song as a picture. Time runs from left to right and breaks into lines as text does. Each line
 // has, from above: the numbers of the bars, a band for the sign key, a band for the center, the
 // chords in boxes with their function or else their degree under them, and thin bands for the
-// readings. A score has its title above, and its times and rehearsal marks beside the numbers of
-// the bars. The color of a band is that of its key: neighbours on the circle of fifths have
-// neighbouring colors, and minor keys are darker.
+// repeated passages and for the readings. A score has its title above, and its times and rehearsal
+// marks beside the numbers of the bars. The color of a band is that of its key: neighbours on the
+// circle of fifths have neighbouring colors, and minor keys are darker.
 
 #include "cli/Analysis.h"
+#include "cli/AnalysisSvg_Copies.h"
 #include "cli/Names.h"
 #include "cli/Svg.h"
 #include "cli/TimeAxis.h"
@@ -140,6 +141,7 @@ public:
             for (const TShownCenter& center : signKey.mCenters) Draw(center);
         }
         for (const TShownChord& chord : song.mLooseChords) Draw(chord, std::string(kNoKey));
+        DrawCopies(mSvg, mAxis, {kMargin, mTops, kReadingsTop, kReadingHeight}, song);
         DrawReadings();
     }
 
@@ -162,6 +164,11 @@ private:
         return title;
     }
 
+    // The repeated passages have a band above the readings.
+    [[nodiscard]] double ReadingsTop() const {
+        return kReadingsTop + (mSong.mCopies.empty() ? 0.0 : kReadingPitch);
+    }
+
     // Each line is as high as the readings on it need.
     void PlaceLines() {
         std::vector<std::size_t> lanes(mAxis.LineCount(), 0);
@@ -174,7 +181,7 @@ private:
         mBottom = mSong.mScore.mTitle.empty() ? kMargin : kMargin + kTitleHeight;
         for (const std::size_t count : lanes) {
             mTops.push_back(mBottom);
-            mBottom += kReadingsTop + static_cast<double>(count) * kReadingPitch + kLineGap;
+            mBottom += ReadingsTop() + static_cast<double>(count) * kReadingPitch + kLineGap;
         }
         mBottom -= kLineGap;
     }
@@ -262,7 +269,7 @@ private:
             const TShownCenter& reading = mSong.mReadings[i];
             const std::size_t lane = mLanes.LaneOf(i);
             if (lane >= kMostLanes) continue;
-            Band(reading.mRange, kReadingsTop + static_cast<double>(lane) * kReadingPitch,
+            Band(reading.mRange, ReadingsTop() + static_cast<double>(lane) * kReadingPitch,
                  kReadingHeight, ColorOf(reading.mHarmCenter, Shade_Reading),
                  fmt::format("{} {:.2f}", reading.mName, reading.mProbability),
                  {.mSize = kSmallSize, .mColor = kInk});

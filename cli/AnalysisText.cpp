@@ -13,14 +13,6 @@
 namespace brindle::cli {
 namespace {
 
-// "bar 3", "bars 1 to 4"
-std::string BarsOf(const TRange& range, const CBars& bars) {
-    const long first = bars.BarOf(range.mBegin);
-    // A range that ends on a bar line does not reach into the bar behind it.
-    const long last = std::max(first, bars.LastBarBefore(range.mEnd));
-    return first == last ? fmt::format("bar {}", first) : fmt::format("bars {} to {}", first, last);
-}
-
 std::string DistanceText(int distance) {
     return distance < 0 ? " -" : fmt::format("{:2} {}", distance, DegreeName(distance));
 }
@@ -128,20 +120,10 @@ private:
         if (hasChords) mText += '\n';
     }
 
-    // The first and the last symbols of a passage.
     [[nodiscard]] static std::string SymbolsOf(const TShownCenter& center) {
-        constexpr std::size_t shown = 4;
-        std::string symbols;
-        const std::size_t count = center.mChords.size();
-        for (std::size_t i = 0; i < count; ++i) {
-            if (count > 2 * shown && i == shown) {
-                symbols += " ...";
-                i = count - shown;
-            }
-            if (!symbols.empty()) symbols += ' ';
-            symbols += center.mChords[i].mSymbol;
-        }
-        return symbols;
+        std::vector<std::string> symbols;
+        for (const TShownChord& chord : center.mChords) symbols.push_back(chord.mSymbol);
+        return FirstAndLast(symbols);
     }
 
     void WriteChords(const std::vector<TShownChord>& chords) {

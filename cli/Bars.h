@@ -1,8 +1,11 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "cli/Song.h"
+
 #include <algorithm>
 #include <cmath>
+#include <string>
 #include <utility>
 #include <vector>
 
@@ -43,5 +46,8 @@ private:
     double mBeatsPerBar;
     std::vector<double> mStarts;  // ascending
 };
+
+/// "bar 3", "bars 1 to 4".
+[[nodiscard]] std::string BarsOf(const TRange& range, const CBars& bars);
 
 }  // namespace brindle::cli

@@ -50,5 +50,7 @@ void AddName(CLI::App& program, TStatus& status);
 void AddFunction(CLI::App& program, TStatus& status);
 void AddTypes(CLI::App& program, TStatus& status);
 void AddNet(CLI::App& program, TStatus& status);
+void AddCopies(CLI::App& program, TStatus& status);
+void AddVector(CLI::App& program, TStatus& status);
 
 }  // namespace brindle::cli

@@ -63,6 +63,8 @@ int main(int argc, char** argv) {
     AddFunction(program, status);
     AddTypes(program, status);
     AddNet(program, status);
+    AddCopies(program, status);
+    AddVector(program, status);
     try {
         program.parse(argc, argv);
     } catch (const CLI::ParseError& error) {

@@ -2,6 +2,7 @@
 #pragma once
 
 #include "brindle/analysis/CHarmAnlsCenters.h"
+#include "brindle/analysis/CHarmCopy.h"
 #include "brindle/analysis/CHarmonicAnalyse.h"
 
 #include <cstddef>
@@ -31,6 +32,14 @@ struct TShownChord {
     int mRootDist = -1;  ///< semitones above the center, -1 for none
     int mBassDist = -1;
     std::string mNumeral;  ///< the function in the center, empty for none
+};
+
+/// A passage that repeats an earlier one, with its exact ranges and the symbols of its chords.
+struct TShownCopy {
+    TRange mSource;
+    TRange mTarget;
+    std::vector<std::string> mSymbols;
+    CHarmCopy mCopy;
 };
 
 /// A center as it is shown. Its range is that of its chords; without chords it is empty and begins
@@ -81,6 +90,7 @@ struct TSong {
     std::vector<TShownSignKey> mSignKeys;
     /// Chords of the text that stand in no center.
     std::vector<TShownChord> mLooseChords;
+    std::vector<TShownCopy> mCopies;
     std::vector<TShownCenter> mReadings;
     bool mHasReadings = false;
 };

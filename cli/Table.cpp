@@ -47,4 +47,18 @@ std::string CTable::Line(const std::vector<std::string>& cells) const {
     return line;
 }
 
+std::string FirstAndLast(const std::vector<std::string>& words) {
+    constexpr std::size_t shown = 4;
+    std::string text;
+    for (std::size_t i = 0; i < words.size(); ++i) {
+        if (words.size() > 2 * shown && i == shown) {
+            text += " ...";
+            i = words.size() - shown;
+        }
+        if (!text.empty()) text += ' ';
+        text += words[i];
+    }
+    return text;
+}
+
 }  // namespace brindle::cli

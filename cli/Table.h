@@ -33,4 +33,7 @@ private:
     std::vector<std::vector<std::string>> mRows;
 };
 
+/// The words with blanks between; of many only the first and the last.
+[[nodiscard]] std::string FirstAndLast(const std::vector<std::string>& words);
+
 }  // namespace brindle::cli

@@ -70,6 +70,7 @@ TEST_CASE("All JSON of the program is strict") {
           "brindle chord --json 'C\"\xff' undef X", "brindle scale --json 'Fb mm7'",
           "brindle key --json 'G# major'",
           "brindle name --json --all-roots C4 E4 --slash-text $'\\xff\"'",
+          "brindle copies --json $'C\\xff\" F C\\xff\" F'", "brindle vector --json $'\\xff\"' C",
           "brindle function --json X --key C", "brindle types --json",
           "brindle net weights --json"}) {
         INFO(command);

@@ -1,0 +1,92 @@
+// SPDX-License-Identifier: MIT
+#include "cli/Bars.h"
+#include "cli/ChordSymbols.h"
+#include "cli/ChordTextOptions.h"
+#include "cli/CommandLine.h"
+#include "cli/Input.h"
+#include "cli/Json.h"
+#include "cli/SongCopies.h"
+#include "cli/Table.h"
+
+#include <memory>
+
+namespace brindle::cli {
+namespace {
+
+constexpr TCommandHelp kHelp{
+    "copies",
+    "Find the passages of a song that repeat earlier ones, chord for chord",
+    "  brindle copies --beats-per-chord 4 \"C Am F G C Am F G\"\n"
+    "  brindle copies --file song.txt --beats-per-bar 3\n"
+    "  cat song.txt | brindle copies - --json\n"
+    "\n"
+    "A chord text has chord symbols between white space; | goes on to the next bar\n"
+    "line, and . holds the chord before it for one more step.\n",
+};
+
+struct TCopiesOptions {
+    CChordTextOptions mText;
+    CFormatOptions mFormat;
+};
+
+Json RangeToJson(const TRange& range) {
+    return {{"Position", NumberToJson(range.mBegin)}, {"End", NumberToJson(range.mEnd)}};
+}
+
+std::string CopiesJson(const std::vector<TShownCopy>& copies) {
+    Json list = Json::array();
+    for (const TShownCopy& shown : copies) {
+        list.push_back({{"TargetPos", NumberToJson(shown.mCopy.mTargetPos)},
+                        {"SourceOffsetBars", shown.mCopy.mSourceOffsetBars},
+                        {"LengthBars", shown.mCopy.mLengthBars},
+                        {"Source", RangeToJson(shown.mSource)},
+                        {"Target", RangeToJson(shown.mTarget)},
+                        {"Symbols", shown.mSymbols}});
+    }
+    return JsonText({{"HarmCopies", list}});
+}
+
+std::string LengthText(double bars) {
+    return ShortNumber(bars) + (bars == 1.0 ? " bar" : " bars");
+}
+
+std::string CopiesText(const std::vector<TShownCopy>& copies, double beatsPerBar,
+                       const CPaint& paint) {
+    if (copies.empty()) return "no passage is repeated\n";
+    const CBars bars(beatsPerBar);
+    CTable table({"source", "target", "length", "chords"});
+    for (const TShownCopy& shown : copies) {
+        table.AddRow({BarsOf(shown.mSource, bars), BarsOf(shown.mTarget, bars),
+                      LengthText((shown.mTarget.mEnd - shown.mTarget.mBegin) / beatsPerBar),
+                      FirstAndLast(shown.mSymbols)});
+    }
+    return table.Text(paint);
+}
+
+TStatus Copies(const TCopiesOptions& options) {
+    if (const auto contradiction = options.mText.Contradiction()) {
+        return Fail(TStatus::BadUsage, *contradiction);
+    }
+    const auto typed = options.mText.Read();
+    if (!typed) return TStatus::BadInput;
+    const TChordStringParse parse = options.mText.Parse();
+    CHarmonicAnalyse chordsOnly;
+    chordsOnly.mChords.ParseStringIntoChords(FoldAccidentals(*typed), parse);
+    const CChordSymbols symbols(*typed, parse, chordsOnly.mChords);
+    const std::vector<TShownCopy> copies = MakeSongCopies(chordsOnly, symbols);
+    return Print(options.mFormat.Format() == TFormat::Json
+                     ? CopiesJson(copies)
+                     : CopiesText(copies, options.mText.BeatsPerBar(), CPaint()));
+}
+
+}  // namespace
+
+void AddCopies(CLI::App& program, TStatus& status) {
+    CLI::App& command = AddCommand(program, kHelp);
+    const auto options = std::make_shared<TCopiesOptions>();
+    options->mText.AddTo(command);
+    options->mFormat.AddTo(command, {"text", "json"});
+    command.callback([options, &status] { status = Copies(*options); });
+}
+
+}  // namespace brindle::cli

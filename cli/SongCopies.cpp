@@ -1,0 +1,37 @@
+// SPDX-License-Identifier: MIT
+#include "cli/SongCopies.h"
+
+#include "cli/ChordSymbols.h"
+
+#include "brindle/analysis/CopiedPassages.h"
+
+#include <algorithm>
+
+namespace brindle::cli {
+namespace {
+
+// `count` chords from number `first` on; the last chord of the list ends where it begins.
+TRange RangeOf(const CHarmAnlsChords& chords, std::uint64_t first, std::uint64_t count) {
+    const std::uint64_t end = std::min<std::uint64_t>(first + count, chords.size() - 1);
+    return {chords[first].mPosition, chords[end].mPosition};
+}
+
+}  // namespace
+
+std::vector<TShownCopy> MakeSongCopies(const CHarmonicAnalyse& analyse,
+                                       const CChordSymbols& symbols) {
+    const CHarmAnlsChords& chords = analyse.mChords;
+    std::vector<TShownCopy> copies;
+    for (const TCopiedPassage& passage : FindCopiedPassages(analyse)) {
+        TShownCopy& shown = copies.emplace_back();
+        shown.mCopy = passage.mCopy;
+        shown.mSource = RangeOf(chords, passage.mSource, passage.mCount);
+        shown.mTarget = RangeOf(chords, passage.mTarget, passage.mCount);
+        for (std::uint64_t n = 0; n < passage.mCount; ++n) {
+            shown.mSymbols.push_back(symbols.SymbolOf(chords[passage.mTarget + n]));
+        }
+    }
+    return copies;
+}
+
+}  // namespace brindle::cli

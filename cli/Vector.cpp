@@ -1,0 +1,171 @@
+// SPDX-License-Identifier: MIT
+#include "cli/CommandLine.h"
+#include "cli/Input.h"
+#include "cli/Json.h"
+#include "cli/Names.h"
+#include "cli/Table.h"
+
+#include "brindle/analysis/CHarmAnlsChordForMetro.h"
+#include "brindle/analysis/ChordVectorText.h"
+#include "brindle/chords/CChordHeavy.h"
+
+#include <algorithm>
+#include <memory>
+
+namespace brindle::cli {
+namespace {
+
+constexpr TCommandHelp kHelp{
+    "vector",
+    "Write chords as vectors of 46 places for learning systems, and read vectors back",
+    "  brindle vector C/E F#m7\n"
+    "  brindle vector 000 100000000000 1000000 000000000000 000010000000\n"
+    "  cat vectors.txt | brindle vector - --json\n"
+    "\n"
+    "The groups of a vector are: no chord, EADGBE, wildcard; the root from C to B; major,\n"
+    "minor, augmented, diminished, sus4, sus2, drone; the semitones beyond these, from 0\n"
+    "to 11; and the bass from C to B. A vector may also be a JSON list of 46 numbers.\n",
+};
+
+struct TVectorOptions {
+    std::vector<std::string> mWords;
+    CFormatOptions mFormat;
+};
+
+/// A chord, its vector, and what the vector says.
+struct TShownVector {
+    std::string mSymbol;  // empty when the vector was typed
+    std::vector<float> mVector;
+    CHarmAnlsChordForMetro mReadBack;
+    std::string mError;
+    std::size_t mColumn = 0;
+};
+
+bool IsVectorText(std::string_view typed) {
+    return !typed.empty() && std::string_view("01[{").find(typed.front()) != typed.npos;
+}
+
+TShownVector Show(const std::string& typed) {
+    TShownVector shown;
+    if (IsVectorText(typed)) {
+        TChordVectorText text = ReadChordVector(typed);
+        shown.mVector = std::move(text.mVector);
+        shown.mError = std::move(text.mError);
+        shown.mColumn = text.mColumn;
+    } else {
+        shown.mSymbol = Printable(typed);
+        const CHarmAnlsChordForMetro chord(CChordLite(FoldAccidentals(typed), NamePrefs()));
+        shown.mVector = chord.GetChordVectorRepresentation();
+    }
+    shown.mReadBack.SetFromChordVectorRepresentation(shown.mVector);
+    return shown;
+}
+
+std::string NameOf(const CHarmAnlsChordForMetro& chord) {
+    if (chord.IsUndef() || chord.IsWildcard() || chord.IsEADGBE()) {
+        return chord.NameForMetroExport(true);
+    }
+    return chord.ToChordHeavy(CChordHeavy::DefaultWrapIntvl).NameWithSlash(NamePrefs());
+}
+
+Json VectorToJson(const TShownVector& shown) {
+    Json places = Json::array();
+    for (const float place : shown.mVector) places.push_back(place == 1.0F ? 1 : 0);
+    const CHarmAnlsChordForMetro& chord = shown.mReadBack;
+    return {{"Symbol", shown.mSymbol.empty() ? Json(nullptr) : Json(shown.mSymbol)},
+            {"VectorRep", places},
+            {"ReadBack",
+             {{"Name", NameOf(chord)},
+              {"NameForExport", chord.NameForMetroExport(true)},
+              {"RootKeyEnh", KeyEnhToJson(chord.mRootKeyEnh)},
+              {"BassKeyEnh", KeyEnhToJson(chord.mBassKeyEnh)},
+              {"Semitones", chord.mSemitones.Mask()},
+              {"Intervals", IntervalsToJson(chord.mSemitones)}}}};
+}
+
+std::string VectorsJson(const std::vector<TShownVector>& vectors) {
+    Json list = Json::array();
+    for (const TShownVector& vector : vectors) list.push_back(VectorToJson(vector));
+    return JsonText({{"Vectors", list}});
+}
+
+std::string VectorsText(const std::vector<TShownVector>& vectors, const CPaint& paint) {
+    CTable table({"chord", "vector", "reads back"});
+    for (const TShownVector& shown : vectors) {
+        const std::string name = NameOf(shown.mReadBack);
+        table.AddRow(
+            {shown.mSymbol.empty() ? "-" : shown.mSymbol, WriteChordVector(shown.mVector), name});
+    }
+    return table.Text(paint);
+}
+
+bool IsDigits(std::string_view word) {
+    return word.find_first_not_of("01 ") == word.npos;
+}
+
+std::size_t CountDigits(std::string_view word) {
+    return word.size() - static_cast<std::size_t>(std::count(word.begin(), word.end(), ' '));
+}
+
+// The groups of a vector may come as words of their own, and so do the entries of a list in
+// brackets, which the command line takes apart.
+std::vector<std::string> WithVectorsJoined(const std::vector<std::string>& words) {
+    std::vector<std::string> things;
+    for (const std::string& word : words) {
+        const bool isRest = !things.empty() && IsDigits(word) && IsDigits(things.back()) &&
+                            CountDigits(things.back()) < CHarmAnlsChordForMetro::VectorSize;
+        if (isRest) {
+            things.back() += ' ' + word;
+        } else {
+            things.push_back(word);
+        }
+    }
+    return things;
+}
+
+// A line of standard input is a vector, or chord symbols between white space.
+std::optional<std::vector<std::string>> TypedThings(const std::vector<std::string>& words) {
+    if (!IsStandardInput(words)) return WithVectorsJoined(words);
+    const auto lines = TypedLines(words);
+    if (!lines) return std::nullopt;
+    std::vector<std::string> things;
+    for (const std::string& line : *lines) {
+        if (IsVectorText(line)) {
+            things.push_back(line);
+        } else {
+            const std::vector<std::string> symbols = WordsOf(line);
+            things.insert(things.end(), symbols.begin(), symbols.end());
+        }
+    }
+    return things;
+}
+
+TStatus Vector(const TVectorOptions& options) {
+    const auto things = TypedThings(options.mWords);
+    if (!things) return TStatus::BadInput;
+    std::vector<TShownVector> vectors;
+    for (const std::string& typed : *things) {
+        vectors.push_back(Show(typed));
+        const TShownVector& shown = vectors.back();
+        if (shown.mError.empty()) continue;
+        return FailAt(TStatus::BadInput, shown.mError, typed, shown.mColumn);
+    }
+    return Print(options.mFormat.Format() == TFormat::Json ? VectorsJson(vectors)
+                                                           : VectorsText(vectors, CPaint()));
+}
+
+}  // namespace
+
+void AddVector(CLI::App& program, TStatus& status) {
+    CLI::App& command = AddCommand(program, kHelp);
+    const auto options = std::make_shared<TVectorOptions>();
+    command
+        .add_option("CHORD", options->mWords,
+                    "Chord symbols or vectors; - reads standard input, a vector or chords a line")
+        ->required()
+        ->option_text("...");
+    options->mFormat.AddTo(command, {"text", "json"});
+    command.callback([options, &status] { status = Vector(*options); });
+}
+
+}  // namespace brindle::cli
