@@ -1,13 +1,13 @@
 // SPDX-License-Identifier: MIT
 #include "Transcript.h"
 
+#include "tests/support/ScratchFolder.h"
+
 #include <doctest/doctest.h>
 #include <fmt/format.h>
 #include <sys/wait.h>
-#include <unistd.h>
 
 #include <cstdlib>
-#include <filesystem>
 #include <fstream>
 #include <iterator>
 #include <sstream>
@@ -16,29 +16,6 @@ namespace brindle::test {
 namespace {
 
 constexpr std::string_view kPrompt = "$ ";
-
-// A folder of this process alone, removed at its end.
-class CScratchFolder {
-public:
-    CScratchFolder() {
-        std::string name =
-            (std::filesystem::temp_directory_path() / "brindle-test-XXXXXX").string();
-        if (mkdtemp(name.data()) == nullptr) std::abort();
-        mPath = name;
-    }
-    CScratchFolder(const CScratchFolder&) = delete;
-    CScratchFolder& operator=(const CScratchFolder&) = delete;
-    ~CScratchFolder() {
-        std::error_code ignored;
-        std::filesystem::remove_all(mPath, ignored);
-    }
-
-    [[nodiscard]] std::string Path() const { return mPath.string(); }
-    [[nodiscard]] std::string File(const char* name) const { return (mPath / name).string(); }
-
-private:
-    std::filesystem::path mPath;
-};
 
 // Standard input is empty, and nothing of the caller's terminal or language gets in.
 std::string Script(const CScratchFolder& scratch, const std::string& command) {
