@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "cli/Language.h"
 
+#include "cli/DataFolder.h"
+
 #include "brindle/platform/Localization.h"
 
 #include <clocale>
@@ -11,14 +13,10 @@ namespace {
 
 namespace fs = std::filesystem;
 
-// Where the catalogues lie: beside the folder of the program, which may have been moved, or else
-// where they were installed.
+// Where the catalogues lie: with the program, or else where they were installed.
 fs::path CatalogueFolder() {
-    std::error_code error;
-    const fs::path program = fs::read_symlink("/proc/self/exe", error);
-    const fs::path beside = program.parent_path().parent_path() / "share" / "locale";
-    const bool isThere = !error && fs::is_directory(beside, error);
-    return isThere ? beside : fs::path(BRINDLE_LOCALE_FOLDER);
+    const fs::path own = SharedFolderOfProgram("locale");
+    return own.empty() ? fs::path(BRINDLE_LOCALE_FOLDER) : own;
 }
 
 }  // namespace

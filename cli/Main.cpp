@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "cli/CommandLine.h"
+#include "cli/DataFolder.h"
 #include "cli/Language.h"
 
 #include "brindle/Version.h"
@@ -49,6 +50,7 @@ TStatus Report(const CLI::App& program, const CLI::ParseError& error, const char
 
 int main(int argc, char** argv) {
     UseLanguageOfUser();
+    UseDataOfProgram();
     CLI::App program{"Music theory and harmony analysis", "brindle"};
     program.set_version_flag("--version", brindle::BrindleVersionString);
     program.require_subcommand(1);

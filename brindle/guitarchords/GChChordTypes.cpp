@@ -36,4 +36,12 @@ std::string GChChordTypeNameForId(CChordTypeId id) {
     return row == types.BuiltIn().end() ? std::string() : row->mName;
 }
 
+CChordTypeId GChChordTypeIdForSemitones(const CSemitones& semitones) {
+    const CChordTypeVec& rows = _s_chordTypes().BuiltIn();
+    const auto row = std::find_if(rows.begin(), rows.end(), [&](const CChordType& type) {
+        return type.mIntvls.ToSemitones() == semitones;
+    });
+    return row == rows.end() ? 0 : row->mId;
+}
+
 }  // namespace brindle

@@ -2,6 +2,7 @@
 #pragma once
 
 #include "brindle/chords/CChordTypes.h"
+#include "brindle/theory/CSemitones.h"
 
 #include <string>
 
@@ -16,5 +17,8 @@ namespace brindle {
 [[nodiscard]] CChordTypeId GChChordTypeIdForIndex(int index);
 /// Empty if there is none.
 [[nodiscard]] std::string GChChordTypeNameForId(CChordTypeId id);
+
+/// The first type that has these tones, in whatever octave; 0 if there is none.
+[[nodiscard]] CChordTypeId GChChordTypeIdForSemitones(const CSemitones& semitones);
 
 }  // namespace brindle
