@@ -46,6 +46,8 @@ void AddAnalyse(CLI::App& program, TStatus& status);
 void AddChord(CLI::App& program, TStatus& status);
 void AddScale(CLI::App& program, TStatus& status);
 void AddKey(CLI::App& program, TStatus& status);
+void AddGrid(CLI::App& program, TStatus& status);
+void AddGrids(CLI::App& program, TStatus& status);
 void AddName(CLI::App& program, TStatus& status);
 void AddFunction(CLI::App& program, TStatus& status);
 void AddTypes(CLI::App& program, TStatus& status);

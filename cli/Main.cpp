@@ -17,6 +17,7 @@ constexpr const char* kExamples =
     "  brindle chord F#m7/C# Bb13\n"
     "  brindle scale \"D dorian\"\n"
     "  brindle key \"F# minor\" --json\n"
+    "  brindle grid x32010\n"
     "  brindle name E2 G3 C4\n"
     "  brindle function Dm7 G7 --key C\n";
 
@@ -61,6 +62,8 @@ int main(int argc, char** argv) {
     AddChord(program, status);
     AddScale(program, status);
     AddKey(program, status);
+    AddGrid(program, status);
+    AddGrids(program, status);
     AddName(program, status);
     AddFunction(program, status);
     AddTypes(program, status);

@@ -83,10 +83,18 @@ void CSvg::Line(double x1, double y1, double x2, double y2, std::string_view col
                    Coordinate(x1), Coordinate(y1), Coordinate(x2), Coordinate(y2), color);
 }
 
+void CSvg::Circle(double x, double y, double radius, std::string_view fill, std::string_view line) {
+    fmt::format_to(std::back_inserter(mBody),
+                   R"(<circle cx="{}" cy="{}" r="{}" fill="{}" stroke="{}"/>)"
+                   "\n",
+                   Coordinate(x), Coordinate(y), Coordinate(radius), fill, line);
+}
+
 void CSvg::Text(double x, double y, std::string_view text, const TSvgFont& font) {
     fmt::format_to(std::back_inserter(mBody), R"(<text x="{}" y="{}" font-size="{}" fill="{}")",
                    Coordinate(x), Coordinate(y), Coordinate(font.mSize), font.mColor);
     if (font.mBold) mBody += R"( font-weight="bold")";
+    if (!font.mAnchor.empty()) mBody += fmt::format(R"( text-anchor="{}")", font.mAnchor);
     mBody += ">" + XmlEscaped(text) + "</text>\n";
 }
 

@@ -17,6 +17,8 @@ struct TSvgFont {
     double mSize = 12.0;
     std::string_view mColor = "#222222";
     bool mBold = false;
+    /// "middle" or "end": where the text has its x; its start otherwise.
+    std::string_view mAnchor = {};
 };
 
 /// About how wide the text is; the viewer's font decides.
@@ -28,6 +30,7 @@ public:
     void Rect(double x, double y, double width, double height, std::string_view fill,
               std::string_view tooltip = {});
     void Line(double x1, double y1, double x2, double y2, std::string_view color);
+    void Circle(double x, double y, double radius, std::string_view fill, std::string_view line);
     void Text(double x, double y, std::string_view text, const TSvgFont& font);
     /// Writes as much of the text as fits into the width.
     void TextCut(double x, double y, double width, std::string_view text, const TSvgFont& font);

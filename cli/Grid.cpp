@@ -1,0 +1,131 @@
+// SPDX-License-Identifier: MIT
+#include "cli/CommandLine.h"
+#include "cli/GridDatabase.h"
+#include "cli/Grids.h"
+#include "cli/Input.h"
+#include "cli/Names.h"
+
+#include <fmt/format.h>
+
+#include <memory>
+#include <variant>
+
+namespace brindle::cli {
+namespace {
+
+constexpr TCommandHelp kHelp{
+    "grid",
+    "Name the chord of a guitar fingering, or show the fingerings of a chord",
+    "  brindle grid x32010\n"
+    "  brindle grid x-10-12-12-11-10 --capo 2\n"
+    "  brindle grid 000232 --tuning DADGAD\n"
+    "  brindle grid Am7 F --format svg >grids.svg\n"
+    "\n"
+    "A fingering has a fret for each string from the lowest one; x is a muted string,\n"
+    "0 an open one. Frets of two digits need a - between the strings.\n",
+};
+
+constexpr int kMostCapo = 24;
+
+struct TGridOptions {
+    std::vector<std::string> mWords;
+    std::string mTuning = "EADGBE";
+    int mCapo = 0;
+    std::string mPackage;
+    CFormatOptions mFormat;
+};
+
+/// The grids of one word, or the status of an error that has been printed.
+using TGrids = std::variant<TStatus, std::vector<TGrid>>;
+
+TGrids GridsOfFrets(const std::string& word, const std::vector<int>& frets,
+                    const GChShortTuning& tuning, int capo) {
+    const auto strings = static_cast<std::size_t>(GChNumberOfStringsInShortTuning(tuning));
+    if (frets.size() != strings) {
+        return Fail(TStatus::BadInput, fmt::format("{} has {} strings, the tuning {} has {}", word,
+                                                   frets.size(), TuningText(tuning), strings));
+    }
+    auto grid = GridOfFrets(word, frets, tuning, capo);
+    if (!grid)
+        return Fail(TStatus::BadInput, word + ": a fingering has at most 15 fretted strings");
+    return std::vector{std::move(*grid)};
+}
+
+/// Looks chords up; the packages are read when the first chord is asked for.
+class CLookUp {
+public:
+    CLookUp(const TGridOptions& options, const GChShortTuning& tuning)
+        : mOptions(options), mTuning(tuning) {}
+
+    TGrids GridsOf(const std::string& word) {
+        if (mDatabase == nullptr) mDatabase = ReadGrids(mOptions.mPackage);
+        if (mDatabase == nullptr) return TStatus::BadInput;
+        const CChordLite chord(FoldAccidentals(word), NamePrefs());
+        const std::string symbol = Printable(word);
+        if (chord.IsUndef()) {
+            return Fail(TStatus::BadInput, symbol + " is neither a fingering nor a chord symbol");
+        }
+        auto grids = FindGrids(*mDatabase, symbol, chord, mTuning, mOptions.mCapo);
+        if (!grids.empty()) return grids;
+        return Fail(TStatus::BadInput,
+                    fmt::format("no fingering of {} for {}", symbol, TuningText(mTuning)));
+    }
+
+private:
+    const TGridOptions& mOptions;
+    GChShortTuning mTuning;
+    std::unique_ptr<GChDatabase> mDatabase;
+};
+
+TStatus Present(const std::vector<TGrid>& grids, const TGridOptions& options) {
+    if (options.mFormat.Format() == TFormat::Json) return Print(GridsJson(grids));
+    if (options.mFormat.Format() == TFormat::Text) return Print(GridsText(grids, CPaint()));
+    return Print(GridsSvg(grids, Printable(fmt::format("{}", fmt::join(options.mWords, " ")))));
+}
+
+TStatus Grid(const TGridOptions& options) {
+    const auto tuning = ReadTuning(options.mTuning);
+    if (!tuning) {
+        return Fail(TStatus::BadUsage, Printable(options.mTuning) +
+                                           " is no tuning: letters from the lowest string, as in "
+                                           "DADGAD, or pitches, as in E2A2D3G3B3E4");
+    }
+    auto words = options.mWords;
+    if (IsStandardInput(words)) {
+        const auto text = ReadInput("-");
+        if (!text) return TStatus::BadInput;
+        words = WordsOf(*text);
+    }
+    CLookUp lookUp(options, *tuning);
+    std::vector<TGrid> grids;
+    for (const std::string& word : words) {
+        const auto frets = ReadFrets(word);
+        TGrids found =
+            frets ? GridsOfFrets(word, *frets, *tuning, options.mCapo) : lookUp.GridsOf(word);
+        if (found.index() == 0) return std::get<0>(found);
+        for (TGrid& grid : std::get<1>(found)) grids.push_back(std::move(grid));
+    }
+    return Present(grids, options);
+}
+
+}  // namespace
+
+void AddGrid(CLI::App& program, TStatus& status) {
+    CLI::App& command = AddCommand(program, kHelp);
+    const auto options = std::make_shared<TGridOptions>();
+    command
+        .add_option("GRID", options->mWords, "Fingerings or chord symbols; - reads standard input")
+        ->required()
+        ->option_text("...");
+    command.add_option("--tuning", options->mTuning, "Open strings (default: EADGBE)")
+        ->option_text("TUNING");
+    command.add_option("--capo", options->mCapo, "Fret of the capodaster (default: 0)")
+        ->check(CLI::Range(0, kMostCapo))
+        ->option_text("N");
+    command.add_option("--package", options->mPackage, "Package to look chords up in")
+        ->option_text("PATH");
+    options->mFormat.AddTo(command, {"text", "json", "svg"});
+    command.callback([options, &status] { status = Grid(*options); });
+}
+
+}  // namespace brindle::cli

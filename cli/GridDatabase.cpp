@@ -1,0 +1,49 @@
+// SPDX-License-Identifier: MIT
+#include "cli/GridDatabase.h"
+
+#include "brindle/guitarchords/GChChordTypes.h"
+#include "brindle/guitarchords/GChFilterParameter.h"
+#include "brindle/platform/FileTree.h"
+#include "brindle/platform/Resources.h"
+#include "brindle/theory/KeyIntervals.h"
+
+#include <fmt/format.h>
+
+namespace brindle::cli {
+
+std::unique_ptr<GChDatabase> ReadGrids(const std::string& packagePath) {
+    auto database = std::make_unique<GChDatabase>();
+    const std::string path =
+        packagePath.empty() ? (ResourceFolder() / kGChFactoryPackagePath).string() : packagePath;
+    if (!database->readFromDbPackageAtPath(path)) {
+        Fail(TStatus::BadInput, fmt::format("{} is no package of chord grids", Printable(path)));
+        return nullptr;
+    }
+    if (packagePath.empty()) database->readFromDbPackageAtPath(kGChUserPackagePath);
+    return database;
+}
+
+std::vector<TGrid> FindGrids(const GChDatabase& database, std::string_view symbol,
+                             const CChordLite& chord, const GChShortTuning& tuning, int capo,
+                             std::size_t most) {
+    const CChordTypeId type = GChChordTypeIdForSemitones(chord.mSemitones);
+    if (chord.IsUndef() || type == 0) return {};
+    GChFilterParameter filter;
+    filter.setChordTypeToFilter(type);
+    filter.setRootNoteToFilter(FoldIntoOctave(chord.mRootKeyEnh.mKeyNr - capo), 0);
+    if (chord.HasBassNote()) {
+        filter.setBassNoteToFilter(FoldIntoOctave(chord.mBassKeyEnh.mKeyNr - capo), 0);
+    }
+    std::vector<TGrid> grids;
+    for (const auto& library : database.allLibrariesForAnyTuning()) {
+        if (!GChIsEqualShortTuning(library->gchTuning()->shortTuning(), tuning)) continue;
+        for (const auto& basicChord : library->basicChords()) {
+            if (grids.size() == most) return grids;
+            if (!filter.Accepts(*basicChord)) continue;
+            grids.push_back(GridOfChord(symbol, *GChChord::make(basicChord, 0), capo));
+        }
+    }
+    return grids;
+}
+
+}  // namespace brindle::cli

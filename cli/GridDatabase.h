@@ -1,0 +1,27 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "cli/Grids.h"
+
+#include "brindle/chords/CChordLite.h"
+#include "brindle/guitarchords/GChDatabase.h"
+
+#include <memory>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace brindle::cli {
+
+/// The package at a path, or for an empty path the one that comes with the program and the user's.
+/// Null when it is not there; then the error has been printed.
+[[nodiscard]] std::unique_ptr<GChDatabase> ReadGrids(const std::string& packagePath);
+
+/// The fingerings that sound a chord under a capodaster, in the order of the database; at most
+/// `most`. A bass behind a slash is only found where a library tells it.
+[[nodiscard]] std::vector<TGrid> FindGrids(const GChDatabase& database, std::string_view symbol,
+                                           const CChordLite& chord, const GChShortTuning& tuning,
+                                           int capo,
+                                           std::size_t most = static_cast<std::size_t>(-1));
+
+}  // namespace brindle::cli

@@ -1,0 +1,152 @@
+// SPDX-License-Identifier: MIT
+#include "cli/CommandLine.h"
+#include "cli/GridDatabase.h"
+#include "cli/GridJson.h"
+#include "cli/Grids.h"
+#include "cli/Input.h"
+#include "cli/Json.h"
+#include "cli/Table.h"
+
+#include "brindle/platform/FileNode.h"
+
+#include <fmt/format.h>
+
+#include <memory>
+
+namespace brindle::cli {
+namespace {
+
+constexpr TCommandHelp kHelp{
+    "grids",
+    "List, show, export and import packages of guitar fingerings",
+    "  brindle grids list\n"
+    "  brindle grids show my.gchdb --format svg >grids.svg\n"
+    "  brindle grids export my.gchdb >grids.json\n"
+    "  brindle grids import my.gchdb <grids.json\n"
+    "\n"
+    "A package is a folder with one file for each library. Without a PATH it is the\n"
+    "package that comes with the program, together with the user's own.\n",
+};
+
+struct TPackageOptions {
+    std::string mPath;
+    std::string mFile = "-";
+    CFormatOptions mFormat;
+};
+
+Json LibraryToJson(const GChLibrary& library) {
+    const auto tuning = library.gchTuning();
+    return {{"Name", library.libraryName()},
+            {"Tuning", tuning->tuningName()},
+            {"OpenStrings", GChPitchArrayFromShortTuning(tuning->shortTuning())},
+            {"Chords", library.numberOfChords()},
+            {"ReadOnly", library.isReadOnlyLibrary()}};
+}
+
+std::string LibrariesText(const GChDatabase& database) {
+    CTable table({"library", "tuning", "open strings", " chords", "read-only"});
+    for (const auto& library : database.allLibrariesForAnyTuning()) {
+        const auto tuning = library->gchTuning();
+        table.AddRow({Printable(library->libraryName()), Printable(tuning->tuningName()),
+                      tuning->tuningPitchesString(), fmt::format("{}", library->numberOfChords()),
+                      library->isReadOnlyLibrary() ? "yes" : "no"});
+    }
+    std::string text = CPaint().Faint(table.Head()) + '\n';
+    for (std::size_t row = 0; row < table.RowCount(); ++row) text += table.Row(row) + '\n';
+    return text;
+}
+
+TStatus List(const TPackageOptions& options) {
+    const auto database = ReadGrids(options.mPath);
+    if (database == nullptr) return TStatus::BadInput;
+    if (options.mFormat.Format() != TFormat::Json) return Print(LibrariesText(*database));
+    Json list = Json::array();
+    for (const auto& library : database->allLibrariesForAnyTuning()) {
+        list.push_back(LibraryToJson(*library));
+    }
+    return Print(JsonText({{"Libraries", list}}));
+}
+
+TStatus Show(const TPackageOptions& options) {
+    const auto database = ReadGrids(options.mPath);
+    if (database == nullptr) return TStatus::BadInput;
+    std::vector<TGrid> grids;
+    for (const auto& library : database->allLibrariesForAnyTuning()) {
+        for (const auto& chord : library->basicChords()) {
+            grids.push_back(GridOfChord("", *GChChord::make(chord, 0), 0));
+            grids.back().mSymbol = grids.back().mName;
+        }
+    }
+    if (options.mFormat.Format() == TFormat::Json) return Print(GridsJson(grids));
+    if (options.mFormat.Format() == TFormat::Svg) return Print(GridsSvg(grids, "Chord grids"));
+    return Print(GridsText(grids, CPaint()));
+}
+
+TStatus Export(const TPackageOptions& options) {
+    const auto database = ReadGrids(options.mPath);
+    if (database == nullptr) return TStatus::BadInput;
+    return Print(JsonText(DatabaseToJson(*database)));
+}
+
+/// Whether the files of a package give back what is written into them.
+bool CanBeKept(const GChDatabase& database) {
+    GChDatabase readBack;
+    readBack.readFromDbPackageWrapper(database.writeLibrariesToDbPackageWrapper(false), {});
+    return DatabaseToJson(readBack) == DatabaseToJson(database);
+}
+
+TStatus Import(const TPackageOptions& options) {
+    const auto text = ReadInput(options.mFile);
+    if (!text) return TStatus::BadInput;
+    const std::string from =
+        options.mFile == "-" ? std::string("standard input") : Printable(options.mFile);
+    const Json json = Json::parse(*text, nullptr, false);
+    if (json.is_discarded()) return Fail(TStatus::BadInput, from + " is no JSON");
+    GChDatabase database;
+    std::string fault = ReadDatabase(json, database);
+    if (fault.empty() && !CanBeKept(database)) {
+        fault =
+            "a package cannot keep all of it; a fingering has 1 to 15 elements, these lie within "
+            "8 frets, and of more than 8 strings the upper ones are muted together";
+    }
+    if (!fault.empty()) return Fail(TStatus::BadInput, from + ": " + fault);
+    if (GChDatabase::writeLibraries(database.allLibrariesForAnyTuning(), options.mPath)) {
+        return TStatus::Success;
+    }
+    return Fail(
+        TStatus::BadInput,
+        Printable(options.mPath) + " cannot be written, or holds something else than a package");
+}
+
+using TAction = TStatus (*)(const TPackageOptions&);
+
+/// Adds "grids <name>"; `formats` are none for an action that has only one.
+CLI::App& AddAction(CLI::App& command, const char* name, const char* purpose, TAction action,
+                    const std::vector<std::string>& formats,
+                    const std::shared_ptr<TPackageOptions>& options, TStatus& status) {
+    CLI::App& subcommand = *command.add_subcommand(name, purpose);
+    subcommand.add_option("PATH", options->mPath, "The package")->option_text(" ");
+    if (!formats.empty()) options->mFormat.AddTo(subcommand, formats);
+    subcommand.callback([options, action, &status] { status = action(*options); });
+    return subcommand;
+}
+
+}  // namespace
+
+void AddGrids(CLI::App& program, TStatus& status) {
+    CLI::App& command = AddCommand(program, kHelp);
+    command.require_subcommand(1);
+    const auto options = [] { return std::make_shared<TPackageOptions>(); };
+    AddAction(command, "list", "Show the libraries", List, {"text", "json"}, options(), status);
+    AddAction(command, "show", "Draw all fingerings", Show, {"text", "json", "svg"}, options(),
+              status);
+    AddAction(command, "export", "Print a package as JSON", Export, {}, options(), status);
+    const auto importOptions = options();
+    CLI::App& importing = AddAction(command, "import", "Replace a package by what JSON holds",
+                                    Import, {}, importOptions, status);
+    importing.get_option("PATH")->required();
+    importing.add_option("--from", importOptions->mFile, "The JSON (default: standard input)")
+        ->option_text("FILE");
+}
+
+}  // namespace brindle::cli

@@ -1,0 +1,18 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+namespace brindle::cli {
+
+class CSvg;
+struct TGrid;
+
+// Distances of a diagram in full size, in pixels.
+inline constexpr double kGridStringGap = 16.0;
+inline constexpr double kGridFretGap = 20.0;
+
+/// Draws a diagram without its name into a picture. `left` is the lowest string, `top` the upper
+/// end of the strings; open and muted strings are marked above that. A diagram smaller than full
+/// size shows no fingers.
+void DrawGrid(CSvg& svg, const TGrid& grid, double left, double top, double scale);
+
+}  // namespace brindle::cli
