@@ -60,6 +60,7 @@ CMarkovTransitionMap CMarkovFileTransitions::ToMap(const CIteratorIndexConverter
         history.resize(length);
         std::generate(history.begin(), history.end(), nextSymbol);
         const bool isKnown =
+            length <= kMarkovLongestHistoryInFile &&
             std::none_of(history.begin(), history.end(),
                          [&](MarkovIterator symbol) { return converter.IsEnd(symbol); });
         for (std::uint32_t pair = 0; pair < pairs; ++pair) {

@@ -1,17 +1,25 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/markov/CMarkovObject.h"
 
+#include <cmath>
 #include <functional>
 #include <ostream>
 
 namespace brindle {
 namespace {
 
+// What is not a number comes first: without a place of its own it would equal all numbers, and
+// there would be no order.
+bool NumberComesBefore(double a, double b) {
+    return std::isnan(a) ? !std::isnan(b) : a < b;
+}
+
 bool ChordComesBefore(const CHarmAnlsChordWithLength& a, const CHarmAnlsChordWithLength& b) {
     if (a.mRootDistToHarmCenter != b.mRootDistToHarmCenter) {
         return a.mRootDistToHarmCenter < b.mRootDistToHarmCenter;
     }
-    if (a.mLength != b.mLength) return a.mLength < b.mLength;
+    if (NumberComesBefore(a.mLength, b.mLength)) return true;
+    if (NumberComesBefore(b.mLength, a.mLength)) return false;
     if (a.mBassDistToHarmCenter != b.mBassDistToHarmCenter) {
         return a.mBassDistToHarmCenter < b.mBassDistToHarmCenter;
     }
@@ -50,7 +58,7 @@ bool operator<(const CMarkovObject& a, const CMarkovObject& b) {
         case TMarkovObjectType_Number:
             return a.mNumber < b.mNumber;
         case TMarkovObjectType_Value:
-            return a.mValue < b.mValue;
+            return NumberComesBefore(a.mValue, b.mValue);
         case TMarkovObjectType_Indexed:
             return a.mIndex < b.mIndex;
     }

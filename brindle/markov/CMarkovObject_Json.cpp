@@ -37,10 +37,12 @@ CMarkovObject CMarkovObject::JSONDeserialization_Helper::CMarkovObjectFromJSONDi
     CMarkovObject object;
     switch (IntegerIn(dictionary, "Type").value_or(0)) {
         case TMarkovObjectType_Chord: {
+            // Never a copy: those of deeply nested values go as deep into the program's stack.
+            static const json none = json::object();
             const auto chord = dictionary.find("CHarmAnlsChordWithLength");
             object.mChord = CHarmAnlsChordWithLength::JSONDeserializer_Helper::
-                CHarmAnlsChordWithLengthFromJSONDictionary(
-                    chord == dictionary.end() ? json::object() : *chord);
+                CHarmAnlsChordWithLengthFromJSONDictionary(chord == dictionary.end() ? none
+                                                                                     : *chord);
             break;
         }
         case TMarkovObjectType_Start:

@@ -73,11 +73,11 @@ void VariableLengthMarkovModel::RemoveNonFittingSymbolsFromProbabilities(MarkovP
 std::int64_t VariableLengthMarkovModel::GetMaxLengthFromProbabilities(
     const MarkovProbabilities& map) {
     if (map.empty()) return 0;
-    double longest = map.begin()->first->mChord.mLength;
-    for (const auto& [symbol, value] : map) longest = std::max(longest, symbol->mChord.mLength);
     // Beyond this a double holds no whole beats, and an integer soon no double.
     constexpr double limit = 9007199254740992.0;
-    return static_cast<std::int64_t>(std::clamp(longest, -limit, limit));
+    double longest = -limit;
+    for (const auto& [symbol, value] : map) longest = std::max(longest, symbol->mChord.mLength);
+    return static_cast<std::int64_t>(std::min(longest, limit));
 }
 
 }  // namespace brindle

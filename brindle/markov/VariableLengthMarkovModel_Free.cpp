@@ -80,9 +80,13 @@ void VariableLengthMarkovModel::AddWeightOfEnding(std::uint64_t length,
                                                   const TMarkovGenerateOptions& options) {
     const MarkovIterator endSymbol = mObjects.getIteratorToObject(CMarkovObject_End);
     const std::uint64_t shortest = std::max<std::uint64_t>(options.mMinHistoryLength, 1);
+    MarkovSequence window;
+    HistorySubvector(length, window);
+    const MarkovSequenceView history(window);
     MarkovProbabilities table;
     for (;; --length) {
-        ProbabilitiesForNextSymbol(length, table);
+        ProbabilitiesForNextSymbol(history.last(std::min<std::size_t>(length, history.size())),
+                                   table);
         const auto end = endSymbol == mObjects.end() ? table.end() : table.find(endSymbol);
         if (end == table.end() && length > shortest) continue;
         sequence.mLogProbability += end == table.end() ? kNever : std::log(end->second);

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/markov/CIteratorIndexConverter.h"
 #include "brindle/markov/VariableLengthMarkovModel.h"
-#include "brindle/markov/internal/CMarkovFileTransitions.h"
+#include "brindle/markov/internal/ParseMarkovFile.h"
 #include "brindle/platform/AtomicFile.h"
 #include "brindle/platform/DictionaryValues.h"
 #include "brindle/platform/PlainText.h"
@@ -16,9 +16,6 @@ namespace {
 using nlohmann::json;
 using PlainText::Write;
 using PlainText::WriteInteger;
-
-constexpr const char* kModelKey = "VariableLengthMarkovModel";
-constexpr const char* kTransitionsKey = "TransitionMap";
 
 /// Writes all elements with a separator between them.
 template <class List, class WriteElement>
@@ -58,43 +55,12 @@ const json& ListIn(const json& dictionary, const char* key) {
     return list == dictionary.end() || !list->is_array() ? none : *list;
 }
 
-/// Takes the entries of the transition map out of a model file while it is parsed, so that only
-/// their numbers are kept.
-class CTransitionsFilter {
-public:
-    explicit CTransitionsFilter(CMarkovFileTransitions& transitions) : mTransitions(transitions) {}
-
-    /// False for what the parser need not keep.
-    bool operator()(int depth, json::parse_event_t event, const json& parsed) {
-        if (event == json::parse_event_t::key) {
-            OnKey(depth, parsed.get_ref<const std::string&>());
-        } else if (event == json::parse_event_t::array_end && depth == 3 && mIsInTransitions) {
-            mTransitions.Add(parsed);
-            return false;
-        }
-        return true;
-    }
-
-private:
-    void OnKey(int depth, const std::string& key) {
-        if (depth == 1) mIsInModel = key == kModelKey;
-        if (depth > 2) return;
-        mIsInTransitions = depth == 2 && mIsInModel && key == kTransitionsKey;
-        // Of several members of one name the last one counts.
-        if (mIsInTransitions || (depth == 1 && mIsInModel)) mTransitions.Clear();
-    }
-
-    CMarkovFileTransitions& mTransitions;
-    bool mIsInModel = false;
-    bool mIsInTransitions = false;
-};
-
 void FillModel(const json& dictionary, const CMarkovFileTransitions& transitions,
                VariableLengthMarkovModel& model) {
     using Helper = VariableLengthMarkovModel::JSONDeserialization_Helper;
     model.Clear();
-    model.mMaxHistoryLength = static_cast<std::uint64_t>(
-        std::max(IntegerIn(dictionary, "MaxHistoryLength").value_or(0), 0));
+    model.mMaxHistoryLength = static_cast<std::uint64_t>(std::clamp(
+        IntegerIn(dictionary, "MaxHistoryLength").value_or(0), 0, kMarkovLongestHistoryInFile));
     model.mObjects =
         CMarkovObjects::JSONDeserialization_Helper::CMarkovObjectsFromJSONDictionary(dictionary);
     CIteratorIndexConverter converter(model.mObjects);
@@ -104,7 +70,7 @@ void FillModel(const json& dictionary, const CMarkovFileTransitions& transitions
 
 CMarkovFileTransitions TransitionsIn(const json& dictionary) {
     CMarkovFileTransitions transitions;
-    for (const json& entry : ListIn(dictionary, kTransitionsKey)) transitions.Add(entry);
+    for (const json& entry : ListIn(dictionary, kMarkovTransitionsKey)) transitions.Add(entry);
     return transitions;
 }
 
@@ -151,9 +117,8 @@ bool VariableLengthMarkovModel::JSONDeserialization_Helper::VariableLengthMarkov
 void VariableLengthMarkovModel::JSONDeserialization_Helper::VariableLengthMarkovModelFromJSONString(
     const std::string& text, VariableLengthMarkovModel& model) {
     CMarkovFileTransitions transitions;
-    CTransitionsFilter filter(transitions);
-    const json file = json::parse(text, std::ref(filter), false);
-    const auto found = file.is_object() ? file.find(kModelKey) : file.end();
+    const json file = ParseMarkovFile(text, transitions);
+    const auto found = file.find(kMarkovModelKey);
     if (found == file.end()) {
         FillModel(json::object(), {}, model);
     } else {

@@ -10,6 +10,10 @@
 
 namespace brindle {
 
+/// Models whose histories are longer are not read: a file of some megabytes could otherwise make
+/// counts without end, one for each length and symbol.
+inline constexpr int kMarkovLongestHistoryInFile = 256;
+
 /// The entries of "TransitionMap" in a model file, as numbers. They take a fraction of the room
 /// that the JSON takes, so that a reader can let go of that entry by entry.
 class CMarkovFileTransitions {
@@ -19,7 +23,7 @@ public:
     void Clear() { mNumbers.clear(); }
 
     /// The map with all shorter histories. Entries and successors whose index names no symbol are
-    /// left out.
+    /// left out, and so are entries of more than kMarkovLongestHistoryInFile symbols.
     [[nodiscard]] CMarkovTransitionMap ToMap(const CIteratorIndexConverter& converter) const;
 
 private:
