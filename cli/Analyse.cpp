@@ -7,6 +7,7 @@
 #include "cli/LeadSheet.h"
 #include "cli/Names.h"
 #include "cli/SongCopies.h"
+#include "cli/SongKeys.h"
 
 #include "brindle/analysis/CAnalyseHarmCenterAlternatives.h"
 #include "brindle/analysis/TChordStringParse.h"
@@ -90,12 +91,20 @@ TSong SongOf(const TAnalysedSong& analysed, const TAnalyseOptions& options) {
     return MakeSong(analysed.mAnalyse, readings, *analysed.mSymbols, options.mBeatsPerBar);
 }
 
+TSongKeys KeysOf(const TAnalysedSong& analysed, const TAnalyseOptions& options) {
+    const double beatsPerBar =
+        analysed.mSheet ? BeatsPerBarOf(*analysed.mSheet) : options.mBeatsPerBar;
+    return MakeSongKeys(analysed.mAnalyse.mChords, *analysed.mSymbols,
+                        {.mBeatsPerBar = beatsPerBar});
+}
+
 std::string Present(const TAnalysedSong& analysed, const TAnalyseOptions& options) {
     switch (options.mFormat.Format()) {
         case TFormat::Json:
             return AnalysisJson(analysed.mAnalyse,
                                 options.mReadings ? &analysed.mReadings : nullptr,
-                                *analysed.mSymbols, analysed.mSheet ? &*analysed.mSheet : nullptr);
+                                *analysed.mSymbols, KeysOf(analysed, options),
+                                analysed.mSheet ? &*analysed.mSheet : nullptr);
         case TFormat::Native: {
             std::ostringstream native;
             analysed.mAnalyse.AppendJSONString(native);

@@ -18,7 +18,7 @@ class CChordSymbols;
 /// Strict JSON, see docs/json.md. `readings` and `sheet` may be null.
 [[nodiscard]] std::string AnalysisJson(const CHarmonicAnalyse& analyse,
                                        const CHarmAnlsCenters* readings,
-                                       const CChordSymbols& symbols,
+                                       const CChordSymbols& symbols, const TSongKeys& keys,
                                        const TMusicXMLDoc* sheet = nullptr);
 
 /// A picture: chords along a time axis, bands for sign keys, centers and readings.

@@ -3,6 +3,7 @@
 
 #include "cli/ChordSymbols.h"
 #include "cli/Json.h"
+#include "cli/KeysJson.h"
 #include "cli/Names.h"
 #include "cli/Output.h"
 
@@ -105,12 +106,14 @@ Json ScoreToJson(const TMusicXMLDoc& sheet) {
 }  // namespace
 
 std::string AnalysisJson(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings,
-                         const CChordSymbols& symbols, const TMusicXMLDoc* sheet) {
+                         const CChordSymbols& symbols, const TSongKeys& keys,
+                         const TMusicXMLDoc* sheet) {
     const CJsonMaker maker(symbols);
     Json json;
     if (sheet != nullptr) json["Score"] = ScoreToJson(*sheet);
     json["HarmSignKeys"] = maker.List(analyse.mSignKeys);
     if (readings != nullptr) json["Readings"] = maker.List(*readings);
+    AppendKeysJson(json, keys);
     return JsonText(json);
 }
 

@@ -2,6 +2,7 @@
 #include "cli/Analysis.h"
 
 #include "cli/Bars.h"
+#include "cli/KeysView.h"
 #include "cli/Names.h"
 #include "cli/Table.h"
 
@@ -64,6 +65,13 @@ public:
         StartParagraph();
         mText += mPaint.Strong("Chords outside of every center") + "\n\n";
         WriteChords(chords);
+    }
+
+    void WriteKeys(const TSongKeys& keys) {
+        const std::string summary = KeysSummary(keys, mBars, mPaint);
+        if (summary.empty()) return;
+        StartParagraph();
+        mText += summary;
     }
 
     void WriteReadings(const std::vector<TShownCenter>& readings) {
@@ -155,6 +163,7 @@ std::string AnalysisText(const TSong& song, const CPaint& paint) {
     writer.WriteScore(song);
     for (const TShownSignKey& signKey : song.mSignKeys) writer.Write(signKey);
     writer.WriteLooseChords(song.mLooseChords);
+    writer.WriteKeys(song.mKeys);
     if (song.mHasReadings) writer.WriteReadings(song.mReadings);
     return std::move(writer).Text();
 }

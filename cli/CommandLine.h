@@ -7,6 +7,10 @@
 #include <string>
 #include <vector>
 
+namespace brindle {
+struct TNumeralOptions;
+}
+
 namespace brindle::cli {
 
 /// What a subcommand is called, what it does, and calls of it that work.
@@ -40,6 +44,9 @@ private:
     bool mJson = false;
 };
 
+/// Adds the options that tell how numerals are written.
+void AddNumeralOptions(CLI::App& command, TNumeralOptions& options);
+
 // The subcommands. `status` receives the outcome when the command line asks for the command.
 
 void AddAnalyse(CLI::App& program, TStatus& status);
@@ -54,5 +61,7 @@ void AddTypes(CLI::App& program, TStatus& status);
 void AddNet(CLI::App& program, TStatus& status);
 void AddCopies(CLI::App& program, TStatus& status);
 void AddVector(CLI::App& program, TStatus& status);
+void AddKeys(CLI::App& program, TStatus& status);
+void AddNumerals(CLI::App& program, TStatus& status);
 
 }  // namespace brindle::cli

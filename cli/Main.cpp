@@ -18,6 +18,8 @@ constexpr const char* kExamples =
     "  brindle scale \"D dorian\"\n"
     "  brindle key \"F# minor\" --json\n"
     "  brindle grid x32010\n"
+    "  brindle keys --file song.txt\n"
+    "  brindle numerals \"ii7 V7 I^7\" --key \"Eb major\"\n"
     "  brindle name E2 G3 C4\n"
     "  brindle function Dm7 G7 --key C\n";
 
@@ -70,6 +72,8 @@ int main(int argc, char** argv) {
     AddNet(program, status);
     AddCopies(program, status);
     AddVector(program, status);
+    AddKeys(program, status);
+    AddNumerals(program, status);
     try {
         program.parse(argc, argv);
     } catch (const CLI::ParseError& error) {

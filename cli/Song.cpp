@@ -5,6 +5,7 @@
 #include "cli/LeadSheet.h"
 #include "cli/Names.h"
 #include "cli/Output.h"
+#include "cli/SongKeys.h"
 
 #include <fmt/format.h>
 
@@ -124,8 +125,9 @@ TShownScore ScoreOf(const TMusicXMLDoc& sheet) {
     return score;
 }
 
-// The length of the bars of a score whose bar lines are not known.
-double FirstBarLength(const TMusicXMLDoc& sheet) {
+}  // namespace
+
+double BeatsPerBarOf(const TMusicXMLDoc& sheet) {
     if (sheet.TimeSignatures.empty()) return kUsualBeatsPerBar;
     const TMusicXMLTimeSignature& time = sheet.TimeSignatures.front();
     if (time.mNumerator < 1 || time.mDenominator < 1) return kUsualBeatsPerBar;
@@ -133,11 +135,9 @@ double FirstBarLength(const TMusicXMLDoc& sheet) {
     return length >= 1.0 / 64 && length <= 1024.0 ? length : kUsualBeatsPerBar;
 }
 
-}  // namespace
-
 TSong MakeSong(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings,
                const CChordSymbols& symbols, const TMusicXMLDoc& sheet) {
-    TSong song = MakeSong(analyse, readings, symbols, FirstBarLength(sheet));
+    TSong song = MakeSong(analyse, readings, symbols, BeatsPerBarOf(sheet));
     song.mScore = ScoreOf(sheet);
     for (const CHarmBarline& barline : sheet.HarmBarlines) {
         song.mBarStarts.push_back(barline.mPosition);
@@ -155,6 +155,7 @@ TSong MakeSong(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings
         song.mSignKeys.push_back(maker.Show(signKey));
     }
     song.mLooseChords = maker.LooseChords(song);
+    song.mKeys = MakeSongKeys(analyse.mChords, symbols, {.mBeatsPerBar = beatsPerBar});
     if (readings != nullptr) {
         song.mHasReadings = true;
         for (const CHarmAnlsCenter& reading : *readings) {

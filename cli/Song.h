@@ -5,6 +5,7 @@
 #include "brindle/analysis/CHarmCopy.h"
 #include "brindle/analysis/CHarmonicAnalyse.h"
 
+#include <array>
 #include <cstddef>
 #include <string>
 #include <vector>
@@ -79,6 +80,29 @@ struct TShownScore {
     std::vector<TCopy> mCopies;
 };
 
+/// A chord with its numeral in the key of its region; empty for a chord that is none.
+struct TShownNumeral {
+    TRange mRange;
+    std::string mSymbol;
+    std::string mNumeral;
+};
+
+struct TShownKeyRegion {
+    CSignKeyLite mKey;
+    std::string mName;
+    TRange mRange;
+    std::vector<TShownNumeral> mChords;
+};
+
+/// The key of a song and its local keys as they are shown.
+struct TSongKeys {
+    CSignKeyLite mKey;
+    std::string mName = "none";
+    double mConfidence = kPosUndef;
+    std::array<double, 24> mScores{};
+    std::vector<TShownKeyRegion> mRegions;
+};
+
 /// An analysis prepared for the eye: named, with the length of each chord, each chord once, and
 /// without the end marker.
 struct TSong {
@@ -93,6 +117,7 @@ struct TSong {
     std::vector<TShownCopy> mCopies;
     std::vector<TShownCenter> mReadings;
     bool mHasReadings = false;
+    TSongKeys mKeys;
 };
 
 /// Calls `function` with every chord of the text: those of the centers, then the loose ones.
@@ -109,6 +134,9 @@ void ForEachChord(const TSong& song, const TFunction& function) {
 /// `readings` may be null.
 [[nodiscard]] TSong MakeSong(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings,
                              const CChordSymbols& symbols, double beatsPerBar);
+
+/// The length of the bars of a score by its first time signature.
+[[nodiscard]] double BeatsPerBarOf(const TMusicXMLDoc& sheet);
 
 /// The same for the chords of a score.
 [[nodiscard]] TSong MakeSong(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings,

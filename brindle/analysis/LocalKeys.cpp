@@ -9,13 +9,12 @@
 
 #include <algorithm>
 #include <cmath>
+#include <limits>
 
 namespace brindle {
 namespace {
 
 using TPointsOfKeys = std::array<double, kKeyCount>;
-/// [from][to]
-using TChangeCosts = std::array<TPointsOfKeys, kKeyCount>;
 using TKeysBefore = std::array<std::uint8_t, kKeyCount>;
 
 constexpr double kShortestInBars = 1.0 / 16;
@@ -40,45 +39,78 @@ double ChangeCost(int from, int to, double base) {
     return base + kKeyChangeCosts.mFifth * std::min(FifthsBetween(from, to), kMostFifths);
 }
 
+/// What the changes cost, [from][to], and the range of that. To stay costs nothing, so the most is
+/// not below that.
+struct TChangeCosts {
+    std::array<TPointsOfKeys, kKeyCount> mCosts{};
+    double mLeast = std::numeric_limits<double>::infinity();
+    double mMost = 0.0;
+};
+
 TChangeCosts ChangeCosts(double base) {
-    TChangeCosts costs{};
+    TChangeCosts costs;
     for (int from = 0; from < kKeyCount; ++from) {
         for (int to = 0; to < kKeyCount; ++to) {
-            costs[static_cast<std::size_t>(from)][static_cast<std::size_t>(to)] =
-                ChangeCost(from, to, base);
+            if (from == to) continue;
+            const double cost = ChangeCost(from, to, base);
+            costs.mCosts[static_cast<std::size_t>(from)][static_cast<std::size_t>(to)] = cost;
+            costs.mLeast = std::min(costs.mLeast, cost);
+            costs.mMost = std::max(costs.mMost, cost);
         }
     }
     return costs;
 }
 
+double Weight(const TKeyChord& chord, double beatsPerBar) {
+    return std::sqrt(
+        std::sqrt(std::clamp(chord.mBeats / beatsPerBar, kShortestInBars, kLongestInBars)));
+}
+
+// How far above the tonic of the key.
+std::size_t DistToTonic(int root, int key) {
+    const int dist = root - TonicOfKey(key);
+    return static_cast<std::size_t>(dist < 0 ? dist + 12 : dist);
+}
+
 TPointsOfKeys Gains(const TKeyChord& chord, int home, const CKeyOptions& options) {
-    const double bars =
-        std::clamp(chord.mBeats / options.mBeatsPerBar, kShortestInBars, kLongestInBars);
-    const double weight = std::sqrt(std::sqrt(bars));
+    const double weight = Weight(chord, options.mBeatsPerBar);
+    const auto pointsIn = [&](int key) {
+        return kKeyLocalTable[static_cast<std::size_t>(ModeOfKey(key))][chord.mClass]
+                             [DistToTonic(chord.mRoot, key)];
+    };
     TPointsOfKeys gains;
     for (int key = 0; key < kKeyCount; ++key) {
-        const auto& row = kKeyLocalTable[static_cast<std::size_t>(ModeOfKey(key))][chord.mClass];
-        const int dist = FoldIntoOctave(chord.mRoot - TonicOfKey(key));
-        gains[static_cast<std::size_t>(key)] = weight * (row[static_cast<std::size_t>(dist)] +
-                                                         (key == home ? options.mHomeBonus : 0.0));
+        gains[static_cast<std::size_t>(key)] = weight * pointsIn(key);
     }
+    gains[static_cast<std::size_t>(home)] = weight * (pointsIn(home) + options.mHomeBonus);
     return gains;
 }
 
-// Moves `best` on by one chord. Tells for each key from which key its best path comes, the lowest
-// of equal ones. The inner loop is free of branches, so that it runs on several keys at once.
+// Takes for each key the better way into it, from the key `from` or from where it comes now; of
+// equal ones the lower key. Free of branches, so that it runs on several keys at once.
+void ChangeFrom(std::size_t from, double best, const TPointsOfKeys& costs, TPointsOfKeys& points,
+                TPointsOfKeys& before) {
+    const auto number = static_cast<double>(from);
+    for (std::size_t to = 0; to < kKeyCount; ++to) {
+        const double candidate = best - costs[to];
+        const bool isBetter =
+            (candidate > points[to]) | ((candidate == points[to]) & (number < before[to]));
+        points[to] = isBetter ? candidate : points[to];
+        before[to] = isBetter ? number : before[to];
+    }
+}
+
+// Moves `best` on by one chord, and tells from which key the best path into each key comes.
 TKeysBefore StepOn(TPointsOfKeys& best, const TPointsOfKeys& gains, const TChangeCosts& costs) {
-    TPointsOfKeys points;
-    TPointsOfKeys before{};
-    for (std::size_t to = 0; to < kKeyCount; ++to) points[to] = best[0] - costs[0][to];
-    for (std::size_t from = 1; from < kKeyCount; ++from) {
-        const auto number = static_cast<double>(from);
-        for (std::size_t to = 0; to < kKeyCount; ++to) {
-            const double candidate = best[from] - costs[from][to];
-            const bool isBetter = candidate > points[to];
-            points[to] = isBetter ? candidate : points[to];
-            before[to] = isBetter ? number : before[to];
-        }
+    TPointsOfKeys points = best;
+    TPointsOfKeys before;
+    for (std::size_t to = 0; to < kKeyCount; ++to) before[to] = static_cast<double>(to);
+    // A key from which the nearest change is worse than the farthest from the leading key is never
+    // where a change comes from. That leaves few.
+    const double needed = *std::max_element(best.begin(), best.end()) - costs.mMost;
+    for (std::size_t from = 0; from < kKeyCount; ++from) {
+        if (best[from] - costs.mLeast < needed) continue;
+        ChangeFrom(from, best[from], costs.mCosts[from], points, before);
     }
     TKeysBefore keys;
     for (std::size_t to = 0; to < kKeyCount; ++to) {
@@ -90,7 +122,7 @@ TKeysBefore StepOn(TPointsOfKeys& best, const TPointsOfKeys& gains, const TChang
 
 bool IsSecondDegree(const TKeyChord& chord, int key) {
     return (chord.mClass == TKeyChordClass_Min7 || chord.mClass == TKeyChordClass_HDim) &&
-           FoldIntoOctave(chord.mRoot - TonicOfKey(key)) == 2;
+           DistToTonic(chord.mRoot, key) == 2;
 }
 
 bool IsDominant(const TKeyChord& chord, int key) {

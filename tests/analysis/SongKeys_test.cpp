@@ -6,6 +6,8 @@
 #include "brindle/analysis/CKeyOfSong.h"
 #include "brindle/analysis/RomanNumeral.h"
 #include "brindle/analysis/TChordStringParse.h"
+#include "brindle/analysis/internal/KeyScores.h"
+#include "brindle/analysis/internal/KeyTables.h"
 #include "brindle/theory/KeyIntervals.h"
 
 #include <doctest/doctest.h>
@@ -231,6 +233,74 @@ TEST_CASE("What is written twice, or as no chord, makes the chord before longer"
         CHECK(same.mRegions[0].mBegin == 0);
         CHECK(same.mRegions[0].mEnd == chords.size() - 1);
         CHECK(same.mRegions[0].mEndPosition == 16.0);
+    }
+}
+
+// The best path, word for word and slowly. Pivots apart.
+std::vector<std::uint8_t> PlainPath(const std::vector<TKeyChord>& chords, int home,
+                                    const CKeyOptions& options) {
+    const auto gain = [&](const TKeyChord& chord, int k) {
+        const double bars = std::clamp(chord.mBeats / options.mBeatsPerBar, 1.0 / 16, 4.0);
+        const auto dist = static_cast<std::size_t>((chord.mRoot - k % 12 + 12) % 12);
+        const double points = kKeyLocalTable[static_cast<std::size_t>(k / 12)][chord.mClass][dist];
+        return std::sqrt(std::sqrt(bars)) * (points + (k == home ? options.mHomeBonus : 0.0));
+    };
+    const auto cost = [&](int a, int b) {
+        if (a == b) return 0.0;
+        if (a % 12 == b % 12) return options.mChangeCost + 1.0;
+        const auto fifths = [](int k) { return (k % 12 + (k < 12 ? 0 : 3)) * 7; };
+        const int up = (fifths(a) - fifths(b) + 120) % 12;
+        return options.mChangeCost + 0.5 * std::min({up, 12 - up, 3});
+    };
+    std::vector<std::array<double, 24>> best(chords.size());
+    std::vector<std::array<int, 24>> from(chords.size());
+    for (std::size_t i = 0; i < chords.size(); ++i) {
+        for (int k = 0; k < 24; ++k) {
+            int a = 0;
+            const auto way = [&](int b) {
+                return best[i - 1][static_cast<std::size_t>(b)] - cost(b, k);
+            };
+            for (int b = 1; i > 0 && b < 24; ++b) {
+                if (way(b) > way(a)) a = b;
+            }
+            const auto ix = static_cast<std::size_t>(k);
+            best[i][ix] = gain(chords[i], k) + (i > 0 ? way(a) : 0.0);
+            from[i][ix] = a;
+        }
+    }
+    std::vector<std::uint8_t> path(chords.size());
+    const auto& last = best.back();
+    auto key = std::max_element(last.begin(), last.end()) - last.begin();
+    for (std::size_t i = chords.size(); i-- > 0;) {
+        path[i] = static_cast<std::uint8_t>(key);
+        key = from[i][static_cast<std::size_t>(key)];
+    }
+    return path;
+}
+
+TEST_CASE("The path through the keys is the best one, the lower key where two are equal") {
+    for (std::uint32_t seed = 1; seed <= 300; ++seed) {
+        CChance chance(seed);
+        CHarmAnlsChords song = RandomSong(chance);
+        // Beats of one length have equal ways.
+        if (chance.OneIn(2)) {
+            for (std::size_t i = 0; i < song.size(); ++i)
+                song[i].mPosition = static_cast<double>(i);
+        }
+        std::vector<TKeyChord> chords = KeyChordsOf(song);
+        // No seventh on a second degree is left, so that there is no pivot.
+        for (TKeyChord& chord : chords) {
+            if (chord.mClass == TKeyChordClass_Min7) chord.mClass = TKeyChordClass_Min;
+            if (chord.mClass == TKeyChordClass_HDim) chord.mClass = TKeyChordClass_Dim;
+        }
+        if (chords.empty()) continue;
+        const int home = static_cast<int>(chance.Below(24));
+        for (const double change : {4.0, 0.0, -3.0, 1.5, 50.0}) {
+            CAPTURE(seed);
+            CAPTURE(change);
+            const CKeyOptions options{4.0, 0.3, change};
+            CHECK(LocalKeys(chords, home, options) == PlainPath(chords, home, options));
+        }
     }
 }
 

@@ -71,8 +71,9 @@ TEST_CASE("All JSON of the program is strict") {
           "brindle key --json 'G# major'",
           "brindle name --json --all-roots C4 E4 --slash-text $'\\xff\"'",
           "brindle copies --json $'C\\xff\" F C\\xff\" F'", "brindle vector --json $'\\xff\"' C",
-          "brindle function --json X --key C", "brindle types --json",
-          "brindle net weights --json"}) {
+          "brindle keys --json 'C . X C/Q | nochord'", "brindle keys --json ''",
+          "brindle numerals --json 'I V7/ii | ii' --key $'C'", "brindle function --json X --key C",
+          "brindle types --json", "brindle net weights --json"}) {
         INFO(command);
         const auto json = nlohmann::json::parse(RunCommand(command).mShown, nullptr, false);
         CHECK_FALSE(json.is_discarded());

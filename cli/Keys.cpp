@@ -1,0 +1,145 @@
+// SPDX-License-Identifier: MIT
+#include "cli/ChordSymbols.h"
+#include "cli/CommandLine.h"
+#include "cli/Input.h"
+#include "cli/KeysJson.h"
+#include "cli/KeysView.h"
+#include "cli/LeadSheet.h"
+#include "cli/Names.h"
+#include "cli/SongKeys.h"
+
+#include "brindle/analysis/CHarmonicAnalyse.h"
+#include "brindle/analysis/TChordStringParse.h"
+
+#include <memory>
+#include <optional>
+
+namespace brindle::cli {
+namespace {
+
+constexpr TCommandHelp kHelp{
+    "keys",
+    "Find the key of a song and the keys that it passes through, with Roman numerals",
+    "  brindle keys \"Dm7 G7 | Cmaj7 . | Fm7 Bb7 | Ebmaj7 .\" --beats-per-chord 2\n"
+    "  brindle keys --file song.txt --beats-per-bar 3 --format svg >keys.svg\n"
+    "  brindle keys song.musicxml --nashville\n"
+    "  cat song.txt | brindle keys - --json\n"
+    "\n"
+    "A chord text has chord symbols between white space; | goes on to the next bar\n"
+    "line, and . holds the chord before it for one more step. A score in MusicXML\n"
+    "(.musicxml, .xml, .mxl) is played through its repeats, endings and jumps.\n",
+};
+
+// A step or a bar this short or long is a slip of the finger, and so are more points than this.
+constexpr double kShortest = 1.0 / 1024;
+constexpr double kLongest = 1024.0;
+constexpr double kMostPoints = 1000.0;
+
+struct TKeysOptions {
+    std::vector<std::string> mWords;
+    std::string mFile;
+    double mBeatsPerChord = 1.0;
+    CKeyOptions mKeys;
+    TNumeralOptions mNumerals;
+    CFormatOptions mFormat;
+};
+
+// What is wrong with options that are fine one by one.
+std::optional<std::string> Contradiction(const TKeysOptions& options) {
+    if (options.mWords.empty() && options.mFile.empty()) {
+        return "a song is needed: a TEXT, a score, --file PATH, or - for standard input";
+    }
+    if (!options.mWords.empty() && !options.mFile.empty()) {
+        return "a TEXT and --file PATH are two songs, one is needed";
+    }
+    for (const double beats : {options.mKeys.mBeatsPerBar, options.mBeatsPerChord}) {
+        if (beats >= kShortest && beats <= kLongest) continue;
+        return "--beats-per-bar and --beats-per-chord take 1/1024 to 1024 beats";
+    }
+    for (const double points : {options.mKeys.mHomeBonus, options.mKeys.mChangeCost}) {
+        if (points >= 0.0 && points <= kMostPoints) continue;
+        return "--home-bonus and --change-cost take 0 to 1000 points";
+    }
+    return std::nullopt;
+}
+
+std::string Present(const TSong& song, TFormat format) {
+    if (format == TFormat::Svg) return KeysSvg(song);
+    if (format != TFormat::Json) return KeysText(song, CPaint());
+    Json json;
+    AppendKeysJson(json, song.mKeys);
+    json["KeyOfSong"]["Scores"] = KeyScoresJson(song.mKeys);
+    return JsonText(json);
+}
+
+TSong SongOfText(const TTypedSong& typed, const TKeysOptions& options) {
+    TChordStringParse parse;
+    parse.mBeatsPerBar = options.mKeys.mBeatsPerBar;
+    parse.mBeatsPerChord = options.mBeatsPerChord;
+    parse.mChordNamePrefs = NamePrefs();
+    CHarmonicAnalyse chordsOnly;
+    chordsOnly.mChords.ParseStringIntoChords(FoldAccidentals(typed.mText), parse);
+    const CChordSymbols symbols(typed.mText, parse, chordsOnly.mChords);
+    TSong song = MakeSong(chordsOnly, nullptr, symbols, parse.mBeatsPerBar);
+    song.mKeys = MakeSongKeys(chordsOnly.mChords, symbols, options.mKeys, options.mNumerals);
+    return song;
+}
+
+TSong SongOfScore(TMusicXMLDoc& sheet, const TKeysOptions& options) {
+    CHarmonicAnalyse chordsOnly;
+    chordsOnly.AnalyseFromMusicXMLDoc(sheet, TAnalyse_None);
+    chordsOnly.mChords = WithRests(chordsOnly.mChords, sheet);
+    const CChordSymbols symbols(sheet, chordsOnly.mChords);
+    TSong song = MakeSong(chordsOnly, nullptr, symbols, sheet);
+    CKeyOptions keyOptions = options.mKeys;
+    keyOptions.mBeatsPerBar = BeatsPerBarOf(sheet);
+    song.mKeys = MakeSongKeys(chordsOnly.mChords, symbols, keyOptions, options.mNumerals);
+    return song;
+}
+
+TStatus Keys(const TKeysOptions& options) {
+    if (const auto contradiction = Contradiction(options)) {
+        return Fail(TStatus::BadUsage, *contradiction);
+    }
+    const auto typed = ReadTypedSong(options.mWords, options.mFile);
+    if (!typed) return TStatus::BadInput;
+    const TFormat format = options.mFormat.Format();
+    if (!typed->mIsScore) return Print(Present(SongOfText(*typed, options), format));
+    auto sheet = ReadLeadSheet(*typed, TTiming::Played);
+    if (!sheet) return TStatus::BadInput;
+    return Print(Present(SongOfScore(*sheet, options), format));
+}
+
+}  // namespace
+
+void AddKeys(CLI::App& program, TStatus& status) {
+    CLI::App& command = AddCommand(program, kHelp);
+    const auto options = std::make_shared<TKeysOptions>();
+    command
+        .add_option("TEXT", options->mWords,
+                    "Chord text, or the name of a score; - reads standard input")
+        ->option_text("...");
+    command.add_option("--file", options->mFile, "Read the chord text or the score from a file")
+        ->option_text("PATH");
+    command
+        .add_option("--beats-per-bar", options->mKeys.mBeatsPerBar,
+                    "Length of a bar in beats (default: 4)")
+        ->option_text("BEATS");
+    command
+        .add_option("--beats-per-chord", options->mBeatsPerChord,
+                    "Length of a chord in beats (default: 1)")
+        ->option_text("BEATS");
+    command
+        .add_option("--home-bonus", options->mKeys.mHomeBonus,
+                    "What a chord gains in the key of the song (default: 0.3)")
+        ->option_text("POINTS");
+    command
+        .add_option("--change-cost", options->mKeys.mChangeCost,
+                    "What the nearest change of key costs (default: 4)")
+        ->option_text("POINTS");
+    AddNumeralOptions(command, options->mNumerals);
+    options->mFormat.AddTo(command, {"text", "json", "svg"});
+    command.callback([options, &status] { status = Keys(*options); });
+}
+
+}  // namespace brindle::cli
