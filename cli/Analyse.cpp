@@ -8,6 +8,7 @@
 #include "cli/Names.h"
 #include "cli/SongCopies.h"
 #include "cli/SongKeys.h"
+#include "cli/TypedChords.h"
 
 #include "brindle/analysis/CAnalyseHarmCenterAlternatives.h"
 #include "brindle/analysis/TChordStringParse.h"
@@ -28,11 +29,13 @@ constexpr TCommandHelp kHelp{
     "  brindle analyse --key \"A minor\" --readings \"Am Dm | E7 Am\"\n"
     "  brindle analyse --file song.txt --beats-per-bar 3 --format svg >song.svg\n"
     "  brindle analyse song.musicxml --format svg >song.svg\n"
+    "  brindle analyse --from chordpro --beats-per-chord 4 --file song.cho\n"
     "  cat song.txt | brindle analyse - --json\n"
     "\n"
     "A chord text has chord symbols between white space; | goes on to the next bar\n"
-    "line, and . holds the chord before it for one more step. A score in MusicXML\n"
-    "(.musicxml, .xml, .mxl) is played through its repeats, endings and jumps.\n",
+    "line, . holds the chord before it for one more step, and what stands between |:\n"
+    "and :| is played twice. A score in MusicXML (.musicxml, .xml, .mxl) is played\n"
+    "through its repeats, endings and jumps.\n",
 };
 
 // A step or a bar this short or long is a slip of the finger.
@@ -47,6 +50,7 @@ struct TAnalyseOptions {
     std::string mTiming = "played";
     double mBeatsPerBar = 4.0;
     double mBeatsPerChord = 1.0;
+    CTypedChords mReading;
     bool mReadings = false;
     CFormatOptions mFormat;
 };
@@ -81,6 +85,7 @@ struct TAnalysedSong {
     CHarmAnlsCenters mReadings;
     std::optional<CChordSymbols> mSymbols;
     std::optional<TMusicXMLDoc> mSheet;
+    double mBeatsPerBar = 4.0;
 };
 
 TSong SongOf(const TAnalysedSong& analysed, const TAnalyseOptions& options) {
@@ -88,12 +93,12 @@ TSong SongOf(const TAnalysedSong& analysed, const TAnalyseOptions& options) {
     if (analysed.mSheet) {
         return MakeSong(analysed.mAnalyse, readings, *analysed.mSymbols, *analysed.mSheet);
     }
-    return MakeSong(analysed.mAnalyse, readings, *analysed.mSymbols, options.mBeatsPerBar);
+    return MakeSong(analysed.mAnalyse, readings, *analysed.mSymbols, analysed.mBeatsPerBar);
 }
 
-TSongKeys KeysOf(const TAnalysedSong& analysed, const TAnalyseOptions& options) {
+TSongKeys KeysOf(const TAnalysedSong& analysed) {
     const double beatsPerBar =
-        analysed.mSheet ? BeatsPerBarOf(*analysed.mSheet) : options.mBeatsPerBar;
+        analysed.mSheet ? BeatsPerBarOf(*analysed.mSheet) : analysed.mBeatsPerBar;
     return MakeSongKeys(analysed.mAnalyse.mChords, *analysed.mSymbols,
                         {.mBeatsPerBar = beatsPerBar});
 }
@@ -103,7 +108,7 @@ std::string Present(const TAnalysedSong& analysed, const TAnalyseOptions& option
         case TFormat::Json:
             return AnalysisJson(analysed.mAnalyse,
                                 options.mReadings ? &analysed.mReadings : nullptr,
-                                *analysed.mSymbols, KeysOf(analysed, options),
+                                *analysed.mSymbols, KeysOf(analysed),
                                 analysed.mSheet ? &*analysed.mSheet : nullptr);
         case TFormat::Native: {
             std::ostringstream native;
@@ -121,15 +126,32 @@ std::string Present(const TAnalysedSong& analysed, const TAnalyseOptions& option
     return AnalysisText(SongOf(analysed, options), CPaint());
 }
 
-void AnalyseText(const TTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
-                 const TAnalyseOptions& options, TAnalysedSong& analysed) {
+// The key that a chord text states for itself, if it is one.
+CHarmAnlsSignKeys StatedKey(const std::string& typed) {
+    const TKeyText key = ReadKeyText(FoldAccidentals(typed));
+    if (typed.empty() || !key.mError.empty()) return {};
+    CHarmAnlsSignKey stated;
+    stated.mPosition = 0.0;
+    stated.mSignKey = key.mSignKey;
+    return {stated};
+}
+
+TStatus AnalyseText(const TTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
+                    const TAnalyseOptions& options, TAnalysedSong& analysed) {
     TChordStringParse parse;
     parse.mBeatsPerBar = options.mBeatsPerBar;
     parse.mBeatsPerChord = options.mBeatsPerChord;
     parse.mChordNamePrefs = NamePrefs();
-    analysed.mAnalyse.AnalyseFromChordString(FoldAccidentals(typed.mText), signKeys,
-                                             RouteOf(options.mRoute), parse);
-    analysed.mSymbols.emplace(typed.mText, parse, analysed.mAnalyse.mChords);
+    CTypedChords reading = options.mReading;
+    if (options.mFormat.Format() == TFormat::Native) reading.UseNative();
+    const auto song = reading.ReadSongOrFail(typed.mText, parse);
+    if (!song) return TStatus::BadInput;
+    analysed.mAnalyse.AnalyseFromChords(song->mChords,
+                                        signKeys.empty() ? StatedKey(song->mKey) : signKeys,
+                                        RouteOf(options.mRoute));
+    analysed.mSymbols = song->mSymbols;
+    analysed.mBeatsPerBar = song->mBeatsPerBar;
+    return TStatus::Success;
 }
 
 TStatus AnalyseScore(const TTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
@@ -174,12 +196,9 @@ TStatus Analyse(const TAnalyseOptions& options) {
     if (!typed) return TStatus::BadInput;
 
     TAnalysedSong analysed;
-    if (typed->mIsScore) {
-        const TStatus status = AnalyseScore(*typed, signKeys, options, analysed);
-        if (status != TStatus::Success) return status;
-    } else {
-        AnalyseText(*typed, signKeys, options, analysed);
-    }
+    const TStatus status = typed->mIsScore ? AnalyseScore(*typed, signKeys, options, analysed)
+                                           : AnalyseText(*typed, signKeys, options, analysed);
+    if (status != TStatus::Success) return status;
     if (options.mReadings) {
         analysed.mReadings =
             CAnalyseHarmCenterAlternatives(analysed.mAnalyse.mChords).BestResults();
@@ -214,6 +233,7 @@ void AddAnalyse(CLI::App& program, TStatus& status) {
               "How the chords of a score follow each other");
     command.add_flag("--readings", options->mReadings,
                      "Show all readings that progressions to a tonic allow");
+    options->mReading.AddTo(command, "In what form the chord text is written");
     options->mFormat.AddTo(command, {"text", "json", "native", "svg"});
     command.callback([options, &status] { status = Analyse(*options); });
 }

@@ -4,6 +4,7 @@
 #include "cli/Json.h"
 #include "cli/Names.h"
 #include "cli/Table.h"
+#include "cli/TypedChords.h"
 
 #include "brindle/chords/CChordLite.h"
 
@@ -19,11 +20,13 @@ constexpr TCommandHelp kHelp{
     "Read chord symbols: root, bass, semitones, basic chord and hash code",
     "  brindle chord F#m7/C# Bb13\n"
     "  brindle chord \"C maj 7\" --json\n"
+    "  brindle chord CΔ Co7 \"F♯m7♭5\" C7alt Ab:min/b3\n"
     "  cat symbols.txt | brindle chord -\n",
 };
 
 struct TChordOptions {
     std::vector<std::string> mSymbols;
+    CTypedChords mReading;
     CFormatOptions mFormat;
 };
 
@@ -74,9 +77,11 @@ std::string ChordsText(const std::vector<TReadChord>& chords, const CPaint& pain
 TStatus Chord(const TChordOptions& options) {
     const auto symbols = TypedSymbols(options.mSymbols);
     if (!symbols) return TStatus::BadInput;
+    const auto read = options.mReading.ReadSymbols(*symbols);
+    if (!read) return TStatus::BadInput;
     std::vector<TReadChord> chords;
-    for (const std::string& symbol : *symbols) {
-        chords.push_back({Printable(symbol), {FoldAccidentals(symbol), NamePrefs()}});
+    for (std::size_t i = 0; i < symbols->size(); ++i) {
+        chords.push_back({Printable((*symbols)[i]), (*read)[i]});
     }
     return Print(options.mFormat.Format() == TFormat::Json ? ChordsJson(chords)
                                                            : ChordsText(chords, CPaint()));
@@ -90,6 +95,7 @@ void AddChord(CLI::App& program, TStatus& status) {
     command.add_option("SYMBOL", options->mSymbols, "Chord symbols; - reads standard input")
         ->required()
         ->option_text("...");
+    options->mReading.AddTo(command);
     options->mFormat.AddTo(command, {"text", "json"});
     command.callback([options, &status] { status = Chord(*options); });
 }

@@ -35,13 +35,16 @@ std::vector<std::string> ChordTokens(std::string_view text, const TChordStringPa
 }  // namespace
 
 CChordSymbols::CChordSymbols(std::string_view text, const TChordStringParse& parse,
+                             const CHarmAnlsChords& chords)
+    : CChordSymbols(ChordTokens(text, parse), chords) {}
+
+CChordSymbols::CChordSymbols(const std::vector<std::string>& symbols,
                              const CHarmAnlsChords& chords) {
-    const std::vector<std::string> tokens = ChordTokens(text, parse);
-    const std::size_t count = std::min(tokens.size(), chords.size());
+    const std::size_t count = std::min(symbols.size(), chords.size());
     for (std::size_t i = 0; i < count; ++i) {
         mPositions.push_back(chords[i].mPosition);
         mChords.push_back(chords[i]);
-        mSymbols.push_back(Printable(tokens[i]));
+        mSymbols.push_back(Printable(symbols[i]));
     }
 }
 

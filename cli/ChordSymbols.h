@@ -18,7 +18,11 @@ namespace brindle::cli {
 /// presentation asks here, so that printed chord names have one place.
 class CChordSymbols {
 public:
-    /// `text` is the chord text and `chords` what the analysis read from it.
+    CChordSymbols() = default;
+    /// The symbol of each chord but the end marker.
+    CChordSymbols(const std::vector<std::string>& symbols, const CHarmAnlsChords& chords);
+    /// What CHarmAnlsChords::ParseStringIntoChords reads: `text` is the chord text and `chords`
+    /// what it read from it.
     CChordSymbols(std::string_view text, const TChordStringParse& parse,
                   const CHarmAnlsChords& chords);
 

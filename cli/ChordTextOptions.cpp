@@ -4,6 +4,8 @@
 #include "cli/Input.h"
 #include "cli/Names.h"
 
+#include "brindle/analysis/TChordStringParse.h"
+
 namespace brindle::cli {
 namespace {
 
@@ -21,6 +23,7 @@ void CChordTextOptions::AddTo(CLI::App& command) {
     command
         .add_option("--beats-per-chord", mBeatsPerChord, "Length of a chord in beats (default: 1)")
         ->option_text("BEATS");
+    mReading.AddTo(command, "In what form the chord text is written");
 }
 
 std::optional<std::string> CChordTextOptions::Contradiction() const {
@@ -37,16 +40,14 @@ std::optional<std::string> CChordTextOptions::Contradiction() const {
     return std::nullopt;
 }
 
-std::optional<std::string> CChordTextOptions::Read() const {
-    return mFile.empty() ? TextFromWords(mWords) : ReadInput(mFile);
-}
-
-TChordStringParse CChordTextOptions::Parse() const {
+std::optional<TChordSong> CChordTextOptions::ReadSong() const {
+    const auto typed = mFile.empty() ? TextFromWords(mWords) : ReadInput(mFile);
+    if (!typed) return std::nullopt;
     TChordStringParse parse;
     parse.mBeatsPerBar = mBeatsPerBar;
     parse.mBeatsPerChord = mBeatsPerChord;
     parse.mChordNamePrefs = NamePrefs();
-    return parse;
+    return mReading.ReadSongOrFail(*typed, parse);
 }
 
 }  // namespace brindle::cli

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "brindle/analysis/TChordStringParse.h"
+#include "cli/TypedChords.h"
 
 #include <CLI/CLI.hpp>
 #include <optional>
@@ -10,24 +10,22 @@
 
 namespace brindle::cli {
 
-/// The options of a command that reads one chord text: TEXT, --file and the beats.
+/// The options of a command that reads one chord text: TEXT, --file, the beats, and how it is read.
 class CChordTextOptions {
 public:
     void AddTo(CLI::App& command);
 
     /// What is wrong with options that are fine one by one.
     [[nodiscard]] std::optional<std::string> Contradiction() const;
-    /// The text as the user wrote it. Nothing when it cannot be read; then the error has been
-    /// printed.
-    [[nodiscard]] std::optional<std::string> Read() const;
-    [[nodiscard]] TChordStringParse Parse() const;
-    [[nodiscard]] double BeatsPerBar() const { return mBeatsPerBar; }
+    /// The song. Nothing when it cannot be read; then the error has been printed.
+    [[nodiscard]] std::optional<TChordSong> ReadSong() const;
 
 private:
     std::vector<std::string> mWords;
     std::string mFile;
     double mBeatsPerBar = 4.0;
     double mBeatsPerChord = 1.0;
+    CTypedChords mReading;
 };
 
 }  // namespace brindle::cli

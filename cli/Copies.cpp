@@ -3,7 +3,6 @@
 #include "cli/ChordSymbols.h"
 #include "cli/ChordTextOptions.h"
 #include "cli/CommandLine.h"
-#include "cli/Input.h"
 #include "cli/Json.h"
 #include "cli/SongCopies.h"
 #include "cli/Table.h"
@@ -67,16 +66,14 @@ TStatus Copies(const TCopiesOptions& options) {
     if (const auto contradiction = options.mText.Contradiction()) {
         return Fail(TStatus::BadUsage, *contradiction);
     }
-    const auto typed = options.mText.Read();
-    if (!typed) return TStatus::BadInput;
-    const TChordStringParse parse = options.mText.Parse();
+    auto song = options.mText.ReadSong();
+    if (!song) return TStatus::BadInput;
     CHarmonicAnalyse chordsOnly;
-    chordsOnly.mChords.ParseStringIntoChords(FoldAccidentals(*typed), parse);
-    const CChordSymbols symbols(*typed, parse, chordsOnly.mChords);
-    const std::vector<TShownCopy> copies = MakeSongCopies(chordsOnly, symbols);
+    chordsOnly.mChords = std::move(song->mChords);
+    const std::vector<TShownCopy> copies = MakeSongCopies(chordsOnly, song->mSymbols);
     return Print(options.mFormat.Format() == TFormat::Json
                      ? CopiesJson(copies)
-                     : CopiesText(copies, options.mText.BeatsPerBar(), CPaint()));
+                     : CopiesText(copies, song->mBeatsPerBar, CPaint()));
 }
 
 }  // namespace

@@ -5,6 +5,7 @@
 #include "cli/KeyText.h"
 #include "cli/Names.h"
 #include "cli/Table.h"
+#include "cli/TypedChords.h"
 
 #include "brindle/chords/CChordHeavy.h"
 #include "brindle/chords/CChordLite.h"
@@ -29,6 +30,7 @@ constexpr TCommandHelp kHelp{
 struct TFunctionOptions {
     std::vector<std::string> mSymbols;
     std::string mKey;
+    CTypedChords mReading;
     CFormatOptions mFormat;
 };
 
@@ -41,8 +43,8 @@ struct TChordFunction {
     int mBassDegree = -1;
 };
 
-TChordFunction FunctionOf(const std::string& symbol, const CSignKeyHeavy& key) {
-    const CChordLite chord(FoldAccidentals(symbol), NamePrefs());
+TChordFunction FunctionOf(const std::string& symbol, const CChordLite& chord,
+                          const CSignKeyHeavy& key) {
     const CChordHeavy heavy = chord.ToChordHeavy(CChordHeavy::DefaultWrapIntvl);
     TChordFunction function;
     function.mSymbol = Printable(symbol);
@@ -105,9 +107,13 @@ TStatus Function(const TFunctionOptions& options) {
     }
     const auto symbols = TypedSymbols(options.mSymbols);
     if (!symbols) return TStatus::BadInput;
+    const auto chords = options.mReading.ReadSymbols(*symbols);
+    if (!chords) return TStatus::BadInput;
     const CSignKeyHeavy signKey = key.mSignKey.ToSignKeyHeavy();
     std::vector<TChordFunction> functions;
-    for (const std::string& symbol : *symbols) functions.push_back(FunctionOf(symbol, signKey));
+    for (std::size_t i = 0; i < symbols->size(); ++i) {
+        functions.push_back(FunctionOf((*symbols)[i], (*chords)[i], signKey));
+    }
     return Print(options.mFormat.Format() == TFormat::Json ? FunctionsJson(key.mSignKey, functions)
                                                            : FunctionsText(functions, CPaint()));
 }
@@ -123,6 +129,7 @@ void AddFunction(CLI::App& program, TStatus& status) {
     command.add_option("--key", options->mKey, "The key, as in \"A minor\" or Bb")
         ->required()
         ->option_text("KEY");
+    options->mReading.AddTo(command);
     options->mFormat.AddTo(command, {"text", "json"});
     command.callback([options, &status] { status = Function(*options); });
 }

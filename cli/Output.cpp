@@ -53,6 +53,17 @@ TStatus FailAt(TStatus status, std::string_view message, std::string_view input,
     return status;
 }
 
+TStatus FailAtCharacter(TStatus status, std::string_view message, std::string_view input,
+                        std::size_t column) {
+    constexpr std::size_t kShownBefore = 60;
+    constexpr std::size_t kShownBehind = 40;
+    const std::size_t before = column > 0 ? column - 1 : 0;
+    const std::size_t hidden = before > kShownBefore ? before - kShownBefore : 0;
+    input.remove_prefix(FirstCharacters(input, hidden).size());
+    const std::string shown = FirstCharacters(input, before - hidden + kShownBehind);
+    return FailAt(status, message, shown, FirstCharacters(shown, before - hidden).size());
+}
+
 TStatus Print(std::string_view text) {
     const bool written = std::fwrite(text.data(), 1, text.size(), stdout) == text.size();
     if (written && std::fflush(stdout) == 0) return TStatus::Success;

@@ -24,6 +24,10 @@ TStatus Fail(TStatus status, std::string_view message);
 TStatus FailAt(TStatus status, std::string_view message, std::string_view input,
                std::size_t column);
 
+/// The same with `column` counted in characters from 1, and of a long input the part around it.
+TStatus FailAtCharacter(TStatus status, std::string_view message, std::string_view input,
+                        std::size_t column);
+
 /// Writes a whole result to standard output; a full disk is an error.
 TStatus Print(std::string_view text);
 

@@ -4,12 +4,14 @@
 #include "cli/Json.h"
 #include "cli/Names.h"
 #include "cli/Table.h"
+#include "cli/TypedChords.h"
 
 #include "brindle/analysis/CHarmAnlsChordForMetro.h"
 #include "brindle/analysis/ChordVectorText.h"
 #include "brindle/chords/CChordHeavy.h"
 
 #include <algorithm>
+#include <iterator>
 #include <memory>
 
 namespace brindle::cli {
@@ -29,6 +31,7 @@ constexpr TCommandHelp kHelp{
 
 struct TVectorOptions {
     std::vector<std::string> mWords;
+    CTypedChords mReading;
     CFormatOptions mFormat;
 };
 
@@ -45,7 +48,7 @@ bool IsVectorText(std::string_view typed) {
     return !typed.empty() && std::string_view("01[{").find(typed.front()) != typed.npos;
 }
 
-TShownVector Show(const std::string& typed) {
+TShownVector Show(const std::string& typed, const CChordLite& chord) {
     TShownVector shown;
     if (IsVectorText(typed)) {
         TChordVectorText text = ReadChordVector(typed);
@@ -54,8 +57,7 @@ TShownVector Show(const std::string& typed) {
         shown.mColumn = text.mColumn;
     } else {
         shown.mSymbol = Printable(typed);
-        const CHarmAnlsChordForMetro chord(CChordLite(FoldAccidentals(typed), NamePrefs()));
-        shown.mVector = chord.GetChordVectorRepresentation();
+        shown.mVector = CHarmAnlsChordForMetro(chord).GetChordVectorRepresentation();
     }
     shown.mReadBack.SetFromChordVectorRepresentation(shown.mVector);
     return shown;
@@ -143,9 +145,14 @@ std::optional<std::vector<std::string>> TypedThings(const std::vector<std::strin
 TStatus Vector(const TVectorOptions& options) {
     const auto things = TypedThings(options.mWords);
     if (!things) return TStatus::BadInput;
+    std::vector<std::string> symbols;
+    std::remove_copy_if(things->begin(), things->end(), std::back_inserter(symbols), IsVectorText);
+    const auto chords = options.mReading.ReadSymbols(symbols);
+    if (!chords) return TStatus::BadInput;
     std::vector<TShownVector> vectors;
+    auto chord = chords->begin();
     for (const std::string& typed : *things) {
-        vectors.push_back(Show(typed));
+        vectors.push_back(Show(typed, IsVectorText(typed) ? CChordLite() : *chord++));
         const TShownVector& shown = vectors.back();
         if (shown.mError.empty()) continue;
         return FailAt(TStatus::BadInput, shown.mError, typed, shown.mColumn);
@@ -164,6 +171,7 @@ void AddVector(CLI::App& program, TStatus& status) {
                     "Chord symbols or vectors; - reads standard input, a vector or chords a line")
         ->required()
         ->option_text("...");
+    options->mReading.AddTo(command);
     options->mFormat.AddTo(command, {"text", "json"});
     command.callback([options, &status] { status = Vector(*options); });
 }

@@ -1,0 +1,69 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "cli/ChordSymbols.h"
+
+#include "brindle/analysis/CHarmAnlsChords.h"
+#include "brindle/analysis/ReadChordSheet.h"
+
+#include <CLI/CLI.hpp>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace brindle {
+struct TChordStringParse;
+}
+
+namespace brindle::cli {
+
+/// A song as somebody typed it.
+struct TChordSong {
+    /// With the end marker.
+    CHarmAnlsChords mChords;
+    CChordSymbols mSymbols;
+    /// That of the song, or of the options if the song does not tell.
+    double mBeatsPerBar = 4.0;
+    /// Empty if the song does not tell.
+    std::string mKey;
+    /// What is not understood. Without --lenient the first fault, and then no chords.
+    std::vector<CChordSheetFault> mFaults;
+};
+
+/// How chords and songs that people type are read, with the options for it: --symbols and
+/// --lenient, and for songs --from and --even. Every subcommand that takes chords reads them here.
+class CTypedChords {
+public:
+    void AddTo(CLI::App& command);
+    void AddTo(CLI::App& command, const std::string& fromPurpose);
+
+    /// As --symbols native: by the parser that hosts use, which has no faults.
+    void UseNative() { mReader = "native"; }
+    [[nodiscard]] bool IsLenient() const { return mIsLenient; }
+
+    /// The chords of typed symbols, one for each; any H among them makes them all German. Nothing
+    /// when one is not understood; then the error has been printed.
+    [[nodiscard]] std::optional<std::vector<CChordLite>> ReadSymbols(
+        const std::vector<std::string>& symbols) const;
+    [[nodiscard]] std::optional<CChordLite> ReadSymbol(const std::string& symbol) const;
+
+    /// Reads a song and leaves its faults to the caller. The beats are those of `parse`.
+    [[nodiscard]] TChordSong ReadSong(std::string_view text, const TChordStringParse& parse) const;
+    /// The same with the faults printed: as warnings with --lenient, else as an error, and then
+    /// there is no song.
+    [[nodiscard]] std::optional<TChordSong> ReadSongOrFail(std::string_view text,
+                                                           const TChordStringParse& parse) const;
+
+private:
+    [[nodiscard]] bool IsNative() const { return mReader == "native"; }
+    [[nodiscard]] bool TakeReading(const std::string& symbol, const CChordTextReading& reading,
+                                   std::vector<CChordLite>& chords) const;
+
+    std::string mReader = "all";
+    std::string mForm = "plain";
+    bool mIsLenient = false;
+    bool mIsEven = false;
+};
+
+}  // namespace brindle::cli
