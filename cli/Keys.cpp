@@ -7,6 +7,7 @@
 #include "cli/LeadSheet.h"
 #include "cli/Names.h"
 #include "cli/SongKeys.h"
+#include "cli/TypedChords.h"
 
 #include "brindle/analysis/CHarmonicAnalyse.h"
 #include "brindle/analysis/TChordStringParse.h"
@@ -41,6 +42,7 @@ struct TKeysOptions {
     double mBeatsPerChord = 1.0;
     CKeyOptions mKeys;
     TNumeralOptions mNumerals;
+    CTypedChords mReading;
     CFormatOptions mFormat;
 };
 
@@ -72,16 +74,20 @@ std::string Present(const TSong& song, TFormat format) {
     return JsonText(json);
 }
 
-TSong SongOfText(const TTypedSong& typed, const TKeysOptions& options) {
+// Nothing when the text is not understood; then the error has been printed.
+std::optional<TSong> SongOfText(const TTypedSong& typed, const TKeysOptions& options) {
     TChordStringParse parse;
     parse.mBeatsPerBar = options.mKeys.mBeatsPerBar;
     parse.mBeatsPerChord = options.mBeatsPerChord;
     parse.mChordNamePrefs = NamePrefs();
+    auto read = options.mReading.ReadSongOrFail(typed.mText, parse);
+    if (!read) return std::nullopt;
     CHarmonicAnalyse chordsOnly;
-    chordsOnly.mChords.ParseStringIntoChords(FoldAccidentals(typed.mText), parse);
-    const CChordSymbols symbols(typed.mText, parse, chordsOnly.mChords);
-    TSong song = MakeSong(chordsOnly, nullptr, symbols, parse.mBeatsPerBar);
-    song.mKeys = MakeSongKeys(chordsOnly.mChords, symbols, options.mKeys, options.mNumerals);
+    chordsOnly.mChords = std::move(read->mChords);
+    TSong song = MakeSong(chordsOnly, nullptr, read->mSymbols, read->mBeatsPerBar);
+    CKeyOptions keyOptions = options.mKeys;
+    keyOptions.mBeatsPerBar = read->mBeatsPerBar;
+    song.mKeys = MakeSongKeys(chordsOnly.mChords, read->mSymbols, keyOptions, options.mNumerals);
     return song;
 }
 
@@ -104,7 +110,10 @@ TStatus Keys(const TKeysOptions& options) {
     const auto typed = ReadTypedSong(options.mWords, options.mFile);
     if (!typed) return TStatus::BadInput;
     const TFormat format = options.mFormat.Format();
-    if (!typed->mIsScore) return Print(Present(SongOfText(*typed, options), format));
+    if (!typed->mIsScore) {
+        const auto song = SongOfText(*typed, options);
+        return song ? Print(Present(*song, format)) : TStatus::BadInput;
+    }
     auto sheet = ReadLeadSheet(*typed, TTiming::Played);
     if (!sheet) return TStatus::BadInput;
     return Print(Present(SongOfScore(*sheet, options), format));
@@ -138,6 +147,7 @@ void AddKeys(CLI::App& program, TStatus& status) {
                     "What the nearest change of key costs (default: 4)")
         ->option_text("POINTS");
     AddNumeralOptions(command, options->mNumerals);
+    options->mReading.AddTo(command, "In what form the chord text is written");
     options->mFormat.AddTo(command, {"text", "json", "svg"});
     command.callback([options, &status] { status = Keys(*options); });
 }

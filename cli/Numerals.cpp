@@ -9,6 +9,7 @@
 #include "brindle/analysis/CKeyOfSong.h"
 #include "brindle/analysis/RomanNumeral.h"
 #include "brindle/chords/CChordHeavy.h"
+#include "brindle/chords/ReadChordText.h"
 
 #include <fmt/format.h>
 
@@ -73,7 +74,7 @@ bool ReadChord(TWord& word, bool isNumeral, const CSignKeyLite& key,
                const TNumeralOptions& options) {
     if (word.IsMark()) return true;
     if (!isNumeral) {
-        word.mChord.SetFromString(FoldAccidentals(word.mTyped), NamePrefs());
+        word.mChord = ReadChordText(word.mTyped).mChord;
     } else if (const auto chord = ChordFromNumeral(word.mTyped, key, options)) {
         word.mChord = *chord;
     }
