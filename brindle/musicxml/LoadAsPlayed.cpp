@@ -5,6 +5,7 @@
 #include "brindle/musicxml/internal/ScoreReader.h"
 #include "brindle/platform/AtomicFile.h"
 #include "brindle/platform/Error.h"
+#include "brindle/platform/Utf8.h"
 
 #include <fmt/format.h>
 
@@ -36,29 +37,11 @@ std::string_view WithoutLeadingWhite(std::string_view bytes) {
     return bytes.substr(std::min(bytes.find_first_not_of(" \t\r\n"), bytes.size()));
 }
 
-// How many bytes of the text are one character of UTF-8, 0 if they are none.
-std::size_t CharacterLength(std::string_view text) {
-    const auto first = static_cast<unsigned char>(text.front());
-    const std::size_t length = first < 0x80   ? 1
-                               : first < 0xC2 ? 0
-                               : first < 0xE0 ? 2
-                               : first < 0xF0 ? 3
-                               : first < 0xF5 ? 4
-                                              : 0;
-    if (length > text.size()) return 0;
-    const auto isRest = [](char byte) { return (static_cast<unsigned char>(byte) & 0xC0) == 0x80; };
-    return std::all_of(text.begin() + 1,
-                       text.begin() + static_cast<std::ptrdiff_t>(std::max<std::size_t>(length, 1)),
-                       isRest)
-               ? length
-               : 0;
-}
-
 // The bytes as UTF-8 if they are Latin-1 with letters that UTF-8 does not know.
 std::optional<std::string> FromLatin1(std::string_view bytes) {
     bool isUtf8 = true;
     for (std::string_view rest = bytes; !rest.empty() && isUtf8;) {
-        const std::size_t length = CharacterLength(rest);
+        const std::size_t length = Utf8Length(rest);
         isUtf8 = length > 0;
         rest.remove_prefix(length);
     }

@@ -7,6 +7,18 @@
 
 namespace brindle {
 
+namespace {
+
+// What most elements of a score begin with is not among these, so that one look passes them over.
+constexpr std::string_view kFirstLettersOfElements = "cdehmrs";
+constexpr std::string_view kFirstLettersOfTexts = "bdfkmrw";
+
+bool MayMatter(std::string_view name, std::string_view firstLetters) {
+    return !name.empty() && firstLetters.find(name.front()) != firstLetters.npos;
+}
+
+}  // namespace
+
 void MusicXmlParserHarmonyDelegate::didStartDocument(XmlStreamParser&) {
     lastSegno = -1;
     lastCoda = -1;
@@ -30,7 +42,7 @@ void MusicXmlParserHarmonyDelegate::didStartElement(XmlStreamParser&, std::strin
         measures.emplace_back();
         return;
     }
-    if (measures.empty()) return;
+    if (measures.empty() || !MayMatter(name, kFirstLettersOfElements)) return;
     TMusicXMLMeasure& measure = measures.back();
     if (name == "harmony") {
         measure.mHarmonies.emplace_back();
@@ -72,7 +84,7 @@ void MusicXmlParserHarmonyDelegate::didEndElement(XmlStreamParser&, std::string_
 
 void MusicXmlParserHarmonyDelegate::foundCharacters(XmlStreamParser&, std::string_view text) {
     const std::string_view name = currentElementName;
-    if (name.empty()) return;
+    if (!MayMatter(name, kFirstLettersOfTexts)) return;
     if (name == "movement-title") musicXMLDoc.Title = text;
     if (measures.empty()) return;
     TMusicXMLMeasure& measure = measures.back();

@@ -18,6 +18,11 @@ public:
     CWalk(const TWrittenMeasures& written, TMusicXMLDoc& doc) : mWritten(written), mDoc(doc) {}
 
     bool Run() {
+        std::size_t count = 0;
+        for (const TMusicXMLMeasure& measure : mWritten.mMeasures) {
+            count += measure.mHarmonies.size();
+        }
+        mDoc.Harmonies.reserve(count);
         for (std::size_t played = 0; IsInside(mIx); ++played) {
             if (played == kMaxPlayedMeasures || mBytes > kMaxPlayedBytes) return false;
             PlayMeasure();

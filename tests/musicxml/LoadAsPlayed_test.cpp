@@ -230,6 +230,9 @@ TEST_CASE("Kinds in other words are put into the words of the library") {
         {"<kind text='m7'/>", "minor-seventh"},
         {"<kind> minor </kind>", "minor"},
         {"<kind text='mMaj7'>minor-major</kind>", "major-minor"},
+        {"<kind text='M7'/>", "major-seventh"},
+        {"<kind text='o7'>other</kind>", "diminished-seventh"},
+        {"<kind text='\u00F8'>other</kind>", "half-diminished"},
         {"<kind>German</kind>", "dominant"},
         {"<kind>Neapolitan</kind>", "Neapolitan"},
         {"<kind text='7sus4'>other</kind>", "suspended-fourth +7"},
@@ -261,6 +264,52 @@ TEST_CASE("A song that does not end is cut, and the load says so") {
         CHECK(error.description == "the song is too long to be played");
     }
     CHECK(Roots(Loaded(Bars("A |:; B :|; C :| =4x="))) == "ABABCCCC");
+}
+
+TEST_CASE("Hostile scores reach nothing outside and take bounded time and room") {
+    const auto repeated = [](std::string_view text, std::size_t count) {
+        std::string all;
+        for (std::size_t i = 0; i < count; ++i) all += text;
+        return all;
+    };
+    std::string bomb = "<!DOCTYPE x [<!ENTITY a0 'aaaaaaaaaa'>";
+    for (int i = 1; i < 12; ++i) {
+        bomb += fmt::format("<!ENTITY a{} '{}'>", i, repeated(fmt::format("&a{};", i - 1), 10));
+    }
+    bomb += "]>";
+    const std::string title =
+        "<score-partwise><movement-title>{}</movement-title></score-partwise>";
+    const auto titled = [&](const std::string& text) {
+        return fmt::format(fmt::runtime(title), text);
+    };
+    for (const std::string& score : {
+             bomb + titled("&a11;"),
+             "<!DOCTYPE x [<!ENTITY e SYSTEM '" BRINDLE_TEST_DATA "/leadsheets/SOURCE.txt'>]>" +
+                 titled("&e;"),
+             Score(repeated("<a>", 100'000) + repeated("</a>", 100'000)),
+             titled(repeated("0123456789", 1'000'001)),
+             Score(repeated("<measure/>", kMaxPlayedMeasures + 1)),
+         }) {
+        TMusicXMLDoc doc;
+        Error error;
+        CHECK_FALSE(doc.LoadAsPlayedFromBytes(score, &error));
+        CHECK(doc.Title.empty());
+        CHECK_FALSE(error.description.empty());
+    }
+    CHECK(Loaded("<!DOCTYPE x SYSTEM '" BRINDLE_TEST_DATA "/leadsheets/SOURCE.txt'>" + titled("A"))
+              .Title == "A");
+    // Each of many endings is for one more pass, and each of many bars jumps to the start.
+    std::string endings;
+    for (int i = 1; i < 12'000; ++i) {
+        endings +=
+            "<measure><barline><ending type='start' number=''/><ending type='stop'/>"
+            "<repeat direction='backward'/></barline></measure>";
+    }
+    TMusicXMLDoc doc;
+    CHECK(doc.LoadAsPlayedFromBytes(Score(endings)));
+    CHECK(doc.HarmBarlines.size() == 11'999);
+    CHECK_FALSE(doc.LoadAsPlayedFromBytes(
+        Score(repeated("<measure><sound dacapo='yes'/></measure>", 2'000))));
 }
 
 TEST_CASE("Scores in any encoding are read, and what is no score is told") {

@@ -124,17 +124,15 @@ private:
                                 Continues(mPlan.mEndings[i - 1], ending) &&
                                 !Marks(ending.mFirst).mRepeatForward;
             const bool isFull =
-                isNext && mPlan.mGroups.back().mHighestNumber >= kHighestEndingNumber;
-            if (!isNext || isFull) mPlan.mGroups.push_back({.mFirstEnding = i});
-            Describe(ending);
+                isNext && mPlan.mGroups.back().HighestNumber() >= kHighestEndingNumber;
+            if (!isNext || isFull) mPlan.mGroups.emplace_back().mFirstEnding = i;
             ending.mGroup = mPlan.mGroups.size() - 1;
             TEndingGroup& group = mPlan.mGroups.back();
-            if (ending.mNumbers.empty()) ending.mNumbers = {group.mHighestNumber + 1};
+            Describe(i, group);
+            if (ending.mNumbers.empty()) ending.mNumbers = {group.HighestNumber() + 1};
             ++group.mEndingCount;
             group.mBehind = ending.mLast + 1;
-            for (const std::int32_t number : ending.mNumbers) {
-                group.mHighestNumber = std::max(group.mHighestNumber, number);
-            }
+            for (const std::int32_t pass : ending.mNumbers) group.mEndingOfPass.emplace(pass, i);
             group.mIsForAfterJump |= Marks(ending.mLast).mRepeatAfterJump;
         }
         // Each but the last ending goes back, even where its sign was forgotten.
@@ -145,11 +143,12 @@ private:
         }
     }
 
-    void Describe(TEnding& ending) {
+    void Describe(std::size_t i, TEndingGroup& group) {
+        TEnding& ending = mPlan.mEndings[i];
         ending.mGoesBack = Marks(ending.mLast).mRepeatBackward;
         for (std::size_t ix = ending.mFirst; ix <= ending.mLast; ++ix) {
-            mPlan.mMeasures[ix].mEnding = static_cast<std::size_t>(&ending - mPlan.mEndings.data());
-            ending.mHasFine |= Marks(ix).mFine;
+            mPlan.mMeasures[ix].mEnding = i;
+            if (Marks(ix).mFine) group.mEndingWithFine = std::min(group.mEndingWithFine, i);
         }
     }
 
@@ -188,7 +187,7 @@ private:
                                        std::int32_t timesAtStart) const {
         const std::int32_t told = marks.mRepeatTimes != 0 ? marks.mRepeatTimes : timesAtStart;
         if (ending == nullptr) return told != 0 ? told : 2;
-        return std::max(told, mPlan.mGroups[ending->mGroup].mHighestNumber);
+        return std::max(told, mPlan.mGroups[ending->mGroup].HighestNumber());
     }
 
     // For a measure before the endings, the first of them stands for all.
@@ -230,7 +229,9 @@ private:
     void SetCodaTarget(std::size_t ix, std::size_t coda) {
         mPlan.mMeasures[ix].mCodaTarget = coda;
         const std::size_t ending = mPlan.mMeasures[ix].mEnding;
-        if (ending != kNoMeasure) mPlan.mEndings[ending].mHasToCoda = true;
+        if (ending == kNoMeasure) return;
+        TEndingGroup& group = mPlan.mGroups[mPlan.mEndings[ending].mGroup];
+        group.mEndingWithToCoda = std::min(group.mEndingWithToCoda, ending);
     }
 
     void FindJumpTargets() {

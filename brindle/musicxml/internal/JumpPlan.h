@@ -6,6 +6,7 @@
 #include <cstddef>
 #include <cstdint>
 #include <limits>
+#include <map>
 #include <optional>
 #include <vector>
 
@@ -20,12 +21,6 @@ struct TEnding {
     std::vector<std::int32_t> mNumbers;
     std::size_t mGroup = 0;
     bool mGoesBack = false;
-    bool mHasFine = false;
-    bool mHasToCoda = false;
-
-    [[nodiscard]] bool IsOfPass(std::int32_t pass) const {
-        return std::find(mNumbers.begin(), mNumbers.end(), pass) != mNumbers.end();
-    }
 };
 
 /// Endings side by side, of which each pass plays one.
@@ -36,8 +31,16 @@ struct TEndingGroup {
     std::size_t mRepeatStart = 0;
     /// The measure behind the last ending.
     std::size_t mBehind = 0;
-    std::int32_t mHighestNumber = 0;
+    /// The first ending with a Fine, and with a way to the coda; kNoMeasure for none.
+    std::size_t mEndingWithFine = kNoMeasure;
+    std::size_t mEndingWithToCoda = kNoMeasure;
+    /// The endings by the passes they are for.
+    std::map<std::int32_t, std::size_t> mEndingOfPass;
     bool mIsForAfterJump = false;
+
+    [[nodiscard]] std::int32_t HighestNumber() const {
+        return mEndingOfPass.empty() ? 0 : mEndingOfPass.rbegin()->first;
+    }
 };
 
 /// What a measure is for the player.

@@ -21,9 +21,12 @@ struct TKindAlias {
     std::string_view mKind;
 };
 
-// Other names of kinds that scores use, and the kind that has the same tones.
+// Other names of kinds that scores use, or signs that they print, and the kind that has the same
+// tones. Capitals count only for the signs of major.
 constexpr auto kKindAliases = std::to_array<TKindAlias>({
-    {"none", "none"},
+    {"M", "major"},
+    {"M7", "major-seventh"},
+    {"M9", "major-ninth"},
     {"n.c.", "none"},
     {"no-chord", "none"},
     {"neapolitan", "Neapolitan"},
@@ -51,6 +54,23 @@ constexpr auto kKindAliases = std::to_array<TKindAlias>({
     {"minor-thirteenth", "minor-13th"},
     {"suspended", "suspended-fourth"},
     {"fifth", "power"},
+    {"m", "minor"},
+    {"-", "minor"},
+    {"-7", "minor-seventh"},
+    {"+", "augmented"},
+    {"+7", "augmented-seventh"},
+    {"7+", "augmented-seventh"},
+    {"o", "diminished"},
+    {"\u00B0", "diminished"},
+    {"o7", "diminished-seventh"},
+    {"\u00B07", "diminished-seventh"},
+    {"\u00F8", "half-diminished"},
+    {"\u00F87", "half-diminished"},
+    {"\u0394", "major-seventh"},
+    {"\u03947", "major-seventh"},
+    {"maj13", "major-13th"},
+    {"maj11", "major-11th"},
+    {"sus", "suspended-fourth"},
 });
 
 // The degree that adds one tone and nothing else, for each semitone above the root.
@@ -107,8 +127,10 @@ std::string Folded(std::string_view word) {
 std::string KindOfAlias(std::string_view word) {
     std::string folded = Folded(word);
     if (IsKind(folded)) return folded;
-    for (const TKindAlias& row : kKindAliases) {
-        if (row.mAlias == folded) return std::string(row.mKind);
+    for (const std::string_view name : {word, std::string_view(folded)}) {
+        for (const TKindAlias& row : kKindAliases) {
+            if (row.mAlias == name) return std::string(row.mKind);
+        }
     }
     return {};
 }

@@ -34,6 +34,7 @@ public:
         FindWhatHolds();
         const TPlayingOrder order = PlayScore(mScore.mMeasures);
         bool isWhole = !order.mWasCut;
+        MakeRoom(order);
         for (const std::uint32_t ix : order.mMeasures) {
             if (mBytes > kMaxPlayedBytes) {
                 isWhole = false;
@@ -57,6 +58,27 @@ private:
             mTimes.push_back(time);
             mKeys.push_back(key);
         }
+    }
+
+    // A long song takes much room; it is taken once.
+    void MakeRoom(const TPlayingOrder& order) {
+        std::vector<std::size_t> bytes;
+        for (const TScoreMeasure& measure : mScore.mMeasures) {
+            std::size_t sum = 0;
+            for (const TWrittenHarmony& harmony : measure.mHarmonies) {
+                sum += BytesOf(harmony.mHarmony);
+            }
+            bytes.push_back(sum);
+        }
+        std::size_t count = 0;
+        std::size_t sum = 0;
+        for (const std::uint32_t ix : order.mMeasures) {
+            sum += bytes[ix];
+            if (sum > kMaxPlayedBytes) break;
+            count += mScore.mMeasures[ix].mHarmonies.size();
+        }
+        mDoc.Harmonies.reserve(count);
+        mDoc.HarmBarlines.reserve(order.mMeasures.size());
     }
 
     void Play(std::size_t ix) {

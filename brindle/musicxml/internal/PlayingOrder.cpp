@@ -58,19 +58,13 @@ private:
         const std::size_t lastOrNone =
             group.mEndingCount == 1 && mPlan.mEndings[last].mGoesBack ? kNoMeasure : last;
         if (mIsAfterJump && !group.mIsForAfterJump) {
-            for (std::size_t i = first; i <= last; ++i) {
-                if (mToFine && mPlan.mEndings[i].mHasFine) return i;
-                if (mToCoda && mPlan.mEndings[i].mHasToCoda) return i;
-            }
+            if (mToFine && group.mEndingWithFine != kNoMeasure) return group.mEndingWithFine;
+            if (mToCoda && group.mEndingWithToCoda != kNoMeasure) return group.mEndingWithToCoda;
             return lastOrNone;
         }
-        bool isBelowAll = true;
-        for (std::size_t i = first; i <= last; ++i) {
-            const TEnding& ending = mPlan.mEndings[i];
-            if (ending.IsOfPass(pass)) return i;
-            for (const std::int32_t number : ending.mNumbers) isBelowAll &= pass < number;
-        }
-        return isBelowAll ? first : lastOrNone;
+        const auto& endings = group.mEndingOfPass;
+        if (const auto it = endings.find(pass); it != endings.end()) return it->second;
+        return pass < endings.begin()->first ? first : lastOrNone;
     }
 
     [[nodiscard]] std::size_t Next(std::size_t ix) {
