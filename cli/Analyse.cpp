@@ -121,6 +121,7 @@ std::string Present(const TAnalysedSong& analysed, const TAnalyseOptions& option
             return AnalysisSvg(song);
         }
         case TFormat::Text:
+        case TFormat::Chords:
             break;
     }
     return AnalysisText(SongOf(analysed, options), CPaint());

@@ -55,6 +55,7 @@ void CFormatOptions::AddTo(CLI::App& command, const std::vector<std::string>& fo
 TFormat CFormatOptions::Format() const {
     if (mJson || mFormat == "json") return TFormat::Json;
     if (mFormat == "native") return TFormat::Native;
+    if (mFormat == "chords") return TFormat::Chords;
     return mFormat == "svg" ? TFormat::Svg : TFormat::Text;
 }
 

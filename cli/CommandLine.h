@@ -34,7 +34,7 @@ void AddChoice(CLI::App& command, const std::string& name, std::string& value,
 /// The options --format and --json.
 class CFormatOptions {
 public:
-    /// `formats` are those that the command has, of text, json, native and svg.
+    /// `formats` are those that the command has, of text, json, native, svg and chords.
     void AddTo(CLI::App& command, const std::vector<std::string>& formats);
 
     [[nodiscard]] TFormat Format() const;
@@ -63,5 +63,6 @@ void AddCopies(CLI::App& program, TStatus& status);
 void AddVector(CLI::App& program, TStatus& status);
 void AddKeys(CLI::App& program, TStatus& status);
 void AddNumerals(CLI::App& program, TStatus& status);
+void AddHarmonies(CLI::App& program, TStatus& status);
 
 }  // namespace brindle::cli

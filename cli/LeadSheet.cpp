@@ -71,8 +71,13 @@ std::string PrintedSymbol(const TMusicXMLHarmony& harmony) {
     });
     if (row == kSuffixes.end()) return {};
     std::string symbol = KeyName(harmony.mRoot.ToKeyEnh(NamePrefs()));
-    symbol += row->mSuffix;
-    for (const TMusicXMLDegree& degree : harmony.mDegrees) symbol += DegreeText(degree);
+    // "C7sus4": what is suspended stands last.
+    const bool isSuspended = row->mSuffix.substr(0, 3) == "sus";
+    if (!isSuspended) symbol += row->mSuffix;
+    for (const TMusicXMLDegree& degree : harmony.mDegrees) {
+        symbol += isSuspended && degree.mAlter == 0 ? degree.mValue : DegreeText(degree);
+    }
+    if (isSuspended) symbol += row->mSuffix;
     const CKeyEnh bass = harmony.mBass.ToKeyEnh(NamePrefs());
     if (!bass.IsUndef()) symbol += '/' + KeyName(bass);
     return symbol;

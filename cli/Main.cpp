@@ -14,6 +14,7 @@ namespace {
 constexpr const char* kExamples =
     "  brindle analyse \"Dm7 G7 | C\"\n"
     "  brindle analyse --file song.txt --format svg >song.svg\n"
+    "  brindle analyse song.musicxml\n"
     "  brindle chord F#m7/C# Bb13\n"
     "  brindle scale \"D dorian\"\n"
     "  brindle key \"F# minor\" --json\n"
@@ -74,6 +75,7 @@ int main(int argc, char** argv) {
     AddVector(program, status);
     AddKeys(program, status);
     AddNumerals(program, status);
+    AddHarmonies(program, status);
     try {
         program.parse(argc, argv);
     } catch (const CLI::ParseError& error) {

@@ -14,7 +14,7 @@ enum class TStatus : int {
 };
 
 /// In what form a result is printed.
-enum class TFormat { Text, Json, Native, Svg };
+enum class TFormat { Text, Json, Native, Svg, Chords };
 
 /// Writes `brindle: message` to standard error and gives the status back.
 TStatus Fail(TStatus status, std::string_view message);

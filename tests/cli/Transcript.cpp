@@ -20,7 +20,7 @@ constexpr std::string_view kPrompt = "$ ";
 // Standard input is empty, and nothing of the caller's terminal or language gets in.
 std::string Script(const CScratchFolder& scratch, const std::string& command) {
     constexpr const char* setUp = R"(
-mkdir '{0}/here' && cd '{0}/here' && ln -s '{1}/examples' . || exit 99
+mkdir '{0}/here' && cd '{0}/here' && ln -s '{1}/examples' '{1}/tests/data/leadsheets' . || exit 99
 unset NO_COLOR
 export TERM=xterm LC_ALL=C
 function brindle {{ '{2}' "$@"; }}

@@ -27,7 +27,7 @@ struct TTranscript {
 [[nodiscard]] std::string WriteTranscript(const TTranscript& transcript);
 
 /// Runs the command in a shell. `brindle` and `./run.sh` are the program of this build, and the
-/// folder that it runs in holds the examples and else nothing.
+/// folder that it runs in holds the examples and the lead sheets and else nothing.
 [[nodiscard]] TConsoleRun RunCommand(const std::string& command);
 
 /// The whole file; fails the test if it is not there.

@@ -1,0 +1,24 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <optional>
+#include <string>
+
+namespace brindle {
+struct TMusicXMLDoc;
+}
+
+namespace brindle::cli {
+
+/// The chords of a score as a chord text, and with which lengths `analyse` reads it back.
+struct TChordText {
+    std::string mText;
+    double mBeatsPerBar = 4.0;
+    double mBeatsPerChord = 1.0;
+};
+
+/// Writes four bars a line. An upbeat is filled up to a bar in front. A bar line stands only where
+/// a reader with bars of one length sees one, too. Nothing for a song that is too long.
+[[nodiscard]] std::optional<TChordText> WriteChordText(const TMusicXMLDoc& sheet);
+
+}  // namespace brindle::cli
