@@ -34,10 +34,11 @@ std::int32_t MusicXmlParserHarmonyDelegate::LastMeasureIndex() const {
     return static_cast<std::int32_t>(measures.size()) - 1;
 }
 
-void MusicXmlParserHarmonyDelegate::didStartElement(XmlStreamParser&, std::string_view name,
+void MusicXmlParserHarmonyDelegate::didStartElement(XmlStreamParser& parser, std::string_view name,
                                                     const XmlAttributes& attributes) {
     currentElementParentName.swap(currentElementName);
     currentElementName = name;
+    parser.setTextWanted(MayMatter(name, kFirstLettersOfTexts));
     if (name == "measure") {
         measures.emplace_back();
         return;
@@ -78,8 +79,9 @@ void MusicXmlParserHarmonyDelegate::StartedRepeat(const XmlAttributes& attribute
 }
 
 // The parent's name is kept: "words" counts only directly behind the start of its parent.
-void MusicXmlParserHarmonyDelegate::didEndElement(XmlStreamParser&, std::string_view) {
+void MusicXmlParserHarmonyDelegate::didEndElement(XmlStreamParser& parser, std::string_view) {
     currentElementName.clear();
+    parser.setTextWanted(false);
 }
 
 void MusicXmlParserHarmonyDelegate::foundCharacters(XmlStreamParser&, std::string_view text) {

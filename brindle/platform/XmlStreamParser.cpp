@@ -87,8 +87,12 @@ struct XmlStreamParser::Callbacks {
     static void Characters(void* context, const xmlChar* text, int length) {
         Guarded(context, [&](XmlStreamParser& self) {
             const auto size = static_cast<std::size_t>(length);
-            self.mText.append(reinterpret_cast<const char*>(text), size);
-            if (self.mText.size() <= kXmlMaxTextLength) return;
+            if (self.mIsTextWanted) {
+                self.mText.append(reinterpret_cast<const char*>(text), size);
+            } else {
+                self.mUnwantedLength += size;
+            }
+            if (self.mText.size() + self.mUnwantedLength <= kXmlMaxTextLength) return;
             self.Fail(
                 {XML_ERR_INTERNAL_ERROR, "text too long", self.lineNumber(), self.columnNumber()});
             self.mText.clear();
@@ -106,6 +110,7 @@ XmlStreamParser::XmlStreamParser() = default;
 XmlStreamParser::~XmlStreamParser() = default;
 
 void XmlStreamParser::Deliver() {
+    mUnwantedLength = 0;
     if (mText.empty()) return;
     if (mDelegate != nullptr) mDelegate->foundCharacters(*this, mText);
     mText.clear();
@@ -126,6 +131,8 @@ int XmlStreamParser::columnNumber() const {
 bool XmlStreamParser::parse(std::string_view bytes) {
     mError.reset();
     mThrown = nullptr;
+    mIsTextWanted = true;
+    mUnwantedLength = 0;
     mText.clear();
     if (bytes.empty() || bytes.size() > std::numeric_limits<int>::max()) {
         mError = {XML_ERR_DOCUMENT_EMPTY, bytes.empty() ? "Document is empty" : "Document too long",

@@ -70,6 +70,10 @@ public:
     void setDelegate(XmlStreamDelegate* delegate) { mDelegate = delegate; }
     [[nodiscard]] XmlStreamDelegate* delegate() const { return mDelegate; }
 
+    /// Whether text is delivered from here on; a delegate that reads few texts saves time by this.
+    /// A parse begins with all text delivered.
+    void setTextWanted(bool isWanted) { mIsTextWanted = isWanted; }
+
     /// True when the text is well-formed; else parserError tells the first fault. Events before the
     /// fault have been delivered. What the delegate throws ends the parse and is passed on.
     bool parse(std::string_view bytes);
@@ -86,9 +90,11 @@ private:
     void Fail(XmlError error);
 
     XmlStreamDelegate* mDelegate = nullptr;
-    void* mContext = nullptr;    // of the parse that runs
-    std::string mText;           // gathered since the last tag
-    std::exception_ptr mThrown;  // by the delegate
+    void* mContext = nullptr;  // of the parse that runs
+    bool mIsTextWanted = true;
+    std::string mText;                // gathered since the last tag
+    std::size_t mUnwantedLength = 0;  // of other text since then
+    std::exception_ptr mThrown;       // by the delegate
     std::optional<XmlError> mError;
 };
 

@@ -298,6 +298,8 @@ TEST_CASE("Hostile scores reach nothing outside and take bounded time and room")
     }
     CHECK(Loaded("<!DOCTYPE x SYSTEM '" BRINDLE_TEST_DATA "/leadsheets/SOURCE.txt'>" + titled("A"))
               .Title == "A");
+    CHECK_FALSE(TMusicXMLDoc().LoadFromMusicXML(
+        Score("<voice>" + repeated("0123456789", 1'000'001) + "</voice>")));
     // Each of many endings is for one more pass, and each of many bars jumps to the start.
     std::string endings;
     for (int i = 1; i < 12'000; ++i) {
