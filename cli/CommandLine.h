@@ -55,6 +55,7 @@ void AddScale(CLI::App& program, TStatus& status);
 void AddKey(CLI::App& program, TStatus& status);
 void AddGrid(CLI::App& program, TStatus& status);
 void AddGrids(CLI::App& program, TStatus& status);
+void AddMarkov(CLI::App& program, TStatus& status);
 void AddName(CLI::App& program, TStatus& status);
 void AddFunction(CLI::App& program, TStatus& status);
 void AddTypes(CLI::App& program, TStatus& status);

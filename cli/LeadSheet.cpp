@@ -96,16 +96,6 @@ bool HasScoreName(std::string_view name) {
     return ending == ".musicxml" || ending == ".xml" || ending == ".mxl";
 }
 
-// No chord text begins with a tag, a mark of the byte order, or the letters of a zip archive and
-// what follows them.
-bool HasScoreBytes(std::string_view bytes) {
-    for (const std::string_view mark : {"\xEF\xBB\xBF", "\xFF\xFE", "\xFE\xFF"}) {
-        if (bytes.substr(0, mark.size()) == mark) bytes.remove_prefix(mark.size());
-    }
-    const std::size_t first = bytes.find_first_not_of(std::string_view(" \t\r\n\0", 5));
-    return bytes.substr(0, 4) == "PK\x03\x04" || (first != bytes.npos && bytes[first] == '<');
-}
-
 std::optional<TMusicXMLDoc> Unreadable(const TTypedSong& song, std::string_view reason) {
     Fail(TStatus::BadInput, fmt::format("{}: {}", Printable(song.mName), Printable(reason)));
     return std::nullopt;
@@ -119,6 +109,16 @@ std::string FaultOf(std::string_view bytes) {
 }
 
 }  // namespace
+
+// No chord text begins with a tag, a mark of the byte order, or the letters of a zip archive and
+// what follows them.
+bool HasScoreBytes(std::string_view bytes) {
+    for (const std::string_view mark : {"\xEF\xBB\xBF", "\xFF\xFE", "\xFE\xFF"}) {
+        if (bytes.substr(0, mark.size()) == mark) bytes.remove_prefix(mark.size());
+    }
+    const std::size_t first = bytes.find_first_not_of(std::string_view(" \t\r\n\0", 5));
+    return bytes.substr(0, 4) == "PK\x03\x04" || (first != bytes.npos && bytes[first] == '<');
+}
 
 std::optional<TTypedSong> ReadTypedSong(const std::vector<std::string>& words,
                                         const std::string& file) {

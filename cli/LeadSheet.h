@@ -31,6 +31,9 @@ struct TTypedSong {
 [[nodiscard]] std::optional<TTypedSong> ReadTypedSong(const std::vector<std::string>& words,
                                                       const std::string& file);
 
+/// Whether a file that begins so is a score and no chord text.
+[[nodiscard]] bool HasScoreBytes(std::string_view bytes);
+
 /// The chords of a score, plain or compressed. Nothing when it cannot be read; then the error has
 /// been printed.
 [[nodiscard]] std::optional<TMusicXMLDoc> ReadLeadSheet(const TTypedSong& song, TTiming timing);

@@ -76,6 +76,7 @@ int main(int argc, char** argv) {
     AddKeys(program, status);
     AddNumerals(program, status);
     AddHarmonies(program, status);
+    AddMarkov(program, status);
     try {
         program.parse(argc, argv);
     } catch (const CLI::ParseError& error) {

@@ -10,13 +10,9 @@ namespace {
 
 using nlohmann::json;
 
-// Whole numbers only; the rest is no count.
-std::uint32_t CountOf(const json& value) {
-    return value.is_number_integer() ? static_cast<std::uint32_t>(value.get<std::uint64_t>()) : 0;
-}
-
 bool IsSuccessor(const json& pair) {
-    return pair.is_array() && pair.size() >= 2 && pair[0].is_number() && pair[1].is_number();
+    return pair.is_array() && pair.size() >= 2 && pair[0].is_number_integer() &&
+           pair[1].is_number_integer();
 }
 
 bool IsEntry(const json& entry) {
@@ -43,7 +39,7 @@ void CMarkovFileTransitions::Add(const json& entry) {
     for (const json& pair : entry[1]) {
         if (!IsSuccessor(pair)) continue;
         mNumbers.push_back(static_cast<std::uint32_t>(MarkovIndexOf(pair[0])));
-        mNumbers.push_back(CountOf(pair[1]));
+        mNumbers.push_back(static_cast<std::uint32_t>(pair[1].get<std::uint64_t>()));
     }
 }
 

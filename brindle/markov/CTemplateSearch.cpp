@@ -22,7 +22,7 @@ bool CTemplateSearch::Run() {
     TOutcome outcome = Begin();
     while (outcome != TOutcome::Found) {
         if (outcome == TOutcome::Failed && mLevels.empty()) return false;
-        if (mSteps >= kMarkovMaxTemplateSteps) break;
+        if (mSteps >= mModel.SearchLimits().mSteps) break;
         outcome = outcome == TOutcome::Deeper ? Begin() : GoOn();
     }
     mInfo.mHasGivenUp = outcome != TOutcome::Found;

@@ -20,13 +20,18 @@ class TMarkovSamplingInformation;
 
 /// For VariableLengthMarkovModel::AppendNextFittingSymbol: as long as the options allow.
 inline constexpr std::uint64_t kMarkovLongestHistory = std::numeric_limits<std::int64_t>::max();
-/// SampleSequenceWithLength gives up after so many attempts.
-inline constexpr std::uint64_t kMarkovMaxAttempts = 10'000'000;
 /// A free sequence of more symbols counts as missed.
 inline constexpr std::size_t kMarkovMaxFreeSymbols = 4096;
-/// A template search goes no deeper, and takes no more steps.
+/// A template search goes no deeper.
 inline constexpr std::size_t kMarkovMaxTemplateSymbols = 250'000;
-inline constexpr std::size_t kMarkovMaxTemplateSteps = 10'000'000;
+
+/// When the search for a sequence is given up.
+struct TMarkovSearchLimits {
+    /// Attempts of one call of SampleSequenceWithLength.
+    std::uint64_t mAttempts = 10'000'000;
+    /// Symbols tried in one attempt to fill a template; a search that reaches it ends the call.
+    std::uint64_t mSteps = 1'000'000;
+};
 
 /// The length of a sequence: that of its chords and gaps together.
 [[nodiscard]] double TMarkovSequenceLengthInBeats(MarkovSequenceView sequence);
@@ -55,8 +60,8 @@ public:
     explicit VariableLengthMarkovModel(std::uint64_t maxHistoryLength = 0);
     /// Where random numbers come from, 32 bits each; an empty one is the operating system.
     void SetRandomSource(RandomSource source);
-    /// After how many attempts SampleSequenceWithLength gives up.
-    void SetMaxAttempts(std::uint64_t attempts) { mMaxAttempts = attempts; }
+    void SetSearchLimits(const TMarkovSearchLimits& limits) { mSearchLimits = limits; }
+    [[nodiscard]] const TMarkovSearchLimits& SearchLimits() const { return mSearchLimits; }
 
     // Learning. A sequence is StartSequence, LearnAddSymbol for each symbol, EndSequence.
 
@@ -205,7 +210,7 @@ private:
                            const TMarkovGenerateOptions& options);
 
     RandomSource mRandomSource;
-    std::uint64_t mMaxAttempts = kMarkovMaxAttempts;
+    TMarkovSearchLimits mSearchLimits;
 };
 
 }  // namespace brindle

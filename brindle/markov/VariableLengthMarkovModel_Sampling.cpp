@@ -79,7 +79,7 @@ void VariableLengthMarkovModel::SampleSequenceWithLength(
         if (!(sequence.mLogProbability > kLowestAccepted) || sequence.mSymbols.empty()) continue;
         accepted.push_back({sequence, sequence.mLogProbability});
         distinct.Add(sequence);
-    } while (accepted.size() < options.mSampleCount && ++attempts < mMaxAttempts);
+    } while (accepted.size() < options.mSampleCount && ++attempts < mSearchLimits.mAttempts);
     NormalizeLogProbabilities(accepted);
     ChooseFromWeightedSequences(accepted, out);
     // Stable, since weights that are not a number have no order.

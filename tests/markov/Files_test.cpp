@@ -8,6 +8,8 @@
 #include <doctest/doctest.h>
 
 #include <filesystem>
+#include <nlohmann/json.hpp>
+#include <sstream>
 
 using namespace brindle;
 using namespace brindle::test;
@@ -56,4 +58,92 @@ TEST_CASE("Models are saved and read as expected") {
                                       {"VariableLengthMarkovModel::SaveToFile", Saved},
                                       {"LoadAndSave", LoadedAndSaved},
                                   });
+}
+
+TEST_CASE("A text that is no model file gives an empty model") {
+    const std::vector<std::string> texts{
+        "",
+        "{",
+        "[]",
+        "12",
+        "{}",
+        R"({"VariableLengthMarkovModel":[1]})",
+        R"({"VariableLengthMarkovModel":{"MaxHistoryLength":2,"CMarkovObjects":[{"Type":4})",
+        R"({"VariableLengthMarkovModel":{"CMarkovObjects":{},"TransitionMap":7,"History":null}})",
+        R"({"VariableLengthMarkovModel":{"MaxHistoryLength":[],"CMarkovObjects":"x"}})",
+        R"({"VariableLengthMarkovModel":{"MaxHistoryLength":-3}})",
+        std::string(100000, '['),
+    };
+    for (const std::string& text : texts) {
+        INFO(text.substr(0, 100));
+        VariableLengthMarkovModel model(3);
+        Learn(model, "(4,C);(4,G)");
+        Helper::VariableLengthMarkovModelFromJSONString(text, model);
+        CHECK(model == VariableLengthMarkovModel());
+    }
+}
+
+TEST_CASE("Entries that name no symbol are left out, and the order of members does not matter") {
+    const std::string text = R"({"Else":{"TransitionMap":[[[0],[[0,9]]]]},
+        "VariableLengthMarkovModel":{"History":[1,"x",7,-1,0],
+        "TransitionMap":[[[0],[[0,99]]]],
+        "TransitionMap":[
+            [[0,1],[[1,2],[9,5],[0],7,["x",1],[-1,3],[0,1]]], [[0,9],[[0,1]]], [[0,-1],[[0,1]]],
+            [[1,0],[]], [[1,0]], [], 5, {"a":1}, [[99999999999999999999,0],[[0,1]]],
+            [[1,1],[[1,4294967295]]]],
+        "CMarkovObjects":[{"Type":4},{"Type":5}],
+        "MaxHistoryLength":2}})";
+    VariableLengthMarkovModel model;
+    Helper::VariableLengthMarkovModelFromJSONString(text, model);
+    CHECK(model.mMaxHistoryLength == 2);
+    CHECK(test::FormOf(model.mHistory) == json{1, 0});
+    auto transitions = json::array();
+    for (const TMarkovTransitions* const entry : model.mTransitionMap.InOrder()) {
+        transitions.push_back({test::FormOf(entry->mHistory), TableForm(entry->mCounts)});
+    }
+    // Counts of 32 bits: 2 + 4294967295 is 1.
+    CHECK(transitions == json::parse("[[[0,1],[[0,1],[1,2]]],[[1],[[0,1],[1,1]]],"
+                                     "[[1,1],[[1,4294967295]]]]"));
+
+    VariableLengthMarkovModel fromDictionary;
+    Helper::VariableLengthMarkovModelFromJSONDictionary(
+        json::parse(text).at("VariableLengthMarkovModel"), fromDictionary);
+    CHECK(fromDictionary == model);
+}
+
+TEST_CASE("Symbols read as they were written, but for gaps") {
+    const auto again = [](const CMarkovObject& object) {
+        std::ostringstream stream;
+        object.AppendJSONString(stream);
+        return CMarkovObject::JSONDeserialization_Helper::CMarkovObjectFromJSONString(stream.str());
+    };
+    const CMarkovObject chord = SymbolsOf("(1.5,Ebm7/Db)").at(0);
+    CHECK(again(chord) == chord);
+    CHECK(again(CMarkovObject_Start) == CMarkovObject_Start);
+    CHECK(again(CMarkovObject_End) == CMarkovObject_End);
+    CHECK(again(CMarkovObject_Gap) == CMarkovObject());
+    CHECK(CMarkovObject::JSONDeserialization_Helper::CMarkovObjectFromJSONString(
+              R"({"Type":7,"Index":12})")
+              .mIndex == 12);
+    // What has a chord without values has one of values 0.
+    const auto empty =
+        CMarkovObject::JSONDeserialization_Helper::CMarkovObjectFromJSONString(R"({"Type":1})");
+    CHECK(empty.mChord.mLength == 0.0);
+    CHECK(empty.mChord.mRootDistToHarmCenter == 0);
+    CHECK(empty.mChord.mRootKeyEnh.mKeyNr == 0);
+    CMarkovObject indexed;
+    indexed.mType = TMarkovObjectType_Indexed;
+    indexed.mIndex = 3;
+    CHECK(JSONStringOf(indexed) == "{\"Type\":7,\n\"Index\":3,\n}");
+    indexed.mType = TMarkovObjectType_Number;
+    CHECK(JSONStringOf(indexed) == "{\"Type\":2,\n}");
+}
+
+TEST_CASE("A model that cannot be read or written changes nothing") {
+    VariableLengthMarkovModel model(2);
+    Learn(model, "(4,C);(4,G)");
+    const std::string before = JSONStringOf(model);
+    CHECK_FALSE(Helper::VariableLengthMarkovModelFromJSONFile("/no/such/file.json", model));
+    CHECK(JSONStringOf(model) == before);
+    CHECK_FALSE(model.SaveToFile("/no/such/folder/model.json"));
 }

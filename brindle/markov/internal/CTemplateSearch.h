@@ -51,7 +51,7 @@ private:
     CMarkovTemplate mTemplate;
     std::uint64_t mLongest;
     double mFirstBeats;
-    std::size_t mSteps = 0;
+    std::uint64_t mSteps = 0;
     std::vector<TLevel> mLevels;
     MarkovSequence mHistory;
     MarkovProbabilities mTable;

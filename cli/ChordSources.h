@@ -1,0 +1,34 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/analysis/TChordStringParse.h"
+#include "brindle/markov/MarkovChords.h"
+
+#include <string>
+#include <vector>
+
+namespace brindle::cli {
+
+/// A file with chords that have lengths.
+struct TChordSource {
+    /// The chords, cut where there is no chord.
+    std::vector<CHarmAnlsChordsWithLength> mSequences;
+    /// What is wrong, if the file cannot be read.
+    std::string mError;
+};
+
+/// Reads a lead sheet in MusicXML, chord strings such as (4,C);(2,G7), one a line, or a chord text.
+/// The content tells which of them it is.
+[[nodiscard]] TChordSource ReadChordSource(const std::string& path, const TChordStringParse& parse);
+
+/// A file that was named or that stands in a folder that was.
+struct TFoundFile {
+    std::string mPath;
+    bool mIsNamed = false;
+};
+
+/// The files themselves and those in the folders, in alphabetic order, whose names end in .xml,
+/// .musicxml, .mxl or .txt.
+[[nodiscard]] std::vector<TFoundFile> FindChordSources(const std::vector<std::string>& paths);
+
+}  // namespace brindle::cli

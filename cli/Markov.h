@@ -1,0 +1,53 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "cli/CommandLine.h"
+#include "cli/Json.h"
+
+#include "brindle/markov/VariableLengthMarkovModel.h"
+
+#include <optional>
+#include <string>
+
+/// What the commands of `brindle markov` share.
+namespace brindle::cli {
+
+/// Longer histories than this are no music but a damaged file.
+inline constexpr std::uint64_t kLongestOrder = 64;
+
+/// Reads a model file. Nothing when that is none; then the error has been printed.
+[[nodiscard]] std::optional<VariableLengthMarkovModel> ReadModel(const std::string& path);
+
+/// Draws from the generator that the seed starts; without one from the operating system.
+void SetSeed(VariableLengthMarkovModel& model, const std::optional<std::uint64_t>& seed);
+
+/// A typed sequence such as (4,C);(8,U);(4,G7), blanks allowed. Nothing when it cannot be one; then
+/// the error has been printed, with `option` as its place.
+[[nodiscard]] std::optional<std::vector<CMarkovObject>> ReadSymbols(const std::string& option,
+                                                                    const std::string& text);
+
+/// "Dm7", "F/C".
+[[nodiscard]] std::string ChordName(const CHarmAnlsChordWithLength& chord);
+
+/// The chord string of a sequence, as it is typed: "(4,C);(2,G7)". Start and end are "start" and
+/// "end".
+[[nodiscard]] std::string ChordString(MarkovSequenceView sequence);
+
+/// The sequence as a chord text with a step for each beat, "C | F . G7", in which a bar has
+/// `beatsPerBar` beats and a line `barsPerLine` bars, 0 for one line; or the chord string if the
+/// chords do not begin on beats.
+[[nodiscard]] std::string BarsText(MarkovSequenceView sequence, int beatsPerBar, int barsPerLine);
+
+/// Length, symbol, root, bass and semitones of a chord; its type for any other symbol.
+[[nodiscard]] Json SymbolToJson(const CMarkovObject& object);
+
+void AddMarkovLearn(CLI::App& markov, TStatus& status);
+void AddMarkovGenerate(CLI::App& markov, TStatus& status);
+void AddMarkovFill(CLI::App& markov, TStatus& status);
+void AddMarkovShow(CLI::App& markov, TStatus& status);
+
+/// The sequence as a piece for two tracks, chords and bass. False when it cannot be written.
+[[nodiscard]] bool WriteMarkovMidi(const std::string& path, MarkovSequenceView sequence,
+                                   double tempo, int beatsPerBar);
+
+}  // namespace brindle::cli

@@ -1,0 +1,248 @@
+// SPDX-License-Identifier: MIT
+#include "cli/Markov.h"
+
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <cmath>
+#include <memory>
+
+namespace brindle::cli {
+namespace {
+
+constexpr TCommandHelp kHelp{
+    "generate",
+    "Make a new chord sequence of a length, or one that fills the gaps of a template",
+    "  brindle markov generate model.json --beats 32\n"
+    "  brindle markov generate model.json --template \"(4,C);(8,U);(4,C)\" --seed 1\n"
+    "  brindle markov generate model.json --beats 64 --order 2 --midi song.mid\n"
+    "\n"
+    "In a template the U are gaps, to be filled with chords of their length together.\n",
+};
+
+constexpr double kMostBeats = 10000.0;
+// A second or two of search.
+constexpr std::uint64_t kMostSteps = 1'000'000;
+constexpr std::uint64_t kMostAttempts = 10'000'000;
+
+struct TGenerateOptions {
+    std::string mModel;
+    double mBeats = 0.0;
+    std::string mTemplate;
+    std::uint64_t mSamples = 10;
+    std::optional<std::uint64_t> mSeed;
+    std::uint64_t mOrder = kLongestOrder;
+    std::uint64_t mMinOrder = 1;
+    std::uint64_t mEvidence = 1;
+    double mMinEntropy = 0.0;
+    bool mIsStrict = false;
+    double mAllEqualFactor = 1.0;
+    std::uint64_t mAttempts = 10000;
+    std::size_t mOthers = 3;
+    int mBeatsPerBar = 4;
+    std::string mMidi;
+    double mTempo = 100.0;
+    CFormatOptions mFormat;
+};
+
+/// What was drawn.
+struct TGenerated {
+    TMarkovSampledSequence mChosen;
+    /// The heaviest first.
+    std::vector<TMarkovSampledSequence> mSequences;
+    /// The part of all weight that each sequence has, 0 to 1.
+    std::vector<double> mShares;
+};
+
+std::optional<std::string> Contradiction(const TGenerateOptions& options) {
+    if (options.mTemplate.empty() == (options.mBeats == 0.0)) {
+        return "either --beats or --template is needed";
+    }
+    return std::nullopt;
+}
+
+std::optional<TMarkovGenerateOptions> OptionsFor(VariableLengthMarkovModel& model,
+                                                 const TGenerateOptions& options) {
+    TMarkovGenerateOptions generate;
+    std::vector<CMarkovObject> wanted;
+    if (options.mTemplate.empty()) {
+        wanted = {CMarkovObject_Gap};
+        wanted.front().mChord.mLength = options.mBeats;
+    } else {
+        const auto symbols = ReadSymbols("--template", options.mTemplate);
+        if (!symbols) return std::nullopt;
+        wanted = *symbols;
+    }
+    generate.mTemplate = model.IteratorSequenceForObjects(wanted);
+    generate.mMaxHistoryLength = options.mOrder;
+    generate.mMinHistoryLength = options.mMinOrder;
+    generate.mEvidenceHistoryLength = options.mEvidence;
+    generate.mAcceptAtMinHistory = !options.mIsStrict;
+    generate.mAcceptExactFill = !options.mIsStrict;
+    generate.mMinNormalizedEntropy = options.mMinEntropy;
+    generate.mAllEqualFactor = options.mAllEqualFactor;
+    generate.mSampleCount = options.mSamples;
+    generate.Validate(model);
+    return generate;
+}
+
+TGenerated Generate(VariableLengthMarkovModel& model, const TMarkovGenerateOptions& options) {
+    TGenerated generated;
+    model.SampleSequenceWithLength(generated.mChosen, generated.mSequences, true, options);
+    std::reverse(generated.mSequences.begin(), generated.mSequences.end());
+    // Relative to the heaviest, since the weights themselves may be too small for a number.
+    double highest = -1e300;
+    for (const auto& sequence : generated.mSequences) {
+        highest = std::max(highest, sequence.mLogProbability);
+    }
+    double sum = 0.0;
+    for (const auto& sequence : generated.mSequences) {
+        const double weight = std::exp(sequence.mLogProbability - highest) * sequence.mCount;
+        generated.mShares.push_back(weight);
+        sum += weight;
+    }
+    for (double& share : generated.mShares) share /= sum;
+    return generated;
+}
+
+Json SampledToJson(const TMarkovSampledObject& sampled) {
+    Json json = SymbolToJson(*sampled.mObject);
+    const auto number = [](double value) { return std::isfinite(value) ? Json(value) : Json(); };
+    json["Probability"] = number(sampled.mProbability);
+    json["NormalizedEntropy"] = number(sampled.mNormalizedEntropy);
+    json["HistoryLength"] = sampled.mHistoryLength;
+    return json;
+}
+
+std::string GeneratedJson(const TGenerated& generated) {
+    Json symbols = Json::array();
+    for (const auto& sampled : generated.mChosen.mSampledObjects) {
+        symbols.push_back(SampledToJson(sampled));
+    }
+    Json sequences = Json::array();
+    for (std::size_t ix = 0; ix < generated.mSequences.size(); ++ix) {
+        const TMarkovSampledSequence& sequence = generated.mSequences[ix];
+        sequences.push_back({{"Share", generated.mShares[ix]},
+                             {"Count", sequence.mCount},
+                             {"LogProbability", sequence.mLogProbability},
+                             {"ChordString", ChordString(sequence.mSymbols)}});
+    }
+    return JsonText({{"ChordString", ChordString(generated.mChosen.mSymbols)},
+                     {"Symbols", symbols},
+                     {"Sequences", sequences}});
+}
+
+std::string OthersText(const TGenerated& generated, const TGenerateOptions& options,
+                       const CPaint& paint) {
+    std::string text;
+    std::size_t shown = 0;
+    for (std::size_t ix = 0; ix < generated.mSequences.size() && shown < options.mOthers; ++ix) {
+        const TMarkovSampledSequence& sequence = generated.mSequences[ix];
+        if (sequence.mSymbols == generated.mChosen.mSymbols) continue;
+        ++shown;
+        text += paint.Faint(fmt::format(
+            "\nor, with weight {:.2f}{}:\n", generated.mShares[ix],
+            sequence.mCount == 1 ? "" : fmt::format(", drawn {} times", sequence.mCount)));
+        text += BarsText(sequence.mSymbols, options.mBeatsPerBar, 4) + '\n';
+    }
+    return text;
+}
+
+std::string GeneratedText(const TGenerated& generated, const TGenerateOptions& options) {
+    const CPaint paint;
+    return BarsText(generated.mChosen.mSymbols, options.mBeatsPerBar, 4) + '\n' +
+           OthersText(generated, options, paint);
+}
+
+TStatus MarkovGenerate(const TGenerateOptions& options) {
+    if (const auto contradiction = Contradiction(options)) {
+        return Fail(TStatus::BadUsage, *contradiction);
+    }
+    auto model = ReadModel(options.mModel);
+    if (!model) return TStatus::BadInput;
+    SetSeed(*model, options.mSeed);
+    model->SetSearchLimits({options.mAttempts, kMostSteps});
+    const auto generateOptions = OptionsFor(*model, options);
+    if (!generateOptions) return TStatus::BadUsage;
+    const TGenerated generated = Generate(*model, *generateOptions);
+    if (generated.mSequences.empty()) {
+        return Fail(
+            TStatus::BadInput,
+            "the model finds no such sequence: each chord, and the end, must have been learned "
+            "behind the one before it");
+    }
+    if (!options.mMidi.empty() && !WriteMarkovMidi(options.mMidi, generated.mChosen.mSymbols,
+                                                   options.mTempo, options.mBeatsPerBar)) {
+        return Fail(TStatus::BadInput,
+                    fmt::format("{} cannot be written", Printable(options.mMidi)));
+    }
+    return Print(options.mFormat.Format() == TFormat::Json ? GeneratedJson(generated)
+                                                           : GeneratedText(generated, options));
+}
+
+void AddHistoryOptions(CLI::App& command, TGenerateOptions& options) {
+    const auto orders = CLI::Range(std::uint64_t{1}, kLongestOrder);
+    command.add_option("--order", options.mOrder, "Longest history (default: that of the model)")
+        ->check(orders)
+        ->option_text("N");
+    command.add_option("--min-order", options.mMinOrder, "Shortest history (default: 1)")
+        ->check(orders)
+        ->option_text("N");
+    command
+        .add_option("--evidence", options.mEvidence,
+                    "History behind which fixed chords must be known (default: 1)")
+        ->check(orders)
+        ->option_text("N");
+    command
+        .add_option("--min-entropy", options.mMinEntropy,
+                    "How varied the chords behind a history must be for it to be used, 0 to 1 "
+                    "(default: 0)")
+        ->check(CLI::Range(0.0, 1.0))
+        ->option_text("H");
+    command.add_flag("--strict", options.mIsStrict,
+                     "Hold --min-entropy at the shortest history and at the end of gaps, too");
+    command
+        .add_option("--all-equal-factor", options.mAllEqualFactor,
+                    "Weight of a sequence of one and the same chord (default: 1)")
+        ->check(CLI::Range(0.0, 1.0))
+        ->option_text("F");
+}
+
+}  // namespace
+
+void AddMarkovGenerate(CLI::App& markov, TStatus& status) {
+    CLI::App& command = AddCommand(markov, kHelp);
+    const auto options = std::make_shared<TGenerateOptions>();
+    command.add_option("MODEL", options->mModel, "Model file; - reads standard input")
+        ->required()
+        ->option_text(" ");
+    command.add_option("--beats", options->mBeats, "Length of the sequence")
+        ->check(CLI::Range(1.0, kMostBeats))
+        ->option_text("BEATS");
+    command.add_option("--template", options->mTemplate, "Chords that are fixed, and gaps")
+        ->option_text("CHORDS");
+    command.add_option("--samples", options->mSamples, "Sequences to choose from (default: 10)")
+        ->check(CLI::Range(std::uint64_t{1}, std::uint64_t{100000}))
+        ->option_text("N");
+    command.add_option("--seed", options->mSeed, "Repeats a run exactly")->option_text("S");
+    AddHistoryOptions(command, *options);
+    command
+        .add_option("--attempts", options->mAttempts,
+                    "Give up after so many attempts (default: 10000)")
+        ->check(CLI::Range(std::uint64_t{1}, kMostAttempts))
+        ->option_text("N");
+    command.add_option("--others", options->mOthers, "Other sequences to show (default: 3)")
+        ->option_text("N");
+    command.add_option("--beats-per-bar", options->mBeatsPerBar, "Beats of a bar (default: 4)")
+        ->check(CLI::Range(1, 64))
+        ->option_text("BEATS");
+    command.add_option("--midi", options->mMidi, "Write the sequence as a MIDI file")
+        ->option_text("PATH");
+    command.add_option("--tempo", options->mTempo, "Beats per minute of that (default: 100)")
+        ->check(CLI::Range(10.0, 1000.0))
+        ->option_text("BPM");
+    options->mFormat.AddTo(command, {"text", "json"});
+    command.callback([options, &status] { status = MarkovGenerate(*options); });
+}
+
+}  // namespace brindle::cli

@@ -1,0 +1,151 @@
+// SPDX-License-Identifier: MIT
+#include "cli/ChordSources.h"
+#include "cli/Markov.h"
+#include "cli/Names.h"
+#include "cli/Progress.h"
+
+#include <fmt/format.h>
+
+#include <filesystem>
+#include <memory>
+#include <utility>
+
+namespace brindle::cli {
+namespace {
+
+constexpr TCommandHelp kHelp{
+    "learn",
+    "Learn which chord follows which in lead sheets, chord strings and chord texts",
+    "  brindle markov learn -o model.json song.musicxml songs/\n"
+    "  brindle markov learn --order 2 --simplify -o model.json songs/\n"
+    "\n"
+    "Lead sheets are read as they are played. A chord string has lengths in beats,\n"
+    "(4,C);(2,F);(2,G7); a chord text has a | before each bar and a . for a beat that a\n"
+    "chord is held on. Folders are walked for .xml, .musicxml, .mxl and .txt.\n",
+};
+
+struct TLearnOptions {
+    std::vector<std::string> mFiles;
+    std::string mModel;
+    std::uint64_t mOrder = 3;
+    bool mSimplify = false;
+    double mBeatsPerBar = 4.0;
+    CFormatOptions mFormat;
+};
+
+/// What was read and learned.
+struct TLearned {
+    std::size_t mFiles = 0;
+    std::size_t mChords = 0;
+    /// Names of files and what is wrong with them.
+    std::vector<std::pair<std::string, std::string>> mUnread;
+    bool mIsNamedFileUnread = false;
+};
+
+void Learn(VariableLengthMarkovModel& model, CHarmAnlsChordsWithLength chords, bool simplify) {
+    if (simplify) {
+        for (CHarmAnlsChordWithLength& chord : chords) chord.SimplifyChord();
+    }
+    std::vector<CMarkovObject> symbols;
+    MarkovObjectsVectorForHarmChords(chords, symbols);
+    model.StartSequence();
+    for (const CMarkovObject& symbol : symbols) model.LearnAddSymbol(symbol);
+    model.EndSequence();
+}
+
+TLearned LearnFiles(VariableLengthMarkovModel& model, const TLearnOptions& options) {
+    TChordStringParse parse;
+    parse.mBeatsPerBar = options.mBeatsPerBar;
+    parse.mChordNamePrefs = NamePrefs();
+    const std::vector<TFoundFile> files = FindChordSources(options.mFiles);
+    TLearned learned;
+    CProgress progress(files.size());
+    for (const TFoundFile& file : files) {
+        progress.Step(file.mPath);
+        const TChordSource source = ReadChordSource(file.mPath, parse);
+        if (!source.mError.empty()) {
+            learned.mUnread.emplace_back(file.mPath, source.mError);
+            learned.mIsNamedFileUnread = learned.mIsNamedFileUnread || file.mIsNamed;
+            continue;
+        }
+        ++learned.mFiles;
+        for (const CHarmAnlsChordsWithLength& chords : source.mSequences) {
+            Learn(model, chords, options.mSimplify);
+            learned.mChords += chords.size();
+        }
+    }
+    return learned;
+}
+
+std::string LearnedJson(const TLearned& learned, const VariableLengthMarkovModel& model) {
+    Json unread = Json::array();
+    for (const auto& [name, error] : learned.mUnread) {
+        unread.push_back({{"File", Printable(name)}, {"Error", Printable(error)}});
+    }
+    return JsonText({{"Files", learned.mFiles},
+                     {"Chords", learned.mChords},
+                     {"MaxHistoryLength", model.mMaxHistoryLength},
+                     {"Symbols", model.mObjects.size()},
+                     {"Histories", model.mTransitionMap.size()},
+                     {"Unread", unread}});
+}
+
+std::string Plural(std::size_t count, std::string_view one, std::string_view many) {
+    return fmt::format("{} {}", count, count == 1 ? one : many);
+}
+
+std::string LearnedText(const TLearned& learned, const VariableLengthMarkovModel& model) {
+    return fmt::format("learned {} from {}: {}, {}\n", Plural(learned.mChords, "chord", "chords"),
+                       Plural(learned.mFiles, "file", "files"),
+                       Plural(model.mObjects.size(), "symbol", "symbols"),
+                       Plural(model.mTransitionMap.size(), "history", "histories"));
+}
+
+void ReportUnread(const TLearned& learned) {
+    for (const auto& [name, error] : learned.mUnread) {
+        Fail(TStatus::BadInput,
+             fmt::format("{} was left out: {}", Printable(name), Printable(error)));
+    }
+}
+
+TStatus MarkovLearn(const TLearnOptions& options) {
+    VariableLengthMarkovModel model(options.mOrder);
+    const TLearned learned = LearnFiles(model, options);
+    ReportUnread(learned);
+    if (learned.mFiles == 0) return Fail(TStatus::BadInput, "there was nothing to learn");
+    if (!model.SaveToFile(options.mModel)) {
+        return Fail(TStatus::BadInput,
+                    fmt::format("{} cannot be written", Printable(options.mModel)));
+    }
+    const TStatus printed =
+        Print(options.mFormat.Format() == TFormat::Json ? LearnedJson(learned, model)
+                                                        : LearnedText(learned, model));
+    return learned.mIsNamedFileUnread ? TStatus::BadInput : printed;
+}
+
+}  // namespace
+
+void AddMarkovLearn(CLI::App& markov, TStatus& status) {
+    CLI::App& command = AddCommand(markov, kHelp);
+    const auto options = std::make_shared<TLearnOptions>();
+    command.add_option("FILES", options->mFiles, "Files and folders")
+        ->required()
+        ->option_text("...");
+    command.add_option("-o,--output", options->mModel, "The model file that is written")
+        ->required()
+        ->option_text("MODEL");
+    command.add_option("--order", options->mOrder, "Longest history, in chords (default: 3)")
+        ->check(CLI::Range(std::uint64_t{1}, kLongestOrder))
+        ->option_text("N");
+    command.add_flag("--simplify", options->mSimplify,
+                     "Make each chord a triad without bass that lasts 4 beats");
+    command
+        .add_option("--beats-per-bar", options->mBeatsPerBar,
+                    "Length of a bar of chord texts in beats (default: 4)")
+        ->check(CLI::Range(1.0, 64.0))
+        ->option_text("BEATS");
+    options->mFormat.AddTo(command, {"text", "json"});
+    command.callback([options, &status] { status = MarkovLearn(*options); });
+}
+
+}  // namespace brindle::cli

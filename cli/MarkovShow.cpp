@@ -1,0 +1,177 @@
+// SPDX-License-Identifier: MIT
+#include "cli/Markov.h"
+#include "cli/Table.h"
+
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <cmath>
+#include <memory>
+#include <numeric>
+
+namespace brindle::cli {
+namespace {
+
+constexpr TCommandHelp kHelp{
+    "show",
+    "Show what a model has learned: its size, how sure it is, and what follows a history",
+    "  brindle markov show model.json\n"
+    "  brindle markov show model.json --history \"(4,Dm7);(4,G7)\"\n",
+};
+
+struct TShowOptions {
+    std::string mModel;
+    std::string mHistory;
+    std::size_t mTop = 10;
+    CFormatOptions mFormat;
+};
+
+/// The histories of one length.
+struct TLengthRow {
+    std::size_t mLength = 0;
+    std::size_t mHistories = 0;
+    /// Means over all places of what was learned.
+    double mEntropy = 0.0;
+    double mMaxEntropy = 0.0;
+};
+
+struct TContinuation {
+    MarkovIterator mSymbol;
+    std::uint32_t mCount = 0;
+    double mProbability = 0.0;
+};
+
+TLengthRow RowOf(const VariableLengthMarkovModel& model, std::size_t length) {
+    TLengthRow row{length};
+    double places = 0.0;
+    MarkovProbabilities table;
+    for (const TMarkovTransitions* const entry : model.mTransitionMap.OfLength(length)) {
+        model.ProbabilitiesForNextSymbol(entry->mHistory, table);
+        double count = 0.0;
+        for (const auto& successor : entry->mCounts) count += successor.second;
+        const double entropy = model.CalculateEntropy(table);
+        ++row.mHistories;
+        if (table.empty() || std::isnan(entropy)) continue;
+        row.mEntropy += entropy * count;
+        row.mMaxEntropy += std::log(static_cast<double>(table.size())) * count;
+        places += count;
+    }
+    if (places > 0.0) {
+        row.mEntropy /= places;
+        row.mMaxEntropy /= places;
+    }
+    return row;
+}
+
+std::vector<TLengthRow> RowsOf(const VariableLengthMarkovModel& model) {
+    std::vector<TLengthRow> rows;
+    for (std::size_t length = 1; length <= model.mMaxHistoryLength; ++length) {
+        rows.push_back(RowOf(model, length));
+    }
+    return rows;
+}
+
+/// Of the history, or of its longest end that the model knows, the most frequent first.
+std::vector<TContinuation> ContinuationsOf(const VariableLengthMarkovModel& model,
+                                           MarkovSequence& history) {
+    const MarkovCounts* counts = nullptr;
+    while (!history.empty() && (counts = model.mTransitionMap.Find(history)) == nullptr) {
+        history.erase(history.begin());
+    }
+    std::vector<TContinuation> continuations;
+    if (counts == nullptr) return continuations;
+    MarkovProbabilities table;
+    model.ProbabilitiesForNextSymbol(history, table);
+    for (const auto& [symbol, count] : *counts) {
+        const auto found = table.find(symbol);
+        continuations.push_back({symbol, count, found == table.end() ? 0.0 : found->second});
+    }
+    std::stable_sort(
+        continuations.begin(), continuations.end(),
+        [](const TContinuation& a, const TContinuation& b) { return a.mCount > b.mCount; });
+    return continuations;
+}
+
+std::string ShownJson(const VariableLengthMarkovModel& model, const MarkovSequence& history,
+                      const std::vector<TContinuation>& continuations) {
+    Json rows = Json::array();
+    for (const TLengthRow& row : RowsOf(model)) {
+        rows.push_back({{"HistoryLength", row.mLength},
+                        {"Histories", row.mHistories},
+                        {"Entropy", NumberToJson(row.mEntropy)},
+                        {"MaxEntropy", NumberToJson(row.mMaxEntropy)}});
+    }
+    Json following = Json::array();
+    for (const TContinuation& continuation : continuations) {
+        Json symbol = SymbolToJson(*continuation.mSymbol);
+        symbol["Count"] = continuation.mCount;
+        symbol["Probability"] = NumberToJson(continuation.mProbability);
+        following.push_back(symbol);
+    }
+    return JsonText({{"MaxHistoryLength", model.mMaxHistoryLength},
+                     {"Symbols", model.mObjects.size()},
+                     {"Histories", model.mTransitionMap.size()},
+                     {"HistoryLengths", rows},
+                     {"History", ChordString(history)},
+                     {"Continuations", following}});
+}
+
+std::string ShownText(const VariableLengthMarkovModel& model, const MarkovSequence& history,
+                      const std::vector<TContinuation>& continuations, const CPaint& paint) {
+    CTable lengths({" history length", " histories", " mean entropy", " of at most"});
+    for (const TLengthRow& row : RowsOf(model)) {
+        lengths.AddRow({fmt::format("{}", row.mLength), fmt::format("{}", row.mHistories),
+                        fmt::format("{:.3f}", row.mEntropy),
+                        fmt::format("{:.3f}", row.mMaxEntropy)});
+    }
+    CTable following({" count", " probability", "symbol"});
+    for (const TContinuation& continuation : continuations) {
+        following.AddRow({fmt::format("{}", continuation.mCount),
+                          fmt::format("{:.3f}", continuation.mProbability),
+                          ChordString({&continuation.mSymbol, 1})});
+    }
+    return fmt::format("{} symbols, {} histories of 1 to {} symbols\n\n{}\nbehind {}\n{}",
+                       model.mObjects.size(), model.mTransitionMap.size(), model.mMaxHistoryLength,
+                       lengths.Text(paint), ChordString(history), following.Text(paint));
+}
+
+TStatus MarkovShow(const TShowOptions& options) {
+    auto model = ReadModel(options.mModel);
+    if (!model) return TStatus::BadInput;
+    MarkovSequence history;
+    if (options.mHistory.empty()) {
+        model->Subvector(1, {}, history);
+    } else {
+        const auto symbols = ReadSymbols("--history", options.mHistory);
+        if (!symbols) return TStatus::BadUsage;
+        history = model->IteratorSequenceForObjects(*symbols);
+    }
+    auto continuations = ContinuationsOf(*model, history);
+    if (history.empty()) {
+        return Fail(TStatus::BadInput, "the model does not know the last chord of --history");
+    }
+    continuations.resize(std::min(continuations.size(), options.mTop));
+    return Print(options.mFormat.Format() == TFormat::Json
+                     ? ShownJson(*model, history, continuations)
+                     : ShownText(*model, history, continuations, CPaint()));
+}
+
+}  // namespace
+
+void AddMarkovShow(CLI::App& markov, TStatus& status) {
+    CLI::App& command = AddCommand(markov, kHelp);
+    const auto options = std::make_shared<TShowOptions>();
+    command.add_option("MODEL", options->mModel, "Model file; - reads standard input")
+        ->required()
+        ->option_text(" ");
+    command
+        .add_option("--history", options->mHistory,
+                    "Show what follows these chords (default: the start of a sequence)")
+        ->option_text("CHORDS");
+    command.add_option("--top", options->mTop, "Continuations to show (default: 10)")
+        ->option_text("N");
+    options->mFormat.AddTo(command, {"text", "json"});
+    command.callback([options, &status] { status = MarkovShow(*options); });
+}
+
+}  // namespace brindle::cli

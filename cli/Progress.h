@@ -1,0 +1,28 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <cstddef>
+#include <string>
+#include <string_view>
+
+namespace brindle::cli {
+
+/// A bar on standard error that tells how far a work of many steps is. Elsewhere than on a terminal
+/// nothing is shown. The bar is gone when the object is.
+class CProgress {
+public:
+    explicit CProgress(std::size_t steps);
+    CProgress(const CProgress&) = delete;
+    CProgress& operator=(const CProgress&) = delete;
+    ~CProgress();
+
+    /// The next step begins; `name` is what it works on.
+    void Step(std::string_view name);
+
+private:
+    std::size_t mSteps;
+    std::size_t mBegun = 0;
+    bool mIsShown;
+};
+
+}  // namespace brindle::cli
