@@ -3,8 +3,8 @@
 
 #include "brindle/markov/CMarkovObjects.h"
 
+#include <array>
 #include <cstdint>
-#include <deque>
 #include <vector>
 
 namespace brindle {
@@ -19,9 +19,9 @@ struct TMarkovTransitions {
 /// The counts of a model: a map from histories of all lengths to the counts of what followed.
 /// Histories whose symbols order alike are one entry, which shows the symbols that came first.
 ///
-/// With a history all its ends are in the map, so an entry is found through that of the history
-/// without its oldest symbol, by hash. Counting at all lengths takes one step for each length,
-/// and no order is kept up meanwhile: InOrder makes it when it is wanted.
+/// Entries are found by hash. With a history all its ends are in the map, so that counting at all
+/// lengths compares no histories: an entry is known by that of the history without its oldest
+/// symbol. No order is kept up meanwhile; InOrder makes it when it is wanted.
 class CMarkovTransitionMap {
 public:
     /// Adds `count` to the symbol behind the history and behind each of its ends, down to length 1.
@@ -31,8 +31,8 @@ public:
     [[nodiscard]] const MarkovCounts* Find(MarkovSequenceView history) const;
 
     /// The number of histories.
-    [[nodiscard]] std::size_t size() const { return mEntries.size(); }
-    [[nodiscard]] bool empty() const { return mEntries.empty(); }
+    [[nodiscard]] std::size_t size() const { return mSize; }
+    [[nodiscard]] bool empty() const { return mSize == 0; }
 
     /// All entries, their histories in lexicographic order, a shorter one before its continuations;
     /// or those of one length.
@@ -44,21 +44,32 @@ public:
     void Clear();
 
 private:
-    struct TEntry : TMarkovTransitions {
+    /// As large as a line of the usual processor's cache.
+    struct alignas(64) TEntry : TMarkovTransitions {
         /// The entry of the history without its oldest symbol, and the class of that symbol.
         std::uint32_t mShorter = 0;
         std::uint32_t mOldestClass = 0;
     };
+    /// A free place in the table has the entry kNoEntry.
+    struct TSlot {
+        std::uint32_t mHash = 0;
+        std::uint32_t mEntry = 0;
+    };
 
-    [[nodiscard]] std::uint32_t FindEntry(std::uint32_t shorter, std::uint32_t oldestClass) const;
-    [[nodiscard]] std::size_t SlotOf(std::uint32_t shorter, std::uint32_t oldestClass) const;
+    [[nodiscard]] const TEntry& At(std::uint32_t number) const;
+    [[nodiscard]] TEntry& At(std::uint32_t number);
+    template <class IsWanted>
+    [[nodiscard]] const TSlot& SlotOf(std::uint32_t hash, IsWanted isWanted) const;
     std::uint32_t AddEntry(std::uint32_t shorter, MarkovSequenceView history);
+    void Fetch(MarkovSequenceView history) const;
     void GrowSlots();
     [[nodiscard]] MarkovSequenceView Keep(MarkovSequenceView history);
 
-    std::deque<TEntry> mEntries;
-    /// Open addressing: the number of an entry, or kNoEntry.
-    std::vector<std::uint32_t> mSlots;
+    /// In pieces that never move.
+    std::vector<std::vector<TEntry>> mEntries;
+    std::size_t mSize = 0;
+    /// Open addressing by the hash of the history.
+    std::vector<TSlot> mSlots;
     /// The symbols of the histories, in pieces that never move.
     std::vector<std::vector<MarkovIterator>> mKeptSymbols;
 };

@@ -34,12 +34,13 @@ bool VariableLengthMarkovModel::AppendNextFittingSymbol(
         // An entropy that is not a number passes.
         const bool isVaried = !(entropy / (maxEntropy + kNotZero) < options.mMinNormalizedEntropy);
         const bool isShortest = length <= options.mMinHistoryLength || length == 0;
+        const auto fillsExactly = [&] {
+            return options.mAcceptExactFill &&
+                   static_cast<double>(GetMaxLengthFromProbabilities(table)) == remaining;
+        };
         const bool isAccepted =
             !table.empty() &&
-            (isVaried || (isShortest ? options.mAcceptAtMinHistory
-                                     : options.mAcceptExactFill &&
-                                           static_cast<double>(
-                                               GetMaxLengthFromProbabilities(table)) == remaining));
+            (isVaried || (isShortest ? options.mAcceptAtMinHistory : fillsExactly()));
         if (isAccepted) {
             const MarkovIterator chosen = ChooseFromProbabilities(table);
             sequence.Append({table.at(chosen), entropy / maxEntropy, maxEntropy, length, chosen});
