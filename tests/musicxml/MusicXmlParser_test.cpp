@@ -202,3 +202,33 @@ TEST_CASE("A host is told all of a score in its order") {
     }
     CHECK(files == 14);
 }
+
+TEST_CASE("A quartet with a bit of everything is told as it sounds") {
+    const test::TEventLog log = test::ImportFile(BRINDLE_TEST_DATA "/scores/everything.musicxml");
+    REQUIRE(log.mOk);
+    // Position, length, note, velocity and voice of each note, part after part.
+    const json parts = json::parse(R"([
+        [[0,960,67,90,1],[3720,120,71,90,1],[3840,1440,72,105,1],[5280,480,74,90,1],
+         [5760,320,75,90,1],[6080,320,74,90,1],[6400,320,72,90,1],[6720,6720,70,90,1],
+         [13440,960,77,90,2],[13440,1920,68,90,1]],
+        [[0,960,46,90,5],[3840,3840,62,90,1],[3840,3840,65,90,1],[3840,3840,70,90,1],
+         [4800,960,55,90,2],[3840,3840,34,105,5],[7680,1440,69,90,1],[9120,960,67,90,1],
+         [10080,1920,66,90,1],[12000,1920,61,90,1]],
+        [[3840,960,65,90,1],[4800,960,72,90,1],[4800,960,79,90,1],[5760,1920,-1,90,1]],
+        [[0,768,70,90,1],[768,768,72,90,1],[1536,768,74,90,1],[2304,768,75,90,1],
+         [3072,768,77,90,1]]])");
+    json told = json::array();
+    for (const json& call : log.mCalls) {
+        if (call.at("call") == "didEncounterPartStart") told.push_back(json::array());
+        if (call.at("call") == "didEncounterNote") told.back().push_back(NoteForm(call));
+    }
+    CHECK(told == parts);
+    const json clarinet = log.Of("didEncounterNote");
+    CHECK(clarinet.at(4).at("mTuplet").at("mTupletActual").dump() ==
+          R"({"mTupletNumber":{"CMuxmlFontAndColor":{"CMuxmlFont":{"mFontSize":8}},)"
+          R"("mTupletNumber":3},"mTupletType":{"mTupletType":7}})");
+    CHECK(clarinet.at(9).at("mScoop").at("CMuxmlLine").at("mLineType") == 3);
+    const auto ends = log.Of("didEncounterPartEnd");
+    CHECK(ends.at(1).at("mPositionedStaves") == json::parse("[[0,2],[3840,0]]"));
+    CHECK(log.Of("didEncounterPartStart").at(3).at("mHasStringInstrument") == true);
+}
