@@ -65,5 +65,6 @@ void AddVector(CLI::App& program, TStatus& status);
 void AddKeys(CLI::App& program, TStatus& status);
 void AddNumerals(CLI::App& program, TStatus& status);
 void AddHarmonies(CLI::App& program, TStatus& status);
+void AddImport(CLI::App& program, TStatus& status);
 
 }  // namespace brindle::cli

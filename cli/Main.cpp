@@ -77,6 +77,7 @@ int main(int argc, char** argv) {
     AddNumerals(program, status);
     AddHarmonies(program, status);
     AddMarkov(program, status);
+    AddImport(program, status);
     try {
         program.parse(argc, argv);
     } catch (const CLI::ParseError& error) {

@@ -1,0 +1,183 @@
+// SPDX-License-Identifier: MIT
+#include "cli/CommandLine.h"
+#include "cli/ImportedScore.h"
+#include "cli/Input.h"
+#include "cli/Json.h"
+#include "cli/MidiFile.h"
+
+#include "brindle/musicxml/MusicXmlParser.h"
+#include "brindle/musicxml/MuxmlJsonLines.h"
+#include "brindle/platform/Alerts.h"
+
+#include <fmt/format.h>
+
+#include <functional>
+#include <memory>
+#include <optional>
+#include <stdexcept>
+#include <utility>
+
+namespace brindle::cli {
+namespace {
+
+constexpr TCommandHelp kHelp{
+    "import",
+    "Import a MusicXML score as timed notes",
+    "  brindle import song.musicxml\n"
+    "  brindle import song.mxl --format ndjson | grep didEncounterNote\n"
+    "  brindle import song.mxl --midi song.mid\n",
+};
+
+struct TImportOptions {
+    std::string mFile;
+    std::string mFormat = "text";
+    bool mJson = false;
+    std::string mMidiFile;
+
+    [[nodiscard]] bool IsNdjson() const { return mJson || mFormat == "ndjson"; }
+};
+
+/// Shows alerts as errors of the program while it lives, and counts them.
+class CAlertsAsErrors {
+public:
+    explicit CAlertsAsErrors(const std::string& name) {
+        SetAlertHandler([this, name](const TAlert& alert) {
+            ++mCount;
+            Fail(TStatus::BadInput,
+                 fmt::format("{}: {}: {}", Printable(name), Printable(alert.messageText),
+                             Printable(alert.informativeText)));
+        });
+    }
+    CAlertsAsErrors(const CAlertsAsErrors&) = delete;
+    CAlertsAsErrors& operator=(const CAlertsAsErrors&) = delete;
+    ~CAlertsAsErrors() { SetAlertHandler({}); }
+
+    [[nodiscard]] int Count() const { return mCount; }
+
+private:
+    int mCount = 0;
+};
+
+/// One method that calls two.
+template <class... Arguments>
+std::function<void(Arguments...)> Both(std::function<void(Arguments...)> first,
+                                       std::function<void(Arguments...)> second) {
+    if (!first || !second) return first ? first : second;
+    return [first = std::move(first), second = std::move(second)](Arguments... arguments) {
+        first(arguments...);
+        second(arguments...);
+    };
+}
+
+// The methods that an imported score has are called beside those that write lines.
+MusicXmlParserDelegate Both(const MusicXmlParserDelegate& lines,
+                            const MusicXmlParserDelegate& score) {
+    MusicXmlParserDelegate both = lines;
+    const auto join = [&](auto method) { both.*method = Both(lines.*method, score.*method); };
+    join(&MusicXmlParserDelegate::didEncounterPartStart);
+    join(&MusicXmlParserDelegate::didEncounterPartEnd);
+    join(&MusicXmlParserDelegate::didEncounterMeasureEnd);
+    join(&MusicXmlParserDelegate::didEncounterSignTime);
+    join(&MusicXmlParserDelegate::didEncounterSignKey);
+    join(&MusicXmlParserDelegate::didEncounterClef);
+    join(&MusicXmlParserDelegate::didEncounterTranspose);
+    join(&MusicXmlParserDelegate::didEncounterTempoChange);
+    join(&MusicXmlParserDelegate::didEncounterDirection);
+    join(&MusicXmlParserDelegate::didEncounterNote);
+    return both;
+}
+
+// Compressed scores are known by the first bytes of a zip archive where there is no file name.
+bool ImportBytes(MusicXmlParser& parser, const std::string& bytes,
+                 const std::shared_ptr<const MusicXmlParserDelegate>& host, Error& error) {
+    if (!bytes.starts_with("PK")) return parser.parseBytes(bytes, host, &error);
+    std::string score;
+    if (const auto failure = MusicXmlParser::unpackCompressedMusicXML(bytes, score)) {
+        return MusicXmlParser::assignLocalError(*failure, &error);
+    }
+    return parser.parseBytes(score, host, &error);
+}
+
+// False with an error; nothing when standard input cannot be read.
+std::optional<bool> ImportFrom(const std::string& file,
+                               const std::shared_ptr<const MusicXmlParserDelegate>& host,
+                               Error& error) {
+    MusicXmlParser parser;
+    parser.MidiTicksPerQuarter = kImportTicksPerQuarter;
+    try {
+        if (file != "-") return parser.parseURL(file, host, &error);
+        const auto bytes = ReadInput(file);
+        if (!bytes) return std::nullopt;
+        return ImportBytes(parser, *bytes, host, error);
+    } catch (const std::domain_error& exception) {
+        // Divisions of 0 leave no unit in which places in the bar could be told.
+        error = {"", 0, exception.what()};
+        return false;
+    }
+}
+
+std::string ResultLine(bool isOk, const Error& error) {
+    Json line{{"call", "result"}, {"ok", isOk}};
+    if (!isOk) {
+        line["domain"] = error.domain;
+        line["code"] = error.code;
+        line["description"] = error.description;
+    }
+    return line.dump(-1, ' ', false, Json::error_handler_t::replace) + '\n';
+}
+
+TStatus Import(const TImportOptions& options) {
+    const std::string name = options.mFile == "-" ? "standard input" : options.mFile;
+    const CAlertsAsErrors alerts(name);
+    TImportedScore score;
+    std::string output;
+    MusicXmlParserDelegate methods = HostFor(score);
+    if (options.IsNdjson()) {
+        const auto lines = MuxmlJsonLines(
+            TMuxmlEnumForm_Word, [&output](const std::string& line) { output += line + '\n'; });
+        methods = options.mMidiFile.empty() ? lines : Both(lines, methods);
+    }
+    Error error;
+    const auto isOk =
+        ImportFrom(options.mFile, std::make_shared<MusicXmlParserDelegate>(methods), error);
+    if (!isOk) return TStatus::BadInput;
+    if (!*isOk) {
+        Fail(TStatus::BadInput,
+             fmt::format("{}: {}", Printable(name), Printable(error.description)));
+    }
+    TStatus status = *isOk && alerts.Count() == 0 ? TStatus::Success : TStatus::BadInput;
+    if (options.IsNdjson()) {
+        output += ResultLine(*isOk, error);
+    } else if (*isOk) {
+        output = ImportText(score, CPaint());
+    }
+    if (Print(output) != TStatus::Success) return TStatus::BadInput;
+    if (*isOk && !options.mMidiFile.empty() &&
+        !WriteMidiFile(options.mMidiFile, MidiPieceOf(score))) {
+        status = Fail(TStatus::BadInput,
+                      fmt::format("{} cannot be written", Printable(options.mMidiFile)));
+    }
+    return status;
+}
+
+}  // namespace
+
+void AddImport(CLI::App& program, TStatus& status) {
+    CLI::App& command = AddCommand(program, kHelp);
+    const auto options = std::make_shared<TImportOptions>();
+    command
+        .add_option("FILE", options->mFile,
+                    "A score in MusicXML, compressed if its name ends in .mxl; - reads standard "
+                    "input")
+        ->required()
+        ->option_text(" ");
+    AddChoice(command, "--format", options->mFormat, {"text", "ndjson"}, "Form of the output");
+    command.add_flag("--json", options->mJson, "Short for --format ndjson")
+        ->excludes("--format")
+        ->option_text(" ");
+    command.add_option("--midi", options->mMidiFile, "Also write the notes to a MIDI file")
+        ->option_text("FILE");
+    command.callback([options, &status] { status = Import(*options); });
+}
+
+}  // namespace brindle::cli
