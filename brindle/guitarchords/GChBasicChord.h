@@ -6,6 +6,7 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <iosfwd>
 #include <memory>
 #include <nlohmann/json_fwd.hpp>
 #include <optional>
@@ -178,5 +179,8 @@ private:
     std::string mUserName;
     std::int32_t mDbChordID = -1;
 };
+
+/// The property list, for debugging.
+std::ostream& operator<<(std::ostream& stream, const GChBasicChord& chord);
 
 }  // namespace brindle

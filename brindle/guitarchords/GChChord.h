@@ -4,6 +4,7 @@
 #include "brindle/guitarchords/GChBasicChord.h"
 
 #include <cstdint>
+#include <iosfwd>
 #include <memory>
 #include <nlohmann/json_fwd.hpp>
 #include <optional>
@@ -100,6 +101,9 @@ private:
     std::int8_t mRootEnhType = -1;
     std::int8_t mBassEnhType = -1;
 };
+
+/// The property list, for debugging.
+std::ostream& operator<<(std::ostream& stream, const GChChord& chord);
 
 /// The name of a chord that the user has named: "C# maj7". A negative root is left out, one above
 /// 11 has an empty name.

@@ -2,6 +2,7 @@
 #pragma once
 
 #include <cstdint>
+#include <iosfwd>
 #include <nlohmann/json_fwd.hpp>
 #include <optional>
 
@@ -69,5 +70,8 @@ private:
 };
 
 static_assert(sizeof(GChChordElem) == 5);
+
+/// The property list, for debugging.
+std::ostream& operator<<(std::ostream& stream, const GChChordElem& elem);
 
 }  // namespace brindle

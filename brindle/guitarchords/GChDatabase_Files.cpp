@@ -7,8 +7,6 @@
 
 #include <nlohmann/json.hpp>
 
-#include <algorithm>
-
 namespace brindle {
 
 namespace fs = std::filesystem;
@@ -50,6 +48,16 @@ bool IsLibrary(const FileNode& file) {
     return !file.mIsFolder && file.mContents.compare(0, kMagic.size(), kMagic) == 0;
 }
 
+std::size_t CountEntries(const fs::path& folder) {
+    std::error_code error;
+    std::size_t count = 0;
+    for (fs::directory_iterator entries(folder, error); entries != fs::directory_iterator();
+         entries.increment(error)) {
+        ++count;
+    }
+    return count;
+}
+
 /// What stands at a path where a package is to be written.
 enum class TPlace { Free, EmptyPackage, Package, Foreign };
 
@@ -59,9 +67,7 @@ TPlace PlaceAt(const fs::path& path) {
     const auto folder = ReadFolder(path);
     if (!folder) return TPlace::Foreign;
     // Entries that cannot be read are not in the tree; they are of value, too.
-    const auto entries = static_cast<std::size_t>(
-        std::distance(fs::directory_iterator(path, error), fs::directory_iterator()));
-    if (error || entries != folder->mChildren.size()) return TPlace::Foreign;
+    if (CountEntries(path) != folder->mChildren.size()) return TPlace::Foreign;
     bool isEmpty = true;
     for (const auto& [name, child] : folder->mChildren) {
         if (name == kInfoName && !child.mIsFolder) continue;

@@ -25,9 +25,9 @@ fs::path FreePath(const fs::path& folder, std::uintptr_t number) {
 /// Replaces a file of a package. What a kill leaves unfinished lies beside the package, where no
 /// reader takes it for a library; if that place is not to be had, in it.
 bool WriteLibraryFile(const fs::path& path, const std::string& content) {
-    const fs::path package = fs::absolute(path).parent_path();
-    return WriteFileAtomically(path, content, package.parent_path()) ||
-           WriteFileAtomically(path, content);
+    std::error_code error;
+    const fs::path besidePackage = fs::absolute(path, error).parent_path().parent_path();
+    return WriteFileAtomically(path, content, besidePackage) || WriteFileAtomically(path, content);
 }
 
 }  // namespace

@@ -4,6 +4,7 @@
 #include "brindle/guitarchords/GChShortTuning.h"
 
 #include <cstdint>
+#include <iosfwd>
 #include <nlohmann/json_fwd.hpp>
 
 namespace brindle {
@@ -45,5 +46,8 @@ private:
     std::uint8_t mNumberOfStrings = 0;
     GChShortTuning mOpenStringPitches{};
 };
+
+/// The property list, for debugging.
+std::ostream& operator<<(std::ostream& stream, const GChTuningDescr& tuning);
 
 }  // namespace brindle

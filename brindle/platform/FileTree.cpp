@@ -104,7 +104,7 @@ std::optional<FileNode> ReadFolder(const fs::path& path, std::uint64_t limit) {
         FileNode node;
         node.mIsFolder = entries->is_directory(ignored);
         if (!node.mIsFolder) {
-            if (!entries->is_regular_file(ignored)) continue;
+            if (!entries->is_regular_file(ignored) || entries->file_size(ignored) > limit) continue;
             auto bytes = ReadWholeFile(entries->path(), static_cast<std::size_t>(limit));
             if (!bytes) continue;
             limit -= bytes->size();

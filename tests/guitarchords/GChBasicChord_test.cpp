@@ -4,6 +4,7 @@
 
 #include "brindle/guitarchords/GChLibrary.h"
 #include "brindle/guitarchords/GChTuning.h"
+#include "brindle/theory/Trace.h"
 
 #include <doctest/doctest.h>
 
@@ -243,4 +244,13 @@ TEST_CASE("Under a capodaster the view and the fingering name another root") {
     chord->setUserName("");
     CHECK_FALSE(chord->chordName(-1, 0).has_value());
     CHECK_FALSE(GChChord::make(nullptr, 0).has_value());
+}
+
+TEST_CASE("A fingering prints its property list") {
+    const auto chord = GuitarChord({{1, 0, 0, 5, 0}});
+    chord->setUserName("\xFF");
+    CHECK(
+        TraceString(chord->chordElems()[0]) ==
+        R"({"absFretIndex":0,"coveredMaxStr":5,"coveredMinStr":0,"fingerNumber":1,"fingerPointType":0})");
+    CHECK(TraceString(ViewOf(chord)).find(TraceString(*chord)) != std::string::npos);
 }
