@@ -127,6 +127,7 @@
 #include "brindle/platform/FileNode.h"
 #include "brindle/platform/FileTree.h"
 #include "brindle/platform/Localization.h"
+#include "brindle/platform/LogWriter.h"
 #include "brindle/platform/PlainText.h"
 #include "brindle/platform/PropertyList.h"
 #include "brindle/platform/Random.h"
