@@ -52,6 +52,7 @@ struct TAnalyseOptions {
     double mBeatsPerChord = 1.0;
     CTypedChords mReading;
     bool mReadings = false;
+    bool mGrids = false;
     CFormatOptions mFormat;
 };
 
@@ -75,6 +76,9 @@ std::optional<std::string> Contradiction(const TAnalyseOptions& options) {
     }
     if (options.mReadings && options.mFormat.Format() == TFormat::Native) {
         return "--readings has no native form; --format json shows them";
+    }
+    if (options.mGrids && options.mFormat.Format() != TFormat::Svg) {
+        return "--grids belong into a picture, --format svg";
     }
     return std::nullopt;
 }
@@ -103,6 +107,13 @@ TSongKeys KeysOf(const TAnalysedSong& analysed) {
                         {.mBeatsPerBar = beatsPerBar});
 }
 
+std::string Picture(const TSong& song, bool withGrids) {
+    const auto database = withGrids ? ReadGrids("") : nullptr;
+    if (database == nullptr) return AnalysisSvg(song);
+    const TChordGrids grids = GridsOfSong(*database, song);
+    return AnalysisSvg(song, &grids);
+}
+
 std::string Present(const TAnalysedSong& analysed, const TAnalyseOptions& options) {
     switch (options.mFormat.Format()) {
         case TFormat::Json:
@@ -118,7 +129,7 @@ std::string Present(const TAnalysedSong& analysed, const TAnalyseOptions& option
         case TFormat::Svg: {
             TSong song = SongOf(analysed, options);
             song.mCopies = MakeSongCopies(analysed.mAnalyse, *analysed.mSymbols);
-            return AnalysisSvg(song);
+            return Picture(song, options.mGrids);
         }
         case TFormat::Text:
         case TFormat::Chords:
@@ -235,6 +246,8 @@ void AddAnalyse(CLI::App& program, TStatus& status) {
     command.add_flag("--readings", options->mReadings,
                      "Show all readings that progressions to a tonic allow");
     options->mReading.AddTo(command, "In what form the chord text is written");
+    command.add_flag("--grids", options->mGrids,
+                     "Draw a guitar fingering under each chord of the picture");
     options->mFormat.AddTo(command, {"text", "json", "native", "svg"});
     command.callback([options, &status] { status = Analyse(*options); });
 }

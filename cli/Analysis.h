@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "cli/GridDatabase.h"
 #include "cli/Output.h"
 #include "cli/Song.h"
 
@@ -21,7 +22,8 @@ class CChordSymbols;
                                        const CChordSymbols& symbols, const TSongKeys& keys,
                                        const TMusicXMLDoc* sheet = nullptr);
 
-/// A picture: chords along a time axis, bands for sign keys, centers and readings.
-[[nodiscard]] std::string AnalysisSvg(const TSong& song);
+/// A picture: chords along a time axis, bands for sign keys, centers and readings; with `grids` the
+/// fingering of each chord under it.
+[[nodiscard]] std::string AnalysisSvg(const TSong& song, const TChordGrids* grids = nullptr);
 
 }  // namespace brindle::cli

@@ -1,13 +1,14 @@
 // SPDX-License-Identifier: MIT
 // A song as a picture. Time runs from left to right and breaks into lines as text does. Each line
 // has, from above: the numbers of the bars, a band for the sign key, a band for the center, the
-// chords in boxes with their function or else their degree under them, a band for the key of the
-// passage, and thin bands for the repeated passages and for the readings. A score has its title
-// above, and its times and rehearsal marks beside the numbers of the bars. The color of a band is
-// that of its key.
+// chords in boxes with their function or else their degree under them, their fingerings if these
+// are asked for, a band for the key of the passage, and thin bands for the repeated passages and
+// for the readings. A score has its title above, and its times and rehearsal marks beside the
+// numbers of the bars. The color of a band is that of its key.
 
 #include "cli/Analysis.h"
 #include "cli/AnalysisSvg_Copies.h"
+#include "cli/GridSvg.h"
 #include "cli/KeyColor.h"
 #include "cli/Names.h"
 #include "cli/SongShapes.h"
@@ -28,8 +29,10 @@ constexpr double kSignKeyTop = 18.0;
 constexpr double kCenterTop = 38.0;
 constexpr double kChordTop = 60.0;
 constexpr double kFunctionTop = kChordTop + kCaptionBelowChord;
-constexpr double kKeysTop = 115.0;
-constexpr double kReadingsTop = 138.0;
+constexpr double kGridTop = 128.0;    // of the strings, with the open ones marked above
+constexpr double kKeysTop = 115.0;    // without grids
+constexpr double kCopiesTop = 138.0;  // without grids
+constexpr double kGridRoom = 64.0;
 constexpr double kReadingPitch = 16.0;
 constexpr double kLineGap = 24.0;
 
@@ -45,6 +48,11 @@ constexpr double kTimeLeft = 34.0;
 
 constexpr double kFunctionSize = 11.0;
 
+// A chord with a grid under it, and the room on its left for the number of the first fret.
+constexpr double kNarrowestGrid = 76.0;
+constexpr double kGridLeft = 20.0;
+constexpr double kGridScale = 0.5;
+
 constexpr double kPadding = 5.0;
 
 // More readings of one place than this are no help to the eye.
@@ -57,8 +65,8 @@ std::string FunctionOf(const TShownChord& chord) {
     return function;
 }
 
-double WidestChord(const TSong& song) {
-    double widest = 0.0;
+double WidestChord(const TSong& song, bool hasGrids) {
+    double widest = hasGrids ? kNarrowestGrid : 0.0;
     ForEachChord(song, [&](const TShownChord& chord) {
         widest = std::max(widest, WidthOfChord(chord.mSymbol, FunctionOf(chord), kFunctionSize));
     });
@@ -99,8 +107,11 @@ private:
 
 class CSongPicture {
 public:
-    explicit CSongPicture(const TSong& song)
-        : mSong(song), mAxis(song, kLineWidth, WidestChord(song)), mLanes(song.mReadings) {
+    CSongPicture(const TSong& song, const TChordGrids* grids)
+        : mSong(song),
+          mGrids(grids),
+          mAxis(song, kLineWidth, WidestChord(song, grids != nullptr)),
+          mLanes(song.mReadings) {
         PlaceLines();
         if (song.mEnd <= 0.0) {
             mSvg.Text(kMargin + kPadding, kMargin + kChordTop, "no chords",
@@ -115,8 +126,8 @@ public:
         }
         const std::string noKey = ColorOf(CSignKeyLite_Undef, Shade_Chord);
         for (const TShownChord& chord : song.mLooseChords) Draw(chord, noKey);
-        DrawKeyRegions(mSvg, mAxis, mPlaces, song.mKeys, kKeysTop, kBandHeight);
-        DrawCopies(mSvg, mAxis, mPlaces, song, kReadingsTop, kReadingHeight);
+        DrawKeyRegions(mSvg, mAxis, mPlaces, song.mKeys, kKeysTop + GridRoom(), kBandHeight);
+        DrawCopies(mSvg, mAxis, mPlaces, song, kCopiesTop + GridRoom(), kReadingHeight);
         DrawReadings();
     }
 
@@ -139,9 +150,12 @@ private:
         return title;
     }
 
+    // What lies under the chords moves down by this.
+    [[nodiscard]] double GridRoom() const { return mGrids == nullptr ? 0.0 : kGridRoom; }
+
     // The repeated passages have a band above the readings.
     [[nodiscard]] double ReadingsTop() const {
-        return kReadingsTop + (mSong.mCopies.empty() ? 0.0 : kReadingPitch);
+        return kCopiesTop + GridRoom() + (mSong.mCopies.empty() ? 0.0 : kReadingPitch);
     }
 
     // Each line is as high as the readings on it need.
@@ -212,6 +226,16 @@ private:
                    chord.mSymbol,
                    FunctionOf(chord),
                    {.mSize = kFunctionSize, .mColor = kFaintInk}});
+        DrawGridOf(chord);
+    }
+
+    void DrawGridOf(const TShownChord& chord) {
+        if (mGrids == nullptr) return;
+        const auto grid = mGrids->find(chord.mSymbol);
+        const auto segments = mAxis.SegmentsOf(chord.mRange);
+        if (grid == mGrids->end() || segments.empty()) return;
+        const double x = kMargin + segments[0].mLeft + kPadding + kGridLeft;
+        DrawGrid(mSvg, grid->second, x, mPlaces.mTops[segments[0].mLine] + kGridTop, kGridScale);
     }
 
     void DrawReadings() {
@@ -232,6 +256,7 @@ private:
     }
 
     const TSong& mSong;
+    const TChordGrids* mGrids;
     CTimeAxis mAxis;
     CLanes mLanes;
     CSvg mSvg;
@@ -241,8 +266,8 @@ private:
 
 }  // namespace
 
-std::string AnalysisSvg(const TSong& song) {
-    return CSongPicture(song).File();
+std::string AnalysisSvg(const TSong& song, const TChordGrids* grids) {
+    return CSongPicture(song, grids).File();
 }
 
 }  // namespace brindle::cli

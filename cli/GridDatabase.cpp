@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: MIT
 #include "cli/GridDatabase.h"
 
+#include "cli/Input.h"
+#include "cli/Names.h"
+
 #include "brindle/guitarchords/GChChordTypes.h"
 #include "brindle/guitarchords/GChFilterParameter.h"
 #include "brindle/platform/FileTree.h"
@@ -8,6 +11,8 @@
 #include "brindle/theory/KeyIntervals.h"
 
 #include <fmt/format.h>
+
+#include <algorithm>
 
 namespace brindle::cli {
 
@@ -24,8 +29,7 @@ std::unique_ptr<GChDatabase> ReadGrids(const std::string& packagePath) {
 }
 
 std::vector<TGrid> FindGrids(const GChDatabase& database, std::string_view symbol,
-                             const CChordLite& chord, const GChShortTuning& tuning, int capo,
-                             std::size_t most) {
+                             const CChordLite& chord, const GChShortTuning& tuning, int capo) {
     const CChordTypeId type = GChChordTypeIdForSemitones(chord.mSemitones);
     if (chord.IsUndef() || type == 0) return {};
     GChFilterParameter filter;
@@ -38,12 +42,28 @@ std::vector<TGrid> FindGrids(const GChDatabase& database, std::string_view symbo
     for (const auto& library : database.allLibrariesForAnyTuning()) {
         if (!GChIsEqualShortTuning(library->gchTuning()->shortTuning(), tuning)) continue;
         for (const auto& basicChord : library->basicChords()) {
-            if (grids.size() == most) return grids;
             if (!filter.Accepts(*basicChord)) continue;
             grids.push_back(GridOfChord(symbol, *GChChord::make(basicChord, 0), capo));
         }
     }
     return grids;
+}
+
+TChordGrids GridsOfSong(const GChDatabase& database, const TSong& song) {
+    const auto highestFret = [](const TGrid& grid) {
+        return *std::max_element(grid.mFrets.begin(), grid.mFrets.end());
+    };
+    TChordGrids gridOfSymbol;
+    ForEachChord(song, [&](const TShownChord& shown) {
+        if (gridOfSymbol.count(shown.mSymbol) > 0) return;
+        const CChordLite chord(FoldAccidentals(shown.mSymbol), NamePrefs());
+        auto grids = FindGrids(database, shown.mSymbol, chord, kGChStandardGuitar, 0);
+        const auto lowest = std::min_element(
+            grids.begin(), grids.end(),
+            [&](const TGrid& a, const TGrid& b) { return highestFret(a) < highestFret(b); });
+        if (lowest != grids.end()) gridOfSymbol.emplace(shown.mSymbol, std::move(*lowest));
+    });
+    return gridOfSymbol;
 }
 
 }  // namespace brindle::cli

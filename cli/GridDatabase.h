@@ -2,10 +2,13 @@
 #pragma once
 
 #include "cli/Grids.h"
+#include "cli/Song.h"
 
 #include "brindle/chords/CChordLite.h"
 #include "brindle/guitarchords/GChDatabase.h"
 
+#include <functional>
+#include <map>
 #include <memory>
 #include <string>
 #include <string_view>
@@ -17,11 +20,16 @@ namespace brindle::cli {
 /// Null when it is not there; then the error has been printed.
 [[nodiscard]] std::unique_ptr<GChDatabase> ReadGrids(const std::string& packagePath);
 
-/// The fingerings that sound a chord under a capodaster, in the order of the database; at most
-/// `most`. A bass behind a slash is only found where a library tells it.
+/// The fingerings that sound a chord under a capodaster, in the order of the database. A bass
+/// behind a slash is only found where a library tells it.
 [[nodiscard]] std::vector<TGrid> FindGrids(const GChDatabase& database, std::string_view symbol,
                                            const CChordLite& chord, const GChShortTuning& tuning,
-                                           int capo,
-                                           std::size_t most = static_cast<std::size_t>(-1));
+                                           int capo);
+
+/// The fingering of each chord symbol of a song that lies lowest on the neck of a standard guitar;
+/// chords that have none are left out.
+using TChordGrids = std::map<std::string, TGrid, std::less<>>;
+
+[[nodiscard]] TChordGrids GridsOfSong(const GChDatabase& database, const TSong& song);
 
 }  // namespace brindle::cli
