@@ -4,6 +4,7 @@
 #include "cli/Grids.h"
 #include "cli/Input.h"
 #include "cli/Names.h"
+#include "cli/TypedChords.h"
 
 #include <fmt/format.h>
 
@@ -32,6 +33,7 @@ struct TGridOptions {
     std::string mTuning = "EADGBE";
     int mCapo = 0;
     std::string mPackage;
+    CTypedChords mReading;
     CFormatOptions mFormat;
 };
 
@@ -60,12 +62,14 @@ public:
     TGrids GridsOf(const std::string& word) {
         if (mDatabase == nullptr) mDatabase = ReadGrids(mOptions.mPackage);
         if (mDatabase == nullptr) return TStatus::BadInput;
-        const CChordLite chord(FoldAccidentals(word), NamePrefs());
         const std::string symbol = Printable(word);
-        if (chord.IsUndef()) {
+        const bool beginsAsFrets = word.find_first_of("0123456789") == 0;
+        const auto chord = beginsAsFrets ? CChordLite() : mOptions.mReading.ReadSymbol(word);
+        if (!chord) return TStatus::BadInput;
+        if (chord->IsUndef()) {
             return Fail(TStatus::BadInput, symbol + " is neither a fingering nor a chord symbol");
         }
-        auto grids = FindGrids(*mDatabase, symbol, chord, mTuning, mOptions.mCapo);
+        auto grids = FindGrids(*mDatabase, symbol, *chord, mTuning, mOptions.mCapo);
         if (!grids.empty()) return grids;
         return Fail(TStatus::BadInput,
                     fmt::format("no fingering of {} for {}", symbol, TuningText(mTuning)));
@@ -124,6 +128,7 @@ void AddGrid(CLI::App& program, TStatus& status) {
         ->option_text("N");
     command.add_option("--package", options->mPackage, "Package to look chords up in")
         ->option_text("PATH");
+    options->mReading.AddTo(command);
     options->mFormat.AddTo(command, {"text", "json", "svg"});
     command.callback([options, &status] { status = Grid(*options); });
 }
