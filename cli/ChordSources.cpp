@@ -93,22 +93,15 @@ TChordSource FromChordStrings(const std::string& text) {
     return sequences.Finish();
 }
 
-/// What the reader of chord texts takes for a chord without being one, or empty.
-std::string FirstWordThatIsNoChord(const std::string& text, const TChordStringParse& parse) {
-    for (const std::string& word : WordsOf(text)) {
-        CHarmAnlsChords chords(word, parse);
-        const bool isUnknown = !chords.empty() && chords.front().IsUndef() &&
-                               !chords.front().IsNoChordYield() && !chords.front().IsNoChordForce();
-        // A repair of the reader joins these to the chord before them.
-        if (isUnknown && word.compare(0, 2, "ma") != 0) return word;
+TChordSource FromChordText(const std::string& text, const TChordStringParse& parse,
+                           const CTypedChords& reading) {
+    const TChordSong song = reading.ReadSong(text, parse);
+    if (!song.mFaults.empty() && !reading.IsLenient()) {
+        const CChordSheetFault& fault = song.mFaults.front();
+        return Failed(
+            fmt::format("line {}, column {}: {}", fault.mLine, fault.mColumn, fault.mText));
     }
-    return {};
-}
-
-TChordSource FromChordText(const std::string& text, const TChordStringParse& parse) {
-    const std::string word = FirstWordThatIsNoChord(text, parse);
-    if (!word.empty()) return Failed(fmt::format("{} is no chord", Printable(word)));
-    const CHarmAnlsChords chords(text, parse);
+    const CHarmAnlsChords& chords = song.mChords;
     CSequences sequences;
     for (std::size_t ix = 0; ix + 1 < chords.size(); ++ix) {
         if (chords[ix].IsUndef()) {
@@ -141,7 +134,8 @@ void AddFolder(const std::string& folder, std::vector<TFoundFile>& files) {
 
 }  // namespace
 
-TChordSource ReadChordSource(const std::string& path, const TChordStringParse& parse) {
+TChordSource ReadChordSource(const std::string& path, const TChordStringParse& parse,
+                             const CTypedChords& reading) {
     std::error_code error;
     if (!fs::exists(path, error)) return Failed("no such file");
     const auto bytes = ReadWholeFile(path, kMaxFileBytes);
@@ -150,7 +144,7 @@ TChordSource ReadChordSource(const std::string& path, const TChordStringParse& p
     const std::string text = FoldAccidentals(*bytes);
     const std::size_t begin = text.find_first_not_of(" \t\r\n");
     return begin != text.npos && text[begin] == '(' ? FromChordStrings(text)
-                                                    : FromChordText(text, parse);
+                                                    : FromChordText(*bytes, parse, reading);
 }
 
 std::vector<TFoundFile> FindChordSources(const std::vector<std::string>& paths) {

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "cli/TypedChords.h"
+
 #include "brindle/analysis/TChordStringParse.h"
 #include "brindle/markov/MarkovChords.h"
 
@@ -19,7 +21,8 @@ struct TChordSource {
 
 /// Reads a lead sheet in MusicXML, chord strings such as (4,C);(2,G7), one a line, or a chord text.
 /// The content tells which of them it is.
-[[nodiscard]] TChordSource ReadChordSource(const std::string& path, const TChordStringParse& parse);
+[[nodiscard]] TChordSource ReadChordSource(const std::string& path, const TChordStringParse& parse,
+                                           const CTypedChords& reading);
 
 /// A file that was named or that stands in a folder that was.
 struct TFoundFile {

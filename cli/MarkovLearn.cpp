@@ -30,6 +30,7 @@ struct TLearnOptions {
     std::uint64_t mOrder = 3;
     bool mSimplify = false;
     double mBeatsPerBar = 4.0;
+    CTypedChords mReading;
     CFormatOptions mFormat;
 };
 
@@ -62,7 +63,7 @@ TLearned LearnFiles(VariableLengthMarkovModel& model, const TLearnOptions& optio
     CProgress progress(files.size());
     for (const TFoundFile& file : files) {
         progress.Step(file.mPath);
-        const TChordSource source = ReadChordSource(file.mPath, parse);
+        const TChordSource source = ReadChordSource(file.mPath, parse, options.mReading);
         if (!source.mError.empty()) {
             learned.mUnread.emplace_back(file.mPath, source.mError);
             learned.mIsNamedFileUnread = learned.mIsNamedFileUnread || file.mIsNamed;
@@ -144,6 +145,7 @@ void AddMarkovLearn(CLI::App& markov, TStatus& status) {
                     "Length of a bar of chord texts in beats (default: 4)")
         ->check(CLI::Range(1.0, 64.0))
         ->option_text("BEATS");
+    options->mReading.AddTo(command, "In what form chord texts are written");
     options->mFormat.AddTo(command, {"text", "json"});
     command.callback([options, &status] { status = MarkovLearn(*options); });
 }
