@@ -70,8 +70,9 @@ TEST_CASE("All JSON of the program is strict") {
           "brindle chord --json --symbols native 'C\"\xff' undef X",
           "brindle scale --json 'Fb mm7'", "brindle key --json 'G# major'",
           "brindle name --json --all-roots C4 E4 --slash-text $'\\xff\"'",
-          "brindle copies --json $'C\\xff\" F C\\xff\" F'", "brindle vector --json $'\\xff\"' C",
-          "brindle keys --json 'C . X C/Q | nochord'", "brindle keys --json ''",
+          "brindle copies --json --symbols native $'C\\xff\" F C\\xff\" F'",
+          "brindle vector --json --symbols native $'\\xff\"' C",
+          "brindle keys --json --symbols native 'C . X C/Q | nochord'", "brindle keys --json ''",
           "brindle numerals --json 'I V7/ii | ii' --key $'C'", "brindle function --json X --key C",
           "brindle types --json", "brindle net weights --json"}) {
         INFO(command);
