@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "cli/SheetChordText.h"
 
+#include "cli/Song.h"
+
 #include "cli/LeadSheet.h"
 
 #include <algorithm>
@@ -26,7 +28,7 @@ bool IsWhole(double number) {
 class CWriter {
 public:
     explicit CWriter(const TMusicXMLDoc& sheet) : mSheet(sheet) {
-        mResult.mBeatsPerBar = UsualBar();
+        mResult.mBeatsPerBar = BeatsPerBarOf(mSheet);
         mUpbeat = Upbeat();
         mResult.mBeatsPerChord = Step();
     }
@@ -49,21 +51,6 @@ public:
     }
 
 private:
-    [[nodiscard]] double UsualBar() const {
-        if (mSheet.TimeSignatures.empty()) return LengthOfLongestBar();
-        const TMusicXMLTimeSignature& time = mSheet.TimeSignatures.front();
-        return 4.0 * time.mNumerator / time.mDenominator;
-    }
-
-    [[nodiscard]] double LengthOfLongestBar() const {
-        double longest = 0.0;
-        for (std::size_t i = 0; i + 1 < mSheet.HarmBarlines.size(); ++i) {
-            longest = std::max(
-                longest, mSheet.HarmBarlines[i + 1].mPosition - mSheet.HarmBarlines[i].mPosition);
-        }
-        return longest > 0.0 ? longest : 4.0;
-    }
-
     // How far the first bar line inside the song is from the beginning of a whole bar.
     [[nodiscard]] double Upbeat() const {
         if (mSheet.HarmBarlines.size() < 2) return 0.0;

@@ -10,6 +10,7 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <map>
 #include <utility>
 
 namespace brindle::cli {
@@ -125,13 +126,28 @@ TShownScore ScoreOf(const TMusicXMLDoc& sheet) {
     return score;
 }
 
+double BarLength(const TMusicXMLTimeSignature& time) {
+    if (time.mNumerator < 1 || time.mDenominator < 1) return 0.0;
+    return 4.0 * time.mNumerator / time.mDenominator;
+}
+
+// The length that most bars have, 0 without bars.
+double CommonBarLength(const std::vector<CHarmBarline>& barlines) {
+    std::map<double, std::size_t> counts;
+    for (std::size_t i = 0; i + 1 < barlines.size(); ++i) {
+        ++counts[barlines[i + 1].mPosition - barlines[i].mPosition];
+    }
+    const auto most = std::max_element(
+        counts.begin(), counts.end(),
+        [](const auto& one, const auto& other) { return one.second < other.second; });
+    return most == counts.end() ? 0.0 : most->first;
+}
+
 }  // namespace
 
 double BeatsPerBarOf(const TMusicXMLDoc& sheet) {
-    if (sheet.TimeSignatures.empty()) return kUsualBeatsPerBar;
-    const TMusicXMLTimeSignature& time = sheet.TimeSignatures.front();
-    if (time.mNumerator < 1 || time.mDenominator < 1) return kUsualBeatsPerBar;
-    const double length = 4.0 * time.mNumerator / time.mDenominator;
+    const double length = sheet.TimeSignatures.empty() ? CommonBarLength(sheet.HarmBarlines)
+                                                       : BarLength(sheet.TimeSignatures.front());
     return length >= 1.0 / 64 && length <= 1024.0 ? length : kUsualBeatsPerBar;
 }
 

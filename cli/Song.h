@@ -135,7 +135,7 @@ void ForEachChord(const TSong& song, const TFunction& function) {
 [[nodiscard]] TSong MakeSong(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings,
                              const CChordSymbols& symbols, double beatsPerBar);
 
-/// The length of the bars of a score by its first time signature.
+/// The length of the bars of a score by its first time signature; without one, that of most bars.
 [[nodiscard]] double BeatsPerBarOf(const TMusicXMLDoc& sheet);
 
 /// The same for the chords of a score.

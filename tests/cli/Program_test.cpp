@@ -75,7 +75,7 @@ TEST_CASE("All JSON of the program is strict") {
           "brindle keys --json --symbols native 'C . X C/Q | nochord'", "brindle keys --json ''",
           "brindle numerals --json 'I V7/ii | ii' --key $'C'", "brindle function --json X --key C",
           "brindle types --json", "brindle net weights --json"}) {
-        INFO(command);
+        INFO(std::string(command));
         const auto json = nlohmann::json::parse(RunCommand(command).mShown, nullptr, false);
         CHECK_FALSE(json.is_discarded());
     }
