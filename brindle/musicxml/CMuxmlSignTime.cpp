@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/musicxml/CMuxmlSignTime.h"
 
+#include "brindle/musicxml/MuxmlLimits.h"
 #include "brindle/musicxml/internal/ReadMuxml.h"
 
 namespace brindle {
@@ -22,7 +23,9 @@ void CMuxmlSignTime::_SetBeats(std::string_view text) {
     mNomAkaBeats = 0;
     while (true) {
         const std::int32_t summand = ReadInteger(text.substr(0, plus));
-        mCompoundNomsAkaBeats.push_back(summand);
+        if (mCompoundNomsAkaBeats.size() < kMuxmlMaxSummands) {
+            mCompoundNomsAkaBeats.push_back(summand);
+        }
         mNomAkaBeats = muxml::WrappedSum(mNomAkaBeats, summand);
         if (plus == text.npos) return;
         text.remove_prefix(plus + 1);

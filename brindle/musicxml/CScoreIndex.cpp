@@ -25,10 +25,19 @@ CMuxmlScoreInstrument InstrumentFrom(const XmlNode& element) {
     return instrument;
 }
 
-std::size_t CountBelow(const XmlNode& element) {
-    std::size_t count = 1;
-    for (XmlNode node = element.firstChild(); node; node = node.nextBelow(element)) ++count;
-    return count;
+constexpr std::size_t kBytesLikeAnElement = 64;
+
+std::size_t WeightOf(const XmlNode& element) {
+    std::size_t weight = 1 + element.stringValue().size() / kBytesLikeAnElement;
+    for (XmlNode node = element.firstChild(); node; node = node.nextBelow(element)) ++weight;
+    return weight;
+}
+
+std::size_t WeightOf(const CMuxmlScoreInstrument& instrument) {
+    const std::size_t bytes = instrument.mID.size() + instrument.mInstrumentName.size() +
+                              instrument.mInstrumentAbbreviation.size() +
+                              instrument.mInstrumentSound.size();
+    return 1 + bytes / kBytesLikeAnElement;
 }
 
 }  // namespace
@@ -36,6 +45,9 @@ std::size_t CountBelow(const XmlNode& element) {
 CScoreIndex::CScoreIndex(const XmlNode& root) {
     Visit(root);
     for (XmlNode node = root.firstChild(); node; node = node.nextBelow(root)) Visit(node);
+    for (XmlNode node = mFirstTime.firstChild(); node; node = node.nextSibling()) {
+        mFirstSignTime.SetElementFromString(node.name(), node.stringValue());
+    }
     ReadPartList(root);
 }
 
@@ -43,7 +55,7 @@ void CScoreIndex::Visit(const XmlNode& node) {
     const std::string_view name = node.name();
     if (name == "part") {
         const std::string id = node.attribute("id").value_or(std::string());
-        if (!id.empty()) mParts.try_emplace(id, TPart{node, 0, false});
+        if (!id.empty()) mParts.try_emplace(id, TPart{node});
     } else if (name == "part-list") {
         if (!mPartList) mPartList = node;
     } else if (name == "time") {
@@ -65,11 +77,11 @@ void CScoreIndex::ReadPartList(const XmlNode& root) {
             if (node.name() == "score-part") ++mScorePartCount;
         }
     }
-    mInstruments = mPartList.descendants("score-instrument");
     std::vector<std::string> ids;
-    ids.reserve(mInstruments.size());
-    for (const XmlNode& instrument : mInstruments) {
-        ids.push_back(instrument.attribute("id").value_or(std::string()));
+    for (const XmlNode& element : mPartList.descendants("score-instrument")) {
+        if (ids.size() == kMuxmlMaxInstruments) break;
+        mInstruments.push_back(InstrumentFrom(element));
+        ids.push_back(mInstruments.back().mID);
     }
     mInstrumentIndex = CInstrumentIndex(std::move(ids));
 }
@@ -80,14 +92,12 @@ XmlNode CScoreIndex::TakePart(std::string_view id) {
     TPart& part = it->second;
     if (!std::exchange(part.mIsTaken, true)) return part.mPart;
     mLyricRoom = 0;
-    if (part.mElementCount == 0) {
-        part.mElementCount = CountBelow(part.mPart) + CountBelow(ScorePart(id));
-    }
-    if (part.mElementCount > mRepeatRoom) {
+    if (part.mWeight == 0) part.mWeight = WeightOf(part.mPart) + WeightOf(ScorePart(id));
+    if (part.mWeight > mRepeatRoom) {
         mScoreParts.erase(it->first);
         return {};
     }
-    mRepeatRoom -= part.mElementCount;
+    mRepeatRoom -= part.mWeight;
     return part.mPart;
 }
 
@@ -99,9 +109,10 @@ XmlNode CScoreIndex::ScorePart(std::string_view id) const {
 CMuxmlScoreInstruments CScoreIndex::TakeInstruments(std::string_view partId) {
     CMuxmlScoreInstruments instruments;
     for (const std::size_t place : mInstrumentIndex.Holding(partId, mInstrumentRoom)) {
-        instruments.push_back(InstrumentFrom(mInstruments[place]));
+        mInstrumentRoom -= std::min(mInstrumentRoom, WeightOf(mInstruments[place]));
+        if (mInstrumentRoom == 0) break;
+        instruments.push_back(mInstruments[place]);
     }
-    mInstrumentRoom -= std::min(mInstrumentRoom, instruments.size());
     return instruments;
 }
 

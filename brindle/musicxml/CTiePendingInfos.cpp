@@ -1,15 +1,18 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/musicxml/CTiePendingInfos.h"
 
+#include "brindle/musicxml/MuxmlLimits.h"
 #include "brindle/musicxml/internal/ReadMuxml.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace brindle {
 
 namespace {
 
 void CopyLyrics(const XmlNode& from, CMuxmlNote& note, std::size_t& room) {
+    if (room == 0) return;
     for (const XmlNode& lyric : from.descendants("lyric")) {
         if (const XmlNode copy = note.mNoteXML.addCopyOf(lyric, room)) {
             note.mLyricXMLs.push_back(copy);
@@ -33,10 +36,15 @@ void BecomeFirstNote(CMuxmlNote& note, const CMuxmlNote& first) {
 }  // namespace
 
 void CTiePendingInfo::TransferRelevantObjectsToLastNote(CMuxmlNote& note, std::size_t& room) const {
-    // Kept: from the second round on, the element of the note is that of the first note.
+    bool isFirstNote = false;
     for (const XmlNode& element : mNoteXMLs) {
         CopyLyrics(element, note, room);
-        if (!mNotes.empty()) BecomeFirstNote(note, mNotes.front());
+        if (mNotes.empty()) continue;
+        // Kept: from the second round on, the element of the note is that of the first note, and
+        // the lyrics that a round has added to the list are dropped again.
+        const CMuxmlNote& first = mNotes.front();
+        if (!std::exchange(isFirstNote, true)) BecomeFirstNote(note, first);
+        note.mLyricXMLs.resize(first.mLyricXMLs.size());
     }
 }
 
@@ -46,8 +54,10 @@ CTiePendingInfos::TKey CTiePendingInfos::KeyOf(const CMuxmlNote& note) {
 }
 
 void CTiePendingInfos::StartEncounteredFor(const CMuxmlNote& note, std::int32_t ticks) {
+    if (mNoteCount >= kMuxmlMaxPendingNotes) return;
     CTiePendingInfo& info = mInfos[KeyOf(note)].emplace_back();
     ++mCount;
+    ++mNoteCount;
     info.mStaff = note.mStaff;
     info.mVoice = note.mVoice;
     info.mPitch = note.mPitch;
@@ -63,6 +73,8 @@ void CTiePendingInfos::ContinueEncounteredFor(const CMuxmlNote& note, std::int32
     info->mPendingLengthAsDuration =
         muxml::WrappedSum(info->mPendingLengthAsDuration, note.mLengthAsDuration);
     info->mPendingLengthAsMidiTicks = muxml::WrappedSum(info->mPendingLengthAsMidiTicks, ticks);
+    if (mNoteCount >= kMuxmlMaxPendingNotes) return;
+    ++mNoteCount;
     if (note.mNoteXML) info->mNoteXMLs.push_back(note.mNoteXML);
     info->mNotes.push_back(note);
 }
@@ -80,6 +92,7 @@ CTiePendingInfo* CTiePendingInfos::PendingDurationFor(const CMuxmlNote& note) {
 void CTiePendingInfos::StopEncounteredFor(const CMuxmlNote& note) {
     const auto it = mInfos.find(KeyOf(note));
     if (it == mInfos.end()) return;
+    mNoteCount -= std::min(mNoteCount, it->second.front().mNotes.size());
     it->second.pop_front();
     --mCount;
     if (it->second.empty()) mInfos.erase(it);

@@ -36,7 +36,7 @@ struct CTiePendingInfo {
 /// does not become slow.
 class CTiePendingInfos {
 public:
-    /// Opens a chain.
+    /// Opens a chain, unless kMuxmlMaxPendingNotes notes wait already.
     void StartEncounteredFor(const CMuxmlNote& note, std::int32_t ticks);
     /// Adds the note to its chain, if there is one.
     void ContinueEncounteredFor(const CMuxmlNote& note, std::int32_t ticks);
@@ -64,6 +64,7 @@ private:
 
     std::map<TKey, std::list<CTiePendingInfo>> mInfos;  ///< no list is empty
     std::size_t mCount = 0;
+    std::size_t mNoteCount = 0;  ///< of all chains together
 };
 
 }  // namespace brindle

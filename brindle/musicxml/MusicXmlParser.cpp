@@ -3,7 +3,6 @@
 
 #include "brindle/musicxml/MuxmlLimits.h"
 #include "brindle/musicxml/XMLParserDelegate_RecursiveMuxml.h"
-#include "brindle/musicxml/XPathHelpers.h"
 #include "brindle/platform/AtomicFile.h"
 #include "brindle/platform/Localization.h"
 #include "brindle/platform/XmlDocument.h"
@@ -12,6 +11,8 @@
 
 #include <fmt/format.h>
 
+#include <array>
+#include <string_view>
 #include <system_error>
 #include <utility>
 #include <variant>
@@ -72,15 +73,30 @@ struct TPacked {
     }
 };
 
+// Whether the element is, or stands inside, a rootfile of the rootfiles of a container. Asked of
+// each element in its turn, as the path "//container//rootfiles//rootfile" takes a library of paths
+// quadratic time.
+bool IsInRootFile(XmlNode node) {
+    constexpr std::array<std::string_view, 3> kNames{"rootfile", "rootfiles", "container"};
+    std::size_t found = 0;
+    for (; node && found < kNames.size(); node = node.parent()) {
+        if (node.name() == kNames[found]) ++found;
+    }
+    return found == kNames.size();
+}
+
 std::optional<std::string> FullPath(const FileNode& container) {
     const FileNode* const folder = container.Child("META-INF");
     const FileNode* const list = folder == nullptr ? nullptr : folder->Child("container.xml");
     if (list == nullptr) return std::nullopt;
     const auto document = XmlDocument::FromBytes(list->mContents);
     if (!std::holds_alternative<XmlDocument>(document)) return std::nullopt;
-    static const XmlPath kPath("//container//rootfiles//rootfile//@full-path");
-    return NSStringValueForXPath(std::get<XmlDocument>(document).rootElement(), kPath,
-                                 std::nullopt);
+    const XmlNode root = std::get<XmlDocument>(document).rootElement();
+    for (XmlNode node = root; node; node = node.nextBelow(root)) {
+        auto path = node.attribute("full-path");
+        if (path && IsInRootFile(node)) return path;
+    }
+    return std::nullopt;
 }
 
 std::optional<Error> Unpack(std::string_view bytes, TPacked& packed) {

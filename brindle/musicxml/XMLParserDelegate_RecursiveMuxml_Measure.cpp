@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/musicxml/XMLParserDelegate_RecursiveMuxml_Measure.h"
 
+#include "brindle/musicxml/MuxmlLimits.h"
 #include "brindle/musicxml/XMLParserDelegate_RecursiveMuxml_Note.h"
 #include "brindle/musicxml/XMLParserDelegate_RecursiveMuxml_Sound.h"
 #include "brindle/musicxml/internal/CScoreIndex.h"
@@ -9,6 +10,7 @@
 #include <algorithm>
 #include <array>
 #include <cmath>
+#include <utility>
 
 namespace brindle {
 
@@ -260,9 +262,7 @@ TMeasure::_encounteredMeasureStart_detectIncompleteFirstBar_barLengthOfFirstSign
     CMuxmlSignTime signTime;
     if (const XmlNode measure = context.CurrentPartMeasureXML()) {
         context.UpdateCurrentDivisionsPQNFromXmlElement(measure);
-        for (const XmlNode& child : Index().FirstTime().children()) {
-            signTime.SetElementFromString(child.name(), child.stringValue());
-        }
+        signTime = Index().FirstSignTime();
     }
     return muxml::WrappedInteger(static_cast<double>(context.CurrentDivisionsPQN) * 4.0 *
                                  signTime.mNomAkaBeats / signTime.mDenomAkaBeatTypeAsInt);
@@ -317,9 +317,8 @@ void TMeasure::encounteredSignTime() {
     TellHost<&brindle::MusicXmlParserDelegate::didEncounterSignTime>(EncounteredSignTime);
 }
 
-XmlNode TMeasure::FirstTransposeOfMeasure() {
-    if (mFirstTranspose) return *mFirstTranspose;
-    mFirstTranspose = XmlNode();
+const std::optional<CMuxmlTranspose>& TMeasure::FirstTransposeOfMeasure() {
+    if (std::exchange(mHasLookedForTranspose, true)) return mFirstTranspose;
     const XmlNode measure = Context().CurrentPartMeasureXML();
     const auto isInAttributes = [&measure](const XmlNode& node) {
         XmlNode around = node.parent();
@@ -330,11 +329,11 @@ XmlNode TMeasure::FirstTransposeOfMeasure() {
     };
     for (XmlNode node = measure.firstChild(); node; node = node.nextBelow(measure)) {
         if (node.name() == "transpose" && isInAttributes(node)) {
-            mFirstTranspose = node;
+            mFirstTranspose.emplace().ReadFromXMLElement(node);
             break;
         }
     }
-    return *mFirstTranspose;
+    return mFirstTranspose;
 }
 
 void TMeasure::encounteredSignKey() {
@@ -342,8 +341,8 @@ void TMeasure::encounteredSignKey() {
     // A key often stands before the transposition of the same attributes.
     if (Context().CurrentTranspose.mHasBeenReadFromXML) {
         EncounteredSignKey.mPartTransposeAtSignKey = Context().CurrentTranspose;
-    } else if (const XmlNode transpose = FirstTransposeOfMeasure()) {
-        EncounteredSignKey.mPartTransposeAtSignKey.ReadFromXMLElement(transpose);
+    } else if (const auto& transpose = FirstTransposeOfMeasure()) {
+        EncounteredSignKey.mPartTransposeAtSignKey = *transpose;
     }
     Context().CurrentSignKey = EncounteredSignKey;
     TellHost<&brindle::MusicXmlParserDelegate::didEncounterSignKey>(EncounteredSignKey);
@@ -353,7 +352,8 @@ void TMeasure::encounteredClef() {
     EncounteredClef.mPositionAsMidiTicks = Context().CurrentPosAsMidiTicks;
     EncounteredClef.mStaffDetailsXML = mFirstStaffDetails;
     Context().CurrentClef = EncounteredClef;
-    Context().CurrentPartGatheredInfo()->mClefs.push_back(EncounteredClef);
+    std::vector<CMuxmlClef>& clefs = Context().CurrentPartGatheredInfo()->mClefs;
+    if (clefs.size() < kMuxmlMaxClefs) clefs.push_back(EncounteredClef);
     // Kept: the host is asked for the method of keys.
     if (HostRespondsTo<&brindle::MusicXmlParserDelegate::didEncounterSignKey>()) {
         TellHost<&brindle::MusicXmlParserDelegate::didEncounterClef>(EncounteredClef);

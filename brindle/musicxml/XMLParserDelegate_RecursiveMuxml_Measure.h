@@ -52,10 +52,11 @@ private:
     void FindElementsOfMeasure();
     void FoundDivisions(XmlStreamParser& parser, std::string_view text);
     void FoundDuration(std::string_view text);
-    [[nodiscard]] XmlNode FirstTransposeOfMeasure();
+    [[nodiscard]] const std::optional<CMuxmlTranspose>& FirstTransposeOfMeasure();
 
     std::vector<XmlNode> mBarlines;
-    std::optional<XmlNode> mFirstTranspose;  // looked for once
+    bool mHasLookedForTranspose = false;
+    std::optional<CMuxmlTranspose> mFirstTranspose;
     XmlNode mFirstStaffDetails;
 };
 

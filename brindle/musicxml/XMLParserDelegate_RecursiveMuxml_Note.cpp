@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/musicxml/XMLParserDelegate_RecursiveMuxml_Note.h"
 
+#include "brindle/musicxml/MuxmlLimits.h"
 #include "brindle/musicxml/internal/ElementTable.h"
 #include "brindle/musicxml/internal/ReadMuxml.h"
 
@@ -133,6 +134,7 @@ CMuxmlTupletPortion* TNote::OpenTupletPortion() {
 }
 
 void TNote::FoundTie() {
+    if (EncounteredNote.mNoteTies.size() >= kMuxmlMaxTies) return;
     const auto word = currentAttributes.Find("type").value_or(std::string_view());
     EncounteredNote.mNoteTies.push_back(MuxmlValueOf(word, TMuxmlEnum_StartStop_Undef));
 }

@@ -156,6 +156,8 @@ bool XmlStreamParser::parse(std::string_view bytes) {
     handler.serror = Callbacks::FaultFound;
     context->_private = this;
     mContext = context.get();
+    const auto forgetContext = [](void** place) { *place = nullptr; };
+    const std::unique_ptr<void*, decltype(forgetContext)> atEnd(&mContext, forgetContext);
 
     if (mDelegate != nullptr) mDelegate->didStartDocument(*this);
     xmlParseDocument(context.get());
@@ -168,7 +170,6 @@ bool XmlStreamParser::parse(std::string_view bytes) {
             mDelegate->didEndDocument(*this);
         }
     }
-    mContext = nullptr;
     return !mError;
 }
 

@@ -4,6 +4,7 @@
 // Internal to musicxml/: what an import asks of the whole document, found in one walk over it.
 
 #include "brindle/musicxml/CMuxmlPart.h"
+#include "brindle/musicxml/CMuxmlSignTime.h"
 #include "brindle/musicxml/MuxmlLimits.h"
 #include "brindle/musicxml/internal/CInstrumentIndex.h"
 #include "brindle/platform/XmlDocument.h"
@@ -14,7 +15,6 @@
 #include <map>
 #include <string>
 #include <string_view>
-#include <vector>
 
 namespace brindle::muxml {
 
@@ -26,8 +26,9 @@ public:
     [[nodiscard]] XmlNode PartList() const { return mPartList; }
     /// The number of parts that the list of a partwise score names.
     [[nodiscard]] std::int32_t ScorePartCount() const { return mScorePartCount; }
-    /// The first `time` of the document, whatever part it belongs to.
-    [[nodiscard]] XmlNode FirstTime() const { return mFirstTime; }
+    /// Beats and beat type of the first `time` of the document, whatever part it belongs to; 4/4
+    /// when there is none.
+    [[nodiscard]] const CMuxmlSignTime& FirstSignTime() const { return mFirstSignTime; }
     [[nodiscard]] bool HasChord() const { return mHasChord; }
 
     /// The first `part` with the identifier. An empty handle for the empty identifier, when there
@@ -45,8 +46,8 @@ public:
 private:
     struct TPart {
         XmlNode mPart;
-        /// Of the part and of its entry in the list; counted when the identifier is repeated.
-        std::size_t mElementCount = 0;
+        /// Of the part and of its entry in the list; weighed when the identifier is repeated.
+        std::size_t mWeight = 0;
         bool mIsTaken = false;
     };
 
@@ -55,11 +56,12 @@ private:
 
     XmlNode mPartList;
     XmlNode mFirstTime;
+    CMuxmlSignTime mFirstSignTime;
     bool mHasChord = false;
     std::int32_t mScorePartCount = 0;
     std::map<std::string, TPart, std::less<>> mParts;
     std::map<std::string, XmlNode, std::less<>> mScoreParts;
-    std::vector<XmlNode> mInstruments;
+    CMuxmlScoreInstruments mInstruments;
     CInstrumentIndex mInstrumentIndex;
     std::size_t mRepeatRoom = kMuxmlMaxRepeatedElements;
     std::size_t mInstrumentRoom = kMuxmlMaxPartInstruments;

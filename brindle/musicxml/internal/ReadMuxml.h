@@ -5,9 +5,11 @@
 
 #include "brindle/musicxml/CMuxmlAttributes.h"
 #include "brindle/musicxml/CMuxmlBiMap.h"
+#include "brindle/musicxml/MuxmlLimits.h"
 #include "brindle/platform/ReadNumber.h"
 
 #include <cmath>
+#include <cstddef>
 #include <cstdint>
 #include <limits>
 #include <string>
@@ -57,6 +59,14 @@ namespace brindle::muxml {
     return static_cast<std::int32_t>(static_cast<std::uint32_t>(static_cast<std::int64_t>(part)));
 }
 
+/// The text, or as many whole characters as kMuxmlMaxWordLength bytes hold.
+[[nodiscard]] inline std::string_view Shortened(std::string_view text) {
+    if (text.size() <= kMuxmlMaxWordLength) return text;
+    std::size_t size = kMuxmlMaxWordLength;
+    while (size > 0 && (static_cast<unsigned char>(text[size]) & 0xC0U) == 0x80U) --size;
+    return text.substr(0, size);
+}
+
 // The attribute read into the field; a missing attribute and an unknown word leave it as it is.
 
 template <class Field>
@@ -72,7 +82,7 @@ void ReadAttribute(const CMuxmlAttributes& attributes, std::string_view name, Fi
     } else if constexpr (std::is_same_v<Field, std::int32_t>) {
         field = ReadInteger(*text);
     } else {
-        field = *text;
+        field = Shortened(*text);
     }
 }
 
