@@ -46,6 +46,7 @@ void CMarkovFileTransitions::Add(const json& entry) {
 CMarkovTransitionMap CMarkovFileTransitions::ToMap(const CIteratorIndexConverter& converter) const {
     CMarkovTransitionMap map;
     MarkovSequence history;
+    std::vector<CMarkovTransitionMap::TAddition> additions;
     auto number = mNumbers.begin();
     const auto nextSymbol = [&] {
         return converter.InsertIfUniqueAndReturnPointer(static_cast<int>(*number++));
@@ -62,9 +63,11 @@ CMarkovTransitionMap CMarkovFileTransitions::ToMap(const CIteratorIndexConverter
         for (std::uint32_t pair = 0; pair < pairs; ++pair) {
             const MarkovIterator symbol = nextSymbol();
             const std::uint32_t count = *number++;
-            if (isKnown && !converter.IsEnd(symbol)) map.AddToAllLengths(history, symbol, count);
+            if (!isKnown || converter.IsEnd(symbol)) continue;
+            map.EnterAllLengths(history, symbol, count, additions);
         }
     }
+    map.AddEntered(additions);
     return map;
 }
 

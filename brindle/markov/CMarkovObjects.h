@@ -39,7 +39,7 @@ using MarkovSequence = std::vector<MarkovIterator>;
 using MarkovSequenceView = std::span<const MarkovIterator>;
 /// How often each symbol followed. Most histories of a big model have one continuation, which needs
 /// no memory of its own; the others have at most as many as there are chords, so that inserting
-/// into the middle costs little.
+/// into the middle costs little. The reader of files, which may hold any number, inserts in order.
 using MarkovCounts =
     boost::container::small_flat_map<MarkovIterator, std::uint32_t, 1, TMarkovLess>;
 /// The probability, or another weight, of each symbol. Filled in order, then asked.

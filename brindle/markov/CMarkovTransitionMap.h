@@ -24,8 +24,20 @@ struct TMarkovTransitions {
 /// symbol. No order is kept up meanwhile; InOrder makes it when it is wanted.
 class CMarkovTransitionMap {
 public:
+    /// A count that is to be added to an entry.
+    struct TAddition {
+        std::uint32_t mEntry = 0;
+        std::uint32_t mCount = 0;
+        MarkovIterator mSymbol;
+    };
+
     /// Adds `count` to the symbol behind the history and behind each of its ends, down to length 1.
     void AddToAllLengths(MarkovSequenceView history, MarkovIterator symbol, std::uint32_t count);
+    /// The same in two steps, for many counts whose symbols may come in any order: all histories
+    /// are entered first, and then the counts are added in the order of symbols.
+    void EnterAllLengths(MarkovSequenceView history, MarkovIterator symbol, std::uint32_t count,
+                         std::vector<TAddition>& additions);
+    void AddEntered(std::vector<TAddition>& additions);
 
     /// The counts behind exactly this history; null if it was never seen.
     [[nodiscard]] const MarkovCounts* Find(MarkovSequenceView history) const;
@@ -60,6 +72,8 @@ private:
     [[nodiscard]] TEntry& At(std::uint32_t number);
     template <class IsWanted>
     [[nodiscard]] const TSlot& SlotOf(std::uint32_t hash, IsWanted isWanted) const;
+    template <class Function>
+    void ForAllLengths(MarkovSequenceView history, Function function);
     std::uint32_t AddEntry(std::uint32_t shorter, MarkovSequenceView history);
     void Fetch(MarkovSequenceView history) const;
     void GrowSlots();

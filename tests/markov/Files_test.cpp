@@ -147,3 +147,23 @@ TEST_CASE("A model that cannot be read or written changes nothing") {
     CHECK(JSONStringOf(model) == before);
     CHECK_FALSE(model.SaveToFile("/no/such/folder/model.json"));
 }
+
+TEST_CASE(
+    "A file of a hundred thousand symbols behind one another in falling order is read at once") {
+    constexpr int count = 100000;
+    std::string objects = R"({"Type":4})";
+    std::string entries;
+    for (int ix = 1; ix <= count; ++ix) {
+        objects += R"(,{"Type":7,"Index":)" + std::to_string(-ix) + "}";
+        entries += (ix == 1 ? "[[0],[[" : ",[") + std::to_string(ix) + ",1]";
+    }
+    VariableLengthMarkovModel model;
+    Helper::VariableLengthMarkovModelFromJSONString(
+        R"({"VariableLengthMarkovModel":{"MaxHistoryLength":1,"CMarkovObjects":[)" + objects +
+            R"(],"TransitionMap":[)" + entries + "]]],\"History\":[0]}}",
+        model);
+    MarkovProbabilities table;
+    model.ProbabilitiesForNextSymbol(table);
+    CHECK(table.size() == count);
+    CHECK(table.begin()->first->mIndex == -count);
+}
