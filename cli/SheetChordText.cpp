@@ -1,9 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "cli/SheetChordText.h"
 
-#include "cli/Song.h"
-
 #include "cli/LeadSheet.h"
+#include "cli/Song.h"
 
 #include <algorithm>
 #include <array>
