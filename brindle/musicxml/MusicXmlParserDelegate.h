@@ -20,12 +20,22 @@ namespace brindle {
 /// How much there is to import.
 struct TMuxmlProgressBarInfo {
     std::int32_t mPartCount = 0;
+
+    static constexpr auto Fields() {
+        return std::tuple(MuxmlField("mPartCount", &TMuxmlProgressBarInfo::mPartCount));
+    }
 };
 
 /// A tempo that holds from a position on.
 struct CMuxmlTempoChange {
     std::int32_t mPositionAsMidiTicks = 0;
     float mTempo = 0;  ///< quarters a minute
+
+    static constexpr auto Fields() {
+        return std::tuple(
+            MuxmlField("mPositionAsMidiTicks", &CMuxmlTempoChange::mPositionAsMidiTicks),
+            MuxmlField("mTempo", &CMuxmlTempoChange::mTempo));
+    }
 };
 
 /// What a host is told while a score is read. An empty member is a method that the host does not
