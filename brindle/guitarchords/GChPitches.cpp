@@ -52,11 +52,17 @@ std::optional<int> ReadOctave(std::string_view text) {
     return std::nullopt;
 }
 
-void ReplaceAll(std::string& text, char letter, std::string_view sign) {
-    for (std::size_t at = text.find(letter); at != text.npos;
-         at = text.find(letter, at + sign.size())) {
-        text.replace(at, 1, sign);
+std::string ReplaceAll(std::string_view text, char letter, std::string_view sign) {
+    std::string replaced;
+    replaced.reserve(text.size());
+    for (const char c : text) {
+        if (c == letter) {
+            replaced += sign;
+        } else {
+            replaced += c;
+        }
     }
+    return replaced;
 }
 
 }  // namespace
@@ -88,10 +94,7 @@ int GChMidiPitchForPitchString(std::string_view text) {
 }
 
 std::string stringByConvertingMusicalSymbols(std::string_view text) {
-    std::string converted(text);
-    ReplaceAll(converted, 'b', kUtf8Flat);
-    ReplaceAll(converted, '#', kUtf8Sharp);
-    return converted;
+    return ReplaceAll(ReplaceAll(text, 'b', kUtf8Flat), '#', kUtf8Sharp);
 }
 
 }  // namespace brindle

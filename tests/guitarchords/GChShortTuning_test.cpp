@@ -59,3 +59,8 @@ TEST_CASE("An octave is one digit, and what stands behind it is not read") {
 TEST_CASE("A string as far above 0 as two tunings lie apart counts as the end of one") {
     CHECK(GChIsEqualShortTuning({64, 12}, {52}));
 }
+
+TEST_CASE("A long text of flats is converted in a time that grows with its length") {
+    const std::string flats(std::size_t{1} << 20, 'b');
+    CHECK(stringByConvertingMusicalSymbols(flats).size() == 3 * flats.size());
+}
