@@ -244,7 +244,8 @@ bool GChLibrary::readChordChunksFromBuffer(const std::uint8_t* buffer, std::size
         const auto userName = TakeStringField(name);
         if (!userName) return false;
         if (chord->chordElems().empty()) continue;
-        chord->setDbChordID(dbChordCount++);
+        chord->setDbChordID(dbChordCount);
+        dbChordCount = static_cast<std::int32_t>(static_cast<std::uint32_t>(dbChordCount) + 1);
         chord->setUserName(*userName);
         addChordRangePriv(chord);
     }
