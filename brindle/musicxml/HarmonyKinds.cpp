@@ -84,8 +84,9 @@ CSemitones XMLHarmonyKindToSemitones(std::string_view kind) {
 }
 
 std::string_view SemitonesToXMLHarmonyKind(CSemitones semitones) {
+    const std::uint64_t octave = semitones.Mask() & 0xFFF;
     for (const TKindRow& row : kKindRows) {
-        if (row.mIsTested && row.Mask() == semitones.Mask()) return row.mWord;
+        if (row.mIsTested && row.Mask() == octave) return row.mWord;
     }
     return kNoKind;
 }

@@ -28,7 +28,7 @@ public:
             PlayMeasure();
             ++mIx;
         }
-        return true;
+        return mBytes <= kMaxPlayedBytes;
     }
 
 private:

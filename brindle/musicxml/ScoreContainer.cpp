@@ -45,8 +45,7 @@ const FileNode* NamedFile(const FileNode& root) {
     XmlStreamParser parser;
     CRootFileFinder finder;
     parser.setDelegate(&finder);
-    // What a container.xml names counts even where it is not well-formed behind that.
-    (void)parser.parse(container->mContents);
+    if (!parser.parse(container->mContents)) return nullptr;
     return finder.mPath.empty() ? nullptr : FileAt(root, finder.mPath);
 }
 

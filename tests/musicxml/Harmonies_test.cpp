@@ -71,6 +71,8 @@ TEST_CASE("Kinds of lead-sheet chords stand for their tones, and tones for kinds
                  return std::string(SemitonesToXMLHarmonyKind(test::SemitonesOf(in.at(0))));
              }},
         });
+    // Semitones above the octave do not count.
+    CHECK(SemitonesToXMLHarmonyKind(CSemitones(std::uint64_t{145 | 1 << 14})) == "major");
 }
 
 TEST_CASE("Roots and basses of lead sheets are spelled by letter and alteration") {

@@ -232,6 +232,8 @@ TEST_CASE("Kinds in other words are put into the words of the library") {
         {"<kind text='mMaj7'>minor-major</kind>", "major-minor"},
         {"<kind text='M7'/>", "major-seventh"},
         {"<kind text='o7'>other</kind>", "diminished-seventh"},
+        {"<kind text=' 7'>other</kind>", "dominant"},
+        {"<kind text=' '/>", "major"},
         {"<kind text='\u00F8'>other</kind>", "half-diminished"},
         {"<kind>German</kind>", "dominant"},
         {"<kind>Neapolitan</kind>", "Neapolitan"},
@@ -341,6 +343,7 @@ TEST_CASE("Scores in any encoding are read, and what is no score is told") {
     const TRow rows[] = {
         {"", "1:1: Document is empty"},
         {"<html/>", "1:1: no MusicXML score"},
+        {"<part><measure><note/></measure></part>", "1:1: no MusicXML score"},
         {"<score-partwise>\n<part></measure>",
          "2:17: Opening and ending tag mismatch: part line 2 "
          "and measure"},

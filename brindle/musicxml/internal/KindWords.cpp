@@ -123,6 +123,11 @@ std::string Folded(std::string_view word) {
     return folded;
 }
 
+std::string_view WithoutBlanks(std::string_view text) {
+    const std::size_t begin = std::min(text.find_first_not_of(' '), text.size());
+    return text.substr(begin, text.find_last_not_of(' ') + 1 - begin);
+}
+
 // The kind that another word for it means, empty for a word without meaning.
 std::string KindOfAlias(std::string_view word) {
     std::string folded = Folded(word);
@@ -156,6 +161,7 @@ void SetTones(TMusicXMLHarmony& harmony, CSemitones tones) {
 
 void SetKind(TMusicXMLHarmony& harmony, std::string_view printed) {
     if (IsKind(harmony.mKind)) return;
+    printed = WithoutBlanks(printed);
     if (printed.size() > kLongestPrinted) printed = {};
     std::string kind = KindOfAlias(harmony.mKind);
     if (kind.empty() && !printed.empty()) kind = KindOfAlias(printed);

@@ -33,18 +33,14 @@ public:
     bool Run() {
         FindWhatHolds();
         const TPlayingOrder order = PlayScore(mScore.mMeasures);
-        bool isWhole = !order.mWasCut;
         MakeRoom(order);
         for (const std::uint32_t ix : order.mMeasures) {
-            if (mBytes > kMaxPlayedBytes) {
-                isWhole = false;
-                break;
-            }
+            if (mBytes > kMaxPlayedBytes) break;
             Play(ix);
         }
         SetDurations();
         AppendCopies(order);
-        return isWhole;
+        return !order.mWasCut && mBytes <= kMaxPlayedBytes;
     }
 
 private:

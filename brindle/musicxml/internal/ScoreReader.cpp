@@ -37,6 +37,8 @@ public:
         mText.clear();
         if (mOpen.size() == 1) {
             mIsScore = element == ScorePartwise || element == ScoreTimewise;
+        } else if (!mIsScore) {
+            return;
         } else if (element == Part && parent != Measure) {
             OpenPart(attributes.Value("id"));
         } else if (element == Measure && parent != Part) {
