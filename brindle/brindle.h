@@ -63,6 +63,7 @@
 #include "brindle/guitarchords/GChTuning.h"
 #include "brindle/guitarchords/GChTuningDescr.h"
 #include "brindle/markov/CIteratorIndexConverter.h"
+#include "brindle/markov/CMarkovCounts.h"
 #include "brindle/markov/CMarkovObject.h"
 #include "brindle/markov/CMarkovObjects.h"
 #include "brindle/markov/CMarkovTransitionMap.h"

@@ -34,7 +34,8 @@ public:
     void Add(const CChordLite& chord, double length) {
         // Model files hold two digits.
         const double rounded = std::round(length * 100.0) / 100.0;
-        if (!(rounded > 0.0)) return;
+        if (!std::isfinite(rounded)) mSource.mError = "a length is no number, or too large";
+        if (!(rounded > 0.0) || !std::isfinite(rounded)) return;
         const int bass = chord.HasBassNote() ? chord.mBassKeyEnh.mKeyNr : -1;
         mSource.mSequences.back().emplace_back(
             CHarmAnlsChord(chord, chord.mRootKeyEnh.mKeyNr, bass), rounded);
@@ -44,7 +45,7 @@ public:
     }
     [[nodiscard]] TChordSource Finish() {
         if (mSource.mSequences.back().empty()) mSource.mSequences.pop_back();
-        if (mSource.mSequences.empty()) mSource.mError = "no chords";
+        if (mSource.mSequences.empty() && mSource.mError.empty()) mSource.mError = "no chords";
         return std::move(mSource);
     }
 

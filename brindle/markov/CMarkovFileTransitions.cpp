@@ -46,7 +46,6 @@ void CMarkovFileTransitions::Add(const json& entry) {
 CMarkovTransitionMap CMarkovFileTransitions::ToMap(const CIteratorIndexConverter& converter) const {
     CMarkovTransitionMap map;
     MarkovSequence history;
-    std::vector<CMarkovTransitionMap::TAddition> additions;
     auto number = mNumbers.begin();
     const auto nextSymbol = [&] {
         return converter.InsertIfUniqueAndReturnPointer(static_cast<int>(*number++));
@@ -63,11 +62,9 @@ CMarkovTransitionMap CMarkovFileTransitions::ToMap(const CIteratorIndexConverter
         for (std::uint32_t pair = 0; pair < pairs; ++pair) {
             const MarkovIterator symbol = nextSymbol();
             const std::uint32_t count = *number++;
-            if (!isKnown || converter.IsEnd(symbol)) continue;
-            map.EnterAllLengths(history, symbol, count, additions);
+            if (isKnown && !converter.IsEnd(symbol)) map.AddToAllLengths(history, symbol, count);
         }
     }
-    map.AddEntered(additions);
     return map;
 }
 

@@ -5,7 +5,6 @@
 
 #include <boost/container/flat_map.hpp>
 #include <boost/container/flat_set.hpp>
-#include <boost/container/small_vector.hpp>
 
 #include <cstdint>
 #include <iosfwd>
@@ -37,11 +36,6 @@ struct TMarkovLess {
 /// Symbols in the order of time.
 using MarkovSequence = std::vector<MarkovIterator>;
 using MarkovSequenceView = std::span<const MarkovIterator>;
-/// How often each symbol followed. Most histories of a big model have one continuation, which needs
-/// no memory of its own; the others have at most as many as there are chords, so that inserting
-/// into the middle costs little. The reader of files, which may hold any number, inserts in order.
-using MarkovCounts =
-    boost::container::small_flat_map<MarkovIterator, std::uint32_t, 1, TMarkovLess>;
 /// The probability, or another weight, of each symbol. Filled in order, then asked.
 using MarkovProbabilities = boost::container::flat_map<MarkovIterator, double, TMarkovLess>;
 using MarkovSymbolSet = boost::container::flat_set<MarkovIterator, TMarkovLess>;

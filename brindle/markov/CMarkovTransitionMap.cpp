@@ -108,9 +108,8 @@ const CMarkovTransitionMap::TSlot& CMarkovTransitionMap::SlotOf(std::uint32_t ha
     }
 }
 
-/// Calls `function` with the number of the entry of the history and of each of its ends.
-template <class Function>
-void CMarkovTransitionMap::ForAllLengths(MarkovSequenceView history, Function function) {
+void CMarkovTransitionMap::AddToAllLengths(MarkovSequenceView history, MarkovIterator symbol,
+                                           std::uint32_t count) {
     Fetch(history);
     MarkovSequenceView kept;
     std::uint32_t entry = kEmptyHistory;
@@ -130,34 +129,8 @@ void CMarkovTransitionMap::ForAllLengths(MarkovSequenceView history, Function fu
             entry = AddEntry(shorter, kept.last(length));
             mSlots[static_cast<std::size_t>(&slot - mSlots.data())] = {hash, entry};
         }
-        function(entry);
+        At(entry).mCounts[symbol] += count;
     }
-}
-
-void CMarkovTransitionMap::AddToAllLengths(MarkovSequenceView history, MarkovIterator symbol,
-                                           std::uint32_t count) {
-    ForAllLengths(history, [&](std::uint32_t entry) { At(entry).mCounts[symbol] += count; });
-}
-
-void CMarkovTransitionMap::EnterAllLengths(MarkovSequenceView history, MarkovIterator symbol,
-                                           std::uint32_t count, std::vector<TAddition>& additions) {
-    ForAllLengths(history, [&](std::uint32_t entry) {
-        additions.push_back({entry, count, symbol});
-    });
-}
-
-// In order each symbol goes behind the others of its table, so that none has to be moved. Of
-// symbols that order alike the first one stays the one that is shown, since the order is stable.
-void CMarkovTransitionMap::AddEntered(std::vector<TAddition>& additions) {
-    std::stable_sort(additions.begin(), additions.end(),
-                     [](const TAddition& a, const TAddition& b) {
-                         if (a.mEntry != b.mEntry) return a.mEntry < b.mEntry;
-                         return TMarkovLess()(a.mSymbol, b.mSymbol);
-                     });
-    for (const TAddition& addition : additions) {
-        At(addition.mEntry).mCounts[addition.mSymbol] += addition.mCount;
-    }
-    additions.clear();
 }
 
 // By the history itself and not through those of its ends, which are far apart in memory.
@@ -193,6 +166,19 @@ std::vector<const TMarkovTransitions*> CMarkovTransitionMap::OfLength(std::size_
         }
     }
     return entries;
+}
+
+CMarkovTransitionMap& CMarkovTransitionMap::operator=(CMarkovTransitionMap&& other) noexcept {
+    CMarkovTransitionMap moved(std::move(other));
+    Swap(moved);
+    return *this;
+}
+
+void CMarkovTransitionMap::Swap(CMarkovTransitionMap& other) noexcept {
+    mEntries.swap(other.mEntries);
+    std::swap(mSize, other.mSize);
+    mSlots.swap(other.mSlots);
+    mKeptSymbols.swap(other.mKeptSymbols);
 }
 
 void CMarkovTransitionMap::Clear() {

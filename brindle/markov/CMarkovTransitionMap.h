@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "brindle/markov/CMarkovObjects.h"
+#include "brindle/markov/CMarkovCounts.h"
 
 #include <array>
 #include <cstdint>
@@ -24,20 +24,17 @@ struct TMarkovTransitions {
 /// symbol. No order is kept up meanwhile; InOrder makes it when it is wanted.
 class CMarkovTransitionMap {
 public:
-    /// A count that is to be added to an entry.
-    struct TAddition {
-        std::uint32_t mEntry = 0;
-        std::uint32_t mCount = 0;
-        MarkovIterator mSymbol;
-    };
+    CMarkovTransitionMap() = default;
+    // Entries look into the symbols that are kept here, so a copy would look into another map.
+    CMarkovTransitionMap(const CMarkovTransitionMap&) = delete;
+    CMarkovTransitionMap& operator=(const CMarkovTransitionMap&) = delete;
+    /// Leaves the other map empty.
+    CMarkovTransitionMap(CMarkovTransitionMap&& other) noexcept { Swap(other); }
+    CMarkovTransitionMap& operator=(CMarkovTransitionMap&& other) noexcept;
+    ~CMarkovTransitionMap() = default;
 
     /// Adds `count` to the symbol behind the history and behind each of its ends, down to length 1.
     void AddToAllLengths(MarkovSequenceView history, MarkovIterator symbol, std::uint32_t count);
-    /// The same in two steps, for many counts whose symbols may come in any order: all histories
-    /// are entered first, and then the counts are added in the order of symbols.
-    void EnterAllLengths(MarkovSequenceView history, MarkovIterator symbol, std::uint32_t count,
-                         std::vector<TAddition>& additions);
-    void AddEntered(std::vector<TAddition>& additions);
 
     /// The counts behind exactly this history; null if it was never seen.
     [[nodiscard]] const MarkovCounts* Find(MarkovSequenceView history) const;
@@ -68,12 +65,11 @@ private:
         std::uint32_t mEntry = 0;
     };
 
+    void Swap(CMarkovTransitionMap& other) noexcept;
     [[nodiscard]] const TEntry& At(std::uint32_t number) const;
     [[nodiscard]] TEntry& At(std::uint32_t number);
     template <class IsWanted>
     [[nodiscard]] const TSlot& SlotOf(std::uint32_t hash, IsWanted isWanted) const;
-    template <class Function>
-    void ForAllLengths(MarkovSequenceView history, Function function);
     std::uint32_t AddEntry(std::uint32_t shorter, MarkovSequenceView history);
     void Fetch(MarkovSequenceView history) const;
     void GrowSlots();

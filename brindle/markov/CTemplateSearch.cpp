@@ -18,6 +18,7 @@ CTemplateSearch::CTemplateSearch(VariableLengthMarkovModel& model, TMarkovSample
       mFirstBeats(TMarkovSequenceLengthInBeats(sequence.mSymbols)) {}
 
 bool CTemplateSearch::Run() {
+    mInfo.mHasGivenUp = false;
     const std::size_t sizeBefore = mSequence.mSymbols.size();
     TOutcome outcome = Begin();
     while (outcome != TOutcome::Found) {

@@ -57,7 +57,8 @@ void VariableLengthMarkovModel::NormalizeLogProbabilities(
 
 void VariableLengthMarkovModel::RemoveItemsFromProbabilities(MarkovProbabilities& map,
                                                              const MarkovSymbolSet& symbols) {
-    for (const MarkovIterator symbol : symbols) map.erase(symbol);
+    const auto isListed = [&symbols](const auto& entry) { return symbols.contains(entry.first); };
+    map.erase(std::remove_if(map.begin(), map.end(), isListed), map.end());
 }
 
 void VariableLengthMarkovModel::RemoveNonFittingSymbolsFromProbabilities(MarkovProbabilities& map,

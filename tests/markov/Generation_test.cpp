@@ -135,3 +135,16 @@ TEST_CASE("Given random numbers make the expected sequences") {
                       {"TMarkovGenerateOptions::Validate", Validated},
                   });
 }
+
+TEST_CASE("A search that fails at once has not given up, whatever the one before it did") {
+    VariableLengthMarkovModel model(1);
+    Learn(model, "(3,C);(3,F)");
+    TMarkovGenerateOptions options;
+    options.mTemplate = model.IteratorSequenceForObjects(SymbolsOf("(2,U)"));
+    REQUIRE(options.Validate(model));
+    TMarkovSampledSequence sequence;
+    TMarkovSamplingInformation info;
+    info.mHasGivenUp = true;
+    CHECK_FALSE(model.RecursiveGenerateSequence(sequence, options, info));
+    CHECK_FALSE(info.mHasGivenUp);
+}

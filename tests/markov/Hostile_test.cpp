@@ -6,6 +6,8 @@
 #include <doctest/doctest.h>
 
 #include <limits>
+#include <map>
+#include <utility>
 
 using namespace brindle;
 using namespace brindle::test;
@@ -65,4 +67,58 @@ TEST_CASE("Symbols whose length is no number have a place of their own") {
     }
     CHECK(TableForm(table) == nlohmann::json::parse("[[1,1.0],[0,1.0],[2,1.0]]"));
     CHECK(VariableLengthMarkovModel::GetMaxLengthFromProbabilities(table) == 4);
+}
+
+TEST_CASE("Symbols that follow in descending order are counted in order, without n squared steps") {
+    constexpr int count = 100'000;
+    CMarkovObjects symbols;
+    CMarkovObject chord = SymbolsOf("(1,C)").at(0);
+    MarkovSequence sequence;
+    for (int length = 1; length <= count; ++length) {
+        chord.mChord.mLength = length;
+        sequence.push_back(symbols.insertObjectIfUnique(chord));
+    }
+    MarkovCounts counts;
+    for (int ix = count; ix-- > 0;) counts[sequence[static_cast<std::size_t>(ix)]] += 2;
+    CHECK(counts.begin()->first == sequence.front());
+    for (int ix = count - 3; ix >= 0; ix -= 3) ++counts[sequence[static_cast<std::size_t>(ix)]];
+
+    REQUIRE(counts.size() == count);
+    std::size_t place = 0;
+    for (const auto& [symbol, times] : counts) {
+        if (symbol != sequence[place] || times != (place % 3 == (count - 3) % 3 ? 3 : 2)) break;
+        ++place;
+    }
+    CHECK(place == count);
+}
+
+TEST_CASE("Symbols in any order, some of them alike, are counted as in a map") {
+    CMarkovObjects symbols;
+    CMarkovObject chord = SymbolsOf("(1,C)").at(0);
+    MarkovCounts counts;
+    std::map<MarkovIterator, std::uint32_t, TMarkovLess> wanted;
+    std::uint32_t number = 1;
+    for (int step = 0; step < 5000; ++step) {
+        number = number * 1664525 + 1013904223;
+        chord.mChord.mLength = number >> 21;
+        const MarkovIterator symbol = symbols.insertObjectIfUnique(chord);
+        counts[symbol] += number & 3;
+        wanted[symbol] += number & 3;
+        const bool isRead = step % 97 == 0 || step % 64 == 1;
+        if (isRead) REQUIRE(TableForm(counts) == TableForm(wanted));
+    }
+    CHECK(TableForm(counts) == TableForm(wanted));
+}
+
+TEST_CASE("A model that was moved from is empty and can learn again") {
+    VariableLengthMarkovModel model(2);
+    Learn(model, "(1,C);(1,F)");
+    const MarkovSequence history{model.mObjects.At(1)};
+    const VariableLengthMarkovModel moved = std::move(model);
+    CHECK(moved.mTransitionMap.Find(history) != nullptr);
+    CHECK(model.mTransitionMap.empty());
+    CHECK(model.mTransitionMap.Find(history) == nullptr);
+    model = VariableLengthMarkovModel(2);
+    Learn(model, "(1,C);(1,F)");
+    CHECK(model == moved);
 }
