@@ -165,6 +165,8 @@ TEST_CASE("Packed charts are read") {
     CHECK(reading.mKey == "Eb");
     const CChordLite sameWithBass = ReadChordSheet("C^7W/G", chart).mChords[1];
     CHECK(sameWithBass == CChordLite(CKeyEnh_C, CKeyEnh_G, CSemitones{0, 4, 7, 11}));
+    const CChordSheetPrefs german{.mForm = TChordSheet_IReal, .mChordTextPrefs{.mBIsBFlat = true}};
+    CHECK(ReadChordSheet("C^7W/B", german).mChords[1].mBassKeyEnh == CKeyEnh(10, TEnh_b));
     CHECK(Shown("C^7 |?", chart) == R"(1:6: "?" is not understood)");
 }
 

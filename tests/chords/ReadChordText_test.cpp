@@ -235,6 +235,7 @@ TEST_CASE("What is not understood is told with its place") {
         {"C/J", 3, R"("J" at 3 is no bass note)"},
         {"Am7/Gq", 5, R"("Gq" at 5 is no bass note)"},
         {"C/E/G", 3, R"("E" at 3: a chord has one bass note, behind the last slash)"},
+        {"C/b/G", 3, R"("b" at 3: a chord has one bass note, behind the last slash)"},
         {"CM7 Dm7", 5, R"("Dm" at 5 begins a second chord)"},
         {"C7(Db7)", 4, R"("Db" at 4 begins a second chord)"},
         {"C E G", 3, R"("E" at 3 begins a second chord)"},

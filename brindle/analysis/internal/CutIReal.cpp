@@ -188,7 +188,8 @@ private:
     void AddChordBeforeWithBass(std::string_view text, std::string_view bass) {
         if (!mChordBefore) return mList.AddFault(text, "there is no chord before this one");
         CChordLite chord = *mChordBefore;
-        const CKeyEnh key = ReadChordText(bass).mChord.mRootKeyEnh;
+        const CChordTextReading reading = ReadChordText(bass, mList.Prefs().mChordTextPrefs);
+        const CKeyEnh key = reading.mChord.mRootKeyEnh;
         const bool isRoot = key.mKeyNr == chord.mRootKeyEnh.mKeyNr;
         chord.mBassKeyEnh = isRoot ? CKeyEnh_Undef : key;
         mList.Add(TTokenKind::Chord, text).mChord = chord;

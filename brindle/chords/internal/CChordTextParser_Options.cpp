@@ -244,6 +244,8 @@ bool CChordTextParser::ReadOtherOption() {
         return true;
     }
     if (IsDigit(mScan.Peek())) return Fail(TFault::NoDegree);
+    // `C/b/G` has two basses.
+    if (mScan.LastNonBlank() == '/' && mScan.Peek() == 'b') return FailBehindSlash();
     if (TakeSign(mScan) != 0) {
         return Fail(TFault::SignWithoutNumber, pos, mScan.mPos - pos);
     }
