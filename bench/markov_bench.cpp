@@ -100,7 +100,7 @@ void BenchQuery(benchmark::State& state) {
         for (std::size_t end = kOrder; end <= sequence.size(); ++end) {
             model.ProbabilitiesForNextSymbol(
                 MarkovSequenceView(sequence).subspan(end - kOrder, kOrder), table);
-            known += table.empty() ? 0 : 1;
+            known += table.empty() ? 0U : 1U;
         }
     }
     if (known == 0) state.SkipWithError("no window is known");

@@ -13,16 +13,18 @@ namespace {
 
 constexpr const char* kExamples =
     "  brindle analyse \"Dm7 G7 | C\"\n"
-    "  brindle analyse --file song.txt --format svg >song.svg\n"
     "  brindle analyse song.musicxml\n"
+    "  brindle analyse --file song.txt --format svg >song.svg\n"
+    "  brindle keys --file song.txt\n"
+    "  brindle import song.musicxml --midi song.mid\n"
     "  brindle chord F#m7/C# Bb13\n"
+    "  brindle function Dm7 G7 --key C\n"
+    "  brindle numerals \"ii7 V7 I^7\" --key \"Eb major\"\n"
+    "  brindle name E2 G3 C4\n"
     "  brindle scale \"D dorian\"\n"
     "  brindle key \"F# minor\" --json\n"
     "  brindle grid x32010\n"
-    "  brindle keys --file song.txt\n"
-    "  brindle numerals \"ii7 V7 I^7\" --key \"Eb major\"\n"
-    "  brindle name E2 G3 C4\n"
-    "  brindle function Dm7 G7 --key C\n";
+    "  brindle markov learn -o model.json songs\n";
 
 std::string SubcommandNames(const CLI::App& program) {
     std::vector<std::string> names;
@@ -62,22 +64,22 @@ int main(int argc, char** argv) {
 
     auto status = TStatus::Success;
     AddAnalyse(program, status);
+    AddKeys(program, status);
+    AddCopies(program, status);
+    AddHarmonies(program, status);
+    AddImport(program, status);
     AddChord(program, status);
+    AddFunction(program, status);
+    AddNumerals(program, status);
+    AddVector(program, status);
+    AddName(program, status);
+    AddTypes(program, status);
+    AddNet(program, status);
     AddScale(program, status);
     AddKey(program, status);
     AddGrid(program, status);
     AddGrids(program, status);
-    AddName(program, status);
-    AddFunction(program, status);
-    AddTypes(program, status);
-    AddNet(program, status);
-    AddCopies(program, status);
-    AddVector(program, status);
-    AddKeys(program, status);
-    AddNumerals(program, status);
-    AddHarmonies(program, status);
     AddMarkov(program, status);
-    AddImport(program, status);
     try {
         program.parse(argc, argv);
     } catch (const CLI::ParseError& error) {
