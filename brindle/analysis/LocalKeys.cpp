@@ -93,8 +93,10 @@ void ChangeFrom(std::size_t from, double best, const TPointsOfKeys& costs, TPoin
     const auto number = static_cast<double>(from);
     for (std::size_t to = 0; to < kKeyCount; ++to) {
         const double candidate = best - costs[to];
-        const bool isBetter =
-            (candidate > points[to]) | ((candidate == points[to]) & (number < before[to]));
+        const int isHigher = candidate > points[to];
+        const int isEqual = candidate == points[to];
+        const int isLowerKey = number < before[to];
+        const bool isBetter = (isHigher | (isEqual & isLowerKey)) != 0;
         points[to] = isBetter ? candidate : points[to];
         before[to] = isBetter ? number : before[to];
     }

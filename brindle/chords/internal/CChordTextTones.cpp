@@ -163,9 +163,10 @@ bool CChordTextTones::Alter(TAlteredDegree altered) {
         mTones |= Bit(3);
         return true;
     }
-    const auto* const row = std::find_if(
-        kAlterationRows.begin(), kAlterationRows.end(),
-        [&](const TAlterationRow& r) { return r.mDegree == degree && r.mSign == sign; });
+    const auto* const row = std::find_if(kAlterationRows.begin(), kAlterationRows.end(),
+                                         [degree = degree, sign = sign](const TAlterationRow& r) {
+                                             return r.mDegree == degree && r.mSign == sign;
+                                         });
     if (row == kAlterationRows.end()) return false;
     mStack &= ~Bit(row->mReplaces);
     mTones |= Bit(row->mTone);
