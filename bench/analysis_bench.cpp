@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 // What a user waits for when a chord text is analysed, on each route and for several kinds of
 // texts, and how the time grows with the length of the text.
+#include "bench/GrowthReporter.h"
 #include "brindle/analysis/CHarmonicAnalyse.h"
 #include "brindle/analysis/TChordStringParse.h"
 
@@ -183,39 +184,14 @@ void RegisterAll() {
     RegisterBenchmark("JSON text of 64 chords", WholeText)->Unit(benchmark::kMicrosecond);
 }
 
-/// Prints the usual lines and keeps the times, to tell how they grow.
-class CGrowthReporter : public benchmark::ConsoleReporter {
-public:
-    void ReportRuns(const std::vector<Run>& runs) override {
-        ConsoleReporter::ReportRuns(runs);
-        for (const Run& run : runs) {
-            if (run.run_type != Run::RT_Iteration || run.run_name.args.empty()) continue;
-            mTimes[run.run_name.function_name][std::stoul(run.run_name.args)] =
-                run.GetAdjustedCPUTime();
-        }
-    }
-    void PrintGrowth() const {
-        std::printf("\n%-45s %12s %14s\n", "time against that of a tenth of the chords", "10,000",
-                    "100,000");
-        for (const auto& [name, times] : mTimes) {
-            if (times.count(1000) + times.count(10000) + times.count(100000) < 3) continue;
-            std::printf("%-45s %12.1f %14.1f\n", name.c_str(), times.at(10000) / times.at(1000),
-                        times.at(100000) / times.at(10000));
-        }
-    }
-
-private:
-    std::map<std::string, std::map<unsigned long, double>> mTimes;
-};
-
 }  // namespace
 
 int main(int argc, char** argv) {
     benchmark::Initialize(&argc, argv);
     if (benchmark::ReportUnrecognizedArguments(argc, argv)) return 2;
     RegisterAll();
-    CGrowthReporter reporter;
+    brindle::bench::CGrowthReporter reporter;
     benchmark::RunSpecifiedBenchmarks(&reporter);
-    reporter.PrintGrowth();
+    reporter.PrintGrowth("chords", 1000);
     return 0;
 }

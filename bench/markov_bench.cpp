@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 // What a user of the sequence model waits for (learn, ask, generate, save, load), how the time
 // grows with what was learned, and how much memory a model takes.
+#include "bench/GrowthReporter.h"
 #include "brindle/markov/VariableLengthMarkovModel.h"
 #include "brindle/platform/SeededRandom.h"
 
@@ -154,31 +155,6 @@ void BenchLoad(benchmark::State& state) {
     ReportSymbols(state);
 }
 
-/// Prints the usual lines and keeps the times, to tell how they grow.
-class CGrowthReporter : public benchmark::ConsoleReporter {
-public:
-    void ReportRuns(const std::vector<Run>& runs) override {
-        ConsoleReporter::ReportRuns(runs);
-        for (const Run& run : runs) {
-            if (run.run_type != Run::RT_Iteration || run.run_name.args.empty()) continue;
-            mTimes[run.run_name.function_name][std::stoul(run.run_name.args)] =
-                run.GetAdjustedCPUTime();
-        }
-    }
-    void PrintGrowth() const {
-        std::printf("\n%-45s %12s %14s\n", "time against that of a tenth of the symbols", "100,000",
-                    "1,000,000");
-        for (const auto& [name, times] : mTimes) {
-            if (times.count(10000) + times.count(100000) + times.count(1000000) < 3) continue;
-            std::printf("%-45s %12.1f %14.1f\n", name.c_str(), times.at(100000) / times.at(10000),
-                        times.at(1000000) / times.at(100000));
-        }
-    }
-
-private:
-    std::map<std::string, std::map<unsigned long, double>> mTimes;
-};
-
 void Register(const char* name, void (*function)(benchmark::State&)) {
     benchmark::RegisterBenchmark(name, function)
         ->Arg(10000)
@@ -211,8 +187,8 @@ int main(int argc, char** argv) {
     Register("generate 16 bars", BenchGenerate);
     Register("save", BenchSave);
     Register("load", BenchLoad);
-    CGrowthReporter reporter;
+    brindle::bench::CGrowthReporter reporter;
     benchmark::RunSpecifiedBenchmarks(&reporter);
-    reporter.PrintGrowth();
+    reporter.PrintGrowth("symbols", 10000);
     return 0;
 }

@@ -194,14 +194,11 @@ TStatus Analyse(const TAnalyseOptions& options) {
     }
     CHarmAnlsSignKeys signKeys;
     if (!options.mKey.empty()) {
+        const auto key = ReadKeyOption(options.mKey);
+        if (!key) return TStatus::BadUsage;
         CHarmAnlsSignKey given;
         given.mPosition = 0.0;
-        const std::string typedKey = FoldAccidentals(options.mKey);
-        const TKeyText key = ReadKeyText(typedKey);
-        if (!key.mError.empty()) {
-            return FailAt(TStatus::BadUsage, "--key: " + key.mError, typedKey, key.mColumn);
-        }
-        given.mSignKey = key.mSignKey;
+        given.mSignKey = *key;
         signKeys.push_back(given);
     }
     const auto typed = ReadTypedSong(options.mWords, options.mFile);

@@ -100,21 +100,18 @@ std::string FunctionsText(const std::vector<TChordFunction>& functions, const CP
 }
 
 TStatus Function(const TFunctionOptions& options) {
-    const std::string typedKey = FoldAccidentals(options.mKey);
-    const TKeyText key = ReadKeyText(typedKey);
-    if (!key.mError.empty()) {
-        return FailAt(TStatus::BadUsage, "--key: " + key.mError, typedKey, key.mColumn);
-    }
+    const auto key = ReadKeyOption(options.mKey);
+    if (!key) return TStatus::BadUsage;
     const auto symbols = TypedSymbols(options.mSymbols);
     if (!symbols) return TStatus::BadInput;
     const auto chords = options.mReading.ReadSymbols(*symbols);
     if (!chords) return TStatus::BadInput;
-    const CSignKeyHeavy signKey = key.mSignKey.ToSignKeyHeavy();
+    const CSignKeyHeavy signKey = key->ToSignKeyHeavy();
     std::vector<TChordFunction> functions;
     for (std::size_t i = 0; i < symbols->size(); ++i) {
         functions.push_back(FunctionOf((*symbols)[i], (*chords)[i], signKey));
     }
-    return Print(options.mFormat.Format() == TFormat::Json ? FunctionsJson(key.mSignKey, functions)
+    return Print(options.mFormat.Format() == TFormat::Json ? FunctionsJson(*key, functions)
                                                            : FunctionsText(functions, CPaint()));
 }
 

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "cli/KeyText.h"
 
+#include "cli/Input.h"
 #include "cli/Names.h"
 
 #include "brindle/theory/ScaleStrings.h"
@@ -43,6 +44,14 @@ TKeyText ReadKeyText(std::string_view typed) {
         return {{}, "behind the key stands major or minor, or nothing", root.mWord};
     }
     return {{root.mRoot, type}, {}, 0};
+}
+
+std::optional<CSignKeyLite> ReadKeyOption(std::string_view typed) {
+    const std::string text = FoldAccidentals(typed);
+    const TKeyText key = ReadKeyText(text);
+    if (key.mError.empty()) return key.mSignKey;
+    static_cast<void>(FailAt(TStatus::BadUsage, "--key: " + key.mError, text, key.mColumn));
+    return std::nullopt;
 }
 
 TScaleText ReadScaleText(std::string_view typed) {

@@ -5,6 +5,7 @@
 #include "brindle/theory/CSignKeyLite.h"
 
 #include <cstddef>
+#include <optional>
 #include <string>
 #include <string_view>
 
@@ -21,6 +22,9 @@ struct TKeyText {
 
 /// Reads "F# minor", "Bb", "am" with accidentals in # and b.
 [[nodiscard]] TKeyText ReadKeyText(std::string_view text);
+
+/// Reads what was typed behind --key. Nothing when that is no key; then the error has been printed.
+[[nodiscard]] std::optional<CSignKeyLite> ReadKeyOption(std::string_view typed);
 
 /// A scale that was typed, or what is wrong with it and where.
 struct TScaleText {

@@ -144,27 +144,24 @@ std::string WordsText(const std::vector<TWord>& words, const CSignKeyLite& key, 
 }
 
 TStatus Numerals(const TNumeralsOptions& options) {
-    const std::string typedKey = FoldAccidentals(options.mKey);
-    const TKeyText key = ReadKeyText(typedKey);
-    if (!key.mError.empty()) {
-        return FailAt(TStatus::BadUsage, "--key: " + key.mError, typedKey, key.mColumn);
-    }
+    const auto key = ReadKeyOption(options.mKey);
+    if (!key) return TStatus::BadUsage;
     const auto lines = TypedLines(options.mWords);
     if (!lines) return TStatus::BadInput;
     std::vector<TWord> words = WordsWithPlaces(*lines);
-    const bool areNumerals = AreNumerals(words, key.mSignKey, options);
+    const bool areNumerals = AreNumerals(words, *key, options);
     for (TWord& word : words) {
-        if (ReadChord(word, areNumerals, key.mSignKey, options.mNumerals)) continue;
+        if (ReadChord(word, areNumerals, *key, options.mNumerals)) continue;
         return FailAt(
             TStatus::BadInput,
             areNumerals ? "this is no Roman numeral and no Nashville number" : "this is no chord",
             (*lines)[word.mLine], word.mColumn);
     }
     if (options.mFormat.Format() == TFormat::Json) {
-        return Print(WordsJson(words, key.mSignKey, areNumerals, options.mNumerals));
+        return Print(WordsJson(words, *key, areNumerals, options.mNumerals));
     }
     const bool toChords = areNumerals && !options.mNumerals.mNashville;
-    return Print(WordsText(words, key.mSignKey, toChords, options.mNumerals));
+    return Print(WordsText(words, *key, toChords, options.mNumerals));
 }
 
 }  // namespace
