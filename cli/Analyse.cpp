@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "cli/Analysis.h"
 #include "cli/ChordSymbols.h"
+#include "cli/ChordTextOptions.h"
 #include "cli/CommandLine.h"
 #include "cli/Input.h"
 #include "cli/KeyText.h"
@@ -220,24 +221,12 @@ TStatus Analyse(const TAnalyseOptions& options) {
 void AddAnalyse(CLI::App& program, TStatus& status) {
     CLI::App& command = AddCommand(program, kHelp);
     const auto options = std::make_shared<TAnalyseOptions>();
-    command
-        .add_option("TEXT", options->mWords,
-                    "Chord text, or the name of a score; - reads standard input")
-        ->option_text("...");
-    command.add_option("--file", options->mFile, "Read the chord text or the score from a file")
-        ->option_text("PATH");
+    AddSongSource(command, options->mWords, options->mFile);
     AddChoice(command, "--route", options->mRoute, {"tonic", "cadence", "weights", "none"},
               "How centers are searched");
     command.add_option("--key", options->mKey, "The stated key, as in \"A minor\" or Bb")
         ->option_text("KEY");
-    command
-        .add_option("--beats-per-bar", options->mBeatsPerBar,
-                    "Length of a bar in beats (default: 4)")
-        ->option_text("BEATS");
-    command
-        .add_option("--beats-per-chord", options->mBeatsPerChord,
-                    "Length of a chord in beats (default: 1)")
-        ->option_text("BEATS");
+    AddBeats(command, options->mBeatsPerBar, options->mBeatsPerChord);
     AddChoice(command, "--timing", options->mTiming, {"played", "native"},
               "How the chords of a score follow each other");
     command.add_flag("--readings", options->mReadings,

@@ -10,6 +10,12 @@
 
 namespace brindle::cli {
 
+/// Adds TEXT and --file of a command that reads a chord text or a score.
+void AddSongSource(CLI::App& command, std::vector<std::string>& words, std::string& file);
+
+/// Adds --beats-per-bar and --beats-per-chord.
+void AddBeats(CLI::App& command, double& beatsPerBar, double& beatsPerChord);
+
 /// The options of a command that reads one chord text: TEXT, --file, the beats, and how it is read.
 class CChordTextOptions {
 public:

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "cli/ChordSymbols.h"
+#include "cli/ChordTextOptions.h"
 #include "cli/CommandLine.h"
 #include "cli/Input.h"
 #include "cli/KeysJson.h"
@@ -124,20 +125,8 @@ TStatus Keys(const TKeysOptions& options) {
 void AddKeys(CLI::App& program, TStatus& status) {
     CLI::App& command = AddCommand(program, kHelp);
     const auto options = std::make_shared<TKeysOptions>();
-    command
-        .add_option("TEXT", options->mWords,
-                    "Chord text, or the name of a score; - reads standard input")
-        ->option_text("...");
-    command.add_option("--file", options->mFile, "Read the chord text or the score from a file")
-        ->option_text("PATH");
-    command
-        .add_option("--beats-per-bar", options->mKeys.mBeatsPerBar,
-                    "Length of a bar in beats (default: 4)")
-        ->option_text("BEATS");
-    command
-        .add_option("--beats-per-chord", options->mBeatsPerChord,
-                    "Length of a chord in beats (default: 1)")
-        ->option_text("BEATS");
+    AddSongSource(command, options->mWords, options->mFile);
+    AddBeats(command, options->mKeys.mBeatsPerBar, options->mBeatsPerChord);
     command
         .add_option("--home-bonus", options->mKeys.mHomeBonus,
                     "What a chord gains in the key of the song (default: 0.3)")
