@@ -218,24 +218,23 @@ TStatus Analyse(const TAnalyseOptions& options) {
 
 }  // namespace
 
-void AddAnalyse(CLI::App& program, TStatus& status) {
-    CLI::App& command = AddCommand(program, kHelp);
+void AddAnalyse(CCommand& program) {
+    CCommand& command = program.AddCommand(kHelp);
     const auto options = std::make_shared<TAnalyseOptions>();
     AddSongSource(command, options->mWords, options->mFile);
-    AddChoice(command, "--route", options->mRoute, {"tonic", "cadence", "weights", "none"},
-              "How centers are searched");
-    command.add_option("--key", options->mKey, "The stated key, as in \"A minor\" or Bb")
-        ->option_text("KEY");
+    command.AddChoice("--route", options->mRoute, {"tonic", "cadence", "weights", "none"},
+                      "How centers are searched");
+    command.AddOption("--key", "KEY", options->mKey, "The stated key, as in \"A minor\" or Bb");
     AddBeats(command, options->mBeatsPerBar, options->mBeatsPerChord);
-    AddChoice(command, "--timing", options->mTiming, {"played", "native"},
-              "How the chords of a score follow each other");
-    command.add_flag("--readings", options->mReadings,
-                     "Show all readings that progressions to a tonic allow");
+    command.AddChoice("--timing", options->mTiming, {"played", "native"},
+                      "How the chords of a score follow each other");
+    command.AddFlag("--readings", options->mReadings,
+                    "Show all readings that progressions to a tonic allow");
     options->mReading.AddTo(command, "In what form the chord text is written");
-    command.add_flag("--grids", options->mGrids,
-                     "Draw a guitar fingering under each chord of the picture");
+    command.AddFlag("--grids", options->mGrids,
+                    "Draw a guitar fingering under each chord of the picture");
     options->mFormat.AddTo(command, {"text", "json", "native", "svg"});
-    command.callback([options, &status] { status = Analyse(*options); });
+    command.OnCall([options] { return Analyse(*options); });
 }
 
 }  // namespace brindle::cli

@@ -89,15 +89,14 @@ TStatus Chord(const TChordOptions& options) {
 
 }  // namespace
 
-void AddChord(CLI::App& program, TStatus& status) {
-    CLI::App& command = AddCommand(program, kHelp);
+void AddChord(CCommand& program) {
+    CCommand& command = program.AddCommand(kHelp);
     const auto options = std::make_shared<TChordOptions>();
-    command.add_option("SYMBOL", options->mSymbols, "Chord symbols; - reads standard input")
-        ->required()
-        ->option_text("...");
+    command.AddArgument("SYMBOL", options->mSymbols, "Chord symbols; - reads standard input")
+        .Required();
     options->mReading.AddTo(command);
     options->mFormat.AddTo(command, {"text", "json"});
-    command.callback([options, &status] { status = Chord(*options); });
+    command.OnCall([options] { return Chord(*options); });
 }
 
 }  // namespace brindle::cli

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "cli/ChordTextOptions.h"
 
+#include "cli/CCommand.h"
 #include "cli/Input.h"
 #include "cli/Names.h"
 
@@ -15,24 +16,22 @@ constexpr double kLongest = 1024.0;
 
 }  // namespace
 
-void AddSongSource(CLI::App& command, std::vector<std::string>& words, std::string& file) {
-    command.add_option("TEXT", words, "Chord text, or the name of a score; - reads standard input")
-        ->option_text("...");
-    command.add_option("--file", file, "Read the chord text or the score from a file")
-        ->option_text("PATH");
+void AddSongSource(CCommand& command, std::vector<std::string>& words, std::string& file) {
+    command.AddArgument("TEXT", words,
+                        "Chord text, or the name of a score; - reads standard input");
+    command.AddOption("--file", "PATH", file, "Read the chord text or the score from a file");
 }
 
-void AddBeats(CLI::App& command, double& beatsPerBar, double& beatsPerChord) {
-    command.add_option("--beats-per-bar", beatsPerBar, "Length of a bar in beats (default: 4)")
-        ->option_text("BEATS");
-    command
-        .add_option("--beats-per-chord", beatsPerChord, "Length of a chord in beats (default: 1)")
-        ->option_text("BEATS");
+void AddBeats(CCommand& command, double& beatsPerBar, double& beatsPerChord) {
+    command.AddOption("--beats-per-bar", "BEATS", beatsPerBar,
+                      "Length of a bar in beats (default: 4)");
+    command.AddOption("--beats-per-chord", "BEATS", beatsPerChord,
+                      "Length of a chord in beats (default: 1)");
 }
 
-void CChordTextOptions::AddTo(CLI::App& command) {
-    command.add_option("TEXT", mWords, "Chord text; - reads standard input")->option_text("...");
-    command.add_option("--file", mFile, "Read the chord text from a file")->option_text("PATH");
+void CChordTextOptions::AddTo(CCommand& command) {
+    command.AddArgument("TEXT", mWords, "Chord text; - reads standard input");
+    command.AddOption("--file", "PATH", mFile, "Read the chord text from a file");
     AddBeats(command, mBeatsPerBar, mBeatsPerChord);
     mReading.AddTo(command, "In what form the chord text is written");
 }

@@ -3,23 +3,24 @@
 
 #include "cli/TypedChords.h"
 
-#include <CLI/CLI.hpp>
 #include <optional>
 #include <string>
 #include <vector>
 
 namespace brindle::cli {
 
+class CCommand;
+
 /// Adds TEXT and --file of a command that reads a chord text or a score.
-void AddSongSource(CLI::App& command, std::vector<std::string>& words, std::string& file);
+void AddSongSource(CCommand& command, std::vector<std::string>& words, std::string& file);
 
 /// Adds --beats-per-bar and --beats-per-chord.
-void AddBeats(CLI::App& command, double& beatsPerBar, double& beatsPerChord);
+void AddBeats(CCommand& command, double& beatsPerBar, double& beatsPerChord);
 
 /// The options of a command that reads one chord text: TEXT, --file, the beats, and how it is read.
 class CChordTextOptions {
 public:
-    void AddTo(CLI::App& command);
+    void AddTo(CCommand& command);
 
     /// What is wrong with options that are fine one by one.
     [[nodiscard]] std::optional<std::string> Contradiction() const;

@@ -78,12 +78,12 @@ TStatus Copies(const TCopiesOptions& options) {
 
 }  // namespace
 
-void AddCopies(CLI::App& program, TStatus& status) {
-    CLI::App& command = AddCommand(program, kHelp);
+void AddCopies(CCommand& program) {
+    CCommand& command = program.AddCommand(kHelp);
     const auto options = std::make_shared<TCopiesOptions>();
     options->mText.AddTo(command);
     options->mFormat.AddTo(command, {"text", "json"});
-    command.callback([options, &status] { status = Copies(*options); });
+    command.OnCall([options] { return Copies(*options); });
 }
 
 }  // namespace brindle::cli

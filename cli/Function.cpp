@@ -117,18 +117,15 @@ TStatus Function(const TFunctionOptions& options) {
 
 }  // namespace
 
-void AddFunction(CLI::App& program, TStatus& status) {
-    CLI::App& command = AddCommand(program, kHelp);
+void AddFunction(CCommand& program) {
+    CCommand& command = program.AddCommand(kHelp);
     const auto options = std::make_shared<TFunctionOptions>();
-    command.add_option("SYMBOL", options->mSymbols, "Chord symbols; - reads standard input")
-        ->required()
-        ->option_text("...");
-    command.add_option("--key", options->mKey, "The key, as in \"A minor\" or Bb")
-        ->required()
-        ->option_text("KEY");
+    command.AddArgument("SYMBOL", options->mSymbols, "Chord symbols; - reads standard input")
+        .Required();
+    command.AddOption("--key", "KEY", options->mKey, "The key, as in \"A minor\" or Bb").Required();
     options->mReading.AddTo(command);
     options->mFormat.AddTo(command, {"text", "json"});
-    command.callback([options, &status] { status = Function(*options); });
+    command.OnCall([options] { return Function(*options); });
 }
 
 }  // namespace brindle::cli

@@ -114,23 +114,19 @@ TStatus Grid(const TGridOptions& options) {
 
 }  // namespace
 
-void AddGrid(CLI::App& program, TStatus& status) {
-    CLI::App& command = AddCommand(program, kHelp);
+void AddGrid(CCommand& program) {
+    CCommand& command = program.AddCommand(kHelp);
     const auto options = std::make_shared<TGridOptions>();
     command
-        .add_option("GRID", options->mWords, "Fingerings or chord symbols; - reads standard input")
-        ->required()
-        ->option_text("...");
-    command.add_option("--tuning", options->mTuning, "Open strings (default: EADGBE)")
-        ->option_text("TUNING");
-    command.add_option("--capo", options->mCapo, "Fret of the capodaster (default: 0)")
-        ->check(CLI::Range(0, kMostCapo))
-        ->option_text("N");
-    command.add_option("--package", options->mPackage, "Package to look chords up in")
-        ->option_text("PATH");
+        .AddArgument("GRID", options->mWords, "Fingerings or chord symbols; - reads standard input")
+        .Required();
+    command.AddOption("--tuning", "TUNING", options->mTuning, "Open strings (default: EADGBE)");
+    command.AddOption("--capo", "N", options->mCapo, "Fret of the capodaster (default: 0)")
+        .InRange(0, kMostCapo);
+    command.AddOption("--package", "PATH", options->mPackage, "Package to look chords up in");
     options->mReading.AddTo(command);
     options->mFormat.AddTo(command, {"text", "json", "svg"});
-    command.callback([options, &status] { status = Grid(*options); });
+    command.OnCall([options] { return Grid(*options); });
 }
 
 }  // namespace brindle::cli

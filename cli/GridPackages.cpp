@@ -121,32 +121,30 @@ TStatus Import(const TPackageOptions& options) {
 using TAction = TStatus (*)(const TPackageOptions&);
 
 /// Adds "grids <name>"; `formats` are none for an action that has only one.
-CLI::App& AddAction(CLI::App& command, const char* name, const char* purpose, TAction action,
+CCommand& AddAction(CCommand& grids, const char* name, const char* purpose, TAction action,
                     const std::vector<std::string>& formats,
-                    const std::shared_ptr<TPackageOptions>& options, TStatus& status) {
-    CLI::App& subcommand = *command.add_subcommand(name, purpose);
-    subcommand.add_option("PATH", options->mPath, "The package")->option_text(" ");
-    if (!formats.empty()) options->mFormat.AddTo(subcommand, formats);
-    subcommand.callback([options, action, &status] { status = action(*options); });
-    return subcommand;
+                    const std::shared_ptr<TPackageOptions>& options) {
+    CCommand& command = grids.AddCommand({name, purpose, nullptr});
+    command.AddArgument("PATH", options->mPath, "The package");
+    if (!formats.empty()) options->mFormat.AddTo(command, formats);
+    command.OnCall([options, action] { return action(*options); });
+    return command;
 }
 
 }  // namespace
 
-void AddGrids(CLI::App& program, TStatus& status) {
-    CLI::App& command = AddCommand(program, kHelp);
-    command.require_subcommand(1);
+void AddGrids(CCommand& program) {
+    CCommand& command = program.AddCommand(kHelp);
     const auto options = [] { return std::make_shared<TPackageOptions>(); };
-    AddAction(command, "list", "Show the libraries", List, {"text", "json"}, options(), status);
-    AddAction(command, "show", "Draw all fingerings", Show, {"text", "json", "svg"}, options(),
-              status);
-    AddAction(command, "export", "Print a package as JSON", Export, {}, options(), status);
+    AddAction(command, "list", "Show the libraries", List, {"text", "json"}, options());
+    AddAction(command, "show", "Draw all fingerings", Show, {"text", "json", "svg"}, options());
+    AddAction(command, "export", "Print a package as JSON", Export, {}, options());
     const auto importOptions = options();
-    CLI::App& importing = AddAction(command, "import", "Replace a package by what JSON holds",
-                                    Import, {}, importOptions, status);
-    importing.get_option("PATH")->required();
-    importing.add_option("--from", importOptions->mFile, "The JSON (default: standard input)")
-        ->option_text("FILE");
+    CCommand& importing = AddAction(command, "import", "Replace a package by what JSON holds",
+                                    Import, {}, importOptions);
+    importing.Option("PATH").Required();
+    importing.AddOption("--from", "FILE", importOptions->mFile,
+                        "The JSON (default: standard input)");
 }
 
 }  // namespace brindle::cli

@@ -127,16 +127,15 @@ TStatus Harmonies(const THarmoniesOptions& options) {
 
 }  // namespace
 
-void AddHarmonies(CLI::App& program, TStatus& status) {
-    CLI::App& command = AddCommand(program, kHelp);
+void AddHarmonies(CCommand& program) {
+    CCommand& command = program.AddCommand(kHelp);
     const auto options = std::make_shared<THarmoniesOptions>();
-    command.add_option("FILE", options->mFile, "A score in MusicXML; - reads standard input")
-        ->required()
-        ->option_text(" ");
-    AddChoice(command, "--timing", options->mTiming, {"played", "native"},
-              "How the chords of a score follow each other");
+    command.AddArgument("FILE", options->mFile, "A score in MusicXML; - reads standard input")
+        .Required();
+    command.AddChoice("--timing", options->mTiming, {"played", "native"},
+                      "How the chords of a score follow each other");
     options->mFormat.AddTo(command, {"text", "json", "chords"});
-    command.callback([options, &status] { status = Harmonies(*options); });
+    command.OnCall([options] { return Harmonies(*options); });
 }
 
 }  // namespace brindle::cli

@@ -162,22 +162,18 @@ TStatus Import(const TImportOptions& options) {
 
 }  // namespace
 
-void AddImport(CLI::App& program, TStatus& status) {
-    CLI::App& command = AddCommand(program, kHelp);
+void AddImport(CCommand& program) {
+    CCommand& command = program.AddCommand(kHelp);
     const auto options = std::make_shared<TImportOptions>();
     command
-        .add_option("FILE", options->mFile,
-                    "A score in MusicXML, compressed if its name ends in .mxl; - reads standard "
-                    "input")
-        ->required()
-        ->option_text(" ");
-    AddChoice(command, "--format", options->mFormat, {"text", "ndjson"}, "Form of the output");
-    command.add_flag("--json", options->mJson, "Short for --format ndjson")
-        ->excludes("--format")
-        ->option_text(" ");
-    command.add_option("--midi", options->mMidiFile, "Also write the notes to a MIDI file")
-        ->option_text("FILE");
-    command.callback([options, &status] { status = Import(*options); });
+        .AddArgument("FILE", options->mFile,
+                     "A score in MusicXML, compressed if its name ends in .mxl; - reads standard "
+                     "input")
+        .Required();
+    command.AddChoice("--format", options->mFormat, {"text", "ndjson"}, "Form of the output");
+    command.AddFlag("--json", options->mJson, "Short for --format ndjson").Excludes("--format");
+    command.AddOption("--midi", "FILE", options->mMidiFile, "Also write the notes to a MIDI file");
+    command.OnCall([options] { return Import(*options); });
 }
 
 }  // namespace brindle::cli

@@ -67,14 +67,13 @@ TStatus Key(const TLineOptions& options) {
 
 }  // namespace
 
-void AddKey(CLI::App& program, TStatus& status) {
-    CLI::App& command = AddCommand(program, kHelp);
+void AddKey(CCommand& program) {
+    CCommand& command = program.AddCommand(kHelp);
     const auto options = std::make_shared<TLineOptions>();
-    command.add_option("KEY", options->mWords, "A key, major or minor; - reads one a line")
-        ->required()
-        ->option_text("...");
+    command.AddArgument("KEY", options->mWords, "A key, major or minor; - reads one a line")
+        .Required();
     options->mFormat.AddTo(command, {"text", "json"});
-    command.callback([options, &status] { status = Key(*options); });
+    command.OnCall([options] { return Key(*options); });
 }
 
 }  // namespace brindle::cli

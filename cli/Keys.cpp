@@ -122,23 +122,19 @@ TStatus Keys(const TKeysOptions& options) {
 
 }  // namespace
 
-void AddKeys(CLI::App& program, TStatus& status) {
-    CLI::App& command = AddCommand(program, kHelp);
+void AddKeys(CCommand& program) {
+    CCommand& command = program.AddCommand(kHelp);
     const auto options = std::make_shared<TKeysOptions>();
     AddSongSource(command, options->mWords, options->mFile);
     AddBeats(command, options->mKeys.mBeatsPerBar, options->mBeatsPerChord);
-    command
-        .add_option("--home-bonus", options->mKeys.mHomeBonus,
-                    "What a chord gains in the key of the song (default: 0.3)")
-        ->option_text("POINTS");
-    command
-        .add_option("--change-cost", options->mKeys.mChangeCost,
-                    "What the nearest change of key costs (default: 4)")
-        ->option_text("POINTS");
+    command.AddOption("--home-bonus", "POINTS", options->mKeys.mHomeBonus,
+                      "What a chord gains in the key of the song (default: 0.3)");
+    command.AddOption("--change-cost", "POINTS", options->mKeys.mChangeCost,
+                      "What the nearest change of key costs (default: 4)");
     AddNumeralOptions(command, options->mNumerals);
     options->mReading.AddTo(command, "In what form the chord text is written");
     options->mFormat.AddTo(command, {"text", "json", "svg"});
-    command.callback([options, &status] { status = Keys(*options); });
+    command.OnCall([options] { return Keys(*options); });
 }
 
 }  // namespace brindle::cli

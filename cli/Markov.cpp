@@ -199,13 +199,12 @@ Json SymbolToJson(const CMarkovObject& object) {
             {"Intervals", IntervalsToJson(chord.mSemitones)}};
 }
 
-void AddMarkov(CLI::App& program, TStatus& status) {
-    CLI::App& markov = AddCommand(program, kHelp);
-    markov.require_subcommand(1);
-    AddMarkovLearn(markov, status);
-    AddMarkovGenerate(markov, status);
-    AddMarkovFill(markov, status);
-    AddMarkovShow(markov, status);
+void AddMarkov(CCommand& program) {
+    CCommand& markov = program.AddCommand(kHelp);
+    AddMarkovLearn(markov);
+    AddMarkovGenerate(markov);
+    AddMarkovFill(markov);
+    AddMarkovShow(markov);
 }
 
 }  // namespace brindle::cli

@@ -41,10 +41,10 @@ void SetSeed(VariableLengthMarkovModel& model, const std::optional<std::uint64_t
 /// Length, symbol, root, bass and semitones of a chord; its type for any other symbol.
 [[nodiscard]] Json SymbolToJson(const CMarkovObject& object);
 
-void AddMarkovLearn(CLI::App& markov, TStatus& status);
-void AddMarkovGenerate(CLI::App& markov, TStatus& status);
-void AddMarkovFill(CLI::App& markov, TStatus& status);
-void AddMarkovShow(CLI::App& markov, TStatus& status);
+void AddMarkovLearn(CCommand& markov);
+void AddMarkovGenerate(CCommand& markov);
+void AddMarkovFill(CCommand& markov);
+void AddMarkovShow(CCommand& markov);
 
 /// The sequence as a piece for two tracks, chords and bass. False when it cannot be written.
 [[nodiscard]] bool WriteMarkovMidi(const std::string& path, MarkovSequenceView sequence,

@@ -85,18 +85,15 @@ TStatus MarkovFill(const TFillOptions& options) {
 
 }  // namespace
 
-void AddMarkovFill(CLI::App& markov, TStatus& status) {
-    CLI::App& command = AddCommand(markov, kHelp);
+void AddMarkovFill(CCommand& markov) {
+    CCommand& command = markov.AddCommand(kHelp);
     const auto options = std::make_shared<TFillOptions>();
-    command.add_option("MODEL", options->mModel, "Model file; - reads standard input")
-        ->required()
-        ->option_text(" ");
-    command.add_option("SEQUENCE", options->mSequence, "Chords with their lengths; U is a gap")
-        ->required()
-        ->option_text(" ");
-    command.add_option("--seed", options->mSeed, "Repeats a run exactly")->option_text("S");
+    command.AddArgument("MODEL", options->mModel, "Model file; - reads standard input").Required();
+    command.AddArgument("SEQUENCE", options->mSequence, "Chords with their lengths; U is a gap")
+        .Required();
+    command.AddOption("--seed", "S", options->mSeed, "Repeats a run exactly");
     options->mFormat.AddTo(command, {"text", "json"});
-    command.callback([options, &status] { status = MarkovFill(*options); });
+    command.OnCall([options] { return MarkovFill(*options); });
 }
 
 }  // namespace brindle::cli

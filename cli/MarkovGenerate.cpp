@@ -23,6 +23,7 @@ constexpr TCommandHelp kHelp{
 constexpr double kMostBeats = 10000.0;
 // A second or two of search.
 constexpr std::uint64_t kMostSteps = 1'000'000;
+constexpr std::uint64_t kShortestOrder = 1;
 constexpr std::uint64_t kMostAttempts = 10'000'000;
 
 struct TGenerateOptions {
@@ -38,7 +39,7 @@ struct TGenerateOptions {
     bool mIsStrict = false;
     double mAllEqualFactor = 1.0;
     std::uint64_t mAttempts = 10000;
-    std::size_t mOthers = 3;
+    std::uint64_t mOthers = 3;
     int mBeatsPerBar = 4;
     std::string mMidi;
     double mTempo = 100.0;
@@ -180,69 +181,56 @@ TStatus MarkovGenerate(const TGenerateOptions& options) {
                                                            : GeneratedText(generated, options));
 }
 
-void AddHistoryOptions(CLI::App& command, TGenerateOptions& options) {
-    const auto orders = CLI::Range(std::uint64_t{1}, kLongestOrder);
-    command.add_option("--order", options.mOrder, "Longest history (default: that of the model)")
-        ->check(orders)
-        ->option_text("N");
-    command.add_option("--min-order", options.mMinOrder, "Shortest history (default: 1)")
-        ->check(orders)
-        ->option_text("N");
+void AddHistoryOptions(CCommand& command, TGenerateOptions& options) {
     command
-        .add_option("--evidence", options.mEvidence,
-                    "History behind which fixed chords must be known (default: 1)")
-        ->check(orders)
-        ->option_text("N");
+        .AddOption("--order", "N", options.mOrder, "Longest history (default: that of the model)")
+        .InRange(kShortestOrder, kLongestOrder);
+    command.AddOption("--min-order", "N", options.mMinOrder, "Shortest history (default: 1)")
+        .InRange(kShortestOrder, kLongestOrder);
     command
-        .add_option("--min-entropy", options.mMinEntropy,
-                    "How varied the chords behind a history must be for it to be used, 0 to 1 "
-                    "(default: 0)")
-        ->check(CLI::Range(0.0, 1.0))
-        ->option_text("H");
-    command.add_flag("--strict", options.mIsStrict,
-                     "Hold --min-entropy at the shortest history and at the end of gaps, too");
+        .AddOption("--evidence", "N", options.mEvidence,
+                   "History behind which fixed chords must be known (default: 1)")
+        .InRange(kShortestOrder, kLongestOrder);
     command
-        .add_option("--all-equal-factor", options.mAllEqualFactor,
-                    "Weight of a sequence of one and the same chord (default: 1)")
-        ->check(CLI::Range(0.0, 1.0))
-        ->option_text("F");
+        .AddOption("--min-entropy", "H", options.mMinEntropy,
+                   "How varied the chords behind a history must be for it to be used, 0 to 1 "
+                   "(default: 0)")
+        .InRange(0.0, 1.0);
+    command.AddFlag("--strict", options.mIsStrict,
+                    "Hold --min-entropy at the shortest history and at the end of gaps, too");
+    command
+        .AddOption("--all-equal-factor", "F", options.mAllEqualFactor,
+                   "Weight of a sequence of one and the same chord (default: 1)")
+        .InRange(0.0, 1.0);
 }
 
 }  // namespace
 
-void AddMarkovGenerate(CLI::App& markov, TStatus& status) {
-    CLI::App& command = AddCommand(markov, kHelp);
+void AddMarkovGenerate(CCommand& markov) {
+    CCommand& command = markov.AddCommand(kHelp);
     const auto options = std::make_shared<TGenerateOptions>();
-    command.add_option("MODEL", options->mModel, "Model file; - reads standard input")
-        ->required()
-        ->option_text(" ");
-    command.add_option("--beats", options->mBeats, "Length of the sequence")
-        ->check(CLI::Range(1.0, kMostBeats))
-        ->option_text("BEATS");
-    command.add_option("--template", options->mTemplate, "Chords that are fixed, and gaps")
-        ->option_text("CHORDS");
-    command.add_option("--samples", options->mSamples, "Sequences to choose from (default: 10)")
-        ->check(CLI::Range(std::uint64_t{1}, std::uint64_t{100000}))
-        ->option_text("N");
-    command.add_option("--seed", options->mSeed, "Repeats a run exactly")->option_text("S");
+    command.AddArgument("MODEL", options->mModel, "Model file; - reads standard input").Required();
+    command.AddOption("--beats", "BEATS", options->mBeats, "Length of the sequence")
+        .InRange(1.0, kMostBeats);
+    command.AddOption("--template", "CHORDS", options->mTemplate,
+                      "Chords that are fixed, and gaps");
+    command.AddOption("--samples", "N", options->mSamples, "Sequences to choose from (default: 10)")
+        .InRange(std::uint64_t{1}, std::uint64_t{100000});
+    command.AddOption("--seed", "S", options->mSeed, "Repeats a run exactly");
     AddHistoryOptions(command, *options);
     command
-        .add_option("--attempts", options->mAttempts,
-                    "Give up after so many attempts (default: 10000)")
-        ->check(CLI::Range(std::uint64_t{1}, kMostAttempts))
-        ->option_text("N");
-    command.add_option("--others", options->mOthers, "Other sequences to show (default: 3)")
-        ->option_text("N");
-    command.add_option("--beats-per-bar", options->mBeatsPerBar, "Beats of a bar (default: 4)")
-        ->check(CLI::Range(1, 64))
-        ->option_text("BEATS");
-    command.add_option("--midi", options->mMidi, "Write the sequence as a MIDI file")
-        ->option_text("PATH");
-    command.add_option("--tempo", options->mTempo, "Beats per minute of that (default: 100)")
-        ->check(CLI::Range(10.0, 1000.0))
-        ->option_text("BPM");
+        .AddOption("--attempts", "N", options->mAttempts,
+                   "Give up after so many attempts (default: 10000)")
+        .InRange(std::uint64_t{1}, kMostAttempts);
+    command.AddOption("--others", "N", options->mOthers, "Other sequences to show (default: 3)");
+    command
+        .AddOption("--beats-per-bar", "BEATS", options->mBeatsPerBar, "Beats of a bar (default: 4)")
+        .InRange(1, 64);
+    command.AddOption("--midi", "PATH", options->mMidi, "Write the sequence as a MIDI file");
+    command.AddOption("--tempo", "BPM", options->mTempo, "Beats per minute of that (default: 100)")
+        .InRange(10.0, 1000.0);
     options->mFormat.AddTo(command, {"text", "json"});
-    command.callback([options, &status] { status = MarkovGenerate(*options); });
+    command.OnCall([options] { return MarkovGenerate(*options); });
 }
 
 }  // namespace brindle::cli

@@ -126,28 +126,23 @@ TStatus MarkovLearn(const TLearnOptions& options) {
 
 }  // namespace
 
-void AddMarkovLearn(CLI::App& markov, TStatus& status) {
-    CLI::App& command = AddCommand(markov, kHelp);
+void AddMarkovLearn(CCommand& markov) {
+    CCommand& command = markov.AddCommand(kHelp);
     const auto options = std::make_shared<TLearnOptions>();
-    command.add_option("FILES", options->mFiles, "Files and folders")
-        ->required()
-        ->option_text("...");
-    command.add_option("-o,--output", options->mModel, "The model file that is written")
-        ->required()
-        ->option_text("MODEL");
-    command.add_option("--order", options->mOrder, "Longest history, in chords (default: 3)")
-        ->check(CLI::Range(std::uint64_t{1}, kLongestOrder))
-        ->option_text("N");
-    command.add_flag("--simplify", options->mSimplify,
-                     "Make each chord a triad without bass that lasts 4 beats");
+    command.AddArgument("FILES", options->mFiles, "Files and folders").Required();
+    command.AddOption("-o,--output", "MODEL", options->mModel, "The model file that is written")
+        .Required();
+    command.AddOption("--order", "N", options->mOrder, "Longest history, in chords (default: 3)")
+        .InRange(std::uint64_t{1}, kLongestOrder);
+    command.AddFlag("--simplify", options->mSimplify,
+                    "Make each chord a triad without bass that lasts 4 beats");
     command
-        .add_option("--beats-per-bar", options->mBeatsPerBar,
-                    "Length of a bar of chord texts in beats (default: 4)")
-        ->check(CLI::Range(1.0, 64.0))
-        ->option_text("BEATS");
+        .AddOption("--beats-per-bar", "BEATS", options->mBeatsPerBar,
+                   "Length of a bar of chord texts in beats (default: 4)")
+        .InRange(1.0, 64.0);
     options->mReading.AddTo(command, "In what form chord texts are written");
     options->mFormat.AddTo(command, {"text", "json"});
-    command.callback([options, &status] { status = MarkovLearn(*options); });
+    command.OnCall([options] { return MarkovLearn(*options); });
 }
 
 }  // namespace brindle::cli

@@ -22,7 +22,7 @@ constexpr TCommandHelp kHelp{
 struct TShowOptions {
     std::string mModel;
     std::string mHistory;
-    std::size_t mTop = 10;
+    std::uint64_t mTop = 10;
     CFormatOptions mFormat;
 };
 
@@ -150,7 +150,9 @@ TStatus MarkovShow(const TShowOptions& options) {
     if (history.empty()) {
         return Fail(TStatus::BadInput, "the model does not know the last chord of --history");
     }
-    continuations.resize(std::min(continuations.size(), options.mTop));
+    if (options.mTop < continuations.size()) {
+        continuations.resize(static_cast<std::size_t>(options.mTop));
+    }
     return Print(options.mFormat.Format() == TFormat::Json
                      ? ShownJson(*model, history, continuations)
                      : ShownText(*model, history, continuations, CPaint()));
@@ -158,20 +160,15 @@ TStatus MarkovShow(const TShowOptions& options) {
 
 }  // namespace
 
-void AddMarkovShow(CLI::App& markov, TStatus& status) {
-    CLI::App& command = AddCommand(markov, kHelp);
+void AddMarkovShow(CCommand& markov) {
+    CCommand& command = markov.AddCommand(kHelp);
     const auto options = std::make_shared<TShowOptions>();
-    command.add_option("MODEL", options->mModel, "Model file; - reads standard input")
-        ->required()
-        ->option_text(" ");
-    command
-        .add_option("--history", options->mHistory,
-                    "Show what follows these chords (default: the start of a sequence)")
-        ->option_text("CHORDS");
-    command.add_option("--top", options->mTop, "Continuations to show (default: 10)")
-        ->option_text("N");
+    command.AddArgument("MODEL", options->mModel, "Model file; - reads standard input").Required();
+    command.AddOption("--history", "CHORDS", options->mHistory,
+                      "Show what follows these chords (default: the start of a sequence)");
+    command.AddOption("--top", "N", options->mTop, "Continuations to show (default: 10)");
     options->mFormat.AddTo(command, {"text", "json"});
-    command.callback([options, &status] { status = MarkovShow(*options); });
+    command.OnCall([options] { return MarkovShow(*options); });
 }
 
 }  // namespace brindle::cli

@@ -211,19 +211,17 @@ TStatus Name(const TNameOptions& options) {
 
 }  // namespace
 
-void AddName(CLI::App& program, TStatus& status) {
-    CLI::App& command = AddCommand(program, kHelp);
+void AddName(CCommand& program) {
+    CCommand& command = program.AddCommand(kHelp);
     const auto options = std::make_shared<TNameOptions>();
-    command.add_option("NOTE", options->mWords, "Notes of a chord; - reads one chord a line")
-        ->required()
-        ->option_text("...");
-    command.add_option("--root", options->mRoot, "The root; without it, it is searched")
-        ->option_text("KEY");
-    AddChoice(command, "--method", options->mMethod, {"net", "score"}, "How a root is searched");
-    command.add_flag("--all-roots", options->mAllRoots, "The names with each of the twelve roots");
+    command.AddArgument("NOTE", options->mWords, "Notes of a chord; - reads one chord a line")
+        .Required();
+    command.AddOption("--root", "KEY", options->mRoot, "The root; without it, it is searched");
+    command.AddChoice("--method", options->mMethod, {"net", "score"}, "How a root is searched");
+    command.AddFlag("--all-roots", options->mAllRoots, "The names with each of the twelve roots");
     options->mFormat.AddTo(command, {"text", "json"});
     options->mNaming.AddTo(command);
-    command.callback([options, &status] { status = Name(*options); });
+    command.OnCall([options] { return Name(*options); });
 }
 
 }  // namespace brindle::cli

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "cli/NamingOptions.h"
 
-#include "cli/CommandLine.h"
+#include "cli/CCommand.h"
 
 namespace brindle::cli {
 namespace {
@@ -13,10 +13,10 @@ std::int32_t MajorSeventhPref(const std::string& text) {
 
 }  // namespace
 
-void CNamingOptions::AddTo(CLI::App& command) {
+void CNamingOptions::AddTo(CCommand& command) {
     const std::string group = "Naming";
     const auto addFlag = [&](const char* name, bool& value, const char* purpose) {
-        command.add_flag(name, value, purpose)->group(group);
+        command.AddFlag(name, value, purpose).InGroup(group);
     };
     addFlag("--ascii", mAscii, "Signs are # and b");
     addFlag("--german", mPrefs.mGermanNames, "Signs are words: Fis, Es");
@@ -32,14 +32,14 @@ void CNamingOptions::AddTo(CLI::App& command) {
     addFlag("--brackets", mBrackets, "Options after the first stand in brackets: C7(9)");
     addFlag("--spaces", mSpaces, "Blanks between the parts of the name");
     addFlag("--spaces-around-slash", mSpacesAroundSlash, "Blanks around the slash of the bass");
-    command.add_option("--slash-text", mPrefs.mSlashText, "Stands for the slash of the bass")
-        ->option_text("TEXT")
-        ->group(group);
-    AddChoice(command, "--major-seventh", mMajorSeventh, {"ma7", "j7", "maj7"},
-              "How a major seventh is written");
-    AddChoice(command, "--middle-c", mMiddleC, {"3", "4", "5"}, "The octave of note number 60");
-    command.get_option("--major-seventh")->group(group);
-    command.get_option("--middle-c")->group(group);
+    command.AddOption("--slash-text", "TEXT", mPrefs.mSlashText, "Stands for the slash of the bass")
+        .InGroup(group);
+    command
+        .AddChoice("--major-seventh", mMajorSeventh, {"ma7", "j7", "maj7"},
+                   "How a major seventh is written")
+        .InGroup(group);
+    command.AddChoice("--middle-c", mMiddleC, {"3", "4", "5"}, "The octave of note number 60")
+        .InGroup(group);
 }
 
 CChordNamePrefs CNamingOptions::Prefs() const {

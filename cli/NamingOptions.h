@@ -3,15 +3,16 @@
 
 #include "brindle/theory/CChordNamePrefs.h"
 
-#include <CLI/CLI.hpp>
 #include <string>
 
 namespace brindle::cli {
 
+class CCommand;
+
 /// The options that tell how names are written, one for each naming preference that has an effect.
 class CNamingOptions {
 public:
-    void AddTo(CLI::App& command);
+    void AddTo(CCommand& command);
 
     [[nodiscard]] CChordNamePrefs Prefs() const;
 

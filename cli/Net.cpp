@@ -110,20 +110,19 @@ TStatus PrintWeights(const CFormatOptions& format) {
 
 using TPrinter = TStatus (*)(const CFormatOptions& format);
 
-void AddPrinter(CLI::App& net, const TCommandHelp& help, TPrinter print, TStatus& status) {
-    CLI::App& command = AddCommand(net, help);
+void AddPrinter(CCommand& net, const TCommandHelp& help, TPrinter print) {
+    CCommand& command = net.AddCommand(help);
     const auto format = std::make_shared<CFormatOptions>();
     format->AddTo(command, {"text", "json"});
-    command.callback([format, print, &status] { status = print(*format); });
+    command.OnCall([format, print] { return print(*format); });
 }
 
 }  // namespace
 
-void AddNet(CLI::App& program, TStatus& status) {
-    CLI::App& command = AddCommand(program, kHelp);
-    command.require_subcommand(1);
-    AddPrinter(command, kTraceHelp, PrintTrace, status);
-    AddPrinter(command, kWeightsHelp, PrintWeights, status);
+void AddNet(CCommand& program) {
+    CCommand& command = program.AddCommand(kHelp);
+    AddPrinter(command, kTraceHelp, PrintTrace);
+    AddPrinter(command, kWeightsHelp, PrintWeights);
 }
 
 }  // namespace brindle::cli

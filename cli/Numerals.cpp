@@ -166,28 +166,25 @@ TStatus Numerals(const TNumeralsOptions& options) {
 
 }  // namespace
 
-void AddNumeralOptions(CLI::App& command, TNumeralOptions& options) {
-    command.add_flag("--nashville", options.mNashville, "Print Nashville numbers: 2-7 57 1");
-    command.add_flag("--figures", options.mFigures,
-                     "Inversions are figures: V65, I6 (otherwise V7/7, I/3)");
-    command.add_flag("--printed-signs", options.mPrintedSigns,
-                     "Diminished chords as in print: \xC3\xB8 and \xC2\xB0 for h and o");
+void AddNumeralOptions(CCommand& command, TNumeralOptions& options) {
+    command.AddFlag("--nashville", options.mNashville, "Print Nashville numbers: 2-7 57 1");
+    command.AddFlag("--figures", options.mFigures,
+                    "Inversions are figures: V65, I6 (otherwise V7/7, I/3)");
+    command.AddFlag("--printed-signs", options.mPrintedSigns,
+                    "Diminished chords as in print: \xC3\xB8 and \xC2\xB0 for h and o");
 }
 
-void AddNumerals(CLI::App& program, TStatus& status) {
-    CLI::App& command = AddCommand(program, kHelp);
+void AddNumerals(CCommand& program) {
+    CCommand& command = program.AddCommand(kHelp);
     const auto options = std::make_shared<TNumeralsOptions>();
-    command.add_option("TEXT", options->mWords, "Numerals or chords; - reads standard input")
-        ->required()
-        ->option_text("...");
-    command.add_option("--key", options->mKey, "The key, as in \"A minor\" or Bb")
-        ->required()
-        ->option_text("KEY");
-    AddChoice(command, "--from", options->mFrom, {"guess", "numerals", "chords"},
-              "What the text has; the first word tells");
+    command.AddArgument("TEXT", options->mWords, "Numerals or chords; - reads standard input")
+        .Required();
+    command.AddOption("--key", "KEY", options->mKey, "The key, as in \"A minor\" or Bb").Required();
+    command.AddChoice("--from", options->mFrom, {"guess", "numerals", "chords"},
+                      "What the text has; the first word tells");
     AddNumeralOptions(command, options->mNumerals);
     options->mFormat.AddTo(command, {"text", "json"});
-    command.callback([options, &status] { status = Numerals(*options); });
+    command.OnCall([options] { return Numerals(*options); });
 }
 
 }  // namespace brindle::cli

@@ -76,15 +76,14 @@ TStatus Scale(const TLineOptions& options) {
 
 }  // namespace
 
-void AddScale(CLI::App& program, TStatus& status) {
-    CLI::App& command = AddCommand(program, kHelp);
+void AddScale(CCommand& program) {
+    CCommand& command = program.AddCommand(kHelp);
     const auto options = std::make_shared<TLineOptions>();
     command
-        .add_option("SCALE", options->mWords, "A key and the name of a scale; - reads one a line")
-        ->required()
-        ->option_text("...");
+        .AddArgument("SCALE", options->mWords, "A key and the name of a scale; - reads one a line")
+        .Required();
     options->mFormat.AddTo(command, {"text", "json"});
-    command.callback([options, &status] { status = Scale(*options); });
+    command.OnCall([options] { return Scale(*options); });
 }
 
 }  // namespace brindle::cli

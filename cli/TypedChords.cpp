@@ -48,17 +48,17 @@ void PrintFaults(std::string_view text, const TChordSong& song, bool areWarnings
 
 }  // namespace
 
-void CTypedChords::AddTo(CLI::App& command) {
-    AddChoice(command, "--symbols", mReader, {"all", "native"},
-              "Read all spellings of chords, or as the parser for hosts does");
-    command.add_flag("--lenient", mIsLenient,
-                     "Go on with no chord where a symbol is not understood");
+void CTypedChords::AddTo(CCommand& command) {
+    command.AddChoice("--symbols", mReader, {"all", "native"},
+                      "Read all spellings of chords, or as the parser for hosts does");
+    command.AddFlag("--lenient", mIsLenient,
+                    "Go on with no chord where a symbol is not understood");
 }
 
-void CTypedChords::AddTo(CLI::App& command, const std::string& fromPurpose) {
+void CTypedChords::AddTo(CCommand& command, const std::string& fromPurpose) {
     AddTo(command);
-    AddChoice(command, "--from", mForm, {"plain", "chordpro", "ireal", "auto"}, fromPurpose);
-    command.add_flag("--even", mIsEven, "The chords of a bar without holds share it evenly");
+    command.AddChoice("--from", mForm, {"plain", "chordpro", "ireal", "auto"}, fromPurpose);
+    command.AddFlag("--even", mIsEven, "The chords of a bar without holds share it evenly");
 }
 
 std::optional<std::vector<CChordLite>> CTypedChords::ReadSymbols(

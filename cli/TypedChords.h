@@ -6,7 +6,6 @@
 #include "brindle/analysis/CHarmAnlsChords.h"
 #include "brindle/analysis/ReadChordSheet.h"
 
-#include <CLI/CLI.hpp>
 #include <optional>
 #include <string>
 #include <string_view>
@@ -17,6 +16,8 @@ struct TChordStringParse;
 }
 
 namespace brindle::cli {
+
+class CCommand;
 
 /// A song as somebody typed it.
 struct TChordSong {
@@ -35,8 +36,8 @@ struct TChordSong {
 /// --lenient, and for songs --from and --even. Every subcommand that takes chords reads them here.
 class CTypedChords {
 public:
-    void AddTo(CLI::App& command);
-    void AddTo(CLI::App& command, const std::string& fromPurpose);
+    void AddTo(CCommand& command);
+    void AddTo(CCommand& command, const std::string& fromPurpose);
 
     /// As --symbols native: by the parser that hosts use, which has no faults.
     void UseNative() { mReader = "native"; }

@@ -52,11 +52,11 @@ TStatus Types(const CFormatOptions& format) {
 
 }  // namespace
 
-void AddTypes(CLI::App& program, TStatus& status) {
-    CLI::App& command = AddCommand(program, kHelp);
+void AddTypes(CCommand& program) {
+    CCommand& command = program.AddCommand(kHelp);
     const auto format = std::make_shared<CFormatOptions>();
     format->AddTo(command, {"text", "json"});
-    command.callback([format, &status] { status = Types(*format); });
+    command.OnCall([format] { return Types(*format); });
 }
 
 }  // namespace brindle::cli

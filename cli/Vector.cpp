@@ -163,17 +163,16 @@ TStatus Vector(const TVectorOptions& options) {
 
 }  // namespace
 
-void AddVector(CLI::App& program, TStatus& status) {
-    CLI::App& command = AddCommand(program, kHelp);
+void AddVector(CCommand& program) {
+    CCommand& command = program.AddCommand(kHelp);
     const auto options = std::make_shared<TVectorOptions>();
     command
-        .add_option("CHORD", options->mWords,
-                    "Chord symbols or vectors; - reads standard input, a vector or chords a line")
-        ->required()
-        ->option_text("...");
+        .AddArgument("CHORD", options->mWords,
+                     "Chord symbols or vectors; - reads standard input, a vector or chords a line")
+        .Required();
     options->mReading.AddTo(command);
     options->mFormat.AddTo(command, {"text", "json"});
-    command.callback([options, &status] { status = Vector(*options); });
+    command.OnCall([options] { return Vector(*options); });
 }
 
 }  // namespace brindle::cli
