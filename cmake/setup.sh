@@ -3,9 +3,11 @@
 
 root=$(cd "$(dirname "$(readlink -f "${BASH_SOURCE[0]}")")/.." && pwd)
 
-# Debian's names of what the library, the program, the tests and the benches are built with.
-build_packages=(g++ cmake ninja-build pkg-config libboost-dev libfmt-dev nlohmann-json3-dev
-                libcli11-dev libxml2-dev libzip-dev libplist-dev gettext doctest-dev libbenchmark-dev)
+# Debian's names of what the library and the program are built with; gettext makes the catalogues.
+program_packages=(g++ cmake ninja-build pkg-config libboost-dev libfmt-dev nlohmann-json3-dev
+                  libcli11-dev libxml2-dev libzip-dev libplist-dev gettext)
+# The same for the tests and the benches.
+test_packages=(doctest-dev libbenchmark-dev)
 
 say() { printf 'brindle: %s\n' "$*" >&2; }
 
@@ -71,17 +73,21 @@ fail_with_log() {
     exit 1
 }
 
+# is_configured PRESET [OPTION...]: as these say, in this folder, up to the end.
+is_configured() {
+    [ "$(cat "$root/build/$1/configured" 2>/dev/null || true)" = "$root $*" ]
+}
+
 # configure PRESET [OPTION...]: once; again when the last time did not come to its end, was for other
 # options, or was for a folder of another name.
 configure() {
-    local preset=$1 build="$root/build/$1" log="$root/build/configure.log" wanted
-    wanted="$root $*"
-    [ "$(cat "$build/configured" 2>/dev/null || true)" != "$wanted" ] || return 0
+    local preset=$1 build="$root/build/$1" log="$root/build/configure.log"
+    is_configured "$@" && return 0
     rm -f "$build/configured"
     say "configuring the $preset build"
     (cd "$root" && cmake --fresh --preset "$preset" "${@:2}") >"$log" 2>&1 </dev/null ||
         fail_with_log "$log" "the configuration failed"
-    printf '%s' "$wanted" >"$build/configured"
+    printf '%s' "$root $*" >"$build/configured"
 }
 
 # build PRESET TARGET [OPTION...]: a configured and built target, on all cores.
@@ -91,8 +97,18 @@ build() (
         exec 9>"$root/build/lock"
         flock -n 9 || { say "waiting for another build"; flock 9; }
     fi
-    need_packages "${build_packages[@]}"
+    local packages=("${program_packages[@]}")
+    [[ " $* " == *" -DBRINDLE_TESTS=OFF "* ]] || packages+=("${test_packages[@]}")
+    need_packages "${packages[@]}"
     configure "$1" "${@:3}"
     cmake --build "$root/build/$1" --target "$2" 2>&1 </dev/null | show_progress \
         >"$root/build/build.log" || fail_with_log "$root/build/build.log" "the build failed"
 )
+
+# build_program: the program without what only tests and benches need. They share its folder, and a
+# folder that is configured for them has the program, too; so neither undoes the other's work.
+build_program() {
+    local options=(-DBRINDLE_TESTS=OFF -DBRINDLE_BENCH=OFF -DBRINDLE_FUZZ=OFF)
+    if is_configured release; then options=(); fi
+    build release brindle_cli "${options[@]}"
+}
