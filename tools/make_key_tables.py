@@ -1,6 +1,6 @@
 #!/usr/bin/env python3
 # SPDX-License-Identifier: MIT
-"""Writes brindle/analysis/KeyTables.cpp from data/key-tables.json."""
+"""Writes brindle/analysis/internal/KeyTables.cpp from data/key-tables.json."""
 
 import json
 import pathlib
@@ -74,7 +74,7 @@ def source(tables):
 
 def main():
     tables = json.loads((ROOT / "data" / "key-tables.json").read_text(encoding="utf-8"))
-    (ROOT / "brindle" / "analysis" / "KeyTables.cpp").write_text(source(tables), encoding="utf-8")
+    (ROOT / "brindle" / "analysis" / "internal" / "KeyTables.cpp").write_text(source(tables), encoding="utf-8")
 
 
 if __name__ == "__main__":
