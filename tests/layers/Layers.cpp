@@ -19,6 +19,7 @@ constexpr auto kFolders = std::to_array<std::string_view>({
     "markov",
     "guitarchords",
     "musicxml",
+    "song",
 });
 constexpr std::size_t kProgram = kFolders.size();
 constexpr std::size_t kNowhere = kProgram + 1;

@@ -1,0 +1,121 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/analysis/CHarmAnlsChords.h"
+#include "brindle/analysis/CHarmAnlsSignKeys.h"
+#include "brindle/song/TSongFormat.h"
+#include "brindle/theory/CSignKeyLite.h"
+
+#include <cstddef>
+#include <cstdint>
+#include <optional>
+#include <string>
+#include <vector>
+
+namespace brindle {
+
+/// A time signature. Undefined where a song does not tell one.
+struct CSongTime {
+    std::int32_t mNumerator = 0;
+    std::int32_t mDenominator = 0;
+
+    [[nodiscard]] bool IsUndef() const { return mNumerator <= 0 || mDenominator <= 0; }
+    friend bool operator==(const CSongTime&, const CSongTime&) = default;
+};
+
+/// A bar as it is played. A bar that is played twice stands twice.
+struct CSongBar {
+    /// As printed, "12" or "12a"; of a typed song, the number of the written bar.
+    std::string mNumber;
+    double mPosition = 0.0;
+    /// An upbeat is as long as it is written.
+    double mLength = 0.0;
+    CSongTime mTime;
+
+    friend bool operator==(const CSongBar&, const CSongBar&) = default;
+};
+
+/// A part of a song that begins here: a rehearsal mark, a verse, a chorus. It may have no name.
+struct CSongSection {
+    std::string mName;
+    double mPosition = 0.0;
+
+    friend bool operator==(const CSongSection&, const CSongSection&) = default;
+};
+
+/// A written passage that is played again, as a repeat or a jump tells.
+struct CSongRepeat {
+    /// Where the second playing begins, and where the first did.
+    double mPosition = 0.0;
+    double mSourcePosition = 0.0;
+    /// From both places on so many bars are the same.
+    std::size_t mBarCount = 0;
+
+    friend bool operator==(const CSongRepeat&, const CSongRepeat&) = default;
+};
+
+/// What a song tells beside its chords, such as `{"album", "Kind of Blue"}`.
+struct CSongRemark {
+    std::string mName;
+    std::string mText;
+
+    friend bool operator==(const CSongRemark&, const CSongRemark&) = default;
+};
+
+/// What is wrong with a song or was left out of it, and where.
+struct CSongFault {
+    /// From 1; 0 where the fault is that of the whole source.
+    std::size_t mLine = 0;
+    /// In characters (not bytes) from 1.
+    std::size_t mColumn = 0;
+    std::string mText;
+    /// The chords are all there and what stands here was left out, such as the other songs of a
+    /// list. Any other fault takes all chords of a song, unless the reading is lenient.
+    bool mIsNote = false;
+
+    friend bool operator==(const CSongFault&, const CSongFault&) = default;
+};
+
+/// A song from any source, played through its repeats, endings and jumps. A value.
+///
+/// All positions and lengths are beats from the beginning of the song: quarter notes in a score,
+/// what the song itself counts in a text. Texts are UTF-8 and as the source has them; empty is what
+/// it does not tell.
+struct CSong {
+    std::string mTitle;
+    /// Who made it: composers, artists, writers of the words, separated by ", ".
+    std::string mMakers;
+    std::string mStyle;
+    /// As played, with the end marker; empty for a song without chords. Where no chord sounds
+    /// stands "No Chord Yield" or an undefined chord.
+    CHarmAnlsChords mChords;
+    /// Of each chord, as written; the end marker has none. A score has no written symbols: these
+    /// are the ones that read back as its chords.
+    std::vector<std::string> mSymbols;
+    /// Empty for a text without bar lines.
+    std::vector<CSongBar> mBars;
+    std::vector<CSongSection> mSections;
+    /// The first key of the song, if it tells root and type.
+    std::optional<CSignKeyLite> mStatedKey;
+    /// All stated keys where they begin to hold; their types may be undefined.
+    CHarmAnlsSignKeys mStatedKeys;
+    /// Quarter notes a minute.
+    std::optional<double> mTempo;
+    /// Length of a bar by the first time signature, else that of the preferences or of most bars.
+    double mBeatsPerBar = 4.0;
+    /// Frets of a capo, and semitones by which the song asks to be transposed. Both are only told:
+    /// the chords are those that are written.
+    int mCapo = 0;
+    int mTranspose = 0;
+    std::vector<CSongRepeat> mRepeats;
+    std::vector<CSongRemark> mRemarks;
+    /// What it was read as; never TSongFormat_Auto.
+    TSongFormat mFormat = TSongFormat_ChordText;
+    /// By their places; empty if all is understood.
+    std::vector<CSongFault> mFaults;
+
+    /// Whether there is a fault that is no note.
+    [[nodiscard]] bool HasFault() const;
+};
+
+}  // namespace brindle

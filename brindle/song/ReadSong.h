@@ -1,0 +1,48 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/chords/ReadChordText.h"
+#include "brindle/song/CSong.h"
+
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace brindle {
+
+/// How a song is read.
+struct CSongPrefs {
+    TSongFormat mFormat = TSongFormat_Auto;
+    /// Length of a bar, and how far a chord or a hold moves on, in a text that does not tell. Beats
+    /// above 0.
+    double mBeatsPerBar = 4.0;
+    double mBeatsPerChord = 1.0;
+    /// The chords of a bar that has no holds share it evenly, in texts of any form; a text without
+    /// bar lines has no bars. Charts are always read so.
+    bool mEven = false;
+    /// What is not understood becomes a "No Chord Yield", and all faults are told.
+    bool mLenient = false;
+    /// `mBIsBFlat` is set by any H in the song.
+    CChordTextPrefs mChordTextPrefs{};
+};
+
+/// Reads a song in any form.
+///
+/// Nothing is printed or thrown for bad music or bad bytes: faults are in the song. Of a source
+/// with many songs this is the first. At most 64 times the written bars and 100,000 bars are
+/// played; a song that goes on is at fault. Time is n log n in what is read and played.
+[[nodiscard]] CSong ReadSong(std::string_view bytes, const CSongPrefs& prefs = {});
+
+/// All songs of a source: those of a link or of a page; of any other form there is one.
+[[nodiscard]] std::vector<CSong> ReadSongs(std::string_view bytes, const CSongPrefs& prefs = {});
+
+/// The same for a file; that it is missing, unreadable or larger than 256 MiB is a fault. A song
+/// without a title has none: the name of the file is not one.
+[[nodiscard]] CSong ReadSongFile(const std::string& path, const CSongPrefs& prefs = {});
+[[nodiscard]] std::vector<CSong> ReadSongsFile(const std::string& path,
+                                               const CSongPrefs& prefs = {});
+
+/// What a source looks like: any form but TSongFormat_Auto and TSongFormat_EvenText.
+[[nodiscard]] TSongFormat SongFormatOf(std::string_view bytes);
+
+}  // namespace brindle

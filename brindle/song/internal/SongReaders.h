@@ -1,0 +1,27 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/song/ReadSong.h"
+
+#include <string_view>
+#include <vector>
+
+/// The readers of single forms. Each gives a song with its format and its faults, by their places.
+namespace brindle::SongReaders {
+
+/// Chord text, plain or even, chords above lyrics, ChordPro, and packed charts.
+[[nodiscard]] CSong ReadSheet(std::string_view text, TSongFormat format, const CSongPrefs& prefs);
+
+/// Links, or a page with links; each link has one or more charts.
+[[nodiscard]] std::vector<CSong> ReadChartLinks(std::string_view text, TSongFormat format,
+                                                const CSongPrefs& prefs);
+
+[[nodiscard]] CSong ReadChordStrings(std::string_view text, const CSongPrefs& prefs);
+
+/// A score, plain or in a container.
+[[nodiscard]] CSong ReadScoreSong(std::string_view bytes, TSongFormat format);
+
+/// Leaves of a song with a fault its texts and the faults, unless the reading is lenient.
+void GiveUpWhatIsAtFault(CSong& song, bool isLenient);
+
+}  // namespace brindle::SongReaders
