@@ -12,8 +12,6 @@ namespace {
 
 enum TLetter { C, D, E, F, G, A, B };
 
-constexpr std::array<int, 7> kKeyNrs{0, 2, 4, 5, 7, 9, 11};
-
 struct TSyllableRow {
     std::string_view mSyllable;
     TLetter mLetter;
@@ -117,10 +115,6 @@ std::optional<TLetter> TakeSyllable(CTextScan& scan) {
 }
 
 }  // namespace
-
-int KeyNrOfLetter(int letter) {
-    return kKeyNrs[static_cast<std::size_t>(letter)];
-}
 
 CKeyEnh TWrittenNote::KeyEnh() const {
     return {FoldIntoOctave(KeyNrOfLetter(mLetter) + mAccidental), SemitoneToEnh(mAccidental)};

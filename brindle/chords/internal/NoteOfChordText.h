@@ -3,6 +3,7 @@
 
 #include "brindle/chords/ReadChordText.h"
 #include "brindle/chords/internal/CTextScan.h"
+#include "brindle/chords/internal/KeySpelling.h"
 
 #include <optional>
 
@@ -20,9 +21,6 @@ struct TWrittenNote {
     /// Accidentals beyond -3 to 3 have no spelling.
     [[nodiscard]] CKeyEnh KeyEnh() const;
 };
-
-/// Key number of a letter, 0 (C) to 6 (B).
-[[nodiscard]] int KeyNrOfLetter(int letter);
 
 /// Reads a note name with its accidental and moves behind it: `Eb`, `fis`, `C sharp`, `As`.
 [[nodiscard]] std::optional<TWrittenNote> TakeNote(CTextScan& scan, const CChordTextPrefs& prefs);

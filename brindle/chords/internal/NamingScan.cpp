@@ -1,0 +1,219 @@
+// SPDX-License-Identifier: MIT
+// How notes are named. Over each of the twelve roots they are held against 95 chord types; a type
+// fits if it has all their tones and lacks none that it cannot do without. Its cost says how rare
+// it is over that bass, what is left out, and how rare such a chord is in the key and beside its
+// neighbours. What fits no type is spelled out. If the bass is foreign to the chord, the notes
+// above it are named as well. Costs are tenths of -log2 of a share, so that they may be added.
+#include "brindle/chords/internal/NamingScan.h"
+#include "brindle/chords/internal/SpelledOutChord.h"
+
+#include <algorithm>
+#include <bit>
+
+namespace brindle {
+namespace {
+
+constexpr int kBassAtMost = 100;
+constexpr int kForeignBass = 17;
+constexpr int kNoExtension = 5;
+constexpr int kNoFifth = 27;
+constexpr int kNoThird = 75;
+constexpr int kNoRoot = 60;
+constexpr int kSpelledOut = 100;
+constexpr int kOption = 20;
+constexpr int kSpelledOutOverBass = 20;
+constexpr int kImpossible = 1'000'000;
+constexpr TToneMask kRoot = 0x001;
+constexpr TToneMask kFifth = 0x080;
+constexpr TToneMask kOctave = 0xFFF;
+
+constexpr int OfCommonness(int cost) {
+    return cost * 4 / 10;
+}
+
+/// A set of types: bit n of word w is type 64 w + n.
+struct TTypeSet {
+    std::array<std::uint64_t, 2> mWords{};
+
+    constexpr void Insert(std::size_t type) { mWords[type / 64] |= std::uint64_t{1} << type % 64; }
+    friend constexpr TTypeSet operator&(const TTypeSet& a, const TTypeSet& b) {
+        return {{a.mWords[0] & b.mWords[0], a.mWords[1] & b.mWords[1]}};
+    }
+};
+static_assert(kNamingTypes.size() <= 128);
+
+/// The types that fit six tones, for each set of the tones 0 to 5 and of the tones 6 to 11. What is
+/// in the sets of both halves fits them all, so that a search looks at few types.
+constexpr auto kTypesOfHalf = [] {
+    std::array<std::array<TTypeSet, 64>, 2> halves{};
+    for (std::size_t type = 0; type < kNamingTypes.size(); ++type) {
+        const TToneMask mine = kNamingTypes[type].mTones;
+        const TToneMask needed = NeededTones(kNamingTypes[type]);
+        for (unsigned half = 0; half < 2; ++half) {
+            const TToneMask foreign = ~mine >> 6 * half & 63U;
+            const TToneMask neededHere = needed >> 6 * half & 63U;
+            for (TToneMask tones = 0; tones < 64; ++tones) {
+                const bool fits = (tones & foreign) == 0 && (neededHere & ~tones) == 0;
+                if (fits) halves[half][tones].Insert(type);
+            }
+        }
+    }
+    return halves;
+}();
+
+TTypeSet TypesThatFit(TToneMask tones) {
+    return kTypesOfHalf[0][tones & 63U] & kTypesOfHalf[1][tones >> 6];
+}
+
+constexpr TToneMask TonesAbove(int root, TToneMask keys) {
+    return (keys >> root | keys << (12 - root)) & kOctave;
+}
+
+/// What it costs that a type which fits does not sound as a whole.
+int CostOfLeftOut(const TNamingType& type, TToneMask tones) {
+    TToneMask gone = type.mTones & ~tones;
+    if (gone == 0) return 0;
+    const int sounding = std::popcount(tones);
+    if (sounding < 2) return kImpossible;
+    int cost = kNoExtension * std::popcount(gone & type.mOptional);
+    gone &= ~type.mOptional;
+    const bool hasRoot = (gone & kRoot) == 0;
+    if (!hasRoot) cost += sounding < 3 ? kImpossible : kNoRoot;
+    if (HasTone(gone, type.mThird)) cost += hasRoot ? kNoThird : kImpossible;
+    if ((gone & kFifth) != 0) {
+        const bool isTooLittle = sounding == 2 && type.mThird < 0;
+        cost += isTooLittle ? kImpossible : kNoFifth;
+    }
+    return cost;
+}
+
+class CScan {
+public:
+    CScan(const TNoteKeys& keys, const CNamingOptions& options)
+        : mOptions(options), mBass(keys.mBass) {
+        mBest.fill({.mCost = kImpossible});
+        const bool isBassOnly = options.mBass == TBassUse::Only && keys.mAbove != 0;
+        const TToneMask withoutBass = keys.mAll & ~(TToneMask{1} << mBass);
+        const bool isOneSet = isBassOnly || options.mBass == TBassUse::None || withoutBass == 0;
+        mIsBassOpen = isBassOnly || options.mBass == TBassUse::None;
+        Look(isBassOnly ? keys.mAbove : keys.mAll, false);
+        if (!isOneSet) Look(withoutBass, true);
+    }
+
+    [[nodiscard]] const std::array<TNamingCandidate, 12>& Best() const { return mBest; }
+
+private:
+    void Look(TToneMask keys, bool isForeign) {
+        for (int root = 0; root < 12; ++root) LookOver(root, TonesAbove(root, keys), isForeign);
+    }
+
+    void LookOver(int root, TToneMask tones, bool isForeign) {
+        const int rootAboveBass = FoldIntoOctave(root - mBass);
+        TNamingCandidate offer{.mIsInverted = rootAboveBass != 0,
+                               .mRootAboveBass = rootAboveBass,
+                               .mRoot = root,
+                               .mTones = tones};
+        const int foreign = isForeign ? kForeignBass : 0;
+        const TToneMask shunned = isForeign ? TToneMask{1} << offer.BassAboveRoot() : 0;
+        const TTypeSet types = TypesThatFit(tones);
+        for (std::size_t word = 0; word < 2; ++word) {
+            for (std::uint64_t left = types.mWords[word]; left != 0; left &= left - 1) {
+                offer.mType = static_cast<int>(word) * 64 + std::countr_zero(left);
+                if ((offer.TonesOfType() & shunned) == 0) Offer(offer, foreign + CostOfType(offer));
+            }
+        }
+        if ((tones & kRoot) == 0) return;
+        offer.mType = kSpelledOutType;
+        Offer(offer, foreign + CostOfSpelledOut(offer));
+    }
+
+    void Offer(TNamingCandidate offer, int cost) {
+        TNamingCandidate& best = mBest[static_cast<std::size_t>(offer.mRoot)];
+        if (cost > best.mCost) return;
+        offer.mCost = cost + CostOfContext(offer);
+        best = std::min(best, offer);
+    }
+
+    [[nodiscard]] int CostOfType(const TNamingCandidate& offer) const {
+        const auto ix = static_cast<std::size_t>(offer.mType);
+        const TNamingTypeRow& row = kNamingTypeRows[ix];
+        const auto bass = static_cast<std::size_t>(offer.BassAboveRoot());
+        const int rarity = mIsBassOpen
+                               ? row.mCost
+                               : std::min<int>(row.mCostOverBass[bass], row.mCost + kBassAtMost);
+        return CostOfLeftOut(kNamingTypes[ix], offer.mTones) + OfCommonness(rarity);
+    }
+
+    [[nodiscard]] int CostOfSpelledOut(const TNamingCandidate& offer) const {
+        const bool isOverBass = offer.mIsInverted && mOptions.mBass != TBassUse::None;
+        return kSpelledOut + kOption * CSpelledOutChord(offer.mTones).OptionsCount() +
+               (isOverBass ? kSpelledOutOverBass : 0);
+    }
+
+    [[nodiscard]] int CostOfContext(const TNamingCandidate& offer) const {
+        const bool hasNext = mOptions.mNextRoot != kKeyNrUndef;
+        const bool hasPrevious = mOptions.mPreviousRoot != kKeyNrUndef;
+        // One neighbour alone tells little.
+        const int weight = hasNext && hasPrevious ? 8 : 2;
+        const auto motion = [&](int tableCost) { return tableCost * weight / 10; };
+        int cost = CostInKey(offer);
+        if (hasNext) cost += motion(NextRootCost(offer, mOptions.mNextRoot));
+        if (hasPrevious) cost += motion(PreviousRootCost(offer, mOptions.mPreviousRoot));
+        return cost;
+    }
+
+    [[nodiscard]] int CostInKey(const TNamingCandidate& offer) const {
+        if (mOptions.mKey.IsUndef()) return 0;
+        const bool isMinor = mOptions.mKey.mSignKeyType == TSignKeyType_Minor;
+        const int degree = FoldIntoOctave(offer.mRoot - mOptions.mKey.mRootKeyEnh.mKeyNr);
+        const auto& table = isMinor ? kMinorKeyCosts : kMajorKeyCosts;
+        return table[offer.Family()][static_cast<std::size_t>(degree)] * 4 / 10;
+    }
+
+    const CNamingOptions& mOptions;
+    int mBass;
+    bool mIsBassOpen = false;
+    std::array<TNamingCandidate, 12> mBest;
+};
+
+}  // namespace
+
+TNoteKeys NoteKeysOf(std::span<const CNote> notes) {
+    TNoteKeys keys;
+    std::int64_t lowest = -1;
+    for (const CNote& note : notes) {
+        if (note.IsUndef()) continue;
+        const TToneMask key = TToneMask{1} << note.KeyNr();
+        keys.mAll |= key;
+        if (lowest >= 0 && note.mNoteNr == lowest) continue;
+        if (lowest < 0 || note.mNoteNr < lowest) {
+            if (lowest >= 0) keys.mAbove |= TToneMask{1} << keys.mBass;
+            lowest = note.mNoteNr;
+            keys.mBass = note.KeyNr();
+        } else {
+            keys.mAbove |= key;
+        }
+    }
+    return keys;
+}
+
+CNamingCandidates::CNamingCandidates(const TNoteKeys& keys, const CNamingOptions& options) {
+    if (keys.mAll == 0) return;
+    const CScan scan(keys, options);
+    for (const TNamingCandidate& candidate : scan.Best()) {
+        if (candidate.mCost < kImpossible) mCandidates[mCount++] = candidate;
+    }
+    std::sort(mCandidates.begin(), mCandidates.begin() + static_cast<std::ptrdiff_t>(mCount));
+}
+
+int NextRootCost(const TNamingCandidate& chord, int nextRoot) {
+    const int step = FoldIntoOctave(nextRoot - chord.mRoot);
+    return kNextRootCosts[chord.Family()][static_cast<std::size_t>(step)];
+}
+
+int PreviousRootCost(const TNamingCandidate& chord, int previousRoot) {
+    const int step = FoldIntoOctave(chord.mRoot - previousRoot);
+    return kPreviousRootCosts[chord.Family()][static_cast<std::size_t>(step)];
+}
+
+}  // namespace brindle
