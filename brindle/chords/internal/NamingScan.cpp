@@ -69,13 +69,13 @@ constexpr TToneMask TonesAbove(int root, TToneMask keys) {
     return (keys >> root | keys << (12 - root)) & kOctave;
 }
 
-/// What it costs that a type which fits does not sound as a whole.
-int CostOfLeftOut(const TNamingType& type, TToneMask tones) {
+/// What it costs that a type which fits does not sound as a whole. `sounding` tones do.
+int CostOfLeftOut(const TNamingType& type, TToneMask tones, int sounding) {
     TToneMask gone = type.mTones & ~tones;
     if (gone == 0) return 0;
-    const int sounding = std::popcount(tones);
     if (sounding < 2) return kImpossible;
-    int cost = kNoExtension * std::popcount(gone & type.mOptional);
+    int cost = 0;
+    for (TToneMask left = gone & type.mOptional; left != 0; left &= left - 1) cost += kNoExtension;
     gone &= ~type.mOptional;
     const bool hasRoot = (gone & kRoot) == 0;
     if (!hasRoot) cost += sounding < 3 ? kImpossible : kNoRoot;
@@ -90,8 +90,17 @@ int CostOfLeftOut(const TNamingType& type, TToneMask tones) {
 class CScan {
 public:
     CScan(const TNoteKeys& keys, const CNamingOptions& options)
-        : mOptions(options), mBass(keys.mBass) {
-        mBest.fill({.mCost = kImpossible});
+        : mOptions(options),
+          mHasContext(!options.mKey.IsUndef() || options.mPreviousRoot != kKeyNrUndef ||
+                      options.mNextRoot != kKeyNrUndef),
+          mBass(keys.mBass) {
+        for (int root = 0; root < 12; ++root) {
+            const int rootAboveBass = FoldIntoOctave(root - mBass);
+            mBest[static_cast<std::size_t>(root)] = {.mCost = kImpossible,
+                                                     .mIsInverted = rootAboveBass != 0,
+                                                     .mRootAboveBass = rootAboveBass,
+                                                     .mRoot = root};
+        }
         const bool isBassOnly = options.mBass == TBassUse::Only && keys.mAbove != 0;
         const TToneMask withoutBass = keys.mAll & ~(TToneMask{1} << mBass);
         const bool isOneSet = isBassOnly || options.mBass == TBassUse::None || withoutBass == 0;
@@ -104,49 +113,52 @@ public:
 
 private:
     void Look(TToneMask keys, bool isForeign) {
+        mSounding = std::popcount(keys);
         for (int root = 0; root < 12; ++root) LookOver(root, TonesAbove(root, keys), isForeign);
     }
 
     void LookOver(int root, TToneMask tones, bool isForeign) {
-        const int rootAboveBass = FoldIntoOctave(root - mBass);
-        TNamingCandidate offer{.mIsInverted = rootAboveBass != 0,
-                               .mRootAboveBass = rootAboveBass,
-                               .mRoot = root,
-                               .mTones = tones};
+        TNamingCandidate& best = mBest[static_cast<std::size_t>(root)];
+        const int bass = FoldIntoOctave(mBass - root);
         const int foreign = isForeign ? kForeignBass : 0;
-        const TToneMask shunned = isForeign ? TToneMask{1} << offer.BassAboveRoot() : 0;
+        const TToneMask shunned = isForeign ? TToneMask{1} << bass : 0;
         const TTypeSet types = TypesThatFit(tones);
         for (std::size_t word = 0; word < 2; ++word) {
             for (std::uint64_t left = types.mWords[word]; left != 0; left &= left - 1) {
-                offer.mType = static_cast<int>(word) * 64 + std::countr_zero(left);
-                if ((offer.TonesOfType() & shunned) == 0) Offer(offer, foreign + CostOfType(offer));
+                const std::size_t ix = word * 64 + static_cast<std::size_t>(std::countr_zero(left));
+                const TNamingType& type = kNamingTypes[ix];
+                if ((type.mTones & shunned) != 0) continue;
+                const int cost = foreign + Rarity(ix, bass) + CostOfLeftOut(type, tones, mSounding);
+                Offer(best, tones, static_cast<int>(ix), cost);
             }
         }
-        if ((tones & kRoot) == 0) return;
-        offer.mType = kSpelledOutType;
-        Offer(offer, foreign + CostOfSpelledOut(offer));
+        const bool isPossible = (tones & kRoot) != 0 && foreign + kSpelledOut <= best.mCost;
+        if (isPossible)
+            Offer(best, tones, kSpelledOutType, foreign + CostOfSpelledOut(tones, bass));
     }
 
-    void Offer(TNamingCandidate offer, int cost) {
-        TNamingCandidate& best = mBest[static_cast<std::size_t>(offer.mRoot)];
+    /// `cost` is without that of the context.
+    void Offer(TNamingCandidate& best, TToneMask tones, int type, int cost) const {
         if (cost > best.mCost) return;
-        offer.mCost = cost + CostOfContext(offer);
-        best = std::min(best, offer);
+        TNamingCandidate offer = best;
+        offer.mType = type;
+        offer.mTones = tones;
+        offer.mCost = cost + (mHasContext ? CostOfContext(offer) : 0);
+        if (offer.mCost < best.mCost || (offer.mCost == best.mCost && type < best.mType)) {
+            best = offer;
+        }
     }
 
-    [[nodiscard]] int CostOfType(const TNamingCandidate& offer) const {
-        const auto ix = static_cast<std::size_t>(offer.mType);
-        const TNamingTypeRow& row = kNamingTypeRows[ix];
-        const auto bass = static_cast<std::size_t>(offer.BassAboveRoot());
-        const int rarity = mIsBassOpen
-                               ? row.mCost
-                               : std::min<int>(row.mCostOverBass[bass], row.mCost + kBassAtMost);
-        return CostOfLeftOut(kNamingTypes[ix], offer.mTones) + OfCommonness(rarity);
+    [[nodiscard]] int Rarity(std::size_t type, int bass) const {
+        const TNamingTypeRow& row = kNamingTypeRows[type];
+        if (mIsBassOpen) return OfCommonness(row.mCost);
+        return OfCommonness(std::min<int>(row.mCostOverBass[static_cast<std::size_t>(bass)],
+                                          row.mCost + kBassAtMost));
     }
 
-    [[nodiscard]] int CostOfSpelledOut(const TNamingCandidate& offer) const {
-        const bool isOverBass = offer.mIsInverted && mOptions.mBass != TBassUse::None;
-        return kSpelledOut + kOption * CSpelledOutChord(offer.mTones).OptionsCount() +
+    [[nodiscard]] int CostOfSpelledOut(TToneMask tones, int bass) const {
+        const bool isOverBass = bass != 0 && mOptions.mBass != TBassUse::None;
+        return kSpelledOut + kOption * CSpelledOutChord(tones).OptionsCount() +
                (isOverBass ? kSpelledOutOverBass : 0);
     }
 
@@ -171,8 +183,10 @@ private:
     }
 
     const CNamingOptions& mOptions;
+    bool mHasContext;
     int mBass;
     bool mIsBassOpen = false;
+    int mSounding = 0;
     std::array<TNamingCandidate, 12> mBest;
 };
 
