@@ -17,7 +17,7 @@ class CHarmAnlsChords;
 struct CKeyOptions {
     double mBeatsPerBar = 4.0;
     /// What a chord gains in the key of the song. More keeps passages at home.
-    double mHomeBonus = 0.3;
+    double mHomeBonus = 0.4;
     /// What the nearest change of key costs. More makes longer regions.
     double mChangeCost = 4.0;
 };

@@ -3,9 +3,9 @@
 // gives points to the keys that it fits, a change of key costs points, so a key changes where a few
 // chords together outweigh the change (Viterbi's algorithm).
 
-#include "brindle/analysis/internal/KeyScores.h"
+#include "brindle/analysis/internal/LocalKeys.h"
+
 #include "brindle/analysis/internal/KeyTables.h"
-#include "brindle/theory/KeyIntervals.h"
 
 #include <algorithm>
 #include <cmath>
@@ -19,6 +19,11 @@ using TKeysBefore = std::array<std::uint8_t, kKeyCount>;
 
 constexpr double kShortestInBars = 1.0 / 16;
 constexpr double kLongestInBars = 4.0;
+// What the seventh chords on I and IV gain at home in a blues, where they are at rest.
+constexpr double kBluesPoints = 2.7;
+// What a change costs more to the parallel key, or for each fifth between the signatures.
+constexpr double kParallelCost = 1.0;
+constexpr double kFifthCost = 0.5;
 // Beyond this far the signatures are far enough.
 constexpr int kMostFifths = 3;
 
@@ -35,8 +40,8 @@ int FifthsBetween(int a, int b) {
 
 double ChangeCost(int from, int to, double base) {
     if (from == to) return 0.0;
-    if (TonicOfKey(from) == TonicOfKey(to)) return base + kKeyChangeCosts.mParallel;
-    return base + kKeyChangeCosts.mFifth * std::min(FifthsBetween(from, to), kMostFifths);
+    if (TonicOfKey(from) == TonicOfKey(to)) return base + kParallelCost;
+    return base + kFifthCost * std::min(FifthsBetween(from, to), kMostFifths);
 }
 
 /// What the changes cost, [from][to], and the range of that. To stay costs nothing, so the most is
@@ -66,37 +71,37 @@ double Weight(const TKeyChord& chord, double beatsPerBar) {
         std::sqrt(std::clamp(chord.mBeats / beatsPerBar, kShortestInBars, kLongestInBars)));
 }
 
-// How far above the tonic of the key.
-std::size_t DistToTonic(int root, int key) {
-    const int dist = root - TonicOfKey(key);
-    return static_cast<std::size_t>(dist < 0 ? dist + 12 : dist);
+bool IsBluesChord(const TKeyChord& chord, int home) {
+    const int degree = DegreeInKey(chord.mRoot, home);
+    return chord.mClass == TKeyChordClass_Dom && (degree == 0 || degree == 5);
 }
 
-TPointsOfKeys Gains(const TKeyChord& chord, int home, const CKeyOptions& options) {
+TPointsOfKeys Gains(const TKeyChord& chord, TKeyChordKind kind, const TSongTraits& traits,
+                    const CKeyOptions& options) {
     const double weight = Weight(chord, options.mBeatsPerBar);
-    const auto pointsIn = [&](int key) {
-        return kKeyLocalTable[static_cast<std::size_t>(ModeOfKey(key))][chord.mClass]
-                             [DistToTonic(chord.mRoot, key)];
-    };
     TPointsOfKeys gains;
     for (int key = 0; key < kKeyCount; ++key) {
-        gains[static_cast<std::size_t>(key)] = weight * pointsIn(key);
+        gains[static_cast<std::size_t>(key)] =
+            weight * kKeyLocalTable[static_cast<std::size_t>(ModeOfKey(key))][kind]
+                                   [static_cast<std::size_t>(DegreeInKey(chord.mRoot, key))];
     }
-    gains[static_cast<std::size_t>(home)] = weight * (pointsIn(home) + options.mHomeBonus);
+    double& home = gains[static_cast<std::size_t>(traits.mHome)];
+    if (traits.mIsBlues && IsBluesChord(chord, traits.mHome)) {
+        home = std::max(home, weight * kBluesPoints);
+    }
+    home += weight * options.mHomeBonus;
     return gains;
 }
 
-// Takes for each key the better way into it, from the key `from` or from where it comes now; of
-// equal ones the lower key. Free of branches, so that it runs on several keys at once.
+// Takes for each key the better way into it, from the key `from` or from where it comes now, and of
+// equal ones the latter: to stay, or a lower key. Free of branches, so that it runs on several keys
+// at once.
 void ChangeFrom(std::size_t from, double best, const TPointsOfKeys& costs, TPointsOfKeys& points,
                 TPointsOfKeys& before) {
     const auto number = static_cast<double>(from);
     for (std::size_t to = 0; to < kKeyCount; ++to) {
         const double candidate = best - costs[to];
-        const int isHigher = candidate > points[to];
-        const int isEqual = candidate == points[to];
-        const int isLowerKey = number < before[to];
-        const bool isBetter = (isHigher | (isEqual & isLowerKey)) != 0;
+        const bool isBetter = candidate > points[to];
         points[to] = isBetter ? candidate : points[to];
         before[to] = isBetter ? number : before[to];
     }
@@ -124,17 +129,16 @@ TKeysBefore StepOn(TPointsOfKeys& best, const TPointsOfKeys& gains, const TChang
 
 bool IsSecondDegree(const TKeyChord& chord, int key) {
     return (chord.mClass == TKeyChordClass_Min7 || chord.mClass == TKeyChordClass_HDim) &&
-           DistToTonic(chord.mRoot, key) == 2;
+           DegreeInKey(chord.mRoot, key) == 2;
 }
 
 bool IsDominant(const TKeyChord& chord, int key) {
-    return chord.mClass == TKeyChordClass_Dom && FoldIntoOctave(chord.mRoot - TonicOfKey(key)) == 7;
+    return chord.mClass == TKeyChordClass_Dom && DegreeInKey(chord.mRoot, key) == 7;
 }
 
-// A second degree before the dominant of a new key already belongs to that key: Fm7 in
-// C Fm7 Bb7 Eb.
+// A II before the dominant of a new key already belongs to it: Fm7 in C Fm7 Bb7 Eb.
 void MovePivots(std::span<const TKeyChord> chords, std::vector<std::uint8_t>& keys) {
-    for (std::size_t i = 0; i + 1 < keys.size(); ++i) {
+    for (std::size_t i = keys.size() - 1; i-- > 1;) {
         const std::uint8_t next = keys[i + 1];
         if (keys[i] != next && IsDominant(chords[i + 1], next) && IsSecondDegree(chords[i], next)) {
             keys[i] = next;
@@ -144,14 +148,15 @@ void MovePivots(std::span<const TKeyChord> chords, std::vector<std::uint8_t>& ke
 
 }  // namespace
 
-std::vector<std::uint8_t> LocalKeys(std::span<const TKeyChord> chords, int home,
-                                    const CKeyOptions& options) {
+std::vector<std::uint8_t> LocalKeys(std::span<const TKeyChord> chords,
+                                    std::span<const TKeyChordKind> kinds,
+                                    const TSongTraits& traits, const CKeyOptions& options) {
     if (chords.empty()) return {};
     const TChangeCosts costs = ChangeCosts(options.mChangeCost);
-    TPointsOfKeys best = Gains(chords.front(), home, options);
+    TPointsOfKeys best = Gains(chords.front(), kinds.front(), traits, options);
     std::vector<TKeysBefore> before(chords.size());
     for (std::size_t i = 1; i < chords.size(); ++i) {
-        before[i] = StepOn(best, Gains(chords[i], home, options), costs);
+        before[i] = StepOn(best, Gains(chords[i], kinds[i], traits, options), costs);
     }
     std::vector<std::uint8_t> keys(chords.size());
     const auto end = std::max_element(best.begin(), best.end());

@@ -23,13 +23,15 @@ TKeyChord KeyChordOf(const CHarmAnlsChords& chords, std::size_t ix) {
     return {KeyChordClassOf(chord.mSemitones),
             FoldIntoOctave(chord.mRootKeyEnh.mKeyNr),
             FoldIntoOctave(bass.mKeyNr),
+            chord.HasBassNote(),
             chord.mSemitones,
             BeatsOf(chords, ix),
             ix};
 }
 
 bool IsSameChord(const TKeyChord& a, const TKeyChord& b) {
-    return a.mRoot == b.mRoot && a.mBass == b.mBass && a.mSemitones == b.mSemitones;
+    return a.mRoot == b.mRoot && a.mBass == b.mBass && a.mHasBass == b.mHasBass &&
+           a.mSemitones == b.mSemitones;
 }
 
 }  // namespace

@@ -44,9 +44,12 @@ struct TKeyChord {
     TKeyChordClass mClass;
     int mRoot;  ///< key number, 0 to 11
     int mBass;  ///< key number, that of the root without a bass
+    bool mHasBass;
     CSemitones mSemitones;
     double mBeats;
     std::size_t mBegin;  ///< its place in the list of chords
+
+    [[nodiscard]] constexpr bool Has(int intvl) const { return mSemitones.HasIntvl(intvl); }
 };
 
 /// Whether the two are one kind of chord on one root.
@@ -55,7 +58,7 @@ struct TKeyChord {
 }
 
 /// The chords of a song. One that is the same as the one before makes that one longer, and so does
-/// an undefined one; undefined chords before the first chord are left out.
+/// an undefined one; undefined chords before the first chord are left out. C and C/C are two chords.
 ///
 /// A length that is negative or no length at all is 0. When no chord has a length, all are equally
 /// long.

@@ -10,23 +10,13 @@ namespace brindle {
 template <std::size_t Rows>
 using TKeyTable = std::array<std::array<std::array<double, 12>, Rows>, 2>;
 
-/// A change of key costs the base, and more for each fifth between the signatures, or for the
-/// parallel key.
-struct TKeyChangeCosts {
-    double mBase;
-    double mFifth;
-    double mParallel;
-};
-
-// The rows of eight are in the order of TKeyChordClass, those of 36 are the three groups of the
-// chord before by the semitones up to the new root.
+// The rows of eight are in the order of TKeyChordClass, those of sixteen in that of TKeyChordKind,
+// those of 36 are the three groups of the chord before by the semitones up to the new root.
 extern const TKeyTable<8> kKeyTimeTable;
 extern const TKeyTable<1> kKeyBassTable;
 extern const TKeyTable<8> kKeyFirstTable;
 extern const TKeyTable<8> kKeyLastTable;
 extern const TKeyTable<36> kKeyStepTable;
-extern const TKeyTable<8> kKeyLocalTable;
-extern const TKeyChangeCosts kKeyChangeCosts;
-extern const double kKeyHomeBonus;
+extern const TKeyTable<16> kKeyLocalTable;
 
 }  // namespace brindle

@@ -1,0 +1,110 @@
+// SPDX-License-Identifier: MIT
+// One reading of a song in four steps: the key of the song, the path of keys through its chords, the
+// tree of which chord prepares which, and, from the last chord to the first, their names. Chords that
+// are written twice are one here, and are told apart again in the end.
+
+#include "brindle/analysis/ReadHarmony.h"
+
+#include "brindle/analysis/CHarmAnlsChords.h"
+#include "brindle/analysis/internal/HarmonyChain.h"
+#include "brindle/analysis/internal/HarmonyRules.h"
+#include "brindle/analysis/internal/SongKeys.h"
+
+#include <array>
+
+namespace brindle {
+namespace {
+
+constexpr int kMinorSeventh = 10;
+constexpr int kLetterCount = 7;
+
+// A to G, 0 is C; -1 for a key that is no letter with its accidental.
+int LetterOfKey(const CKeyEnh& keyEnh) {
+    if (keyEnh.IsUndef() || keyEnh.mEnh == TEnh_Undef) return -1;
+    constexpr std::array<int, 12> letters{0, -1, 1, -1, 2, 3, -1, 4, -1, 5, -1, 6};
+    const int natural = FoldIntoOctave(std::int64_t{keyEnh.mKeyNr} - EnhToSemitone(keyEnh.mEnh));
+    return letters[static_cast<std::size_t>(natural)];
+}
+
+std::vector<TSeventhSpelling> SeventhsOf(const CHarmAnlsChords& chords,
+                                         std::span<const TKeyChord> heard,
+                                         std::span<const TSeventhSpelling> stated) {
+    std::vector<TSeventhSpelling> sevenths(heard.size(), TSeventhSpelling_Undef);
+    for (std::size_t i = 0; i < heard.size(); ++i) {
+        const std::size_t ix = heard[i].mBegin;
+        if (ix < stated.size()) sevenths[i] = stated[ix];
+        if (sevenths[i] != TSeventhSpelling_Undef) continue;
+        sevenths[i] = SeventhSpellingOf(chords[ix].mRootKeyEnh, chords[ix].mBassKeyEnh);
+    }
+    return sevenths;
+}
+
+std::vector<CChordReading> ReadChords(std::span<const TKeyChord> heard, const TSongKeys& keys,
+                                      std::span<const TSeventhSpelling> sevenths) {
+    const std::vector<std::ptrdiff_t> under =
+        HarmonyChain(heard, keys.mKinds, keys.mTraits.mHome);
+    std::vector<CChordReading> readings(heard.size());
+    for (std::size_t i = 0; i < heard.size(); ++i) {
+        readings[i].mUnder = under[i];
+        readings[i].mResolvesTo = under[i];
+    }
+    NameHarmonies({heard, keys.mKeys, sevenths, keys.mTraits, readings});
+    return readings;
+}
+
+// From places among the chords that are heard to those in the list.
+std::vector<CChordReading> Spread(const CHarmAnlsChords& chords, std::span<const TKeyChord> heard,
+                                  const std::vector<CChordReading>& readings) {
+    const auto placeOf = [&](std::ptrdiff_t ix) {
+        return ix < 0 ? ix
+                      : static_cast<std::ptrdiff_t>(heard[static_cast<std::size_t>(ix)].mBegin);
+    };
+    std::vector<CChordReading> spread(chords.size());
+    for (std::size_t i = 0; i < heard.size(); ++i) {
+        const std::size_t end = i + 1 < heard.size() ? heard[i + 1].mBegin : chords.size();
+        for (std::size_t ix = heard[i].mBegin; ix < end; ++ix) {
+            if (chords[ix].IsUndef()) continue;
+            spread[ix] = readings[i];
+            spread[ix].mResolvesTo = placeOf(readings[i].mResolvesTo);
+            spread[ix].mUnder = placeOf(readings[i].mUnder);
+        }
+    }
+    return spread;
+}
+
+}  // namespace
+
+TSeventhSpelling SeventhSpellingOf(const CKeyEnh& root, const CKeyEnh& seventh) {
+    const int rootLetter = LetterOfKey(root);
+    const int letter = LetterOfKey(seventh);
+    if (rootLetter < 0 || letter < 0) return TSeventhSpelling_Undef;
+    const int up = FoldIntoOctave(std::int64_t{seventh.mKeyNr} - root.mKeyNr);
+    if (up != kMinorSeventh) return TSeventhSpelling_Undef;
+    const int letters = (letter - rootLetter + kLetterCount) % kLetterCount;
+    if (letters == 6) return TSeventhSpelling_MinorSeventh;
+    return letters == 5 ? TSeventhSpelling_AugmentedSixth : TSeventhSpelling_Undef;
+}
+
+CSongReading ReadHarmony(const CHarmAnlsChords& chords, const CReadingOptions& options) {
+    CSongReading song;
+    const std::vector<TKeyChord> heard = KeyChordsOf(chords);
+    if (heard.empty()) {
+        song.mChords.resize(chords.size());
+        return song;
+    }
+    const TSongKeys keys = FindSongKeys(heard, options.mKeys, NumberOfKey(options.mStatedKey));
+    const CKeySpeller speller(chords);
+    const int home = keys.mTraits.mHome;
+    song.mKey = options.mStatedKey.IsUndef() ? speller.SignKeyOf(home) : options.mStatedKey;
+    song.mConfidence = ConfidenceOf(keys.mScores, home);
+    song.mRegions = KeyRegionsOf(chords, heard, keys.mKeys, speller);
+    std::vector<CChordReading> readings =
+        ReadChords(heard, keys, SeventhsOf(chords, heard, options.mSevenths));
+    for (std::size_t i = 0; i < heard.size(); ++i) {
+        readings[i].mKey = speller.SignKeyOf(keys.mKeys[i]);
+    }
+    song.mChords = Spread(chords, heard, readings);
+    return song;
+}
+
+}  // namespace brindle

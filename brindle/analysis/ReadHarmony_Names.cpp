@@ -1,0 +1,78 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/analysis/ReadHarmony.h"
+
+namespace brindle {
+
+std::string_view NameOf(THarmFunction function) {
+    switch (function) {
+        case THarmFunction_Undef:
+            return "";
+        case THarmFunction_Tonic:
+            return "tonic";
+        case THarmFunction_Subdominant:
+            return "subdominant";
+        case THarmFunction_Dominant:
+            return "dominant";
+        case THarmFunction_None:
+            return "none";
+    }
+    return "";
+}
+
+std::string_view LetterOf(THarmFunction function) {
+    switch (function) {
+        case THarmFunction_Undef:
+            return "";
+        case THarmFunction_Tonic:
+            return "T";
+        case THarmFunction_Subdominant:
+            return "S";
+        case THarmFunction_Dominant:
+            return "D";
+        case THarmFunction_None:
+            return "-";
+    }
+    return "";
+}
+
+std::string_view NameOf(TChordRelation relation) {
+    switch (relation) {
+        case TChordRelation_Undef:
+            return "";
+        case TChordRelation_None:
+            return "none";
+        case TChordRelation_Tonic:
+            return "tonic";
+        case TChordRelation_Dominant:
+            return "dominant";
+        case TChordRelation_RelatedSecond:
+            return "related second";
+        case TChordRelation_SubstituteDominant:
+            return "substitute dominant";
+        case TChordRelation_LeadingDiminished:
+            return "leading diminished";
+        case TChordRelation_PassingDiminished:
+            return "passing diminished";
+        case TChordRelation_CommonToneDiminished:
+            return "common-tone diminished";
+        case TChordRelation_Backdoor:
+            return "backdoor";
+        case TChordRelation_Plagal:
+            return "plagal";
+        case TChordRelation_Borrowed:
+            return "borrowed";
+        case TChordRelation_ChromaticMediant:
+            return "chromatic mediant";
+        case TChordRelation_Neapolitan:
+            return "Neapolitan";
+        case TChordRelation_AugmentedSixth:
+            return "augmented sixth";
+        case TChordRelation_Blues:
+            return "blues";
+        case TChordRelation_LineCliche:
+            return "line cliche";
+    }
+    return "";
+}
+
+}  // namespace brindle

@@ -1,0 +1,107 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/analysis/internal/SongKeys.h"
+
+#include "brindle/analysis/CHarmAnlsChords.h"
+#include "brindle/analysis/internal/LocalKeys.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace brindle {
+namespace {
+
+// Points beyond this bury everything else.
+constexpr double kMostPoints = 1e6;
+
+double PointsOrDefault(double points, double byDefault) {
+    return std::isfinite(points) ? std::clamp(points, -kMostPoints, kMostPoints) : byDefault;
+}
+
+CKeyOptions Checked(CKeyOptions options) {
+    const CKeyOptions byDefault;
+    const bool isBar = std::isfinite(options.mBeatsPerBar) && options.mBeatsPerBar > 0.0;
+    if (!isBar) options.mBeatsPerBar = byDefault.mBeatsPerBar;
+    options.mHomeBonus = PointsOrDefault(options.mHomeBonus, byDefault.mHomeBonus);
+    options.mChangeCost = PointsOrDefault(options.mChangeCost, byDefault.mChangeCost);
+    return options;
+}
+
+int HomeOf(std::span<const TKeyChord> chords, int bestScored, int statedKey) {
+    if (statedKey >= 0) return statedKey;
+    const int vamp = KeyOfVamp(chords);
+    return vamp >= 0 ? vamp : bestScored;
+}
+
+}  // namespace
+
+TSongKeys FindSongKeys(std::span<const TKeyChord> chords, const CKeyOptions& options,
+                       int statedKey) {
+    TSongKeys found;
+    found.mScores = KeyScores(chords);
+    const auto winner = std::max_element(found.mScores.begin(), found.mScores.end());
+    found.mBestScored = static_cast<int>(winner - found.mScores.begin());
+    found.mTraits = SongTraitsOf(chords, HomeOf(chords, found.mBestScored, statedKey));
+    found.mKinds = KeyChordKindsOf(chords);
+    const int home = found.mTraits.mHome;
+    if (found.mTraits.mIsVamp) {
+        found.mKeys.assign(chords.size(), static_cast<std::uint8_t>(home));
+        return found;
+    }
+    found.mKeys = LocalKeys(chords, found.mKinds, found.mTraits, Checked(options));
+    TidyLocalKeys(chords, home, found.mKeys);
+    return found;
+}
+
+// The softmax probability.
+double ConfidenceOf(const std::array<double, kKeyCount>& scores, int key) {
+    const double most = *std::max_element(scores.begin(), scores.end());
+    double sum = 0.0;
+    for (const double score : scores) sum += std::exp(score - most);
+    return std::exp(scores[static_cast<std::size_t>(key)] - most) / sum;
+}
+
+CKeySpeller::CKeySpeller(const CHarmAnlsChords& chords) {
+    std::array<TEnh, 12> enhs;
+    enhs.fill(TEnh_Undef);
+    for (const CHarmAnlsChord& chord : chords) {
+        if (chord.IsUndef()) continue;
+        TEnh& enh = enhs[static_cast<std::size_t>(FoldIntoOctave(chord.mRootKeyEnh.mKeyNr))];
+        if (enh == TEnh_Undef) enh = chord.mRootKeyEnh.mEnh;
+    }
+    for (int key = 0; key < kKeyCount; ++key) {
+        const int tonic = TonicOfKey(key);
+        CSignKeyLite& signKey = mSignKeys[static_cast<std::size_t>(key)];
+        signKey = CSignKeyLite({tonic, enhs[static_cast<std::size_t>(tonic)]},
+                               IsMinorKey(key) ? TSignKeyType_Minor : TSignKeyType_Major);
+        signKey.SetRootNoteEnhWithLeastSigns();
+    }
+}
+
+std::vector<CKeyRegion> KeyRegionsOf(const CHarmAnlsChords& chords,
+                                     std::span<const TKeyChord> heard,
+                                     std::span<const std::uint8_t> keys,
+                                     const CKeySpeller& speller) {
+    std::vector<CKeyRegion> regions;
+    if (heard.empty()) return regions;
+    for (std::size_t i = 0; i < heard.size(); ++i) {
+        if (i > 0 && keys[i] == keys[i - 1]) continue;
+        const std::size_t begin = heard[i].mBegin;
+        const double position = chords[begin].mPosition;
+        if (!regions.empty()) {
+            regions.back().mEnd = begin;
+            regions.back().mEndPosition = position;
+        }
+        regions.push_back({.mKey = speller.SignKeyOf(keys[i]),
+                           .mBegin = begin,
+                           .mEnd = chords.size(),
+                           .mPosition = position,
+                           .mEndPosition = chords.LastChordEndPos()});
+    }
+    if (chords.back().IsUndef()) {
+        regions.back().mEnd = chords.size() - 1;
+        regions.back().mEndPosition = chords.back().mPosition;
+    }
+    return regions;
+}
+
+}  // namespace brindle

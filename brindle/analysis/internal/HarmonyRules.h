@@ -1,0 +1,56 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/analysis/internal/ChordInSong.h"
+
+#include <string_view>
+
+namespace brindle {
+
+/// The name that a rule gives to a chord.
+struct TChordName {
+    CChordReading& mReading;
+    /// The rule tells the chord that it leads to.
+    bool mIsLed = false;
+
+    void Be(TChordRelation relation, THarmFunction function) {
+        mReading.mRelation = relation;
+        mReading.mFunction = function;
+    }
+    /// No chord changes nothing.
+    void LeadTo(std::ptrdiff_t ix) {
+        if (ix < 0) return;
+        mReading.mResolvesTo = ix;
+        mIsLed = true;
+    }
+    /// Its degree becomes that which `other` serves.
+    void ServeAs(const CChordReading& other) {
+        mReading.mServes = other.mServes;
+        mReading.mServedDegree = other.mServedDegree;
+    }
+};
+
+/// Writes the numeral of the chord's own degree, serving the tonic.
+void WriteOwnNumeral(const CChordInSong& chord, CChordReading& reading);
+/// Writes a prefix and the sign of the chord, and behind a slash what it serves.
+void WriteServingNumeral(const CChordInSong& chord, std::string_view prefix,
+                         CChordReading& reading);
+/// Makes the chord one that is applied to the degree `target`, such as V7/ii, and leads it to the
+/// chord `goal` on it, if there is one.
+void Apply(const CChordInSong& chord, std::string_view prefix, int target, std::ptrdiff_t goal,
+           TChordName& name);
+
+// The rules in the order in which they are tried. Each names the chord if it applies; the name
+// begins as the chord's own degree with the function of that.
+[[nodiscard]] bool NameChordAtRest(const CChordInSong& chord, TChordName& name);
+[[nodiscard]] bool NamePredominant(const CChordInSong& chord, TChordName& name);
+[[nodiscard]] bool NameDominant(const CChordInSong& chord, TChordName& name);
+[[nodiscard]] bool NameDiminished(const CChordInSong& chord, TChordName& name);
+[[nodiscard]] bool NameRelatedSecond(const CChordInSong& chord, TChordName& name);
+/// Names what no other rule does.
+void NameChordOfKey(const CChordInSong& chord, TChordName& name);
+
+/// Names all chords of a song. In the end `mResolvesTo` is the chord that each resolves to.
+void NameHarmonies(const TSongToName& song);
+
+}  // namespace brindle

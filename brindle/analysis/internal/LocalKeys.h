@@ -1,0 +1,24 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/analysis/CKeyOfSong.h"
+#include "brindle/analysis/internal/KeyChordKinds.h"
+#include "brindle/analysis/internal/SongTraits.h"
+
+#include <cstdint>
+#include <span>
+#include <vector>
+
+namespace brindle {
+
+/// The key of each chord, on the best path through the keys.
+[[nodiscard]] std::vector<std::uint8_t> LocalKeys(std::span<const TKeyChord> chords,
+                                                  std::span<const TKeyChordKind> kinds,
+                                                  const TSongTraits& traits,
+                                                  const CKeyOptions& options);
+
+/// Gives short passages and the ends of passages to the key around them, where their chords are at
+/// home there: a tonicization of the second degree, a borrowed chord behind a cadence.
+void TidyLocalKeys(std::span<const TKeyChord> chords, int home, std::vector<std::uint8_t>& keys);
+
+}  // namespace brindle

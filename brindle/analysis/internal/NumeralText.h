@@ -1,0 +1,24 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/analysis/internal/KeyChords.h"
+
+#include <string>
+#include <string_view>
+
+namespace brindle {
+
+/// Whether a class is written in small letters: the minor and diminished chords.
+[[nodiscard]] constexpr bool IsSmallNumeral(TKeyChordClass chordClass) {
+    return chordClass == TKeyChordClass_Min || chordClass == TKeyChordClass_Min7 ||
+           chordClass == TKeyChordClass_HDim || chordClass == TKeyChordClass_Dim;
+}
+
+/// What stands behind the degree of a chord as far as its class goes: 7, ^7, h7, o7. One of
+/// kNumeralSigns.
+[[nodiscard]] std::string_view NumeralSignOf(CSemitones semitones);
+
+/// Appends the degree so many semitones above the tonic of a key by its number: "bVI", "ii".
+void AppendDegree(std::string& text, int degree, bool isSmall, int key);
+
+}  // namespace brindle

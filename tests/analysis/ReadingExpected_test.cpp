@@ -1,0 +1,59 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/analysis/CHarmAnlsChords.h"
+#include "brindle/analysis/ReadHarmony.h"
+#include "brindle/theory/KeyIntervals.h"
+
+#include <doctest/doctest.h>
+#include <nlohmann/json.hpp>
+
+#include <fstream>
+#include <string>
+
+namespace brindle::test {
+namespace {
+
+// [root, mask, bass or -1, length in bars] a chord.
+CHarmAnlsChords ChordsOf(const nlohmann::json& rows) {
+    CHarmAnlsChords chords;
+    double position = 0.0;
+    for (const nlohmann::json& row : rows) {
+        CChordLite chord{{row[0].get<int>(), TEnh_Undef}, CKeyEnh_Undef,
+                         CSemitones(row[1].get<std::uint64_t>())};
+        if (row[2] != -1) chord.mBassKeyEnh = {row[2].get<int>(), TEnh_Undef};
+        chords.emplace_back(chord, position);
+        position += 4.0 * row[3].get<double>();
+    }
+    chords.emplace_back(CChordLite_Undef, position);
+    return chords;
+}
+
+int NumberOf(const CSignKeyLite& key) {
+    return FoldIntoOctave(key.mRootKeyEnh.mKeyNr) +
+           (key.mSignKeyType == TSignKeyType_Minor ? 12 : 0);
+}
+
+// [key, numeral, function, relation, served degree, resolves to, under, deceptive] a chord.
+nlohmann::json RowsOf(const CSongReading& reading) {
+    nlohmann::json rows = nlohmann::json::array();
+    for (const CChordReading& chord : reading.mChords) {
+        if (chord.mKey.IsUndef()) continue;
+        rows.push_back({NumberOf(chord.mKey), chord.mNumeral, LetterOf(chord.mFunction),
+                        NameOf(chord.mRelation), chord.mServedDegree, chord.mResolvesTo,
+                        chord.mUnder, chord.mDeceptive});
+    }
+    return rows;
+}
+
+TEST_CASE("Chords at random are read as another program of the same method reads them") {
+    std::ifstream file(BRINDLE_TEST_DATA "/reading/expected.jsonl");
+    std::size_t songs = 0;
+    for (std::string line; std::getline(file, line); ++songs) {
+        const nlohmann::json song = nlohmann::json::parse(line);
+        CAPTURE(song["chords"].dump());
+        CHECK(RowsOf(ReadHarmony(ChordsOf(song["chords"]))) == song["reading"]);
+    }
+    CHECK(songs == 3000);
+}
+
+}  // namespace
+}  // namespace brindle::test
