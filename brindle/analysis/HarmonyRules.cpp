@@ -39,8 +39,7 @@ bool IsSmallTarget(const CChordInSong& chord, int target, std::ptrdiff_t goal) {
     const bool isThere = goal >= 0 && chord.DegreeOf(goal) == target;
     if (isThere) {
         const TKeyChordClass goalClass = chord.ChordAt(goal).mClass;
-        const bool hasOwnKind =
-            goalClass != TKeyChordClass_Dom && goalClass != TKeyChordClass_Open;
+        const bool hasOwnKind = goalClass != TKeyChordClass_Dom && goalClass != TKeyChordClass_Open;
         if (hasOwnKind) return IsSmallNumeral(goalClass);
     }
     return IsSmallDegree(target, chord.Key());

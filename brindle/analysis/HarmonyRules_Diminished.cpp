@@ -27,8 +27,8 @@ bool IsBySteps(const CChordInSong& chord) {
 void BePassing(const CChordInSong& chord, TChordRelation relation, TChordName& name) {
     name.Be(relation, THarmFunction_None);
     name.LeadTo(chord.Next());
-    const bool isRaised = chord.IsInMajor() && BassStep(chord) == 1 &&
-                          CSemitones{1, 3, 8}.HasIntvl(chord.Degree());
+    const bool isRaised =
+        chord.IsInMajor() && BassStep(chord) == 1 && CSemitones{1, 3, 8}.HasIntvl(chord.Degree());
     if (!isRaised) return;
     std::string& numeral = name.mReading.mNumeral;
     numeral = '#';
@@ -42,8 +42,8 @@ bool BeLeading(const CChordInSong& chord, int target, std::ptrdiff_t goal, TChor
     return true;
 }
 
-// The tones of a diminished seventh chord lie three semitones apart, so each can be its root: before
-// Dm Bbo7 is C#o7.
+// The tones of a diminished seventh chord lie three semitones apart, so each can be its root:
+// before Dm Bbo7 is C#o7.
 bool NameInverted(const CChordInSong& chord, TChordName& name) {
     if (!chord.HasNext()) return false;
     const int target = chord.NextEffectiveDegree();

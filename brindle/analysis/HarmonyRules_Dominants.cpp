@@ -67,8 +67,8 @@ std::ptrdiff_t SameDominantLater(const CChordInSong& chord) {
 
 bool NameFirstGo(const CChordInSong& chord, TChordName& name) {
     if (!chord.HasNext() || !IsStrong(chord)) return false;
-    const bool isDirect = chord.Goal(kFourthUp) == chord.Next() ||
-                          chord.Goal(kSemitoneDown) == chord.Next();
+    const bool isDirect =
+        chord.Goal(kFourthUp) == chord.Next() || chord.Goal(kSemitoneDown) == chord.Next();
     if (isDirect) return false;
     const std::ptrdiff_t later = SameDominantLater(chord);
     if (later < 0 || chord.KeyAt(later) != chord.Key()) return false;
@@ -116,8 +116,7 @@ bool NameTritoneSubstitute(const CChordInSong& chord, TChordName& name) {
 
 // A7 in C major even if no D follows.
 bool NameUnresolvedDominant(const CChordInSong& chord, TChordName& name) {
-    const CSemitones degrees =
-        chord.IsInMajor() ? CSemitones{0, 2, 4, 9, 11} : CSemitones{0, 2, 3};
+    const CSemitones degrees = chord.IsInMajor() ? CSemitones{0, 2, 4, 9, 11} : CSemitones{0, 2, 3};
     if (!IsDom(chord) || chord.IsDiatonic() || !degrees.HasIntvl(chord.Degree())) return false;
     name.mReading.mRelation = TChordRelation_Dominant;
     Apply(chord, "V", chord.Degree() + kFourthUp, kNoChord, name);
@@ -134,11 +133,10 @@ bool NameChordAtRest(const CChordInSong& chord, TChordName& name) {
     const bool isOfBlues = song.mIsBlues && chord.IsAtHome() && !chord.IsPrepared();
     const bool mayRest = degree == 5 || song.mIsJazz;
     if (!isOfBlues && !(mayRest && !Resolves(chord))) return false;
-    name.Be(TChordRelation_Blues,
-            degree == 0 ? THarmFunction_Tonic : THarmFunction_Subdominant);
-    const bool goesOn = chord.HasNext() && (chord.DegreeBehind() == 0 ||
-                                            chord.ChordAt(chord.Next()).mClass ==
-                                                TKeyChordClass_Dim);
+    name.Be(TChordRelation_Blues, degree == 0 ? THarmFunction_Tonic : THarmFunction_Subdominant);
+    const bool goesOn =
+        chord.HasNext() &&
+        (chord.DegreeBehind() == 0 || chord.ChordAt(chord.Next()).mClass == TKeyChordClass_Dim);
     if (degree == 5 && goesOn) name.LeadTo(chord.Next());
     return true;
 }

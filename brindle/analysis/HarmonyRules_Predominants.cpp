@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// What leads to a dominant: augmented sixths, the Neapolitan chord, and the second that belongs to a
-// dominant.
+// What leads to a dominant: augmented sixths, the Neapolitan chord, and the second that belongs to
+// a dominant.
 
 #include "brindle/analysis/internal/HarmonyRules.h"
 
@@ -70,8 +70,8 @@ bool IsMinorOrHalfDiminished(const CChordInSong& chord) {
 
 // ii of the dominant's target; in its own key's numeral where it is at home there, or where the
 // dominant is a substitute.
-bool NameSecondOfDominant(const CChordInSong& chord, const CChordReading& dominant, bool isSubstitute,
-                          TChordName& name) {
+bool NameSecondOfDominant(const CChordInSong& chord, const CChordReading& dominant,
+                          bool isSubstitute, TChordName& name) {
     const TKeyChordClass next = chord.ChordAt(chord.Next()).mClass;
     const bool isHeldBack = next == TKeyChordClass_Triad && !chord.Is(TKeyChordClass_Min);
     if (next != TKeyChordClass_Dom && next != TKeyChordClass_Open && !isHeldBack) return false;

@@ -26,8 +26,8 @@ TKeyChordKind KindBefore(const TKeyChord& chord, const TKeyChord& next) {
 }
 
 TKeyChordKind KindBehind(const TKeyChord& before, const TKeyChord& chord) {
-    const bool isResolved = before.mClass == TKeyChordClass_Dom &&
-                            FoldIntoOctave(chord.mRoot - before.mRoot) == 5;
+    const bool isResolved =
+        before.mClass == TKeyChordClass_Dom && FoldIntoOctave(chord.mRoot - before.mRoot) == 5;
     if (isResolved && chord.mClass == TKeyChordClass_Triad) return TKeyChordKind_TriadResolved;
     if (isResolved && chord.mClass == TKeyChordClass_Maj7) return TKeyChordKind_Maj7Resolved;
     if (isResolved && chord.mClass == TKeyChordClass_Min) return TKeyChordKind_MinResolved;

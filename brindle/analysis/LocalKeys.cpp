@@ -66,9 +66,9 @@ TChangeCosts ChangeCosts(double base) {
     return costs;
 }
 
+// One root of the fourth and not two square ones: rounded once, it leaves equal sums equal.
 double Weight(const TKeyChord& chord, double beatsPerBar) {
-    return std::sqrt(
-        std::sqrt(std::clamp(chord.mBeats / beatsPerBar, kShortestInBars, kLongestInBars)));
+    return std::pow(std::clamp(chord.mBeats / beatsPerBar, kShortestInBars, kLongestInBars), 0.25);
 }
 
 bool IsBluesChord(const TKeyChord& chord, int home) {
@@ -149,8 +149,8 @@ void MovePivots(std::span<const TKeyChord> chords, std::vector<std::uint8_t>& ke
 }  // namespace
 
 std::vector<std::uint8_t> LocalKeys(std::span<const TKeyChord> chords,
-                                    std::span<const TKeyChordKind> kinds,
-                                    const TSongTraits& traits, const CKeyOptions& options) {
+                                    std::span<const TKeyChordKind> kinds, const TSongTraits& traits,
+                                    const CKeyOptions& options) {
     if (chords.empty()) return {};
     const TChangeCosts costs = ChangeCosts(options.mChangeCost);
     TPointsOfKeys best = Gains(chords.front(), kinds.front(), traits, options);

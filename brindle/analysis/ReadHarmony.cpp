@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
-// One reading of a song in four steps: the key of the song, the path of keys through its chords, the
-// tree of which chord prepares which, and, from the last chord to the first, their names. Chords that
-// are written twice are one here, and are told apart again in the end.
+// One reading of a song in four steps: the key of the song, the path of keys through its chords,
+// the tree of which chord prepares which, and, from the last chord to the first, their names.
+// Chords that are written twice are one here, and are told apart again in the end.
 
 #include "brindle/analysis/ReadHarmony.h"
 
@@ -41,8 +41,7 @@ std::vector<TSeventhSpelling> SeventhsOf(const CHarmAnlsChords& chords,
 
 std::vector<CChordReading> ReadChords(std::span<const TKeyChord> heard, const TSongKeys& keys,
                                       std::span<const TSeventhSpelling> sevenths) {
-    const std::vector<std::ptrdiff_t> under =
-        HarmonyChain(heard, keys.mKinds, keys.mTraits.mHome);
+    const std::vector<std::ptrdiff_t> under = HarmonyChain(heard, keys.mKinds, keys.mTraits.mHome);
     std::vector<CChordReading> readings(heard.size());
     for (std::size_t i = 0; i < heard.size(); ++i) {
         readings[i].mUnder = under[i];

@@ -62,9 +62,9 @@ struct CReadingOptions {
     CKeyOptions mKeys;
     /// The key of the song if it is known; undefined to find it.
     CSignKeyLite mStatedKey;
-    /// One a chord of the list, or fewer. An augmented sixth makes a German or Italian sixth chord of
-    /// a seventh chord whose root falls a semitone, a minor seventh keeps it from being one. A bass
-    /// that is the seventh tells this by its own spelling, if there is none here.
+    /// One a chord of the list, or fewer. An augmented sixth makes a German or Italian sixth chord
+    /// of a seventh chord whose root falls a semitone, a minor seventh keeps it from being one. A
+    /// bass that is the seventh tells this by its own spelling, if there is none here.
     std::span<const TSeventhSpelling> mSevenths;
 };
 
@@ -78,9 +78,9 @@ struct CChordReading {
     std::string mNumeral;
     THarmFunction mFunction = THarmFunction_Undef;
     TChordRelation mRelation = TChordRelation_Undef;
-    /// The degree that it prepares or stands for, in semitones above the tonic: 0 for G7 in C major,
-    /// 2 for A7 before Dm. -1 for no chord. A related second serves what its dominant serves, in the
-    /// key of that.
+    /// The degree that it prepares or stands for, in semitones above the tonic: 0 for G7 in C
+    /// major, 2 for A7 before Dm. -1 for no chord. A related second serves what its dominant
+    /// serves, in the key of that.
     int mServes = -1;
     /// The same as a numeral: "I", "ii". Small letters are minor.
     std::string mServedDegree;
@@ -113,8 +113,8 @@ struct CSongReading {
 /// chord at the end. Linear in the number of chords.
 ///
 /// A chord that is the same as the one before makes that one longer, and so does an undefined one;
-/// the former gets the same reading, the latter an undefined one. Positions that make no sense count
-/// as no length; if no chord has a length, all count a beat.
+/// the former gets the same reading, the latter an undefined one. Positions that make no sense
+/// count as no length; if no chord has a length, all count a beat.
 [[nodiscard]] CSongReading ReadHarmony(const CHarmAnlsChords& chords,
                                        const CReadingOptions& options = {});
 

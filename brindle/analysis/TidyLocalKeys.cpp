@@ -76,10 +76,10 @@ void JoinTonicizations(std::span<const TKeyChord> chords, std::vector<std::uint8
 
 // A chord that fits home and not the key that it was put into.
 bool IsForeign(const TKeyChord& chord, int key, int home) {
-    const bool hasMode =
-        chord.mClass == TKeyChordClass_Triad || chord.mClass == TKeyChordClass_Maj7 ||
-        chord.mClass == TKeyChordClass_Min || chord.mClass == TKeyChordClass_Min7 ||
-        chord.mClass == TKeyChordClass_HDim;
+    const bool hasMode = chord.mClass == TKeyChordClass_Triad ||
+                         chord.mClass == TKeyChordClass_Maj7 ||
+                         chord.mClass == TKeyChordClass_Min ||
+                         chord.mClass == TKeyChordClass_Min7 || chord.mClass == TKeyChordClass_HDim;
     return hasMode && !IsInScale(chord, DegreeInKey(chord.mRoot, key), ScaleOfKey(key)) &&
            IsInScale(chord, DegreeInKey(chord.mRoot, home), ScaleOfKey(home));
 }

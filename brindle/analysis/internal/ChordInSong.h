@@ -19,8 +19,8 @@ struct TSongToName {
     std::span<const std::uint8_t> mKeys;
     std::span<const TSeventhSpelling> mSevenths;
     TSongTraits mTraits;
-    /// Those of the later chords are done. `mResolvesTo` is the chord that the rules lead one to, and
-    /// first the one that it stands under.
+    /// Those of the later chords are done. `mResolvesTo` is the chord that the rules lead one to,
+    /// and first the one that it stands under.
     std::span<CChordReading> mReadings;
 };
 

@@ -58,7 +58,8 @@ struct TKeyChord {
 }
 
 /// The chords of a song. One that is the same as the one before makes that one longer, and so does
-/// an undefined one; undefined chords before the first chord are left out. C and C/C are two chords.
+/// an undefined one; undefined chords before the first chord are left out. C and C/C are two
+/// chords.
 ///
 /// A length that is negative or no length at all is 0. When no chord has a length, all are equally
 /// long.

@@ -35,7 +35,8 @@ inline constexpr int kKeyCount = 24;
 
 /// The scale that the chords of a key are made of; minor with the lowered and the raised seventh.
 [[nodiscard]] constexpr CSemitones ScaleOfKey(int key) {
-    return IsMinorKey(key) ? CSemitones{0, 2, 3, 5, 7, 8, 10, 11} : CSemitones{0, 2, 4, 5, 7, 9, 11};
+    return IsMinorKey(key) ? CSemitones{0, 2, 3, 5, 7, 8, 10, 11}
+                           : CSemitones{0, 2, 4, 5, 7, 9, 11};
 }
 /// The scale that a key borrows from: the one with the same tonic in the other mode.
 [[nodiscard]] constexpr CSemitones ParallelScaleOfKey(int key) {

@@ -24,7 +24,8 @@ struct TSongKeys {
     std::vector<std::uint8_t> mKeys;
 };
 
-/// `chords` has at least one chord. `statedKey` is the number of the key of the song, -1 to find it.
+/// `chords` has at least one chord. `statedKey` is the number of the key of the song, -1 to find
+/// it.
 [[nodiscard]] TSongKeys FindSongKeys(std::span<const TKeyChord> chords, const CKeyOptions& options,
                                      int statedKey = -1);
 
