@@ -1,6 +1,6 @@
 #!/usr/bin/env python3
 # SPDX-License-Identifier: MIT
-"""Writes brindle/analysis/internal/KeyTables.cpp and ChainTables.cpp from data/reading-model.json.
+"""Writes KeyTables.cpp and ChainTables.cpp, in brindle/analysis/internal, from data/reading-model.json.
 
 With --check it writes nothing and fails if a source is not as it would be written.
 """
@@ -107,7 +107,7 @@ def sources(model):
 def main():
     model = json.loads((ROOT / "data" / "reading-model.json").read_text(encoding="utf-8"))
     for name, text in sources(model).items():
-        path = ROOT / "brindle" / "analysis" / name
+        path = ROOT / "brindle" / "analysis" / "internal" / name
         if "--check" not in sys.argv:
             path.write_text(text, encoding="utf-8")
         elif path.read_text(encoding="utf-8") != text:
