@@ -1,16 +1,12 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/musicxml/XMLParserDelegate_RecursiveMuxml_Measure.h"
 
-#include "brindle/musicxml/MuxmlLimits.h"
 #include "brindle/musicxml/XMLParserDelegate_RecursiveMuxml_Note.h"
 #include "brindle/musicxml/XMLParserDelegate_RecursiveMuxml_Sound.h"
 #include "brindle/musicxml/internal/CScoreIndex.h"
 #include "brindle/musicxml/internal/ReadMuxml.h"
 
 #include <algorithm>
-#include <array>
-#include <cmath>
-#include <utility>
 
 namespace brindle {
 
@@ -18,102 +14,7 @@ namespace {
 
 using TMeasure = XMLParserDelegate_RecursiveMuxml_Measure;
 
-std::int32_t IntegerOrZeroIfBelowOne(std::string_view text) {
-    return std::max(0, ReadInteger(text));
-}
-
-// The code that a host sees in the alert about divisions.
-constexpr int kBadDivisions = 1;
-
 }  // namespace
-
-// Element, the element around it, what is done with its text. Inside `attributes` only. The first
-// row that fits counts; a row without a name fits all elements. Each is done with the empty text at
-// the start of the element, and once more if there is a text.
-struct XMLParserDelegate_RecursiveMuxml_Measure::TAttributesRow {
-    std::string_view mElement;
-    std::string_view mInside;
-    void (*mRead)(TMeasure& measure, XmlStreamParser& parser, std::string_view text);
-};
-
-const TMeasure::TAttributesRow* TMeasure::FindAttributesRow(const TMeasure& self) {
-    using Parser = XmlStreamParser&;
-    using Text = std::string_view;
-    // clang-format off
-    static constexpr auto kRows = std::to_array<TAttributesRow>({
-        {"divisions", "", [](TMeasure& m, Parser p, Text text) { m.FoundDivisions(p, text); }},
-
-        {"key", "", [](TMeasure& m, Parser, Text) {
-            m.EncounteredSignKey = {};
-            m.EncounteredSignKey.ReadFromAttributes(m.currentAttributes);
-        }},
-        {"fifths", "key", [](TMeasure& m, Parser, Text text) {
-            m.EncounteredSignKey.mFifths = ReadInteger(text);
-        }},
-        {"mode", "key", [](TMeasure& m, Parser, Text text) {
-            m.EncounteredSignKey.mMode = MuxmlValueOf(text, TMuxmlEnum_SignKeyMode_Major);
-        }},
-
-        {"time", "", [](TMeasure& m, Parser, Text) {
-            m.EncounteredSignTime = {};
-            m.EncounteredSignTime.ReadFromAttributes(m.currentAttributes);
-        }},
-        {"", "time", [](TMeasure& m, Parser, Text text) {
-            m.EncounteredSignTime.SetElementFromString(m.currentElementName, text);
-        }},
-
-        {"staves", "", [](TMeasure& m, Parser, Text text) {
-            m.EncounteredMeasure.mStaves =
-                static_cast<std::uint64_t>(IntegerOrZeroIfBelowOne(text));
-        }},
-        {"part-symbol", "", [](TMeasure&, Parser, Text) {}},
-        {"instruments", "", [](TMeasure& m, Parser, Text text) {
-            m.EncounteredMeasure.mInstruments =
-                static_cast<std::uint64_t>(IntegerOrZeroIfBelowOne(text));
-        }},
-
-        {"clef", "", [](TMeasure& m, Parser, Text) {
-            m.EncounteredClef = {};
-            m.EncounteredClef.ReadFromAttributes(m.currentAttributes);
-        }},
-        {"sign", "clef", [](TMeasure& m, Parser, Text text) {
-            m.EncounteredClef.mSign = MuxmlValueOf(text, TMuxmlEnum_ClefSign_None);
-        }},
-        {"line", "clef", [](TMeasure& m, Parser, Text text) {
-            m.EncounteredClef.mStaffLine = ReadInteger(text);
-        }},
-        {"clef-octave-change", "clef", [](TMeasure& m, Parser, Text text) {
-            m.EncounteredClef.mClefOctaveChange = ReadInteger(text);
-        }},
-
-        {"transpose", "", [](TMeasure& m, Parser, Text) {
-            m.EncounteredTranspose = {};
-            m.EncounteredTranspose.ReadFromAttributes(m.currentAttributes);
-        }},
-        {"diatonic", "transpose", [](TMeasure& m, Parser, Text text) {
-            m.EncounteredTranspose.mDiatonic = ReadInteger(text);
-        }},
-        {"chromatic", "transpose", [](TMeasure& m, Parser, Text text) {
-            m.EncounteredTranspose.mChromatic = std::round(muxml::ReadFloat(text));
-        }},
-        {"octave-change", "transpose", [](TMeasure& m, Parser, Text text) {
-            m.EncounteredTranspose.mOctaveChange = ReadInteger(text);
-        }},
-        {"double", "transpose", [](TMeasure& m, Parser, Text) {
-            m.EncounteredTranspose.mDouble = true;
-        }},
-
-        {"directive", "", [](TMeasure&, Parser, Text) {}},
-        {"measure-style", "", [](TMeasure&, Parser, Text) {}},
-    });
-    // clang-format on
-    const auto* const row =
-        std::find_if(kRows.begin(), kRows.end(), [&self](const TAttributesRow& entry) {
-            const bool fits = entry.mElement.empty() || entry.mElement == self.currentElementName;
-            return fits && (entry.mInside.empty() || self.IsInside(entry.mInside));
-        });
-    return row == kRows.end() ? nullptr : row;
-}
 
 void TMeasure::didStartMyElement(XmlStreamParser&, std::string_view name,
                                  const XmlAttributes& attributes) {
@@ -147,13 +48,7 @@ void TMeasure::didStartElement(XmlStreamParser& parser, std::string_view name,
     foundCharacters(parser, "");
 }
 
-void TMeasure::didEndElement(XmlStreamParser& parser, std::string_view name) {
-    if (name == MyRecursiveTreeStartsAtElementName) {
-        encounteredMeasureEnd();
-        didEndElement_resetCurrentElementNameAndRemoveFromCurrentElementParentNames(name);
-        setParserDelegateToParentDelegateAndReleaseSelf(name, parser);
-        return;
-    }
+void TMeasure::didEndInnerElement(std::string_view name) {
     if (name == "time") {
         encounteredSignTime();
     } else if (name == "key") {
@@ -167,7 +62,6 @@ void TMeasure::didEndElement(XmlStreamParser& parser, std::string_view name) {
     } else if (name == "backup") {
         Context().InXMLElementBackup = false;
     }
-    didEndElement_resetCurrentElementNameAndRemoveFromCurrentElementParentNames(name);
 }
 
 void TMeasure::foundTrimmedCharacters(XmlStreamParser& parser, std::string_view text) {
@@ -175,31 +69,15 @@ void TMeasure::foundTrimmedCharacters(XmlStreamParser& parser, std::string_view 
     if (!IsInside("measure")) {
         ParentDelegate->foundCharacters(parser, text);
     } else if (IsInside("attributes")) {
-        if (const TAttributesRow* row = FindAttributesRow(*this)) row->mRead(*this, parser, text);
+        FoundInAttributes(parser, text);
     } else if (currentElementName == "duration") {
         FoundDuration(text);
     }
 }
 
-void TMeasure::parseErrorOccurred(XmlStreamParser& parser, const XmlError& error) {
-    ParentDelegate->parseErrorOccurred(parser, error);
-}
-
-void TMeasure::FoundDivisions(XmlStreamParser& parser, std::string_view text) {
-    if (text.empty()) return;
-    if (ReadInteger(text) < 1) {
-        parseErrorOccurred(
-            parser,
-            {kBadDivisions, "MusicXML File contains zero or negative value for “divisions”", 0, 0});
-    }
-    const auto divisions = static_cast<std::uint64_t>(IntegerOrZeroIfBelowOne(text));
-    EncounteredMeasure.mDivisions = divisions;
-    Context().CurrentDivisionsPQN = divisions;
-}
-
 void TMeasure::FoundDuration(std::string_view text) {
     MusicXmlContext& context = Context();
-    const std::int32_t duration = IntegerOrZeroIfBelowOne(text);
+    const std::int32_t duration = std::max(0, ReadInteger(text));
     const std::int32_t ticks = context.ConvertMuxmlDurationToMidiTicks(duration);
     // Kept: the place in the bar grows on a backup, too.
     if (context.InXMLElementBackup) {
@@ -309,62 +187,6 @@ void TMeasure::encounteredMeasureEnd() {
     EncounteredMeasure.mMeasureXML = context.CurrentPartMeasureXML();
     EncounteredMeasure.mBarlineXMLs = mBarlines;
     TellHost<&brindle::MusicXmlParserDelegate::didEncounterMeasureEnd>(EncounteredMeasure);
-}
-
-void TMeasure::encounteredSignTime() {
-    EncounteredSignTime.mPositionAsMidiTicks = Context().CurrentPosAsMidiTicks;
-    Context().CurrentSignTime = EncounteredSignTime;
-    TellHost<&brindle::MusicXmlParserDelegate::didEncounterSignTime>(EncounteredSignTime);
-}
-
-const std::optional<CMuxmlTranspose>& TMeasure::FirstTransposeOfMeasure() {
-    if (std::exchange(mHasLookedForTranspose, true)) return mFirstTranspose;
-    const XmlNode measure = Context().CurrentPartMeasureXML();
-    const auto isInAttributes = [&measure](const XmlNode& node) {
-        XmlNode around = node.parent();
-        while (around && around != measure && around.name() != "attributes") {
-            around = around.parent();
-        }
-        return around && around != measure;
-    };
-    for (XmlNode node = measure.firstChild(); node; node = node.nextBelow(measure)) {
-        if (node.name() == "transpose" && isInAttributes(node)) {
-            mFirstTranspose.emplace().ReadFromXMLElement(node);
-            break;
-        }
-    }
-    return mFirstTranspose;
-}
-
-void TMeasure::encounteredSignKey() {
-    EncounteredSignKey.mPositionAsMidiTicks = Context().CurrentPosAsMidiTicks;
-    // A key often stands before the transposition of the same attributes.
-    if (Context().CurrentTranspose.mHasBeenReadFromXML) {
-        EncounteredSignKey.mPartTransposeAtSignKey = Context().CurrentTranspose;
-    } else if (const auto& transpose = FirstTransposeOfMeasure()) {
-        EncounteredSignKey.mPartTransposeAtSignKey = *transpose;
-    }
-    Context().CurrentSignKey = EncounteredSignKey;
-    TellHost<&brindle::MusicXmlParserDelegate::didEncounterSignKey>(EncounteredSignKey);
-}
-
-void TMeasure::encounteredClef() {
-    EncounteredClef.mPositionAsMidiTicks = Context().CurrentPosAsMidiTicks;
-    EncounteredClef.mStaffDetailsXML = mFirstStaffDetails;
-    Context().CurrentClef = EncounteredClef;
-    std::vector<CMuxmlClef>& clefs = Context().CurrentPartGatheredInfo()->mClefs;
-    if (clefs.size() < kMuxmlMaxClefs) clefs.push_back(EncounteredClef);
-    // Kept: the host is asked for the method of keys.
-    if (HostRespondsTo<&brindle::MusicXmlParserDelegate::didEncounterSignKey>()) {
-        TellHost<&brindle::MusicXmlParserDelegate::didEncounterClef>(EncounteredClef);
-    }
-}
-
-void TMeasure::encounteredTranspose() {
-    EncounteredTranspose.mPositionAsMidiTicks = Context().CurrentPosAsMidiTicks;
-    Context().CurrentTranspose = EncounteredTranspose;
-    Context().CurrentPartGatheredInfo()->mFoundTransposeNoteCounts.Add(EncounteredTranspose, 0);
-    TellHost<&brindle::MusicXmlParserDelegate::didEncounterTranspose>(EncounteredTranspose);
 }
 
 void TMeasure::encounteredDirection() {

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "brindle/musicxml/XMLParserDelegate_RecursiveMuxml.h"
+#include "brindle/musicxml/XMLParserDelegate_RecursiveMuxml_Child.h"
 
 #include <optional>
 
@@ -12,7 +12,8 @@ namespace brindle {
 ///
 /// The end of a bar follows from the time signature and not from what the bar holds, so that a
 /// faulty bar cannot shift what follows.
-class XMLParserDelegate_RecursiveMuxml_Measure final : public XMLParserDelegate_RecursiveMuxml {
+class XMLParserDelegate_RecursiveMuxml_Measure final
+    : public XMLParserDelegate_RecursiveMuxml_Child {
 public:
     CMuxmlMeasure EncounteredMeasure;
     CMuxmlSignTime EncounteredSignTime;
@@ -24,8 +25,6 @@ public:
                            const XmlAttributes& attributes) override;
     void didStartElement(XmlStreamParser& parser, std::string_view name,
                          const XmlAttributes& attributes) override;
-    void didEndElement(XmlStreamParser& parser, std::string_view name) override;
-    void parseErrorOccurred(XmlStreamParser& parser, const XmlError& error) override;
 
     void encounteredMeasureStart(const XmlAttributes& attributes);
     void encounteredMeasureEnd();
@@ -35,22 +34,23 @@ public:
     void encounteredTranspose();
     void encounteredDirection();
 
+    /// For the table of elements.
+    void FoundDivisions(XmlStreamParser& parser, std::string_view text);
+
 protected:
+    void didEndMyElement() override { encounteredMeasureEnd(); }
+    void didEndInnerElement(std::string_view name) override;
     void foundTrimmedCharacters(XmlStreamParser& parser, std::string_view text) override;
 
 private:
-    /// What is done with the text of an element inside `attributes`.
-    struct TAttributesRow;
-    static const TAttributesRow* FindAttributesRow(
-        const XMLParserDelegate_RecursiveMuxml_Measure& self);
-
     void _encounteredMeasureStart_detectIncompleteFirstBar();
     std::int32_t
     _encounteredMeasureStart_detectIncompleteFirstBar_barLengthOfFirstSignTimeAsDuration();
     [[nodiscard]] std::int32_t _findMaxPosInCurrentPartMeasureAsDuration() const;
     [[nodiscard]] std::int32_t _NextBarStart() const;
     void FindElementsOfMeasure();
-    void FoundDivisions(XmlStreamParser& parser, std::string_view text);
+    /// The text of an element inside `attributes`.
+    void FoundInAttributes(XmlStreamParser& parser, std::string_view text);
     void FoundDuration(std::string_view text);
     [[nodiscard]] const std::optional<CMuxmlTranspose>& FirstTransposeOfMeasure();
 

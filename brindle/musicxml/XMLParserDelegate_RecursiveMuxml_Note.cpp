@@ -96,24 +96,6 @@ void TNote::didStartMyElement(XmlStreamParser&, std::string_view, const XmlAttri
     ++Context().CurrentPartMeasureNotesXMLIx;
 }
 
-void TNote::didStartElement(XmlStreamParser& parser, std::string_view name,
-                            const XmlAttributes& attributes) {
-    EnterElement(name, attributes);
-    PushCurrentElementName();
-    foundCharacters(parser, "");
-}
-
-void TNote::didEndElement(XmlStreamParser& parser, std::string_view name) {
-    const bool isMyEnd = name == MyRecursiveTreeStartsAtElementName;
-    if (isMyEnd) encounteredNote();
-    didEndElement_resetCurrentElementNameAndRemoveFromCurrentElementParentNames(name);
-    if (isMyEnd) setParserDelegateToParentDelegateAndReleaseSelf(name, parser);
-}
-
-void TNote::parseErrorOccurred(XmlStreamParser& parser, const XmlError& error) {
-    ParentDelegate->parseErrorOccurred(parser, error);
-}
-
 void TNote::foundTrimmedCharacters(XmlStreamParser& parser, std::string_view text) {
     if (const TNoteRow* row = kElements.Find(currentElementName)) {
         row->mRead(*this, EncounteredNote, currentAttributes, text);

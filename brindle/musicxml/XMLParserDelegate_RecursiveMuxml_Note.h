@@ -1,24 +1,20 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "brindle/musicxml/XMLParserDelegate_RecursiveMuxml.h"
+#include "brindle/musicxml/XMLParserDelegate_RecursiveMuxml_Child.h"
 
 #include <string>
 
 namespace brindle {
 
 /// Reads a `note` and makes of it a note in time. A delegate reads one note.
-class XMLParserDelegate_RecursiveMuxml_Note final : public XMLParserDelegate_RecursiveMuxml {
+class XMLParserDelegate_RecursiveMuxml_Note final : public XMLParserDelegate_RecursiveMuxml_Child {
 public:
     CMuxmlNote EncounteredNote;
     std::string InstrumentName;
 
     void didStartMyElement(XmlStreamParser& parser, std::string_view name,
                            const XmlAttributes& attributes) override;
-    void didStartElement(XmlStreamParser& parser, std::string_view name,
-                         const XmlAttributes& attributes) override;
-    void didEndElement(XmlStreamParser& parser, std::string_view name) override;
-    void parseErrorOccurred(XmlStreamParser& parser, const XmlError& error) override;
 
     /// Works out pitch, loudness, place and length, joins ties, gathers what is learned about the
     /// part and tells the note to the host. Throws boost::bad_rational when the file told divisions
@@ -36,6 +32,7 @@ public:
     [[nodiscard]] CMuxmlTupletPortion* OpenTupletPortion();
 
 protected:
+    void didEndMyElement() override { encounteredNote(); }
     void foundTrimmedCharacters(XmlStreamParser& parser, std::string_view text) override;
 
 private:

@@ -27,23 +27,10 @@ void XMLParserDelegate_RecursiveMuxml_Part::didStartElement(XmlStreamParser& par
     if (name == "score-part") visit_Start_ScorePart(attributes.Value("id"));
 }
 
-void XMLParserDelegate_RecursiveMuxml_Part::didEndElement(XmlStreamParser& parser,
-                                                          std::string_view name) {
-    if (name == MyRecursiveTreeStartsAtElementName) {
-        encounteredPartEnd();
-        didEndElement_resetCurrentElementNameAndRemoveFromCurrentElementParentNames(name);
-        setParserDelegateToParentDelegateAndReleaseSelf(name, parser);
-        return;
-    }
+void XMLParserDelegate_RecursiveMuxml_Part::didEndInnerElement(std::string_view name) {
     if (name == "midi-instrument") visit_End_MidiInstrument();
     if (name == "score-part") visit_End_ScorePart();
     if (name == "score-instrument") visit_End_ScoreInstrument();
-    didEndElement_resetCurrentElementNameAndRemoveFromCurrentElementParentNames(name);
-}
-
-void XMLParserDelegate_RecursiveMuxml_Part::parseErrorOccurred(XmlStreamParser& parser,
-                                                               const XmlError& error) {
-    ParentDelegate->parseErrorOccurred(parser, error);
 }
 
 void XMLParserDelegate_RecursiveMuxml_Part::encounteredPartStart(const XmlAttributes& attributes) {

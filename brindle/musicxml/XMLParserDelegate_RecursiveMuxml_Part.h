@@ -2,7 +2,7 @@
 #pragma once
 
 #include "brindle/musicxml/CMuxmlPart.h"
-#include "brindle/musicxml/XMLParserDelegate_RecursiveMuxml.h"
+#include "brindle/musicxml/XMLParserDelegate_RecursiveMuxml_Child.h"
 
 #include <map>
 #include <string>
@@ -10,7 +10,7 @@
 namespace brindle {
 
 /// Reads a `part` and hands its measures to their delegates.
-class XMLParserDelegate_RecursiveMuxml_Part final : public XMLParserDelegate_RecursiveMuxml {
+class XMLParserDelegate_RecursiveMuxml_Part final : public XMLParserDelegate_RecursiveMuxml_Child {
 public:
     std::string CurrentPartID;
     // Instruments by the identifier of their part. Nothing fills them.
@@ -21,13 +21,13 @@ public:
                            const XmlAttributes& attributes) override;
     void didStartElement(XmlStreamParser& parser, std::string_view name,
                          const XmlAttributes& attributes) override;
-    void didEndElement(XmlStreamParser& parser, std::string_view name) override;
-    void parseErrorOccurred(XmlStreamParser& parser, const XmlError& error) override;
 
     void encounteredPartStart(const XmlAttributes& attributes);
     void encounteredPartEnd();
 
 protected:
+    void didEndMyElement() override { encounteredPartEnd(); }
+    void didEndInnerElement(std::string_view name) override;
     void foundTrimmedCharacters(XmlStreamParser&, std::string_view) override {}
 
 private:

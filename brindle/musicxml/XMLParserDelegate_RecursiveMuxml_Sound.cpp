@@ -14,27 +14,6 @@ void XMLParserDelegate_RecursiveMuxml_Sound::didStartMyElement(XmlStreamParser& 
     foundCharacters(parser, "");
 }
 
-void XMLParserDelegate_RecursiveMuxml_Sound::didStartElement(XmlStreamParser& parser,
-                                                             std::string_view name,
-                                                             const XmlAttributes& attributes) {
-    EnterElement(name, attributes);
-    PushCurrentElementName();
-    foundCharacters(parser, "");
-}
-
-void XMLParserDelegate_RecursiveMuxml_Sound::didEndElement(XmlStreamParser& parser,
-                                                           std::string_view name) {
-    didEndElement_resetCurrentElementNameAndRemoveFromCurrentElementParentNames(name);
-    if (name == MyRecursiveTreeStartsAtElementName) {
-        setParserDelegateToParentDelegateAndReleaseSelf(name, parser);
-    }
-}
-
-void XMLParserDelegate_RecursiveMuxml_Sound::parseErrorOccurred(XmlStreamParser& parser,
-                                                                const XmlError& error) {
-    ParentDelegate->parseErrorOccurred(parser, error);
-}
-
 void XMLParserDelegate_RecursiveMuxml_Sound::encounteredTempoChange(float tempo) {
     TellHost<&brindle::MusicXmlParserDelegate::didEncounterTempoChange>(
         CMuxmlTempoChange{Context().CurrentPosAsMidiTicks, tempo});
