@@ -1,8 +1,11 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <cstddef>
 #include <string_view>
 #include <tuple>
+#include <type_traits>
+#include <utility>
 
 namespace brindle {
 
@@ -24,6 +27,50 @@ template <class Record, class Value>
 [[nodiscard]] constexpr CMuxmlField<Record, Value> MuxmlField(std::string_view name,
                                                               Value Record::*member) {
     return {name, member};
+}
+
+/// For counting only: becomes whatever an aggregate is made of.
+struct CMuxmlAnyValue {
+    template <class Value>
+    operator Value() const;
+};
+
+template <class Record, std::size_t... Numbers>
+[[nodiscard]] constexpr bool MuxmlTakesValues(std::index_sequence<Numbers...>) {
+    return requires {
+        Record{(static_cast<void>(Numbers), CMuxmlAnyValue{})...};
+    };
+}
+
+/// How many fields and base classes an aggregate has.
+template <class Record, std::size_t Count = 1>
+[[nodiscard]] constexpr std::size_t MuxmlCountFields() {
+    if constexpr (MuxmlTakesValues<Record>(std::make_index_sequence<Count + 1>())) {
+        return MuxmlCountFields<Record, Count + 1>();
+    } else {
+        return Count;
+    }
+}
+
+template <class Record, class Field>
+inline constexpr bool kIsMuxmlFieldOf = false;
+template <class Record, class Value>
+inline constexpr bool kIsMuxmlFieldOf<Record, CMuxmlField<Record, Value>> = true;
+
+template <class Record, class... Fields>
+[[nodiscard]] constexpr bool MuxmlHasOwnFields(const std::tuple<Fields...>&) {
+    return (kIsMuxmlFieldOf<Record, Fields> || ...);
+}
+
+/// Whether `Fields()` forgets none of the fields. What is no aggregate cannot be counted, and a
+/// record without fields of its own has those of its bases.
+template <class Record>
+[[nodiscard]] constexpr bool MuxmlNamesAllFields() {
+    if constexpr (std::is_aggregate_v<Record> && MuxmlHasOwnFields<Record>(Record::Fields())) {
+        return std::tuple_size_v<decltype(Record::Fields())> == MuxmlCountFields<Record>();
+    } else {
+        return true;
+    }
 }
 
 template <class T>

@@ -45,6 +45,7 @@ public:
     /// The fields of the record without braces; a comma before them unless the text ends with "{".
     template <class Record>
     void AppendFields(std::string& text, const Record& record) const {
+        static_assert(MuxmlNamesAllFields<Record>());
         static const Record defaults{};
         std::apply([&](const auto&... field) { (AppendField(text, record, defaults, field), ...); },
                    Record::Fields());

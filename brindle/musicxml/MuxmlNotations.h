@@ -122,6 +122,8 @@ struct CMuxmlNotationEmptyPlacement : CMuxmlXYColor, CMuxmlFont {
     }
 };
 
+static_assert(MuxmlNamesAllFields<CMuxmlNotationEmptyPlacement>());
+
 struct CMuxmlAccent : CMuxmlNotationEmptyPlacement {};
 struct CMuxmlBreathMark : CMuxmlNotationEmptyPlacement {};
 struct CMuxmlCeasura : CMuxmlNotationEmptyPlacement {};
