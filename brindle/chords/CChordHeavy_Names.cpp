@@ -1,7 +1,9 @@
 // SPDX-License-Identifier: MIT
 // The name of a chord: root, basic chord, options, slash and bass.
 #include "brindle/chords/BasicChordNames.h"
+
 #include "brindle/chords/CChordHeavy.h"
+#include "brindle/platform/Ascii.h"
 #include "brindle/theory/CChordNamePrefs.h"
 #include "brindle/theory/CScaleHeavy.h"
 #include "brindle/theory/KeyNames.h"
@@ -19,10 +21,8 @@ std::string_view NameOfNonChord(const CNote& root) {
 }
 
 void LowerFirstLetter(std::string& name) {
-    if (name.empty()) return;  // a syllable may be translated by nothing
-    constexpr int capitalToSmall = 'a' - 'A';
-    char& first = name.front();
-    if (first >= 'A' && first <= 'Z') first = static_cast<char>(first + capitalToSmall);
+    // A syllable may be translated by nothing.
+    if (!name.empty()) name.front() = Ascii::ToLower(name.front());
 }
 
 }  // namespace

@@ -5,6 +5,7 @@
 #include "brindle/guitarchords/GChChord.h"
 #include "brindle/guitarchords/GChChordDescr.h"
 #include "brindle/guitarchords/GChTuningDescr.h"
+#include "brindle/platform/Utf8.h"
 #include "brindle/theory/CChordNamePrefs.h"
 
 #include <boost/container/static_vector.hpp>
@@ -59,18 +60,13 @@ std::optional<std::string> NameOf(const TPitches& pitches, int root, int enhType
     return chord.Name(prefs);
 }
 
-std::size_t CharacterCount(const std::string& utf8) {
-    return static_cast<std::size_t>(std::count_if(utf8.begin(), utf8.end(), [](char c) {
-        return (static_cast<unsigned char>(c) & 0xC0) != 0x80;
-    }));
-}
-
 int RootWithShortestName(const TPitches& pitches) {
     const CChordNamePrefs prefs = PrefsForGrids(false);
     int shortest = -1;
     std::size_t fewest = 0;
     for (int root = 0; root < 12; ++root) {
-        const std::size_t count = CharacterCount(NameOf(pitches, root, -1, prefs).value_or(""));
+        const std::size_t count =
+            CountUtf8Characters(NameOf(pitches, root, -1, prefs).value_or(""));
         if (shortest >= 0 && count >= fewest) continue;
         shortest = root;
         fewest = count;

@@ -1,8 +1,10 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/guitarchords/GChPitches.h"
 
+#include "brindle/platform/Ascii.h"
 #include "brindle/theory/CChordNamePrefs.h"
 #include "brindle/theory/CKeyEnh.h"
+#include "brindle/theory/KeyIntervals.h"
 #include "brindle/theory/KeyNames.h"
 #include "brindle/theory/MakeSensefulEnh.h"
 
@@ -26,15 +28,12 @@ constexpr auto kEnhPitches = std::to_array<CKeyEnh>({
     { 8, TEnh_b}, { 9, TEnh_n}, {10, TEnh_s}, {10, TEnh_b}, {11, TEnh_n},
 });
 
-// Key number of each letter from A.
-constexpr auto kKeyNrOfLetter = std::to_array<int>({9, 11, 0, 2, 4, 5, 7});
 // clang-format on
 
 std::optional<int> ReadKeyNr(std::string_view& text) {
     if (text.empty()) return std::nullopt;
-    const char upper = text[0] >= 'a' ? static_cast<char>(text[0] - 'a' + 'A') : text[0];
-    if (upper < 'A' || upper > 'G') return std::nullopt;
-    int keyNr = kKeyNrOfLetter[static_cast<std::size_t>(upper - 'A')];
+    int keyNr = KeyNrOfLetter(text[0]);
+    if (keyNr == kKeyNrUndef) return std::nullopt;
     text.remove_prefix(1);
     if (!text.empty() && (text[0] == 'b' || text[0] == '#')) {
         keyNr = (keyNr + (text[0] == 'b' ? 11 : 1)) % 12;
@@ -46,7 +45,7 @@ std::optional<int> ReadKeyNr(std::string_view& text) {
 /// The pitch of the C that an octave begins with; "-2" is the lowest octave.
 std::optional<int> ReadOctave(std::string_view text) {
     if (text.empty()) return std::nullopt;
-    if (text[0] >= '0' && text[0] <= '9') return (text[0] - '0' + 2) * 12;
+    if (Ascii::IsDigit(text[0])) return (text[0] - '0' + 2) * 12;
     if (text.substr(0, 2) == "-1") return 12;
     if (text.substr(0, 2) == "-2") return 0;
     return std::nullopt;

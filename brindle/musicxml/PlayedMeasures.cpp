@@ -3,6 +3,7 @@
 
 #include "brindle/musicxml/TMusicXMLDoc.h"
 #include "brindle/platform/ReadNumber.h"
+#include "brindle/platform/Utf8.h"
 
 #include <algorithm>
 
@@ -188,8 +189,7 @@ bool PlayMeasures(const TWrittenMeasures& written, TMusicXMLDoc& doc) {
 }
 
 bool IsRepeatWord(std::string_view text) {
-    const auto isLead = [](char byte) { return (static_cast<unsigned char>(byte) & 0xC0) != 0x80; };
-    const auto length = std::count_if(text.begin(), text.end(), isLead);
+    const std::size_t length = CountUtf8Characters(text);
     return length >= 2 && length <= 4 && text.find('x') != std::string_view::npos;
 }
 

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/musicxml/ScoreContainer.h"
 
+#include "brindle/platform/Ascii.h"
 #include "brindle/platform/XmlStreamParser.h"
 #include "brindle/platform/ZipContainer.h"
 
@@ -51,9 +52,8 @@ const FileNode* NamedFile(const FileNode& root) {
 
 bool EndsWith(std::string_view name, std::string_view ending) {
     return name.size() > ending.size() &&
-           std::equal(ending.rbegin(), ending.rend(), name.rbegin(), [](char a, char b) {
-               return a == b || (b >= 'A' && b <= 'Z' && a == b - 'A' + 'a');
-           });
+           std::equal(ending.rbegin(), ending.rend(), name.rbegin(),
+                      [](char a, char b) { return a == Ascii::ToLower(b) || a == b; });
 }
 
 // Names that begin with a point or an underline are notes of file systems, not scores.

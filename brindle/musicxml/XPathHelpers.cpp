@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/musicxml/XPathHelpers.h"
 
+#include "brindle/platform/Ascii.h"
 #include "brindle/platform/ReadNumber.h"
 
 #include <algorithm>
@@ -20,9 +21,7 @@ std::string StringValueForXPath(const XmlNode& node, const XmlPath& path,
 }
 
 std::string LowercaseString(std::string text) {
-    std::transform(text.begin(), text.end(), text.begin(), [](char letter) {
-        return letter >= 'A' && letter <= 'Z' ? static_cast<char>(letter - 'A' + 'a') : letter;
-    });
+    std::transform(text.begin(), text.end(), text.begin(), Ascii::ToLower);
     return text;
 }
 

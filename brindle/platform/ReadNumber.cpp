@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/platform/ReadNumber.h"
 
+#include "brindle/platform/Ascii.h"
+
 #include <locale.h>
 #include <stdlib.h>
 #include <algorithm>
@@ -15,10 +17,6 @@ namespace {
 
 constexpr std::string_view kWhiteSpace = " \t\n\v\f\r";
 
-bool IsDigit(char character) {
-    return character >= '0' && character <= '9';
-}
-
 std::string_view WithoutWhiteSpace(std::string_view text) {
     const std::size_t first = text.find_first_not_of(kWhiteSpace);
     return first == std::string_view::npos ? std::string_view() : text.substr(first);
@@ -27,7 +25,7 @@ std::string_view WithoutWhiteSpace(std::string_view text) {
 // Moves `pos` over decimal digits and tells whether there were any.
 bool SkipDigits(std::string_view text, std::size_t& pos) {
     const std::size_t first = pos;
-    while (pos < text.size() && IsDigit(text[pos])) ++pos;
+    while (pos < text.size() && Ascii::IsDigit(text[pos])) ++pos;
     return pos > first;
 }
 
@@ -65,7 +63,7 @@ std::int32_t ReadInteger(std::string_view text) {
     if (isNegative || text.starts_with('+')) text.remove_prefix(1);
     std::int64_t magnitude = 0;
     for (const char c : text) {
-        if (!IsDigit(c)) break;
+        if (!Ascii::IsDigit(c)) break;
         magnitude = std::min(magnitude * 10 + (c - '0'), -kMin);
     }
     return static_cast<std::int32_t>(isNegative ? -magnitude : std::min(magnitude, kMax));

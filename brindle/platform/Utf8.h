@@ -10,4 +10,16 @@ namespace brindle {
 /// UTF-8 (overlong forms, surrogates and numbers beyond U+10FFFF included) or the text is empty.
 [[nodiscard]] std::size_t Utf8Length(std::string_view text);
 
+/// Whether a character begins with this byte: all of UTF-8 but the bytes inside of characters.
+[[nodiscard]] constexpr bool BeginsUtf8Character(char byte) {
+    return (static_cast<unsigned char>(byte) & 0xC0U) != 0x80U;
+}
+
+/// The number of characters; of bytes that are no UTF-8 it counts those that could begin one.
+[[nodiscard]] constexpr std::size_t CountUtf8Characters(std::string_view text) {
+    std::size_t count = 0;
+    for (const char byte : text) count += BeginsUtf8Character(byte) ? 1 : 0;
+    return count;
+}
+
 }  // namespace brindle

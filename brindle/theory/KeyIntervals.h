@@ -1,8 +1,11 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "brindle/platform/Ascii.h"
 #include "brindle/theory/CKeyEnh.h"
 
+#include <array>
+#include <cstddef>
 #include <cstdint>
 
 namespace brindle {
@@ -10,6 +13,17 @@ namespace brindle {
 /// The interval from or to a key that is undefined. Real intervals are semitones, negative for
 /// down.
 inline constexpr int kIntvlUndef = -129;
+
+/// The pitch classes of the letters C D E F G A B, and so the semitones of the degrees of a major
+/// scale above its tonic.
+inline constexpr std::array<int, 7> kNaturalKeyNrs{0, 2, 4, 5, 7, 9, 11};
+
+/// The pitch class of a letter, A to G in either case; `kKeyNrUndef` for any other character.
+[[nodiscard]] constexpr int KeyNrOfLetter(char letter) {
+    const char capital = Ascii::ToUpper(letter);
+    if (capital < 'A' || capital > 'G') return kKeyNrUndef;
+    return kNaturalKeyNrs[static_cast<std::size_t>((capital - 'A' + 5) % 7)];
+}
 
 /// A number of semitones as one octave holds it: the true remainder by 12, 0 to 11.
 [[nodiscard]] constexpr int FoldIntoOctave(std::int64_t semitones) {

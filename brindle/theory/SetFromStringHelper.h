@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "brindle/platform/Ascii.h"
+
 #include <cassert>
 #include <cstddef>
 #include <cstdint>
@@ -28,9 +30,7 @@ enum TSpaces : std::int32_t {
     TSpaces_WholeRemainder = 1,
 };
 
-[[nodiscard]] constexpr char ToLower(char c) {
-    return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
-}
+using Ascii::ToLower;
 
 /// A lower-case copy of `text`, byte by byte.
 [[nodiscard]] std::string ToLowercase(std::string_view text);

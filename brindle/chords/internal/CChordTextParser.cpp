@@ -25,7 +25,7 @@ bool CChordTextParser::Fail(TFault fault, std::size_t pos, std::size_t length) {
 
 bool CChordTextParser::ReadRoot() {
     const char first = mScan.Peek();
-    mRootIsSmall = IsLetter(first) && !(first >= 'A' && first <= 'Z');
+    mRootIsSmall = Ascii::IsSmallLetter(first);
     const auto note = TakeNote(mScan, mPrefs);
     if (!note) return Fail(TFault::NoNote);
     mRoot = *note;

@@ -17,8 +17,8 @@ struct TColonDegree {
     int mAccidental = 0;
 
     [[nodiscard]] constexpr int Tone() const {
-        constexpr std::array<int, 7> kTones{0, 2, 4, 5, 7, 9, 11};
-        return FoldIntoOctave(kTones[static_cast<std::size_t>((mDegree - 1) % 7)] + mAccidental);
+        const int natural = kNaturalKeyNrs[static_cast<std::size_t>((mDegree - 1) % 7)];
+        return FoldIntoOctave(natural + mAccidental);
     }
 };
 
@@ -135,7 +135,8 @@ bool CChordTextParser::ReadColonBass() {
     // Spelled by its letter: the third of A flat is a C, and its flat third a C flat.
     const int letter = (mRoot.mLetter + degree.mDegree - 1) % 7;
     const int key = mRoot.KeyEnh().mKeyNr + degree.Tone();
-    const int accidental = FoldIntoOctave(key - KeyNrOfLetter(letter) + 6) - 6;
+    const int natural = kNaturalKeyNrs[static_cast<std::size_t>(letter)];
+    const int accidental = FoldIntoOctave(key - natural + 6) - 6;
     if (accidental < -2 || accidental > 2) {
         Fail(TFault::OneAccidentalTooMany, degreePos);
         return true;

@@ -1,17 +1,15 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "brindle/platform/Ascii.h"
+
 #include <cstddef>
 #include <string_view>
 
 namespace brindle::ChordText {
 
-[[nodiscard]] constexpr bool IsDigit(char c) {
-    return c >= '0' && c <= '9';
-}
-[[nodiscard]] constexpr bool IsLetter(char c) {
-    return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z');
-}
+using Ascii::IsDigit;
+using Ascii::IsLetter;
 /// A to H, as a chord in capitals begins.
 [[nodiscard]] constexpr bool IsCapitalNote(char c) {
     return c >= 'A' && c <= 'H';

@@ -3,6 +3,7 @@
 
 #include "brindle/chords/internal/CFoldedText.h"
 #include "brindle/chords/internal/CTextScan.h"
+#include "brindle/platform/Utf8.h"
 
 #include <fmt/format.h>
 
@@ -42,13 +43,9 @@ constexpr auto kFaultRows = std::to_array<TFaultRow>({
 /// Nobody reads more of a text that went wrong.
 constexpr std::size_t kLongestShown = 40;
 
-bool BeginsCharacter(char c) {
-    return (static_cast<unsigned char>(c) & 0xC0) != 0x80;
-}
-
 std::size_t LengthOfCharacter(std::string_view text) {
     std::size_t length = 1;
-    while (length < text.size() && !BeginsCharacter(text[length])) ++length;
+    while (length < text.size() && !BeginsUtf8Character(text[length])) ++length;
     return length;
 }
 
@@ -64,10 +61,8 @@ std::string_view Shown(std::string_view text, bool withDigits) {
 }  // namespace
 
 int CharacterPos(std::string_view input, std::size_t offset) {
-    const std::string_view before = input.substr(0, offset);
-    const auto count = std::count_if(before.begin(), before.end(), BeginsCharacter);
-    constexpr std::ptrdiff_t kLast = std::numeric_limits<int>::max() - 1;
-    return static_cast<int>(std::min<std::ptrdiff_t>(count, kLast)) + 1;
+    constexpr std::size_t kLast = std::numeric_limits<int>::max() - 1;
+    return static_cast<int>(std::min(CountUtf8Characters(input.substr(0, offset)), kLast)) + 1;
 }
 
 std::string FaultText(const TFaultAt& fault, const CFoldedText& text) {

@@ -117,7 +117,8 @@ std::optional<TLetter> TakeSyllable(CTextScan& scan) {
 }  // namespace
 
 CKeyEnh TWrittenNote::KeyEnh() const {
-    return {FoldIntoOctave(KeyNrOfLetter(mLetter) + mAccidental), SemitoneToEnh(mAccidental)};
+    const int natural = kNaturalKeyNrs[static_cast<std::size_t>(mLetter)];
+    return {FoldIntoOctave(natural + mAccidental), SemitoneToEnh(mAccidental)};
 }
 
 std::optional<TWrittenNote> TakeNote(CTextScan& scan, const CChordTextPrefs& prefs) {
@@ -127,7 +128,7 @@ std::optional<TWrittenNote> TakeNote(CTextScan& scan, const CChordTextPrefs& pre
         }
     }
     const char typed = scan.Peek();
-    const char letter = typed >= 'A' && typed <= 'H' ? static_cast<char>(typed - 'A' + 'a') : typed;
+    const char letter = Ascii::ToLower(typed);
     if (letter < 'a' || letter > 'h') return std::nullopt;
     ++scan.mPos;
     const auto accidental = TakeAccidental(scan, letter);

@@ -7,6 +7,7 @@
 #include "brindle/musicxml/CMuxmlBiMap.h"
 #include "brindle/musicxml/MuxmlLimits.h"
 #include "brindle/platform/ReadNumber.h"
+#include "brindle/platform/Utf8.h"
 
 #include <cmath>
 #include <cstddef>
@@ -63,7 +64,7 @@ namespace brindle::muxml {
 [[nodiscard]] inline std::string_view Shortened(std::string_view text) {
     if (text.size() <= kMuxmlMaxWordLength) return text;
     std::size_t size = kMuxmlMaxWordLength;
-    while (size > 0 && (static_cast<unsigned char>(text[size]) & 0xC0U) == 0x80U) --size;
+    while (size > 0 && !BeginsUtf8Character(text[size])) --size;
     return text.substr(0, size);
 }
 

@@ -2,6 +2,7 @@
 #include "brindle/musicxml/internal/ScoreWords.h"
 
 #include "brindle/musicxml/internal/WrittenScore.h"
+#include "brindle/platform/Ascii.h"
 #include "brindle/platform/ReadNumber.h"
 
 #include <algorithm>
@@ -16,14 +17,6 @@ namespace {
 constexpr std::size_t kMostEndingNumbers = 64;
 constexpr std::size_t kMostWords = 64;
 
-bool IsDigit(char c) {
-    return c >= '0' && c <= '9';
-}
-
-bool IsLetter(char c) {
-    return c >= 'a' && c <= 'z';
-}
-
 // Lower case, and the sign of multiplication as the "x" that it is meant for.
 std::string Folded(std::string_view words) {
     constexpr std::string_view times = "\u00D7";
@@ -34,7 +27,7 @@ std::string Folded(std::string_view words) {
             folded += 'x';
             i += times.size() - 1;
         } else {
-            folded += c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
+            folded += Ascii::ToLower(c);
         }
     }
     return folded;
@@ -46,11 +39,13 @@ std::vector<std::string> TokensOf(std::string_view words) {
     std::vector<std::string> tokens;
     for (std::size_t i = 0; i < text.size() && tokens.size() < kMostWords;) {
         std::size_t end = i;
-        if (IsDigit(text[i])) {
-            while (end < text.size() && IsDigit(text[end])) ++end;
+        if (Ascii::IsDigit(text[i])) {
+            while (end < text.size() && Ascii::IsDigit(text[end])) ++end;
         } else {
             // A letter of another script is no border: "verso" is one word with any accents.
-            while (end < text.size() && (IsLetter(text[end]) || (text[end] & 0x80) != 0)) ++end;
+            while (end < text.size() &&
+                   (Ascii::IsSmallLetter(text[end]) || (text[end] & 0x80) != 0))
+                ++end;
         }
         if (end > i) tokens.push_back(text.substr(i, end - i));
         i = std::max(end, i + 1);
@@ -113,7 +108,7 @@ std::int32_t RepeatTimesOf(const std::vector<std::string>& tokens) {
     };
     for (std::size_t i = 0; i < tokens.size(); ++i) {
         const std::int32_t number = ReadInteger(tokens[i]);
-        if (number < 1 || !IsDigit(tokens[i].front())) continue;
+        if (number < 1 || !Ascii::IsDigit(tokens[i].front())) continue;
         const bool hasNext = i + 1 < tokens.size();
         if (hasNext && (tokens[i + 1] == "repeats" || tokens[i + 1] == "repeat")) {
             return std::min(number, std::numeric_limits<std::int32_t>::max() - 1) + 1;
@@ -154,14 +149,14 @@ std::vector<std::int32_t> ReadEndingNumbers(std::string_view text) {
     std::vector<std::int32_t> numbers;
     bool isRange = false;
     for (std::size_t i = 0; i < text.size() && numbers.size() < kMostEndingNumbers;) {
-        if (!IsDigit(text[i])) {
+        if (!Ascii::IsDigit(text[i])) {
             isRange = isRange || (text[i] == '-' && !numbers.empty());
             if (text[i] == ',') isRange = false;
             ++i;
             continue;
         }
         const std::int32_t number = std::min(ReadInteger(text.substr(i)), kHighestEndingNumber);
-        while (i < text.size() && IsDigit(text[i])) ++i;
+        while (i < text.size() && Ascii::IsDigit(text[i])) ++i;
         if (number < 1) continue;
         std::int32_t from = isRange ? numbers.back() + 1 : number;
         while (from < number && numbers.size() < kMostEndingNumbers) numbers.push_back(from++);
