@@ -34,8 +34,8 @@ void CHarmAnlsChordWithLengthToMidiNotes(const CHarmAnlsChordWithLength& chord,
 void AddBassNoteToMidiNotes(const CHarmAnlsChordWithLength& chord,
                             std::vector<unsigned char>& notes, bool relative);
 
-/// Turns over the chord so that its highest note comes near to `center`: the upper voice of
-/// successive chords then moves little. Sorts the notes.
+/// Simple voice leading: turns over the chord so that its highest note comes near to `center`: the
+/// upper voice of successive chords then moves little. Sorts the notes.
 void TransposeChordBasedOnPreviousChords(std::vector<unsigned char>& notes, int center);
 
 }  // namespace brindle

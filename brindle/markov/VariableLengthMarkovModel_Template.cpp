@@ -13,6 +13,25 @@ namespace {
 // Keeps a table of one entry, whose maximal entropy is 0, from being divided by 0.
 constexpr double kNotZero = 1e-5;
 
+/// How many symbols in a row are fixed, back from the last one. All that could stand before the
+/// start count as fixed.
+class CFixedRun {
+public:
+    void Append(bool isFixed) {
+        if (!isFixed) {
+            mLength = 0;
+        } else if (mLength < kEndless) {
+            ++mLength;
+        }
+    }
+    [[nodiscard]] std::uint64_t Length() const { return mLength; }
+
+private:
+    static constexpr std::uint64_t kEndless = std::numeric_limits<std::uint64_t>::max();
+
+    std::uint64_t mLength = kEndless;
+};
+
 }  // namespace
 
 bool VariableLengthMarkovModel::AppendNextFittingSymbol(
@@ -21,11 +40,11 @@ bool VariableLengthMarkovModel::AppendNextFittingSymbol(
     if (length == kMarkovLongestHistory) length = options.mMaxHistoryLength;
     // No longer history was ever seen.
     length = std::min(length, mMaxHistoryLength);
-    MarkovSequence history;
-    Subvector(length, sequence.mSymbols, history);
+    MarkovSequence longest;
+    Subvector(length, sequence.mSymbols, longest);
     MarkovProbabilities table;
-    for (;; --length) {
-        ProbabilitiesForNextSymbol(MarkovSequenceView(history).last(length), table);
+    for (MarkovSequenceView history(longest);; history = history.subspan(1)) {
+        ProbabilitiesForNextSymbol(history, table);
         const std::size_t candidates = table.size();
         const double entropy = CalculateEntropy(table);
         const double maxEntropy = std::log(static_cast<double>(candidates));
@@ -33,7 +52,7 @@ bool VariableLengthMarkovModel::AppendNextFittingSymbol(
         RemoveNonFittingSymbolsFromProbabilities(table, remaining);
         // An entropy that is not a number passes.
         const bool isVaried = !(entropy / (maxEntropy + kNotZero) < options.mMinNormalizedEntropy);
-        const bool isShortest = length <= options.mMinHistoryLength || length == 0;
+        const bool isShortest = history.size() <= options.mMinHistoryLength || history.empty();
         const auto fillsExactly = [&] {
             return options.mAcceptExactFill &&
                    static_cast<double>(GetMaxLengthFromProbabilities(table)) == remaining;
@@ -43,7 +62,8 @@ bool VariableLengthMarkovModel::AppendNextFittingSymbol(
             (isVaried || (isShortest ? options.mAcceptAtMinHistory : fillsExactly()));
         if (isAccepted) {
             const MarkovIterator chosen = ChooseFromProbabilities(table);
-            sequence.Append({table.at(chosen), entropy / maxEntropy, maxEntropy, length, chosen});
+            sequence.Append(
+                {table.at(chosen), entropy / maxEntropy, maxEntropy, history.size(), chosen});
             info.mBranching.push_back(static_cast<std::int32_t>(candidates));
             return true;
         }
@@ -70,33 +90,28 @@ void VariableLengthMarkovModel::CalculateEvidenceProbability(
     }
     const MarkovIterator endSymbol = mObjects.insertObjectIfUnique(CMarkovObject_End);
     const CMarkovTemplate wanted(options.mTemplate, endSymbol);
-    const MarkovSequenceView symbols(sequence.mSymbols);
     MarkovSequence window;
     MarkovProbabilities table;
+    CFixedRun run;
+    const auto weigh = [&](MarkovSequenceView before, MarkovIterator fixed) {
+        if (run.Length() >= options.mEvidenceHistoryLength) return;
+        // No history longer than N was ever seen, so one more symbol finds as little.
+        Subvector(std::min(options.mEvidenceHistoryLength, mMaxHistoryLength + 1), before, window);
+        ProbabilitiesForNextSymbol(window, table);
+        const auto found = table.find(fixed);
+        sequence.mLogProbability += found == table.end() ? -std::numeric_limits<double>::infinity()
+                                                         : std::log(found->second);
+    };
+    const MarkovSequenceView symbols(sequence.mSymbols);
     double beats = 0.0;
-    // How many places, counted back from the current one, are fixed; those before the start are.
-    std::uint64_t fixedBefore = std::numeric_limits<std::uint64_t>::max();
-    for (std::size_t place = 0; place <= symbols.size(); ++place) {
-        const bool isEnd = place == symbols.size();
-        const bool isFixed = isEnd || wanted.HasChordAt(beats);
-        if (isFixed && fixedBefore < options.mEvidenceHistoryLength) {
-            // No history longer than N was ever seen, so one more symbol finds as little.
-            Subvector(std::min(options.mEvidenceHistoryLength, mMaxHistoryLength + 1),
-                      symbols.first(place), window);
-            ProbabilitiesForNextSymbol(window, table);
-            const auto found = table.find(isEnd ? endSymbol : symbols[place]);
-            sequence.mLogProbability += found == table.end()
-                                            ? -std::numeric_limits<double>::infinity()
-                                            : std::log(found->second);
-        }
-        if (isEnd) return;
-        if (!isFixed) {
-            fixedBefore = 0;
-        } else if (fixedBefore < std::numeric_limits<std::uint64_t>::max()) {
-            ++fixedBefore;
-        }
-        if (symbols[place]->HasBeats()) beats += symbols[place]->mChord.mLength;
+    for (std::size_t place = 0; place < symbols.size(); ++place) {
+        const MarkovIterator symbol = symbols[place];
+        const bool isFixed = wanted.HasChordAt(beats);
+        if (isFixed) weigh(symbols.first(place), symbol);
+        run.Append(isFixed);
+        if (symbol->HasBeats()) beats += symbol->mChord.mLength;
     }
+    weigh(symbols, endSymbol);
 }
 
 }  // namespace brindle

@@ -55,19 +55,23 @@ CTemplateSearch::TOutcome CTemplateSearch::Begin() {
 
 /// The last level again, after the way behind its symbol failed.
 CTemplateSearch::TOutcome CTemplateSearch::GoOn() {
+    return mLevels.back().mNext.mDistance > 0.0 ? TryOtherSymbol() : TakeBackFixedSymbol();
+}
+
+CTemplateSearch::TOutcome CTemplateSearch::TryOtherSymbol() {
     TLevel& level = mLevels.back();
-    if (level.mNext.mDistance > 0.0) {
-        level.mExcluded.insert(mSequence.mSymbols.back());
-        TakeBack();
-        return FillGap();
-    }
+    level.mExcluded.insert(mSequence.mSymbols.back());
+    mSequence.RemoveLast();
+    mInfo.mBeats.push_back(level.mBeats);
+    return FillGap();
+}
+
+CTemplateSearch::TOutcome CTemplateSearch::TakeBackFixedSymbol() {
     mSequence.RemoveLast();
     mModel.Subvector(mLongest, mSequence.mSymbols, mHistory);
     BlockHere(mLongest);
-    const double beats = level.mBeats;
-    const TOutcome failed = Fail();
-    mInfo.mBeats.push_back(beats);
-    return failed;
+    mInfo.mBeats.push_back(mLevels.back().mBeats);
+    return Fail();
 }
 
 CTemplateSearch::TOutcome CTemplateSearch::FillGap() {
@@ -123,11 +127,6 @@ double CTemplateSearch::BeatsAtEnd() const {
     if (mLevels.empty()) return mFirstBeats;
     const CMarkovObject& last = *mSequence.mSymbols.back();
     return mLevels.back().mBeats + (last.HasBeats() ? last.mChord.mLength : 0.0);
-}
-
-void CTemplateSearch::TakeBack() {
-    mSequence.RemoveLast();
-    mInfo.mBeats.push_back(mLevels.back().mBeats);
 }
 
 /// Nothing fits here behind the last symbols of the history.

@@ -36,11 +36,14 @@ private:
 
     TOutcome Begin();
     TOutcome GoOn();
+    /// In a gap.
+    TOutcome TryOtherSymbol();
+    /// There is no other: the level fails.
+    TOutcome TakeBackFixedSymbol();
     TOutcome FillGap();
     TOutcome PlaceFixedSymbol();
     TOutcome Fail();
     [[nodiscard]] double BeatsAtEnd() const;
-    void TakeBack();
     void BlockHere(std::uint64_t historyLength);
     std::uint64_t LookUpFixedSymbol();
 
