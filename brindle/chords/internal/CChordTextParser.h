@@ -50,6 +50,13 @@ private:
 
     bool ReadOptions();
     bool ReadOption();
+    /// A word and what reads it.
+    struct TOptionRow;
+    [[nodiscard]] static const TOptionRow* FindOptionRow(const CTextScan& scan);
+    bool ReadDegreeOption();
+    bool ReadDrone(std::size_t wordLength);
+    bool ReadAltered(std::size_t wordLength);
+    bool ReadAugmented(std::size_t wordLength);
     bool ReadPunctuation(char c);
     bool ReadOmission(std::size_t wordLength);
     bool ReadSuspension();

@@ -8,10 +8,8 @@
 namespace brindle::ChordText {
 namespace {
 
-constexpr auto kOmitWords = std::to_array<std::string_view>({"omit", "no", "without"});
 // The longer first.
 constexpr auto kSuspendedWords = std::to_array<std::string_view>({"suspended", "susp", "sus"});
-constexpr auto kAlteredWords = std::to_array<std::string_view>({"altered", "alt"});
 
 struct TSuspensionRow {
     std::string_view mText;
@@ -51,7 +49,30 @@ bool CChordTextParser::ReadOptions() {
     return true;
 }
 
-// The first that fits is taken.
+struct CChordTextParser::TOptionRow {
+    std::string_view mWord;
+    bool (CChordTextParser::*mRead)(std::size_t wordLength);
+};
+
+/// The row of the word that the text goes on with; null without one.
+const CChordTextParser::TOptionRow* CChordTextParser::FindOptionRow(const CTextScan& scan) {
+    using Parser = CChordTextParser;
+    // A longer word before one that it begins with.
+    static constexpr auto kRows = std::to_array<TOptionRow>({
+        {"add", &Parser::ReadAddition},
+        {"altered", &Parser::ReadAltered},
+        {"alt", &Parser::ReadAltered},
+        {"drone", &Parser::ReadDrone},
+        {"no", &Parser::ReadOmission},
+        {"omit", &Parser::ReadOmission},
+        {"without", &Parser::ReadOmission},
+    });
+    const auto* const row = std::find_if(kRows.begin(), kRows.end(), [&](const TOptionRow& option) {
+        return scan.SeesWord(option.mWord);
+    });
+    return row == kRows.end() ? nullptr : row;
+}
+
 bool CChordTextParser::ReadOption() {
     const char c = mScan.Peek();
     if (c == ' ' || c == '.') {
@@ -59,21 +80,13 @@ bool CChordTextParser::ReadOption() {
         return true;
     }
     if (c == '(' || c == ')' || c == ',' || c == '/') return ReadPunctuation(c);
-    if (mScan.TakeWord("drone")) {
-        mTones.EraseThird();
-        ++mPartCount;
-        return true;
-    }
-    if (const std::size_t length = LengthOfWord(mScan, kAlteredWords)) {
-        mScan.mPos += length;
-        mTones.MakeAltered();
-        ++mPartCount;
-        return true;
-    }
-    if (const std::size_t length = LengthOfWord(mScan, kOmitWords)) return ReadOmission(length);
+    if (const TOptionRow* row = FindOptionRow(mScan)) return (this->*row->mRead)(row->mWord.size());
     if (mScan.SeesWord("s") && ReadSuspension()) return true;
-    if (mScan.SeesWord("add")) return ReadAddition(3);
+    return ReadDegreeOption();
+}
 
+/// `b9`, `11`; whatever else is no word.
+bool CChordTextParser::ReadDegreeOption() {
     CTextScan scan = mScan;
     if (const int sign = TakeSign(scan)) {
         const std::size_t length = scan.mPos - mScan.mPos;
@@ -85,6 +98,28 @@ bool CChordTextParser::ReadOption() {
         return ReadNumber(number);
     }
     return ReadOtherOption();
+}
+
+bool CChordTextParser::ReadDrone(std::size_t wordLength) {
+    mScan.mPos += wordLength;
+    mTones.EraseThird();
+    ++mPartCount;
+    return true;
+}
+
+bool CChordTextParser::ReadAltered(std::size_t wordLength) {
+    mScan.mPos += wordLength;
+    mTones.MakeAltered();
+    ++mPartCount;
+    return true;
+}
+
+/// Without a degree behind it, which would make it a sign.
+bool CChordTextParser::ReadAugmented(std::size_t wordLength) {
+    mScan.mPos += wordLength;
+    mTones.RaiseFifth();
+    ++mPartCount;
+    return true;
 }
 
 bool CChordTextParser::ReadPunctuation(char c) {
@@ -228,11 +263,8 @@ int CChordTextParser::SignBehindNumber(int number) const {
 
 bool CChordTextParser::ReadOtherOption() {
     const std::size_t pos = mScan.mPos;
-    if (mScan.Take('+') || mScan.TakeWord("aug")) {
-        mTones.RaiseFifth();
-        ++mPartCount;
-        return true;
-    }
+    if (mScan.Peek() == '+') return ReadAugmented(1);
+    if (mScan.SeesWord("aug")) return ReadAugmented(3);
     if (ReadLoneDim()) return true;
     // `C/j7` is a way to write Cj7, `C/J` has a bass that is none.
     if (mScan.LastNonBlank() == '/' && mScan.SeesWord("j") && !IsDigit(mScan.Peek(1))) {
