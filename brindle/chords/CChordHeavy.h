@@ -329,7 +329,6 @@ private:
     [[nodiscard]] int _IntvlOfNote(const CNote& note) const;
     /// From the root up to the key of the lowest note, 0 to 11.
     [[nodiscard]] int _BassIntvl() const;
-    [[nodiscard]] bool _IsDominantOfMinor(const CSignKeyHeavy& signKey) const;
     /// The note, its spelling repaired, in that of itself and its neighbours with which the chord
     /// on it needs the fewest signs.
     [[nodiscard]] CNote _RootWithLeastSigns(CNote given) const;

@@ -109,7 +109,6 @@ public:
     friend std::ostream& operator<<(std::ostream& stream, const NeuronalNet& net);
 
 private:
-    [[nodiscard]] std::size_t _LayerWidth(std::size_t layer) const;
     [[nodiscard]] std::span<const double> _InputsOfLayer(std::size_t layer);
     [[nodiscard]] double _SquaredError(const std::vector<double>& wanted) const;
     void _CalculateDeltas(const std::vector<double>& wanted);

@@ -23,7 +23,6 @@ public:
     void MakeAugmented();
 
     /// The third that sounds unless the chord is suspended: 4, 3, or 0 for none.
-    [[nodiscard]] int Third() const { return mThird; }
     /// The first number that was stacked, 0 for none.
     [[nodiscard]] int FirstNumber() const { return mFirstNumber; }
     [[nodiscard]] bool IsMajorMarked() const { return mIsMajorMarked; }

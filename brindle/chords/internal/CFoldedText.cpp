@@ -113,9 +113,4 @@ void CFoldedText::TakeInsideOfBrackets() {
     }
 }
 
-std::string_view CFoldedText::TrimmedInput() const {
-    const std::size_t begin = mOffsets[mBegin];
-    return mInput.substr(begin, mOffsets[mEnd] - begin);
-}
-
 }  // namespace brindle::ChordText

@@ -23,8 +23,6 @@ public:
         return std::string_view(mLower.data(), mEnd).substr(mBegin);
     }
     [[nodiscard]] std::string_view Input() const { return mInput; }
-    /// What Text comes from, unfolded.
-    [[nodiscard]] std::string_view TrimmedInput() const;
     /// The byte of the input that character `pos` of Text comes from; `pos` may be its size.
     [[nodiscard]] std::size_t InputOffset(std::size_t pos) const { return mOffsets[mBegin + pos]; }
 
