@@ -157,7 +157,7 @@ public:
 
     [[nodiscard]] nlohmann::json propertyList() const;
 
-    // Its chunk in a library file (in LibraryFile.cpp)
+    // Its chunk in a library file (the layout is in internal/LibraryFile.h)
 
     [[nodiscard]] std::size_t chordChunkSize() const;
     /// writeChordChunkToBuffer:remLength: the size of the chunk, 0 if it does not fit.

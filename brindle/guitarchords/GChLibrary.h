@@ -51,7 +51,7 @@ public:
     void replaceChordRange2(const std::shared_ptr<GChBasicChord>& chord,
                             const std::shared_ptr<GChBasicChord>& withChord);
 
-    // Its file (the layout is in LibraryFile.cpp)
+    // Its file (the layout is in internal/LibraryFile.h)
 
     /// 0 when the tuning is gone. A name that is no UTF-8 counts and is written as a missing one.
     [[nodiscard]] std::size_t tuningChunkSize() const;

@@ -9,6 +9,10 @@
 #include <string>
 #include <string_view>
 
+namespace brindle {
+class GChBasicChord;
+}
+
 /// The layout of a library file, for its writer and its reader.
 ///
 /// All numbers are big-endian. A string field is a 32-bit size that counts itself, then the text in
@@ -100,5 +104,8 @@ enum class THeadFault { None, NoLibrary, NoTuningChunk, Damaged };
 
 /// Reads header and tuning chunk. The result refers to `bytes`.
 [[nodiscard]] THeadFault ReadHead(std::string_view bytes, TLibraryHead& head);
+
+/// Reads a whole chord chunk without its name. False if the chunk ends before its fields do.
+[[nodiscard]] bool ReadChordBody(std::string_view chunk, GChBasicChord& chord);
 
 }  // namespace brindle::LibraryFile
