@@ -73,6 +73,62 @@ private:
     std::vector<std::size_t> mPrevious;
 };
 
+/// The two walks over a list that has chords.
+class CSweeps {
+public:
+    CSweeps(const CHarmAnlsChords& chords, CHarmAnlsCenterAlternatives& alternatives)
+        : mChords(chords),
+          mAlternatives(alternatives),
+          mTolerating(chords.size()),
+          mReadings(chords.size()) {}
+
+    /// From the front: adds all readings, grown over the chords before their match.
+    void FindReadings(const CHarmAnlsProgressions& progressions) {
+        CProgressionFinder finder(progressions, mChords);
+        CPlaceForEachCenter runBegin(0);
+        for (std::size_t n = 0; n < mChords.size(); ++n) {
+            const auto bestRows = finder.BestRowsAt(n);
+            const double probability = 1.0 / static_cast<double>(bestRows.size());
+            for (const CHarmAnlsProgression* row : bestRows) {
+                AddReading(*row, n, probability, runBegin);
+            }
+            mTolerating[n] = ModalCenters::CentersTolerating(mChords[n]);
+            runBegin.MoveOthers(mTolerating[n], n + 1);
+        }
+    }
+
+    /// From the back: grows the readings over the chords behind their match. The last chord of the
+    /// list, as a rule the end marker, is never taken in.
+    void GrowToTheirEnds() {
+        CPlaceForEachCenter nextBreak(mChords.size() - 1);
+        for (std::size_t n = mChords.size() - 1; n-- > 0;) {
+            nextBreak.MoveOthers(mTolerating[n], n);
+            mReadings.ForEachAt(n, [&](std::size_t reading) {
+                CHarmAnlsCenterInChords& center = mAlternatives[reading].mCenters.front();
+                center.mEnd = At(nextBreak.Of(center.mCenter));
+            });
+        }
+    }
+
+private:
+    [[nodiscard]] CHarmAnlsChords::const_iterator At(std::size_t n) const {
+        return mChords.cbegin() + static_cast<std::ptrdiff_t>(n);
+    }
+    void AddReading(const CHarmAnlsProgression& row, std::size_t n, double probability,
+                    const CPlaceForEachCenter& runBegin) {
+        const CHarmCenterLite center =
+            row.HarmCenterCalculatedFromFoundProgressionLastChord(At(n), mChords);
+        const std::size_t end = n + row.size();
+        mAlternatives.push_back({probability, {{center, At(runBegin.Of(center)), At(end)}}});
+        mReadings.Append(end);
+    }
+
+    const CHarmAnlsChords& mChords;
+    CHarmAnlsCenterAlternatives& mAlternatives;
+    std::vector<TCenters> mTolerating;
+    CReadingsByEnd mReadings;
+};
+
 }  // namespace
 
 CAnalyseHarmCenterAlternatives::CAnalyseHarmCenterAlternatives(const CHarmAnlsChords& chords)
@@ -120,37 +176,9 @@ void CAnalyseHarmCenterAlternatives::_AnalyseSingleChord() {
 
 void CAnalyseHarmCenterAlternatives::_AnalyseSeveralChords() {
     if (mChords.empty()) return;
-    const auto at = [this](std::size_t n) {
-        return mChords.cbegin() + static_cast<std::ptrdiff_t>(n);
-    };
-    CProgressionFinder finder(mProgressions, mChords);
-    CReadingsByEnd readings(mChords.size());
-    std::vector<TCenters> tolerating(mChords.size());
-
-    CPlaceForEachCenter runBegin(0);
-    for (std::size_t n = 0; n < mChords.size(); ++n) {
-        const auto bestRows = finder.BestRowsAt(n);
-        for (const CHarmAnlsProgression* row : bestRows) {
-            const CHarmCenterLite center =
-                row->HarmCenterCalculatedFromFoundProgressionLastChord(at(n), mChords);
-            const std::size_t end = n + row->size();
-            mAlternatives.push_back({1.0 / static_cast<double>(bestRows.size()),
-                                     {{center, at(runBegin.Of(center)), at(end)}}});
-            readings.Append(end);
-        }
-        tolerating[n] = ModalCenters::CentersTolerating(mChords[n]);
-        runBegin.MoveOthers(tolerating[n], n + 1);
-    }
-
-    // The last chord of the list, as a rule the end marker, is never taken in.
-    CPlaceForEachCenter nextBreak(mChords.size() - 1);
-    for (std::size_t n = mChords.size() - 1; n-- > 0;) {
-        nextBreak.MoveOthers(tolerating[n], n);
-        readings.ForEachAt(n, [&](std::size_t reading) {
-            CHarmAnlsCenterInChords& center = mAlternatives[reading].mCenters.front();
-            center.mEnd = at(nextBreak.Of(center.mCenter));
-        });
-    }
+    CSweeps sweeps(mChords, mAlternatives);
+    sweeps.FindReadings(mProgressions);
+    sweeps.GrowToTheirEnds();
 }
 
 }  // namespace brindle

@@ -11,7 +11,8 @@ namespace brindle {
 class CHarmAnlsSignKey;
 
 /// A harmonic center, the chords that it governs, and where it begins. It holds until the next
-/// center of its list begins.
+/// center of its list begins; where that is in another tonality, the music modulates, or tonicizes
+/// a degree for a few chords.
 class CHarmAnlsCenter {
 public:
     /// 0 to 1, more where equal readings were added up; `kPosUndef` when no route stated one.

@@ -53,11 +53,11 @@ CHarmAnlsProgressions MakeTonicProgressions() {
         {{{Major, 7}, {Major, 0}},                                                   8, kMajor},
         {{{Major, 0}, {Major, 5}},                                                   8, kMajor},  // ends on the subdominant
         {{{Diminished, 11}, {Major, 0}},                                             8, kMajor},
-        {{{Dominant7, 1}, {Major, 0}},                                               8, kMajor},
+        {{{Dominant7, 1}, {Major, 0}},                                               8, kMajor},  // the tritone substitute of the dominant
         {{{Minor, 2}, {Major, 7}, {Major, 0}},                                       8, kMajor},
         {{{Minor, 5}, {Major, 7}, {Major, 0}},                                       6, kMajor},
-        {{{Major, 9}, {Minor, 2}, {Major, 7}, {Major, 0}},                           8, kMajor},
-        {{{Major, 5}, {Minor, 5}, {Major, 0}},                                       4, kMajor},
+        {{{Major, 9}, {Minor, 2}, {Major, 7}, {Major, 0}},                           8, kMajor},  // a secondary dominant first, that of the second degree
+        {{{Major, 5}, {Minor, 5}, {Major, 0}},                                       4, kMajor},  // the minor subdominant is borrowed from the parallel key
         {{{Major, 5}, {HalfDiminished, 2}, {Major, 0}},                             10, kMajor},
         {{{Major, 5}, {Major, 7}, {Minor, 9}},                                       4, kMajor},  // deceptive: the tonic does not sound
         {{{Major, 0}, {Major, 5}, {HalfDiminished, 2}, {Major, 0}},                  4, kMajor},

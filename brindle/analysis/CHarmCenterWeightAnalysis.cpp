@@ -17,12 +17,12 @@ namespace brindle {
 
 namespace {
 
-using ModalCenters::kKeyCenters;
 using ModalCenters::kMinorOffset;
+using ModalCenters::kTonalityCount;
 
 /// From C major up to B major, then from C minor up to B minor: the places of ModalCenters, and
 /// the order in which the keys compete.
-using TWeights = std::array<double, kKeyCenters>;
+using TWeights = std::array<double, kTonalityCount>;
 
 CSignKeyLite SignKeyAt(std::size_t place) {
     constexpr TEnh enhs[] = {TEnh_n, TEnh_b, TEnh_n, TEnh_b, TEnh_n, TEnh_n,
@@ -34,7 +34,7 @@ CSignKeyLite SignKeyAt(std::size_t place) {
 
 int SignsCountAbs(std::size_t place) {
     static const auto counts = [] {
-        std::array<int, kKeyCenters> signs{};
+        std::array<int, kTonalityCount> signs{};
         for (std::size_t n = 0; n < signs.size(); ++n) {
             const CSignKeyLite signKey = SignKeyAt(n);
             signs[n] = std::abs(SignsCountForSignKeyWithKeyEnhAndSignKeyType(signKey.mRootKeyEnh,
@@ -49,7 +49,7 @@ int SignsCountAbs(std::size_t place) {
 /// the chords, since equal weights are told by exact comparison.
 void AddChord(TWeights& weights, const CChordLite& chord, double length, bool isAtBorder) {
     const double bonus = 0.1 * length;
-    auto owning = ModalCenters::KeysOwning(chord) & ((1u << kKeyCenters) - 1);
+    auto owning = ModalCenters::CentersOwning(chord) & ((1u << kTonalityCount) - 1);
     for (; owning != 0; owning &= owning - 1) {
         const auto place = static_cast<std::size_t>(std::countr_zero(owning));
         double& weight = weights[place];
@@ -89,7 +89,7 @@ std::optional<std::size_t> Heaviest(std::span<const double> weights, bool& isAmb
 
 std::size_t CountOfKeysToWeigh(std::int32_t keysToWeigh) {
     if (keysToWeigh == 0) return kMinorOffset;
-    return keysToWeigh == 1 ? kKeyCenters : 0;
+    return keysToWeigh == 1 ? kTonalityCount : 0;
 }
 
 }  // namespace

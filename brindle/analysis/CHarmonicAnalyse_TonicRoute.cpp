@@ -84,36 +84,52 @@ CHarmAnlsCenter UndefCenterAt(double position) {
     return center;
 }
 
+// What a walk goes through. Its center is the one that is looked for now; the walk asks
+//   NextBestRow  for the next row that matches, from where the walk stands, and where it does;
+//   Chords       for the chords, of which those from Begin on can belong to the center;
+//   GiveRange    to give the center its chords. False when nothing is left to walk through;
+//   GoOn         to make the next center ready;
+//   Finish       for what is to be done when no row matches any more.
+
 /// The last center of a sign key, and behind the chords that it has taken those that are left.
 class CRemainder {
 public:
-    explicit CRemainder(CHarmAnlsCenters& centers)
-        : mCenters(centers), mChords(std::move(centers.back().mChords)) {
-        centers.back().mChords.clear();
+    CRemainder(CHarmAnlsSignKey& signKey, const CHarmAnlsProgressions& progressions)
+        : mSignKey(signKey),
+          mCenters(signKey.mHarmCenters),
+          mChords(std::move(mCenters.back().mChords)),
+          mFinder(progressions, mChords) {
+        mCenters.back().mChords.clear();
     }
 
     [[nodiscard]] const CHarmAnlsChords& Chords() const { return mChords; }
     [[nodiscard]] std::size_t Begin() const { return mBegin; }
-
+    [[nodiscard]] CHarmAnlsCenter& Center() { return mCenters.back(); }
+    const CHarmAnlsProgression* NextBestRow(std::size_t& at) {
+        at = mBegin;
+        return mFinder.NextBestRow(at);
+    }
     /// What ChangeRangeOfHarmCenter does: the chords before the range go to the preceding center if
-    /// the center was to reach that far, and those behind it are left for a new one. Returns
-    /// whether there are any.
+    /// the center was to reach that far, and those behind it are left for a new one.
     bool GiveRange(TMatchedRange range) {
         const double start = mChords[range.mFirst].mPosition;
-        if (mCenters.back().mPosition < start) GiveToPreceding(range.mFirst);
-        mCenters.back().mPosition = start;
+        if (Center().mPosition < start) GiveToPreceding(range.mFirst);
+        Center().mPosition = start;
         GiveChords(range.mNext);
         return mBegin < mChords.size();
     }
-    void AppendCenter() { mCenters.push_back(UndefCenterAt(mChords[mBegin].mPosition)); }
-    void GiveAllChords() { GiveChords(mChords.size()); }
+    void GoOn() {
+        mCenters.push_back(UndefCenterAt(mChords[mBegin].mPosition));
+        Center().IfUndefFillWithHarmSignKey(mSignKey);
+    }
+    void Finish() { GiveChords(mChords.size()); }
 
 private:
     [[nodiscard]] CHarmAnlsChords::const_iterator At(std::size_t n) const {
         return mChords.begin() + static_cast<std::ptrdiff_t>(n);
     }
     void GiveChords(std::size_t end) {
-        mCenters.back().mChords.assign(At(mBegin), At(end));
+        Center().mChords.assign(At(mBegin), At(end));
         mBegin = end;
     }
     void GiveToPreceding(std::size_t first) {
@@ -128,48 +144,60 @@ private:
         mBegin = end;
     }
 
+    CHarmAnlsSignKey& mSignKey;
     CHarmAnlsCenters& mCenters;
     CHarmAnlsChords mChords;
+    CProgressionFinder mFinder;
     std::size_t mBegin = 0;
 };
 
-/// The walk through the last center and all that split off behind it.
-void WalkRemainder(CHarmAnlsSignKey& signKey, const CHarmAnlsProgressions& progressions) {
-    CHarmAnlsCenters& centers = signKey.mHarmCenters;
-    CRemainder remainder(centers);
-    CProgressionFinder finder(progressions, remainder.Chords());
-    for (;;) {
-        std::size_t at = remainder.Begin();
-        const CHarmAnlsProgression* row = finder.NextBestRow(at);
-        if (row == nullptr) return remainder.GiveAllChords();
-        TakeScale(centers.back(), *row, remainder.Chords(), at);
-        const bool hasMore = remainder.GiveRange(
-            RangeOfMatch(centers.back().mHarmCenter, remainder.Chords(), remainder.Begin(), at));
-        signKey.IfUndefFillWithHarmAnlsCenter(centers.back());
-        if (!hasMore) return;
-        remainder.AppendCenter();
-        centers.back().IfUndefFillWithHarmSignKey(signKey);
-    }
-}
+/// One center among others, which ChangeRangeOfHarmCenter keeps in order.
+class COneCenter {
+public:
+    COneCenter(CHarmAnlsCenters& centers, std::size_t n, const CHarmAnlsProgressions& progressions)
+        : mCenters(centers), mProgressions(progressions), mIndex(n) {}
 
-/// The walk through one center. Returns its index, which can have moved.
-std::size_t WalkCenter(CHarmAnlsSignKey& signKey, std::size_t n,
-                       const CHarmAnlsProgressions& progressions) {
-    CHarmAnlsCenters& centers = signKey.mHarmCenters;
-    std::size_t at = 0;
-    for (;;) {
-        const CHarmAnlsChords& chords = centers[n].mChords;
-        const CHarmAnlsProgression* row = CProgressionFinder(progressions, chords).NextBestRow(at);
-        if (row == nullptr) return n;
-        TakeScale(centers[n], *row, chords, at);
-        const TMatchedRange range = RangeOfMatch(centers[n].mHarmCenter, chords, 0, at);
-        const auto center = centers.ChangeRangeOfHarmCenter(
-            centers.begin() + static_cast<std::ptrdiff_t>(n), chords[range.mFirst].mPosition,
-            PositionAt(chords, range.mNext));
-        n = static_cast<std::size_t>(center - centers.begin());
+    /// It can move.
+    [[nodiscard]] std::size_t Index() const { return mIndex; }
+
+    [[nodiscard]] const CHarmAnlsChords& Chords() const { return mCenters[mIndex].mChords; }
+    [[nodiscard]] static std::size_t Begin() { return 0; }
+    [[nodiscard]] CHarmAnlsCenter& Center() { return mCenters[mIndex]; }
+    const CHarmAnlsProgression* NextBestRow(std::size_t& at) {
+        at = mNext;
+        return CProgressionFinder(mProgressions, Chords()).NextBestRow(at);
+    }
+    bool GiveRange(TMatchedRange range) {
+        const auto center = mCenters.ChangeRangeOfHarmCenter(
+            mCenters.begin() + static_cast<std::ptrdiff_t>(mIndex),
+            Chords()[range.mFirst].mPosition, PositionAt(Chords(), range.mNext));
+        mIndex = static_cast<std::size_t>(center - mCenters.begin());
         // Kept: the index counts from the front of the list as it was before the change.
-        at = range.mNext;
-        signKey.IfUndefFillWithHarmAnlsCenter(*center);
+        mNext = range.mNext;
+        return true;
+    }
+    void GoOn() {}
+    void Finish() {}
+
+private:
+    CHarmAnlsCenters& mCenters;
+    const CHarmAnlsProgressions& mProgressions;
+    std::size_t mIndex;
+    std::size_t mNext = 0;
+};
+
+template <class Piece>
+void Walk(CHarmAnlsSignKey& signKey, Piece& piece) {
+    for (;;) {
+        std::size_t at = 0;
+        const CHarmAnlsProgression* row = piece.NextBestRow(at);
+        if (row == nullptr) return piece.Finish();
+        TakeScale(piece.Center(), *row, piece.Chords(), at);
+        const bool hasMore = piece.GiveRange(
+            RangeOfMatch(piece.Center().mHarmCenter, piece.Chords(), piece.Begin(), at));
+        signKey.IfUndefFillWithHarmAnlsCenter(piece.Center());
+        if (!hasMore) return;
+        piece.GoOn();
     }
 }
 
@@ -205,8 +233,13 @@ void CHarmonicAnalyse::_FindAndInsertHarmCenterUsingTonicProgressions_ForSignKey
     for (std::size_t n = 0; n < std::min(centers.size(), mostCenters); ++n) {
         if (onlyUndef == TOnlyUndefCenters_Yes && !centers[n].IsUndef()) continue;
         centers[n].IfUndefFillWithHarmSignKey(signKey);
-        if (IsRemainder(centers, n)) return WalkRemainder(signKey, mProgressions);
-        n = WalkCenter(signKey, n, mProgressions);
+        if (IsRemainder(centers, n)) {
+            CRemainder remainder(signKey, mProgressions);
+            return Walk(signKey, remainder);
+        }
+        COneCenter center(centers, n, mProgressions);
+        Walk(signKey, center);
+        n = center.Index();
     }
 }
 

@@ -2,6 +2,7 @@
 #include "brindle/analysis/ModalCenters.h"
 
 #include "brindle/analysis/CSemitonesMatch.h"
+#include "brindle/theory/KeyIntervals.h"
 
 #include <array>
 #include <bit>
@@ -11,49 +12,45 @@ namespace brindle::ModalCenters {
 
 namespace {
 
-constexpr std::uint32_t kAllKeys = 0xFFF;
+constexpr std::uint32_t kAllPitchClasses = 0xFFF;
 constexpr TCenters kAll = (TCenters{1} << kCount) - 1;
 
 /// The twelve lowest bits moved up by 0 to 11 places, round the octave.
-constexpr TKeys RotatedUp(std::uint64_t mask, int places) {
-    const auto keys = static_cast<std::uint32_t>(mask & kAllKeys);
-    return (keys << places | keys >> (12 - places)) & kAllKeys;
+constexpr TPitchClasses RotatedUp(std::uint64_t mask, int places) {
+    const auto keys = static_cast<std::uint32_t>(mask & kAllPitchClasses);
+    return (keys << places | keys >> (12 - places)) & kAllPitchClasses;
 }
 
-constexpr int KeyInOctave(int keyNr) {
-    const int key = keyNr % 12;
-    return key < 0 ? key + 12 : key;
-}
-
-/// For each key the centers whose scale holds it.
-constexpr auto kCentersHoldingKey = [] {
-    std::array<TCenters, 12> centersHoldingKey{};
+/// For each pitch class the centers whose scale holds it.
+constexpr auto kCentersHoldingPitchClass = [] {
+    std::array<TCenters, 12> holding{};
     for (int center = 0; center < 12; ++center) {
-        const TKeys major = RotatedUp(kSemitonesMajor.Mask(), center);
-        const TKeys minor = RotatedUp(kSemitonesNaturalMinor.Mask(), center);
+        const TPitchClasses major = RotatedUp(kSemitonesMajor.Mask(), center);
+        const TPitchClasses minor = RotatedUp(kSemitonesNaturalMinor.Mask(), center);
         for (std::size_t key = 0; key < 12; ++key) {
             const TCenters bit = TCenters{1} << center;
-            if (major >> key & 1) centersHoldingKey[key] |= bit;
-            if (minor >> key & 1) centersHoldingKey[key] |= bit << kMinorOffset;
+            if (major >> key & 1) holding[key] |= bit;
+            if (minor >> key & 1) holding[key] |= bit << kMinorOffset;
         }
     }
-    return centersHoldingKey;
+    return holding;
 }();
 
-/// The major center that lies `intvl` semitones below a key.
+/// The major center that lies `intvl` semitones below a pitch class.
 constexpr TCenters MajorBelow(int keyNr, int intvl) {
-    return TCenters{1} << KeyInOctave(keyNr - intvl);
+    return TCenters{1} << FoldIntoOctave(keyNr - intvl);
 }
 
-/// The major and the minor center that have the key as their fifth degree.
+/// The major and the minor center that have the pitch class as their fifth degree: the chord on it
+/// is their dominant, and in any other center their secondary dominant.
 constexpr TCenters CentersWithFifthDegree(int keyNr) {
     const TCenters major = MajorBelow(keyNr, 7);
     return major | major << kMinorOffset;
 }
 
-/// The major centers that borrow the chord: Eb, Bb and Fm in C.
+/// The major centers that borrow the chord from their parallel minor: Eb, Bb and Fm in C.
 TCenters CentersBorrowing(const CChordLite& chord) {
-    const int root = KeyInOctave(chord.mRootKeyEnh.mKeyNr);
+    const int root = FoldIntoOctave(chord.mRootKeyEnh.mKeyNr);
     TCenters centers = 0;
     if (ChordPattern::Major.Matches(chord.mSemitones)) {
         centers |= MajorBelow(root, 3) | MajorBelow(root, 10);
@@ -71,43 +68,43 @@ bool HasMajorThird(const CChordLite& chord) {
 
 }  // namespace
 
-TKeys KeysAbove(int rootKeyNr, CSemitones semitones) {
-    return RotatedUp(semitones.Mask(), KeyInOctave(rootKeyNr));
+TPitchClasses PitchClassesAbove(int rootKeyNr, CSemitones semitones) {
+    return RotatedUp(semitones.Mask(), FoldIntoOctave(rootKeyNr));
 }
 
-TKeys KeysOf(const CChordLite& chord) {
+TPitchClasses PitchClassesOf(const CChordLite& chord) {
     if (chord.IsUndef()) return 0;
     const CKeyEnh& lowest = chord.mBassKeyEnh.IsUndef() ? chord.mRootKeyEnh : chord.mBassKeyEnh;
-    return KeysAbove(chord.mRootKeyEnh.mKeyNr, chord.mSemitones) |
-           TKeys{1} << KeyInOctave(lowest.mKeyNr);
+    return PitchClassesAbove(chord.mRootKeyEnh.mKeyNr, chord.mSemitones) |
+           TPitchClasses{1} << FoldIntoOctave(lowest.mKeyNr);
 }
 
 int PlaceOf(const CHarmCenterLite& center) {
-    const int key = KeyInOctave(center.mRootKeyEnh.mKeyNr);
+    const int key = FoldIntoOctave(center.mRootKeyEnh.mKeyNr);
     if (center.mSemitones == kSemitonesMajor) return key;
     if (center.mSemitones == kSemitonesNaturalMinor) return key + kMinorOffset;
     return kNoScale;
 }
 
-TCenters CentersHolding(TKeys keys) {
+TCenters CentersHolding(TPitchClasses keys) {
     TCenters centers = kAll;
     for (; keys != 0; keys &= keys - 1) {
-        centers &= kCentersHoldingKey[static_cast<std::size_t>(std::countr_zero(keys))];
+        centers &= kCentersHoldingPitchClass[static_cast<std::size_t>(std::countr_zero(keys))];
     }
     return centers;
 }
 
 TCenters CentersTolerating(const CChordLite& chord) {
     if (chord.IsUndef()) return kAll;
-    return CentersHolding(KeysOf(chord)) | CentersWithFifthDegree(chord.mRootKeyEnh.mKeyNr) |
-           CentersBorrowing(chord);
+    return CentersHolding(PitchClassesOf(chord)) |
+           CentersWithFifthDegree(chord.mRootKeyEnh.mKeyNr) | CentersBorrowing(chord);
 }
 
-TCenters KeysOwning(const CChordLite& chord) {
+TCenters CentersOwning(const CChordLite& chord) {
     if (chord.IsUndef()) return 0;
     const TCenters dominantOf =
         CentersWithFifthDegree(chord.mRootKeyEnh.mKeyNr) >> kMinorOffset << kMinorOffset;
-    const TCenters owning = CentersHolding(KeysOf(chord));
+    const TCenters owning = CentersHolding(PitchClassesOf(chord));
     return HasMajorThird(chord) ? owning | dominantOf : owning & ~dominantOf;
 }
 

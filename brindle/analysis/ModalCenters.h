@@ -11,35 +11,36 @@ namespace brindle {
 /// The harmonic centers that the analysis knows, the twelve major and the twelve natural minor
 /// keys, as bits of one number, so that a chord is tried on all of them at once.
 ///
-/// Bit k is the major center on key k, bit 12 + k the minor one. Bit 24 stands for a center
+/// Bit k is the major center on pitch class k, bit 12 + k the minor one. Bit 24 stands for a center
 /// without a scale.
 namespace ModalCenters {
 
-/// Keys as a set: bit n is key n.
-using TKeys = std::uint32_t;
+/// Pitch classes as a set: bit n is that of number n.
+using TPitchClasses = std::uint32_t;
 using TCenters = std::uint32_t;
 
 inline constexpr int kMinorOffset = 12;
-inline constexpr int kKeyCenters = 24;
+inline constexpr int kTonalityCount = 24;
 inline constexpr int kNoScale = 24;
 inline constexpr int kCount = 25;
 
-/// The set of the intervals above a root as keys; key numbers outside 0 to 11 are reduced.
-[[nodiscard]] TKeys KeysAbove(int rootKeyNr, CSemitones semitones);
-/// The keys that sound: the tones, and the bass, or else the root. None for an undefined chord.
-[[nodiscard]] TKeys KeysOf(const CChordLite& chord);
+/// The set of the intervals above a root as pitch classes; key numbers outside 0 to 11 are reduced.
+[[nodiscard]] TPitchClasses PitchClassesAbove(int rootKeyNr, CSemitones semitones);
+/// The pitch classes that sound: the tones, and the bass, or else the root. None for an undefined
+/// chord.
+[[nodiscard]] TPitchClasses PitchClassesOf(const CChordLite& chord);
 
-/// The bit number of a center on a key from 0 to 11: major, natural minor, or no scale.
+/// The bit number of a center on a pitch class from 0 to 11: major, natural minor, or no scale.
 [[nodiscard]] int PlaceOf(const CHarmCenterLite& center);
 
-/// The centers whose scale holds all the keys.
-[[nodiscard]] TCenters CentersHolding(TKeys keys);
+/// The centers whose scale holds all the pitch classes.
+[[nodiscard]] TCenters CentersHolding(TPitchClasses keys);
 /// The centers that tolerate the chord, as ScaleLite::ChordIsCompatibleWithScale tells.
 [[nodiscard]] TCenters CentersTolerating(const CChordLite& chord);
 /// The centers that the chord belongs to as to a key, as CChordHeavy::IsInSignKeyRegardlessOfEnh
 /// tells: its tones are in the scale, only the dominant of a minor key needs its major third
 /// instead. Bit 24 has no meaning here. None for an undefined chord.
-[[nodiscard]] TCenters KeysOwning(const CChordLite& chord);
+[[nodiscard]] TCenters CentersOwning(const CChordLite& chord);
 
 }  // namespace ModalCenters
 }  // namespace brindle

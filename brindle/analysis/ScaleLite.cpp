@@ -34,11 +34,11 @@ bool StandsOnFifthDegree(const CChordLite& chord, const CScaleLite& scale) {
 }
 
 bool IsDiatonic(const CChordLite& chord, const CScaleLite& scale) {
-    const auto scaleKeys =
+    const auto inScale =
         scale.mRootKeyEnh.IsUndef()
-            ? ModalCenters::TKeys{0}
-            : ModalCenters::KeysAbove(scale.mRootKeyEnh.mKeyNr, scale.mSemitones);
-    return (ModalCenters::KeysOf(chord) & ~scaleKeys) == 0;
+            ? ModalCenters::TPitchClasses{0}
+            : ModalCenters::PitchClassesAbove(scale.mRootKeyEnh.mKeyNr, scale.mSemitones);
+    return (ModalCenters::PitchClassesOf(chord) & ~inScale) == 0;
 }
 
 }  // namespace

@@ -114,7 +114,7 @@ TEST_CASE("Chords are tried on all keys at once as on each full scale") {
                 REQUIRE(((ModalCenters::CentersTolerating(chord) & bit) != 0) == isCompatible);
                 REQUIRE(ScaleLite::ChordIsCompatibleWithScale(chord, center.ToScaleLite()) ==
                         isCompatible);
-                REQUIRE(((ModalCenters::KeysOwning(chord) & bit) != 0) ==
+                REQUIRE(((ModalCenters::CentersOwning(chord) & bit) != 0) ==
                         PlainIsInSignKey(chord, signKey));
             }
         }

@@ -49,6 +49,13 @@ TPlace COccurrences::SearchTandem(TPlace place) const {
 // that does not overlap it, and does not follow it at once. To try one occurrence of a row after
 // the other would make the search quadratic in lists that repeat a few chords all the time, so
 // whole rows are passed over.
+//
+//   symbols  a b a b a b a b a c a b a b a     the passage is "a b a b a", its period 2
+//   places   0   2   4         10              two rows, 0 2 4 and 10
+//
+// A tandem would be two places 5 apart. From place 0 on the next one without overlap is 10, the
+// first of its row: no occurrence before 5 has one directly behind it, and the search goes on
+// there. In one row alone, 0 2 4 6, all distances are even and none is 5.
 TPlace COccurrences::PlaceBehindFailedTandem(TPlace place, TPlace follower) const {
     const TPlace period = Next(place + 1) - place;
     if (2 * period > mLength) return follower - mLength;

@@ -20,6 +20,13 @@ namespace brindle {
 /// not like it, so until the first one unlike it only tandems are left to be taken, and behind that
 /// one nothing is free at all. From then on each occurrence can only take itself. What is left
 /// costs a few searches for each start, of which there are at most 3 in the length of a passage.
+///
+///     symbols   a b x  a b x  a b y  a b x      the passage is "a b"
+///     place     0      3      6      9
+///
+/// Place 0 is the first: it goes on with x, so that its partner is the one with y. It takes 6, and
+/// then itself. 6 is the first unlike it; before that, 3 is no tandem but has the partner 6, and
+/// takes itself. 6 takes its partner 9, and nothing is left for 9.
 class CPassageStarts {
 public:
     explicit CPassageStarts(const CSuffixes& suffixes)

@@ -17,9 +17,11 @@ struct TRanks {
     [[nodiscard]] TPlace size() const { return mEnd - mFirst; }
 };
 
-/// All suffixes of a list of symbols in sorted order. The suffixes that begin with the same
-/// symbols stand side by side, so that any passage of the list is a range of ranks, and the range
-/// holds all its occurrences.
+/// All suffixes of a list of symbols in sorted order: a suffix array, with what neighbours share
+/// (the LCP array, the lengths of their longest common prefixes) and a wavelet matrix of the
+/// places, which finds the next occurrence of a passage without looking at all of them. The
+/// suffixes that begin with the same symbols stand side by side, so that any passage of the list is
+/// a range of ranks, and the range holds all its occurrences.
 ///
 /// Built by doubling: the order by the first 2k symbols comes from that by the first k. Takes
 /// n log n steps and room; each question takes at most log n steps.
@@ -42,7 +44,9 @@ public:
     [[nodiscard]] TPlace NextPlace(TRanks ranks, TPlace place) const;
 
 private:
+    /// By prefix doubling.
     void SortSuffixes(const std::vector<TPlace>& symbols);
+    /// Fills the LCP array in one walk over the places.
     void CompareNeighbours(const std::vector<TPlace>& symbols);
     void MakeMinima();
     void SplitByBits();
@@ -52,10 +56,11 @@ private:
 
     std::vector<TPlace> mPlaceOfRank;
     std::vector<TPlace> mRankOfPlace;
-    // Row k: the least of 2^k entries of SharedWithPrevious from a rank on.
+    // The LCP array, and behind it row k: the least of 2^k of its entries from a rank on (a sparse
+    // table of range minima).
     std::vector<std::vector<TPlace>> mShared;
-    // Row k: the places split stably by their bits, the highest first; how many of the first so
-    // many have a 0. The last entry is the number of all that have.
+    // The wavelet matrix. Row k: the places split stably by their bits, the highest first; how many
+    // of the first so many have a 0. The last entry is the number of all that have.
     std::vector<std::vector<TPlace>> mZerosBefore;
 };
 

@@ -42,8 +42,8 @@ inline constexpr std::size_t kKeyChordClassCount = 8;
 /// A chord of a song as long as it sounds, whatever the number of times that it is written.
 struct TKeyChord {
     TKeyChordClass mClass;
-    int mRoot;  ///< key number, 0 to 11
-    int mBass;  ///< key number, that of the root without a bass
+    int mRoot;  ///< pitch class, 0 to 11
+    int mBass;  ///< pitch class, that of the root without a bass
     bool mHasBass;
     CSemitones mSemitones;
     double mBeats;
