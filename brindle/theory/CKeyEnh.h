@@ -13,7 +13,8 @@ namespace brindle {
 
 struct CChordNamePrefs;
 
-/// Key number of no key. Real key numbers are 0 (C) to 11 (B).
+/// Key number of no key. Real key numbers are 0 (C) to 11 (B): pitch classes, the keys of a
+/// keyboard in any octave.
 inline constexpr int kKeyNrUndef = 15;
 
 /// Whether the key is one of the five black keys. 15 is not tested: its remainder by 12 is 3, so it
@@ -28,7 +29,8 @@ inline constexpr int kKeyNrUndef = 15;
     return !IsBlackKey(keyNr);
 }
 
-/// A key together with its spelling: C sharp and D flat are one key, two CKeyEnh.
+/// A pitch class together with its spelling: C sharp and D flat are one key, two CKeyEnh. They are
+/// enharmonic.
 ///
 /// The fields are not checked against each other; HasSensefulEnh tells whether the pair can be
 /// written down.

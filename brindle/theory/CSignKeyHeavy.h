@@ -43,7 +43,8 @@ public:
     [[nodiscard]] int KeyNrToSignKeyKeyNr(int keyNr) const;
     [[nodiscard]] int SignKeyKeyNrToKeyNr(int signKeyKeyNr) const;
 
-    /// The key with the same signature in the other type: A minor for C major, and back.
+    /// The relative key, despite the given name: the one with the same signature in the other
+    /// type, A minor for C major, and back. (C minor would be the parallel key.)
     [[nodiscard]] CSignKeyHeavy ParallelSignKey() const;
     /// The major key with the same signature.
     [[nodiscard]] CSignKeyHeavy IonicSignKey() const;

@@ -62,7 +62,8 @@ struct CSignKeyLite {
     [[nodiscard]] int SignsCount() const;
     [[nodiscard]] int SignsCountAbs() const;
 
-    /// The key with the same signature in the other type: A minor for C major, and back.
+    /// The relative key, despite the given name: the one with the same signature in the other
+    /// type, A minor for C major, and back. (C minor would be the parallel key.)
     [[nodiscard]] CSignKeyLite ParallelSignKey() const;
     /// The major key with the same signature.
     [[nodiscard]] CSignKeyLite IonicSignKey() const;

@@ -58,7 +58,8 @@ struct CSignKeyNoEnh {
     [[nodiscard]] int SignsCount() const;
     [[nodiscard]] int SignsCountAbs() const;
 
-    /// The key with the same signature in the other type: A minor for C major, and back.
+    /// The relative key, despite the given name: the one with the same signature in the other
+    /// type, A minor for C major, and back. (C minor would be the parallel key.)
     [[nodiscard]] CSignKeyNoEnh ParallelSignKey() const;
     /// The major key with the same signature.
     [[nodiscard]] CSignKeyNoEnh IonicSignKey() const;

@@ -8,8 +8,9 @@
 
 namespace brindle {
 
-/// Which letter a key is named from, told by the accidental of the written note: D flat is
-/// `TEnh_b`, C sharp is `TEnh_s`. The value 6 is not used.
+/// Which of the enharmonic names a key has: the letter that it is named from, told by the
+/// accidental of the written note: D flat is `TEnh_b`, C sharp is `TEnh_s`. The value 6 is not
+/// used.
 enum TEnh : std::int8_t {
     TEnh_bbb = -1,
     TEnh_bb = 0,
