@@ -72,7 +72,7 @@ const TMetro kCMinorOverB(CChordLite({0, TEnh_n}, {11, TEnh_n}, CSemitones{0, 3,
 
 }  // namespace
 
-TEST_CASE("Chords become vectors, names and chords of small vocabularies as expected") {
+TEST_CASE("A chord becomes a vector, a name, and its nearest chord of a small vocabulary") {
     CheckExpected(
         "chord_vectors",
         {{"CHarmAnlsChordForMetro::GetChordVectorRepresentation",

@@ -62,7 +62,7 @@ public:
 
 }  // namespace
 
-TEST_CASE("All readings of a chord text are found as expected") {
+TEST_CASE("All readings that the tonic progressions allow are found in a chord text") {
     CheckExpected("center_alternatives",
                   {{"CAnalyseHarmCenterAlternatives::BestResults", BestResults}});
 }

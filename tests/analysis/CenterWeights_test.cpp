@@ -33,7 +33,7 @@ json Detect(const CHarmAnlsChords& chords, CHarmCenterWeightAnalysisParams param
 
 }  // namespace
 
-TEST_CASE("The key that weighs most is found as expected") {
+TEST_CASE("The key that most chords speak for weighs most") {
     CheckExpected(
         "center_weights",
         {{"CHarmCenterWeightAnalysis::DetectHarmCentersFromChords", [](const json& in) {

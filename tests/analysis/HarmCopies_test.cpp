@@ -80,7 +80,7 @@ CHarmAnlsChords RandomSong(CChance& chance, std::size_t most) {
 
 }  // namespace
 
-TEST_CASE("Repeated passages of chord texts are found as expected") {
+TEST_CASE("Repeated passages of a chord text are found with their places") {
     CheckExpected("harm_copies", {{"CHarmonicAnalyse::FindHarmCopies", [](const json& in) {
                                        return FormOf(CopiesOf(in.at(0).get<std::string>(),
                                                               in.at(1).get<double>()));

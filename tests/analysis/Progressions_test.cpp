@@ -68,7 +68,7 @@ json PatternMatches(const json& in) {
 
 }  // namespace
 
-TEST_CASE("Progressions match chord texts as expected") {
+TEST_CASE("A progression matches where its chords stand in its key") {
     CheckExpected("progressions",
                   {{"CHarmAnlsProgressions::FindAndSortForwardMatchingProgressions", Forward},
                    {"CHarmAnlsProgressions::FindAndSortBackwardMatchingProgressions", Backward},

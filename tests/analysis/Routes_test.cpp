@@ -35,7 +35,7 @@ json Analysis(const json& in) {
 
 }  // namespace
 
-TEST_CASE("Chord texts are analysed by each route as expected") {
+TEST_CASE("Each route finds its sign keys, centers and functions in a chord text") {
     for (const char* file : {"analysis_json_tonic", "analysis_json_cadence",
                              "analysis_json_weights", "analysis_json_sign_keys"}) {
         CheckExpected(file, {{"CHarmonicAnalyse::AnalyseFromChordString", Analysis}});

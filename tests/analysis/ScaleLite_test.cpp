@@ -34,7 +34,7 @@ json DigitsFor(const json& in, Test test) {
 
 }  // namespace
 
-TEST_CASE("Scales tolerate chords as expected") {
+TEST_CASE("A scale tolerates its own chords, its dominants and the borrowed ones") {
     CheckExpected(
         "scale_compatibility",
         {{"ScaleLite::ChordIsCompatibleWithScale",

@@ -154,7 +154,7 @@ json Unfolded(const json& in) {
 
 }  // namespace
 
-TEST_CASE("Compact chords unfold to notes and fold back as expected") {
+TEST_CASE("A compact chord becomes notes, and the notes the chord again") {
     CheckExpected("chord_lite_to_full",
                   {{"CChordLite::ToChordHeavy", Unfolded},
                    {"CChordLite::SetFromChordHeavy", [](const json& in) {
@@ -162,7 +162,7 @@ TEST_CASE("Compact chords unfold to notes and fold back as expected") {
                     }}});
 }
 
-TEST_CASE("Chords of given notes are described as expected") {
+TEST_CASE("Given notes tell root, bass, intervals and name of their chord") {
     CheckExpected(
         "chord_note_sets",
         {
@@ -182,14 +182,14 @@ TEST_CASE("Chords of given notes are described as expected") {
         });
 }
 
-TEST_CASE("Bass, notes and octaves of a chord change as expected") {
+TEST_CASE("Bass, notes and octaves of a chord change without its other tones") {
     auto answers = AnswersByOperation([](const CChordHeavy& chord) { return FormOf(chord); });
     answers["CChordHeavy::Transpose"] = AnswersByOperation(NumbersOf).at("CChordHeavy::Transpose");
     answers["operations"] = InARow;
     CheckExpected("chord_operations", answers);
 }
 
-TEST_CASE("Roots and contents of a chord are set as expected") {
+TEST_CASE("A chord takes a new root and new contents") {
     auto answers = AnswersByOperation(NumbersOf);
     answers["CChordHeavy"] = Built;
     CheckExpected("chord_setters", answers);

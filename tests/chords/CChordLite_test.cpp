@@ -119,7 +119,7 @@ TEST_CASE("Every set of semitones has its skeleton and options") {
     CheckExpected("chord_basic_chords", {{"CChordLite", Skeletons}});
 }
 
-TEST_CASE("Compact chords are coded, printed, read back and compared as expected") {
+TEST_CASE("A compact chord survives its code and its text, and has one place in the order") {
     CheckExpected(
         "chord_records",
         {
@@ -145,7 +145,7 @@ TEST_CASE("Compact chords are coded, printed, read back and compared as expected
         });
 }
 
-TEST_CASE("Root, bass and keys of a compact chord relate as expected") {
+TEST_CASE("A compact chord knows the intervals from its root to its bass and to any key") {
     CheckExpected(
         "chord_root_bass",
         {
@@ -167,7 +167,7 @@ TEST_CASE("Root, bass and keys of a compact chord relate as expected") {
         });
 }
 
-TEST_CASE("Notes are moved to the tones of a chord as expected") {
+TEST_CASE("A note moves to the nearest tone of a chord") {
     CheckExpected(
         "chord_quantize",
         {

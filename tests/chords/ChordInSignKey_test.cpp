@@ -41,7 +41,7 @@ const CSignKeyHeavy kAMinor(9, TSignKeyTypeNoUndef_Minor);
 
 }  // namespace
 
-TEST_CASE("Chords belong to the keys and are as close to them as expected") {
+TEST_CASE("A chord belongs to the keys that hold its tones, and is closest where it is at home") {
     CheckExpected("chord_in_sign_key",
                   {
                       {"CChordLite::IsInSignKeyRegardlessOfEnh",

@@ -56,7 +56,7 @@ const CKeyEnh kC{0, TEnh_n};
 
 }  // namespace
 
-TEST_CASE("Chords of all semitones, roots and basses are named as expected") {
+TEST_CASE("Every set of semitones has a name over every root and bass") {
     CheckExpected("chord_names",
                   {{"CChordHeavy::Name", Named(&CChordHeavy::Name)},
                    {"CChordHeavy::NameWithSlash", Named(&CChordHeavy::NameWithSlash)},
@@ -76,7 +76,7 @@ TEST_CASE("Chords of all semitones, roots and basses are named as expected") {
                     }}});
 }
 
-TEST_CASE("Options are found, ordered and written as expected") {
+TEST_CASE("The options of a chord are found and written in their order") {
     CheckExpected(
         "chord_name_options",
         {{"CChordHeavy::Name", Named(&CChordHeavy::Name)},
@@ -93,7 +93,7 @@ TEST_CASE("Options are found, ordered and written as expected") {
           }}});
 }
 
-TEST_CASE("The preferences change names as expected") {
+TEST_CASE("Each preference changes its part of a chord name and no other") {
     CheckExpected("chord_names_prefs", {{"CChordHeavy", InEachWay}});
 }
 

@@ -22,7 +22,7 @@ CChordLite Read(std::string_view symbol, const CChordNamePrefs& prefs = {}) {
 
 }  // namespace
 
-TEST_CASE("Chord symbols read as expected") {
+TEST_CASE("A chord symbol gives root, bass and tones") {
     test::CheckExpected("chord_symbols", {{"CChordLite::SetFromString", [](const json& in) {
                                                CChordLite chord;
                                                chord.SetFromString(in.at(0).get<std::string>(),

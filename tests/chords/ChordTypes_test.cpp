@@ -20,7 +20,7 @@ json FormOf(const CChordTypes::TFound& found) {
 
 }  // namespace
 
-TEST_CASE("The catalogue of chord types is listed and searched as expected") {
+TEST_CASE("The catalogue of chord types is found by name and by tones") {
     const CChordTypes& types = _s_chordTypes();
     CHECK(types.BuiltIn().size() == 30);
     CheckExpected(

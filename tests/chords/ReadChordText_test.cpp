@@ -138,6 +138,10 @@ TEST_CASE("Contested spellings and rare marks have one reading") {
         {"Comit1", "4,7"},
         {"C##5", "0,4,8"},
         {"(E7)", "0,4,7,10"},
+        // The flat eleventh is the enharmonic third, and takes the place of the eleventh.
+        {"C7b11", "0,4,7,10"},
+        {"Cm7b11", "0,3,4,7,10"},
+        {"C11b11", "0,2,4,7,10"},
     };
     for (const TRow& row : rows) {
         CAPTURE(row.mText);

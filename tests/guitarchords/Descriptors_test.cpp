@@ -76,7 +76,7 @@ json FilterAfter(const json& calls) {
 
 }  // namespace
 
-TEST_CASE("Detached tunings and fingerings answer as expected") {
+TEST_CASE("Detached tunings and fingerings know their pitches, their lowest fret and their name") {
     CheckExpected("guitar_descriptors",
                   {{"GChTuningDescr::isValid",
                     [](const json& in) { return TuningDescrOf(in.at(0), in.at(1)).isValid(); }},
@@ -92,7 +92,7 @@ TEST_CASE("Detached tunings and fingerings answer as expected") {
                    {"GChChordDescr", ChordDescrOf}});
 }
 
-TEST_CASE("The filter keeps what its setters are told as expected") {
+TEST_CASE("A filter keeps root, bass, type, difficulty and favorites apart") {
     CheckExpected("guitar_filters",
                   {{"setNoRestrictions", [](const json&) { return FormOf(GChFilterParameter()); }},
                    {"GChFilterParameter", [](const json& in) { return FilterAfter(in.at(0)); }}});
@@ -152,4 +152,28 @@ TEST_CASE("Display options are not set at first") {
     options.setMirrorStrings(false);
     CHECK(options.mirrorStrings() == 0);
     CHECK(options.numberOfFrets() == -1);
+}
+
+TEST_CASE("A detached fingering is named over its root, and copied with all that it says") {
+    const GChTuningDescr guitar = TuningDescrOf(0, {52, 57, 62, 67, 71, 76});
+    GChChordDescr chord;
+    chord.setMuted(true, 0);
+    chord.addFingerNum(3, 3, 1, 1, 0);
+    chord.addFingerNum(2, 2, 2, 2, 0);
+    chord.addFingerNum(1, 1, 4, 4, 0);
+    chord.setRootNote(0);
+    CHECK(chord.chordNameWithTuningDescr(guitar) == "C");
+    chord.setRootNote(12);
+    CHECK(chord.chordNameWithTuningDescr(guitar) == std::nullopt);
+
+    chord.setRootNote(9);
+    chord.setTransposeRange(5);
+    GChChordDescr copy;
+    copy.setToChordDescr(chord);
+    CHECK(copy.chordNameWithTuningDescr(guitar) == chord.chordNameWithTuningDescr(guitar));
+    CHECK(copy.transposeRange() == 5);
+    CHECK(copy.numberOfElements() == 3);
+    GChTuningDescr tuning;
+    tuning.setToTuningDescr(guitar);
+    CHECK(tuning.isEqualToTuningDescr(guitar));
 }

@@ -113,11 +113,11 @@ GChChord ChordWithNotes(int root, int bass) {
 
 }  // namespace
 
-TEST_CASE("Grids show and sound as expected") {
+TEST_CASE("A grid sounds the fretted and the open strings and is silent on the muted ones") {
     CheckExpected("guitar_grids", {{"GChChord", GridOf}});
 }
 
-TEST_CASE("A fingering answers single questions as expected") {
+TEST_CASE("A fingering knows its fingers, its barres and what lies in their shadow") {
     CheckExpected(
         "guitar_chord_model",
         {{"addChordElem",
@@ -253,4 +253,48 @@ TEST_CASE("A fingering prints its property list") {
         TraceString(chord->chordElems()[0]) ==
         R"({"absFretIndex":0,"coveredMaxStr":5,"coveredMinStr":0,"fingerNumber":1,"fingerPointType":0})");
     CHECK(TraceString(ViewOf(chord)).find(TraceString(*chord)) != std::string::npos);
+}
+
+TEST_CASE("Any change of a fingering is seen, that of its bass, too") {
+    struct TChange {
+        const char* mWhat;
+        void (*mChange)(GChBasicChord& chord);
+    };
+    const TChange changes[] = {
+        {"root", [](GChBasicChord& chord) { chord.setRootNote(2); }},
+        {"bass", [](GChBasicChord& chord) { chord.setBassNote(7); }},
+        {"type", [](GChBasicChord& chord) { chord.setChordType(3); }},
+        {"difficulty", [](GChBasicChord& chord) { chord.setDifficultyLevel(2); }},
+        {"muted string", [](GChBasicChord& chord) { chord.setMuted(true, 5); }},
+        {"finger", [](GChBasicChord& chord) { chord.addChordElem(nullptr, 4, 3, 4); }},
+    };
+    const auto original = GuitarChord({{3, 3, 1, 1, 0}, {2, 2, 2, 2, 0}, {1, 1, 4, 4, 0}});
+    original->setRootNote(0);
+    original->setBassNote(4);
+    CHECK(GChBasicChord(*original).isEqualToChordRange(*original, true));
+    for (const TChange& change : changes) {
+        CAPTURE(change.mWhat);
+        GChBasicChord changed(*original);
+        change.mChange(changed);
+        CHECK_FALSE(changed.isEqualToChordRange(*original, false));
+        CHECK_FALSE(original->isEqualToChordRange(changed, false));
+    }
+    GChBasicChord favorite(*original);
+    favorite.setIsFavorite(true, 0);
+    CHECK(favorite.isEqualToChordRange(*original, false));
+    CHECK_FALSE(favorite.isEqualToChordRange(*original, true));
+}
+
+TEST_CASE("The single spots of a string are counted, and the highest of each kind is found") {
+    // On string 1: two fingers to press and one that may be left out.
+    const auto chord =
+        GuitarChord({{1, 2, 1, 1, 0}, {3, 5, 1, 1, 0}, {4, 7, 1, 1, 1}, {2, 3, 0, 4, 0}});
+    CHECK(chord->numberOfSpotsForStringIndex(1) ==
+          chord->numberOfRealSpotsForStringIndex(1) +
+              chord->numberOfOptionalSpotsForStringIndex(1));
+    CHECK(chord->numberOfSpotsForStringIndex(1) == 3);
+    CHECK(chord->numberOfSpotsForStringIndex(2) == 0);
+    REQUIRE(chord->realSpotAtMaxIndexForStringIndex(1) != nullptr);
+    CHECK(chord->realSpotAtMaxIndexForStringIndex(2) == nullptr);
+    CHECK(chord->optionalSpotAtMaxIndexForStringIndex(2) == nullptr);
 }

@@ -248,3 +248,20 @@ TEST_CASE("The first start of a user makes the package in the home folder") {
     SetResourceFolder({});
     setenv("HOME", home.c_str(), 1);
 }
+
+TEST_CASE("The edited chord, the one to go back to and the original are remembered apart") {
+    GChDatabase database;
+    const auto library = AddLibrary(database, kGChStandardGuitar, "a", 3);
+    const auto& chords = library->basicChords();
+    CHECK(database.editedBasicChord() == nullptr);
+    database.setEditedChord(ViewOf(chords[0]));
+    database.setUndoChord(ViewOf(chords[1]));
+    database.setOriginalChord(ViewOf(chords[2]));
+    REQUIRE((database.editedChord() && database.undoChord() && database.originalChord()));
+    CHECK(database.editedBasicChord() == chords[0]);
+    CHECK(database.undoChord()->basicChord() == chords[1]);
+    CHECK(database.originalBasicChord() == chords[2]);
+    CHECK_FALSE(database.chordNotInLibrary());
+    database.setChordNotInLibrary(true);
+    CHECK(database.chordNotInLibrary());
+}

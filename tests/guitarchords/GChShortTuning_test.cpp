@@ -10,7 +10,7 @@ using namespace brindle;
 using namespace brindle::test;
 using nlohmann::json;
 
-TEST_CASE("Tunings are counted, compared up to octaves and turned into arrays as expected") {
+TEST_CASE("Tunings an octave apart are equal, and each is an array of its open strings") {
     CheckExpected(
         "guitar_short_tunings",
         {{"GChIsEqualShortTuning",
@@ -31,7 +31,7 @@ TEST_CASE("Tunings are counted, compared up to octaves and turned into arrays as
           }}});
 }
 
-TEST_CASE("Pitches have their default names both ways as expected") {
+TEST_CASE("A pitch is named with its octave and read back from the name") {
     CheckExpected(
         "guitar_pitches",
         {{"GChMidiPitchDefaultName",

@@ -19,7 +19,7 @@ GChChord ChordOf(const json& in) {
 
 }  // namespace
 
-TEST_CASE("The catalogue of chord types is listed as expected") {
+TEST_CASE("The catalogue of guitar chords lists each type under its name and number") {
     CheckExpected("guitar_chord_types",
                   {{"GChNumberOfChordTypes", [](const json&) { return GChNumberOfChordTypes(); }},
                    {"GChChordTypeNameForIndex",
@@ -30,7 +30,7 @@ TEST_CASE("The catalogue of chord types is listed as expected") {
                     [](const json& in) { return GChChordTypeNameForId(in.at(0)); }}});
 }
 
-TEST_CASE("Grids are named over a root as expected") {
+TEST_CASE("A grid is named over its root by the notes that it sounds") {
     CheckExpected("guitar_harmony_strings",
                   {{"GChHarmonyStringFromChord",
                     [](const json& in) {

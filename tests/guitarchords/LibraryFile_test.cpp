@@ -51,7 +51,7 @@ const std::string kChord = "000000160e0001030011000000000000081100000004";
 
 }  // namespace
 
-TEST_CASE("Libraries are written byte by byte as expected") {
+TEST_CASE("A library is written byte by byte in the layout of its file") {
     CheckExpected("guitar_library_written",
                   {{"wholeLibraryFileContent", [](const json& in) {
                         const json& form = in.at(0);
@@ -61,7 +61,7 @@ TEST_CASE("Libraries are written byte by byte as expected") {
                     }}});
 }
 
-TEST_CASE("Library files are read and written again as expected") {
+TEST_CASE("What is read from a library file is written again, and damaged files are refused") {
     CheckExpected("guitar_library_files", {{"readOneRegularFile", Read}});
 }
 

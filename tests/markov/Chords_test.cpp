@@ -69,7 +69,7 @@ json NotesNear(const json& in) {
 
 }  // namespace
 
-TEST_CASE("Chord strings become symbols, and chords notes, as expected") {
+TEST_CASE("Chord strings become symbols, and chords the notes that sound them") {
     CheckExpected("markov_chords", {
                                        {"HarmChordsFromChordString", ChordsIn},
                                        {"MarkovObjectsVectorForHarmChords", SymbolsIn},

@@ -53,7 +53,7 @@ json LoadedAndSaved(const json& in) {
 
 }  // namespace
 
-TEST_CASE("Models are saved and read as expected") {
+TEST_CASE("A saved model is read back with its symbols, counts and window") {
     CheckExpected("markov_files", {
                                       {"VariableLengthMarkovModel::SaveToFile", Saved},
                                       {"LoadAndSave", LoadedAndSaved},

@@ -148,3 +148,42 @@ TEST_CASE("A search that fails at once has not given up, whatever the one before
     CHECK_FALSE(model.RecursiveGenerateSequence(sequence, options, info));
     CHECK_FALSE(info.mHasGivenUp);
 }
+
+TEST_CASE("A chord fills a gap the better, the better the chord behind the gap follows it") {
+    // Behind C stand F and D equally often, but G follows F alone.
+    VariableLengthMarkovModel model(1);
+    Learn(model, "(1,C);(1,F);(1,G)");
+    Learn(model, "(1,C);(1,D);(1,A)");
+    const MarkovSequence sequence =
+        model.IteratorSequenceForObjects(SymbolsOf("(1,C);(1,U);(1,G)"));
+    const MarkovSequence chords = model.IteratorSequenceForObjects(SymbolsOf("(1,F);(1,D)"));
+    int fCount = 0;
+    int dCount = 0;
+    constexpr std::uint32_t kDraws = 100;
+    for (std::uint32_t draw = 0; draw < kDraws; ++draw) {
+        model.SetRandomSource([draw] { return 0xFFFF'FFFFU / kDraws * draw + 1000; });
+        const MarkovIterator chosen = model.FillGapInSequence(sequence);
+        fCount += chosen == chords[0] ? 1 : 0;
+        dCount += chosen == chords[1] ? 1 : 0;
+    }
+    // F weighs 1/2 for itself and 1 for the G behind it, D only 1/2.
+    CHECK(fCount == 75);
+    CHECK(dCount == 25);
+}
+
+TEST_CASE("A free sequence whose last chord is shorter than a beat has missed its length") {
+    VariableLengthMarkovModel model(1);
+    Learn(model, "(4,C);(0.5,G)");
+    const auto weightFor = [&](const std::string& wanted) {
+        TMarkovGenerateOptions options;
+        options.mTemplate = model.IteratorSequenceForObjects(SymbolsOf(wanted));
+        options.mMaxHistoryLength = 1;
+        options.mMinHistoryLength = 1;
+        TMarkovSampledSequence sequence;
+        model.GenerateSequenceWithFixedLength(1, sequence, options);
+        REQUIRE_FALSE(sequence.mSymbols.empty());
+        CHECK(sequence.mSymbols[0]->mChord.mLength == 4.0);
+        return sequence.mLogProbability;
+    };
+    CHECK(weightFor("(4,U);(0.5,U)") < -700.0);
+}

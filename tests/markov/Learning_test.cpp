@@ -69,7 +69,7 @@ json WindowsFor(const json& in) {
 
 }  // namespace
 
-TEST_CASE("Models count, estimate and remember as expected") {
+TEST_CASE("A model counts what follows each history and estimates its chance") {
     CheckExpected(
         "markov_learning",
         {

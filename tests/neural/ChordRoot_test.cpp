@@ -49,7 +49,7 @@ json LikeliestRoot(const json& in) {
 
 }  // namespace
 
-TEST_CASE("Keys collect points as expected") {
+TEST_CASE("Each tone of a chord gives points to the keys that could be its root") {
     CheckExpected("root_scores", {{"CChordHeavy::ProbThatNoteIsRootNote", [](const json& in) {
                                        const CChordHeavy chord = ChordHeavyOf(in.at(0));
                                        return ForEachKeyNr([&](int keyNr) {
@@ -58,7 +58,7 @@ TEST_CASE("Keys collect points as expected") {
                                    }}});
 }
 
-TEST_CASE("The score finds roots, spellings and names as expected") {
+TEST_CASE("The score finds the likeliest root, and with it spelling and name") {
     CheckExpected("root_by_score",
                   {{"CChordHeavy::SetRootNoteAndEnh_ToLikeliestRegardingNoteSet", LikeliestRoot}});
 }

@@ -43,7 +43,7 @@ NeuronalNet NewNet(std::vector<int> hidden) {
 
 }  // namespace
 
-TEST_CASE("Steps of training change the weights as expected") {
+TEST_CASE("A step of training moves the weights against the error") {
     CheckExpected("net_training", {{"NeuronalNet::train", Trained}}, 1e-12);
 }
 

@@ -88,7 +88,7 @@ json Winner(const json& in) {
 
 }  // namespace
 
-TEST_CASE("Neurons weigh, fire and slope as expected") {
+TEST_CASE("A neuron sums its weighted inputs, fires, and knows the slope where it does") {
     CheckExpected("net_neurons",
                   {
                       {"Neuron::Neuron", StartWeights},

@@ -24,7 +24,7 @@ TPredefinedWeights SmallRecord() {
 
 }  // namespace
 
-TEST_CASE("Nets of all types answer as expected") {
+TEST_CASE("A net of any type gives its outputs for its inputs") {
     CheckExpected("net_forward",
                   {{"NeuronalNet::use",
                     [](const json& in) {

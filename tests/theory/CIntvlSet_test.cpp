@@ -46,7 +46,7 @@ std::vector<int> ListOf(const json& in) {
 
 }  // namespace
 
-TEST_CASE("Interval sets answer as expected") {
+TEST_CASE("An interval set holds intervals beyond the octave and wraps where it is told") {
     CheckExpected(
         "theory-interval-sets",
         {

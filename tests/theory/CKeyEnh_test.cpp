@@ -14,7 +14,7 @@ using namespace brindle;
 using namespace brindle::test;
 using nlohmann::json;
 
-TEST_CASE("A spelled key moved by an interval is spelled as expected") {
+TEST_CASE("A spelled key moved by an interval keeps to its side of flats or sharps") {
     test::CheckExpected(
         "theory-adding-intervals",
         {

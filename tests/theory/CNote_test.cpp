@@ -53,7 +53,7 @@ Answer IntvlBy(int (*intvl)(std::int64_t, std::int64_t)) {
 
 }  // namespace
 
-TEST_CASE("Notes are built, changed, named and read as expected") {
+TEST_CASE("A note keeps its number and spelling through change, name and reading") {
     test::CheckExpected(
         "theory-notes",
         {

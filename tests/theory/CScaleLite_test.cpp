@@ -38,7 +38,7 @@ json FormOfTriad(const CChordLite& chord) {
 
 }  // namespace
 
-TEST_CASE("Compact scales answer as expected") {
+TEST_CASE("A compact scale knows its notes and its relatives") {
     test::CheckExpected(
         "theory-compact-scales",
         {

@@ -54,7 +54,7 @@ json FromList(const json& in) {
 
 }  // namespace
 
-TEST_CASE("Sets of semitones answer as expected") {
+TEST_CASE("A set of semitones holds, moves and turns over its intervals") {
     CheckExpected(
         "theory-semitones",
         {

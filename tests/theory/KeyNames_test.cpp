@@ -55,7 +55,7 @@ TEST_CASE("The preferences of each name are those that a host finds") {
     CHECK(ChordNamePrefsNonUTF8.mAsciiAccidentals == 1);
 }
 
-TEST_CASE("Keys are named as expected under every mix of preferences") {
+TEST_CASE("Keys are named in letters, syllables and German under every mix of preferences") {
     test::CheckExpected(
         "theory-key-names",
         {
@@ -74,7 +74,7 @@ TEST_CASE("Keys are named as expected under every mix of preferences") {
         });
 }
 
-TEST_CASE("Key names are read as expected") {
+TEST_CASE("A key name is read with its accidental in all languages") {
     test::CheckExpected("theory-key-reading",
                         {
                             {"CKeyEnh::SetFromString",

@@ -41,7 +41,7 @@ std::int64_t WalkIntoRange(std::int64_t noteNr, int wrapIntvl) {
 
 }  // namespace
 
-TEST_CASE("The notes of a key around a note, and the comping range, are found as expected") {
+TEST_CASE("The notes of a key around a note are found, and those of the comping range") {
     test::CheckExpected(
         "theory-note-search",
         {

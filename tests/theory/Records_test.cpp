@@ -51,7 +51,7 @@ std::string Printed(const json& in) {
 
 }  // namespace
 
-TEST_CASE("Records print, order and read back as expected") {
+TEST_CASE("Records print, have an order, and read back") {
     test::CheckExpected(
         "theory-records",
         {

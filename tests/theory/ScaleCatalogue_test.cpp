@@ -44,7 +44,7 @@ json LocalizedName(TScaleType type) {
 
 }  // namespace
 
-TEST_CASE("The table of scales answers as expected") {
+TEST_CASE("The table of scales tells steps, mode and spelling of each type") {
     CheckExpected(
         "theory-scale-catalogue",
         {

@@ -45,7 +45,7 @@ constexpr auto kTieLeft = TQuantizeToScaleDirection_ClosestTieLeft;
 
 }  // namespace
 
-TEST_CASE("Notes move along scales and are quantized to them as expected") {
+TEST_CASE("Notes move along a scale by its steps, and foreign ones are quantized to it") {
     CheckExpected(
         "theory-scale-motion",
         {

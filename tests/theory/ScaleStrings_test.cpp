@@ -32,7 +32,7 @@ CScaleLite Read(std::string_view text) {
 
 }  // namespace
 
-TEST_CASE("Scale strings read as expected") {
+TEST_CASE("A scale string gives root and type") {
     test::CheckExpected(
         "theory-scale-strings",
         {{"SetFromString", ReadScale}, {"_SemitonesScaleFromString", [](const json& in) {

@@ -275,7 +275,7 @@ CSignKeyLite LeastSigns(CKeyEnh root, TSignKeyType type) {
 
 }  // namespace
 
-TEST_CASE("Sign keys in all their forms answer as expected") {
+TEST_CASE("A sign key knows its signature, its relative key and its name in all its forms") {
     std::map<std::string, Answer> answers = kAnswersOfTypes;
     answers.insert(kAnswersOfCodes.begin(), kAnswersOfCodes.end());
     answers.insert(kAnswersOfSignKeys.begin(), kAnswersOfSignKeys.end());

@@ -35,7 +35,7 @@ json AllUpToOneAccidental(const json&) {
 
 }  // namespace
 
-TEST_CASE("Spellings are judged, repaired and shifted as expected, and keys measured") {
+TEST_CASE("A spelling that no letter has is repaired, and keys are measured by the shorter way") {
     test::CheckExpected(
         "theory-spellings",
         {
