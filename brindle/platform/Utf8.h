@@ -18,7 +18,9 @@ namespace brindle {
 /// The number of characters; of bytes that are no UTF-8 it counts those that could begin one.
 [[nodiscard]] constexpr std::size_t CountUtf8Characters(std::string_view text) {
     std::size_t count = 0;
-    for (const char byte : text) count += BeginsUtf8Character(byte) ? 1 : 0;
+    for (const char byte : text) {
+        if (BeginsUtf8Character(byte)) ++count;
+    }
     return count;
 }
 
