@@ -28,9 +28,11 @@ public:
     /// Any chord at all.
     constexpr CSemitonesMatch() { Reset(); }
     /// Entry n of `entries` for semitone n. The further argument of the second form has no effect.
-    constexpr explicit CSemitonesMatch(const std::array<TSemiMatch, 12>& entries)
-        : mEntries(entries) {}
-    constexpr CSemitonesMatch(const std::array<TSemiMatch, 12>& entries, int) : mEntries(entries) {}
+    constexpr explicit CSemitonesMatch(const std::array<TSemiMatch, 12>& entries) {
+        for (unsigned n = 0; n < 12; ++n) SetSemitone(n, entries[n]);
+    }
+    constexpr CSemitonesMatch(const std::array<TSemiMatch, 12>& entries, int)
+        : CSemitonesMatch(entries) {}
     /// Would read as a list of semitone numbers.
     CSemitonesMatch(std::initializer_list<TSemiMatch>) = delete;
     /// The tones of `present` must sound, the tones of `any` may, all others must not.

@@ -9,6 +9,7 @@
 #include <doctest/doctest.h>
 
 #include <algorithm>
+#include <array>
 #include <map>
 
 using namespace brindle;
@@ -122,6 +123,25 @@ TEST_CASE("A backward match begins before its chord, but not before the list") {
     CHECK(begin(1, TMatchDirection_Backward) == 0);
     CHECK(begin(1, TMatchDirection_Forward) == 1);
     CHECK(begin(1, static_cast<TMatchDirection>(7)) == 3);
+}
+
+TEST_CASE("A pattern made of its twelve entries fits the chords of the pattern it copies") {
+    for (const CSemitonesMatch& pattern :
+         {ChordPattern::Major, ChordPattern::HalfDiminished, ChordPattern::Dominant7}) {
+        std::array<TSemiMatch, 12> entries{};
+        for (unsigned n = 0; n < 12; ++n) entries[n] = pattern.Semitone(n);
+        const CSemitonesMatch built(entries);
+        const CSemitonesMatch builtWithArgument(entries, 1);
+        CHECK(built == pattern);
+        CHECK(builtWithArgument == pattern);
+        int different = 0;
+        for (std::uint64_t mask = 0; mask < 4096; ++mask) {
+            const bool isMatch = pattern.Matches(CSemitones(mask));
+            different += built.Matches(CSemitones(mask)) != isMatch;
+            different += builtWithArgument.Matches(CSemitones(mask)) != isMatch;
+        }
+        CHECK(different == 0);
+    }
 }
 
 TEST_CASE("Semitone patterns are set entry by entry") {
