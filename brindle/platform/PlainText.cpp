@@ -37,7 +37,7 @@ void WriteUnsigned(std::ostream& stream, std::uint64_t value) {
 
 void WriteFixed(std::ostream& stream, double value) {
     TBuffer buffer;
-    fmt::format_to(std::back_inserter(buffer), "{:6.2f}", value);
+    fmt::format_to(std::back_inserter(buffer), "{:>6.2f}", value);
     Write(stream, buffer);
 }
 
