@@ -129,8 +129,7 @@ void CChordHeavy::SetRootNoteEnhWithLeastSigns() {
 }
 
 CNote CChordHeavy::_RootWithLeastSigns(CNote given) const {
-    given.SetEnhAndDontMakeSenseful(
-        MakeSensefulEnhForKeyNrAssumingCMajor(given.KeyNr(), given.mEnh));
+    given.MakeSensefulEnhAssumingCMajor();
     if (given.IsUndef()) return given;
     CNote flatter = given;
     flatter.EnhShiftToFlats();

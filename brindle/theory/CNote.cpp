@@ -14,7 +14,7 @@ void CNote::SetNoteNrAndEnh(std::int64_t noteNr, TEnh enh) {
 
 void CNote::SetNoteNrAndMakeSensefulEnhAssumingCMajor(std::int64_t noteNr) {
     SetNoteNr(noteNr);
-    mEnh = MakeSensefulEnhForKeyNrAssumingCMajor(KeyNr(), mEnh);
+    MakeSensefulEnhAssumingCMajor();
 }
 
 void CNote::SetKeyNr(int keyNr) {
@@ -28,7 +28,7 @@ void CNote::SetKeyNr(int keyNr) {
 
 void CNote::SetKeyNrAndEnhAssumingCMajor(int keyNr) {
     SetKeyNr(keyNr);
-    mEnh = MakeSensefulEnhForKeyNrAssumingCMajor(KeyNr(), mEnh);
+    MakeSensefulEnhAssumingCMajor();
 }
 
 void CNote::SetOct(int oct) {

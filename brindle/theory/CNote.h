@@ -73,12 +73,16 @@ struct CNote {
     constexpr void SetNoteNr(std::int64_t noteNr) { mNoteNr = ClampNoteNr(noteNr); }
     /// Sets the spelling, repaired unless `TEnh_Undef`.
     constexpr void SetEnh(TEnh enh) {
-        const bool keep = enh == TEnh_Undef;
-        mEnh = keep ? enh : MakeSensefulEnhForKeyNrAssumingCMajor(KeyNr(), enh);
+        mEnh = enh;
+        if (enh != TEnh_Undef) MakeSensefulEnhAssumingCMajor();
     }
     constexpr void SetEnhAndDontMakeSenseful(TEnh enh) { mEnh = enh; }
     /// As the constructor.
     void SetNoteNrAndEnh(std::int64_t noteNr, TEnh enh);
+    /// Repairs the present spelling, `TEnh_Undef` too, as the keys are usually written in C major.
+    constexpr void MakeSensefulEnhAssumingCMajor() {
+        mEnh = MakeSensefulEnhForKeyNrAssumingCMajor(KeyNr(), mEnh);
+    }
     /// As SetNoteNr, then repairs the present spelling, `TEnh_Undef` too.
     void SetNoteNrAndMakeSensefulEnhAssumingCMajor(std::int64_t noteNr);
     /// Changes the key within the octave; key 15 makes the note undefined. An undefined note counts

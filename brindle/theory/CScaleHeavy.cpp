@@ -42,7 +42,7 @@ CScaleHeavy::CScaleHeavy(const CNote& root, const CMySet<int>& keyNrs)
 
 void CScaleHeavy::SetFromRootKeyEnhAndScaleType_ResetCustomScaleData(const CKeyEnh& root,
                                                                      TScaleType type) {
-    mCustomScaleData = kCustomScaleRow;
+    InitCustomScaleData();
     SetFromRootKeyEnhAndScaleType_DontResetCustomScaleData(root, type);
 }
 
@@ -97,7 +97,7 @@ void CScaleHeavy::SetScaleTypeWithoutCalcEnh(TScaleType type) {
 }
 
 void CScaleHeavy::SetCustomScaleRootOffsetIntvlSet_ResetCustomScaleData(const CIntvlSet& intvls) {
-    mCustomScaleData = kCustomScaleRow;
+    InitCustomScaleData();
     SetCustomScaleRootOffsetIntvlSet_DontResetCustomScaleData(intvls);
 }
 

@@ -98,7 +98,10 @@ public:
     void SetRootNote(const CNote& root);
     void SetScaleType(TScaleType type);
     void SetScaleTypeWithoutCalcEnh(TScaleType type);
-    /// Sets the steps that count for the type `st_custom`; type, root and spellings stay.
+    /// Gives the own row, that of the type `st_custom`, the twelve chromatic steps it starts with.
+    void InitCustomScaleData() { mCustomScaleData = kCustomScaleRow; }
+    /// Sets the steps that count for the type `st_custom`; type, root and spellings stay. A scale
+    /// of that type has the new steps at once.
     void SetCustomScaleRootOffsetIntvlSet_ResetCustomScaleData(const CIntvlSet& intvls);
     /// The same, keeping what else the custom row holds.
     void SetCustomScaleRootOffsetIntvlSet_DontResetCustomScaleData(const CIntvlSet& intvls);

@@ -88,8 +88,11 @@ std::int64_t CScaleHeavy::MoveInScale(std::int64_t noteNr, int steps, bool fold)
 
 CNote CScaleHeavy::MoveInScale(const CNote& note, int steps) const {
     if (IsUndef() || mScaleType == st_Undef || DegreesPerOctave() <= 0) return note;
-    const std::int64_t noteNr = MoveInScale(note.mNoteNr, steps, true);
-    return {noteNr, EnhForKeyNr(KeyNrOfNoteNr(noteNr))};
+    CNote moved(MoveInScale(note.mNoteNr, steps, true), TEnh_Undef);
+    if (moved.IsUndef()) return moved;
+    // As the scale has it, also where that is no usual spelling: F triple sharp in G double sharp.
+    moved.SetEnhAndDontMakeSenseful(EnhForKeyNr(moved.KeyNr()));
+    return moved;
 }
 
 int CScaleHeavy::QuantizeToScaleDegreeNr(int keyNr, TQuantizeToScaleDirection direction,

@@ -32,6 +32,9 @@ TEST_CASE("The steps of a scale make chords on a root in the comping range") {
     CHECK(NoteNrsOf(triad) == json({60, 64, 67}));
     CHECK(LiteOf(triad) == CChordLite(kC, {}, kMajorTriad));
 
+    const CScaleHeavy gDoubleSharp(CKeyEnh{9, TEnh_ss}, st_maj);
+    CHECK(gDoubleSharp.ChordFromScaleStepSet({6}).RootNote().mEnh == TEnh_sss);
+
     const CChordHeavy seventh = CMajor().ChordFromScaleStepSet({4, 6, 8, 10});
     CHECK(seventh.RootNote().mNoteNr == 55);
     CHECK(NoteNrsOf(seventh) == json({55, 71, 74, 77}));

@@ -135,6 +135,21 @@ TEST_CASE("A note reads as it looks, signs in front of the octave included") {
     }
 }
 
+TEST_CASE("A spelling that its key cannot have is repaired on request") {
+    const auto repaired = [](std::int64_t noteNr, TEnh enh) {
+        CNote note;
+        note.mNoteNr = noteNr;
+        note.SetEnhAndDontMakeSenseful(enh);
+        note.MakeSensefulEnhAssumingCMajor();
+        return note.mEnh;
+    };
+    CHECK(repaired(61, TEnh_Undef) == TEnh_s);
+    CHECK(repaired(61, TEnh_n) == TEnh_s);
+    CHECK(repaired(68, TEnh_sss) == TEnh_s);
+    CHECK(repaired(70, TEnh_b) == TEnh_b);
+    CHECK(repaired(kNoteNrUndef, TEnh_b) == TEnh_Undef);
+}
+
 TEST_CASE("Steps of respelling leave triple accidentals of a note triple") {
     CNote note;
     note.mNoteNr = 61;

@@ -134,6 +134,12 @@ TEST_CASE("A custom scale can change its steps, and a named one becomes custom b
     CHECK(scale.ToSemitones() == CSemitones{0, 3, 7});
     CHECK(scale.EnhForKeyNr(2) == TEnh_Undef);
 
+    CScaleHeavy chromatic = scale;
+    chromatic.InitCustomScaleData();
+    CHECK(chromatic.ToSemitones() == CSemitones(4095));
+    CHECK(chromatic.ScaleType() == st_custom);
+    CHECK(chromatic.RootKeyEnh() == CKeyEnh_D);
+
     const CScaleHeavy copy = scale;
     scale.SetFromRootKeyEnhAndScaleType_ResetCustomScaleData(CKeyEnh_D, st_custom);
     CHECK(scale.ToSemitones() == CSemitones(4095));

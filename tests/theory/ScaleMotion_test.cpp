@@ -99,6 +99,27 @@ TEST_CASE("Moving stays on the keys of the scale beyond both ends of the keyboar
     CHECK(cMajor.MoveInScale(CNote_Undef, 1) == CNote_Undef);
 }
 
+TEST_CASE("A moved note is spelled by the scale, also where that is no usual spelling") {
+    const CScaleHeavy scale(CKeyEnh{9, TEnh_ss}, st_maj);  // G double sharp
+    CHECK(scale.DegreeNrToNote(6, 4).mEnh == TEnh_sss);
+    CHECK(scale.MoveInScale(CNote(57, TEnh_ss), 6) == scale.DegreeNrToNote(6, 4));
+
+    int different = 0;
+    for (int keyNr = 0; keyNr < 12; ++keyNr) {
+        for (const TEnh enh : {TEnh_bb, TEnh_b, TEnh_n, TEnh_s, TEnh_ss}) {
+            for (const TScaleRow& row : kScaleCatalogue) {
+                const CScaleHeavy any(CKeyEnh{keyNr, enh}, row.mType);
+                for (int step = 0; step < any.DegreesPerOctave(); ++step) {
+                    const CNote start = any.DegreeNrToNote(0, 4);
+                    const CKeyEnh moved = any.MoveInScale(start, step).KeyEnh();
+                    different += moved != any.DegreeNrToKeyEnh(step);
+                }
+            }
+        }
+    }
+    CHECK(different == 0);
+}
+
 TEST_CASE("Huge steps, notes and keys stay on the scale and end at once") {
     constexpr int least = std::numeric_limits<int>::min();
     constexpr int largest = std::numeric_limits<int>::max();
