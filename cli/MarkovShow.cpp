@@ -75,9 +75,11 @@ std::vector<TLengthRow> RowsOf(const VariableLengthMarkovModel& model) {
 std::vector<TContinuation> ContinuationsOf(const VariableLengthMarkovModel& model,
                                            MarkovSequence& history) {
     const MarkovCounts* counts = nullptr;
-    while (!history.empty() && (counts = model.mTransitionMap.Find(history)) == nullptr) {
-        history.erase(history.begin());
-    }
+    const auto isContinued = [&] {
+        counts = model.mTransitionMap.Find(history);
+        return counts != nullptr && !counts->empty();
+    };
+    while (!history.empty() && !isContinued()) history.erase(history.begin());
     std::vector<TContinuation> continuations;
     if (counts == nullptr) return continuations;
     MarkovProbabilities table;

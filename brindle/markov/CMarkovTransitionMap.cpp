@@ -108,8 +108,8 @@ const CMarkovTransitionMap::TSlot& CMarkovTransitionMap::SlotOf(std::uint32_t ha
     }
 }
 
-void CMarkovTransitionMap::AddToAllLengths(MarkovSequenceView history, MarkovIterator symbol,
-                                           std::uint32_t count) {
+template <class Change>
+void CMarkovTransitionMap::ForAllLengths(MarkovSequenceView history, Change change) {
     Fetch(history);
     MarkovSequenceView kept;
     std::uint32_t entry = kEmptyHistory;
@@ -129,8 +129,17 @@ void CMarkovTransitionMap::AddToAllLengths(MarkovSequenceView history, MarkovIte
             entry = AddEntry(shorter, kept.last(length));
             mSlots[static_cast<std::size_t>(&slot - mSlots.data())] = {hash, entry};
         }
-        At(entry).mCounts[symbol] += count;
+        change(At(entry).mCounts);
     }
+}
+
+void CMarkovTransitionMap::AddHistory(MarkovSequenceView history) {
+    ForAllLengths(history, [](MarkovCounts&) {});
+}
+
+void CMarkovTransitionMap::AddToAllLengths(MarkovSequenceView history, MarkovIterator symbol,
+                                           std::uint32_t count) {
+    ForAllLengths(history, [symbol, count](MarkovCounts& counts) { counts[symbol] += count; });
 }
 
 // By the history itself and not through those of its ends, which are far apart in memory.

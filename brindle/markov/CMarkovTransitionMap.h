@@ -33,6 +33,8 @@ public:
     CMarkovTransitionMap& operator=(CMarkovTransitionMap&& other) noexcept;
     ~CMarkovTransitionMap() = default;
 
+    /// The history and each of its ends, down to length 1, with an empty table if they are new.
+    void AddHistory(MarkovSequenceView history);
     /// Adds `count` to the symbol behind the history and behind each of its ends, down to length 1.
     void AddToAllLengths(MarkovSequenceView history, MarkovIterator symbol, std::uint32_t count);
 
@@ -70,6 +72,9 @@ private:
     [[nodiscard]] TEntry& At(std::uint32_t number);
     template <class IsWanted>
     [[nodiscard]] const TSlot& SlotOf(std::uint32_t hash, IsWanted isWanted) const;
+    /// Calls `change` with the counts of the history and of each of its ends, the shortest first.
+    template <class Change>
+    void ForAllLengths(MarkovSequenceView history, Change change);
     std::uint32_t AddEntry(std::uint32_t shorter, MarkovSequenceView history);
     void Fetch(MarkovSequenceView history) const;
     void GrowSlots();

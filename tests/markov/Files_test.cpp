@@ -103,12 +103,36 @@ TEST_CASE("Entries that name no symbol are left out, and the order of members do
     }
     // Counts of 32 bits: 2 + 4294967295 is 1.
     CHECK(transitions == json::parse("[[[0,1],[[0,1],[1,2]]],[[1],[[0,1],[1,1]]],"
-                                     "[[1,1],[[1,4294967295]]]]"));
+                                     "[[1,0],[]],[[1,1],[[1,4294967295]]]]"));
 
     VariableLengthMarkovModel fromDictionary;
     Helper::VariableLengthMarkovModelFromJSONDictionary(
         json::parse(text).at("VariableLengthMarkovModel"), fromDictionary);
     CHECK(fromDictionary == model);
+}
+
+TEST_CASE("A history without a valid successor keeps its empty table") {
+    for (const char* const entry : {"[[0,1],[]]", "[[0,1],[[9,1],[-1,2],\"x\"]]", "[[0,1]]"}) {
+        CAPTURE(entry);
+        VariableLengthMarkovModel model;
+        Helper::VariableLengthMarkovModelFromJSONString(
+            std::string(R"({"VariableLengthMarkovModel":{"MaxHistoryLength":2,)"
+                        R"("CMarkovObjects":[{"Type":4},{"Type":5}],"History":[],)"
+                        R"("TransitionMap":[)") +
+                entry + "]}}",
+            model);
+        auto histories = json::array();
+        for (const TMarkovTransitions* const known : model.mTransitionMap.InOrder()) {
+            CHECK(known->mCounts.empty());
+            histories.push_back(test::FormOf(known->mHistory));
+        }
+        CHECK(histories == json::parse("[[0,1],[1]]"));
+        const std::string written = JSONStringOf(model);
+        CHECK(written.find("[\n[   0,   1],[]\n]") != std::string::npos);
+        MarkovProbabilities table;
+        model.ProbabilitiesForNextSymbol(std::uint64_t{1}, table);
+        CHECK(table.empty());
+    }
 }
 
 TEST_CASE("Symbols read as they were written, but for gaps") {

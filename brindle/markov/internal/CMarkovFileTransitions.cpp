@@ -16,7 +16,13 @@ bool IsSuccessor(const json& pair) {
 }
 
 bool IsEntry(const json& entry) {
-    return entry.is_array() && entry.size() >= 2 && entry[0].is_array() && entry[1].is_array();
+    return entry.is_array() && !entry.empty() && entry[0].is_array();
+}
+
+/// The successors of an entry, none if there is no list of them.
+const json& SuccessorsOf(const json& entry) {
+    static const json none = json::array();
+    return entry.size() >= 2 && entry[1].is_array() ? entry[1] : none;
 }
 
 }  // namespace
@@ -29,14 +35,15 @@ int MarkovIndexOf(const json& value) {
 
 void CMarkovFileTransitions::Add(const json& entry) {
     if (!IsEntry(entry)) return;
-    const auto pairs =
-        static_cast<std::uint32_t>(std::count_if(entry[1].begin(), entry[1].end(), IsSuccessor));
+    const json& successors = SuccessorsOf(entry);
+    const auto pairs = static_cast<std::uint32_t>(
+        std::count_if(successors.begin(), successors.end(), IsSuccessor));
     mNumbers.push_back(static_cast<std::uint32_t>(entry[0].size()));
     mNumbers.push_back(pairs);
     for (const json& index : entry[0]) {
         mNumbers.push_back(static_cast<std::uint32_t>(MarkovIndexOf(index)));
     }
-    for (const json& pair : entry[1]) {
+    for (const json& pair : successors) {
         if (!IsSuccessor(pair)) continue;
         mNumbers.push_back(static_cast<std::uint32_t>(MarkovIndexOf(pair[0])));
         mNumbers.push_back(static_cast<std::uint32_t>(pair[1].get<std::uint64_t>()));
@@ -59,6 +66,7 @@ CMarkovTransitionMap CMarkovFileTransitions::ToMap(const CIteratorIndexConverter
             length <= kMarkovLongestHistoryInFile &&
             std::none_of(history.begin(), history.end(),
                          [&](MarkovIterator symbol) { return converter.IsEnd(symbol); });
+        if (isKnown) map.AddHistory(history);
         for (std::uint32_t pair = 0; pair < pairs; ++pair) {
             const MarkovIterator symbol = nextSymbol();
             const std::uint32_t count = *number++;

@@ -18,7 +18,8 @@ inline constexpr int kMarkovLongestHistoryInFile = 256;
 /// that the JSON takes, so that a reader can let go of that entry by entry.
 class CMarkovFileTransitions {
 public:
-    /// `entry` is `[[h1,h2,...],[[s,c],[s,c],...]]`. What has another form is left out.
+    /// `entry` is `[[h1,h2,...],[[s,c],[s,c],...]]`. What has another form is left out; a history
+    /// stays in the map also when no successor is left.
     void Add(const nlohmann::json& entry);
     void Clear() { mNumbers.clear(); }
 
