@@ -5,6 +5,7 @@
 
 #include <doctest/doctest.h>
 
+#include <functional>
 #include <limits>
 #include <string>
 #include <vector>
@@ -86,6 +87,28 @@ TEST_CASE("The skeleton is heard without a bass that stands on a tone of its own
         CAPTURE(row.mWhat);
         CHECK(row.mChord.BasicChord() == row.mBasicChord);
         CHECK(row.mChord.XGChordIx() == row.mXGChordIx);
+    }
+}
+
+TEST_CASE("Tones set on a chord without a root leave it so, and the next note is its root") {
+    const auto withSemitones = [](CChordHeavy& chord) { chord.SetSemitones({0, 4, 7}); };
+    const auto withBasicChord = [](CChordHeavy& chord) { chord.SetBasicChord(TBasicChord::Minor); };
+    for (const std::function<void(CChordHeavy&)>& set :
+         {std::function<void(CChordHeavy&)>(withSemitones),
+          std::function<void(CChordHeavy&)>(withBasicChord)}) {
+        CChordHeavy following = Of({60, 64, 67});
+        set(following);
+        CHECK_FALSE(following.RootNoteSpecified());
+        CHECK(following.RootNote() == CNote(60, TEnh_n));
+        following.AddNote(CNote(50, TEnh_n));
+        CHECK(following.RootNote() == following.LowestNote());
+
+        CChordHeavy empty;
+        set(empty);
+        CHECK_FALSE(empty.RootNoteSpecified());
+        CHECK(empty.RootNote().IsUndef());
+        empty.AddNote(CNote(62, TEnh_n));
+        CHECK(empty.RootNote() == empty.LowestNote());
     }
 }
 

@@ -116,6 +116,16 @@ TEST_CASE("The wrap interval reduces members and does not make sets different") 
     CHECK(set == CIntvlSet(5, 11));
 }
 
+TEST_CASE("Erasing an interval takes its octaves up to the wrap interval, and always itself") {
+    CIntvlSet set(CMySet<int>{2, 14, 24, 26, 38}, 24);
+    set.EraseIntvlInAnyOct(26);
+    CHECK(set == CIntvlSet(CMySet<int>{2, 14, 24, 38}));
+    set.EraseIntvlInAnyOct(2);
+    CHECK(set == CIntvlSet(CMySet<int>{24, 38}));
+    set.EraseIntvlInAnyOct(12);
+    CHECK(set == CIntvlSet(CMySet<int>{38}));
+}
+
 TEST_CASE("Intervals far out are answered without overflow") {
     constexpr int least = std::numeric_limits<int>::min();
     constexpr int largest = std::numeric_limits<int>::max();
