@@ -63,7 +63,7 @@ enum class TPlace { Free, EmptyPackage, Package, Foreign };
 
 TPlace PlaceAt(const fs::path& path) {
     std::error_code error;
-    if (!fs::exists(fs::symlink_status(path, error))) return TPlace::Free;
+    if (!fs::exists(fs::status(path, error))) return TPlace::Free;
     const auto folder = ReadFolder(path);
     if (!folder) return TPlace::Foreign;
     // Entries that cannot be read are not in the tree; they are of value, too.

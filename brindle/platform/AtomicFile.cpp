@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/platform/AtomicFile.h"
 
+#include "brindle/platform/internal/ScratchEntries.h"
 #include "brindle/platform/internal/WholeFiles.h"
 
 #include <fcntl.h>
@@ -10,11 +11,13 @@
 #include <algorithm>
 #include <array>
 #include <cerrno>
-#include <cstdlib>
 #include <ostream>
 #include <streambuf>
+#include <utility>
 
 namespace brindle {
+
+namespace fs = std::filesystem;
 
 namespace {
 
@@ -45,42 +48,70 @@ private:
     std::array<char, 65536> mBytes;
 };
 
-/// `scratch` is the path with whose name, and some letters behind it, the bytes are first written.
-template <class WriteBytes>
-bool ReplaceFile(const std::filesystem::path& path, const std::filesystem::path& scratch,
-                 mode_t rights, WriteBytes writeBytes) {
-    std::string beside = scratch.string() + ".XXXXXX";
-    const int file = mkostemp(beside.data(), O_CLOEXEC);
-    if (file < 0) return false;
-    bool ok = fchmod(file, rights) == 0 && writeBytes(file) && fsync(file) == 0;
-    ok = close(file) == 0 && ok;
-    ok = ok && rename(beside.c_str(), path.c_str()) == 0;
-    if (!ok) {
-        unlink(beside.c_str());
-        return false;
-    }
+/// An open file that is closed at its end.
+class COpenFile {
+public:
+    explicit COpenFile(int file) : mFile(file) {}
+    COpenFile(const COpenFile&) = delete;
+    COpenFile& operator=(const COpenFile&) = delete;
+    ~COpenFile() { (void)Close(); }
+
+    [[nodiscard]] bool IsOpen() const { return mFile >= 0; }
+    [[nodiscard]] int Get() const { return mFile; }
+    [[nodiscard]] bool Close() { return close(std::exchange(mFile, -1)) == 0; }
+
+private:
+    int mFile;
+};
+
+using TWriteBytes = std::function<bool(int file)>;
+
+/// Writes to `scratch`, with some letters behind it, and renames that. The rights are exact, or
+/// those of a new file without them.
+bool ReplaceFile(const fs::path& path, fs::path scratch, std::optional<mode_t> rights,
+                 const TWriteBytes& writeBytes) {
+    constexpr mode_t kNewFileRights = 0666;
+    ScratchEntries::RemoveOld(scratch);
+    COpenFile file(ScratchEntries::OpenNewFile(scratch, rights.value_or(kNewFileRights)));
+    if (!file.IsOpen()) return false;
+    const ScratchEntries::CRemover remover(scratch);
+    const bool ok = (!rights || fchmod(file.Get(), *rights) == 0) && writeBytes(file.Get()) &&
+                    fsync(file.Get()) == 0;
+    if (!file.Close() || !ok || rename(scratch.c_str(), path.c_str()) != 0) return false;
     WholeFiles::FlushFolder(path.parent_path());
     return true;
 }
 
+/// A device, a pipe or the like keeps what it is.
+bool WriteInto(const fs::path& path, const TWriteBytes& writeBytes) {
+    COpenFile file(open(path.c_str(), O_WRONLY | O_NOCTTY | O_CLOEXEC));
+    if (!file.IsOpen()) return false;
+    const bool ok = writeBytes(file.Get());
+    return file.Close() && ok;
+}
+
+bool WriteFile(const fs::path& path, const fs::path& scratchFolder, const TWriteBytes& writeBytes) {
+    const auto target = WholeFiles::BehindLinks(path);
+    if (!target) return false;
+    struct stat status {};
+    const bool isThere = stat(target->c_str(), &status) == 0;
+    if (isThere && S_ISDIR(status.st_mode)) return false;
+    if (isThere && !S_ISREG(status.st_mode)) return WriteInto(*target, writeBytes);
+    const fs::path scratch = scratchFolder.empty() ? *target : scratchFolder / target->filename();
+    const auto rights = isThere ? std::optional<mode_t>(status.st_mode & 07777) : std::nullopt;
+    return ReplaceFile(*target, scratch, rights, writeBytes);
+}
+
 }  // namespace
 
-bool WriteFileAtomically(const std::filesystem::path& path, std::string_view bytes,
-                         const std::filesystem::path& scratchFolder) {
-    const std::filesystem::path scratch =
-        scratchFolder.empty() ? path : scratchFolder / path.filename();
-    return ReplaceFile(path, scratch, WholeFiles::RightsFor(path, 0666),
-                       [bytes](int file) { return WholeFiles::WriteAll(file, bytes); });
+bool WriteFileAtomically(const fs::path& path, std::string_view bytes,
+                         const fs::path& scratchFolder) {
+    return WriteFile(path, scratchFolder,
+                     [bytes](int file) { return WholeFiles::WriteAll(file, bytes); });
 }
 
-bool WritePrivateFileAtomically(const std::filesystem::path& path, std::string_view bytes) {
-    return ReplaceFile(path, path, 0600,
-                       [bytes](int file) { return WholeFiles::WriteAll(file, bytes); });
-}
-
-bool WriteFileAtomically(const std::filesystem::path& path,
-                         const std::function<void(std::ostream&)>& write) {
-    return ReplaceFile(path, path, WholeFiles::RightsFor(path, 0666), [&write](int file) {
+bool WriteFileAtomically(const fs::path& path, const std::function<void(std::ostream&)>& write) {
+    return WriteFile(path, {}, [&write](int file) {
         CFileBuffer buffer(file);
         std::ostream stream(&buffer);
         write(stream);
@@ -88,7 +119,12 @@ bool WriteFileAtomically(const std::filesystem::path& path,
     });
 }
 
-std::optional<std::string> ReadWholeFile(const std::filesystem::path& path, std::size_t limit) {
+bool WritePrivateFileAtomically(const fs::path& path, std::string_view bytes) {
+    return ReplaceFile(path, path, 0600,
+                       [bytes](int file) { return WholeFiles::WriteAll(file, bytes); });
+}
+
+std::optional<std::string> ReadWholeFile(const fs::path& path, std::size_t limit) {
     const int file = open(path.c_str(), O_RDONLY | O_CLOEXEC);
     if (file < 0) return std::nullopt;
     std::string bytes;

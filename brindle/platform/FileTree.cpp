@@ -2,6 +2,7 @@
 #include "brindle/platform/FileTree.h"
 
 #include "brindle/platform/AtomicFile.h"
+#include "brindle/platform/internal/ScratchEntries.h"
 #include "brindle/platform/internal/WholeFiles.h"
 
 #include <fcntl.h>
@@ -21,7 +22,7 @@ namespace fs = std::filesystem;
 namespace {
 
 constexpr mode_t kUsualFileRights = 0666;
-constexpr unsigned kUsualFolderRights = 0777;
+constexpr mode_t kUsualFolderRights = 0777;
 
 bool IsEntryName(std::string_view name) {
     return !name.empty() && name != "." && name != ".." && name.find('/') == name.npos &&
@@ -74,12 +75,10 @@ bool MoveAside(const fs::path& fresh, const fs::path& path) {
     return false;
 }
 
-/// The folder itself for a path that ends with "/" or is a link to it.
-fs::path TargetOf(const fs::path& path) {
-    const fs::path named = path.has_filename() ? path : path.parent_path();
-    std::error_code error;
-    fs::path linked = fs::is_symlink(named, error) ? fs::canonical(named, error) : named;
-    return error ? named : linked;
+/// Gives a folder the rights of the one that it replaces.
+bool TakeRightsOf(const fs::path& old, const fs::path& fresh) {
+    struct stat status {};
+    return stat(old.c_str(), &status) != 0 || chmod(fresh.c_str(), status.st_mode & 07777) == 0;
 }
 
 /// Puts a folder to where it belongs; what stood there has its name then.
@@ -117,16 +116,16 @@ std::optional<FileNode> ReadFolder(const fs::path& path, std::uint64_t limit) {
 
 bool WriteFolderAtomically(const fs::path& path, const FileNode& tree) {
     if (!tree.mIsFolder) return false;
-    const fs::path target = TargetOf(path);
-    std::string beside = target.string() + ".XXXXXX";
-    if (mkdtemp(beside.data()) == nullptr) return false;
-    const bool ok = FillFolder(beside, tree) &&
-                    chmod(beside.c_str(), WholeFiles::RightsFor(target, kUsualFolderRights)) == 0 &&
-                    PutInPlace(beside, target);
-    // Now it is the old folder, or what could not be put in its place.
-    std::error_code ignored;
-    fs::remove_all(beside, ignored);
-    if (ok) WholeFiles::FlushFolder(target.parent_path());
+    const auto target = WholeFiles::BehindLinks(path.has_filename() ? path : path.parent_path());
+    if (!target) return false;
+    fs::path beside = *target;
+    ScratchEntries::RemoveOld(*target);
+    if (!ScratchEntries::MakeNewFolder(beside, kUsualFolderRights)) return false;
+    // Behind an exchange it is the old folder, else what could not be put in its place.
+    const ScratchEntries::CRemover remover(beside);
+    const bool ok =
+        FillFolder(beside, tree) && TakeRightsOf(*target, beside) && PutInPlace(beside, *target);
+    if (ok) WholeFiles::FlushFolder(target->parent_path());
     return ok;
 }
 

@@ -2,7 +2,6 @@
 #include "brindle/platform/internal/WholeFiles.h"
 
 #include <fcntl.h>
-#include <sys/stat.h>
 #include <unistd.h>
 
 #include <cerrno>
@@ -27,12 +26,15 @@ void FlushFolder(const std::filesystem::path& folder) {
     close(file);
 }
 
-unsigned RightsFor(const std::filesystem::path& path, unsigned usual) {
-    struct stat status {};
-    if (stat(path.c_str(), &status) == 0) return status.st_mode & 07777;
-    const mode_t mask = umask(0);
-    umask(mask);
-    return usual & ~mask;
+std::optional<std::filesystem::path> BehindLinks(std::filesystem::path path) {
+    constexpr int kMostLinks = 40;
+    for (int links = 0; links <= kMostLinks; ++links) {
+        std::error_code error;
+        const std::filesystem::path target = std::filesystem::read_symlink(path, error);
+        if (error) return path;
+        path = path.parent_path() / target;
+    }
+    return std::nullopt;
 }
 
 }  // namespace brindle::WholeFiles

@@ -1,39 +1,27 @@
 // SPDX-License-Identifier: MIT
+#include "tests/support/ScratchFolder.h"
+
 #include "brindle/platform/AtomicFile.h"
 #include "brindle/platform/ZipContainer.h"
 
 #include <doctest/doctest.h>
 #include <zip.h>
 
-#include <unistd.h>
-
 #include <filesystem>
 #include <string>
 #include <vector>
 
 using namespace brindle;
+using brindle::test::CScratchFolder;
 
 namespace {
-
-class CFolder {
-public:
-    CFolder()
-        : mPath(std::filesystem::temp_directory_path() /
-                ("brindle_files_test_" + std::to_string(getpid()))) {
-        std::filesystem::remove_all(mPath);
-        std::filesystem::create_directories(mPath);
-    }
-    ~CFolder() { std::filesystem::remove_all(mPath); }
-
-    std::filesystem::path mPath;
-};
 
 struct TZipEntry {
     const char* mName;
     std::string mContents;
 };
 
-std::string ZipOf(const std::filesystem::path& path, const std::vector<TZipEntry>& entries) {
+std::string ZipOf(const std::string& path, const std::vector<TZipEntry>& entries) {
     zip_t* archive = zip_open(path.c_str(), ZIP_CREATE | ZIP_TRUNCATE, nullptr);
     for (const TZipEntry& entry : entries) {
         zip_source_t* source =
@@ -47,11 +35,10 @@ std::string ZipOf(const std::filesystem::path& path, const std::vector<TZipEntry
 }  // namespace
 
 TEST_CASE("A zip container is a tree of files") {
-    const CFolder folder;
-    const std::string bytes =
-        ZipOf(folder.mPath / "a.zip", {{"META-INF/container.xml", "<c/>"},
-                                       {"score.xml", std::string(100'000, 'x')},
-                                       {"../../up.txt", "up"}});
+    const CScratchFolder folder;
+    const std::string bytes = ZipOf(folder.File("a.zip"), {{"META-INF/container.xml", "<c/>"},
+                                                           {"score.xml", std::string(100'000, 'x')},
+                                                           {"../../up.txt", "up"}});
     const auto root = UnpackZip(bytes);
     REQUIRE(root.has_value());
     CHECK(root->Child("META-INF")->Child("container.xml")->mContents == "<c/>");
@@ -69,22 +56,22 @@ TEST_CASE("A zip container is a tree of files") {
 }
 
 TEST_CASE("A zip bomb is refused") {
-    const CFolder folder;
-    const std::string bytes = ZipOf(folder.mPath / "bomb.zip",
-                                    {{"score.xml", std::string(kZipMaxUnpackedSize + 1, '\0')}});
+    const CScratchFolder folder;
+    const std::string bytes =
+        ZipOf(folder.File("bomb.zip"), {{"score.xml", std::string(kZipMaxUnpackedSize + 1, '\0')}});
     CHECK(bytes.size() < 1'000'000);
     CHECK_FALSE(UnpackZip(bytes).has_value());
 }
 
 TEST_CASE("A file is replaced as a whole or not at all") {
-    const CFolder folder;
-    const auto path = folder.mPath / "file.txt";
+    const CScratchFolder folder;
+    const auto path = folder.File("file.txt");
     CHECK(WriteFileAtomically(path, "one"));
     CHECK(WriteFileAtomically(path, "two"));
     CHECK(ReadWholeFile(path) == "two");
     CHECK_FALSE(ReadWholeFile(path, 2).has_value());
-    CHECK_FALSE(WriteFileAtomically(folder.mPath / "missing" / "file.txt", "x"));
-    CHECK_FALSE(WriteFileAtomically(folder.mPath, "a folder stands here"));
-    CHECK(std::distance(std::filesystem::directory_iterator(folder.mPath), {}) == 1);
-    CHECK_FALSE(ReadWholeFile(folder.mPath / "missing").has_value());
+    CHECK_FALSE(WriteFileAtomically(folder.File("missing/file.txt"), "x"));
+    CHECK_FALSE(WriteFileAtomically(folder.Path(), "a folder stands here"));
+    CHECK(std::distance(std::filesystem::directory_iterator(folder.Path()), {}) == 1);
+    CHECK_FALSE(ReadWholeFile(folder.File("missing")).has_value());
 }

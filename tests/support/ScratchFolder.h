@@ -6,6 +6,7 @@
 #include <cstdlib>
 #include <filesystem>
 #include <string>
+#include <string_view>
 
 namespace brindle::test {
 
@@ -26,7 +27,7 @@ public:
     }
 
     [[nodiscard]] std::string Path() const { return mPath.string(); }
-    [[nodiscard]] std::string File(const char* name) const { return (mPath / name).string(); }
+    [[nodiscard]] std::string File(std::string_view name) const { return (mPath / name).string(); }
 
 private:
     std::filesystem::path mPath;

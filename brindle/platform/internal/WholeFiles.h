@@ -2,6 +2,7 @@
 #pragma once
 
 #include <filesystem>
+#include <optional>
 #include <string_view>
 
 /// What writing a file and writing a folder as a whole have in common.
@@ -13,7 +14,8 @@ namespace brindle::WholeFiles {
 /// Flushes the entries of a folder to the disk; "" is the current one.
 void FlushFolder(const std::filesystem::path& folder);
 
-/// The rights of what stands at the path, else `usual` without what the process masks.
-[[nodiscard]] unsigned RightsFor(const std::filesystem::path& path, unsigned usual);
+/// What the path names behind all links; a link to nothing names what it would be. Nothing for
+/// links in a ring.
+[[nodiscard]] std::optional<std::filesystem::path> BehindLinks(std::filesystem::path path);
 
 }  // namespace brindle::WholeFiles
