@@ -9,6 +9,7 @@
 
 #include <limits>
 #include <new>
+#include <utility>
 
 namespace brindle {
 
@@ -18,7 +19,9 @@ std::string_view TextOf(const xmlChar* text) {
     return text == nullptr ? std::string_view() : reinterpret_cast<const char*>(text);
 }
 
+// Where there is a text to be had, none at all means that memory was short.
 std::string TakeText(xmlChar* text) {
+    if (text == nullptr) throw std::bad_alloc();
     const std::unique_ptr<xmlChar, decltype(xmlFree)> owner(text, xmlFree);
     return std::string(TextOf(text));
 }
@@ -52,13 +55,34 @@ std::size_t SizeOf(const xmlNode* node, std::size_t limit) {
 using XPathContext = std::unique_ptr<xmlXPathContext, decltype(&xmlXPathFreeContext)>;
 using XPathResult = std::unique_ptr<xmlXPathObject, decltype(&xmlXPathFreeObject)>;
 
+// Short memory and a wrong path both have no result; they differ by the error.
+void HearPathError(void* wasMemoryShort, xmlErrorPtr error) {
+    const bool isShort = error->code == XML_ERR_NO_MEMORY ||
+                         error->code == int{XML_XPATH_EXPRESSION_OK} + XPATH_MEMORY_ERROR;
+    if (isShort) *static_cast<bool*>(wasMemoryShort) = true;
+}
+
+/// Calls `step` with a context for paths. Throws when memory was short.
+template <class Step>
+auto WithPathContext(xmlDocPtr document, Step step) {
+    const xml::CMemoryWatch watch;
+    bool wasMemoryShort = false;
+    const XPathContext context(xmlXPathNewContext(document), xmlXPathFreeContext);
+    if (!context) throw std::bad_alloc();
+    context->error = HearPathError;
+    context->userData = &wasMemoryShort;
+    auto result = step(context.get());
+    if (wasMemoryShort) throw std::bad_alloc();
+    watch.Check();
+    return result;
+}
+
 XPathResult Evaluate(xmlXPathCompExpr* compiled, xmlNodePtr node) {
     if (compiled == nullptr || node == nullptr) return {nullptr, xmlXPathFreeObject};
-    const XPathContext context(xmlXPathNewContext(node->doc), xmlXPathFreeContext);
-    if (!context) throw std::bad_alloc();
-    context->node = node;
-    context->error = [](void*, xmlErrorPtr) {};
-    return {xmlXPathCompiledEval(compiled, context.get()), xmlXPathFreeObject};
+    return WithPathContext(node->doc, [&](xmlXPathContextPtr context) {
+        context->node = node;
+        return XPathResult(xmlXPathCompiledEval(compiled, context), xmlXPathFreeObject);
+    });
 }
 
 }  // namespace
@@ -68,7 +92,11 @@ std::string_view XmlNode::name() const {
 }
 
 std::string XmlNode::stringValue() const {
-    return mNode == nullptr ? std::string() : TakeText(xmlNodeGetContent(mNode));
+    if (mNode == nullptr) return {};
+    const xml::CMemoryWatch watch;
+    std::string text = TakeText(xmlNodeGetContent(mNode));
+    watch.Check();
+    return text;
 }
 
 std::optional<std::string> XmlNode::attribute(std::string_view name) const {
@@ -76,7 +104,11 @@ std::optional<std::string> XmlNode::attribute(std::string_view name) const {
     for (xmlAttrPtr attribute = mNode->properties; attribute != nullptr;
          attribute = attribute->next) {
         if (TextOf(attribute->name) != name) continue;
-        return TakeText(xmlNodeListGetString(mNode->doc, attribute->children, 1));
+        if (attribute->children == nullptr) return std::string();
+        const xml::CMemoryWatch watch;
+        std::string value = TakeText(xmlNodeListGetString(mNode->doc, attribute->children, 1));
+        watch.Check();
+        return value;
     }
     return std::nullopt;
 }
@@ -136,10 +168,13 @@ XmlNode XmlNode::addCopyOf(const XmlNode& element, std::size_t& room) {
         room = 0;
         return {};
     }
+    const xml::CMemoryWatch watch;
     const xmlNodePtr copy = xmlDocCopyNode(element.mNode, mNode->doc, 1);
     if (copy == nullptr) throw std::bad_alloc();
+    const XmlNode added(xmlAddChild(mNode, copy));
+    watch.Check();
     room -= size;
-    return XmlNode(xmlAddChild(mNode, copy));
+    return added;
 }
 
 int XmlNode::line() const {
@@ -165,13 +200,13 @@ XmlNode XmlNode::firstForXPath(const XmlPath& path) const {
 }
 
 XmlPath::XmlPath(const char* path) {
-    const XPathContext context(xmlXPathNewContext(nullptr), xmlXPathFreeContext);
-    if (!context) throw std::bad_alloc();
-    context->error = [](void*, xmlErrorPtr) {};
-    mCompiled.reset(xmlXPathCtxtCompile(context.get(), reinterpret_cast<const xmlChar*>(path)),
-                    [](xmlXPathCompExpr* compiled) {
-                        if (compiled != nullptr) xmlXPathFreeCompExpr(compiled);
-                    });
+    const auto free = [](xmlXPathCompExpr* compiled) {
+        if (compiled != nullptr) xmlXPathFreeCompExpr(compiled);
+    };
+    mCompiled = WithPathContext(nullptr, [&](xmlXPathContextPtr context) {
+        return std::shared_ptr<xmlXPathCompExpr>(
+            xmlXPathCtxtCompile(context, reinterpret_cast<const xmlChar*>(path)), free);
+    });
 }
 
 XmlDocument::XmlDocument(_xmlDoc* document) : mDocument(document, xmlFreeDoc) {}
@@ -180,16 +215,9 @@ std::variant<XmlDocument, XmlError> XmlDocument::FromBytes(std::string_view byte
     if (bytes.size() > std::numeric_limits<int>::max()) {
         return XmlError{XML_ERR_DOCUMENT_END, "Document too long", 1, 1};
     }
-    const std::unique_ptr<xmlParserCtxt, decltype(&xmlFreeParserCtxt)> context(xmlNewParserCtxt(),
-                                                                               xmlFreeParserCtxt);
-    if (!context) throw std::bad_alloc();
-    xml::RefuseOutsideWorld(*context->sax);
-    context->sax->serror = [](void*, xmlErrorPtr) {};
-    xmlDocPtr document =
-        xmlCtxtReadMemory(context.get(), bytes.data(), static_cast<int>(bytes.size()), nullptr,
-                          nullptr, xml::kOptions | XML_PARSE_BIG_LINES);
-    if (document == nullptr) return xml::ErrorFrom(context->lastError);
-    return XmlDocument(document);
+    xml::CParse parse(bytes);
+    if (auto error = parse.Run()) return *std::move(error);
+    return XmlDocument(parse.TakeDocument());
 }
 
 XmlNode XmlDocument::rootElement() const {

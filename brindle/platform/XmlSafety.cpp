@@ -1,38 +1,190 @@
 // SPDX-License-Identifier: MIT
+// The XML library takes n squared steps for the n attributes of an element, some of them before it
+// tells of the element. So it is given the bytes piece by piece and gets no more of them when it
+// has a tag with too many at hand.
 #include "brindle/platform/internal/XmlSafety.h"
 
 #include <libxml/SAX2.h>
+#include <libxml/parserInternals.h>
+#include <libxml/xmlerror.h>
+
+#include <algorithm>
+#include <cstring>
+#include <mutex>
+#include <new>
+#include <string>
+#include <utility>
 
 namespace brindle::xml {
 
 namespace {
 
-// An external entity is never declared, so that a reference to it finds nothing to load.
-void DeclareInternalEntity(void* context, const xmlChar* name, int type, const xmlChar* publicId,
-                           const xmlChar* systemId, xmlChar* content) {
-    const bool isInternal =
-        type == XML_INTERNAL_GENERAL_ENTITY || type == XML_INTERNAL_PARAMETER_ENTITY;
-    if (isInternal) xmlSAX2EntityDecl(context, name, type, publicId, systemId, content);
-}
+// No score has more than some tens in an element.
+constexpr int kMaxAttributes = 1'000;
+// Of a document type that the document brings: declared ones, and those that elements get from it.
+constexpr int kMaxDeclaredAttributes = 1'000;
+constexpr int kMaxDefaultedAttributes = 100'000;
 
-void IgnoreExternalSubset(void*, const xmlChar*, const xmlChar*, const xmlChar*) {}
+constexpr const char* kTooManyAttributes = "element with more than 1000 attributes";
 
-xmlParserInputPtr ResolveNothing(void*, const xmlChar*, const xmlChar*) {
-    return nullptr;
-}
-
-}  // namespace
-
-void RefuseOutsideWorld(xmlSAXHandler& handler) {
-    handler.entityDecl = DeclareInternalEntity;
-    handler.externalSubset = IgnoreExternalSubset;
-    handler.resolveEntity = ResolveNothing;
-}
+constexpr int kOptions = XML_PARSE_NOENT | XML_PARSE_NONET | XML_PARSE_BIG_LINES;
 
 XmlError ErrorFrom(const xmlError& error) {
     std::string text = error.message == nullptr ? "unknown XML error" : error.message;
     while (!text.empty() && (text.back() == '\n' || text.back() == ' ')) text.pop_back();
     return {error.code, text, error.line, error.int2};
+}
+
+}  // namespace
+
+void StartLibrary() {
+    static std::once_flag once;
+    std::call_once(once, xmlInitParser);
+}
+
+CMemoryWatch::CMemoryWatch()
+    : mFormer((StartLibrary(), xmlStructuredError)), mFormerContext(xmlStructuredErrorContext) {
+    xmlSetStructuredErrorFunc(this, Hear);
+}
+
+CMemoryWatch::~CMemoryWatch() {
+    xmlSetStructuredErrorFunc(mFormerContext, mFormer);
+}
+
+void CMemoryWatch::Hear(void* self, xmlErrorPtr error) {
+    if (error->code == XML_ERR_NO_MEMORY) static_cast<CMemoryWatch*>(self)->mWasShort = true;
+}
+
+void CMemoryWatch::Check() const {
+    if (mWasShort) throw std::bad_alloc();
+}
+
+struct CParse::Callbacks {
+    static int Read(void* self, char* buffer, int length) {
+        CParse& parse = *static_cast<CParse*>(self);
+        if (parse.mContext != nullptr && parse.IsTagTooLong()) parse.EndInTag();
+        const auto count = std::min(static_cast<std::size_t>(length), parse.mRest.size());
+        std::memcpy(buffer, parse.mRest.data(), count);
+        parse.mRest.remove_prefix(count);
+        return static_cast<int>(count);
+    }
+
+    static void StartElement(void* context, const xmlChar* name, const xmlChar* prefix,
+                             const xmlChar* uri, int namespaceCount, const xmlChar** namespaces,
+                             int attributeCount, int defaultedCount, const xmlChar** attributes) {
+        CParse& parse = Of(context);
+        parse.mDefaultedAttributes += defaultedCount;
+        if (attributeCount > kMaxAttributes || namespaceCount > kMaxAttributes) {
+            parse.Guarded([&] { parse.Refuse(kTooManyAttributes); });
+        } else if (parse.mDefaultedAttributes > kMaxDefaultedAttributes) {
+            parse.Guarded([&] { parse.Refuse("too many attributes from the document type"); });
+        } else if (parse.mStartElement != nullptr) {
+            parse.Guarded([&] { parse.mStartElement(parse, name, attributeCount, attributes); });
+        } else {
+            xmlSAX2StartElementNs(context, name, prefix, uri, namespaceCount, namespaces,
+                                  attributeCount, defaultedCount, attributes);
+        }
+    }
+
+    static void DeclareAttribute(void* context, const xmlChar* element, const xmlChar* name,
+                                 int type, int defaultKind, const xmlChar* defaultValue,
+                                 xmlEnumerationPtr tree) {
+        xmlSAX2AttributeDecl(context, element, name, type, defaultKind, defaultValue, tree);
+        CParse& parse = Of(context);
+        if (++parse.mDeclaredAttributes <= kMaxDeclaredAttributes) return;
+        parse.Guarded([&] { parse.Refuse("document type with more than 1000 attributes"); });
+    }
+
+    // An external entity is never declared, so that a reference to it finds nothing to load.
+    static void DeclareInternalEntity(void* context, const xmlChar* name, int type,
+                                      const xmlChar* publicId, const xmlChar* systemId,
+                                      xmlChar* content) {
+        const bool isInternal =
+            type == XML_INTERNAL_GENERAL_ENTITY || type == XML_INTERNAL_PARAMETER_ENTITY;
+        if (isInternal) xmlSAX2EntityDecl(context, name, type, publicId, systemId, content);
+    }
+
+    static void IgnoreExternalSubset(void*, const xmlChar*, const xmlChar*, const xmlChar*) {}
+
+    static xmlParserInputPtr ResolveNothing(void*, const xmlChar*, const xmlChar*) {
+        return nullptr;
+    }
+
+    // Only the first fault is kept, and only one that makes the text not well-formed.
+    static void FaultFound(void* context, xmlErrorPtr error) {
+        CParse& parse = Of(context);
+        if (error->code == XML_ERR_NO_MEMORY) parse.mWasMemoryShort = true;
+        if (error->level == XML_ERR_FATAL) parse.Guarded([&] { parse.Keep(ErrorFrom(*error)); });
+    }
+};
+
+CParse::CParse(std::string_view bytes) : mRest(bytes) {
+    const CMemoryWatch watch;
+    mContext = xmlCreateIOParserCtxt(nullptr, nullptr, Callbacks::Read, nullptr, this,
+                                     XML_CHAR_ENCODING_NONE);
+    if (mContext == nullptr) throw std::bad_alloc();
+    mContext->_private = this;
+    xmlCtxtUseOptions(mContext, kOptions);
+    xmlSAXHandler& handler = Handler();
+    handler.startElementNs = Callbacks::StartElement;
+    handler.attributeDecl = Callbacks::DeclareAttribute;
+    handler.entityDecl = Callbacks::DeclareInternalEntity;
+    handler.externalSubset = Callbacks::IgnoreExternalSubset;
+    handler.resolveEntity = Callbacks::ResolveNothing;
+    handler.serror = Callbacks::FaultFound;
+}
+
+CParse::~CParse() {
+    // A parse makes a document in any case, for the entities that are defined inside.
+    xmlFreeDoc(TakeDocument());
+    xmlFreeParserCtxt(mContext);
+}
+
+CParse& CParse::Of(void* context) {
+    return *static_cast<CParse*>(static_cast<xmlParserCtxtPtr>(context)->_private);
+}
+
+std::optional<XmlError> CParse::Run() {
+    const CMemoryWatch watch;
+    xmlParseDocument(mContext);
+    if (mThrown) std::rethrow_exception(std::exchange(mThrown, nullptr));
+    if (mWasMemoryShort) throw std::bad_alloc();
+    watch.Check();
+    if (mLineOfLongTag > 0) {
+        mError = {XML_ERR_INTERNAL_ERROR, kTooManyAttributes, mLineOfLongTag, mColumnInLongTag};
+    } else if (!mError && mContext->wellFormed == 0) {
+        mError = {XML_ERR_INTERNAL_ERROR, "not well-formed", 0, 0};
+    }
+    return mError;
+}
+
+xmlDoc* CParse::TakeDocument() {
+    return std::exchange(mContext->myDoc, nullptr);
+}
+
+void CParse::Refuse(const char* description) {
+    Keep({XML_ERR_INTERNAL_ERROR, description, xmlSAX2GetLineNumber(mContext),
+          xmlSAX2GetColumnNumber(mContext)});
+    xmlStopParser(mContext);
+}
+
+// The parser is reading and can't be stopped: it finds the end of the bytes.
+void CParse::EndInTag() {
+    if (mLineOfLongTag == 0) {
+        mLineOfLongTag = xmlSAX2GetLineNumber(mContext);
+        mColumnInLongTag = xmlSAX2GetColumnNumber(mContext);
+    }
+    mRest = {};
+}
+
+// The array of the attributes grows to twice of what is needed, five fields each; there are two
+// fields for each namespace that is declared.
+bool CParse::IsTagTooLong() const {
+    return mContext->maxatts > 2 * 5 * (kMaxAttributes + 2) || mContext->nsNr > 2 * kMaxAttributes;
+}
+
+void CParse::Keep(XmlError error) {
+    if (!mError) mError = std::move(error);
 }
 
 }  // namespace brindle::xml

@@ -19,19 +19,6 @@ std::string_view TextOf(const unsigned char* text) {
     return text == nullptr ? std::string_view() : reinterpret_cast<const char*>(text);
 }
 
-xmlParserCtxtPtr ContextOf(void* context) {
-    return static_cast<xmlParserCtxtPtr>(context);
-}
-
-// A streaming parse makes a document for the entities that are defined inside.
-struct TContextEnd {
-    void operator()(xmlParserCtxtPtr context) const {
-        xmlFreeDoc(context->myDoc);
-        context->myDoc = nullptr;
-        xmlFreeParserCtxt(context);
-    }
-};
-
 }  // namespace
 
 std::pair<std::string_view, std::string_view> XmlAttributes::At(int n) const {
@@ -50,42 +37,29 @@ std::optional<std::string_view> XmlAttributes::Find(std::string_view name) const
 }
 
 struct XmlStreamParser::Callbacks {
-    static XmlStreamParser& Self(void* context) {
-        return *static_cast<XmlStreamParser*>(ContextOf(context)->_private);
-    }
-
-    // No exception may pass the C library: it waits until the parse has been stopped.
     template <class Step>
-    static void Guarded(void* context, Step step) {
-        XmlStreamParser& self = Self(context);
-        if (self.mThrown) return;
-        try {
-            step(self);
-        } catch (...) {
-            self.mThrown = std::current_exception();
-            xmlStopParser(ContextOf(context));
-        }
+    static void Guarded(xml::CParse& parse, Step step) {
+        parse.Guarded([&] { step(*static_cast<XmlStreamParser*>(parse.mHost)); });
     }
 
-    static void StartElement(void* context, const xmlChar* name, const xmlChar*, const xmlChar*,
-                             int, const xmlChar**, int attributeCount, int,
+    static void StartElement(xml::CParse& parse, const xmlChar* name, int attributeCount,
                              const xmlChar** attributes) {
-        Guarded(context, [&](XmlStreamParser& self) {
-            self.Deliver();
-            if (self.mDelegate == nullptr) return;
-            self.mDelegate->didStartElement(self, TextOf(name), {attributes, attributeCount});
-        });
+        auto& self = *static_cast<XmlStreamParser*>(parse.mHost);
+        self.Deliver();
+        if (self.mDelegate == nullptr) return;
+        self.mDelegate->didStartElement(self, TextOf(name), {attributes, attributeCount});
     }
 
     static void EndElement(void* context, const xmlChar* name, const xmlChar*, const xmlChar*) {
-        Guarded(context, [&](XmlStreamParser& self) {
+        Guarded(xml::CParse::Of(context), [&](XmlStreamParser& self) {
             self.Deliver();
             if (self.mDelegate != nullptr) self.mDelegate->didEndElement(self, TextOf(name));
         });
     }
 
     static void Characters(void* context, const xmlChar* text, int length) {
-        Guarded(context, [&](XmlStreamParser& self) {
+        xml::CParse& parse = xml::CParse::Of(context);
+        Guarded(parse, [&](XmlStreamParser& self) {
             const auto size = static_cast<std::size_t>(length);
             if (self.mIsTextWanted) {
                 self.mText.append(reinterpret_cast<const char*>(text), size);
@@ -93,16 +67,9 @@ struct XmlStreamParser::Callbacks {
                 self.mUnwantedLength += size;
             }
             if (self.mText.size() + self.mUnwantedLength <= kXmlMaxTextLength) return;
-            self.Fail(
-                {XML_ERR_INTERNAL_ERROR, "text too long", self.lineNumber(), self.columnNumber()});
             self.mText.clear();
-            xmlStopParser(ContextOf(context));
+            parse.Refuse("text too long");
         });
-    }
-
-    // Only the first fault is kept, and only one that makes the text not well-formed.
-    static void FaultFound(void* context, xmlErrorPtr error) {
-        if (error->level == XML_ERR_FATAL) Self(context).Fail(xml::ErrorFrom(*error));
     }
 };
 
@@ -116,10 +83,6 @@ void XmlStreamParser::Deliver() {
     mText.clear();
 }
 
-void XmlStreamParser::Fail(XmlError error) {
-    if (!mError) mError = std::move(error);
-}
-
 int XmlStreamParser::lineNumber() const {
     return mContext == nullptr ? 0 : xmlSAX2GetLineNumber(mContext);
 }
@@ -130,7 +93,6 @@ int XmlStreamParser::columnNumber() const {
 
 bool XmlStreamParser::parse(std::string_view bytes) {
     mError.reset();
-    mThrown = nullptr;
     mIsTextWanted = true;
     mUnwantedLength = 0;
     mText.clear();
@@ -140,29 +102,22 @@ bool XmlStreamParser::parse(std::string_view bytes) {
         if (mDelegate != nullptr) mDelegate->parseErrorOccurred(*this, *mError);
         return false;
     }
-    const std::unique_ptr<xmlParserCtxt, TContextEnd> context(
-        xmlCreateMemoryParserCtxt(bytes.data(), static_cast<int>(bytes.size())));
-    if (!context) throw std::bad_alloc();
-    xmlCtxtUseOptions(context.get(), xml::kOptions);
-    xmlSAXHandler& handler = *context->sax;
-    xml::RefuseOutsideWorld(handler);
-    handler.startElementNs = Callbacks::StartElement;
+    xml::CParse parse(bytes);
+    parse.mHost = this;
+    parse.SetStartElement(Callbacks::StartElement);
+    xmlSAXHandler& handler = parse.Handler();
     handler.endElementNs = Callbacks::EndElement;
     handler.characters = Callbacks::Characters;
     handler.ignorableWhitespace = Callbacks::Characters;
     handler.cdataBlock = Callbacks::Characters;
     handler.comment = nullptr;
     handler.processingInstruction = nullptr;
-    handler.serror = Callbacks::FaultFound;
-    context->_private = this;
-    mContext = context.get();
+    mContext = &parse.Context();
     const auto forgetContext = [](void** place) { *place = nullptr; };
     const std::unique_ptr<void*, decltype(forgetContext)> atEnd(&mContext, forgetContext);
 
     if (mDelegate != nullptr) mDelegate->didStartDocument(*this);
-    xmlParseDocument(context.get());
-    if (mThrown) std::rethrow_exception(std::exchange(mThrown, nullptr));
-    if (context->wellFormed == 0) Fail({XML_ERR_INTERNAL_ERROR, "not well-formed", 0, 0});
+    mError = parse.Run();
     if (mDelegate != nullptr) {
         if (mError) {
             mDelegate->parseErrorOccurred(*this, *mError);

@@ -4,7 +4,6 @@
 #include "brindle/platform/XmlError.h"
 
 #include <cstddef>
-#include <exception>
 #include <memory>
 #include <optional>
 #include <string>
@@ -57,7 +56,8 @@ public:
 /// A streaming XML parse of bytes in memory, in any encoding that they declare.
 ///
 /// Nothing outside the bytes is ever read: external entities and document types are left unread,
-/// entities that are defined inside expand within narrow limits, and nesting is limited too.
+/// entities that are defined inside expand within narrow limits, and nesting is limited too. An
+/// element with more than 1000 attributes is a fault.
 /// Names of elements come without their prefix.
 class XmlStreamParser {
 public:
@@ -87,14 +87,12 @@ private:
     struct Callbacks;
 
     void Deliver();
-    void Fail(XmlError error);
 
     XmlStreamDelegate* mDelegate = nullptr;
     void* mContext = nullptr;  // of the parse that runs
     bool mIsTextWanted = true;
     std::string mText;                // gathered since the last tag
     std::size_t mUnwantedLength = 0;  // of other text since then
-    std::exception_ptr mThrown;       // by the delegate
     std::optional<XmlError> mError;
 };
 
