@@ -79,8 +79,9 @@ struct CChordSheetReading {
 /// Positions are those of ParseStringIntoHarmAnlsChords: a chord and a hold (`.`, `/`) move on by
 /// `mBeatsPerChord`, and `|` goes on to the next bar line. Chords are read by ReadChordText. `|:`
 /// and `:|` repeat, with endings `[1` and `[2`; `%` alone in a bar is the bar before it; a name in
-/// `{}` or before `:` begins a section. Repeats add at most a million bars and chords; more is a
-/// fault. Time is linear in the length of what is read and played.
+/// `{}` or before `:` begins a section. Repeats may add 64 times the written bars and chords,
+/// 10,000 in any case and 100,000 at most; more is a fault. Time is linear in the length of what is
+/// read and played.
 [[nodiscard]] CChordSheetReading ReadChordSheet(std::string_view text,
                                                 const CChordSheetPrefs& prefs = {});
 

@@ -20,16 +20,19 @@ public:
 
     bool Run() {
         std::size_t count = 0;
+        std::size_t bytes = 0;
         for (const TMusicXMLMeasure& measure : mWritten.mMeasures) {
             count += measure.mHarmonies.size();
+            for (const TMusicXMLHarmony& harmony : measure.mHarmonies) bytes += BytesOf(harmony);
         }
         mDoc.Harmonies.reserve(count);
+        mLimits = PlayLimitsOf(mWritten.mMeasures.size(), bytes);
         for (std::size_t played = 0; IsInside(mIx); ++played) {
-            if (played == kMaxPlayedMeasures || mBytes > kMaxPlayedBytes) return false;
+            if (played == mLimits.mMeasures || mBytes > mLimits.mBytes) return false;
             PlayMeasure();
             ++mIx;
         }
-        return mBytes <= kMaxPlayedBytes;
+        return mBytes <= mLimits.mBytes;
     }
 
 private:
@@ -108,7 +111,7 @@ private:
         bool isFirst = true;
         for (const TMusicXMLHarmony& written : mMeasure->mHarmonies) {
             mBytes += BytesOf(written);
-            if (mBytes > kMaxPlayedBytes) return;
+            if (mBytes > mLimits.mBytes) return;
             TMusicXMLHarmony& harmony = mDoc.Harmonies.emplace_back(written);
             harmony.mPosition = mDistance;
             if (harmony.mKind.empty()) harmony.mKind = "major";
@@ -169,6 +172,7 @@ private:
     std::size_t mSegnoPairIx = 0;
     double mDistance = 0.0;
     std::size_t mBytes = 0;
+    TPlayLimits mLimits;
     bool mFirstSection = true;
 };
 
@@ -182,6 +186,14 @@ std::size_t BytesOf(const TMusicXMLHarmony& harmony) {
         bytes += degree.mValue.size() + degree.mType.size();
     }
     return bytes;
+}
+
+TPlayLimits PlayLimitsOf(std::size_t writtenMeasures, std::size_t writtenBytes) {
+    const auto limit = [](std::size_t written, std::size_t least, std::size_t most) {
+        return std::max(written, std::clamp(kMaxTimesPlayed * written, least, most));
+    };
+    return {limit(writtenMeasures, kMinPlayedMeasures, kMaxPlayedMeasures),
+            limit(writtenBytes, kMinPlayedBytes, kMaxPlayedBytes)};
 }
 
 bool PlayMeasures(const TWrittenMeasures& written, TMusicXMLDoc& doc) {

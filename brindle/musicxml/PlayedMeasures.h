@@ -21,8 +21,16 @@ struct TWrittenMeasures {
     std::span<const std::pair<std::int32_t, std::int32_t>> mSegnoPairs;
 };
 
+/// How far repeats and jumps may lead, from what is written; see kMaxTimesPlayed.
+struct TPlayLimits {
+    std::size_t mMeasures = 0;
+    std::size_t mBytes = 0;
+};
+
+[[nodiscard]] TPlayLimits PlayLimitsOf(std::size_t writtenMeasures, std::size_t writtenBytes);
+
 /// Walks the measures in playing order and appends what they hold to `doc`. False when the walk was
-/// cut at kMaxPlayedMeasures or kMaxPlayedBytes.
+/// cut at its limits.
 bool PlayMeasures(const TWrittenMeasures& written, TMusicXMLDoc& doc);
 
 /// The room in bytes that a harmony takes, about.

@@ -16,11 +16,18 @@ namespace brindle {
 
 struct Error;
 
-/// Most measures that one song may play, repeats and jumps counted. A song that goes on is cut
-/// there, and its load reports failure.
-inline constexpr std::size_t kMaxPlayedMeasures = 1'000'000;
-/// Most room in bytes that the played harmonies of one song may take; the same happens beyond.
-inline constexpr std::size_t kMaxPlayedBytes = std::size_t{1} << 30;
+/// Most measures that a score may have, those of all parts counted; a longer one fails to load.
+inline constexpr std::size_t kMaxWrittenMeasures = 1'000'000;
+/// How often repeats and jumps may play what is written, measures and room for harmonies alike. A
+/// song that goes on is cut there, and its load reports failure. A short song may play more often,
+/// and a long one less: see the two bounds below. What is written is played in any case.
+inline constexpr std::size_t kMaxTimesPlayed = 64;
+/// Measures that a song may always play, and most that it may.
+inline constexpr std::size_t kMinPlayedMeasures = 10'000;
+inline constexpr std::size_t kMaxPlayedMeasures = 100'000;
+/// The same for the room of the played harmonies in bytes.
+inline constexpr std::size_t kMinPlayedBytes = std::size_t{16} << 20;
+inline constexpr std::size_t kMaxPlayedBytes = std::size_t{256} << 20;
 
 struct TMusicXMLTimeSignature {
     double mPosition = kPosUndef;

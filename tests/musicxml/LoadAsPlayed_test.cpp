@@ -262,10 +262,47 @@ TEST_CASE("A song that does not end is cut, and the load says so") {
         TMusicXMLDoc doc;
         Error error;
         CHECK_FALSE(doc.LoadAsPlayedFromBytes(Bars(bars), &error));
-        CHECK(doc.HarmBarlines.size() == kMaxPlayedMeasures);
+        CHECK(doc.HarmBarlines.size() == kMinPlayedMeasures);
         CHECK(error.description == "the song is too long to be played");
     }
     CHECK(Roots(Loaded(Bars("A |:; B :|; C :| =4x="))) == "ABABCCCC");
+}
+
+TEST_CASE("What is played is bounded by what is written") {
+    // Each of the measures goes back to the beginning: 980,700 would be played.
+    std::string measures;
+    for (int i = 0; i < 1'400; ++i) {
+        measures +=
+            "<measure><sound dacapo='yes'/><harmony><root><root-step>C</root-step></root>"
+            "<kind>major</kind></harmony></measure>";
+    }
+    TMusicXMLDoc doc;
+    Error error;
+    CHECK_FALSE(doc.LoadAsPlayedFromBytes(Score(measures), &error));
+    CHECK(doc.HarmBarlines.size() == 64 * 1'400);
+    CHECK(doc.Harmonies.size() == 64 * 1'400);
+    CHECK(error.description == "the song is too long to be played");
+
+    // A bar of many long harmonies is bounded by their room.
+    const std::string kind(10'000, 'x');
+    std::string harmonies;
+    for (int i = 0; i < 100; ++i) {
+        harmonies +=
+            "<harmony><root><root-step>C</root-step></root><kind>" + kind + "</kind></harmony>";
+    }
+    CHECK_FALSE(
+        doc.LoadAsPlayedFromBytes(Score("<measure>" + harmonies +
+                                        "<barline><repeat direction='backward' times='5000'/>"
+                                        "</barline></measure>"),
+                                  &error));
+    CHECK(doc.Harmonies.size() < 6'600);
+    CHECK(doc.Harmonies.size() > 6'000);
+
+    // What is written is played in any case.
+    std::string many;
+    for (std::size_t i = 0; i < kMaxPlayedMeasures + 10; ++i) many += "<measure/>";
+    CHECK(doc.LoadAsPlayedFromBytes(Score(many), &error));
+    CHECK(doc.HarmBarlines.size() == kMaxPlayedMeasures + 10);
 }
 
 TEST_CASE("Hostile scores reach nothing outside and take bounded time and room") {
@@ -290,7 +327,7 @@ TEST_CASE("Hostile scores reach nothing outside and take bounded time and room")
                  titled("&e;"),
              Score(repeated("<a>", 100'000) + repeated("</a>", 100'000)),
              titled(repeated("0123456789", 1'000'001)),
-             Score(repeated("<measure/>", kMaxPlayedMeasures + 1)),
+             Score(repeated("<measure/>", kMaxWrittenMeasures + 1)),
          }) {
         TMusicXMLDoc doc;
         Error error;

@@ -8,8 +8,11 @@
 namespace brindle::ChordSheet {
 namespace {
 
-/// What repeats may add, in bars, chords and holds.
-constexpr std::size_t kMostRepeated = 1'000'000;
+/// What repeats may add, in bars, chords and holds: 64 times what is written, but so much that a
+/// short song can be repeated often, and not more than a long one needs.
+std::size_t MostRepeated(std::size_t written) {
+    return std::clamp<std::size_t>(64 * written, 10'000, 100'000);
+}
 
 /// A bar as it is written. Bars of nothing are none.
 struct TBar {
@@ -120,7 +123,8 @@ public:
           mBars(std::move(bars)),
           mEndingsFrom(EndingsFrom(mBars)),
           mReading(reading),
-          mBudget(kMostRepeated + mBars.size() + list.mTokens.size()),
+          mBudget(MostRepeated(mBars.size() + list.mTokens.size()) + mBars.size() +
+                  list.mTokens.size()),
           mIsEven((mPrefs.mEven || list.mIsEven) && HasBarLines(list)) {}
 
     void Play() {
@@ -263,7 +267,7 @@ private:
     }
 
     bool Spend(std::size_t count) {
-        if (mBudget < count) return GiveUp("its repeats make the song longer than a million bars");
+        if (mBudget < count) return GiveUp("its repeats make the song too long to be played");
         mBudget -= count;
         return true;
     }

@@ -8,6 +8,7 @@
 #include "brindle/theory/CSignKeyHeavy.h"
 
 #include <algorithm>
+#include <numeric>
 #include <optional>
 
 namespace brindle {
@@ -33,14 +34,14 @@ public:
     bool Run() {
         FindWhatHolds();
         const TPlayingOrder order = PlayScore(mScore.mMeasures);
-        MakeRoom(order);
+        const std::size_t mostBytes = MakeRoom(order);
         for (const std::uint32_t ix : order.mMeasures) {
-            if (mBytes > kMaxPlayedBytes) break;
+            if (mBytes > mostBytes) break;
             Play(ix);
         }
         SetDurations();
         AppendCopies(order);
-        return !order.mWasCut && mBytes <= kMaxPlayedBytes;
+        return !order.mWasCut && mBytes <= mostBytes;
     }
 
 private:
@@ -56,8 +57,8 @@ private:
         }
     }
 
-    // A long song takes much room; it is taken once.
-    void MakeRoom(const TPlayingOrder& order) {
+    // A long song takes much room; it is taken once. Gives how much it may be.
+    std::size_t MakeRoom(const TPlayingOrder& order) {
         std::vector<std::size_t> bytes;
         for (const TScoreMeasure& measure : mScore.mMeasures) {
             std::size_t sum = 0;
@@ -66,15 +67,18 @@ private:
             }
             bytes.push_back(sum);
         }
+        const std::size_t written = std::accumulate(bytes.begin(), bytes.end(), std::size_t{0});
+        const std::size_t mostBytes = PlayLimitsOf(bytes.size(), written).mBytes;
         std::size_t count = 0;
         std::size_t sum = 0;
         for (const std::uint32_t ix : order.mMeasures) {
             sum += bytes[ix];
-            if (sum > kMaxPlayedBytes) break;
+            if (sum > mostBytes) break;
             count += mScore.mMeasures[ix].mHarmonies.size();
         }
         mDoc.Harmonies.reserve(count);
         mDoc.HarmBarlines.reserve(order.mMeasures.size());
+        return mostBytes;
     }
 
     void Play(std::size_t ix) {
@@ -89,7 +93,6 @@ private:
         if (measure.mHasSlash) mDoc.ChordSequences.push_back(mDoc.Harmonies.size());
         for (const TWrittenHarmony& written : measure.mHarmonies) {
             mBytes += BytesOf(written.mHarmony);
-            if (mBytes > kMaxPlayedBytes) return;
             TMusicXMLHarmony& harmony = mDoc.Harmonies.emplace_back(written.mHarmony);
             harmony.mPosition =
                 QuartersOf(std::max(TTicks{0}, AddTicks(mPosition, written.mOffset)));

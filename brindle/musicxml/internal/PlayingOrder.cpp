@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/musicxml/internal/PlayingOrder.h"
 
-#include "brindle/musicxml/TMusicXMLDoc.h"
+#include "brindle/musicxml/PlayedMeasures.h"
 #include "brindle/musicxml/internal/JumpPlan.h"
 
 #include <algorithm>
@@ -15,6 +15,7 @@ public:
     explicit CPlayer(const TScoreMeasures& measures)
         : mWritten(measures),
           mPlan(MakeJumpPlan(measures)),
+          mMostPlayed(PlayLimitsOf(measures.size(), 0).mMeasures),
           mLastPlayed(measures.size(), kNoMeasure),
           mHasJumped(measures.size(), false) {}
 
@@ -25,7 +26,7 @@ public:
                 ix = other;
                 continue;
             }
-            if (mOrder.mMeasures.size() == kMaxPlayedMeasures) {
+            if (mOrder.mMeasures.size() == mMostPlayed) {
                 mOrder.mWasCut = true;
                 break;
             }
@@ -153,6 +154,7 @@ private:
 
     const TScoreMeasures& mWritten;
     TJumpPlan mPlan;
+    std::size_t mMostPlayed;
     TPlayingOrder mOrder;
     std::vector<std::size_t> mLastPlayed;  // of each measure, an index into the order
     std::vector<bool> mHasJumped;

@@ -20,7 +20,7 @@ struct TJumpBack {
 struct TPlayingOrder {
     std::vector<std::uint32_t> mMeasures;
     std::vector<TJumpBack> mJumpsBack;
-    /// Whether the song was cut at kMaxPlayedMeasures.
+    /// Whether the song was cut, see kMaxTimesPlayed.
     bool mWasCut = false;
 };
 

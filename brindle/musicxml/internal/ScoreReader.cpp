@@ -78,7 +78,7 @@ public:
     }
 
     [[nodiscard]] bool IsScore() const { return mIsScore; }
-    [[nodiscard]] bool WasCut() const { return mAllMeasures > kMaxPlayedMeasures; }
+    [[nodiscard]] bool WasCut() const { return mAllMeasures > kMaxWrittenMeasures; }
 
     [[nodiscard]] TWrittenScore Take() {
         TWrittenScore score;
