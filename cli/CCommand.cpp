@@ -5,6 +5,7 @@
 
 #include <CLI/CLI.hpp>
 #include <optional>
+#include <sstream>
 #include <utility>
 
 namespace brindle::cli {
@@ -42,7 +43,9 @@ std::string SubcommandNames(const CLI::App& program) {
 // CLI11 asks for help and version by exceptions, too; these end well.
 TStatus Report(const CLI::App& program, const CLI::ParseError& error, const char* firstWord) {
     if (error.get_exit_code() == static_cast<int>(CLI::ExitCodes::Success)) {
-        return program.exit(error) == 0 ? TStatus::Success : TStatus::BadInput;
+        std::ostringstream shown;
+        program.exit(error, shown, shown);
+        return Print(shown.str());
     }
     const std::vector<CLI::App*> commands = program.get_subcommands();
     if (!commands.empty()) {
@@ -135,6 +138,8 @@ template COption CCommand::AddOption(const std::string&, const std::string&, dou
                                      const std::string&);
 template COption CCommand::AddOption(const std::string&, const std::string&,
                                      std::optional<std::uint64_t>&, const std::string&);
+template COption CCommand::AddOption(const std::string&, const std::string&,
+                                     std::optional<std::string>&, const std::string&);
 
 COption CCommand::AddChoice(const std::string& name, std::string& value,
                             const std::vector<std::string>& choices, const std::string& purpose) {

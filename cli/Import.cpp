@@ -7,7 +7,10 @@
 
 #include "brindle/musicxml/MusicXmlParser.h"
 #include "brindle/musicxml/MuxmlJsonLines.h"
+#include "brindle/musicxml/MuxmlLimits.h"
+#include "brindle/musicxml/ScoreContainer.h"
 #include "brindle/platform/Alerts.h"
+#include "brindle/platform/AtomicFile.h"
 
 #include <fmt/format.h>
 
@@ -32,7 +35,7 @@ struct TImportOptions {
     std::string mFile;
     std::string mFormat = "text";
     bool mJson = false;
-    std::string mMidiFile;
+    std::optional<std::string> mMidiFile;
 
     [[nodiscard]] bool IsNdjson() const { return mJson || mFormat == "ndjson"; }
 };
@@ -87,15 +90,16 @@ MusicXmlParserDelegate Both(const MusicXmlParserDelegate& lines,
     return both;
 }
 
-// Compressed scores are known by the first bytes of a zip archive where there is no file name.
-bool ImportBytes(MusicXmlParser& parser, const std::string& bytes,
+// In memory: the library would leave a compressed score in a file that all users share. A container
+// without a usable list of its files has a score nevertheless.
+bool ImportBytes(MusicXmlParser& parser, const std::string& bytes, bool isCompressed,
                  const std::shared_ptr<const MusicXmlParserDelegate>& host, Error& error) {
-    if (!bytes.starts_with("PK")) return parser.parseBytes(bytes, host, &error);
-    std::string score;
-    if (const auto failure = MusicXmlParser::unpackCompressedMusicXML(bytes, score)) {
-        return MusicXmlParser::assignLocalError(*failure, &error);
-    }
-    return parser.parseBytes(score, host, &error);
+    if (!isCompressed) return parser.parseBytes(bytes, host, &error);
+    if (const auto score = ScoreInContainer(bytes)) return parser.parseBytes(*score, host, &error);
+    std::string unused;
+    const auto failure = MusicXmlParser::unpackCompressedMusicXML(bytes, unused);
+    return MusicXmlParser::assignLocalError(
+        failure.value_or(Error{"", 0, "no score in the container"}), &error);
 }
 
 // False with an error; nothing when standard input cannot be read.
@@ -105,10 +109,13 @@ std::optional<bool> ImportFrom(const std::string& file,
     MusicXmlParser parser;
     parser.MidiTicksPerQuarter = kImportTicksPerQuarter;
     try {
-        if (file != "-") return parser.parseURL(file, host, &error);
-        const auto bytes = ReadInput(file);
+        const bool isNamedFile = file != "-";
+        const auto bytes = isNamedFile ? ReadWholeFile(file, kMuxmlMaxFileSize) : ReadInput(file);
+        // The library tells why it cannot read a file.
+        if (!bytes && isNamedFile) return parser.parseURL(file, host, &error);
         if (!bytes) return std::nullopt;
-        return ImportBytes(parser, *bytes, host, error);
+        const bool isCompressed = IsScoreContainer(*bytes) || file.ends_with(".mxl");
+        return ImportBytes(parser, *bytes, isCompressed, host, error);
     } catch (const std::domain_error& exception) {
         // Divisions of 0 leave no unit in which places in the bar could be told.
         error = {"", 0, exception.what()};
@@ -127,6 +134,7 @@ std::string ResultLine(bool isOk, const Error& error) {
 }
 
 TStatus Import(const TImportOptions& options) {
+    if (options.mMidiFile == "") return Fail(TStatus::BadUsage, "--midi needs the name of a file");
     const std::string name = options.mFile == "-" ? "standard input" : options.mFile;
     const CAlertsAsErrors alerts(name);
     TImportedScore score;
@@ -135,7 +143,7 @@ TStatus Import(const TImportOptions& options) {
     if (options.IsNdjson()) {
         const auto lines = MuxmlJsonLines(
             TMuxmlEnumForm_Word, [&output](const std::string& line) { output += line + '\n'; });
-        methods = options.mMidiFile.empty() ? lines : Both(lines, methods);
+        methods = options.mMidiFile ? Both(lines, methods) : lines;
     }
     Error error;
     const auto isOk =
@@ -151,13 +159,12 @@ TStatus Import(const TImportOptions& options) {
     } else if (*isOk) {
         output = ImportText(score, CPaint());
     }
-    if (Print(output) != TStatus::Success) return TStatus::BadInput;
-    if (*isOk && !options.mMidiFile.empty() &&
-        !WriteMidiFile(options.mMidiFile, MidiPieceOf(score))) {
+    // The file first: who reads the output may stop before its end.
+    if (*isOk && options.mMidiFile && !WriteMidiFile(*options.mMidiFile, MidiPieceOf(score))) {
         status = Fail(TStatus::BadInput,
-                      fmt::format("{} cannot be written", Printable(options.mMidiFile)));
+                      fmt::format("{} cannot be written", Printable(*options.mMidiFile)));
     }
-    return status;
+    return Print(output) == TStatus::Success ? status : TStatus::BadInput;
 }
 
 }  // namespace

@@ -1,11 +1,10 @@
 // SPDX-License-Identifier: MIT
 #include "cli/CommandLine.h"
 #include "cli/DataFolder.h"
+#include "cli/Guard.h"
 #include "cli/Language.h"
 
 #include "brindle/Version.h"
-
-#include <exception>
 
 using namespace brindle::cli;
 
@@ -29,9 +28,7 @@ constexpr TCommandHelp kHelp{
     "  brindle markov learn -o model.json songs\n",
 };
 
-}  // namespace
-
-int main(int argc, char** argv) {
+TStatus Run(int argc, char** argv) {
     UseLanguageOfUser();
     UseDataOfProgram();
     CCommand program(kHelp, brindle::BrindleVersionString);
@@ -52,11 +49,11 @@ int main(int argc, char** argv) {
     AddGrid(program);
     AddGrids(program);
     AddMarkov(program);
-    auto status = TStatus::Success;
-    try {
-        status = program.Run(argc, argv);
-    } catch (const std::exception& error) {
-        status = Fail(TStatus::BadInput, error.what());
-    }
-    return static_cast<int>(status);
+    return program.Run(argc, argv);
+}
+
+}  // namespace
+
+int main(int argc, char** argv) {
+    return static_cast<int>(Guarded(Run, argc, argv));
 }

@@ -41,7 +41,7 @@ struct TGenerateOptions {
     std::uint64_t mAttempts = 10000;
     std::uint64_t mOthers = 3;
     int mBeatsPerBar = 4;
-    std::string mMidi;
+    std::optional<std::string> mMidi;
     double mTempo = 100.0;
     CFormatOptions mFormat;
 };
@@ -159,6 +159,7 @@ TStatus MarkovGenerate(const TGenerateOptions& options) {
     if (const auto contradiction = Contradiction(options)) {
         return Fail(TStatus::BadUsage, *contradiction);
     }
+    if (options.mMidi == "") return Fail(TStatus::BadUsage, "--midi needs the name of a file");
     auto model = ReadModel(options.mModel);
     if (!model) return TStatus::BadInput;
     SetSeed(*model, options.mSeed);
@@ -172,10 +173,10 @@ TStatus MarkovGenerate(const TGenerateOptions& options) {
             "the model finds no such sequence: each chord, and the end, must have been learned "
             "behind the one before it");
     }
-    if (!options.mMidi.empty() && !WriteMarkovMidi(options.mMidi, generated.mChosen.mSymbols,
-                                                   options.mTempo, options.mBeatsPerBar)) {
+    if (options.mMidi && !WriteMarkovMidi(*options.mMidi, generated.mChosen.mSymbols,
+                                          options.mTempo, options.mBeatsPerBar)) {
         return Fail(TStatus::BadInput,
-                    fmt::format("{} cannot be written", Printable(options.mMidi)));
+                    fmt::format("{} cannot be written", Printable(*options.mMidi)));
     }
     return Print(options.mFormat.Format() == TFormat::Json ? GeneratedJson(generated)
                                                            : GeneratedText(generated, options));

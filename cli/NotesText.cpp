@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "cli/NotesText.h"
 
+#include "cli/Output.h"
+
 #include "brindle/theory/CChordNamePrefs.h"
 
 #include <fmt/format.h>
@@ -46,7 +48,7 @@ public:
         const std::string_view octave = word.substr(static_cast<std::size_t>(consumed));
         if (octave.empty()) return Add(NoteNrFrom(mNext, key.mKeyNr), key.mEnh, word);
         const auto octaveNr = WholeNumber(octave);
-        if (!octaveNr) return fmt::format("behind the key stands its octave, not {}", octave);
+        if (!octaveNr) return fmt::format("behind the key stands its octave, not {}", Printable(octave));
         const int octaveOfMiddleC = 3 + mPrefs.mOctaveNaming;
         return Add((std::int64_t{*octaveNr} - octaveOfMiddleC) * 12 + kMiddleC + key.mKeyNr,
                    key.mEnh, word);
@@ -57,7 +59,7 @@ public:
 private:
     std::string Add(std::int64_t noteNr, TEnh enh, std::string_view word) {
         if (noteNr < 0 || noteNr > kHighestNoteNr) {
-            return fmt::format("{} is outside of the notes 0 to 127", word);
+            return fmt::format("{} is outside of the notes 0 to 127", Printable(word));
         }
         const bool isThere = std::any_of(mNotes.begin(), mNotes.end(),
                                          [&](const CNote& note) { return note.mNoteNr == noteNr; });

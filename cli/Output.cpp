@@ -30,6 +30,18 @@ bool BeginsCharacter(char c) {
     return (static_cast<unsigned char>(c) & 0xC0) != 0x80;
 }
 
+// A message may repeat what was typed, and have several lines.
+std::string PrintableLines(std::string_view message) {
+    std::string printable;
+    while (true) {
+        const std::size_t end = message.find('\n');
+        printable += Printable(message.substr(0, end));
+        if (end == message.npos) return printable;
+        printable += '\n';
+        message.remove_prefix(end + 1);
+    }
+}
+
 bool WantsColor() {
     const char* const noColor = std::getenv("NO_COLOR");
     if (noColor != nullptr && *noColor != '\0') return false;
@@ -41,14 +53,14 @@ bool WantsColor() {
 }  // namespace
 
 TStatus Fail(TStatus status, std::string_view message) {
-    fmt::print(stderr, "brindle: {}\n", message);
+    fmt::print(stderr, "brindle: {}\n", PrintableLines(message));
     return status;
 }
 
 TStatus FailAt(TStatus status, std::string_view message, std::string_view input,
                std::size_t column) {
     const std::string before = Printable(input.substr(0, column));
-    fmt::print(stderr, "brindle: {}\n  {}\n  {}^\n", message, Printable(input),
+    fmt::print(stderr, "brindle: {}\n  {}\n  {}^\n", PrintableLines(message), Printable(input),
                std::string(Width(before), ' '));
     return status;
 }

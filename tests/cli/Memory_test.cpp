@@ -1,0 +1,57 @@
+// SPDX-License-Identifier: MIT
+// The program with a memory that runs short at each of its requests in turn: it tells and ends, or
+// does all that it does with memory.
+
+#include "Transcript.h"
+
+#include <doctest/doctest.h>
+#include <fmt/format.h>
+
+#include <string>
+
+#if defined(BRINDLE_FAILING_MALLOC_LIBRARY)
+
+namespace brindle::test {
+namespace {
+
+// The standard output, status and whether a request failed; standard error only if it is empty.
+TConsoleRun RunShort(const std::string& command, long failing, const char* andAllBehind) {
+    return RunCommand(fmt::format(
+        "export BRINDLE_FAILED_MARK=$PWD/mark; "
+        "LD_PRELOAD='{}' BRINDLE_FAILING_MALLOC={}{} '{}' {} 2>errors; status=$?; "
+        "grep -q '^brindle: ' errors && echo told; test -e mark && echo failed; exit $status",
+        BRINDLE_FAILING_MALLOC_LIBRARY, failing, andAllBehind, BRINDLE_PROGRAM, command));
+}
+
+bool EndsWith(const std::string& text, const std::string& end) {
+    return text.size() >= end.size() &&
+           text.compare(text.size() - end.size(), end.size(), end) == 0;
+}
+
+TEST_CASE("A program whose memory runs short says so and fails, or shows what it should") {
+    for (const char* const command :
+         {"import examples/scores/frere-jacques.musicxml --json", "analyse 'Dm7 G7 C' --json",
+          "grids import here.gchdb <<<'{\"Libraries\":[]}'", "--version"}) {
+        const std::string whole = RunShort(command, 0, "").mShown;
+        int told = 0;
+        for (const char* const andAllBehind : {"", "+"}) {
+            // From small to large steps: there are thousands of requests.
+            for (long failing = 1;; failing += 1 + failing / 20) {
+                const std::string shown = RunShort(command, failing, andAllBehind).mShown;
+                if (shown == whole) break;  // nothing failed
+                CAPTURE(command);
+                CAPTURE(failing);
+                CAPTURE(andAllBehind);
+                const bool isTold = EndsWith(shown, "told\nfailed\n[status 1]\n");
+                if (!isTold) CHECK(shown == whole + "failed\n");
+                told += isTold;
+            }
+        }
+        CHECK(told > 20);
+    }
+}
+
+}  // namespace
+}  // namespace brindle::test
+
+#endif
