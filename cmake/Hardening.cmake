@@ -1,0 +1,47 @@
+# What makes a fault in the program or the shared library harder to use against its user: the stack
+# and calls of the C library are watched, and what the dynamic linker writes is closed after start.
+include(CheckCXXCompilerFlag)
+include(CheckCXXSourceCompiles)
+include(CheckLinkerFlag)
+include(CheckPIESupported)
+
+option(BRINDLE_HARDEN "Harden release builds of the program and the library" ON)
+
+set(brindle_harden_compile_options "")
+set(brindle_harden_link_options "")
+# Sanitizers watch more, and in their own way.
+if(BRINDLE_HARDEN AND NOT BRINDLE_SANITIZE)
+    check_pie_supported(LANGUAGES CXX)
+    check_cxx_compiler_flag(-fstack-protector-strong BRINDLE_HAS_STACK_PROTECTOR)
+    if(BRINDLE_HAS_STACK_PROTECTOR)
+        list(APPEND brindle_harden_compile_options -fstack-protector-strong)
+    endif()
+    check_cxx_compiler_flag(-fstack-clash-protection BRINDLE_HAS_STACK_CLASH_PROTECTION)
+    if(BRINDLE_HAS_STACK_CLASH_PROTECTION)
+        list(APPEND brindle_harden_compile_options -fstack-clash-protection)
+    endif()
+    # A system that does not have level 3 warns of it.
+    set(CMAKE_REQUIRED_FLAGS "-O2 -U_FORTIFY_SOURCE -D_FORTIFY_SOURCE=3 -Werror")
+    check_cxx_source_compiles("#include <cstring>\nint main() { return 0; }" BRINDLE_HAS_FORTIFY_3)
+    unset(CMAKE_REQUIRED_FLAGS)
+    if(BRINDLE_HAS_FORTIFY_3)
+        list(APPEND brindle_harden_compile_options -U_FORTIFY_SOURCE -D_FORTIFY_SOURCE=3)
+    else()
+        list(APPEND brindle_harden_compile_options -U_FORTIFY_SOURCE -D_FORTIFY_SOURCE=2)
+    endif()
+    check_linker_flag(CXX -Wl,-z,relro,-z,now BRINDLE_HAS_FULL_RELRO)
+    if(BRINDLE_HAS_FULL_RELRO)
+        list(APPEND brindle_harden_link_options -Wl,-z,relro,-z,now)
+    endif()
+endif()
+
+# Optimized builds only: without optimization nothing is fortified.
+function(brindle_harden target)
+    if(NOT BRINDLE_HARDEN)
+        return()
+    endif()
+    set(is_release $<CONFIG:Release,RelWithDebInfo,MinSizeRel>)
+    target_compile_options(${target} PRIVATE "$<${is_release}:${brindle_harden_compile_options}>")
+    target_link_options(${target} PRIVATE "$<${is_release}:${brindle_harden_link_options}>")
+    set_target_properties(${target} PROPERTIES POSITION_INDEPENDENT_CODE ON)
+endfunction()
