@@ -1,18 +1,21 @@
 // SPDX-License-Identifier: MIT
-#include "cli/Analysis.h"
 #include "cli/ChordSymbols.h"
 #include "cli/ChordTextOptions.h"
 #include "cli/CommandLine.h"
+#include "cli/GridDatabase.h"
 #include "cli/Input.h"
 #include "cli/KeyText.h"
 #include "cli/LeadSheet.h"
-#include "cli/Names.h"
 #include "cli/SongCopies.h"
 #include "cli/SongKeys.h"
 #include "cli/TypedChords.h"
 
 #include "brindle/analysis/CAnalyseHarmCenterAlternatives.h"
 #include "brindle/analysis/TChordStringParse.h"
+#include "brindle/present/AnalysisJson.h"
+#include "brindle/present/AnalysisSvg.h"
+#include "brindle/present/AnalysisText.h"
+#include "brindle/present/ShownNames.h"
 
 #include <fmt/format.h>
 
@@ -93,7 +96,7 @@ struct TAnalysedSong {
     double mBeatsPerBar = 4.0;
 };
 
-TSong SongOf(const TAnalysedSong& analysed, const TAnalyseOptions& options) {
+CShownSong SongOf(const TAnalysedSong& analysed, const TAnalyseOptions& options) {
     const CHarmAnlsCenters* readings = options.mReadings ? &analysed.mReadings : nullptr;
     if (analysed.mSheet) {
         return MakeSong(analysed.mAnalyse, readings, *analysed.mSymbols, *analysed.mSheet);
@@ -101,14 +104,14 @@ TSong SongOf(const TAnalysedSong& analysed, const TAnalyseOptions& options) {
     return MakeSong(analysed.mAnalyse, readings, *analysed.mSymbols, analysed.mBeatsPerBar);
 }
 
-TSongKeys KeysOf(const TAnalysedSong& analysed) {
+CShownKeys KeysOf(const TAnalysedSong& analysed) {
     const double beatsPerBar =
         analysed.mSheet ? BeatsPerBarOf(*analysed.mSheet) : analysed.mBeatsPerBar;
     return MakeSongKeys(analysed.mAnalyse.mChords, *analysed.mSymbols,
                         {.mBeatsPerBar = beatsPerBar});
 }
 
-std::string Picture(const TSong& song, bool withGrids) {
+std::string Picture(const CShownSong& song, bool withGrids) {
     const auto database = withGrids ? ReadGrids("") : nullptr;
     if (database == nullptr) return AnalysisSvg(song);
     const TChordGrids grids = GridsOfSong(*database, song);
@@ -118,17 +121,19 @@ std::string Picture(const TSong& song, bool withGrids) {
 std::string Present(const TAnalysedSong& analysed, const TAnalyseOptions& options) {
     switch (options.mFormat.Format()) {
         case TFormat::Json:
-            return AnalysisJson(analysed.mAnalyse,
-                                options.mReadings ? &analysed.mReadings : nullptr,
-                                *analysed.mSymbols, KeysOf(analysed),
-                                analysed.mSheet ? &*analysed.mSheet : nullptr);
+            return AnalysisJson(
+                analysed.mAnalyse, options.mReadings ? &analysed.mReadings : nullptr,
+                [&](const CHarmAnlsChordWithPos& chord) -> const std::string& {
+                    return analysed.mSymbols->SymbolOf(chord);
+                },
+                KeysOf(analysed), analysed.mSheet ? &*analysed.mSheet : nullptr);
         case TFormat::Native: {
             std::ostringstream native;
             analysed.mAnalyse.AppendJSONString(native);
             return native.str();
         }
         case TFormat::Svg: {
-            TSong song = SongOf(analysed, options);
+            CShownSong song = SongOf(analysed, options);
             song.mCopies = MakeSongCopies(analysed.mAnalyse, *analysed.mSymbols);
             return Picture(song, options.mGrids);
         }
@@ -136,12 +141,12 @@ std::string Present(const TAnalysedSong& analysed, const TAnalyseOptions& option
         case TFormat::Chords:
             break;
     }
-    return AnalysisText(SongOf(analysed, options), CPaint());
+    return AnalysisText(SongOf(analysed, options), PaintOfOutput());
 }
 
 // The key that a chord text states for itself, if it is one.
 CHarmAnlsSignKeys StatedKey(const std::string& typed) {
-    const TKeyText key = ReadKeyText(FoldAccidentals(typed));
+    const CKeyText key = ReadKeyText(FoldAccidentals(typed));
     if (typed.empty() || !key.mError.empty()) return {};
     CHarmAnlsSignKey stated;
     stated.mPosition = 0.0;

@@ -2,11 +2,11 @@
 #include "cli/CommandLine.h"
 #include "cli/Input.h"
 #include "cli/Json.h"
-#include "cli/Names.h"
-#include "cli/Table.h"
 #include "cli/TypedChords.h"
 
 #include "brindle/chords/CChordLite.h"
+#include "brindle/present/CTable.h"
+#include "brindle/present/ShownNames.h"
 
 #include <fmt/format.h>
 
@@ -84,7 +84,7 @@ TStatus Chord(const TChordOptions& options) {
         chords.push_back({Printable((*symbols)[i]), (*read)[i]});
     }
     return Print(options.mFormat.Format() == TFormat::Json ? ChordsJson(chords)
-                                                           : ChordsText(chords, CPaint()));
+                                                           : ChordsText(chords, PaintOfOutput()));
 }
 
 }  // namespace

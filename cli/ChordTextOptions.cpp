@@ -3,9 +3,9 @@
 
 #include "cli/CCommand.h"
 #include "cli/Input.h"
-#include "cli/Names.h"
 
 #include "brindle/analysis/TChordStringParse.h"
+#include "brindle/present/ShownNames.h"
 
 namespace brindle::cli {
 namespace {

@@ -1,11 +1,12 @@
 // SPDX-License-Identifier: MIT
-#include "cli/Bars.h"
 #include "cli/ChordSymbols.h"
 #include "cli/ChordTextOptions.h"
 #include "cli/CommandLine.h"
 #include "cli/Json.h"
 #include "cli/SongCopies.h"
-#include "cli/Table.h"
+
+#include "brindle/present/CBars.h"
+#include "brindle/present/CTable.h"
 
 #include <memory>
 
@@ -28,13 +29,13 @@ struct TCopiesOptions {
     CFormatOptions mFormat;
 };
 
-Json RangeToJson(const TRange& range) {
+Json RangeToJson(const CTimeRange& range) {
     return {{"Position", NumberToJson(range.mBegin)}, {"End", NumberToJson(range.mEnd)}};
 }
 
-std::string CopiesJson(const std::vector<TShownCopy>& copies) {
+std::string CopiesJson(const std::vector<CShownCopy>& copies) {
     Json list = Json::array();
-    for (const TShownCopy& shown : copies) {
+    for (const CShownCopy& shown : copies) {
         list.push_back({{"TargetPos", NumberToJson(shown.mCopy.mTargetPos)},
                         {"SourceOffsetBars", shown.mCopy.mSourceOffsetBars},
                         {"LengthBars", shown.mCopy.mLengthBars},
@@ -49,12 +50,12 @@ std::string LengthText(double bars) {
     return ShortNumber(bars) + (bars == 1.0 ? " bar" : " bars");
 }
 
-std::string CopiesText(const std::vector<TShownCopy>& copies, double beatsPerBar,
+std::string CopiesText(const std::vector<CShownCopy>& copies, double beatsPerBar,
                        const CPaint& paint) {
     if (copies.empty()) return "no passage is repeated\n";
     const CBars bars(beatsPerBar);
     CTable table({"source", "target", "length", "chords"});
-    for (const TShownCopy& shown : copies) {
+    for (const CShownCopy& shown : copies) {
         table.AddRow({BarsOf(shown.mSource, bars), BarsOf(shown.mTarget, bars),
                       LengthText((shown.mTarget.mEnd - shown.mTarget.mBegin) / beatsPerBar),
                       FirstAndLast(shown.mSymbols)});
@@ -70,10 +71,10 @@ TStatus Copies(const TCopiesOptions& options) {
     if (!song) return TStatus::BadInput;
     CHarmonicAnalyse chordsOnly;
     chordsOnly.mChords = std::move(song->mChords);
-    const std::vector<TShownCopy> copies = MakeSongCopies(chordsOnly, song->mSymbols);
+    const std::vector<CShownCopy> copies = MakeSongCopies(chordsOnly, song->mSymbols);
     return Print(options.mFormat.Format() == TFormat::Json
                      ? CopiesJson(copies)
-                     : CopiesText(copies, song->mBeatsPerBar, CPaint()));
+                     : CopiesText(copies, song->mBeatsPerBar, PaintOfOutput()));
 }
 
 }  // namespace

@@ -3,13 +3,13 @@
 #include "cli/Input.h"
 #include "cli/Json.h"
 #include "cli/KeyText.h"
-#include "cli/Names.h"
-#include "cli/Table.h"
 #include "cli/TypedChords.h"
 
 #include "brindle/chords/CChordHeavy.h"
 #include "brindle/chords/CChordLite.h"
 #include "brindle/chords/HarmFuncNames.h"
+#include "brindle/present/CTable.h"
+#include "brindle/present/ShownNames.h"
 #include "brindle/theory/CSignKeyHeavy.h"
 
 #include <fmt/format.h>
@@ -111,8 +111,9 @@ TStatus Function(const TFunctionOptions& options) {
     for (std::size_t i = 0; i < symbols->size(); ++i) {
         functions.push_back(FunctionOf((*symbols)[i], (*chords)[i], signKey));
     }
-    return Print(options.mFormat.Format() == TFormat::Json ? FunctionsJson(*key, functions)
-                                                           : FunctionsText(functions, CPaint()));
+    return Print(options.mFormat.Format() == TFormat::Json
+                     ? FunctionsJson(*key, functions)
+                     : FunctionsText(functions, PaintOfOutput()));
 }
 
 }  // namespace

@@ -1,10 +1,13 @@
 // SPDX-License-Identifier: MIT
 #include "cli/CommandLine.h"
 #include "cli/GridDatabase.h"
-#include "cli/Grids.h"
 #include "cli/Input.h"
-#include "cli/Names.h"
 #include "cli/TypedChords.h"
+
+#include "brindle/present/GridsJson.h"
+#include "brindle/present/GridsSvg.h"
+#include "brindle/present/GridsText.h"
+#include "brindle/present/ShownNames.h"
 
 #include <fmt/format.h>
 
@@ -38,7 +41,7 @@ struct TGridOptions {
 };
 
 /// The grids of one word, or the status of an error that has been printed.
-using TGrids = std::variant<TStatus, std::vector<TGrid>>;
+using TGrids = std::variant<TStatus, std::vector<CChordGrid>>;
 
 TGrids GridsOfFrets(const std::string& word, const std::vector<int>& frets,
                     const GChShortTuning& tuning, int capo) {
@@ -81,9 +84,9 @@ private:
     std::unique_ptr<GChDatabase> mDatabase;
 };
 
-TStatus Present(const std::vector<TGrid>& grids, const TGridOptions& options) {
+TStatus Present(const std::vector<CChordGrid>& grids, const TGridOptions& options) {
     if (options.mFormat.Format() == TFormat::Json) return Print(GridsJson(grids));
-    if (options.mFormat.Format() == TFormat::Text) return Print(GridsText(grids, CPaint()));
+    if (options.mFormat.Format() == TFormat::Text) return Print(GridsText(grids, PaintOfOutput()));
     return Print(GridsSvg(grids, Printable(fmt::format("{}", fmt::join(options.mWords, " ")))));
 }
 
@@ -101,13 +104,13 @@ TStatus Grid(const TGridOptions& options) {
         words = WordsOf(*text);
     }
     CLookUp lookUp(options, *tuning);
-    std::vector<TGrid> grids;
+    std::vector<CChordGrid> grids;
     for (const std::string& word : words) {
         const auto frets = ReadFrets(word);
         TGrids found =
             frets ? GridsOfFrets(word, *frets, *tuning, options.mCapo) : lookUp.GridsOf(word);
         if (found.index() == 0) return std::get<0>(found);
-        for (TGrid& grid : std::get<1>(found)) grids.push_back(std::move(grid));
+        for (CChordGrid& grid : std::get<1>(found)) grids.push_back(std::move(grid));
     }
     return Present(grids, options);
 }

@@ -2,12 +2,12 @@
 #include "cli/GridDatabase.h"
 
 #include "cli/Input.h"
-#include "cli/Names.h"
 
 #include "brindle/guitarchords/GChChordTypes.h"
 #include "brindle/guitarchords/GChFilterParameter.h"
 #include "brindle/platform/FileTree.h"
 #include "brindle/platform/Resources.h"
+#include "brindle/present/ShownNames.h"
 #include "brindle/theory/KeyIntervals.h"
 
 #include <fmt/format.h>
@@ -28,8 +28,8 @@ std::unique_ptr<GChDatabase> ReadGrids(const std::string& packagePath) {
     return database;
 }
 
-std::vector<TGrid> FindGrids(const GChDatabase& database, std::string_view symbol,
-                             const CChordLite& chord, const GChShortTuning& tuning, int capo) {
+std::vector<CChordGrid> FindGrids(const GChDatabase& database, std::string_view symbol,
+                                  const CChordLite& chord, const GChShortTuning& tuning, int capo) {
     const CChordTypeId type = GChChordTypeIdForSemitones(chord.mSemitones);
     if (chord.IsUndef() || type == 0) return {};
     GChFilterParameter filter;
@@ -38,7 +38,7 @@ std::vector<TGrid> FindGrids(const GChDatabase& database, std::string_view symbo
     if (chord.HasBassNote()) {
         filter.setBassNoteToFilter(FoldIntoOctave(chord.mBassKeyEnh.mKeyNr - capo), 0);
     }
-    std::vector<TGrid> grids;
+    std::vector<CChordGrid> grids;
     for (const auto& library : database.allLibrariesForAnyTuning()) {
         if (!GChIsEqualShortTuning(library->gchTuning()->shortTuning(), tuning)) continue;
         for (const auto& basicChord : library->basicChords()) {
@@ -49,18 +49,19 @@ std::vector<TGrid> FindGrids(const GChDatabase& database, std::string_view symbo
     return grids;
 }
 
-TChordGrids GridsOfSong(const GChDatabase& database, const TSong& song) {
-    const auto highestFret = [](const TGrid& grid) {
+TChordGrids GridsOfSong(const GChDatabase& database, const CShownSong& song) {
+    const auto highestFret = [](const CChordGrid& grid) {
         return *std::max_element(grid.mFrets.begin(), grid.mFrets.end());
     };
     TChordGrids gridOfSymbol;
-    ForEachChord(song, [&](const TShownChord& shown) {
+    ForEachChord(song, [&](const CShownChord& shown) {
         if (gridOfSymbol.count(shown.mSymbol) > 0) return;
         const CChordLite chord(FoldAccidentals(shown.mSymbol), NamePrefs());
         auto grids = FindGrids(database, shown.mSymbol, chord, kGChStandardGuitar, 0);
-        const auto lowest = std::min_element(
-            grids.begin(), grids.end(),
-            [&](const TGrid& a, const TGrid& b) { return highestFret(a) < highestFret(b); });
+        const auto lowest = std::min_element(grids.begin(), grids.end(),
+                                             [&](const CChordGrid& a, const CChordGrid& b) {
+                                                 return highestFret(a) < highestFret(b);
+                                             });
         if (lowest != grids.end()) gridOfSymbol.emplace(shown.mSymbol, std::move(*lowest));
     });
     return gridOfSymbol;

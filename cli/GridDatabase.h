@@ -1,11 +1,11 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "cli/Grids.h"
 #include "cli/Song.h"
 
 #include "brindle/chords/CChordLite.h"
 #include "brindle/guitarchords/GChDatabase.h"
+#include "brindle/present/ChordGrid.h"
 
 #include <functional>
 #include <map>
@@ -22,14 +22,12 @@ namespace brindle::cli {
 
 /// The fingerings that sound a chord under a capodaster, in the order of the database. A bass
 /// behind a slash is only found where a library tells it.
-[[nodiscard]] std::vector<TGrid> FindGrids(const GChDatabase& database, std::string_view symbol,
-                                           const CChordLite& chord, const GChShortTuning& tuning,
-                                           int capo);
+[[nodiscard]] std::vector<CChordGrid> FindGrids(const GChDatabase& database,
+                                                std::string_view symbol, const CChordLite& chord,
+                                                const GChShortTuning& tuning, int capo);
 
 /// The fingering of each chord symbol of a song that lies lowest on the neck of a standard guitar;
 /// chords that have none are left out.
-using TChordGrids = std::map<std::string, TGrid, std::less<>>;
-
-[[nodiscard]] TChordGrids GridsOfSong(const GChDatabase& database, const TSong& song);
+[[nodiscard]] TChordGrids GridsOfSong(const GChDatabase& database, const CShownSong& song);
 
 }  // namespace brindle::cli

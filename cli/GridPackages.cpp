@@ -1,13 +1,15 @@
 // SPDX-License-Identifier: MIT
 #include "cli/CommandLine.h"
 #include "cli/GridDatabase.h"
-#include "cli/GridJson.h"
-#include "cli/Grids.h"
 #include "cli/Input.h"
 #include "cli/Json.h"
-#include "cli/Table.h"
 
 #include "brindle/platform/FileNode.h"
+#include "brindle/present/CTable.h"
+#include "brindle/present/GridPackageJson.h"
+#include "brindle/present/GridsJson.h"
+#include "brindle/present/GridsSvg.h"
+#include "brindle/present/GridsText.h"
 
 #include <fmt/format.h>
 
@@ -51,7 +53,7 @@ std::string LibrariesText(const GChDatabase& database) {
                       tuning->tuningPitchesString(), fmt::format("{}", library->numberOfChords()),
                       library->isReadOnlyLibrary() ? "yes" : "no"});
     }
-    std::string text = CPaint().Faint(table.Head()) + '\n';
+    std::string text = PaintOfOutput().Faint(table.Head()) + '\n';
     for (std::size_t row = 0; row < table.RowCount(); ++row) text += table.Row(row) + '\n';
     return text;
 }
@@ -70,7 +72,7 @@ TStatus List(const TPackageOptions& options) {
 TStatus Show(const TPackageOptions& options) {
     const auto database = ReadGrids(options.mPath);
     if (database == nullptr) return TStatus::BadInput;
-    std::vector<TGrid> grids;
+    std::vector<CChordGrid> grids;
     for (const auto& library : database->allLibrariesForAnyTuning()) {
         for (const auto& chord : library->basicChords()) {
             grids.push_back(GridOfChord("", *GChChord::make(chord, 0), 0));
@@ -79,7 +81,7 @@ TStatus Show(const TPackageOptions& options) {
     }
     if (options.mFormat.Format() == TFormat::Json) return Print(GridsJson(grids));
     if (options.mFormat.Format() == TFormat::Svg) return Print(GridsSvg(grids, "Chord grids"));
-    return Print(GridsText(grids, CPaint()));
+    return Print(GridsText(grids, PaintOfOutput()));
 }
 
 TStatus Export(const TPackageOptions& options) {

@@ -1,11 +1,12 @@
 // SPDX-License-Identifier: MIT
-#include "cli/Bars.h"
 #include "cli/CommandLine.h"
 #include "cli/Json.h"
 #include "cli/LeadSheet.h"
-#include "cli/Names.h"
 #include "cli/SheetChordText.h"
-#include "cli/Table.h"
+
+#include "brindle/present/CBars.h"
+#include "brindle/present/CTable.h"
+#include "brindle/present/ShownNames.h"
 
 #include <fmt/format.h>
 
@@ -71,7 +72,7 @@ std::string HarmoniesText(const TMusicXMLDoc& sheet) {
                       Printable(harmony.mKind), DegreesText(harmony)});
         table.AddRow(std::move(cells));
     }
-    const CPaint paint;
+    const CPaint paint = PaintOfOutput();
     std::string text;
     if (!sheet.Title.empty()) text = paint.Strong(Printable(sheet.Title)) + "\n\n";
     return text + table.Text(paint);

@@ -1,9 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "cli/CommandLine.h"
-#include "cli/ImportedScore.h"
 #include "cli/Input.h"
 #include "cli/Json.h"
-#include "cli/MidiFile.h"
 
 #include "brindle/musicxml/MusicXmlParser.h"
 #include "brindle/musicxml/MuxmlJsonLines.h"
@@ -11,6 +9,8 @@
 #include "brindle/musicxml/ScoreContainer.h"
 #include "brindle/platform/Alerts.h"
 #include "brindle/platform/AtomicFile.h"
+#include "brindle/present/ImportMidi.h"
+#include "brindle/present/ImportText.h"
 
 #include <fmt/format.h>
 
@@ -137,7 +137,7 @@ TStatus Import(const TImportOptions& options) {
     if (options.mMidiFile == "") return Fail(TStatus::BadUsage, "--midi needs the name of a file");
     const std::string name = options.mFile == "-" ? "standard input" : options.mFile;
     const CAlertsAsErrors alerts(name);
-    TImportedScore score;
+    CImportedScore score;
     std::string output;
     MusicXmlParserDelegate methods = HostFor(score);
     if (options.IsNdjson()) {
@@ -157,10 +157,11 @@ TStatus Import(const TImportOptions& options) {
     if (options.IsNdjson()) {
         output += ResultLine(*isOk, error);
     } else if (*isOk) {
-        output = ImportText(score, CPaint());
+        output = ImportText(score, PaintOfOutput());
     }
     // The file first: who reads the output may stop before its end.
-    if (*isOk && options.mMidiFile && !WriteMidiFile(*options.mMidiFile, MidiPieceOf(score))) {
+    if (*isOk && options.mMidiFile &&
+        !WriteFileAtomically(*options.mMidiFile, MidiFileBytes(MidiPieceOf(score)))) {
         status = Fail(TStatus::BadInput,
                       fmt::format("{} cannot be written", Printable(*options.mMidiFile)));
     }

@@ -2,8 +2,8 @@
 #include "cli/CommandLine.h"
 #include "cli/KeyText.h"
 #include "cli/LineByLine.h"
-#include "cli/Names.h"
 
+#include "brindle/present/ShownNames.h"
 #include "brindle/theory/CSignKeyHeavy.h"
 #include "brindle/theory/SignKeyCode.h"
 
@@ -61,8 +61,8 @@ std::string KeyText(const CSignKeyLite& key, const CPaint& paint) {
 
 TStatus Key(const TLineOptions& options) {
     return PrintLineByLine(
-        options, "Keys", ReadKeyText, [](const TKeyText& read) { return KeyToJson(read.mSignKey); },
-        [](const TKeyText& read) { return KeyText(read.mSignKey, CPaint()); });
+        options, "Keys", ReadKeyText, [](const CKeyText& read) { return KeyToJson(read.mSignKey); },
+        [](const CKeyText& read) { return KeyText(read.mSignKey, PaintOfOutput()); });
 }
 
 }  // namespace

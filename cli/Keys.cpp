@@ -3,15 +3,16 @@
 #include "cli/ChordTextOptions.h"
 #include "cli/CommandLine.h"
 #include "cli/Input.h"
-#include "cli/KeysJson.h"
-#include "cli/KeysView.h"
 #include "cli/LeadSheet.h"
-#include "cli/Names.h"
 #include "cli/SongKeys.h"
 #include "cli/TypedChords.h"
 
 #include "brindle/analysis/CHarmonicAnalyse.h"
 #include "brindle/analysis/TChordStringParse.h"
+#include "brindle/present/KeysJson.h"
+#include "brindle/present/KeysSvg.h"
+#include "brindle/present/KeysText.h"
+#include "brindle/present/ShownNames.h"
 
 #include <memory>
 #include <optional>
@@ -66,17 +67,14 @@ std::optional<std::string> Contradiction(const TKeysOptions& options) {
     return std::nullopt;
 }
 
-std::string Present(const TSong& song, TFormat format) {
+std::string Present(const CShownSong& song, TFormat format) {
     if (format == TFormat::Svg) return KeysSvg(song);
-    if (format != TFormat::Json) return KeysText(song, CPaint());
-    Json json;
-    AppendKeysJson(json, song.mKeys);
-    json["KeyOfSong"]["Scores"] = KeyScoresJson(song.mKeys);
-    return JsonText(json);
+    if (format != TFormat::Json) return KeysText(song, PaintOfOutput());
+    return KeysJson(song.mKeys);
 }
 
 // Nothing when the text is not understood; then the error has been printed.
-std::optional<TSong> SongOfText(const TTypedSong& typed, const TKeysOptions& options) {
+std::optional<CShownSong> SongOfText(const TTypedSong& typed, const TKeysOptions& options) {
     TChordStringParse parse;
     parse.mBeatsPerBar = options.mKeys.mBeatsPerBar;
     parse.mBeatsPerChord = options.mBeatsPerChord;
@@ -85,19 +83,19 @@ std::optional<TSong> SongOfText(const TTypedSong& typed, const TKeysOptions& opt
     if (!read) return std::nullopt;
     CHarmonicAnalyse chordsOnly;
     chordsOnly.mChords = std::move(read->mChords);
-    TSong song = MakeSong(chordsOnly, nullptr, read->mSymbols, read->mBeatsPerBar);
+    CShownSong song = MakeSong(chordsOnly, nullptr, read->mSymbols, read->mBeatsPerBar);
     CKeyOptions keyOptions = options.mKeys;
     keyOptions.mBeatsPerBar = read->mBeatsPerBar;
     song.mKeys = MakeSongKeys(chordsOnly.mChords, read->mSymbols, keyOptions, options.mNumerals);
     return song;
 }
 
-TSong SongOfScore(TMusicXMLDoc& sheet, const TKeysOptions& options) {
+CShownSong SongOfScore(TMusicXMLDoc& sheet, const TKeysOptions& options) {
     CHarmonicAnalyse chordsOnly;
     chordsOnly.AnalyseFromMusicXMLDoc(sheet, TAnalyse_None);
     chordsOnly.mChords = WithRests(chordsOnly.mChords, sheet);
     const CChordSymbols symbols(sheet, chordsOnly.mChords);
-    TSong song = MakeSong(chordsOnly, nullptr, symbols, sheet);
+    CShownSong song = MakeSong(chordsOnly, nullptr, symbols, sheet);
     CKeyOptions keyOptions = options.mKeys;
     keyOptions.mBeatsPerBar = BeatsPerBarOf(sheet);
     song.mKeys = MakeSongKeys(chordsOnly.mChords, symbols, keyOptions, options.mNumerals);

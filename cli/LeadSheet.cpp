@@ -2,7 +2,6 @@
 #include "cli/LeadSheet.h"
 
 #include "cli/Input.h"
-#include "cli/Names.h"
 #include "cli/Output.h"
 
 #include "brindle/chords/CChordHeavy.h"
@@ -10,6 +9,7 @@
 #include "brindle/musicxml/CChordSetFromMusicXml.h"
 #include "brindle/musicxml/ScoreContainer.h"
 #include "brindle/platform/Error.h"
+#include "brindle/present/ShownNames.h"
 #include "brindle/theory/CChordNamePrefs.h"
 
 #include <fmt/format.h>

@@ -2,11 +2,11 @@
 #include "cli/Markov.h"
 
 #include "cli/Input.h"
-#include "cli/Names.h"
 
 #include "brindle/chords/CChordHeavy.h"
 #include "brindle/markov/MarkovChords.h"
 #include "brindle/platform/SeededRandom.h"
+#include "brindle/present/ShownNames.h"
 
 #include <fmt/format.h>
 

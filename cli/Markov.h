@@ -46,8 +46,4 @@ void AddMarkovGenerate(CCommand& markov);
 void AddMarkovFill(CCommand& markov);
 void AddMarkovShow(CCommand& markov);
 
-/// The sequence as a piece for two tracks, chords and bass. False when it cannot be written.
-[[nodiscard]] bool WriteMarkovMidi(const std::string& path, MarkovSequenceView sequence,
-                                   double tempo, int beatsPerBar);
-
 }  // namespace brindle::cli

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: MIT
 #include "cli/Markov.h"
 
+#include "brindle/platform/AtomicFile.h"
+#include "brindle/present/MarkovMidi.h"
+
 #include <fmt/format.h>
 
 #include <algorithm>
@@ -150,7 +153,7 @@ std::string OthersText(const TGenerated& generated, const TGenerateOptions& opti
 }
 
 std::string GeneratedText(const TGenerated& generated, const TGenerateOptions& options) {
-    const CPaint paint;
+    const CPaint paint = PaintOfOutput();
     return BarsText(generated.mChosen.mSymbols, options.mBeatsPerBar, 4) + '\n' +
            OthersText(generated, options, paint);
 }
@@ -173,8 +176,10 @@ TStatus MarkovGenerate(const TGenerateOptions& options) {
             "the model finds no such sequence: each chord, and the end, must have been learned "
             "behind the one before it");
     }
-    if (options.mMidi && !WriteMarkovMidi(*options.mMidi, generated.mChosen.mSymbols,
-                                          options.mTempo, options.mBeatsPerBar)) {
+    if (options.mMidi &&
+        !WriteFileAtomically(*options.mMidi,
+                             MidiFileBytes(MidiPieceOf(generated.mChosen.mSymbols, options.mTempo,
+                                                       options.mBeatsPerBar)))) {
         return Fail(TStatus::BadInput,
                     fmt::format("{} cannot be written", Printable(*options.mMidi)));
     }

@@ -1,8 +1,9 @@
 // SPDX-License-Identifier: MIT
 #include "cli/ChordSources.h"
 #include "cli/Markov.h"
-#include "cli/Names.h"
 #include "cli/Progress.h"
+
+#include "brindle/present/ShownNames.h"
 
 #include <fmt/format.h>
 

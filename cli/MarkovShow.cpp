@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "cli/Markov.h"
-#include "cli/Table.h"
+
+#include "brindle/present/CTable.h"
 
 #include <fmt/format.h>
 
@@ -157,7 +158,7 @@ TStatus MarkovShow(const TShowOptions& options) {
     }
     return Print(options.mFormat.Format() == TFormat::Json
                      ? ShownJson(*model, history, continuations)
-                     : ShownText(*model, history, continuations, CPaint()));
+                     : ShownText(*model, history, continuations, PaintOfOutput()));
 }
 
 }  // namespace

@@ -2,12 +2,12 @@
 #include "cli/CommandLine.h"
 #include "cli/KeyText.h"
 #include "cli/LineByLine.h"
-#include "cli/Names.h"
 #include "cli/NamingOptions.h"
 #include "cli/NotesText.h"
-#include "cli/Table.h"
 
 #include "brindle/chords/CChordHeavy.h"
+#include "brindle/present/CTable.h"
+#include "brindle/present/ShownNames.h"
 #include "brindle/theory/KeyIntervals.h"
 #include "brindle/theory/KeyNames.h"
 
@@ -205,8 +205,9 @@ TStatus Name(const TNameOptions& options) {
     for (const TNotesText& line : std::get<1>(lines)) {
         chords.push_back(NamesOf(line.mNotes, root, options));
     }
-    return Print(options.mFormat.Format() == TFormat::Json ? NamesJson(chords, options)
-                                                           : NamesText(chords, options, CPaint()));
+    return Print(options.mFormat.Format() == TFormat::Json
+                     ? NamesJson(chords, options)
+                     : NamesText(chords, options, PaintOfOutput()));
 }
 
 }  // namespace

@@ -3,13 +3,13 @@
 #include "cli/Input.h"
 #include "cli/Json.h"
 #include "cli/KeyText.h"
-#include "cli/Names.h"
 
 #include "brindle/analysis/CHarmAnlsChords.h"
 #include "brindle/analysis/CKeyOfSong.h"
 #include "brindle/analysis/RomanNumeral.h"
 #include "brindle/chords/CChordHeavy.h"
 #include "brindle/chords/ReadChordText.h"
+#include "brindle/present/ShownNames.h"
 
 #include <fmt/format.h>
 

@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "brindle/present/CPaint.h"
+#include "brindle/present/ShownText.h"
+
 #include <string>
 #include <string_view>
 
@@ -31,38 +34,7 @@ TStatus FailAtCharacter(TStatus status, std::string_view message, std::string_vi
 /// Writes a whole result to standard output; a full disk is an error.
 TStatus Print(std::string_view text);
 
-/// The text without what would disturb a terminal or an XML file: control characters and bytes that
-/// are no UTF-8 become U+FFFD.
-[[nodiscard]] std::string Printable(std::string_view text);
-
-/// The number of characters of UTF-8 text.
-[[nodiscard]] std::size_t Width(std::string_view text);
-
-/// The first `count` characters of UTF-8 text.
-[[nodiscard]] std::string FirstCharacters(std::string_view text, std::size_t count);
-
-/// The text, filled with blanks on the right (left) side to so many characters.
-[[nodiscard]] std::string PadRight(std::string_view text, std::size_t width);
-[[nodiscard]] std::string PadLeft(std::string_view text, std::size_t width);
-
-/// A number with at most three digits after the point and no zeros at the end: "1", "2.5".
-[[nodiscard]] std::string ShortNumber(double number);
-
-/// How text for people is emphasised: colours on a terminal, nothing elsewhere or with NO_COLOR.
-class CPaint {
-public:
-    /// For standard output.
-    CPaint();
-    explicit CPaint(bool colored) : mColored(colored) {}
-
-    [[nodiscard]] std::string Strong(std::string_view text) const;
-    [[nodiscard]] std::string Accent(std::string_view text) const;
-    [[nodiscard]] std::string Faint(std::string_view text) const;
-
-private:
-    [[nodiscard]] std::string Wrapped(std::string_view code, std::string_view text) const;
-
-    bool mColored = false;
-};
+/// Colours if standard output is a terminal, nothing elsewhere or with NO_COLOR.
+[[nodiscard]] CPaint PaintOfOutput();
 
 }  // namespace brindle::cli

@@ -2,8 +2,8 @@
 #include "cli/CommandLine.h"
 #include "cli/KeyText.h"
 #include "cli/LineByLine.h"
-#include "cli/Names.h"
 
+#include "brindle/present/ShownNames.h"
 #include "brindle/theory/CScaleLite.h"
 
 #include <fmt/format.h>
@@ -70,8 +70,8 @@ std::string ScaleText(const CScaleHeavy& scale, const CPaint& paint) {
 TStatus Scale(const TLineOptions& options) {
     return PrintLineByLine(
         options, "Scales", ReadScaleText,
-        [](const TScaleText& read) { return ScaleToJson(read.mScale); },
-        [](const TScaleText& read) { return ScaleText(read.mScale, CPaint()); });
+        [](const CScaleText& read) { return ScaleToJson(read.mScale); },
+        [](const CScaleText& read) { return ScaleText(read.mScale, PaintOfOutput()); });
 }
 
 }  // namespace

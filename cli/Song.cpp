@@ -3,9 +3,10 @@
 
 #include "cli/ChordSymbols.h"
 #include "cli/LeadSheet.h"
-#include "cli/Names.h"
 #include "cli/Output.h"
 #include "cli/SongKeys.h"
+
+#include "brindle/present/ShownNames.h"
 
 #include <fmt/format.h>
 
@@ -25,15 +26,15 @@ public:
 
     [[nodiscard]] double End() const { return mChords.empty() ? 0.0 : mChords.back().mPosition; }
 
-    [[nodiscard]] TShownCenter Show(const CHarmAnlsCenter& center) const {
-        TShownCenter shown;
+    [[nodiscard]] CShownCenter Show(const CHarmAnlsCenter& center) const {
+        CShownCenter shown;
         shown.mHarmCenter = center.mHarmCenter;
         shown.mName = center.IsUndef() ? "unknown" : center.mHarmCenter.NameLong(NamePrefs());
         shown.mProbability = center.mProbability;
         for (const CHarmAnlsChordWithPos& chord : center.mChords) {
             // A center that was put together from several readings holds a chord once for each.
             if (chord.mPosition >= End()) continue;
-            TShownChord next = Show(chord);
+            CShownChord next = Show(chord);
             const bool isRepeated = !shown.mChords.empty() &&
                                     shown.mChords.back().mRange.mBegin == next.mRange.mBegin &&
                                     shown.mChords.back().mSymbol == next.mSymbol;
@@ -50,8 +51,8 @@ public:
         return shown;
     }
 
-    [[nodiscard]] TShownSignKey Show(const CHarmAnlsSignKey& signKey) const {
-        TShownSignKey shown;
+    [[nodiscard]] CShownSignKey Show(const CHarmAnlsSignKey& signKey) const {
+        CShownSignKey shown;
         shown.mSignKey = signKey.mSignKey;
         shown.mName = signKey.IsUndef() ? "unknown" : signKey.mSignKey.NameLong(NamePrefs());
         shown.mBegin = std::max(0.0, signKey.mPosition);
@@ -63,15 +64,15 @@ public:
 
     /// The chords of the text that no center of the song holds; a sign that no chord sounds is
     /// none.
-    [[nodiscard]] std::vector<TShownChord> LooseChords(const TSong& song) const {
+    [[nodiscard]] std::vector<CShownChord> LooseChords(const CShownSong& song) const {
         std::vector<double> held;
-        ForEachChord(song, [&](const TShownChord& chord) { held.push_back(chord.mRange.mBegin); });
+        ForEachChord(song, [&](const CShownChord& chord) { held.push_back(chord.mRange.mBegin); });
         std::sort(held.begin(), held.end());
-        std::vector<TShownChord> loose;
+        std::vector<CShownChord> loose;
         for (const CHarmAnlsChordWithPos& chord : mChords) {
             if (chord.mPosition >= End()) break;
             if (std::binary_search(held.begin(), held.end(), chord.mPosition)) continue;
-            TShownChord shown = Show(chord);
+            CShownChord shown = Show(chord);
             if (shown.mSymbol != kNoChordSymbol) loose.push_back(std::move(shown));
         }
         return loose;
@@ -79,7 +80,7 @@ public:
 
 private:
     // Of several chords at one place the last one sounds.
-    [[nodiscard]] TShownChord Show(const CHarmAnlsChordWithPos& chord) const {
+    [[nodiscard]] CShownChord Show(const CHarmAnlsChordWithPos& chord) const {
         const auto next = std::upper_bound(
             mChords.begin(), mChords.end(), chord.mPosition,
             [](double position, const auto& other) { return position < other.mPosition; });
@@ -103,8 +104,8 @@ std::string TimeName(const TMusicXMLTimeSignature& time) {
     return fmt::format("{}/{}", time.mNumerator, time.mDenominator);
 }
 
-TShownScore ScoreOf(const TMusicXMLDoc& sheet) {
-    TShownScore score;
+CShownScore ScoreOf(const TMusicXMLDoc& sheet) {
+    CShownScore score;
     score.mTitle = Printable(sheet.Title);
     for (const auto& time : sheet.TimeSignatures) {
         score.mTimes.push_back({time.mPosition, TimeName(time)});
@@ -151,9 +152,9 @@ double BeatsPerBarOf(const TMusicXMLDoc& sheet) {
     return length >= 1.0 / 64 && length <= 1024.0 ? length : kUsualBeatsPerBar;
 }
 
-TSong MakeSong(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings,
-               const CChordSymbols& symbols, const TMusicXMLDoc& sheet) {
-    TSong song = MakeSong(analyse, readings, symbols, BeatsPerBarOf(sheet));
+CShownSong MakeSong(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings,
+                    const CChordSymbols& symbols, const TMusicXMLDoc& sheet) {
+    CShownSong song = MakeSong(analyse, readings, symbols, BeatsPerBarOf(sheet));
     song.mScore = ScoreOf(sheet);
     for (const CHarmBarline& barline : sheet.HarmBarlines) {
         song.mBarStarts.push_back(barline.mPosition);
@@ -161,10 +162,10 @@ TSong MakeSong(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings
     return song;
 }
 
-TSong MakeSong(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings,
-               const CChordSymbols& symbols, double beatsPerBar) {
+CShownSong MakeSong(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings,
+                    const CChordSymbols& symbols, double beatsPerBar) {
     const CSongMaker maker(analyse.mChords, symbols);
-    TSong song;
+    CShownSong song;
     song.mBeatsPerBar = beatsPerBar;
     song.mEnd = maker.End();
     for (const CHarmAnlsSignKey& signKey : analyse.mSignKeys) {
@@ -179,7 +180,7 @@ TSong MakeSong(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings
         }
         // From left to right, the longest of those that begin together first.
         std::stable_sort(song.mReadings.begin(), song.mReadings.end(),
-                         [](const TShownCenter& a, const TShownCenter& b) {
+                         [](const CShownCenter& a, const CShownCenter& b) {
                              if (a.mRange.mBegin != b.mRange.mBegin) {
                                  return a.mRange.mBegin < b.mRange.mBegin;
                              }

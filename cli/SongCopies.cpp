@@ -11,19 +11,19 @@ namespace brindle::cli {
 namespace {
 
 // `count` chords from number `first` on; the last chord of the list ends where it begins.
-TRange RangeOf(const CHarmAnlsChords& chords, std::uint64_t first, std::uint64_t count) {
+CTimeRange RangeOf(const CHarmAnlsChords& chords, std::uint64_t first, std::uint64_t count) {
     const std::uint64_t end = std::min<std::uint64_t>(first + count, chords.size() - 1);
     return {chords[first].mPosition, chords[end].mPosition};
 }
 
 }  // namespace
 
-std::vector<TShownCopy> MakeSongCopies(const CHarmonicAnalyse& analyse,
+std::vector<CShownCopy> MakeSongCopies(const CHarmonicAnalyse& analyse,
                                        const CChordSymbols& symbols) {
     const CHarmAnlsChords& chords = analyse.mChords;
-    std::vector<TShownCopy> copies;
+    std::vector<CShownCopy> copies;
     for (const TCopiedPassage& passage : FindCopiedPassages(analyse)) {
-        TShownCopy& shown = copies.emplace_back();
+        CShownCopy& shown = copies.emplace_back();
         shown.mCopy = passage.mCopy;
         shown.mSource = RangeOf(chords, passage.mSource, passage.mCount);
         shown.mTarget = RangeOf(chords, passage.mTarget, passage.mCount);

@@ -8,7 +8,7 @@
 namespace brindle::cli {
 
 /// The passages of a song that repeat earlier ones, by position, with their exact ranges.
-[[nodiscard]] std::vector<TShownCopy> MakeSongCopies(const CHarmonicAnalyse& analyse,
+[[nodiscard]] std::vector<CShownCopy> MakeSongCopies(const CHarmonicAnalyse& analyse,
                                                      const CChordSymbols& symbols);
 
 }  // namespace brindle::cli

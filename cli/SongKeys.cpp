@@ -2,21 +2,22 @@
 #include "cli/SongKeys.h"
 
 #include "cli/ChordSymbols.h"
-#include "cli/Names.h"
+
+#include "brindle/present/ShownNames.h"
 
 namespace brindle::cli {
 
-TSongKeys MakeSongKeys(const CHarmAnlsChords& chords, const CChordSymbols& symbols,
-                       const CKeyOptions& options, const TNumeralOptions& numeralOptions) {
+CShownKeys MakeSongKeys(const CHarmAnlsChords& chords, const CChordSymbols& symbols,
+                        const CKeyOptions& options, const TNumeralOptions& numeralOptions) {
     const CKeyOfSong found = FindKeys(chords, options);
     const std::vector<std::string> numerals = NumeralsOf(chords, found, numeralOptions);
-    TSongKeys keys;
+    CShownKeys keys;
     keys.mKey = found.mKey;
     if (!found.mKey.IsUndef()) keys.mName = found.mKey.NameLong(NamePrefs());
     keys.mConfidence = found.mConfidence;
     keys.mScores = found.mScores;
     for (const CKeyRegion& region : found.mRegions) {
-        TShownKeyRegion shown{region.mKey,
+        CShownKeyRegion shown{region.mKey,
                               region.mKey.NameLong(NamePrefs()),
                               {region.mPosition, region.mEndPosition},
                               {}};

@@ -9,8 +9,8 @@
 namespace brindle::cli {
 
 /// Finds the keys of a song and prepares them for the eye, with the numeral of each chord.
-[[nodiscard]] TSongKeys MakeSongKeys(const CHarmAnlsChords& chords, const CChordSymbols& symbols,
-                                     const CKeyOptions& options,
-                                     const TNumeralOptions& numeralOptions = {});
+[[nodiscard]] CShownKeys MakeSongKeys(const CHarmAnlsChords& chords, const CChordSymbols& symbols,
+                                      const CKeyOptions& options,
+                                      const TNumeralOptions& numeralOptions = {});
 
 }  // namespace brindle::cli

@@ -3,10 +3,10 @@
 
 #include "cli/CommandLine.h"
 #include "cli/Input.h"
-#include "cli/Names.h"
 #include "cli/Output.h"
 
 #include "brindle/analysis/TChordStringParse.h"
+#include "brindle/present/ShownNames.h"
 
 #include <fmt/format.h>
 

@@ -1,11 +1,11 @@
 // SPDX-License-Identifier: MIT
 #include "cli/CommandLine.h"
 #include "cli/Json.h"
-#include "cli/Names.h"
-#include "cli/Table.h"
 
 #include "brindle/chords/CChordHeavy.h"
 #include "brindle/chords/CChordTypes.h"
+#include "brindle/present/CTable.h"
+#include "brindle/present/ShownNames.h"
 
 #include <fmt/format.h>
 
@@ -47,7 +47,8 @@ std::string TypesText(const CChordTypeVec& types, const CPaint& paint) {
 
 TStatus Types(const CFormatOptions& format) {
     const CChordTypeVec& types = _s_chordTypes().BuiltIn();
-    return Print(format.Format() == TFormat::Json ? TypesJson(types) : TypesText(types, CPaint()));
+    return Print(format.Format() == TFormat::Json ? TypesJson(types)
+                                                  : TypesText(types, PaintOfOutput()));
 }
 
 }  // namespace

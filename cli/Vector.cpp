@@ -2,13 +2,13 @@
 #include "cli/CommandLine.h"
 #include "cli/Input.h"
 #include "cli/Json.h"
-#include "cli/Names.h"
-#include "cli/Table.h"
 #include "cli/TypedChords.h"
 
 #include "brindle/analysis/CHarmAnlsChordForMetro.h"
 #include "brindle/analysis/ChordVectorText.h"
 #include "brindle/chords/CChordHeavy.h"
+#include "brindle/present/CTable.h"
+#include "brindle/present/ShownNames.h"
 
 #include <algorithm>
 #include <iterator>
@@ -158,7 +158,7 @@ TStatus Vector(const TVectorOptions& options) {
         return FailAt(TStatus::BadInput, shown.mError, typed, shown.mColumn);
     }
     return Print(options.mFormat.Format() == TFormat::Json ? VectorsJson(vectors)
-                                                           : VectorsText(vectors, CPaint()));
+                                                           : VectorsText(vectors, PaintOfOutput()));
 }
 
 }  // namespace

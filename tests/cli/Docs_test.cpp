@@ -2,7 +2,7 @@
 // What the documents show is true: blocks marked `console` are run and compared, blocks of code
 // stand in a file of examples/ that is built by a test, and pictures are what the program draws.
 
-#include "Transcript.h"
+#include "tests/support/Transcript.h"
 
 #include <doctest/doctest.h>
 

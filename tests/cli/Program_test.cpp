@@ -2,7 +2,7 @@
 // The program as people meet it. tests/cli/golden holds what commands show, byte by byte;
 // tools/renew_golden.sh writes it anew for review.
 
-#include "Transcript.h"
+#include "tests/support/Transcript.h"
 
 #include <doctest/doctest.h>
 #include <nlohmann/json.hpp>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 // What the program makes of scores, beside what the library makes of them.
 
-#include "Transcript.h"
+#include "tests/support/Transcript.h"
 
 #include "brindle/analysis/CHarmonicAnalyse.h"
 

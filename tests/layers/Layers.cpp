@@ -20,6 +20,8 @@ constexpr auto kFolders = std::to_array<std::string_view>({
     "guitarchords",
     "musicxml",
     "song",
+    "song",
+    "present",
 });
 constexpr std::size_t kProgram = kFolders.size();
 constexpr std::size_t kNowhere = kProgram + 1;

@@ -1,0 +1,53 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/present/ShownSong.h"
+
+#include <algorithm>
+#include <cmath>
+#include <string>
+#include <utility>
+#include <vector>
+
+namespace brindle {
+
+/// Bars and beats as musicians count them, from 1, for positions in beats that count from 0. Bars
+/// are all as long as the first, or begin where a score tells.
+class CBars {
+public:
+    explicit CBars(double beatsPerBar, std::vector<double> starts = {})
+        : mBeatsPerBar(beatsPerBar), mStarts(std::move(starts)) {}
+
+    [[nodiscard]] long BarOf(double position) const {
+        if (!mStarts.empty()) return StartsUpTo(position);
+        return std::lround(std::floor(position / mBeatsPerBar)) + 1;
+    }
+    /// 1 up to, not including, the length of a bar plus 1.
+    [[nodiscard]] double BeatOf(double position) const {
+        if (!mStarts.empty()) {
+            const auto bar = static_cast<std::size_t>(std::max(1L, StartsUpTo(position)));
+            return position - mStarts[bar - 1] + 1.0;
+        }
+        return position - std::floor(position / mBeatsPerBar) * mBeatsPerBar + 1.0;
+    }
+    /// The last bar of a range that ends before `end`.
+    [[nodiscard]] long LastBarBefore(double end) const {
+        if (!mStarts.empty()) {
+            return std::lower_bound(mStarts.begin(), mStarts.end(), end) - mStarts.begin();
+        }
+        return std::lround(std::ceil(end / mBeatsPerBar));
+    }
+
+private:
+    [[nodiscard]] long StartsUpTo(double position) const {
+        return std::upper_bound(mStarts.begin(), mStarts.end(), position) - mStarts.begin();
+    }
+
+    double mBeatsPerBar;
+    std::vector<double> mStarts;  // ascending
+};
+
+/// "bar 3", "bars 1 to 4".
+[[nodiscard]] std::string BarsOf(const CTimeRange& range, const CBars& bars);
+
+}  // namespace brindle

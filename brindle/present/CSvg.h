@@ -1,0 +1,45 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <string>
+#include <string_view>
+
+namespace brindle {
+
+/// The text with what XML reserves written as entities.
+[[nodiscard]] std::string XmlEscaped(std::string_view text);
+
+/// A color as "#rrggbb"; `hue` in degrees, the others in percent.
+[[nodiscard]] std::string HslColor(int hue, int saturation, int lightness);
+
+/// How a text is written into a picture.
+struct CSvgFont {
+    double mSize = 12.0;
+    std::string_view mColor = "#222222";
+    bool mBold = false;
+    /// "middle" or "end": where the text has its x; its start otherwise.
+    std::string_view mAnchor = {};
+};
+
+/// About how wide the text is; the viewer's font decides.
+[[nodiscard]] double TextWidth(std::string_view text, double fontSize);
+
+/// A picture that is put together from rectangles, lines and texts. Sizes are in pixels.
+class CSvg {
+public:
+    void Rect(double x, double y, double width, double height, std::string_view fill,
+              std::string_view tooltip = {});
+    void Line(double x1, double y1, double x2, double y2, std::string_view color);
+    void Circle(double x, double y, double radius, std::string_view fill, std::string_view line);
+    void Text(double x, double y, std::string_view text, const CSvgFont& font);
+    /// Writes as much of the text as fits into the width.
+    void TextCut(double x, double y, double width, std::string_view text, const CSvgFont& font);
+
+    /// The whole file; `title` is read out by screen readers.
+    [[nodiscard]] std::string File(double width, double height, std::string_view title) const;
+
+private:
+    std::string mBody;
+};
+
+}  // namespace brindle

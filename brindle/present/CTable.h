@@ -1,0 +1,36 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/present/CPaint.h"
+
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace brindle {
+
+/// A table in aligned columns. A column whose name begins with a blank is aligned to the right; the
+/// blank is not shown.
+class CTable {
+public:
+    explicit CTable(std::vector<std::string> columns);
+
+    /// One cell for each column.
+    void AddRow(std::vector<std::string> cells);
+
+    [[nodiscard]] std::string Head() const;
+    [[nodiscard]] std::size_t RowCount() const { return mRows.size(); }
+    [[nodiscard]] std::string Row(std::size_t row) const;
+    /// All lines behind a margin, the head faint.
+    [[nodiscard]] std::string Text(const CPaint& paint, std::string_view margin = {}) const;
+
+private:
+    [[nodiscard]] std::string Line(const std::vector<std::string>& cells) const;
+
+    std::vector<std::string> mColumns;
+    std::vector<bool> mIsRightAligned;
+    std::vector<std::size_t> mWidths;
+    std::vector<std::vector<std::string>> mRows;
+};
+
+}  // namespace brindle

@@ -1,0 +1,213 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/present/ChordGrid.h"
+
+#include "brindle/guitarchords/GChChordDescr.h"
+#include "brindle/guitarchords/GChHarmonyStrings.h"
+#include "brindle/guitarchords/GChLibrary.h"
+#include "brindle/guitarchords/GChPitches.h"
+#include "brindle/guitarchords/GChTuningDescr.h"
+#include "brindle/present/ShownText.h"
+#include "brindle/theory/KeyIntervals.h"
+#include "brindle/theory/KeyNames.h"
+
+#include <fmt/format.h>
+
+#include <algorithm>
+
+namespace brindle {
+namespace {
+
+constexpr int kShownFrets = 4;
+constexpr int kMuted = -1;
+// Where letters without octaves begin, C2.
+constexpr int kLowestOpenString = 48;
+
+bool IsFretsText(std::string_view text) {
+    return text.find_first_not_of("0123456789xX-,.") == text.npos &&
+           text.find_first_of("0123456789xX") != text.npos;
+}
+
+std::optional<int> ReadFret(std::string_view word) {
+    if (word == "x" || word == "X") return kMuted;
+    if (word.empty() || word.size() > 2) return std::nullopt;
+    int fret = 0;
+    for (const char c : word) {
+        if (c < '0' || c > '9') return std::nullopt;
+        fret = fret * 10 + (c - '0');
+    }
+    return fret <= kGChFrets ? std::optional(fret) : std::nullopt;
+}
+
+/// Takes a letter with its sign from the start of a text.
+std::string_view TakeKeyName(std::string_view& text) {
+    const bool isSigned = text.size() > 1 && (text[1] == '#' || text[1] == 'b');
+    const std::string_view name = text.substr(0, isSigned ? 2 : 1);
+    text.remove_prefix(name.size());
+    return name;
+}
+
+/// Takes "2" or "-1" from the start of a text; empty if there is none.
+std::string_view TakeOctave(std::string_view& text) {
+    const std::size_t sign = !text.empty() && text[0] == '-' ? 1 : 0;
+    const bool isOctave = text.size() > sign && text[sign] >= '0' && text[sign] <= '9';
+    const std::string_view octave = text.substr(0, isOctave ? sign + 1 : 0);
+    text.remove_prefix(octave.size());
+    return octave;
+}
+
+/// The pitch of a key that lies nearest to another pitch, below it if two do.
+int NearestPitch(int keyNr, int pitch) {
+    return pitch + FoldIntoOctave(keyNr - pitch + 6) - 6;
+}
+
+/// Pitches of keys without octaves.
+std::vector<int> PitchesOfKeys(const std::vector<int>& keyNrs) {
+    std::vector<int> pitches;
+    for (std::size_t i = 0; i < keyNrs.size(); ++i) {
+        const int standard = GChStandardGuitarOpenStringPitch(static_cast<int>(i));
+        if (keyNrs.size() == 6) {
+            pitches.push_back(NearestPitch(keyNrs[i], standard));
+        } else {
+            const int from = pitches.empty() ? kLowestOpenString : pitches.back() + 1;
+            pitches.push_back(from + FoldIntoOctave(keyNrs[i] - from));
+        }
+    }
+    return pitches;
+}
+
+std::string AsciiName(std::optional<std::string> name) {
+    std::string text = std::move(name).value_or("");
+    ConvertUtf8SharpAndFlatToAscii(text);
+    return text;
+}
+
+}  // namespace
+
+CFretWindow WindowOf(const CChordGrid& grid) {
+    if (grid.mElems.empty()) return {};
+    const auto [lowest, highest] = std::minmax_element(
+        grid.mElems.begin(), grid.mElems.end(),
+        [](const auto& a, const auto& b) { return a.absFretIndex() < b.absFretIndex(); });
+    if (highest->absFretIndex() < kShownFrets) return {};
+    return {lowest->absFretIndex(),
+            std::max(kShownFrets, highest->absFretIndex() - lowest->absFretIndex() + 1)};
+}
+
+std::string NamesText(const CChordGrid& grid) {
+    std::string text = grid.mName;
+    for (const std::string& name : grid.mOtherNames) text += ", " + name;
+    return text;
+}
+
+std::string FretsText(const CChordGrid& grid) {
+    const bool isLong =
+        std::any_of(grid.mFrets.begin(), grid.mFrets.end(), [](int fret) { return fret > 9; });
+    std::string text;
+    for (const int fret : grid.mFrets) {
+        if (isLong && !text.empty()) text += '-';
+        text += fret == kMuted ? "x" : std::to_string(fret);
+    }
+    return text;
+}
+
+std::optional<std::vector<int>> ReadFrets(std::string_view text) {
+    if (!IsFretsText(text)) return std::nullopt;
+    const bool isLong = text.find_first_of("-,.") != text.npos;
+    std::vector<int> frets;
+    while (!text.empty()) {
+        const std::size_t length = isLong ? std::min(text.find_first_of("-,."), text.size()) : 1;
+        const auto fret = ReadFret(text.substr(0, length));
+        if (!fret) return std::nullopt;
+        frets.push_back(*fret);
+        text.remove_prefix(std::min(isLong ? length + 1 : length, text.size()));
+    }
+    return frets;
+}
+
+std::optional<GChShortTuning> ReadTuning(std::string_view text) {
+    std::string folded(text);
+    ConvertUtf8SharpAndFlatToAscii(folded);
+    std::string_view rest = folded;
+    std::vector<int> keyNrs;
+    std::vector<int> pitches;
+    while (true) {
+        rest.remove_prefix(std::min(rest.find_first_not_of(" ,"), rest.size()));
+        if (rest.empty()) break;
+        const std::string name(TakeKeyName(rest));
+        const std::string octave(TakeOctave(rest));
+        // An octave that is missing may be any: the key is the same in all.
+        const int pitch = GChMidiPitchForPitchString(name + (octave.empty() ? "0" : octave));
+        if (pitch < 0 || (octave.empty() && !pitches.empty())) return std::nullopt;
+        if (!octave.empty() && !keyNrs.empty()) return std::nullopt;
+        octave.empty() ? keyNrs.push_back(pitch % 12) : pitches.push_back(pitch);
+    }
+    if (pitches.empty()) pitches = PitchesOfKeys(keyNrs);
+    if (pitches.size() > kGChMaxStrings) return std::nullopt;
+    GChShortTuning tuning{};
+    for (const int pitch : pitches) {
+        if (pitch < 1 || pitch > 127) return std::nullopt;
+    }
+    GChPitchArrayToShortTuning(pitches, tuning);
+    return GChIsValidShortTuning(tuning) ? std::optional(tuning) : std::nullopt;
+}
+
+std::string TuningText(const GChShortTuning& tuning) {
+    std::vector<std::string> names;
+    for (const int pitch : GChPitchArrayFromShortTuning(tuning)) {
+        names.push_back(GChMidiPitchDefaultName(pitch));
+    }
+    return fmt::format("{}", fmt::join(names, " "));
+}
+
+std::optional<CChordGrid> GridOfFrets(std::string_view symbol, const std::vector<int>& frets,
+                                      const GChShortTuning& tuning, int capo) {
+    const GChTuningDescr tuningDescr(tuning, capo);
+    GChChordDescr chord;
+    for (std::size_t i = 0; i < frets.size(); ++i) {
+        const auto string = static_cast<int>(i);
+        chord.setMuted(frets[i] == kMuted, string);
+        if (frets[i] > 0 && !chord.addFingerNum(0, frets[i] - 1, string)) return std::nullopt;
+    }
+    CChordGrid grid;
+    grid.mSymbol = symbol;
+    grid.mTuning = tuning;
+    grid.mCapo = capo;
+    grid.mElems = chord.chordElems();
+    grid.mFrets = frets;
+    for (std::size_t i = 0; i < frets.size(); ++i) {
+        grid.mPitches.push_back(chord.pitchForStringIndex1(static_cast<int>(i), tuningDescr));
+    }
+    grid.mRoot = GChProposedRootNoteFromChordDescr(&chord, &tuningDescr);
+    for (int root = grid.mRoot; root < 12; ++root) {
+        std::string name =
+            AsciiName(GChHarmonyStringFromChordDescr(&chord, &tuningDescr, root, -1));
+        if (root == grid.mRoot) {
+            grid.mName = std::move(name);
+        } else if (name.size() == grid.mName.size()) {
+            grid.mOtherNames.push_back(std::move(name));
+        }
+    }
+    return grid;
+}
+
+CChordGrid GridOfChord(std::string_view symbol, const GChChord& chord, int capo) {
+    CChordGrid grid;
+    grid.mSymbol = symbol;
+    grid.mTuning = chord.basicChord()->shortTuning();
+    grid.mCapo = capo;
+    grid.mElems = chord.chordElems();
+    for (int i = 0; i < chord.numberOfStrings(); ++i) {
+        grid.mFrets.push_back(chord.maxAbsFretIndexPlusOneForStringIndex(i));
+        grid.mPitches.push_back(chord.pitchForStringIndex(i, capo));
+    }
+    grid.mRoot = chord.rootNote(capo);
+    if (grid.mRoot < 0) grid.mRoot = GChProposedRootNoteFromChord(&chord, capo);
+    grid.mName = chord.userName().empty()
+                     ? AsciiName(GChHarmonyStringFromChord(&chord, grid.mRoot, -1, capo))
+                     : Printable(chord.chordName(capo));
+    const auto library = chord.gchLibrary();
+    if (library != nullptr) grid.mLibrary = Printable(library->libraryName());
+    return grid;
+}
+
+}  // namespace brindle

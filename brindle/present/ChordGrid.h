@@ -1,0 +1,75 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/guitarchords/GChChord.h"
+#include "brindle/guitarchords/GChShortTuning.h"
+
+#include <functional>
+#include <map>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace brindle {
+
+/// A fingering made ready for the eye.
+struct CChordGrid {
+    /// What the user asked for: frets, or a chord symbol.
+    std::string mSymbol;
+    /// Told from what sounds.
+    std::string mName;
+    /// The names over other roots that are as short.
+    std::vector<std::string> mOtherNames;
+    GChShortTuning mTuning{};
+    int mCapo = 0;
+    std::vector<GChChordElem> mElems;
+    /// Of each string: -1 muted, 0 open, else the fret that sounds, counted from the capodaster.
+    std::vector<int> mFrets;
+    /// Of each string: -1 muted.
+    std::vector<int> mPitches;
+    /// The key that the name stands on, 0 to 11.
+    int mRoot = -1;
+    /// Where it comes from; empty for typed frets.
+    std::string mLibrary;
+};
+
+/// The frets that are drawn.
+struct CFretWindow {
+    int mFirst = 0;  ///< 0: from the nut
+    int mCount = 4;
+};
+
+[[nodiscard]] CFretWindow WindowOf(const CChordGrid& grid);
+
+/// The name, and behind commas those that are as short: "C 6, A m".
+[[nodiscard]] std::string NamesText(const CChordGrid& grid);
+
+/// "x32010"; frets of two digits stand between dashes: "x-10-12-12-11-10".
+[[nodiscard]] std::string FretsText(const CChordGrid& grid);
+
+/// The frets of a text in one of these forms; nothing if it has another.
+[[nodiscard]] std::optional<std::vector<int>> ReadFrets(std::string_view text);
+
+/// A tuning as people write it: letters from the lowest string, "DADGAD", or pitches with octaves,
+/// "E2A2D3G3B3E4". Six letters lie as near to the standard guitar as they can; others ascend, the
+/// first in the octave of C2. Nothing for any other text and for less than three strings.
+[[nodiscard]] std::optional<GChShortTuning> ReadTuning(std::string_view text);
+
+/// "E2 A2 D3 G3 B3 E4"
+[[nodiscard]] std::string TuningText(const GChShortTuning& tuning);
+
+/// Frets without fingers over the root that gives the shortest name, of several the first from C.
+/// Nothing if there are more
+/// fretted strings than a fingering has elements.
+[[nodiscard]] std::optional<CChordGrid> GridOfFrets(std::string_view symbol,
+                                                    const std::vector<int>& frets,
+                                                    const GChShortTuning& tuning, int capo);
+
+/// A fingering of a library over its stored root.
+[[nodiscard]] CChordGrid GridOfChord(std::string_view symbol, const GChChord& chord, int capo);
+
+/// Fingerings by the symbol of their chord.
+using TChordGrids = std::map<std::string, CChordGrid, std::less<>>;
+
+}  // namespace brindle

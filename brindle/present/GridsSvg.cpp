@@ -1,0 +1,157 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/present/GridsSvg.h"
+
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <cstddef>
+
+namespace brindle {
+namespace {
+
+constexpr double kMargin = 16.0;
+constexpr std::size_t kGridsPerLine = 6;
+
+// A full diagram, from its top left corner.
+constexpr double kNameSize = 15.0;
+constexpr double kSmallSize = 10.0;
+constexpr double kLabelRoom = 26.0;  // left of the strings, for the number of the first fret
+
+constexpr std::string_view kInk = "#222222";
+constexpr std::string_view kFaintInk = "#666666";
+constexpr std::string_view kWire = "#999999";
+constexpr std::string_view kPaper = "#ffffff";
+
+/// Draws one diagram.
+class CGridPicture {
+public:
+    CGridPicture(CSvg& svg, const CChordGrid& grid, double left, double top, double scale)
+        : mSvg(svg),
+          mGrid(grid),
+          mWindow(WindowOf(grid)),
+          mStringGap(kGridStringGap * scale),
+          mFretGap(kGridFretGap * scale),
+          mLeft(left),
+          mTop(top) {}
+
+    void Draw() {
+        DrawWires();
+        for (std::size_t i = 0; i < mGrid.mFrets.size(); ++i) {
+            if (mGrid.mFrets[i] <= 0) DrawStringMark(i, mGrid.mFrets[i] < 0);
+        }
+        for (const GChChordElem& elem : mGrid.mElems) DrawElem(elem);
+    }
+
+private:
+    [[nodiscard]] double StringX(std::size_t string) const {
+        return mLeft + mStringGap * static_cast<double>(string);
+    }
+    [[nodiscard]] double FretY(double fret) const { return mTop + mFretGap * fret; }
+    [[nodiscard]] double DotRadius() const { return mStringGap * 0.42; }
+
+    void DrawWires() {
+        const double right = StringX(mGrid.mFrets.size() - 1);
+        const double bottom = FretY(mWindow.mCount);
+        for (std::size_t i = 0; i < mGrid.mFrets.size(); ++i) {
+            mSvg.Line(StringX(i), mTop, StringX(i), bottom, kWire);
+        }
+        for (int fret = 0; fret <= mWindow.mCount; ++fret) {
+            mSvg.Line(mLeft, FretY(fret), right, FretY(fret), kWire);
+        }
+        if (mWindow.mFirst == 0) {
+            mSvg.Rect(mLeft - 1, mTop - 4, right - mLeft + 2, 4, kInk);
+        } else {
+            mSvg.Text(mLeft - mStringGap * 0.8, FretY(0.5) + kSmallSize * 0.36,
+                      fmt::format("{}", mWindow.mFirst + 1),
+                      {.mSize = kSmallSize, .mColor = kFaintInk, .mAnchor = "end"});
+        }
+    }
+
+    // A cross for a muted string, a ring for an open one.
+    void DrawStringMark(std::size_t string, bool isMuted) {
+        const double x = StringX(string);
+        const double y = mTop - mStringGap * 0.7;
+        const double r = mStringGap * 0.24;
+        if (isMuted) {
+            mSvg.Line(x - r, y - r, x + r, y + r, kInk);
+            mSvg.Line(x - r, y + r, x + r, y - r, kInk);
+        } else {
+            mSvg.Circle(x, y, r, kPaper, kInk);
+        }
+    }
+
+    void DrawElem(const GChChordElem& elem) {
+        const std::size_t strings = mGrid.mFrets.size();
+        const auto first = static_cast<std::size_t>(elem.coveredMinStr());
+        const auto last = std::min(static_cast<std::size_t>(elem.coveredMaxStr()), strings - 1);
+        if (first >= strings) return;
+        const double y = FretY(elem.absFretIndex() - mWindow.mFirst + 0.5);
+        const double r = DotRadius();
+        if (last > first) {
+            mSvg.Rect(StringX(first), y - r * 0.8, StringX(last) - StringX(first), r * 1.6, kInk);
+        }
+        for (const std::size_t string : {first, last}) {
+            mSvg.Circle(StringX(string), y, r, elem.isReal() ? kInk : kPaper, kInk);
+        }
+        if (elem.fingerNumber() == 0 || mStringGap < kGridStringGap) return;
+        mSvg.Text(StringX(first), y + kSmallSize * 0.36, fmt::format("{}", elem.fingerNumber()),
+                  {.mSize = kSmallSize,
+                   .mColor = elem.isReal() ? kPaper : kInk,
+                   .mBold = true,
+                   .mAnchor = "middle"});
+    }
+
+    CSvg& mSvg;
+    const CChordGrid& mGrid;
+    CFretWindow mWindow;
+    double mStringGap;
+    double mFretGap;
+    double mLeft;
+    double mTop;
+};
+
+/// The room of one diagram on a sheet: that of the largest.
+struct TCell {
+    double mWidth = 0.0;
+    double mHeight = 0.0;
+};
+
+TCell CellFor(const std::vector<CChordGrid>& grids) {
+    TCell cell;
+    for (const CChordGrid& grid : grids) {
+        const double neck = kGridStringGap * static_cast<double>(grid.mFrets.size() - 1);
+        const double name = TextWidth(NamesText(grid), kNameSize);
+        cell.mWidth = std::max(cell.mWidth, kLabelRoom + std::max(neck, name));
+        cell.mHeight = std::max(cell.mHeight, kGridFretGap * WindowOf(grid).mCount);
+    }
+    return {cell.mWidth + 24.0, cell.mHeight + 72.0};
+}
+
+}  // namespace
+
+void DrawGrid(CSvg& svg, const CChordGrid& grid, double left, double top, double scale) {
+    CGridPicture(svg, grid, left, top, scale).Draw();
+}
+
+std::string GridsSvg(const std::vector<CChordGrid>& grids, std::string_view title) {
+    const TCell cell = CellFor(grids);
+    CSvg svg;
+    for (std::size_t i = 0; i < grids.size(); ++i) {
+        const double left = kMargin + cell.mWidth * static_cast<double>(i % kGridsPerLine);
+        const double top = kMargin + cell.mHeight * static_cast<double>(i / kGridsPerLine);
+        const double neck = left + kLabelRoom;
+        svg.Text(neck, top + kNameSize, NamesText(grids[i]),
+                 {.mSize = kNameSize, .mColor = kInk, .mBold = true});
+        const std::string capo =
+            grids[i].mCapo > 0 ? fmt::format(", capo {}", grids[i].mCapo) : std::string();
+        svg.Text(neck, top + kNameSize + 14, FretsText(grids[i]) + capo,
+                 {.mSize = kSmallSize, .mColor = kFaintInk});
+        DrawGrid(svg, grids[i], neck, top + kNameSize + 36, 1.0);
+    }
+    const std::size_t count = std::max<std::size_t>(grids.size(), 1);
+    const auto columns = static_cast<double>(std::min(count, kGridsPerLine));
+    const auto rows = static_cast<double>((count + kGridsPerLine - 1) / kGridsPerLine);
+    return svg.File(cell.mWidth * columns + 2 * kMargin, cell.mHeight * rows + 2 * kMargin, title);
+}
+
+}  // namespace brindle

@@ -1,0 +1,25 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/present/CSvg.h"
+#include "brindle/present/ChordGrid.h"
+
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace brindle {
+
+// Distances of a diagram in full size, in pixels.
+inline constexpr double kGridStringGap = 16.0;
+inline constexpr double kGridFretGap = 20.0;
+
+/// Draws a diagram without its name into a picture. `left` is the lowest string, `top` the upper
+/// end of the strings; open and muted strings are marked above that. A diagram smaller than full
+/// size shows no fingers.
+void DrawGrid(CSvg& svg, const CChordGrid& grid, double left, double top, double scale);
+
+/// A sheet of diagrams.
+[[nodiscard]] std::string GridsSvg(const std::vector<CChordGrid>& grids, std::string_view title);
+
+}  // namespace brindle

@@ -1,0 +1,12 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/present/ImportedScore.h"
+#include "brindle/present/MidiFile.h"
+
+namespace brindle {
+
+/// An imported score as a piece with one track for each part. Notes of unknown length are left out.
+[[nodiscard]] CMidiPiece MidiPieceOf(const CImportedScore& score);
+
+}  // namespace brindle

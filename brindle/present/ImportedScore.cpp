@@ -1,0 +1,196 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/present/ImportedScore.h"
+
+#include "brindle/musicxml/MuxmlBlocks.h"
+#include "brindle/platform/ReadNumber.h"
+#include "brindle/present/ShownNames.h"
+#include "brindle/present/ShownText.h"
+#include "brindle/theory/CSignKeyHeavy.h"
+
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <array>
+#include <string_view>
+
+namespace brindle {
+namespace {
+
+// Field of a note, the word for it in the column of marks.
+struct TMark {
+    bool (*mHas)(const CMuxmlNote& note);
+    std::string_view mWord;
+};
+
+constexpr auto kMarks = std::to_array<TMark>({
+    {[](const CMuxmlNote& n) { return n.mIsChordNote; }, "chord"},
+    {[](const CMuxmlNote& n) { return n.mIsGraceNote; }, "grace"},
+    {[](const CMuxmlNote& n) { return n.mIsCueNote; }, "cue"},
+    {[](const CMuxmlNote& n) { return n.mNoteType == TMuxmlEnum_NoteType_Unpitched; }, "unpitched"},
+    {[](const CMuxmlNote& n) { return n.mAccent.mExists; }, "accent"},
+    {[](const CMuxmlNote& n) { return n.mStrongAccent.mExists; }, "strong-accent"},
+    {[](const CMuxmlNote& n) { return n.mStaccato.mExists; }, "staccato"},
+    {[](const CMuxmlNote& n) { return n.mStaccatissimo.mExists; }, "staccatissimo"},
+    {[](const CMuxmlNote& n) { return n.mTenuto.mExists; }, "tenuto"},
+    {[](const CMuxmlNote& n) { return n.mDetachedLegato.mExists; }, "detached-legato"},
+    {[](const CMuxmlNote& n) { return n.mFermata.mExists; }, "fermata"},
+    {[](const CMuxmlNote& n) { return n.mBreathMark.mExists; }, "breath-mark"},
+    {[](const CMuxmlNote& n) { return n.mCaesura.mExists; }, "caesura"},
+    {[](const CMuxmlNote& n) { return n.mScoop.mExists; }, "scoop"},
+    {[](const CMuxmlNote& n) { return n.mPlop.mExists; }, "plop"},
+    {[](const CMuxmlNote& n) { return n.mDoit.mExists; }, "doit"},
+    {[](const CMuxmlNote& n) { return n.mFallOff.mExists; }, "falloff"},
+});
+
+std::string MarksOf(const CMuxmlNote& note) {
+    std::string marks;
+    for (const TMark& mark : kMarks) {
+        if (mark.mHas(note)) fmt::format_to(std::back_inserter(marks), " {}", mark.mWord);
+    }
+    return marks.empty() ? marks : marks.substr(1);
+}
+
+// As the file names pitches: letter, accidental, octave, where C4 is the middle C.
+std::string WrittenName(const CMuxmlPitch& pitch) {
+    const auto letter = mBiMap<TMuxmlEnum_Step>.WordOf(pitch.mStep);
+    if (!letter) return "?";
+    static constexpr auto kAccidentals =
+        std::to_array<std::string_view>({"bb", "b", "", "#", "##"});
+    const TEnh enh = pitch.AlterationToEnh();
+    const std::string_view accidental =
+        enh == TEnh_Undef ? "?" : kAccidentals[static_cast<std::size_t>(enh)];
+    return fmt::format("{}{}{}", *letter, accidental, pitch.mOctave);
+}
+
+template <class Enumeration>
+std::string_view WordOf(Enumeration value) {
+    return mBiMap<Enumeration>.WordOf(value).value_or("?");
+}
+
+class CFiller {
+public:
+    explicit CFiller(CImportedScore& score) : mScore(&score) {}
+
+    void PartStart(const CMuxmlPart& part) const {
+        CImportedPart& imported = mScore->mParts.emplace_back();
+        mScore->mIsInPart = true;
+        std::swap(imported.mEvents, mScore->mEventsBeforePart);
+        imported.mID = part.mID;
+        imported.mName = part.FindBestPartName();
+        for (const CMuxmlScoreInstrument& instrument : part.mScoreInstruments) {
+            const XmlNode scorePart = instrument.mXML.parent();
+            if (scorePart.attribute("id") != part.mID) continue;
+            imported.mProgram = MidiNumber(scorePart, "midi-program");
+            imported.mChannel = MidiNumber(scorePart, "midi-channel");
+            break;
+        }
+    }
+
+    void Add(std::int32_t position, std::string what) const {
+        CImportedEvent event;
+        event.mPosition = position;
+        event.mWhat = std::move(what);
+        auto& events = mScore->mIsInPart ? Part().mEvents : mScore->mEventsBeforePart;
+        events.push_back(std::move(event));
+    }
+
+    void Note(const CMuxmlNote& note) const {
+        CImportedEvent event;
+        event.mIsNote = true;
+        event.mPosition = note.mPositionAsMidiTicks;
+        if (note.mLengthAsMidiTicks != kMuxmlUndef) event.mLength = note.mLengthAsMidiTicks;
+        event.mWhat =
+            note.mNoteType == TMuxmlEnum_NoteType_Pitched ? WrittenName(note.mPitch) : "x";
+        event.mMarks = MarksOf(note);
+        event.mNoteNr = note.mNoteNr;
+        event.mVelocity = note.mVelocity;
+        event.mVoice = note.mVoice;
+        event.mStaff = note.mStaff;
+        Part().mEvents.push_back(std::move(event));
+    }
+
+    void SignTime(const CMuxmlSignTime& time) const {
+        Add(time.mPositionAsMidiTicks,
+            time.mSenzaMisura
+                ? std::string("time without measure")
+                : fmt::format("time {}/{}", time.mNomAkaBeats, time.mDenomAkaBeatTypeAsInt));
+        if (!IsOfFirstPart()) return;
+        mScore->mTimeSignatures.push_back(
+            {time.mPositionAsMidiTicks, time.mNomAkaBeats, time.mDenomAkaBeatTypeAsInt});
+    }
+
+    void SignKey(const CMuxmlSignKey& key) const {
+        const CSignKeyHeavy written = key.ConvertToCSignKeyTransposedPitch();
+        Add(key.mPositionAsMidiTicks, "key " + written.NameLong(NamePrefs()));
+        if (!IsOfFirstPart()) return;
+        const CSignKeyHeavy sounding = key.ConvertToCSignKeySoundingPitch();
+        mScore->mKeySignatures.push_back({key.mPositionAsMidiTicks, sounding.SignsCount(),
+                                          sounding.SignKeyType() == TSignKeyType_Minor});
+    }
+
+    void Tempo(const CMuxmlTempoChange& change) const {
+        Add(change.mPositionAsMidiTicks, "tempo " + ShortNumber(double{change.mTempo}));
+        if (change.mTempo <= 0) return;
+        mScore->mTempos.push_back({change.mPositionAsMidiTicks, double{change.mTempo}});
+    }
+
+    void PartEnd(const CMuxmlPartGatheredInfo& info) const {
+        Part().mEnd = info.mPartEndPosAsMidiTicks;
+        mScore->mIsInPart = false;
+    }
+
+    [[nodiscard]] CImportedPart& Part() const { return mScore->mParts.back(); }
+
+private:
+    // A time signature may be told before its part starts.
+    [[nodiscard]] bool IsOfFirstPart() const {
+        return mScore->mParts.size() == (mScore->mIsInPart ? 1U : 0U);
+    }
+
+    // Numbers of MIDI count from 1 in scores.
+    static std::optional<int> MidiNumber(const XmlNode& scorePart, std::string_view name) {
+        const XmlNode found = scorePart.firstDescendant(name);
+        if (!found) return std::nullopt;
+        return std::max(1, ReadInteger(found.stringValue())) - 1;
+    }
+
+    CImportedScore* mScore;
+};
+
+}  // namespace
+
+MusicXmlParserDelegate HostFor(CImportedScore& score) {
+    const CFiller filler(score);
+    MusicXmlParserDelegate host;
+    host.didEncounterPartStart = [filler](const CMuxmlPart& part) { filler.PartStart(part); };
+    host.didEncounterPartEnd = [filler](const CMuxmlPartGatheredInfo& info) {
+        filler.PartEnd(info);
+    };
+    host.didEncounterMeasureEnd = [filler](const CMuxmlMeasure& measure) {
+        const bool hasNumber = measure.mNumber != CMuxmlMeasure::kNumber_Undef;
+        filler.Part().mMeasures.push_back(
+            {measure.mPositionAsMidiTicks, hasNumber ? measure.mNumber : "-"});
+    };
+    host.didEncounterSignTime = [filler](const CMuxmlSignTime& time) { filler.SignTime(time); };
+    host.didEncounterSignKey = [filler](const CMuxmlSignKey& key) { filler.SignKey(key); };
+    host.didEncounterClef = [filler](const CMuxmlClef& clef) {
+        filler.Add(clef.mPositionAsMidiTicks,
+                   fmt::format("clef {} {}", WordOf(clef.mSign), clef.mStaffLine));
+    };
+    host.didEncounterTranspose = [filler](const CMuxmlTranspose& transpose) {
+        filler.Add(transpose.mPositionAsMidiTicks,
+                   fmt::format(
+                       "transpose {:+g}",
+                       transpose.mChromatic + 12.0F * static_cast<float>(transpose.mOctaveChange)));
+    };
+    host.didEncounterTempoChange = [filler](const CMuxmlTempoChange& c) { filler.Tempo(c); };
+    host.didEncounterDirection = [filler](const CPositionedXMLElement& direction) {
+        const XmlNode type = direction.XMLElement.firstDescendant("direction-type").firstChild();
+        filler.Add(direction.PositionAsMidiTicks,
+                   fmt::format("direction {}", type ? type.name() : "of no type"));
+    };
+    host.didEncounterNote = [filler](const CMuxmlNote& note) { filler.Note(note); };
+    return host;
+}
+
+}  // namespace brindle

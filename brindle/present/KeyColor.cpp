@@ -1,0 +1,24 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/present/KeyColor.h"
+
+#include "brindle/present/CSvg.h"
+
+namespace brindle {
+
+std::string ColorOf(const CKeyEnh& root, bool isMinor, TShade shade) {
+    if (root.IsUndef()) return "#ececec";
+    const int placeOnCircleOfFifths = root.mKeyNr * 7 % 12;
+    return HslColor((placeOnCircleOfFifths * 30 + 50) % 360, 65,
+                    static_cast<int>(shade) - (isMinor ? 7 : 0));
+}
+
+std::string ColorOf(const CSignKeyLite& key, TShade shade) {
+    return ColorOf(key.mRootKeyEnh, key.mSignKeyType == TSignKeyType_Minor, shade);
+}
+
+std::string ColorOf(const CHarmCenterLite& center, TShade shade) {
+    const bool isMinor = center.mSemitones.HasIntvl(3) && !center.mSemitones.HasIntvl(4);
+    return ColorOf(center.mRootKeyEnh, isMinor, shade);
+}
+
+}  // namespace brindle

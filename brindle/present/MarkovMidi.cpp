@@ -1,0 +1,53 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/present/MarkovMidi.h"
+
+#include "brindle/markov/MarkovChords.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace brindle {
+namespace {
+
+constexpr int kTicksPerQuarter = 480;
+constexpr int kBassChannel = 1;
+constexpr int kPianoProgram = 0;
+constexpr int kBassProgram = 32;
+// Where the highest voice of the chords stays, the G above middle C.
+constexpr int kTopVoiceCenter = 67;
+
+std::int64_t TickAt(double beats) {
+    return static_cast<std::int64_t>(std::min(std::round(beats * kTicksPerQuarter), 1e9));
+}
+
+}  // namespace
+
+CMidiPiece MidiPieceOf(MarkovSequenceView sequence, double tempo, int beatsPerBar) {
+    CMidiPiece piece;
+    piece.mTicksPerQuarter = kTicksPerQuarter;
+    piece.mTempos = {{0, tempo}};
+    piece.mTimeSignatures = {{0, beatsPerBar, 4}};
+    piece.mTracks = {{"Chords", {{0, 0, kPianoProgram}}, {}},
+                     {"Bass", {{0, kBassChannel, kBassProgram}}, {}}};
+    double beats = 0.0;
+    std::vector<unsigned char> notes;
+    for (const MarkovIterator symbol : sequence) {
+        if (!symbol->HasBeats()) continue;
+        const CHarmAnlsChordWithLength& chord = symbol->mChord;
+        const std::int64_t begin = TickAt(beats);
+        beats += chord.mLength;
+        const std::int64_t length = TickAt(beats) - begin;
+        if (symbol->IsGap() || chord.IsUndef()) continue;
+        CHarmAnlsChordWithLengthToMidiNotes(chord, notes, false);
+        AddBassNoteToMidiNotes(chord, notes, false);
+        piece.mTracks[1].mNotes.push_back({begin, length, kBassChannel, notes.back(), 90});
+        notes.pop_back();
+        TransposeChordBasedOnPreviousChords(notes, kTopVoiceCenter);
+        for (const unsigned char note : notes) {
+            piece.mTracks[0].mNotes.push_back({begin, length, 0, note, 75});
+        }
+    }
+    return piece;
+}
+
+}  // namespace brindle

@@ -1,0 +1,87 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/present/SongShapes.h"
+
+#include "brindle/present/KeyColor.h"
+
+#include <fmt/format.h>
+
+#include <algorithm>
+
+namespace brindle {
+namespace {
+
+constexpr double kPadding = 5.0;
+constexpr double kGap = 1.0;
+constexpr double kChordHeight = 34.0;
+constexpr double kNarrowestChord = 40.0;
+// From the middle of a line of text to its base, in parts of the font's size.
+constexpr double kBaseLine = 0.36;
+constexpr std::string_view kBarLine = "#c8c8c8";
+
+double WidthInside(const CTimeSegment& segment) {
+    return std::max(0.5, segment.Width() - 2 * kGap);
+}
+
+}  // namespace
+
+void DrawBarLines(CSvg& svg, const CTimeAxis& axis, const CLinePlaces& places, double bottom) {
+    for (std::size_t line = 0; line < axis.LineCount(); ++line) {
+        const double top = places.mTops[line];
+        for (const auto& [barX, bar] : axis.BarLines(line)) {
+            const double x = places.mLeft + barX;
+            svg.Line(x, top + 4, x, top + bottom, kBarLine);
+            svg.Text(x + 3, top + 13, fmt::format("{}", bar),
+                     {.mSize = kSmallSize, .mColor = kFaintInk});
+        }
+        const double right = places.mLeft + axis.Line(line).mRight;
+        svg.Line(right, top + 4, right, top + bottom, kBarLine);
+    }
+}
+
+void DrawBand(CSvg& svg, const CTimeAxis& axis, const CLinePlaces& places, const CTimeRange& range,
+              const CBand& band) {
+    for (const CTimeSegment& segment : axis.SegmentsOf(range)) {
+        const double x = places.mLeft + segment.mLeft + kGap;
+        const double y = places.mTops[segment.mLine] + band.mTop;
+        svg.Rect(x, y, WidthInside(segment), band.mHeight, band.mColor, band.mLabel);
+        svg.TextCut(x + kPadding, y + band.mHeight / 2 + band.mFont.mSize * kBaseLine,
+                    segment.Width() - kPadding, band.mLabel, band.mFont);
+    }
+}
+
+void DrawKeyRegions(CSvg& svg, const CTimeAxis& axis, const CLinePlaces& places,
+                    const CShownKeys& keys, double top, double height) {
+    for (const CShownKeyRegion& region : keys.mRegions) {
+        DrawBand(svg, axis, places, region.mRange,
+                 {top,
+                  height,
+                  ColorOf(region.mKey, Shade_Region),
+                  "in " + region.mName,
+                  {.mSize = kLabelSize, .mBold = region.mKey == keys.mKey}});
+    }
+}
+
+void DrawChord(CSvg& svg, const CTimeAxis& axis, const CLinePlaces& places, const CTimeRange& range,
+               const CChordBox& box) {
+    const std::vector<CTimeSegment> segments = axis.SegmentsOf(range);
+    for (const CTimeSegment& segment : segments) {
+        svg.Rect(places.mLeft + segment.mLeft + kGap, places.mTops[segment.mLine] + box.mTop,
+                 WidthInside(segment), kChordHeight, box.mColor, box.mSymbol);
+    }
+    if (segments.empty()) return;
+    const CTimeSegment& first = segments.front();
+    const double x = places.mLeft + first.mLeft + kPadding;
+    const double room = first.Width() - kPadding - kGap;
+    const double top = places.mTops[first.mLine] + box.mTop;
+    svg.TextCut(x, top + 22, room, box.mSymbol,
+                {.mSize = kSymbolSize, .mColor = kInk, .mBold = true});
+    svg.TextCut(x, top + kCaptionBelowChord + box.mCaptionFont.mSize, room, box.mCaption,
+                box.mCaptionFont);
+}
+
+double WidthOfChord(std::string_view symbol, std::string_view caption, double captionSize) {
+    const double widest = std::max(TextWidth(symbol, kSymbolSize), TextWidth(caption, captionSize));
+    return std::max(kNarrowestChord, widest + 2 * kPadding);
+}
+
+}  // namespace brindle

@@ -1,0 +1,63 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/theory/ReadKeyText.h"
+
+#include "brindle/theory/CChordNamePrefs.h"
+#include "brindle/theory/ScaleStrings.h"
+#include "brindle/theory/SignKeyStrings.h"
+
+#include <algorithm>
+
+namespace brindle {
+namespace {
+
+// The key at the start of a text, and where the word behind it begins.
+struct TTypedRoot {
+    CKeyEnh mRoot;
+    int mConsumed = 0;
+    std::size_t mWord = 0;
+};
+
+TTypedRoot ReadRoot(const std::string& text) {
+    TTypedRoot root;
+    root.mRoot.SetFromString(text, &root.mConsumed, ChordNamePrefsNonUTF8);
+    root.mWord = std::min(text.find_first_not_of(' ', static_cast<std::size_t>(root.mConsumed)),
+                          text.size());
+    return root;
+}
+
+// Whether a reader that moved from the word's begin to `position` has read all of the text.
+bool IsReadToItsEnd(std::string_view text, int position) {
+    return text.find_first_not_of(' ', static_cast<std::size_t>(position)) == text.npos;
+}
+
+}  // namespace
+
+CKeyText ReadKeyText(std::string_view typed) {
+    const std::string text(typed);
+    const TTypedRoot root = ReadRoot(text);
+    if (root.mRoot.IsUndef()) return {{}, "a key begins with a letter A to H, as in \"Bb minor\""};
+    int position = root.mConsumed;
+    const TSignKeyType type = _SignKeyTypeFromString(text, position);
+    if (!IsReadToItsEnd(text, position)) {
+        return {{}, "behind the key stands major or minor, or nothing", root.mWord};
+    }
+    return {{root.mRoot, type}, {}, 0};
+}
+
+CScaleText ReadScaleText(std::string_view typed) {
+    const std::string text(typed);
+    const TTypedRoot root = ReadRoot(text);
+    if (root.mRoot.IsUndef()) {
+        return {{}, "a scale begins with a letter A to H, as in \"D dorian\""};
+    }
+    int position = root.mConsumed;
+    static_cast<void>(_SemitonesScaleFromString(text, position));
+    if (!IsReadToItsEnd(text, position)) {
+        return {{}, "no scale of this name is known", root.mWord};
+    }
+    CScaleText read;
+    read.mScale.SetFromString(text, ChordNamePrefsNonUTF8);
+    return read;
+}
+
+}  // namespace brindle

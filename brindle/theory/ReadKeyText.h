@@ -1,0 +1,36 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/theory/CScaleHeavy.h"
+#include "brindle/theory/CSignKeyLite.h"
+
+#include <cstddef>
+#include <string>
+#include <string_view>
+
+namespace brindle {
+
+// The readers of names take a word that it does not know for "major". Somebody who typed it wants
+// to know.
+
+/// A key that was typed, or what is wrong with it and where.
+struct CKeyText {
+    CSignKeyLite mSignKey;
+    std::string mError;
+    std::size_t mColumn = 0;
+};
+
+/// Reads "F# minor", "Bb", "am" with accidentals in # and b.
+[[nodiscard]] CKeyText ReadKeyText(std::string_view text);
+
+/// A scale that was typed, or what is wrong with it and where.
+struct CScaleText {
+    CScaleHeavy mScale;
+    std::string mError;
+    std::size_t mColumn = 0;
+};
+
+/// Reads "D dorian", "Bb blues minor", "Am" with accidentals in # and b.
+[[nodiscard]] CScaleText ReadScaleText(std::string_view text);
+
+}  // namespace brindle
