@@ -9,6 +9,7 @@
 #include "brindle/musicxml/CChordSetFromMusicXml.h"
 #include "brindle/musicxml/ScoreContainer.h"
 #include "brindle/platform/Error.h"
+#include "brindle/platform/XmlStreamParser.h"
 #include "brindle/present/ShownNames.h"
 #include "brindle/theory/CChordNamePrefs.h"
 
@@ -101,8 +102,15 @@ std::optional<TMusicXMLDoc> Unreadable(const TTypedSong& song, std::string_view 
     return std::nullopt;
 }
 
-// The library tells only that it cannot read a plain score; the other reading tells why.
+// The library tells only that it cannot read a plain score; what reads its XML, or reads it in the
+// other way, tells why. The other way is more lenient: it reads on behind blanks and wrong
+// encodings.
 std::string FaultOf(std::string_view bytes) {
+    XmlStreamParser parser;
+    if (!IsScoreContainer(bytes) && !parser.parse(bytes)) {
+        const XmlError& fault = *parser.parserError();
+        return fmt::format("{}:{}: {}", fault.mLine, fault.mColumn, fault.mDescription);
+    }
     Error error;
     if (TMusicXMLDoc().LoadAsPlayedFromBytes(bytes, &error)) return "the score cannot be laid out";
     return error.description;

@@ -55,24 +55,30 @@ std::size_t SizeOf(const xmlNode* node, std::size_t limit) {
 using XPathContext = std::unique_ptr<xmlXPathContext, decltype(&xmlXPathFreeContext)>;
 using XPathResult = std::unique_ptr<xmlXPathObject, decltype(&xmlXPathFreeObject)>;
 
-// Short memory and a wrong path both have no result; they differ by the error.
-void HearPathError(void* wasMemoryShort, xmlErrorPtr error) {
-    const bool isShort = error->code == XML_ERR_NO_MEMORY ||
-                         error->code == int{XML_XPATH_EXPRESSION_OK} + XPATH_MEMORY_ERROR;
-    if (isShort) *static_cast<bool*>(wasMemoryShort) = true;
-}
+// Short memory and a wrong path both have no result; only a wrong path is always told as an error.
+struct TPathErrors {
+    bool mWasMemoryShort = false;
+    bool mIsWrong = false;
+
+    static void Hear(void* self, xmlErrorPtr error) {
+        const bool isShort = error->code == XML_ERR_NO_MEMORY ||
+                             error->code == int{XML_XPATH_EXPRESSION_OK} + XPATH_MEMORY_ERROR;
+        auto& errors = *static_cast<TPathErrors*>(self);
+        (isShort ? errors.mWasMemoryShort : errors.mIsWrong) = true;
+    }
+};
 
 /// Calls `step` with a context for paths. Throws when memory was short.
 template <class Step>
 auto WithPathContext(xmlDocPtr document, Step step) {
     const xml::CMemoryWatch watch;
-    bool wasMemoryShort = false;
+    TPathErrors errors;
     const XPathContext context(xmlXPathNewContext(document), xmlXPathFreeContext);
     if (!context) throw std::bad_alloc();
-    context->error = HearPathError;
-    context->userData = &wasMemoryShort;
+    context->error = TPathErrors::Hear;
+    context->userData = &errors;
     auto result = step(context.get());
-    if (wasMemoryShort) throw std::bad_alloc();
+    if (errors.mWasMemoryShort || (!result && !errors.mIsWrong)) throw std::bad_alloc();
     watch.Check();
     return result;
 }

@@ -180,7 +180,12 @@ bool CChordTextParser::ReadSuspension() {
         return scan.SeesWord(row.mText) && (wordLength > 0 || row.mText.size() == 1);
     };
     const auto* const row = std::find_if(kSuspensionRows.begin(), kSuspensionRows.end(), fits);
-    if (row == kSuspensionRows.end()) {
+    const bool isRaisedFourth =
+        wordLength > 0 && behindWord.SeesWord("#4") && !IsDigit(behindWord.Peek(2));
+    if (isRaisedFourth) {
+        mScan.mPos = behindWord.mPos + 2;
+        mTones.Suspend(6);
+    } else if (row == kSuspensionRows.end()) {
         if (wordLength == 0) return false;
         mScan = behindWord;
         mTones.Suspend(5);

@@ -45,7 +45,7 @@ public:
     /// False when the degree cannot be altered so.
     [[nodiscard]] bool Alter(TAlteredDegree altered);
 
-    /// Suspended by tone 2 or 5.
+    /// Suspended by tone 2, 5 or 6.
     void Suspend(int tone) { mSus |= Bit(tone); }
     void MakeAltered();
     void RaiseFifth();
