@@ -31,7 +31,8 @@ constexpr int kOptions = XML_PARSE_NOENT | XML_PARSE_NONET | XML_PARSE_BIG_LINES
 
 XmlError ErrorFrom(const xmlError& error) {
     std::string text = error.message == nullptr ? "unknown XML error" : error.message;
-    while (!text.empty() && (text.back() == '\n' || text.back() == ' ')) text.pop_back();
+    std::replace(text.begin(), text.end(), '\n', ' ');
+    while (!text.empty() && text.back() == ' ') text.pop_back();
     return {error.code, text, error.line, error.int2};
 }
 
