@@ -102,7 +102,7 @@ TEST_CASE("Entries that name no symbol are left out, and the order of members do
         transitions.push_back({test::FormOf(entry->mHistory), TableForm(entry->mCounts)});
     }
     // Counts of 32 bits: 2 + 4294967295 is 1.
-    CHECK(transitions == json::parse("[[[0,1],[[0,1],[1,2]]],[[1],[[0,1],[1,1]]],"
+    CHECK(transitions == json::parse("[[[0],[]],[[0,1],[[0,1],[1,2]]],[[1],[[0,1],[1,1]]],"
                                      "[[1,0],[]],[[1,1],[[1,4294967295]]]]"));
 
     VariableLengthMarkovModel fromDictionary;
