@@ -39,36 +39,38 @@ std::vector<TSeventhSpelling> SeventhsOf(const CHarmAnlsChords& chords,
     return sevenths;
 }
 
-std::vector<CChordReading> ReadChords(std::span<const TKeyChord> heard, const TSongKeys& keys,
+// The reading of each chord stands at its first place in the list, its indices count the chords
+// that are heard.
+std::vector<CChordReading> ReadChords(std::size_t count, std::span<const TKeyChord> heard,
+                                      const TSongKeys& keys,
                                       std::span<const TSeventhSpelling> sevenths) {
     const std::vector<std::ptrdiff_t> under = HarmonyChain(heard, keys.mKinds, keys.mTraits.mHome);
-    std::vector<CChordReading> readings(heard.size());
+    std::vector<CChordReading> readings(count);
     for (std::size_t i = 0; i < heard.size(); ++i) {
-        readings[i].mUnder = under[i];
-        readings[i].mResolvesTo = under[i];
+        CChordReading& reading = readings[heard[i].mBegin];
+        reading.mUnder = under[i];
+        reading.mResolvesTo = under[i];
     }
     NameHarmonies({heard, keys.mKeys, sevenths, keys.mTraits, readings});
     return readings;
 }
 
-// From places among the chords that are heard to those in the list.
-std::vector<CChordReading> Spread(const CHarmAnlsChords& chords, std::span<const TKeyChord> heard,
-                                  const std::vector<CChordReading>& readings) {
+// Makes the indices places in the list, and gives chords that are written again the same reading.
+void Spread(const CHarmAnlsChords& chords, std::span<const TKeyChord> heard,
+            std::vector<CChordReading>& readings) {
     const auto placeOf = [&](std::ptrdiff_t ix) {
         return ix < 0 ? ix
                       : static_cast<std::ptrdiff_t>(heard[static_cast<std::size_t>(ix)].mBegin);
     };
-    std::vector<CChordReading> spread(chords.size());
     for (std::size_t i = 0; i < heard.size(); ++i) {
         const std::size_t end = i + 1 < heard.size() ? heard[i + 1].mBegin : chords.size();
-        for (std::size_t ix = heard[i].mBegin; ix < end; ++ix) {
-            if (chords[ix].IsUndef()) continue;
-            spread[ix] = readings[i];
-            spread[ix].mResolvesTo = placeOf(readings[i].mResolvesTo);
-            spread[ix].mUnder = placeOf(readings[i].mUnder);
+        CChordReading& reading = readings[heard[i].mBegin];
+        reading.mResolvesTo = placeOf(reading.mResolvesTo);
+        reading.mUnder = placeOf(reading.mUnder);
+        for (std::size_t ix = heard[i].mBegin + 1; ix < end; ++ix) {
+            if (!chords[ix].IsUndef()) readings[ix] = reading;
         }
     }
-    return spread;
 }
 
 }  // namespace
@@ -97,12 +99,12 @@ CSongReading ReadHarmony(const CHarmAnlsChords& chords, const CReadingOptions& o
     song.mKey = options.mStatedKey.IsUndef() ? speller.SignKeyOf(home) : options.mStatedKey;
     song.mConfidence = ConfidenceOf(keys.mScores, home);
     song.mRegions = KeyRegionsOf(chords, heard, keys.mKeys, speller);
-    std::vector<CChordReading> readings =
-        ReadChords(heard, keys, SeventhsOf(chords, heard, options.mSevenths));
+    song.mChords =
+        ReadChords(chords.size(), heard, keys, SeventhsOf(chords, heard, options.mSevenths));
     for (std::size_t i = 0; i < heard.size(); ++i) {
-        readings[i].mKey = speller.SignKeyOf(keys.mKeys[i]);
+        song.mChords[heard[i].mBegin].mKey = speller.SignKeyOf(keys.mKeys[i]);
     }
-    song.mChords = Spread(chords, heard, readings);
+    Spread(chords, heard, song.mChords);
     return song;
 }
 

@@ -68,6 +68,23 @@ struct CReadingOptions {
     std::span<const TSeventhSpelling> mSevenths;
 };
 
+/// The degree of a key that a chord serves.
+struct CServedDegree {
+    /// Above the tonic, 0 to 11; -1 for no degree.
+    std::int8_t mSemitones = -1;
+    /// As it is written: 3 and -1 for bIII.
+    std::int8_t mNumber = 0;
+    std::int8_t mAccidental = 0;
+    /// In small letters: ii.
+    bool mIsMinor = false;
+
+    [[nodiscard]] constexpr bool IsTonic() const { return mSemitones == 0; }
+    /// "I", "ii", "bIII"; empty for no degree. The tonic is "I" in minor, too.
+    [[nodiscard]] std::string Name() const;
+
+    friend constexpr bool operator==(const CServedDegree&, const CServedDegree&) = default;
+};
+
 /// One chord as a teacher reads it. All indices are those of the list of chords, -1 for none; of a
 /// chord that is written several times in a row, they are those of the first time.
 struct CChordReading {
@@ -78,12 +95,9 @@ struct CChordReading {
     std::string mNumeral;
     THarmFunction mFunction = THarmFunction_Undef;
     TChordRelation mRelation = TChordRelation_Undef;
-    /// The degree that it prepares or stands for, in semitones above the tonic: 0 for G7 in C
-    /// major, 2 for A7 before Dm. -1 for no chord. A related second serves what its dominant
-    /// serves, in the key of that.
-    int mServes = -1;
-    /// The same as a numeral: "I", "ii". Small letters are minor.
-    std::string mServedDegree;
+    /// The degree that it prepares or stands for: I for G7 in C major, ii for A7 before Dm. A
+    /// related second serves what its dominant serves, in the key of that.
+    CServedDegree mServes;
     /// The chord that it leads to.
     std::ptrdiff_t mResolvesTo = -1;
     /// The later chord that it stands under in the tree of the song; -1 for a chord that prepares

@@ -1,7 +1,14 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/analysis/ReadHarmony.h"
+#include "brindle/analysis/internal/NumeralText.h"
 
 namespace brindle {
+
+std::string CServedDegree::Name() const {
+    std::string name;
+    if (mSemitones >= 0) AppendDegree(name, {mNumber, mAccidental}, mIsMinor);
+    return name;
+}
 
 std::string_view NameOf(THarmFunction function) {
     switch (function) {

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/analysis/internal/KeyTables.h"
-#include "brindle/analysis/CKeyOfSong.h"
+#include "brindle/analysis/internal/ChainTables.h"
 
 #include <doctest/doctest.h>
 #include <nlohmann/json.hpp>
@@ -10,31 +10,36 @@
 namespace brindle::test {
 namespace {
 
-nlohmann::json KeyTablesJson() {
-    std::ifstream file(BRINDLE_SOURCE_DIR "/data/key-tables.json");
+nlohmann::json ModelJson() {
+    std::ifstream file(BRINDLE_SOURCE_DIR "/data/reading-model.json");
     return nlohmann::json::parse(file, nullptr, false);
 }
 
-TEST_CASE("The tables of keys hold what their JSON holds") {
-    const nlohmann::json json = KeyTablesJson();
-    REQUIRE(json.is_object());
-    CHECK(json.size() == 8);
-    CHECK(json["time"] == nlohmann::json(kKeyTimeTable));
-    CHECK(json["bass"] == nlohmann::json(kKeyBassTable));
-    CHECK(json["first"] == nlohmann::json(kKeyFirstTable));
-    CHECK(json["last"] == nlohmann::json(kKeyLastTable));
-    CHECK(json["step"] == nlohmann::json(kKeyStepTable));
-    CHECK(json["local"] == nlohmann::json(kKeyLocalTable));
-    CHECK(json["change"] == nlohmann::json{{"base", kKeyChangeCosts.mBase},
-                                           {"fifth", kKeyChangeCosts.mFifth},
-                                           {"parallel", kKeyChangeCosts.mParallel}});
-    CHECK(json["home"] == kKeyHomeBonus);
+// A table in tenths as the JSON has it.
+template <class TTable>
+nlohmann::json InPoints(const TTable& table) {
+    nlohmann::json rows = table;
+    for (nlohmann::json& row : rows) {
+        for (nlohmann::json& cell : row) cell = cell.get<double>() / 10.0;
+    }
+    return rows;
 }
 
-TEST_CASE("Without options a song is heard by the figures of the tables") {
-    const CKeyOptions options;
-    CHECK(options.mHomeBonus == kKeyHomeBonus);
-    CHECK(options.mChangeCost == kKeyChangeCosts.mBase);
+TEST_CASE("The tables of keys and chains hold what their JSON holds") {
+    const nlohmann::json json = ModelJson();
+    REQUIRE(json.is_object());
+    CHECK(json.size() == 11);
+    CHECK(json["global_time"] == nlohmann::json(kKeyTimeTable));
+    CHECK(json["global_bass"] == nlohmann::json(kKeyBassTable));
+    CHECK(json["global_first"] == nlohmann::json(kKeyFirstTable));
+    CHECK(json["global_last"] == nlohmann::json(kKeyLastTable));
+    CHECK(json["global_step"] == nlohmann::json(kKeyStepTable));
+    CHECK(json["local"] == nlohmann::json(kKeyLocalTable));
+    CHECK(json["motion"] == InPoints(kChainMotion));
+    CHECK(json["goal"] == InPoints(kChainGoal));
+    CHECK(json["to"] == InPoints(kChainTo));
+    CHECK(json["depth"] == InPoints(kChainDepth));
+    CHECK(json["rest"] == InPoints(kChainRest));
 }
 
 }  // namespace

@@ -43,7 +43,7 @@ nlohmann::json RowsOf(const CSongReading& reading) {
     for (const CChordReading& chord : reading.mChords) {
         if (chord.mKey.IsUndef()) continue;
         rows.push_back({NumberOf(chord.mKey), chord.mNumeral, LetterOf(chord.mFunction),
-                        NameOf(chord.mRelation), chord.mServedDegree, chord.mResolvesTo,
+                        NameOf(chord.mRelation), chord.mServes.Name(), chord.mResolvesTo,
                         chord.mUnder, chord.mDeceptive});
     }
     return rows;

@@ -6,8 +6,8 @@
 #include "brindle/analysis/CKeyOfSong.h"
 #include "brindle/analysis/RomanNumeral.h"
 #include "brindle/analysis/TChordStringParse.h"
-#include "brindle/analysis/internal/KeyScores.h"
 #include "brindle/analysis/internal/KeyTables.h"
+#include "brindle/analysis/internal/LocalKeys.h"
 #include "brindle/theory/KeyIntervals.h"
 
 #include <doctest/doctest.h>
@@ -237,13 +237,20 @@ TEST_CASE("What is written twice, or as no chord, makes the chord before longer"
 }
 
 // The best path, word for word and slowly. Pivots apart.
-std::vector<std::uint8_t> PlainPath(const std::vector<TKeyChord>& chords, int home,
-                                    const CKeyOptions& options) {
-    const auto gain = [&](const TKeyChord& chord, int k) {
+std::vector<std::uint8_t> PlainPath(const std::vector<TKeyChord>& chords,
+                                    const std::vector<TKeyChordKind>& kinds,
+                                    const TSongTraits& traits, const CKeyOptions& options) {
+    const auto gain = [&](std::size_t i, int k) {
+        const TKeyChord& chord = chords[i];
         const double bars = std::clamp(chord.mBeats / options.mBeatsPerBar, 1.0 / 16, 4.0);
         const auto dist = static_cast<std::size_t>((chord.mRoot - k % 12 + 12) % 12);
-        const double points = kKeyLocalTable[static_cast<std::size_t>(k / 12)][chord.mClass][dist];
-        return std::sqrt(std::sqrt(bars)) * (points + (k == home ? options.mHomeBonus : 0.0));
+        double points = kKeyLocalTable[static_cast<std::size_t>(k / 12)][kinds[i]][dist];
+        const double weight = std::pow(bars, 0.25);
+        if (k != traits.mHome) return weight * points;
+        const bool isBluesChord =
+            chord.mClass == TKeyChordClass_Dom && (dist == 0 || dist == 5) && traits.mIsBlues;
+        if (isBluesChord) points = std::max(points, 2.7);
+        return weight * points + weight * options.mHomeBonus;
     };
     const auto cost = [&](int a, int b) {
         if (a == b) return 0.0;
@@ -256,15 +263,15 @@ std::vector<std::uint8_t> PlainPath(const std::vector<TKeyChord>& chords, int ho
     std::vector<std::array<int, 24>> from(chords.size());
     for (std::size_t i = 0; i < chords.size(); ++i) {
         for (int k = 0; k < 24; ++k) {
-            int a = 0;
+            int a = k;
             const auto way = [&](int b) {
                 return best[i - 1][static_cast<std::size_t>(b)] - cost(b, k);
             };
-            for (int b = 1; i > 0 && b < 24; ++b) {
+            for (int b = 0; i > 0 && b < 24; ++b) {
                 if (way(b) > way(a)) a = b;
             }
             const auto ix = static_cast<std::size_t>(k);
-            best[i][ix] = gain(chords[i], k) + (i > 0 ? way(a) : 0.0);
+            best[i][ix] = gain(i, k) + (i > 0 ? way(a) : 0.0);
             from[i][ix] = a;
         }
     }
@@ -278,7 +285,9 @@ std::vector<std::uint8_t> PlainPath(const std::vector<TKeyChord>& chords, int ho
     return path;
 }
 
-TEST_CASE("The path through the keys is the best one, the lower key where two are equal") {
+TEST_CASE(
+    "The path through the keys is the best one; where two are equal it stays, or comes from the "
+    "lower") {
     for (std::uint32_t seed = 1; seed <= 300; ++seed) {
         CChance chance(seed);
         CHarmAnlsChords song = RandomSong(chance);
@@ -294,12 +303,16 @@ TEST_CASE("The path through the keys is the best one, the lower key where two ar
             if (chord.mClass == TKeyChordClass_HDim) chord.mClass = TKeyChordClass_Dim;
         }
         if (chords.empty()) continue;
-        const int home = static_cast<int>(chance.Below(24));
+        const auto kinds = KeyChordKindsOf(chords);
+        TSongTraits traits;
+        traits.mHome = static_cast<int>(chance.Below(24));
+        traits.mIsBlues = chance.OneIn(2);
         for (const double change : {4.0, 0.0, -3.0, 1.5, 50.0}) {
             CAPTURE(seed);
             CAPTURE(change);
             const CKeyOptions options{4.0, 0.3, change};
-            CHECK(LocalKeys(chords, home, options) == PlainPath(chords, home, options));
+            CHECK(LocalKeys(chords, kinds, traits, options) ==
+                  PlainPath(chords, kinds, traits, options));
         }
     }
 }

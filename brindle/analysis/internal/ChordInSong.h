@@ -19,9 +19,13 @@ struct TSongToName {
     std::span<const std::uint8_t> mKeys;
     std::span<const TSeventhSpelling> mSevenths;
     TSongTraits mTraits;
-    /// Those of the later chords are done. `mResolvesTo` is the chord that the rules lead one to,
-    /// and first the one that it stands under.
+    /// By places in the list. Those of the later chords are done. `mResolvesTo` is the chord that
+    /// the rules lead one to, and first the one that it stands under.
     std::span<CChordReading> mReadings;
+
+    [[nodiscard]] CChordReading& ReadingOf(std::size_t ix) const {
+        return mReadings[mChords[ix].mBegin];
+    }
 };
 
 /// A chord to be named, with what its rules ask for. Degrees are semitones above the tonic of its
@@ -63,7 +67,7 @@ public:
         return mSong.mChords[static_cast<std::size_t>(ix)];
     }
     [[nodiscard]] const CChordReading& ReadingAt(std::ptrdiff_t ix) const {
-        return mSong.mReadings[static_cast<std::size_t>(ix)];
+        return mSong.ReadingOf(static_cast<std::size_t>(ix));
     }
     [[nodiscard]] int KeyAt(std::ptrdiff_t ix) const {
         return mSong.mKeys[static_cast<std::size_t>(ix)];

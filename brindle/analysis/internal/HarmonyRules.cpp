@@ -28,10 +28,7 @@ THarmFunction FunctionOf(int degree, bool isMajor) {
     return kFunctionInMajor[static_cast<std::size_t>(degree)];
 }
 
-void ServeTonic(CChordReading& reading) {
-    reading.mServes = 0;
-    reading.mServedDegree = "I";
-}
+constexpr CServedDegree kServedTonic{.mSemitones = 0, .mNumber = 1};
 
 // Whether the degree that a chord is applied to is written in small letters: as the chord that
 // stands there is, and as the key has it if that is a seventh chord or open.
@@ -57,7 +54,7 @@ bool IsSixOrFlatSix(int degree) {
 }
 
 bool IsDeceptive(const CChordInSong& chord, const CChordReading& reading) {
-    if (reading.mRelation != TChordRelation_Dominant || reading.mServes != 0) return false;
+    if (reading.mRelation != TChordRelation_Dominant || !reading.mServes.IsTonic()) return false;
     if (!IsSixOrFlatSix(chord.DegreeBehind())) return false;
     const TKeyChordClass behind = chord.ChordAt(chord.Next()).mClass;
     return behind == TKeyChordClass_Triad || behind == TKeyChordClass_Maj7 ||
@@ -71,16 +68,17 @@ std::ptrdiff_t Resolution(const CChordInSong& chord, const TChordName& name) {
     if (name.mIsLed || target < 0 || target == chord.Next()) return target;
     if (chord.KeyAt(target) != chord.Key()) return kNoChord;
     const bool isDominant = reading.mRelation == TChordRelation_Dominant;
-    if (isDominant && (reading.mServes != 0 || chord.DegreeOf(target) != 0)) return kNoChord;
+    if (isDominant && (!reading.mServes.IsTonic() || chord.DegreeOf(target) != 0)) return kNoChord;
     return target;
 }
 
 }  // namespace
 
 void WriteOwnNumeral(const CChordInSong& chord, CChordReading& reading) {
-    ServeTonic(reading);
+    reading.mServes = kServedTonic;
     reading.mNumeral.clear();
-    AppendDegree(reading.mNumeral, chord.Degree(), IsSmallNumeral(chord.Class()), chord.Key());
+    AppendDegree(reading.mNumeral, NumeralDegreeOf(chord.Degree(), chord.Key()),
+                 IsSmallNumeral(chord.Class()));
     reading.mNumeral += NumeralSignOf(chord.Chord().mSemitones);
 }
 
@@ -89,7 +87,8 @@ void WriteServingNumeral(const CChordInSong& chord, std::string_view prefix,
     reading.mNumeral = prefix;
     reading.mNumeral += NumeralSignOf(chord.Chord().mSemitones);
     reading.mNumeral += '/';
-    reading.mNumeral += reading.mServedDegree;
+    const CServedDegree& served = reading.mServes;
+    AppendDegree(reading.mNumeral, {served.mNumber, served.mAccidental}, served.mIsMinor);
 }
 
 void Apply(const CChordInSong& chord, std::string_view prefix, int target, std::ptrdiff_t goal,
@@ -98,17 +97,17 @@ void Apply(const CChordInSong& chord, std::string_view prefix, int target, std::
     name.LeadTo(goal);
     reading.mFunction = THarmFunction_Dominant;
     const int degree = FoldIntoOctave(target);
-    ServeTonic(reading);
+    reading.mServes = kServedTonic;
     if (degree == 0 && prefix != "subV") {
         reading.mNumeral = prefix;
         reading.mNumeral += NumeralSignOf(chord.Chord().mSemitones);
         return;
     }
     if (degree != 0) {
-        reading.mServes = degree;
-        reading.mServedDegree.clear();
-        AppendDegree(reading.mServedDegree, degree, IsSmallTarget(chord, degree, goal),
-                     chord.Key());
+        const TNumeralDegree& written = NumeralDegreeOf(degree, chord.Key());
+        reading.mServes = {
+            static_cast<std::int8_t>(degree), static_cast<std::int8_t>(written.mNumber),
+            static_cast<std::int8_t>(written.mAccidental), IsSmallTarget(chord, degree, goal)};
     }
     WriteServingNumeral(chord, prefix, reading);
 }
@@ -119,7 +118,7 @@ void NameHarmonies(const TSongToName& song) {
     std::vector<bool> isLed(song.mChords.size());
     for (std::size_t i = song.mChords.size(); i-- > 0;) {
         const CChordInSong chord(song, i);
-        TChordName name{song.mReadings[i]};
+        TChordName name{song.ReadingOf(i)};
         name.Be(TChordRelation_None, FunctionOf(chord.Degree(), chord.IsInMajor()));
         WriteOwnNumeral(chord, name.mReading);
         const bool isNamed = NameChordAtRest(chord, name) || NamePredominant(chord, name) ||
@@ -130,7 +129,7 @@ void NameHarmonies(const TSongToName& song) {
     }
     for (std::size_t i = 0; i < song.mChords.size(); ++i) {
         const CChordInSong chord(song, i);
-        CChordReading& reading = song.mReadings[i];
+        CChordReading& reading = song.ReadingOf(i);
         reading.mDeceptive = IsDeceptive(chord, reading);
         reading.mResolvesTo = Resolution(chord, {reading, isLed[i]});
     }

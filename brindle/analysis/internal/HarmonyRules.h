@@ -23,11 +23,6 @@ struct TChordName {
         mReading.mResolvesTo = ix;
         mIsLed = true;
     }
-    /// Its degree becomes that which `other` serves.
-    void ServeAs(const CChordReading& other) {
-        mReading.mServes = other.mServes;
-        mReading.mServedDegree = other.mServedDegree;
-    }
 };
 
 /// Writes the numeral of the chord's own degree, serving the tonic.

@@ -32,7 +32,7 @@ void BePassing(const CChordInSong& chord, TChordRelation relation, TChordName& n
     if (!isRaised) return;
     std::string& numeral = name.mReading.mNumeral;
     numeral = '#';
-    AppendDegree(numeral, chord.Degree() - 1, true, chord.Key());
+    AppendDegree(numeral, NumeralDegreeOf(chord.Degree() - 1, chord.Key()), true);
     numeral += NumeralSignOf(chord.Chord().mSemitones);
 }
 

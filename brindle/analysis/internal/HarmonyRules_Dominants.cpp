@@ -73,10 +73,10 @@ bool NameFirstGo(const CChordInSong& chord, TChordName& name) {
     const std::ptrdiff_t later = SameDominantLater(chord);
     if (later < 0 || chord.KeyAt(later) != chord.Key()) return false;
     const CChordReading& reading = chord.ReadingAt(later);
-    if (reading.mServedDegree == "I") return false;
+    if (reading.mServes.IsTonic()) return false;
     const bool isSubstitute = reading.mRelation == TChordRelation_SubstituteDominant;
     name.Be(reading.mRelation, reading.mFunction);
-    name.ServeAs(reading);
+    name.mReading.mServes = reading.mServes;
     WriteServingNumeral(chord, isSubstitute ? "subV" : "V", name.mReading);
     name.LeadTo(reading.mResolvesTo);
     return true;

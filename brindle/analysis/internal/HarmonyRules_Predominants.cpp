@@ -39,7 +39,7 @@ bool NameWrittenSixth(const CChordInSong& chord, TChordName& name) {
     Apply(chord, SixthName(chord), target, chord.Next(), name);
     std::string& numeral = name.mReading.mNumeral;
     numeral = SixthName(chord);
-    if (target != 0) numeral += '/' + name.mReading.mServedDegree;
+    if (target != 0) numeral += '/' + name.mReading.mServes.Name();
     name.Be(TChordRelation_AugmentedSixth, THarmFunction_Subdominant);
     return true;
 }
@@ -77,8 +77,8 @@ bool NameSecondOfDominant(const CChordInSong& chord, const CChordReading& domina
     if (next != TKeyChordClass_Dom && next != TKeyChordClass_Open && !isHeldBack) return false;
     name.Be(TChordRelation_RelatedSecond, THarmFunction_Subdominant);
     const bool isAtHome = chord.IsDiatonic() && !chord.Is(TKeyChordClass_HDim);
-    name.ServeAs(dominant);
-    const bool isOwn = isSubstitute || dominant.mServedDegree == "I" || isAtHome;
+    name.mReading.mServes = dominant.mServes;
+    const bool isOwn = isSubstitute || dominant.mServes.IsTonic() || isAtHome;
     if (!isOwn) WriteServingNumeral(chord, "ii", name.mReading);
     name.LeadTo(chord.Next());
     return true;
@@ -107,7 +107,7 @@ bool NameRelatedSecond(const CChordInSong& chord, TChordName& name) {
     }
     if (up == kSemitoneDown && isSubstitute && chord.Degree() == 2) {
         name.Be(TChordRelation_RelatedSecond, THarmFunction_Subdominant);
-        name.ServeAs(next);
+        name.mReading.mServes = next.mServes;
         name.LeadTo(chord.Next());
         return true;
     }

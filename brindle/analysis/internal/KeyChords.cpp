@@ -21,8 +21,8 @@ TKeyChord KeyChordOf(const CHarmAnlsChords& chords, std::size_t ix) {
     const CHarmAnlsChord& chord = chords[ix];
     const CKeyEnh& bass = chord.HasBassNote() ? chord.mBassKeyEnh : chord.mRootKeyEnh;
     return {KeyChordClassOf(chord.mSemitones),
-            FoldIntoOctave(chord.mRootKeyEnh.mKeyNr),
-            FoldIntoOctave(bass.mKeyNr),
+            static_cast<std::int8_t>(FoldIntoOctave(chord.mRootKeyEnh.mKeyNr)),
+            static_cast<std::int8_t>(FoldIntoOctave(bass.mKeyNr)),
             chord.HasBassNote(),
             chord.mSemitones,
             BeatsOf(chords, ix),
@@ -38,6 +38,7 @@ bool IsSameChord(const TKeyChord& a, const TKeyChord& b) {
 
 std::vector<TKeyChord> KeyChordsOf(const CHarmAnlsChords& chords) {
     std::vector<TKeyChord> heard;
+    heard.reserve(chords.size());
     double total = 0.0;
     for (std::size_t ix = 0; ix < chords.size(); ++ix) {
         if (chords[ix].IsUndef()) {

@@ -42,8 +42,8 @@ inline constexpr std::size_t kKeyChordClassCount = 8;
 /// A chord of a song as long as it sounds, whatever the number of times that it is written.
 struct TKeyChord {
     TKeyChordClass mClass;
-    int mRoot;  ///< pitch class, 0 to 11
-    int mBass;  ///< pitch class, that of the root without a bass
+    std::int8_t mRoot;  ///< pitch class, 0 to 11
+    std::int8_t mBass;  ///< pitch class, that of the root without a bass
     bool mHasBass;
     CSemitones mSemitones;
     double mBeats;

@@ -2,7 +2,6 @@
 #include "brindle/analysis/internal/NumeralText.h"
 
 #include "brindle/analysis/internal/KeyNumbers.h"
-#include "brindle/analysis/internal/NumeralTables.h"
 
 namespace brindle {
 namespace {
@@ -46,11 +45,14 @@ std::string_view NumeralSignOf(CSemitones semitones) {
     return "";
 }
 
-void AppendDegree(std::string& text, int degree, bool isSmall, int key) {
+const TNumeralDegree& NumeralDegreeOf(int degree, int key) {
     const auto& degrees = IsMinorKey(key) ? kDegreesInMinor : kDegreesInMajor;
-    const TNumeralDegree& row = degrees[static_cast<std::size_t>(degree)];
-    if (row.mAccidental != 0) text += row.mAccidental > 0 ? '#' : 'b';
-    for (const char c : kRomanNumbers[static_cast<std::size_t>(row.mNumber - 1)]) {
+    return degrees[static_cast<std::size_t>(degree)];
+}
+
+void AppendDegree(std::string& text, const TNumeralDegree& degree, bool isSmall) {
+    if (degree.mAccidental != 0) text += degree.mAccidental > 0 ? '#' : 'b';
+    for (const char c : kRomanNumbers[static_cast<std::size_t>(degree.mNumber - 1)]) {
         text += isSmall ? static_cast<char>(c - 'A' + 'a') : c;
     }
 }

@@ -2,6 +2,7 @@
 #pragma once
 
 #include "brindle/analysis/internal/KeyChords.h"
+#include "brindle/analysis/internal/NumeralTables.h"
 
 #include <string>
 #include <string_view>
@@ -18,7 +19,10 @@ namespace brindle {
 /// kNumeralSigns.
 [[nodiscard]] std::string_view NumeralSignOf(CSemitones semitones);
 
-/// Appends the degree so many semitones above the tonic of a key by its number: "bVI", "ii".
-void AppendDegree(std::string& text, int degree, bool isSmall, int key);
+/// The degree so many semitones above the tonic of a key by its number.
+[[nodiscard]] const TNumeralDegree& NumeralDegreeOf(int degree, int key);
+
+/// Appends a degree of 1 to 7: "bVI", "ii".
+void AppendDegree(std::string& text, const TNumeralDegree& degree, bool isSmall);
 
 }  // namespace brindle
