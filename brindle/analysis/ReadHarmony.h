@@ -59,13 +59,13 @@ enum TSeventhSpelling : std::uint8_t {
 
 /// How ReadHarmony reads. All that is left out is found from the chords.
 struct CReadingOptions {
-    CKeyOptions mKeys;
+    CKeyOptions mKeys = {};
     /// The key of the song if it is known; undefined to find it.
-    CSignKeyLite mStatedKey;
+    CSignKeyLite mStatedKey = {};
     /// One a chord of the list, or fewer. An augmented sixth makes a German or Italian sixth chord
     /// of a seventh chord whose root falls a semitone, a minor seventh keeps it from being one. A
     /// bass that is the seventh tells this by its own spelling, if there is none here.
-    std::span<const TSeventhSpelling> mSevenths;
+    std::span<const TSeventhSpelling> mSevenths = {};
 };
 
 /// The degree of a key that a chord serves.

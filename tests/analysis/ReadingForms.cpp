@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "ReadingForms.h"
 
+#include "brindle/chords/ReadChordText.h"
 #include "brindle/theory/CChordNamePrefs.h"
 
 #include <sstream>
@@ -12,7 +13,7 @@ namespace {
 std::vector<CChordLite> ChordsOf(const std::string& bar) {
     std::vector<CChordLite> chords;
     std::istringstream words(bar);
-    for (std::string word; words >> word;) chords.emplace_back(word, ChordNamePrefsNonUTF8);
+    for (std::string word; words >> word;) chords.push_back(ReadChordText(word).mChord);
     return chords;
 }
 
@@ -35,8 +36,10 @@ CHarmAnlsChords BarsOf(std::string_view text) {
 
 std::string ShortKey(const CSignKeyLite& key) {
     if (key.IsUndef()) return {};
-    std::string name = key.mRootKeyEnh.NameShort(ChordNamePrefsNonUTF8);
-    if (key.mSignKeyType == TSignKeyType_Minor) name[0] = static_cast<char>(name[0] - 'A' + 'a');
+    std::string name = key.NameShort(ChordNamePrefsNonUTF8);
+    if (key.mSignKeyType != TSignKeyType_Minor) return name;
+    name.pop_back();
+    name[0] = static_cast<char>(name[0] - 'A' + 'a');
     return name;
 }
 

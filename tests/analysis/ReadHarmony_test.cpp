@@ -1,0 +1,247 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/analysis/ReadHarmony.h"
+#include "RandomChordTexts.h"
+#include "ReadingForms.h"
+
+#include "brindle/theory/KeyIntervals.h"
+
+#include <doctest/doctest.h>
+
+#include <limits>
+#include <vector>
+
+namespace brindle::test {
+namespace {
+
+constexpr auto kKinds = std::to_array<std::uint64_t>({
+    0x091,  // major
+    0x089,  // minor
+    0x491,  // dominant seventh
+    0x891,  // major seventh
+    0x489,  // minor seventh
+    0x449,  // half-diminished
+    0x249,  // diminished seventh
+    0x049,  // diminished
+    0x111,  // augmented
+    0x0A1,  // sus4
+});
+
+// Lengths of their own, so that no two keys have equal points by chance.
+CHarmAnlsChords RandomSong(CChance& chance, std::size_t count) {
+    CHarmAnlsChords song;
+    double position = 0.0;
+    for (std::size_t i = 0; i < count; ++i) {
+        CChordLite chord;
+        if (!chance.OneIn(12)) {
+            chord.mRootKeyEnh = {static_cast<int>(chance.Below(12)), TEnh_Undef};
+            chord.mSemitones = CSemitones(chance.Of<std::uint64_t>(kKinds));
+            if (chance.OneIn(5)) {
+                chord.mBassKeyEnh = {static_cast<int>(chance.Below(12)), TEnh_Undef};
+            }
+        }
+        song.emplace_back(chord, position);
+        position += 0.5 + static_cast<double>(chance.Below(100000)) / 12347.0;
+    }
+    song.emplace_back(CChordLite_Undef, position);
+    return song;
+}
+
+CKeyEnh Moved(const CKeyEnh& keyEnh, int up) {
+    return keyEnh.IsUndef() ? keyEnh : CKeyEnh{FoldIntoOctave(keyEnh.mKeyNr + up), keyEnh.mEnh};
+}
+
+CChordReading Moved(CChordReading reading, int up) {
+    if (!reading.mKey.IsUndef()) {
+        reading.mKey.mRootKeyEnh = {FoldIntoOctave(reading.mKey.mRootKeyEnh.mKeyNr + up),
+                                    TEnh_Undef};
+    }
+    return reading;
+}
+
+TEST_CASE("A song in another key is read the same there") {
+    for (std::uint32_t seed = 1; seed <= 60; ++seed) {
+        CChance chance(seed);
+        const CHarmAnlsChords song = RandomSong(chance, 1 + chance.Below(60));
+        const CSongReading reading = ReadHarmony(song);
+        for (int up = 1; up < 12; ++up) {
+            CAPTURE(seed);
+            CAPTURE(up);
+            CHarmAnlsChords other = song;
+            for (CHarmAnlsChordWithPos& chord : other) {
+                chord.mRootKeyEnh = Moved(chord.mRootKeyEnh, up);
+                chord.mBassKeyEnh = Moved(chord.mBassKeyEnh, up);
+            }
+            const CSongReading otherReading = ReadHarmony(other);
+            REQUIRE(otherReading.mChords.size() == song.size());
+            for (std::size_t i = 0; i < song.size(); ++i) {
+                CHECK(Moved(otherReading.mChords[i], 0) == Moved(reading.mChords[i], up));
+            }
+        }
+    }
+}
+
+TEST_CASE("Each chord points to a later one that exists, no two arcs cross, and regions hold it") {
+    for (std::uint32_t seed = 1; seed <= 200; ++seed) {
+        CAPTURE(seed);
+        CChance chance(seed);
+        const CHarmAnlsChords song = RandomSong(chance, chance.Below(80));
+        const CSongReading reading = ReadHarmony(song);
+        REQUIRE(reading.mChords.size() == song.size());
+        std::vector<std::ptrdiff_t> arcs;
+        for (std::size_t i = 0; i < song.size(); ++i) {
+            const auto ix = static_cast<std::ptrdiff_t>(i);
+            const CChordReading& chord = reading.mChords[i];
+            CHECK(chord.mKey.IsUndef() == song[i].IsUndef());
+            CHECK(chord.mNumeral.empty() == song[i].IsUndef());
+            CHECK((chord.mRelation == TChordRelation_Undef) == song[i].IsUndef());
+            for (const std::ptrdiff_t to : {chord.mResolvesTo, chord.mUnder}) {
+                if (to < 0) continue;
+                REQUIRE(to < static_cast<std::ptrdiff_t>(song.size()));
+                CHECK_FALSE(song[static_cast<std::size_t>(to)].IsUndef());
+            }
+            while (!arcs.empty() && arcs.back() <= ix) arcs.pop_back();
+            const bool isAgain = i > 0 && chord == reading.mChords[i - 1];
+            if (chord.mUnder < 0 || isAgain) continue;
+            CHECK(chord.mUnder > ix);
+            CHECK((arcs.empty() || chord.mUnder <= arcs.back()));
+            arcs.push_back(chord.mUnder);
+        }
+        for (const CKeyRegion& region : reading.mRegions) {
+            for (std::size_t i = region.mBegin; i < region.mEnd; ++i) {
+                if (!song[i].IsUndef()) CHECK(reading.mChords[i].mKey == region.mKey);
+            }
+        }
+    }
+}
+
+TEST_CASE("What is written again or as no chord keeps the places in the list") {
+    const CSongReading plain = ReadHarmony(BarsOf("Dm7 | G7 | C"));
+    const CSongReading again = ReadHarmony(BarsOf("NC | Dm7 Dm7 | G7 NC | NC | C C"));
+    CHECK(ReadingText(plain) == "C: ii7~related second>1 V7~dominant>2 I~tonic");
+    CHECK(ReadingText(again) ==
+          "C: ii7~related second>3 ii7~related second>3 V7~dominant>6 I~tonic I~tonic");
+    CHECK(again.mChords[0] == CChordReading{});
+    CHECK(again.mChords[4] == CChordReading{});
+    REQUIRE(again.mRegions.size() == 1);
+    CHECK(again.mRegions[0].mBegin == 1);
+    CHECK(again.mRegions[0].mEnd == 8);
+}
+
+TEST_CASE("A song twice in a row is read as once, apart from the joint") {
+    const CSongReading once = ReadHarmony(BarsOf("C A7 | Dm7 G7 | C F | C"));
+    const CSongReading twice =
+        ReadHarmony(BarsOf("C A7 | Dm7 G7 | C F | C | G7 | C A7 | Dm7 G7 | C F | C"));
+    for (std::size_t i = 0; i < 6; ++i) {
+        CAPTURE(i);
+        CHECK(twice.mChords[i].mNumeral == once.mChords[i].mNumeral);
+        CHECK(twice.mChords[i + 8].mNumeral == once.mChords[i].mNumeral);
+        CHECK(twice.mChords[i + 8].mRelation == once.mChords[i].mRelation);
+    }
+}
+
+TEST_CASE("A stated key is home, and its share tells whether the chords show it") {
+    const CHarmAnlsChords chords = BarsOf("Am | F | C | G");
+    const CSignKeyLite aMinor({9, TEnh_n}, TSignKeyType_Minor);
+    CHECK(ShortKey(ReadHarmony(chords).mKey) == "C");
+    const CSongReading stated = ReadHarmony(chords, {.mStatedKey = aMinor});
+    CHECK(stated.mKey == aMinor);
+    CHECK(ReadingText(stated) == "a: i~tonic VI~none>2 III~none>3 VII~none");
+    const CSignKeyLite fSharp({6, TEnh_s}, TSignKeyType_Major);
+    CHECK(ReadHarmony(chords, {.mStatedKey = fSharp}).mConfidence < 0.01);
+    // A vamp of ii and V is one of i and IV, unless its key is stated.
+    const CHarmAnlsChords vamp = BarsOf("Dm7 | G7 | Dm7 | G7");
+    const CSignKeyLite cMajor({0, TEnh_n}, TSignKeyType_Major);
+    CHECK(ShortKey(ReadHarmony(vamp).mKey) == "d");
+    CHECK(ReadHarmony(vamp, {.mStatedKey = cMajor}).mChords[1].mNumeral == "V7");
+}
+
+TEST_CASE("The letters of a seventh tell an augmented sixth") {
+    struct TCase {
+        CKeyEnh mRoot;
+        CKeyEnh mSeventh;
+        TSeventhSpelling mSpelling;
+    };
+    constexpr auto cases = std::to_array<TCase>({
+        {{0, TEnh_n}, {10, TEnh_b}, TSeventhSpelling_MinorSeventh},    // C Bb
+        {{0, TEnh_n}, {10, TEnh_s}, TSeventhSpelling_AugmentedSixth},  // C A#
+        {{8, TEnh_b}, {6, TEnh_b}, TSeventhSpelling_MinorSeventh},     // Ab Gb
+        {{8, TEnh_b}, {6, TEnh_s}, TSeventhSpelling_AugmentedSixth},   // Ab F#
+        {{8, TEnh_s}, {6, TEnh_s}, TSeventhSpelling_MinorSeventh},     // G# F#
+        {{5, TEnh_n}, {3, TEnh_s}, TSeventhSpelling_AugmentedSixth},   // F D#
+        {{11, TEnh_b}, {9, TEnh_n}, TSeventhSpelling_Undef},           // Cb is 11: no ten semitones
+        {{0, TEnh_n}, {9, TEnh_n}, TSeventhSpelling_Undef},            // C A
+        {{0, TEnh_n}, {10, TEnh_Undef}, TSeventhSpelling_Undef},
+    });
+    for (const TCase& row : cases) {
+        CAPTURE(row.mRoot.mKeyNr);
+        CAPTURE(row.mSeventh.mKeyNr);
+        CHECK(SeventhSpellingOf(row.mRoot, row.mSeventh) == row.mSpelling);
+    }
+}
+
+TEST_CASE("A seventh chord written with an augmented sixth is a German sixth, also in jazz") {
+    using TSevenths = std::vector<TSeventhSpelling>;
+    constexpr TSeventhSpelling none = TSeventhSpelling_Undef;
+    constexpr TSeventhSpelling sixth = TSeventhSpelling_AugmentedSixth;
+    constexpr TSeventhSpelling seventh = TSeventhSpelling_MinorSeventh;
+    const auto numeral = [](std::string_view text, const TSevenths& sevenths, std::size_t ix) {
+        const CSongReading reading = ReadHarmony(BarsOf(text), {.mSevenths = sevenths});
+        return reading.mChords[ix].mNumeral + " " +
+               std::string(NameOf(reading.mChords[ix].mRelation));
+    };
+    // C7 with A# before B, in E.
+    CHECK(numeral("Em7 | Am7 | C7 | B7 | Em7", {}, 2) == "subV7/V substitute dominant");
+    CHECK(numeral("Em7 | Am7 | C7 | B7 | Em7", {none, none, sixth}, 2) == "Ger6 augmented sixth");
+    CHECK(numeral("Cm | Fm | Ab7 | G | Cm", {}, 2) == "Ger6 augmented sixth");
+    CHECK(numeral("Cm | Fm | Ab7 | G | Cm", {none, none, seventh}, 2) ==
+          "subV7/V substitute dominant");
+    CHECK(numeral("C | F | Eb7 | D7 | G7 | C", {none, none, sixth}, 2) == "Ger6/V augmented sixth");
+    // The bass has letters of its own.
+    CHECK(numeral("Em7 | Am7 | C7/A# | B7 | Em7", {}, 2) == "Ger6 augmented sixth");
+    CHECK(numeral("Em7 | Am7 | C7/Bb | B7 | Em7", {}, 2) == "subV7/V substitute dominant");
+    // It does not lead down a semitone here.
+    CHECK(numeral("C | C7 | F | G7 | C", {none, sixth}, 1) == "V7/IV dominant");
+}
+
+TEST_CASE("No chords, one chord and very many are read") {
+    CHECK(ReadHarmony({}).mKey.IsUndef());
+    CHECK(ReadHarmony({}).mChords.empty());
+    CHECK(ReadHarmony(BarsOf("NC | NC")).mChords.size() == 3);
+    CHECK(ReadHarmony(BarsOf("NC | NC")).mConfidence == kPosUndef);
+    CHECK(ReadingText(ReadHarmony(BarsOf("Ebm"))) == "eb: i~tonic");
+    CChance chance(1);
+    const CHarmAnlsChords song = RandomSong(chance, 100000);
+    const CSongReading reading = ReadHarmony(song);
+    CHECK(reading.mChords.size() == song.size());
+    CHECK(reading.mRegions.back().mEnd + 1 == song.size());
+}
+
+TEST_CASE("Broken positions, chords, spellings and options are survived") {
+    constexpr double nan = std::numeric_limits<double>::quiet_NaN();
+    constexpr double infinity = std::numeric_limits<double>::infinity();
+    const CChordLite c{CKeyEnh_C, CKeyEnh_Undef, CSemitones{0, 4, 7}};
+    const CChordLite g7{CKeyEnh_G, CKeyEnh_Undef, CSemitones{0, 4, 7, 10}};
+    const CChordLite odd{{-1234567890, static_cast<TEnh>(99)},
+                         {2147483647, static_cast<TEnh>(-99)},
+                         CSemitones(~std::uint64_t{0})};
+    const std::vector<TSeventhSpelling> sevenths(99, static_cast<TSeventhSpelling>(77));
+    for (const double first : {nan, infinity, -infinity, -1.0, 1e300, kPosUndef, 1e-320}) {
+        for (const double second : {nan, infinity, -infinity, -1.0, 1e300, kPosUndef}) {
+            CHarmAnlsChords chords;
+            for (const CChordLite& chord : {c, g7}) chords.emplace_back(chord, first);
+            for (const CChordLite& chord : {odd, c}) chords.emplace_back(chord, second);
+            const CSongReading reading =
+                ReadHarmony(chords, {.mKeys = {first, second, first},
+                                     .mStatedKey = {{-77, TEnh_sss}, static_cast<TSignKeyType>(9)},
+                                     .mSevenths = sevenths});
+            for (const CChordReading& chord : reading.mChords) {
+                CHECK_FALSE(chord.mNumeral.empty());
+                CHECK_FALSE(NameOf(chord.mRelation).empty());
+                CHECK_FALSE(NameOf(chord.mFunction).empty());
+            }
+        }
+    }
+}
+
+}  // namespace
+}  // namespace brindle::test
