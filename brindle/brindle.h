@@ -31,6 +31,7 @@
 #include "brindle/analysis/Positions.h"
 #include "brindle/analysis/ProgressionFinder.h"
 #include "brindle/analysis/ReadChordSheet.h"
+#include "brindle/analysis/ReadHarmony.h"
 #include "brindle/analysis/RomanNumeral.h"
 #include "brindle/analysis/RouteRanges.h"
 #include "brindle/analysis/ScaleLite.h"

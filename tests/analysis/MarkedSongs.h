@@ -26,14 +26,9 @@ struct TMarkedSong {
 inline constexpr auto kMarkedSongs = std::to_array<TMarkedSong>({
     // Blues
     {"Twelve-bar blues", "C Major",
-     "[C Major] C7 | F7 | C7 | C7 | F7 | F7 | C7 | C7 | G7 | F7 | C7 | G7 .",
-     {},
-     "[F Major] C7 | F7 | C7 | C7 | F7 | F7 | C7 | C7 | G7 | F7 | C7 | G7 ."},
+     "[C Major] C7 | F7 | C7 | C7 | F7 | F7 | C7 | C7 | G7 | F7 | C7 | G7 ."},
     {"Blues with a turnaround", "F Major",
-     "[F Major] F7 | Bb7 | F7 | Cm7 F7 | Bb7 | Bdim7 | F7 | D7 | Gm7 | C7 | F7 D7 | Gm7 C7",
-     {},
-     "[Bb Major] F7 | Bb7 | F7 | Cm7 F7 | Bb7 | Bdim7 | F7 | [F Major] D7 | Gm7 | C7 | F7 D7 "
-     "| Gm7 C7"},
+     "[F Major] F7 | Bb7 | F7 | Cm7 F7 | Bb7 | Bdim7 | F7 | D7 | Gm7 | C7 | F7 D7 | Gm7 C7"},
     {"Minor blues", "A Minor",
      "[A Minor] Am7 | Dm7 | Am7 | Am7 | Dm7 | Dm7 | Am7 | Am7 | F7 | E7 | Am7 | E7 ."},
 
@@ -69,7 +64,9 @@ inline constexpr auto kMarkedSongs = std::to_array<TMarkedSong>({
     {"Silent Night", "C Major",
      "[C Major] C | C | G7 | C | F | C | F | C | G7 | C | C G7 | C ."},
     {"Old Joe Clark", "A Major",
-     "[A Major] A | A | A | G | A | A | A G | A | A | A | A | G | A | A | A G | A ."},
+     "[A Major] A | A | A | G | A | A | A G | A | A | A | A | G | A | A | A G | A .",
+     {},
+     "[D Major] A | A | A | G | A | A | A G | A | A | A | A | G | A | A | A G | A ."},
     {"The Star-Spangled Banner, first strain", "Bb Major",
      "[Bb Major] Bb F | Gm D7 | Gm C7 | F | Bb F7 | Bb Eb | Bb F7 | Bb ."},
 
@@ -111,10 +108,7 @@ inline constexpr auto kMarkedSongs = std::to_array<TMarkedSong>({
      "| Bbmaj7 | [D Major] Em7 | A7 | Dmaj7 | Dmaj7 ."},
     {"Cycle of major thirds", "B Major",
      "[B Major] Bmaj7 [G Major] D7 | Gmaj7 [Eb Major] Bb7 | Ebmaj7 | [G Major] Am7 D7 "
-     "| Gmaj7 [Eb Major] Bb7 | Ebmaj7 [B Major] F#7 | Bmaj7 .",
-     {},
-     "[G Major] Bmaj7 D7 | Gmaj7 Bb7 | Ebmaj7 | Am7 D7 | Gmaj7 [Eb Major] Bb7 | Ebmaj7 "
-     "[B Major] F#7 | Bmaj7 ."},
+     "| Gmaj7 [Eb Major] Bb7 | Ebmaj7 [B Major] F#7 | Bmaj7 ."},
     {"Last verse a semitone up", "C Major",
      "[C Major] C Am | F G | C Am | F G | C | [Db Major] Ab7 | Db Bbm | Gb Ab | Db Bbm | Gb Ab "
      "| Db ."},
