@@ -147,12 +147,6 @@
 #include "brindle/platform/XmlError.h"
 #include "brindle/platform/XmlStreamParser.h"
 #include "brindle/platform/ZipContainer.h"
-<<<<<<< HEAD
-#include "brindle/song/CSong.h"
-#include "brindle/song/HarmonySymbols.h"
-#include "brindle/song/ReadSong.h"
-#include "brindle/song/TSongFormat.h"
-=======
 #include "brindle/present/AnalysisJson.h"
 #include "brindle/present/AnalysisSvg.h"
 #include "brindle/present/AnalysisText.h"
@@ -181,7 +175,10 @@
 #include "brindle/present/ShownSong.h"
 #include "brindle/present/ShownText.h"
 #include "brindle/present/SongShapes.h"
->>>>>>> 6c33f7e (Turn results into text, JSON, pictures and MIDI in the library)
+#include "brindle/song/CSong.h"
+#include "brindle/song/HarmonySymbols.h"
+#include "brindle/song/ReadSong.h"
+#include "brindle/song/TSongFormat.h"
 #include "brindle/theory/CChordNamePrefs.h"
 #include "brindle/theory/CHarmCenterLite.h"
 #include "brindle/theory/CIntvlSet.h"
