@@ -1,213 +1,106 @@
 // SPDX-License-Identifier: MIT
-#include "cli/CommandLine.h"
+#include "cli/Name.h"
+#include "cli/Input.h"
 #include "cli/KeyText.h"
-#include "cli/LineByLine.h"
-#include "cli/NamingOptions.h"
-#include "cli/NotesText.h"
 
-#include "brindle/chords/CChordHeavy.h"
-#include "brindle/present/CTable.h"
-#include "brindle/present/ShownNames.h"
-#include "brindle/theory/KeyIntervals.h"
-#include "brindle/theory/KeyNames.h"
+#include "brindle/chords/ReadChordText.h"
 
-#include <fmt/format.h>
-
-#include <algorithm>
 #include <memory>
+#include <optional>
 
 namespace brindle::cli {
 namespace {
 
 constexpr TCommandHelp kHelp{
     "name",
-    "Find the root of some notes and name their chord",
+    "Name the chord of some notes",
     "  brindle name E2 G3 C4\n"
     "  brindle name 40 55 60 --json\n"
-    "  brindle name C4 E4 G4 A4 --all-roots\n"
+    "  brindle name E3 G3 A3 C4 --candidates 3 --key \"A minor\"\n"
+    "  brindle name E3 G3 A3 C4 --before Dm7 --after G7\n"
+    "  printf 'G2 F3 B3 D4\\nE3 G3 A3 C4\\nG2 F3 B3 D4\\n' | brindle name - --progression\n"
     "  brindle name F#3 A3 C#4 --german\n"
     "  cat chords.txt | brindle name - --method score\n"
     "\n"
     "A note is a key and its octave, or a MIDI number; a key without octave is the next one\n"
-    "above the note before it.\n",
+    "above the note before it. Notes with names keep them, numbers are spelled by the chord\n"
+    "and the key.\n",
 };
 
-struct TNameOptions {
-    std::vector<std::string> mWords;
-    std::string mRoot;
-    std::string mMethod = "net";
-    bool mAllRoots = false;
-    CNamingOptions mNaming;
-    CFormatOptions mFormat;
-};
+constexpr int kMostCandidates = 12;
 
-// The name that the notes have with one root.
-struct TNamed {
-    CKeyEnh mRoot;
-    CKeyEnh mBass;  // where it is not the root
-    std::string mName;
-    std::vector<std::string> mOptions;
-    TBasicChord mBasicChord = TBasicChord::None;
-    bool mIsSounding = false;
-};
+TBassUse BassUseOf(const std::string& word) {
+    if (word == "only") return TBassUse::Only;
+    return word == "none" ? TBassUse::None : TBassUse::Usual;
+}
 
-// All names of some notes, the best one first.
-struct TNamedNotes {
-    CMySet<CNote> mNotes;
-    std::vector<TNamed> mNames;
-};
+/// Reads the root behind --root. False when it is none; then the error has been printed.
+bool ReadRoot(TNameOptions& options) {
+    if (options.mRoot.empty()) return true;
+    const std::string typed = FoldAccidentals(options.mRoot);
+    int consumed = 0;
+    options.mRootKey.SetFromString(typed, &consumed, options.mNaming.Prefs());
+    const auto column = static_cast<std::size_t>(consumed);
+    if (!options.mRootKey.IsUndef() && column == typed.size()) return true;
+    static_cast<void>(
+        FailAt(TStatus::BadUsage, "--root: a root is a key, as in Bb", typed, column));
+    return false;
+}
 
-// Octaves do not matter for a name, but the lowest octave of the keyboard is that of the root and
-// there must be room for one note above the others.
-CMySet<CNote> AwayFromTheEnds(const CMySet<CNote>& notes) {
-    constexpr std::int64_t lowest = 12;
-    constexpr std::int64_t highest = 127;
-    const bool isLow = !notes.empty() && notes.begin()->mNoteNr < lowest;
-    const bool isHigh = !notes.empty() && notes.begin()->mNoteNr + 12 > highest;
-    CMySet<CNote> moved;
-    for (CNote note : notes) {
-        if (isHigh) note.mNoteNr -= 12;
-        if (isLow && note.mNoteNr + 12 <= highest) note.mNoteNr += 12;
-        moved.insert(note);
+/// The root of a neighbouring chord. Nothing when it is no chord; then the error has been printed.
+std::optional<int> ReadNeighbour(const std::string& option, const std::string& typed,
+                                 const TNameOptions& options) {
+    if (typed.empty()) return kKeyNrUndef;
+    const CChordTextReading read =
+        ReadChordText(typed, {.mBIsBFlat = options.mNaming.Prefs().mBForBFlat});
+    if (read.mKind == TChordText_Chord) return read.mChord.mRootKeyEnh.mKeyNr;
+    const std::string fault = read.mFault.empty() ? "this is no chord symbol" : read.mFault;
+    static_cast<void>(FailAtCharacter(TStatus::BadUsage, option + ": " + fault, typed,
+                                      static_cast<std::size_t>(read.mFaultPos)));
+    return std::nullopt;
+}
+
+/// Reads what was told about the notes besides themselves. False after an error.
+bool ReadContext(TNameOptions& options) {
+    if (!options.mKey.empty()) {
+        const auto key = ReadKeyOption(options.mKey);
+        if (!key) return false;
+        options.mContext.mKey = *key;
     }
-    return moved;
-}
-
-// Names the chord as it sounds, its inversions too. A third or a fifth in the bass belongs to the
-// triad, so that E G C is C/E; any other bass is foreign to it, as in C/Bb.
-CChordHeavy ChordOn(const CKeyEnh& root, const CMySet<CNote>& notes) {
-    CChordHeavy chord(CNote(root, -1), notes, 12);
-    if (notes.empty()) return chord;
-    const CNote bass = *notes.begin();
-    const int intvl = AbsKeyIntvlFromTo(root.mKeyNr, bass.KeyNr());
-    const bool isOfTriad = intvl == 3 || intvl == 4 || (intvl >= 6 && intvl <= 8);
-    if (isOfTriad) chord.AddNote({bass.mNoteNr + 12, bass.mEnh});
-    return chord;
-}
-
-TNamed NameOn(const CKeyEnh& root, const CMySet<CNote>& notes, const CChordNamePrefs& prefs) {
-    const CChordHeavy chord = ChordOn(root, notes);
-    TNamed named;
-    named.mRoot = root;
-    named.mName = chord.NameWithSlash(prefs);  // which spells the bass
-    if (chord.IsSlashChord()) named.mBass = chord.BassKeyEnh();
-    named.mName = chord.Name(prefs);
-    named.mOptions = chord.OptionsStringVector(prefs);
-    named.mBasicChord = chord.BasicChord();
-    named.mIsSounding = chord.HasKeyNr(root.mKeyNr);
-    return named;
-}
-
-CKeyEnh LikeliestRoot(const CMySet<CNote>& notes, const std::string& method) {
-    CChordHeavy chord;
-    chord.SetFromNoteSet(notes);
-    chord.SetRootNoteAndEnh_ToLikeliestRegardingNoteSet(
-        method == "net" ? TSingleChordAnalysisAlgo_NeuronalNet : TSingleChordAnalysisAlgo_Score);
-    return chord.RootKeyEnh();
-}
-
-// The key in the spelling with which the chord on it needs the fewest signs.
-CKeyEnh SpelledRoot(int keyNr, const CMySet<CNote>& notes) {
-    CChordHeavy chord;
-    chord.SetFromNoteSet(notes);
-    CNote root(keyNr, TEnh_n);
-    static_cast<void>(chord.NameWithLeastSignsForThisRootNote(root, NamePrefs()));
-    return root.KeyEnh();
-}
-
-TNamedNotes NamesOf(const CMySet<CNote>& typed, const CKeyEnh& givenRoot,
-                    const TNameOptions& options) {
-    const CChordNamePrefs prefs = options.mNaming.Prefs();
-    const CMySet<CNote> notes = AwayFromTheEnds(typed);
-    const CKeyEnh root = givenRoot.IsUndef() ? LikeliestRoot(notes, options.mMethod) : givenRoot;
-    TNamedNotes named{typed, {NameOn(root, notes, prefs)}};
-    if (!options.mAllRoots || root.IsUndef()) return named;
-    for (int intvl = 1; intvl < 12; ++intvl) {
-        const CKeyEnh other = SpelledRoot(FoldIntoOctave(root.mKeyNr + intvl), notes);
-        named.mNames.push_back(NameOn(other, notes, prefs));
+    const auto before = ReadNeighbour("--before", options.mBefore, options);
+    const auto after = ReadNeighbour("--after", options.mAfter, options);
+    if (!before || !after) return false;
+    options.mContext.mPreviousRoot = *before;
+    options.mContext.mNextRoot = *after;
+    options.mContext.mBass = BassUseOf(options.mBass);
+    if (options.mProgression && options.mMethod != "notes") {
+        static_cast<void>(Fail(TStatus::BadUsage, "--progression goes with --method notes"));
+        return false;
     }
-    // Roots that sound come before those that are left out.
-    std::stable_sort(
-        named.mNames.begin() + 1, named.mNames.end(),
-        [](const TNamed& a, const TNamed& b) { return a.mIsSounding && !b.mIsSounding; });
-    return named;
+    if (options.mAllRoots) options.mCandidates = kMostCandidates;
+    return ReadRoot(options);
 }
 
-Json NameToJson(const TNamed& named) {
-    return {{"Name", named.mName},
-            {"RootKeyEnh", KeyEnhToJson(named.mRoot)},
-            {"BassKeyEnh", KeyEnhToJson(named.mBass)},
-            {"BasicChord", BasicChordName(named.mBasicChord)},
-            {"Options", named.mOptions},
-            {"RootSounds", named.mIsSounding}};
-}
-
-Json NotesToJson(const CMySet<CNote>& notes, const CChordNamePrefs& prefs) {
-    Json list = Json::array();
-    for (const CNote& note : notes) {
-        list.push_back(
-            {{"Name", note.KeyName(prefs) + note.OctName(prefs)}, {"NoteNr", note.mNoteNr}});
-    }
-    return list;
-}
-
-std::string NamesJson(const std::vector<TNamedNotes>& chords, const TNameOptions& options) {
-    CChordNamePrefs notePrefs = NamePrefs();
-    notePrefs.mOctaveNaming = options.mNaming.Prefs().mOctaveNaming;
-    Json list = Json::array();
-    for (const TNamedNotes& chord : chords) {
-        Json json{{"Notes", NotesToJson(chord.mNotes, notePrefs)}};
-        json.update(NameToJson(chord.mNames.front()));
-        if (options.mAllRoots) {
-            json["AllRoots"] = Json::array();
-            for (const TNamed& named : chord.mNames) json["AllRoots"].push_back(NameToJson(named));
-        }
-        list.push_back(std::move(json));
-    }
-    return JsonText({{"Chords", list}});
-}
-
-std::string NamesText(const std::vector<TNamedNotes>& chords, const TNameOptions& options,
-                      const CPaint& paint) {
-    const CChordNamePrefs prefs = options.mNaming.Prefs();
-    const auto nameOf = [&](const CKeyEnh& key) {
-        return key.IsUndef() ? "-" : KeyNrAndEnhToName(key.mKeyNr, key.mEnh, prefs);
-    };
-    CTable table({"notes", "name", "root", "bass", "basic chord"});
-    for (const TNamedNotes& chord : chords) {
-        std::string notes = NotesName(chord.mNotes, prefs);
-        for (const TNamed& named : chord.mNames) {
-            const std::string root = nameOf(named.mRoot);
-            table.AddRow({std::exchange(notes, {}), named.mName,
-                          named.mIsSounding ? root : '(' + root + ')', nameOf(named.mBass),
-                          std::string(BasicChordName(named.mBasicChord))});
+TStatus Name(TNameOptions options) {
+    if (!ReadContext(options)) return TStatus::BadUsage;
+    const auto lines = TypedLines(options.mWords);
+    if (!lines) return TStatus::BadInput;
+    TStatus status = TStatus::Success;
+    std::vector<TNotesText> sets;
+    for (const std::string& line : *lines) {
+        const std::string typed = FoldAccidentals(line);
+        TNotesText notes = ReadNotesText(typed, options.mNaming.Prefs());
+        if (notes.mError.empty()) {
+            sets.push_back(std::move(notes));
+        } else {
+            status = FailAt(TStatus::BadInput, notes.mError, typed, notes.mColumn);
         }
     }
-    return table.Text(paint);
-}
-
-TStatus Name(const TNameOptions& options) {
-    CKeyEnh root;
-    if (!options.mRoot.empty()) {
-        const std::string typed = FoldAccidentals(options.mRoot);
-        int consumed = 0;
-        root.SetFromString(typed, &consumed, options.mNaming.Prefs());
-        if (root.IsUndef() || static_cast<std::size_t>(consumed) < typed.size()) {
-            return FailAt(TStatus::BadUsage, "--root: a root is a key, as in Bb", typed,
-                          static_cast<std::size_t>(consumed));
-        }
-    }
-    const auto lines = ReadLines(options.mWords, [&](const std::string& line) {
-        return ReadNotesText(line, options.mNaming.Prefs());
-    });
-    if (lines.index() == 0) return std::get<0>(lines);
-    std::vector<TNamedNotes> chords;
-    for (const TNotesText& line : std::get<1>(lines)) {
-        chords.push_back(NamesOf(line.mNotes, root, options));
-    }
-    return Print(options.mFormat.Format() == TFormat::Json
-                     ? NamesJson(chords, options)
-                     : NamesText(chords, options, PaintOfOutput()));
+    if (sets.empty()) return status;
+    const bool isAsPlayed = options.mMethod == "notes" || options.mMethod == "both";
+    const TStatus printed =
+        Print(isAsPlayed ? NameAsPlayed(sets, options) : NameByRoot(sets, options));
+    return printed == TStatus::Success ? status : printed;
 }
 
 }  // namespace
@@ -217,8 +110,19 @@ void AddName(CCommand& program) {
     const auto options = std::make_shared<TNameOptions>();
     command.AddArgument("NOTE", options->mWords, "Notes of a chord; - reads one chord a line")
         .Required();
+    command.AddChoice("--method", options->mMethod, {"notes", "both", "net", "score"},
+                      "By how common chords are; with the net; over a root of net or score");
+    command.AddOption("--key", "KEY", options->mKey, "The key of the piece: \"Bb major\"");
+    command.AddOption("--before", "CHORD", options->mBefore, "The chord before these notes");
+    command.AddOption("--after", "CHORD", options->mAfter, "The chord behind these notes");
+    command.AddChoice("--bass", options->mBass, {"usual", "only", "none"},
+                      "The lowest note is of the chord or not; only its bass; or says nothing");
+    command.AddFlag("--progression", options->mProgression,
+                    "The chords of the lines follow each other");
+    command.AddOption("--candidates", "N", options->mCandidates, "How many names (default: 1)")
+        .InRange(1, kMostCandidates);
+    command.AddFlag("--exact", options->mIsExact, "Say all that is left out: C7(no5)");
     command.AddOption("--root", "KEY", options->mRoot, "The root; without it, it is searched");
-    command.AddChoice("--method", options->mMethod, {"net", "score"}, "How a root is searched");
     command.AddFlag("--all-roots", options->mAllRoots, "The names with each of the twelve roots");
     options->mFormat.AddTo(command, {"text", "json"});
     options->mNaming.AddTo(command);

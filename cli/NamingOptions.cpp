@@ -35,8 +35,8 @@ void CNamingOptions::AddTo(CCommand& command) {
     command.AddOption("--slash-text", "TEXT", mPrefs.mSlashText, "Stands for the slash of the bass")
         .InGroup(group);
     command
-        .AddChoice("--major-seventh", mMajorSeventh, {"ma7", "j7", "maj7"},
-                   "How a major seventh is written")
+        .AddChoice("--major-seventh", mMajorSeventh, {"usual", "ma7", "j7", "maj7"},
+                   "A major seventh; usual is maj7, and ma7 with --method net or score")
         .InGroup(group);
     command.AddChoice("--middle-c", mMiddleC, {"3", "4", "5"}, "The octave of note number 60")
         .InGroup(group);
@@ -52,6 +52,13 @@ CChordNamePrefs CNamingOptions::Prefs() const {
     prefs.mNoSpaceBetweenNameParts = mSpaces ? 0 : 1;
     prefs.mNoSpaceAroundSlash = mSpacesAroundSlash ? 0 : 1;
     prefs.mOctaveNaming = mMiddleC.front() - '3';
+    return prefs;
+}
+
+CChordNamePrefs CNamingOptions::PlayersPrefs() const {
+    constexpr std::int32_t kMaj7 = 2;
+    CChordNamePrefs prefs = Prefs();
+    if (mMajorSeventh == "usual") prefs.mChordPrefC = kMaj7;
     return prefs;
 }
 

@@ -15,6 +15,8 @@ public:
     void AddTo(CCommand& command);
 
     [[nodiscard]] CChordNamePrefs Prefs() const;
+    /// The same with a major seventh as players write it, "maj7", unless it was told otherwise.
+    [[nodiscard]] CChordNamePrefs PlayersPrefs() const;
 
 private:
     CChordNamePrefs mPrefs;
@@ -25,7 +27,7 @@ private:
     bool mSpaces = false;
     bool mSpacesAroundSlash = false;
     std::string mMiddleC = "4";
-    std::string mMajorSeventh = "ma7";
+    std::string mMajorSeventh = "usual";
 };
 
 }  // namespace brindle::cli

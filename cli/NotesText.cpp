@@ -38,7 +38,7 @@ public:
 
     /// What is wrong with the word; empty if it is a note.
     std::string Read(std::string_view word) {
-        if (const auto number = WholeNumber(word)) return Add(*number, TEnh_n, word);
+        if (const auto number = WholeNumber(word)) return Add(*number, TEnh_Undef, word);
         CKeyEnh key;
         int consumed = 0;
         key.SetFromString(std::string(word), &consumed, mPrefs);
@@ -54,22 +54,27 @@ public:
                    key.mEnh, word);
     }
 
-    [[nodiscard]] CMySet<CNote> Notes() && { return std::move(mNotes); }
+    [[nodiscard]] TNotesText Notes() && { return std::move(mNotes); }
 
 private:
     std::string Add(std::int64_t noteNr, TEnh enh, std::string_view word) {
         if (noteNr < 0 || noteNr > kHighestNoteNr) {
             return fmt::format("{} is outside of the notes 0 to 127", Printable(word));
         }
-        const bool isThere = std::any_of(mNotes.begin(), mNotes.end(),
-                                         [&](const CNote& note) { return note.mNoteNr == noteNr; });
-        if (!isThere) mNotes.insert(CNote(noteNr, enh));
+        if (mNotes.mTyped.size() == kMostTypedNotes) {
+            return fmt::format("a chord has at most {} notes", kMostTypedNotes);
+        }
+        mNotes.mTyped.emplace_back(noteNr, enh);
+        const auto isSame = [&](const CNote& note) { return note.mNoteNr == noteNr; };
+        if (std::none_of(mNotes.mNotes.begin(), mNotes.mNotes.end(), isSame)) {
+            mNotes.mNotes.insert(CNote(noteNr, enh == TEnh_Undef ? TEnh_n : enh));
+        }
         mNext = noteNr + 1;
         return {};
     }
 
     const CChordNamePrefs& mPrefs;
-    CMySet<CNote> mNotes;
+    TNotesText mNotes;
     std::int64_t mNext = kMiddleC;
 };
 
@@ -82,18 +87,27 @@ TNotesText ReadNotesText(std::string_view text, const CChordNamePrefs& prefs) {
     while (begin != text.npos) {
         const std::size_t end = std::min(text.find_first_of(blanks, begin), text.size());
         std::string error = reader.Read(text.substr(begin, end - begin));
-        if (!error.empty()) return {{}, std::move(error), begin};
+        if (!error.empty()) return {{}, {}, std::move(error), begin};
         begin = text.find_first_not_of(blanks, end);
     }
-    return {std::move(reader).Notes(), {}, 0};
+    return std::move(reader).Notes();
 }
 
-std::string NotesName(const CMySet<CNote>& notes, const CChordNamePrefs& prefs) {
+std::string NotesName(std::span<const CNote> notes, const CChordNamePrefs& prefs) {
     std::string name;
     for (const CNote& note : notes) {
         name += (name.empty() ? "" : " ") + note.KeyName(prefs) + note.OctName(prefs);
     }
     return name;
+}
+
+Json NotesToJson(std::span<const CNote> notes, const CChordNamePrefs& prefs) {
+    Json list = Json::array();
+    for (const CNote& note : notes) {
+        list.push_back(
+            {{"Name", note.KeyName(prefs) + note.OctName(prefs)}, {"NoteNr", note.mNoteNr}});
+    }
+    return list;
 }
 
 }  // namespace brindle::cli

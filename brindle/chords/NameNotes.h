@@ -33,6 +33,9 @@ struct CNamingOptions {
     int mPreviousRoot = kKeyNrUndef;
     int mNextRoot = kKeyNrUndef;
     TBassUse mBass = TBassUse::Usual;
+    /// What another judge adds for each root key, in tenths of a bit and not negative: see
+    /// RootCostsByNet.
+    std::array<int, 12> mRootCosts{};
     /// Most names that are wanted.
     std::size_t mLimit = 12;
 };

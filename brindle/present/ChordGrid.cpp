@@ -6,6 +6,7 @@
 #include "brindle/guitarchords/GChLibrary.h"
 #include "brindle/guitarchords/GChPitches.h"
 #include "brindle/guitarchords/GChTuningDescr.h"
+#include "brindle/guitarchords/NameFingering.h"
 #include "brindle/present/ShownText.h"
 #include "brindle/theory/KeyIntervals.h"
 #include "brindle/theory/KeyNames.h"
@@ -79,6 +80,20 @@ std::string AsciiName(std::optional<std::string> name) {
     std::string text = std::move(name).value_or("");
     ConvertUtf8SharpAndFlatToAscii(text);
     return text;
+}
+
+/// Names what the strings sound. Other names are those of whole chords that are nearly as likely.
+void SetNames(CChordGrid& grid) {
+    constexpr int kNearlyAsLikely = 50;
+    const auto names = NameFingering(grid.mPitches, grid.mTuning);
+    if (names.empty()) return;
+    grid.mName = names.front().mSymbol;
+    grid.mRoot = names.front().mRoot.mKeyNr;
+    for (std::size_t i = 1; i < names.size(); ++i) {
+        const bool isWhole = names[i].mOmitted.empty() && names[i].mAdded.empty();
+        const bool isNear = names[i].mCost <= names.front().mCost + kNearlyAsLikely;
+        if (isWhole && isNear) grid.mOtherNames.push_back(names[i].mSymbol);
+    }
 }
 
 }  // namespace
@@ -177,16 +192,7 @@ std::optional<CChordGrid> GridOfFrets(std::string_view symbol, const std::vector
     for (std::size_t i = 0; i < frets.size(); ++i) {
         grid.mPitches.push_back(chord.pitchForStringIndex1(static_cast<int>(i), tuningDescr));
     }
-    grid.mRoot = GChProposedRootNoteFromChordDescr(&chord, &tuningDescr);
-    for (int root = grid.mRoot; root < 12; ++root) {
-        std::string name =
-            AsciiName(GChHarmonyStringFromChordDescr(&chord, &tuningDescr, root, -1));
-        if (root == grid.mRoot) {
-            grid.mName = std::move(name);
-        } else if (name.size() == grid.mName.size()) {
-            grid.mOtherNames.push_back(std::move(name));
-        }
-    }
+    SetNames(grid);
     return grid;
 }
 

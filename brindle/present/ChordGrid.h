@@ -19,7 +19,7 @@ struct CChordGrid {
     std::string mSymbol;
     /// Told from what sounds.
     std::string mName;
-    /// The names over other roots that are as short.
+    /// Other names that are nearly as likely.
     std::vector<std::string> mOtherNames;
     GChShortTuning mTuning{};
     int mCapo = 0;
@@ -42,7 +42,7 @@ struct CFretWindow {
 
 [[nodiscard]] CFretWindow WindowOf(const CChordGrid& grid);
 
-/// The name, and behind commas those that are as short: "C 6, A m".
+/// The name, and behind commas the other ones: "Am7, C6/A".
 [[nodiscard]] std::string NamesText(const CChordGrid& grid);
 
 /// "x32010"; frets of two digits stand between dashes: "x-10-12-12-11-10".
@@ -59,9 +59,8 @@ struct CFretWindow {
 /// "E2 A2 D3 G3 B3 E4"
 [[nodiscard]] std::string TuningText(const GChShortTuning& tuning);
 
-/// Frets without fingers over the root that gives the shortest name, of several the first from C.
-/// Nothing if there are more
-/// fretted strings than a fingering has elements.
+/// Frets without fingers, named as NameFingering does. Nothing if there are more fretted strings
+/// than a fingering has elements.
 [[nodiscard]] std::optional<CChordGrid> GridOfFrets(std::string_view symbol,
                                                     const std::vector<int>& frets,
                                                     const GChShortTuning& tuning, int capo);

@@ -120,7 +120,8 @@ private:
     void LookOver(int root, TToneMask tones, bool isForeign) {
         TNamingCandidate& best = mBest[static_cast<std::size_t>(root)];
         const int bass = FoldIntoOctave(mBass - root);
-        const int foreign = isForeign ? kForeignBass : 0;
+        const int base =
+            mOptions.mRootCosts[static_cast<std::size_t>(root)] + (isForeign ? kForeignBass : 0);
         const TToneMask shunned = isForeign ? TToneMask{1} << bass : 0;
         const TTypeSet types = TypesThatFit(tones);
         for (std::size_t word = 0; word < 2; ++word) {
@@ -128,13 +129,12 @@ private:
                 const std::size_t ix = word * 64 + static_cast<std::size_t>(std::countr_zero(left));
                 const TNamingType& type = kNamingTypes[ix];
                 if ((type.mTones & shunned) != 0) continue;
-                const int cost = foreign + Rarity(ix, bass) + CostOfLeftOut(type, tones, mSounding);
+                const int cost = base + Rarity(ix, bass) + CostOfLeftOut(type, tones, mSounding);
                 Offer(best, tones, static_cast<int>(ix), cost);
             }
         }
-        const bool isPossible = (tones & kRoot) != 0 && foreign + kSpelledOut <= best.mCost;
-        if (isPossible)
-            Offer(best, tones, kSpelledOutType, foreign + CostOfSpelledOut(tones, bass));
+        const bool isPossible = (tones & kRoot) != 0 && base + kSpelledOut <= best.mCost;
+        if (isPossible) Offer(best, tones, kSpelledOutType, base + CostOfSpelledOut(tones, bass));
     }
 
     /// `cost` is without that of the context.

@@ -1,0 +1,22 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/chords/NameNotes.h"
+#include "brindle/guitarchords/GChShortTuning.h"
+
+#include <span>
+#include <vector>
+
+namespace brindle {
+
+/// Whether a string is tuned higher than the one behind it, as the G of a ukulele is.
+[[nodiscard]] bool IsReentrant(const GChShortTuning& tuning);
+
+/// Names what the strings of a fingering sound as a guitarist would: x02010 is Am7 and 200232 D/F#.
+/// `pitches` are MIDI numbers from the string with the lowest index, negative for a muted string.
+/// NameNotes and the net that hears roots judge together. On a re-entrant tuning the lowest note is
+/// no bass and no name has a slash. Without a string that sounds there is no name.
+[[nodiscard]] std::vector<CNamedChord> NameFingering(std::span<const int> pitches,
+                                                     const GChShortTuning& tuning);
+
+}  // namespace brindle
