@@ -1,0 +1,35 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/chords/internal/NamingScan.h"
+#include "brindle/musicxml/internal/NoteWindows.h"
+#include "brindle/theory/CSignKeyLite.h"
+
+#include <vector>
+
+namespace brindle {
+
+/// A chord that a window can have: a type over a root, and what it costs there, in tenths of a bit.
+struct TWindowChord {
+    int mCost = 0;
+    int mRoot = 0;
+    std::size_t mType = 0;
+
+    [[nodiscard]] bool IsSameChord(const TWindowChord& other) const {
+        return mRoot == other.mRoot && mType == other.mType;
+    }
+    friend auto operator<=>(const TWindowChord&, const TWindowChord&) = default;
+};
+
+/// What a chord costs in a window.
+[[nodiscard]] int CostOfWindowChord(const TNoteWindow& window, int root, std::size_t type,
+                                    const CSignKeyLite& key);
+
+/// The `count` chords that cost the least.
+[[nodiscard]] std::vector<TWindowChord> LikeliestChords(const TNoteWindow& window,
+                                                        const CSignKeyLite& key, std::size_t count);
+
+/// The candidate of a name in which the whole chord sounds over the bass of the window.
+[[nodiscard]] TNamingCandidate CandidateOf(const TWindowChord& chord, const TNoteWindow& window);
+
+}  // namespace brindle
