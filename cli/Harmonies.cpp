@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "cli/CommandLine.h"
+#include "cli/HarmoniesFromNotes.h"
 #include "cli/Json.h"
+#include "cli/KeyText.h"
 #include "cli/LeadSheet.h"
 #include "cli/SheetChordText.h"
 
@@ -22,14 +24,20 @@ constexpr TCommandHelp kHelp{
     "  brindle harmonies song.musicxml\n"
     "  brindle harmonies song.mxl --json\n"
     "  brindle harmonies song.xml --format chords >song.txt\n"
+    "  brindle harmonies --from-notes piano.musicxml\n"
+    "  brindle harmonies --from-notes chorale.mxl --every beat --key \"G minor\"\n"
     "\n"
     "Repeats, endings and jumps are played through. Positions and lengths are quarter\n"
-    "notes.\n",
+    "notes. With --from-notes the chords are named from what sounds, in the bars as they are\n"
+    "written, for scores without chord symbols.\n",
 };
 
 struct THarmoniesOptions {
     std::string mFile;
     std::string mTiming = "played";
+    bool mIsFromNotes = false;
+    std::string mEvery = "change";
+    std::string mKey;
     CFormatOptions mFormat;
 };
 
@@ -115,9 +123,30 @@ TStatus PrintChordText(const TMusicXMLDoc& sheet, const std::string& name) {
     return Print(chords->mText);
 }
 
+TChordEvery EveryOf(const std::string& word) {
+    if (word == "bar") return TChordEvery::Bar;
+    return word == "beat" ? TChordEvery::Beat : TChordEvery::Change;
+}
+
+TStatus FromNotes(const TTypedSong& song, const THarmoniesOptions& options) {
+    const TFormat format = options.mFormat.Format();
+    if (format == TFormat::Chords) {
+        return Fail(TStatus::BadUsage, "--from-notes has no --format chords");
+    }
+    CChordsFromNotesOptions how;
+    how.mEvery = EveryOf(options.mEvery);
+    if (!options.mKey.empty()) {
+        const auto key = ReadKeyOption(options.mKey);
+        if (!key) return TStatus::BadUsage;
+        how.mKey = *key;
+    }
+    return PrintChordsFromNotes(song, how, format == TFormat::Json);
+}
+
 TStatus Harmonies(const THarmoniesOptions& options) {
     const auto typed = ReadTypedSong({}, options.mFile);
     if (!typed) return TStatus::BadInput;
+    if (options.mIsFromNotes) return FromNotes(*typed, options);
     const TTiming timing = options.mTiming == "native" ? TTiming::Native : TTiming::Played;
     const auto sheet = ReadLeadSheet(*typed, timing);
     if (!sheet) return TStatus::BadInput;
@@ -135,6 +164,12 @@ void AddHarmonies(CCommand& program) {
         .Required();
     command.AddChoice("--timing", options->mTiming, {"played", "native"},
                       "How the chords of a score follow each other");
+    command.AddFlag("--from-notes", options->mIsFromNotes,
+                    "Name the chords from the notes of the score");
+    command.AddChoice("--every", options->mEvery, {"bar", "beat", "change"},
+                      "Where chords from notes may stand");
+    command.AddOption("--key", "KEY", options->mKey,
+                      "The key for chords from notes; without it, it is found");
     options->mFormat.AddTo(command, {"text", "json", "chords"});
     command.OnCall([options] { return Harmonies(*options); });
 }
