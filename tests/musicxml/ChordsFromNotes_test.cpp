@@ -70,6 +70,16 @@ TEST_CASE("Passing notes do not make chords, and silence does not end one") {
           "0+1 C  1+1 C  4+1 G7  5+1 G7  6+1 G7  7+1 G7  ");
 }
 
+TEST_CASE("What many parts play in unison counts once, and a high note in front is no bass") {
+    std::vector<CTimedNote> notes = Chord(0.0, 4.0, {48, 64, 67});
+    for (int part = 0; part < 30; ++part) notes.push_back({0.25, 0.25, CNote(74, TEnh_n)});
+    CHECK(Text(ChordsFromNotes(FourFour(1, notes))) == "0+4 C  ");
+    // An upbeat to the left hand: the C below comes behind the G.
+    notes = Chord(0.0, 0.5, {79});
+    for (const CTimedNote& note : Chord(0.5, 3.5, {48, 64, 67})) notes.push_back(note);
+    CHECK(Text(ChordsFromNotes(FourFour(1, notes))) == "0+4 C  ");
+}
+
 TEST_CASE("A stated key is kept and spells the chords") {
     const CScoreNotes score = FourFour(1, Chord(0.0, 4.0, {54, 58, 61}));
     const CSignKeyLite fSharp(CKeyEnh_Fis, TSignKeyType_Major);
