@@ -3,6 +3,7 @@
 // cost, symbol, exact symbol and the spelled keys from C up.
 #include "brindle/chords/NameNotes.h"
 #include "brindle/chords/ReadChordText.h"
+#include "brindle/chords/WriteChordSymbol.h"
 #include "brindle/chords/internal/KeySpelling.h"
 #include "brindle/chords/internal/NamingTypes.h"
 
@@ -80,7 +81,7 @@ std::string KeysFromC(const CNamedChord& chord) {
     std::string text;
     for (const auto& [keyNr, key] : keys) {
         if (!text.empty()) text += '-';
-        AppendPlainKeyName(key, text);
+        text += WriteNoteName(key);
     }
     return text;
 }

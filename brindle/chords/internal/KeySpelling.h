@@ -6,8 +6,6 @@
 
 #include <array>
 #include <cstddef>
-#include <cstdlib>
-#include <string>
 
 namespace brindle {
 
@@ -28,13 +26,6 @@ namespace brindle {
 [[nodiscard]] constexpr int PlaceOnLineOfFifths(const CKeyEnh& key) {
     constexpr std::array<int, 7> kPlaces{0, 2, 4, -1, 1, 3, 5};
     return kPlaces[static_cast<std::size_t>(LetterOf(key))] + 7 * EnhToSemitone(key.mEnh);
-}
-
-/// Appends the name of a spelled key with its letter and "b" or "#" for each sign: "C##".
-inline void AppendPlainKeyName(const CKeyEnh& key, std::string& name) {
-    const int signs = EnhToSemitone(key.mEnh);
-    name += "CDEFGAB"[LetterOf(key)];
-    name.append(static_cast<std::size_t>(std::abs(signs)), signs < 0 ? 'b' : '#');
 }
 
 }  // namespace brindle

@@ -1,9 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/chords/internal/NamedChords.h"
-#include "brindle/chords/internal/KeySpelling.h"
+#include "brindle/chords/WriteChordSymbol.h"
 #include "brindle/chords/internal/NamedChordSpelling.h"
 #include "brindle/chords/internal/SpelledOutChord.h"
-#include "brindle/theory/CChordNamePrefs.h"
 
 #include <algorithm>
 
@@ -77,16 +76,13 @@ std::vector<CNote> Spelled(std::span<const CNote> sorted, const CNamedChordSpell
 }
 
 std::string SymbolOf(const CNamedChord& chord, const std::string& suffix) {
-    std::string symbol;
-    AppendPlainKeyName(chord.mRoot, symbol);
+    std::string symbol = WriteNoteName(chord.mRoot);
     const bool looksLikeSign = !suffix.empty() && (suffix[0] == 'b' || suffix[0] == '#');
     if (looksLikeSign) symbol += '(';
     symbol += suffix;
     if (looksLikeSign) symbol += ')';
     if (chord.mBass.IsUndef()) return symbol;
-    symbol += '/';
-    AppendPlainKeyName(chord.mBass, symbol);
-    return symbol;
+    return symbol + '/' + WriteNoteName(chord.mBass);
 }
 
 CNamedChord NamedChord(const TNamingCandidate& candidate, std::span<const CNote> sorted,
