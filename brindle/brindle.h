@@ -174,6 +174,7 @@
 #include "brindle/present/KeysSvg.h"
 #include "brindle/present/KeysText.h"
 #include "brindle/present/MarkovMidi.h"
+#include "brindle/present/MarkovText.h"
 #include "brindle/present/MidiFile.h"
 #include "brindle/present/ShownNames.h"
 #include "brindle/present/ShownSong.h"

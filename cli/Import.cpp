@@ -87,6 +87,7 @@ MusicXmlParserDelegate Both(const MusicXmlParserDelegate& lines,
     join(&MusicXmlParserDelegate::didEncounterTempoChange);
     join(&MusicXmlParserDelegate::didEncounterDirection);
     join(&MusicXmlParserDelegate::didEncounterNote);
+    join(&MusicXmlParserDelegate::didLeaveTieOpen);
     return both;
 }
 

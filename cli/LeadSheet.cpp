@@ -4,14 +4,10 @@
 #include "cli/Input.h"
 #include "cli/Output.h"
 
-#include "brindle/chords/CChordHeavy.h"
-#include "brindle/chords/CChordLite.h"
-#include "brindle/musicxml/CChordSetFromMusicXml.h"
 #include "brindle/musicxml/ScoreContainer.h"
 #include "brindle/platform/Error.h"
 #include "brindle/platform/XmlStreamParser.h"
 #include "brindle/present/ShownNames.h"
-#include "brindle/theory/CChordNamePrefs.h"
 
 #include <fmt/format.h>
 
@@ -21,68 +17,6 @@
 
 namespace brindle::cli {
 namespace {
-
-struct TSuffix {
-    std::string_view mKind;
-    std::string_view mSuffix;
-};
-
-// What lead sheets print behind the root for each kind of chord.
-constexpr auto kSuffixes = std::to_array<TSuffix>({
-    {"major", ""},
-    {"minor", "m"},
-    {"augmented", "aug"},
-    {"diminished", "dim"},
-    {"dominant", "7"},
-    {"major-seventh", "maj7"},
-    {"minor-seventh", "m7"},
-    {"diminished-seventh", "dim7"},
-    {"augmented-seventh", "7#5"},
-    {"half-diminished", "m7b5"},
-    {"major-minor", "mmaj7"},
-    {"major-sixth", "6"},
-    {"minor-sixth", "m6"},
-    {"dominant-ninth", "9"},
-    {"major-ninth", "maj9"},
-    {"minor-ninth", "m9"},
-    {"dominant-11th", "11"},
-    {"major-11th", "maj11"},
-    {"minor-11th", "m11"},
-    {"dominant-13th", "13"},
-    {"major-13th", "maj13"},
-    {"minor-13th", "m13"},
-    {"suspended-second", "sus2"},
-    {"suspended-fourth", "sus4"},
-    {"power", "5"},
-});
-
-std::string DegreeText(const TMusicXMLDegree& degree) {
-    std::string text;
-    if (degree.mType == "subtract") return "no" + degree.mValue;
-    if (degree.mType == "add" && degree.mAlter == 0) text = "add";
-    if (degree.mAlter < 0) text = "b";
-    if (degree.mAlter > 0) text = "#";
-    return text + degree.mValue;
-}
-
-// As it is printed; empty for a kind that lead sheets have no sign for.
-std::string PrintedSymbol(const TMusicXMLHarmony& harmony) {
-    const auto row = std::find_if(kSuffixes.begin(), kSuffixes.end(), [&](const TSuffix& suffix) {
-        return suffix.mKind == harmony.mKind;
-    });
-    if (row == kSuffixes.end()) return {};
-    std::string symbol = KeyName(harmony.mRoot.ToKeyEnh(NamePrefs()));
-    // "C7sus4": what is suspended stands last.
-    const bool isSuspended = row->mSuffix.substr(0, 3) == "sus";
-    if (!isSuspended) symbol += row->mSuffix;
-    for (const TMusicXMLDegree& degree : harmony.mDegrees) {
-        symbol += isSuspended && degree.mAlter == 0 ? degree.mValue : DegreeText(degree);
-    }
-    if (isSuspended) symbol += row->mSuffix;
-    const CKeyEnh bass = harmony.mBass.ToKeyEnh(NamePrefs());
-    if (!bass.IsUndef()) symbol += '/' + KeyName(bass);
-    return symbol;
-}
 
 std::string_view LastDot(std::string_view name) {
     const std::size_t dot = name.rfind('.');
@@ -188,21 +122,8 @@ CHarmAnlsChords WithRests(const CHarmAnlsChords& chords, const TMusicXMLDoc& she
     return all;
 }
 
-bool IsNoChord(const TMusicXMLHarmony& harmony) {
-    return harmony.mRoot.mStep == kNoChordSymbol || harmony.mKind == "none";
-}
-
 std::string SymbolOf(const TMusicXMLHarmony& harmony) {
-    if (IsNoChord(harmony)) return std::string(kNoChordSymbol);
-    const CChordHeavy heavy = CChordSetFromMusicXml(harmony, 24, NamePrefs());
-    if (heavy.RootKeyEnh().IsUndef()) return "?";
-    CChordLite chord;
-    chord.SetFromChordHeavy(heavy);
-    std::string printed = PrintedSymbol(harmony);
-    if (!printed.empty() && CChordLite(printed, NamePrefs()) == chord) return printed;
-    std::string name = heavy.NameWithSlash(NamePrefs());
-    if (printed.empty() || CChordLite(name, NamePrefs()) == chord) return Printable(name);
-    return Printable(printed);
+    return HarmonySymbol(harmony);
 }
 
 }  // namespace brindle::cli

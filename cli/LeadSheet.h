@@ -3,6 +3,7 @@
 
 #include "brindle/analysis/CHarmAnlsChords.h"
 #include "brindle/musicxml/TMusicXMLDoc.h"
+#include "brindle/song/HarmonySymbols.h"
 
 #include <optional>
 #include <string>
@@ -47,12 +48,6 @@ struct TTypedSong {
 /// `chords`, which an analysis read from the score, in the form that a chord text gives: with an
 /// undefined chord where no chord sounds, and one at the end.
 [[nodiscard]] CHarmAnlsChords WithRests(const CHarmAnlsChords& chords, const TMusicXMLDoc& sheet);
-
-/// The symbol of no chord.
-inline constexpr std::string_view kNoChordSymbol = "N.C.";
-
-/// Whether a harmony is the sign that no chord sounds.
-[[nodiscard]] bool IsNoChord(const TMusicXMLHarmony& harmony);
 
 /// The chord symbol of a harmony as a lead sheet prints it, in a form that reads back as the same
 /// chord where there is one: "F#m7b5/C", "N.C.".

@@ -3,15 +3,14 @@
 
 #include "cli/Input.h"
 
-#include "brindle/chords/CChordHeavy.h"
+#include "brindle/chords/ReadChordText.h"
 #include "brindle/markov/MarkovChords.h"
 #include "brindle/platform/SeededRandom.h"
-#include "brindle/present/ShownNames.h"
+#include "brindle/present/MarkovText.h"
 
 #include <fmt/format.h>
 
 #include <algorithm>
-#include <cmath>
 #include <sstream>
 
 namespace brindle::cli {
@@ -26,28 +25,8 @@ constexpr TCommandHelp kHelp{
     "  brindle markov show model.json\n",
 };
 
-// Wide enough for two octaves of tensions.
-constexpr int kWrapIntvl = 24;
 // Longer texts are shown as chord strings.
 constexpr double kMostBeats = 1e6;
-
-std::string SymbolName(const CMarkovObject& object) {
-    switch (object.mType) {
-        case TMarkovObjectType_Chord:
-            return object.mChord.IsUndef() ? "U" : ChordName(object.mChord);
-        case TMarkovObjectType_Start:
-            return "start";
-        case TMarkovObjectType_End:
-            return "end";
-        case TMarkovObjectType_Gap:
-            return "U";
-    }
-    return fmt::format("#{}", object.mIndex);
-}
-
-bool IsWholeBeats(double length) {
-    return length >= 1.0 && length <= kMostBeats && std::floor(length) == length;
-}
 
 /// A word that is neither a chord nor "U"; empty if there is none.
 std::string UnknownSymbol(const std::string& text) {
@@ -64,47 +43,24 @@ std::string UnknownSymbol(const std::string& text) {
     return {};
 }
 
-/// Puts one word for each beat into bars.
-class CBarsWriter {
-public:
-    CBarsWriter(int beatsPerBar, int barsPerLine)
-        : mBeatsPerBar(beatsPerBar), mBarsPerLine(barsPerLine) {}
-
-    void Add(const std::string& symbol, int beats) {
-        for (int beat = 0; beat < beats; ++beat) AddWord(beat == 0 ? symbol : ".");
+// A chord string with its symbols as the reader of such strings knows them: it takes the brackets
+// of
+// "(4,Gm(maj7))" away before it reads the chord.
+std::string WithPlainSymbols(const std::string& text) {
+    std::istringstream elements(text);
+    std::string plain;
+    for (std::string element; std::getline(elements, element, ';');) {
+        plain += plain.empty() ? "" : ";";
+        const std::size_t comma = element.find(',');
+        const bool isPair =
+            element.starts_with('(') && element.ends_with(')') && comma != element.npos;
+        const auto symbol =
+            isPair ? NormaliseChordSymbol(element.substr(comma + 1, element.size() - comma - 2))
+                   : std::nullopt;
+        plain += symbol ? element.substr(0, comma + 1) + *symbol + ")" : element;
     }
-
-    [[nodiscard]] std::string Text() const { return mText + mBar; }
-
-private:
-    void AddWord(const std::string& word) {
-        if (mBeat == mBeatsPerBar) EndBar();
-        // The bar line tells how long the last chord of a bar is held.
-        if (word == "." && mBeat > 0) {
-            mHeld += " .";
-        } else {
-            mBar += mHeld + (mBeat == 0 ? "" : " ") + word;
-            mHeld.clear();
-        }
-        ++mBeat;
-    }
-    void EndBar() {
-        ++mBars;
-        const bool isLineEnd = mBarsPerLine > 0 && mBars % mBarsPerLine == 0;
-        mText += mBar + (isLineEnd ? " |\n" : " | ");
-        mBar.clear();
-        mHeld.clear();
-        mBeat = 0;
-    }
-
-    int mBeatsPerBar;
-    int mBarsPerLine;
-    int mBeat = 0;
-    int mBars = 0;
-    std::string mText;
-    std::string mBar;
-    std::string mHeld;
-};
+    return plain;
+}
 
 }  // namespace
 
@@ -137,6 +93,7 @@ std::optional<std::vector<CMarkovObject>> ReadSymbols(const std::string& option,
     std::string typed = FoldAccidentals(text);
     std::erase_if(typed, [](char c) { return c == ' ' || c == '\t' || c == '\r' || c == '\n'; });
     if (!typed.empty() && typed.back() == ';') typed.pop_back();
+    typed = WithPlainSymbols(typed);
     const CHarmAnlsChordsWithLength chords = HarmChordsFromChordString(typed);
     const bool areLengths = std::all_of(chords.begin(), chords.end(), [](const auto& chord) {
         return chord.mLength > 0.0 && chord.mLength <= kMostBeats;
@@ -158,41 +115,12 @@ std::optional<std::vector<CMarkovObject>> ReadSymbols(const std::string& option,
     return symbols;
 }
 
-std::string ChordName(const CHarmAnlsChordWithLength& chord) {
-    return chord.ToChordHeavy(kWrapIntvl).NameWithSlash(NamePrefs());
-}
-
-std::string ChordString(MarkovSequenceView sequence) {
-    std::string text;
-    for (const MarkovIterator symbol : sequence) {
-        text += text.empty() ? "" : ";";
-        text += symbol->HasBeats() ? fmt::format("({},{})", ShortNumber(symbol->mChord.mLength),
-                                                 SymbolName(*symbol))
-                                   : SymbolName(*symbol);
-    }
-    return text;
-}
-
-std::string BarsText(MarkovSequenceView sequence, int beatsPerBar, int barsPerLine) {
-    const auto fits = [](MarkovIterator symbol) {
-        return symbol->HasBeats() && IsWholeBeats(symbol->mChord.mLength);
-    };
-    if (!std::all_of(sequence.begin(), sequence.end(), fits) ||
-        TMarkovSequenceLengthInBeats(sequence) > kMostBeats) {
-        return ChordString(sequence);
-    }
-    CBarsWriter bars(beatsPerBar, barsPerLine);
-    for (const MarkovIterator symbol : sequence) {
-        bars.Add(SymbolName(*symbol), static_cast<int>(symbol->mChord.mLength));
-    }
-    return bars.Text();
-}
-
-Json SymbolToJson(const CMarkovObject& object) {
-    if (!object.HasBeats()) return {{"Symbol", SymbolName(object)}};
-    const CHarmAnlsChordWithLength& chord = object.mChord;
-    return {{"Symbol", SymbolName(object)},
-            {"Length", chord.mLength},
+Json SymbolToJson(const CMarkovObject& object, const CMarkovSpelling& spelling) {
+    const std::string symbol = spelling.SymbolOf(object);
+    if (!object.HasBeats()) return {{"Symbol", symbol}};
+    const CChordLite chord = spelling.Spelled(object.mChord);
+    return {{"Symbol", symbol},
+            {"Length", object.mChord.mLength},
             {"RootKeyEnh", KeyEnhToJson(chord.mRootKeyEnh)},
             {"BassKeyEnh", KeyEnhToJson(chord.mBassKeyEnh)},
             {"Semitones", chord.mSemitones.Mask()},

@@ -5,6 +5,7 @@
 #include "cli/Json.h"
 
 #include "brindle/markov/VariableLengthMarkovModel.h"
+#include "brindle/present/MarkovText.h"
 
 #include <optional>
 #include <string>
@@ -26,20 +27,8 @@ void SetSeed(VariableLengthMarkovModel& model, const std::optional<std::uint64_t
 [[nodiscard]] std::optional<std::vector<CMarkovObject>> ReadSymbols(const std::string& option,
                                                                     const std::string& text);
 
-/// "Dm7", "F/C".
-[[nodiscard]] std::string ChordName(const CHarmAnlsChordWithLength& chord);
-
-/// The chord string of a sequence, as it is typed: "(4,C);(2,G7)". Start and end are "start" and
-/// "end".
-[[nodiscard]] std::string ChordString(MarkovSequenceView sequence);
-
-/// The sequence as a chord text with a step for each beat, "C | F . G7", in which a bar has
-/// `beatsPerBar` beats and a line `barsPerLine` bars, 0 for one line; or the chord string if the
-/// chords do not begin on beats.
-[[nodiscard]] std::string BarsText(MarkovSequenceView sequence, int beatsPerBar, int barsPerLine);
-
 /// Length, symbol, root, bass and semitones of a chord; its type for any other symbol.
-[[nodiscard]] Json SymbolToJson(const CMarkovObject& object);
+[[nodiscard]] Json SymbolToJson(const CMarkovObject& object, const CMarkovSpelling& spelling);
 
 void AddMarkovLearn(CCommand& markov);
 void AddMarkovGenerate(CCommand& markov);

@@ -57,13 +57,14 @@ bool FillGaps(VariableLengthMarkovModel& model, MarkovSequence& sequence) {
 }
 
 std::string FilledJson(const MarkovSequence& sequence, const MarkovSequence& typed) {
+    const CMarkovSpelling spelling(sequence);
     Json symbols = Json::array();
     for (std::size_t ix = 0; ix < sequence.size(); ++ix) {
-        Json symbol = SymbolToJson(*sequence[ix]);
+        Json symbol = SymbolToJson(*sequence[ix], spelling);
         symbol["Filled"] = typed[ix]->IsGap();
         symbols.push_back(symbol);
     }
-    return JsonText({{"ChordString", ChordString(sequence)}, {"Symbols", symbols}});
+    return JsonText({{"ChordString", ChordString(sequence, spelling)}, {"Symbols", symbols}});
 }
 
 TStatus MarkovFill(const TFillOptions& options) {
@@ -79,8 +80,9 @@ TStatus MarkovFill(const TFillOptions& options) {
     if (model->mMaxHistoryLength == 0) {
         return Fail(TStatus::BadInput, "the model knows no chord between these neighbours");
     }
-    return Print(options.mFormat.Format() == TFormat::Json ? FilledJson(filled, typed)
-                                                           : ChordString(filled) + '\n');
+    return Print(options.mFormat.Format() == TFormat::Json
+                     ? FilledJson(filled, typed)
+                     : ChordString(filled, CMarkovSpelling(filled)) + '\n');
 }
 
 }  // namespace

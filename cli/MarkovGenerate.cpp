@@ -109,8 +109,8 @@ TGenerated Generate(VariableLengthMarkovModel& model, const TMarkovGenerateOptio
     return generated;
 }
 
-Json SampledToJson(const TMarkovSampledObject& sampled) {
-    Json json = SymbolToJson(*sampled.mObject);
+Json SampledToJson(const TMarkovSampledObject& sampled, const CMarkovSpelling& spelling) {
+    Json json = SymbolToJson(*sampled.mObject, spelling);
     const auto number = [](double value) { return std::isfinite(value) ? Json(value) : Json(); };
     json["Probability"] = number(sampled.mProbability);
     json["NormalizedEntropy"] = number(sampled.mNormalizedEntropy);
@@ -119,9 +119,10 @@ Json SampledToJson(const TMarkovSampledObject& sampled) {
 }
 
 std::string GeneratedJson(const TGenerated& generated) {
+    const CMarkovSpelling spelling(generated.mChosen.mSymbols);
     Json symbols = Json::array();
     for (const auto& sampled : generated.mChosen.mSampledObjects) {
-        symbols.push_back(SampledToJson(sampled));
+        symbols.push_back(SampledToJson(sampled, spelling));
     }
     Json sequences = Json::array();
     for (std::size_t ix = 0; ix < generated.mSequences.size(); ++ix) {
@@ -129,15 +130,15 @@ std::string GeneratedJson(const TGenerated& generated) {
         sequences.push_back({{"Share", generated.mShares[ix]},
                              {"Count", sequence.mCount},
                              {"LogProbability", sequence.mLogProbability},
-                             {"ChordString", ChordString(sequence.mSymbols)}});
+                             {"ChordString", ChordString(sequence.mSymbols, spelling)}});
     }
-    return JsonText({{"ChordString", ChordString(generated.mChosen.mSymbols)},
+    return JsonText({{"ChordString", ChordString(generated.mChosen.mSymbols, spelling)},
                      {"Symbols", symbols},
                      {"Sequences", sequences}});
 }
 
 std::string OthersText(const TGenerated& generated, const TGenerateOptions& options,
-                       const CPaint& paint) {
+                       const CMarkovSpelling& spelling, const CPaint& paint) {
     std::string text;
     std::size_t shown = 0;
     for (std::size_t ix = 0; ix < generated.mSequences.size() && shown < options.mOthers; ++ix) {
@@ -147,15 +148,16 @@ std::string OthersText(const TGenerated& generated, const TGenerateOptions& opti
         text += paint.Faint(fmt::format(
             "\nor, with weight {:.2f}{}:\n", generated.mShares[ix],
             sequence.mCount == 1 ? "" : fmt::format(", drawn {} times", sequence.mCount)));
-        text += BarsText(sequence.mSymbols, options.mBeatsPerBar, 4) + '\n';
+        text += BarsText(sequence.mSymbols, spelling, options.mBeatsPerBar, 4) + '\n';
     }
     return text;
 }
 
 std::string GeneratedText(const TGenerated& generated, const TGenerateOptions& options) {
     const CPaint paint = PaintOfOutput();
-    return BarsText(generated.mChosen.mSymbols, options.mBeatsPerBar, 4) + '\n' +
-           OthersText(generated, options, paint);
+    const CMarkovSpelling spelling(generated.mChosen.mSymbols);
+    return BarsText(generated.mChosen.mSymbols, spelling, options.mBeatsPerBar, 4) + '\n' +
+           OthersText(generated, options, spelling, paint);
 }
 
 TStatus MarkovGenerate(const TGenerateOptions& options) {

@@ -95,6 +95,15 @@ std::vector<TContinuation> ContinuationsOf(const VariableLengthMarkovModel& mode
     return continuations;
 }
 
+/// One spelling for the history and what follows it.
+CMarkovSpelling SpellingOf(MarkovSequence sequence,
+                           const std::vector<TContinuation>& continuations) {
+    for (const TContinuation& continuation : continuations) {
+        sequence.push_back(continuation.mSymbol);
+    }
+    return CMarkovSpelling(sequence);
+}
+
 std::string ShownJson(const VariableLengthMarkovModel& model, const MarkovSequence& history,
                       const std::vector<TContinuation>& continuations) {
     Json rows = Json::array();
@@ -104,9 +113,10 @@ std::string ShownJson(const VariableLengthMarkovModel& model, const MarkovSequen
                         {"Entropy", NumberToJson(row.mEntropy)},
                         {"MaxEntropy", NumberToJson(row.mMaxEntropy)}});
     }
+    const CMarkovSpelling spelling = SpellingOf(history, continuations);
     Json following = Json::array();
     for (const TContinuation& continuation : continuations) {
-        Json symbol = SymbolToJson(*continuation.mSymbol);
+        Json symbol = SymbolToJson(*continuation.mSymbol, spelling);
         symbol["Count"] = continuation.mCount;
         symbol["Probability"] = NumberToJson(continuation.mProbability);
         following.push_back(symbol);
@@ -115,7 +125,7 @@ std::string ShownJson(const VariableLengthMarkovModel& model, const MarkovSequen
                      {"Symbols", model.mObjects.size()},
                      {"Histories", model.mTransitionMap.size()},
                      {"HistoryLengths", rows},
-                     {"History", ChordString(history)},
+                     {"History", ChordString(history, spelling)},
                      {"Continuations", following}});
 }
 
@@ -127,15 +137,16 @@ std::string ShownText(const VariableLengthMarkovModel& model, const MarkovSequen
                         fmt::format("{:.3f}", row.mEntropy),
                         fmt::format("{:.3f}", row.mMaxEntropy)});
     }
+    const CMarkovSpelling spelling = SpellingOf(history, continuations);
     CTable following({" count", " probability", "symbol"});
     for (const TContinuation& continuation : continuations) {
         following.AddRow({fmt::format("{}", continuation.mCount),
                           fmt::format("{:.3f}", continuation.mProbability),
-                          ChordString({&continuation.mSymbol, 1})});
+                          ChordString({&continuation.mSymbol, 1}, spelling)});
     }
     return fmt::format("{} symbols, {} histories of 1 to {} symbols\n\n{}\nbehind {}\n{}",
                        model.mObjects.size(), model.mTransitionMap.size(), model.mMaxHistoryLength,
-                       lengths.Text(paint), ChordString(history), following.Text(paint));
+                       lengths.Text(paint), ChordString(history, spelling), following.Text(paint));
 }
 
 TStatus MarkovShow(const TShowOptions& options) {

@@ -7,8 +7,8 @@
 #include "brindle/analysis/CHarmAnlsChords.h"
 #include "brindle/analysis/CKeyOfSong.h"
 #include "brindle/analysis/RomanNumeral.h"
-#include "brindle/chords/CChordHeavy.h"
 #include "brindle/chords/ReadChordText.h"
+#include "brindle/chords/WriteChordSymbol.h"
 #include "brindle/present/ShownNames.h"
 
 #include <fmt/format.h>
@@ -81,18 +81,6 @@ bool ReadChord(TWord& word, bool isNumeral, const CSignKeyLite& key,
     return !word.mChord.IsUndef();
 }
 
-// A symbol that the program reads as the same chord.
-std::string SymbolOf(const CChordLite& chord) {
-    CChordNamePrefs prefs = NamePrefs();
-    prefs.mOptionBrackets = 1;
-    prefs.mChordPrefC = 2;
-    const CChordLite withoutBass(chord.mRootKeyEnh, CKeyEnh_Undef, chord.mSemitones);
-    std::string symbol = withoutBass.ToChordHeavy(CChordHeavy::DefaultWrapIntvl).Name(prefs);
-    std::erase(symbol, ' ');
-    if (chord.IsSlashChord()) symbol += "/" + KeyName(chord.mBassKeyEnh);
-    return symbol;
-}
-
 // The numerals of all words in one key; empty for the marks.
 std::vector<std::string> Numerals(const std::vector<TWord>& words, const CSignKeyLite& key,
                                   const TNumeralOptions& options) {
@@ -115,13 +103,14 @@ std::string WordsJson(const std::vector<TWord>& words, const CSignKeyLite& key, 
     for (std::size_t i = 0; i < words.size(); ++i) {
         const TWord& word = words[i];
         if (word.IsMark()) continue;
-        list.push_back({{"Symbol", areNumerals ? SymbolOf(word.mChord) : Printable(word.mTyped)},
-                        {"Numeral", roman[i]},
-                        {"Nashville", nashville[i]},
-                        {"RootKeyEnh", KeyEnhToJson(word.mChord.mRootKeyEnh)},
-                        {"BassKeyEnh", KeyEnhToJson(word.mChord.mBassKeyEnh)},
-                        {"Semitones", word.mChord.mSemitones.Mask()},
-                        {"Intervals", IntervalsToJson(word.mChord.mSemitones)}});
+        list.push_back(
+            {{"Symbol", areNumerals ? WriteChordSymbol(word.mChord) : Printable(word.mTyped)},
+             {"Numeral", roman[i]},
+             {"Nashville", nashville[i]},
+             {"RootKeyEnh", KeyEnhToJson(word.mChord.mRootKeyEnh)},
+             {"BassKeyEnh", KeyEnhToJson(word.mChord.mBassKeyEnh)},
+             {"Semitones", word.mChord.mSemitones.Mask()},
+             {"Intervals", IntervalsToJson(word.mChord.mSemitones)}});
     }
     return JsonText({{"Key", key.NameLong(NamePrefs())}, {"Chords", list}});
 }
@@ -137,7 +126,7 @@ std::string WordsText(const std::vector<TWord>& words, const CSignKeyLite& key, 
         if (words[i].IsMark()) {
             text += words[i].mTyped;
         } else {
-            text += toChords ? SymbolOf(words[i].mChord) : turned[i];
+            text += toChords ? WriteChordSymbol(words[i].mChord) : turned[i];
         }
     }
     return text + '\n';

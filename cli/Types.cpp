@@ -2,8 +2,8 @@
 #include "cli/CommandLine.h"
 #include "cli/Json.h"
 
-#include "brindle/chords/CChordHeavy.h"
 #include "brindle/chords/CChordTypes.h"
+#include "brindle/chords/WriteChordSymbol.h"
 #include "brindle/present/CTable.h"
 #include "brindle/present/ShownNames.h"
 
@@ -22,7 +22,9 @@ constexpr TCommandHelp kHelp{
 };
 
 std::string NameOnC(const CChordType& type) {
-    return CChordHeavy(CKeyEnh_C, type.mIntvls, CKeyEnh_Undef).NameWithSlash(NamePrefs());
+    CSemitones semitones;
+    for (const int intvl : type.mIntvls) semitones.AddIntvl(intvl % 12);
+    return "C" + ChordSymbolSuffix(semitones);
 }
 
 std::string TypesJson(const CChordTypeVec& types) {

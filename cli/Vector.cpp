@@ -6,7 +6,7 @@
 
 #include "brindle/analysis/CHarmAnlsChordForMetro.h"
 #include "brindle/analysis/ChordVectorText.h"
-#include "brindle/chords/CChordHeavy.h"
+#include "brindle/chords/WriteChordSymbol.h"
 #include "brindle/present/CTable.h"
 #include "brindle/present/ShownNames.h"
 
@@ -67,7 +67,7 @@ std::string NameOf(const CHarmAnlsChordForMetro& chord) {
     if (chord.IsUndef() || chord.IsWildcard() || chord.IsEADGBE()) {
         return chord.NameForMetroExport(true);
     }
-    return chord.ToChordHeavy(CChordHeavy::DefaultWrapIntvl).NameWithSlash(NamePrefs());
+    return WriteChordSymbol(chord);
 }
 
 Json VectorToJson(const TShownVector& shown) {

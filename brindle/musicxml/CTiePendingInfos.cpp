@@ -89,6 +89,21 @@ CTiePendingInfo* CTiePendingInfos::PendingDurationFor(const CMuxmlNote& note) {
     return it == mInfos.end() ? nullptr : &it->second.front();
 }
 
+std::vector<CMuxmlNote> CTiePendingInfos::NotesLeftOpen() const {
+    std::vector<CMuxmlNote> notes;
+    for (const auto& [key, chains] : mInfos) {
+        for (const CTiePendingInfo& chain : chains) {
+            notes.push_back(chain.mNotes.front());
+            notes.back().mLengthAsDuration = chain.mPendingLengthAsDuration;
+            notes.back().mLengthAsMidiTicks = chain.mPendingLengthAsMidiTicks;
+        }
+    }
+    std::stable_sort(notes.begin(), notes.end(), [](const CMuxmlNote& a, const CMuxmlNote& b) {
+        return a.mPositionAsMidiTicks < b.mPositionAsMidiTicks;
+    });
+    return notes;
+}
+
 void CTiePendingInfos::StopEncounteredFor(const CMuxmlNote& note) {
     const auto it = mInfos.find(KeyOf(note));
     if (it == mInfos.end()) return;

@@ -46,6 +46,9 @@ public:
     /// Forgets the chain of the note, if there is one.
     void StopEncounteredFor(const CMuxmlNote& note);
 
+    /// The first note of each open chain with the length of the chain, by position.
+    [[nodiscard]] std::vector<CMuxmlNote> NotesLeftOpen() const;
+
     [[nodiscard]] std::size_t size() const { return mCount; }
     [[nodiscard]] bool empty() const { return mCount == 0; }
 

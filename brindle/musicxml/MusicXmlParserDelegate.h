@@ -63,6 +63,9 @@ struct MusicXmlParserDelegate {
     std::function<void(std::string_view name, std::int32_t midiChannel)>
         didEncounterInstrumentWithName;
     std::function<void(const CMuxmlNote& note)> didEncounterNote;
+    /// A note whose tie never ends, with the length of what is tied to it. Told before the end of the
+    /// part; such a note is no other call.
+    std::function<void(const CMuxmlNote& note)> didLeaveTieOpen;
     std::function<void(const CPositionedXMLElement& direction)> didEncounterDirection;
     /// `didEncounterCtrChangePedal:pedalType:value:` Not sent.
     std::function<void(std::int32_t position, std::int32_t pedalType, std::int32_t value)>

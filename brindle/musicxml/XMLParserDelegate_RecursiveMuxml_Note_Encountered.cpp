@@ -95,9 +95,9 @@ TNote::TDeliver TNote::SetPlaceAndJoinTies(std::int32_t& ticks) {
     const bool starts = Holds(ties, TMuxmlEnum_StartStop_Start);
     const bool stops = Holds(ties, TMuxmlEnum_StartStop_Stop);
     if (stops && !starts) return CloseChain(position, ticks);
+    note.mPositionAsMidiTicks = position;
     if (starts && stops) context.TiePendingInfos.ContinueEncounteredFor(note, ticks);
     if (starts && !stops) context.TiePendingInfos.StartEncounteredFor(note, ticks);
-    note.mPositionAsMidiTicks = position;
     if (!ties.empty()) return TDeliver_No;
     note.mLengthAsMidiTicks = ticks;
     return TDeliver_Yes;

@@ -99,6 +99,9 @@ void XMLParserDelegate_RecursiveMuxml_Part::
 
 void XMLParserDelegate_RecursiveMuxml_Part::encounteredPartEnd() {
     MusicXmlContext& context = Context();
+    for (const CMuxmlNote& note : context.TiePendingInfos.NotesLeftOpen()) {
+        TellHost<&brindle::MusicXmlParserDelegate::didLeaveTieOpen>(note);
+    }
     context.CurrentPartGatheredInfo()->mPartEndPosAsMidiTicks = context.CurrentPosAsMidiTicks;
     TellHost<&brindle::MusicXmlParserDelegate::didEncounterPartEnd>(
         context.mCurrentPartGatheredInfo);

@@ -16,14 +16,34 @@ int ChannelOfPart(const CImportedPart& part, std::size_t index) {
     return channel < kPercussionChannel ? channel : channel + 1;
 }
 
+// Each instrument of a part may have a channel of its own; drums without one have that of drums.
+int ChannelOfNote(const CImportedPart& part, const CImportedEvent& note, int channel) {
+    if (note.mMidiChannel) return std::min(*note.mMidiChannel, kChannels - 1);
+    return note.mIsUnpitched && !part.mChannel ? kPercussionChannel : channel;
+}
+
+void AddPrograms(const CImportedPart& part, int channel, CMidiTrack& track) {
+    if (part.mProgram) track.mPrograms.push_back({0, channel, *part.mProgram});
+    for (const auto& [id, instrument] : part.mInstruments) {
+        if (!instrument.mProgram || !instrument.mChannel || instrument.mChannel == part.mChannel) {
+            continue;
+        }
+        track.mPrograms.push_back({0, *instrument.mChannel, *instrument.mProgram});
+    }
+}
+
 CMidiTrack TrackOf(const CImportedPart& part, int channel) {
     CMidiTrack track;
     track.mName = part.mName;
-    if (part.mProgram) track.mPrograms.push_back({0, channel, *part.mProgram});
-    for (const CImportedEvent& event : part.mEvents) {
-        if (!event.mIsNote || !event.mLength || event.mNoteNr < 0) continue;
-        track.mNotes.push_back({event.mPosition, *event.mLength, channel,
-                                static_cast<int>(event.mNoteNr), event.mVelocity});
+    AddPrograms(part, channel, track);
+    for (const auto* const events : {&part.mEvents, &part.mNotesLeftOpen}) {
+        for (const CImportedEvent& event : *events) {
+            const std::int64_t key = event.mMidiKey ? *event.mMidiKey : event.mNoteNr;
+            if (!event.mIsNote || !event.mLength || key < 0) continue;
+            track.mNotes.push_back({event.mPosition, *event.mLength,
+                                    ChannelOfNote(part, event, channel), static_cast<int>(key),
+                                    event.mVelocity});
+        }
     }
     return track;
 }

@@ -61,6 +61,11 @@ std::string PartText(CImportedPart part, const CPaint& paint) {
                     part.mMeasures.size() == 1 ? "bar" : "bars", notes,
                     notes == 1 ? "note" : "notes", Quarters(part.mEnd));
     text += table.Text(paint, "  ");
+    for (const CImportedEvent& note : part.mNotesLeftOpen) {
+        text += fmt::format("\n  The tie of {} at {} does not end; it is played for {} quarters\n",
+                            note.mWhat, Quarters(note.mPosition),
+                            note.mLength ? Quarters(*note.mLength) : "?");
+    }
     return text;
 }
 

@@ -82,6 +82,7 @@ public:
             if (scorePart.attribute("id") != part.mID) continue;
             imported.mProgram = MidiNumber(scorePart, "midi-program");
             imported.mChannel = MidiNumber(scorePart, "midi-channel");
+            ReadInstruments(scorePart, imported);
             break;
         }
     }
@@ -94,7 +95,13 @@ public:
         events.push_back(std::move(event));
     }
 
-    void Note(const CMuxmlNote& note) const {
+    void Note(const CMuxmlNote& note) const { Part().mEvents.push_back(EventOf(note)); }
+
+    void NoteLeftOpen(const CMuxmlNote& note) const {
+        Part().mNotesLeftOpen.push_back(EventOf(note));
+    }
+
+    [[nodiscard]] CImportedEvent EventOf(const CMuxmlNote& note) const {
         CImportedEvent event;
         event.mIsNote = true;
         event.mPosition = note.mPositionAsMidiTicks;
@@ -106,7 +113,12 @@ public:
         event.mVelocity = note.mVelocity;
         event.mVoice = note.mVoice;
         event.mStaff = note.mStaff;
-        Part().mEvents.push_back(std::move(event));
+        event.mIsUnpitched = note.mNoteType == TMuxmlEnum_NoteType_Unpitched;
+        if (const CImportedInstrument* const instrument = InstrumentOf(note)) {
+            if (event.mIsUnpitched) event.mMidiKey = instrument->mUnpitchedKey;
+            event.mMidiChannel = instrument->mChannel;
+        }
+        return event;
     }
 
     void SignTime(const CMuxmlSignTime& time) const {
@@ -145,6 +157,25 @@ private:
     // A time signature may be told before its part starts.
     [[nodiscard]] bool IsOfFirstPart() const {
         return mScore->mParts.size() == (mScore->mIsInPart ? 1U : 0U);
+    }
+
+    static void ReadInstruments(const XmlNode& scorePart, CImportedPart& part) {
+        for (const XmlNode& midi : scorePart.descendants("midi-instrument")) {
+            part.mInstruments.insert_or_assign(
+                midi.attribute("id").value_or(""),
+                CImportedInstrument{MidiNumber(midi, "midi-program"),
+                                    MidiNumber(midi, "midi-channel"),
+                                    MidiNumber(midi, "midi-unpitched")});
+        }
+    }
+
+    // Notes of a part with one instrument need not name it. Null if it is not known.
+    [[nodiscard]] const CImportedInstrument* InstrumentOf(const CMuxmlNote& note) const {
+        const auto& instruments = Part().mInstruments;
+        const XmlNode named = note.mNoteXML.firstDescendant("instrument");
+        if (!named) return instruments.size() == 1 ? &instruments.begin()->second : nullptr;
+        const auto found = instruments.find(named.attribute("id").value_or(""));
+        return found == instruments.end() ? nullptr : &found->second;
     }
 
     // Numbers of MIDI count from 1 in scores.
@@ -190,6 +221,7 @@ MusicXmlParserDelegate HostFor(CImportedScore& score) {
                    fmt::format("direction {}", type ? type.name() : "of no type"));
     };
     host.didEncounterNote = [filler](const CMuxmlNote& note) { filler.Note(note); };
+    host.didLeaveTieOpen = [filler](const CMuxmlNote& note) { filler.NoteLeftOpen(note); };
     return host;
 }
 

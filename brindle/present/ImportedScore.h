@@ -5,6 +5,8 @@
 #include "brindle/present/MidiFile.h"
 
 #include <cstdint>
+#include <functional>
+#include <map>
 #include <optional>
 #include <string>
 #include <vector>
@@ -25,6 +27,10 @@ struct CImportedEvent {
     int mVelocity = 0;
     std::int32_t mVoice = 0;
     std::int32_t mStaff = 0;
+    bool mIsUnpitched = false;
+    /// Of a note, what its instrument is played with: from 0, where the score tells it.
+    std::optional<int> mMidiKey;
+    std::optional<int> mMidiChannel;
 };
 
 struct CImportedMeasure {
@@ -32,13 +38,24 @@ struct CImportedMeasure {
     std::string mNumber;
 };
 
+/// How MIDI plays an instrument of a part; all numbers from 0.
+struct CImportedInstrument {
+    std::optional<int> mProgram;
+    std::optional<int> mChannel;
+    std::optional<int> mUnpitchedKey;  ///< of all notes without a pitch
+};
+
 struct CImportedPart {
     std::string mID;
     std::string mName;
     std::optional<int> mProgram;  ///< from 0
     std::optional<int> mChannel;  ///< from 0
+    /// By the identifiers that notes have.
+    std::map<std::string, CImportedInstrument, std::less<>> mInstruments;
     std::vector<CImportedEvent> mEvents;
     std::vector<CImportedMeasure> mMeasures;
+    /// Notes whose ties never end: they are none of the events, and sound as long as is written.
+    std::vector<CImportedEvent> mNotesLeftOpen;
     std::int32_t mEnd = 0;
 };
 

@@ -20,7 +20,6 @@ constexpr auto kFolders = std::to_array<std::string_view>({
     "guitarchords",
     "musicxml",
     "song",
-    "song",
     "present",
 });
 constexpr std::size_t kProgram = kFolders.size();

@@ -4,6 +4,7 @@
 #include "brindle/chords/CChordLite.h"
 #include "brindle/musicxml/HarmonyKinds.h"
 #include "brindle/musicxml/TMusicXMLHarmony.h"
+#include "brindle/musicxml/internal/KindRows.h"
 #include "brindle/theory/CChordNamePrefs.h"
 
 #include <algorithm>
@@ -19,6 +20,8 @@ namespace {
 struct TKindAlias {
     std::string_view mAlias;
     std::string_view mKind;
+    /// A tone that the alias has beside those of the kind, in semitones above the root; 0 for none.
+    std::size_t mAddedTone = 0;
 };
 
 // Other names of kinds that scores use, or signs that they print, and the kind that has the same
@@ -41,6 +44,8 @@ constexpr auto kKindAliases = std::to_array<TKindAlias>({
     {"seventh", "dominant"},
     {"half-diminished-seventh", "half-diminished"},
     {"augmented-dominant-seventh", "augmented-seventh"},
+    {"augmented-ninth", "augmented-seventh", 2},
+    {"augmented-dominant-ninth", "augmented-seventh", 2},
     {"sixth", "major-sixth"},
     {"ninth", "dominant-ninth"},
     {"dominant-9th", "dominant-ninth"},
@@ -60,6 +65,8 @@ constexpr auto kKindAliases = std::to_array<TKindAlias>({
     {"+", "augmented"},
     {"+7", "augmented-seventh"},
     {"7+", "augmented-seventh"},
+    {"+9", "augmented-seventh", 2},
+    {"9+", "augmented-seventh", 2},
     {"o", "diminished"},
     {"\u00B0", "diminished"},
     {"o7", "diminished-seventh"},
@@ -110,6 +117,29 @@ constexpr auto kKindsFromMostTones = std::to_array<std::string_view>({
     "power",
 });
 
+// A kind that another one is a part of would never be found behind it.
+constexpr bool AreFromMostTones() {
+    for (std::size_t i = 0; i < kKindsFromMostTones.size(); ++i) {
+        const TKindRow* row = KindRowOf(kKindsFromMostTones[i]);
+        const TKindRow* before = i == 0 ? row : KindRowOf(kKindsFromMostTones[i - 1]);
+        if (row == nullptr || before == nullptr || before->mCount < row->mCount) return false;
+    }
+    return true;
+}
+static_assert(AreFromMostTones());
+
+// The three augmented sixths and the pedal are kinds that no printed sign asks for.
+static_assert(kKindsFromMostTones.size() + 4 == kKindRows.size());
+
+constexpr bool AllAliasesHaveAKind() {
+    for (const TKindAlias& alias : kKindAliases) {
+        if (alias.mKind != kNoChord && KindRowOf(alias.mKind) == nullptr) return false;
+        if (KindRowOf(alias.mAlias) != nullptr) return false;
+    }
+    return true;
+}
+static_assert(AllAliasesHaveAKind());
+
 bool IsKind(std::string_view word) {
     return word == kNoChord || !XMLHarmonyKindToIntvlSetExceptRoot(word).empty();
 }
@@ -128,16 +158,27 @@ std::string_view WithoutBlanks(std::string_view text) {
     return text.substr(begin, text.find_last_not_of(' ') + 1 - begin);
 }
 
-// The kind that another word for it means, empty for a word without meaning.
-std::string KindOfAlias(std::string_view word) {
+void AddTone(TMusicXMLHarmony& harmony, std::size_t intvl) {
+    harmony.mDegrees.push_back({std::string(kDegreeOfSemitone[intvl]), 0, "add"});
+}
+
+// Takes the kind that another word for it means. False for a word without meaning.
+bool SetKindOfAlias(TMusicXMLHarmony& harmony, std::string_view word) {
     std::string folded = Folded(word);
-    if (IsKind(folded)) return folded;
-    for (const std::string_view name : {word, std::string_view(folded)}) {
-        for (const TKindAlias& row : kKindAliases) {
-            if (row.mAlias == name) return std::string(row.mKind);
-        }
+    if (IsKind(folded)) {
+        harmony.mKind = std::move(folded);
+        return true;
     }
-    return {};
+    for (const std::string_view name : {word, std::string_view(folded)}) {
+        const auto* const row =
+            std::find_if(kKindAliases.begin(), kKindAliases.end(),
+                         [name](const TKindAlias& alias) { return alias.mAlias == name; });
+        if (row == kKindAliases.end()) continue;
+        harmony.mKind = row->mKind;
+        if (row->mAddedTone > 0) AddTone(harmony, row->mAddedTone);
+        return true;
+    }
+    return false;
 }
 
 // The kind with the most of these tones and no other one, and degrees for what is left.
@@ -153,7 +194,7 @@ void SetTones(TMusicXMLHarmony& harmony, CSemitones tones) {
     }
     for (std::size_t intvl = 1; intvl < kDegreeOfSemitone.size(); ++intvl) {
         if ((left >> intvl & 1) == 0) continue;
-        harmony.mDegrees.push_back({std::string(kDegreeOfSemitone[intvl]), 0, "add"});
+        AddTone(harmony, intvl);
     }
 }
 
@@ -163,11 +204,9 @@ void SetKind(TMusicXMLHarmony& harmony, std::string_view printed) {
     if (IsKind(harmony.mKind)) return;
     printed = WithoutBlanks(printed);
     if (printed.size() > kLongestPrinted) printed = {};
-    std::string kind = KindOfAlias(harmony.mKind);
-    if (kind.empty() && !printed.empty()) kind = KindOfAlias(printed);
-    if (!kind.empty()) {
-        harmony.mKind = std::move(kind);
-    } else if (!printed.empty()) {
+    if (SetKindOfAlias(harmony, std::string(harmony.mKind))) return;
+    if (!printed.empty() && SetKindOfAlias(harmony, printed)) return;
+    if (!printed.empty()) {
         const CChordLite chord("C" + std::string(printed), CChordNamePrefs());
         SetTones(harmony, chord.mSemitones);
     } else {
