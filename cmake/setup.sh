@@ -7,7 +7,7 @@ root=$(cd "$(dirname "$(readlink -f "${BASH_SOURCE[0]}")")/.." && pwd)
 program_packages=(g++ cmake ninja-build pkg-config libboost-dev libfmt-dev nlohmann-json3-dev
                   libcli11-dev libxml2-dev libzip-dev libplist-dev gettext)
 # The same for the tests and the benches.
-test_packages=(doctest-dev libbenchmark-dev)
+test_packages=(doctest-dev libbenchmark-dev python3-jsonschema)
 
 say() { printf 'brindle: %s\n' "$*" >&2; }
 
