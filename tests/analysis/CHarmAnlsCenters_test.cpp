@@ -61,3 +61,18 @@ TEST_CASE("The center that sorts last is taken for the one that occurs most") {
     CheckExpected("center_most_occurrent",
                   {{"CHarmAnlsCenters::FindMostOccurentHarmCenter", MostOccurrent}});
 }
+
+TEST_CASE("A center that takes over the next one has the chords of both") {
+    CHarmAnlsCenters centers(3);
+    for (std::size_t n = 0; n < centers.size(); ++n) {
+        centers[n].mPosition = 4.0 * static_cast<double>(n);
+        centers[n].mChords.resize(n + 1);
+    }
+    const auto behind =
+        centers._MergeHarmCentersAndEraseSecond(centers.begin(), centers.begin() + 1);
+    REQUIRE(centers.size() == 2);
+    CHECK(centers[0].mChords.size() == 3);
+    CHECK(centers[0].mPosition == 0.0);
+    CHECK(behind == centers.begin() + 1);
+    CHECK(behind->mPosition == 8.0);
+}

@@ -171,3 +171,19 @@ TEST_CASE("A dictionary with a vector of anything but 46 numbers gives the undef
     chord.FromDictionary(json::array());
     CHECK(chord.mSemitones.IsEmpty());
 }
+
+TEST_CASE("A chord simplified in place is the simplified chord") {
+    for (const CSemitones semitones :
+         {CSemitones{0, 3, 7}, CSemitones{0, 4, 7, 10}, CSemitones{0, 3, 6, 9}}) {
+        for (const bool dropBass : {false, true}) {
+            TMetro chord = kCMinorOverB;
+            chord.mSemitones = semitones;
+            TMetro plain = chord;
+            plain.SimplifyToMajorOrMinor(dropBass);
+            CHECK(MetroForm(plain) == MetroForm(chord.SimplifiedToMajorOrMinor(dropBass)));
+            TMetro known = chord;
+            known.SimplifyToRecognizedMetroChord(dropBass);
+            CHECK(MetroForm(known) == MetroForm(chord.SimplifiedToRecognizedMetroChord(dropBass)));
+        }
+    }
+}

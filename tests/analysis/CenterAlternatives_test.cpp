@@ -147,3 +147,19 @@ TEST_CASE("Lists of centers answer for their longest and for their first center"
     CHECK(CHarmAnlsCentersInChords{}.OverallBeginAndEndInputChord().first ==
           CHarmAnlsCentersInChords::chord_iterator{});
 }
+
+TEST_CASE("Readings over one range are simultaneous, and a longer one around them contains them") {
+    CReadings readings;
+    readings.mReadings = {{1.0, {readings.Center(0, 4)}},
+                          {1.0, {readings.Center(0, 4, 7)}},
+                          {1.0, {readings.Center(1, 3)}},
+                          {1.0, {readings.Center(5, 9)}}};
+    auto& list = readings.mReadings;
+    const auto others = list.FindSimultaneousAlternatives(list.begin());
+    REQUIRE(others.size() == 1);
+    CHECK(&others[0].get() == &list[1]);
+    CHECK(list.FindSimultaneousAlternatives(list.begin() + 2).empty());
+    CHECK(list.HasLongerContainingAlternernative(list.begin() + 2));
+    CHECK_FALSE(list.HasLongerContainingAlternernative(list.begin()));
+    CHECK_FALSE(list.HasLongerContainingAlternernative(list.begin() + 3));
+}

@@ -318,3 +318,15 @@ TEST_CASE("Usual chords need no memory but their own") {
     CHECK(inside(&*unfolded.Notes().begin()));
     CHECK(inside(&*unfolded.IntvlSet().begin()));
 }
+
+TEST_CASE("Intervals are added above the root, and notes outside a key are counted") {
+    CChordHeavy chord(kC, CSemitones{0, 4, 7}, {}, 12);
+    const auto tones = [&] { return chord.Semitones(); };
+    chord.AddIntvlSetAboveRootNote(CIntvlSet{10});
+    CHECK(tones() == CSemitones{0, 4, 7, 10});
+    chord.AddIntvlSetInCompingRange(CIntvlSet{14});
+    CHECK(tones() == CSemitones{0, 2, 4, 7, 10});
+    // Of C9 only the B flat lies outside C major.
+    CHECK(chord.CountNotesNotInSignKey(CSignKeyHeavy(kC, TSignKeyTypeNoUndef_Major)) == 1);
+    CHECK(chord.CountNotesNotInSignKey(CSignKeyHeavy(CKeyEnh_F, TSignKeyTypeNoUndef_Major)) == 0);
+}

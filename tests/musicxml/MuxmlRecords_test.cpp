@@ -3,8 +3,11 @@
 #include "brindle/musicxml/CMuxmlPart.h"
 #include "brindle/musicxml/CMuxmlSignKey.h"
 #include "brindle/musicxml/CMuxmlSignTime.h"
+#include "brindle/musicxml/CTransposeNoteCounts.h"
 #include "brindle/musicxml/MuxmlEnums.h"
 #include "brindle/musicxml/MuxmlJson.h"
+#include "brindle/musicxml/TMusicXMLHarmony.h"
+#include "brindle/theory/CChordNamePrefs.h"
 #include "brindle/theory/CSignKeyHeavy.h"
 #include "brindle/theory/Trace.h"
 #include "tests/support/Expected.h"
@@ -214,4 +217,32 @@ TEST_CASE("Transpositions are ordered by all but the octave") {
         CHECK_FALSE(flute < other);
         CHECK_FALSE(other < flute);
     }
+}
+
+TEST_CASE("Two harmonies are compared by all that sounds, and by their place if asked for") {
+    TMusicXMLHarmony harmony;
+    harmony.mPosition = 4.0;
+    harmony.mRoot = {"B", -1};
+    harmony.mKind = "minor";
+    CHECK(harmony.mRoot.ToKeyNr({}) == 10);
+    CHECK(harmony.mRoot.ToKeyNrAndEnh({}) == CKeyEnh_Bb);
+    TMusicXMLHarmony later = harmony;
+    later.mPosition = 8.0;
+    CHECK_FALSE(harmony.CompareAllMembers(later, TComparePos_Yes));
+    CHECK(harmony.CompareAllMembers(later, TComparePos_No));
+    later.mBass = {"F", 0};
+    CHECK_FALSE(harmony.CompareAllMembers(later, TComparePos_No));
+}
+
+TEST_CASE("The transposition of a part is that of most of its notes") {
+    CTransposeNoteCounts counts;
+    CHECK_FALSE(counts.TransposeWithMostNotes().mHasBeenReadFromXML);
+    CMuxmlTranspose clarinet;
+    clarinet.mChromatic = -2;
+    clarinet.mDiatonic = -1;
+    counts.Add(CMuxmlTranspose(), 10);
+    counts.Add(clarinet, 6);
+    CHECK(counts.TransposeWithMostNotes().mChromatic == 0);
+    counts.Add(clarinet, 6);
+    CHECK(counts.TransposeWithMostNotes().mChromatic == -2);
 }

@@ -179,3 +179,13 @@ TEST_CASE("Notes order by number, then from flat to sharp, and print") {
     CHECK(JSONStringOf(CNote_Undef) == R"({"name":"Undef","nr":-1,"enh":"undef"})");
     CHECK(TraceString(KeyDirectionFrom(60, 59)) == "Down");
 }
+
+TEST_CASE("A note takes number and spelling at once as it is made with them") {
+    for (const TEnh enh : {TEnh_b, TEnh_n, TEnh_s, TEnh_Undef}) {
+        for (const std::int64_t noteNr : {60, 61, 66, 127}) {
+            CNote note(12, TEnh_n);
+            note.SetNoteNrAndEnh(noteNr, enh);
+            CHECK(note == CNote(noteNr, enh));
+        }
+    }
+}

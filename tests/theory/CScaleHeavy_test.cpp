@@ -200,3 +200,30 @@ TEST_CASE("A key number without a spelling takes the root with fewer signs") {
     CHECK(CScaleHeavy(6, st_maj).RootKeyEnh() == CKeyEnh_Fis);
     CHECK(CScaleHeavy(15, st_maj).IsUndef());
 }
+
+TEST_CASE("A mode has the notes of its major scale") {
+    const struct {
+        CKeyEnh mRoot;
+        TScaleType mType;
+        CKeyEnh mMajorRoot;
+    } rows[] = {{CKeyEnh_C, st_maj, CKeyEnh_C},
+                {{2, TEnh_n}, st_dorian, CKeyEnh_C},
+                {{4, TEnh_n}, st_phrygian, CKeyEnh_C},
+                {{7, TEnh_n}, st_mixolydian, CKeyEnh_C}};
+    for (const auto& row : rows) {
+        const CScaleHeavy mode(row.mRoot, row.mType);
+        const CScaleHeavy major = mode.RelatedIonianScale();
+        CHECK(major.RootKeyEnh() == row.mMajorRoot);
+        CHECK(major.ScaleType() == st_maj);
+        CHECK(major.ToKeyNrSet() == mode.ToKeyNrSet());
+    }
+}
+
+TEST_CASE("A scale spells a black key as it is told, by its step or by a note of it") {
+    CScaleHeavy scale(CKeyEnh{7, TEnh_n}, st_maj);
+    CHECK(scale.EnhForKeyNr(6) == TEnh_s);
+    scale.SetEnhForNote(CNote(66, TEnh_s), TEnh_b);
+    CHECK(scale.EnhForKeyNr(6) == TEnh_b);
+    scale.SetEnhForChromStep(11, TEnh_s);  // F sharp is eleven semitones above G
+    CHECK(scale.EnhForKeyNr(6) == TEnh_s);
+}
