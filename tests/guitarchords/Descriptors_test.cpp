@@ -158,9 +158,10 @@ TEST_CASE("A detached fingering is named over its root, and copied with all that
     const GChTuningDescr guitar = TuningDescrOf(0, {52, 57, 62, 67, 71, 76});
     GChChordDescr chord;
     chord.setMuted(true, 0);
-    chord.addFingerNum(3, 3, 1, 1, 0);
-    chord.addFingerNum(2, 2, 2, 2, 0);
-    chord.addFingerNum(1, 1, 4, 4, 0);
+    // Index 0 is the first fret: the open C major chord.
+    chord.addFingerNum(3, 2, 1, 1, 0);
+    chord.addFingerNum(2, 1, 2, 2, 0);
+    chord.addFingerNum(1, 0, 4, 4, 0);
     chord.setRootNote(0);
     CHECK(chord.chordNameWithTuningDescr(guitar) == "C");
     chord.setRootNote(12);
