@@ -165,6 +165,9 @@ TEST_CASE("A library that is saved is the old one or the new one, whenever the w
                                  name == "second2 saved";
             CHECK(isWhole);
         }
+        // What the dead have left beside, which the next writer would look at.
+        fs::remove_all(folder.Path());
+        fs::create_directory(folder.Path());
         REQUIRE(oldPackage.Write(path));
     }
 }
