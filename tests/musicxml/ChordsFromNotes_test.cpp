@@ -13,7 +13,7 @@ namespace brindle::test {
 namespace {
 
 CScoreNotes ScoreOf(const std::string& file) {
-    std::ifstream stream(BRINDLE_TEST_DATA "/scores/" + file, std::ios::binary);
+    std::ifstream stream(BRINDLE_SOURCE_DIR "/examples/scores/" + file, std::ios::binary);
     std::ostringstream bytes;
     bytes << stream.rdbuf();
     CScoreNotes score;
@@ -46,7 +46,7 @@ std::string Text(const CChordsFromNotes& chords) {
 }
 
 TEST_CASE("A prelude of broken chords has the chords that musicians hear in it") {
-    const CScoreNotes score = ScoreOf("prelude_in_c.musicxml");
+    const CScoreNotes score = ScoreOf("prelude-in-c.musicxml");
     const std::string bars =
         "0+4 C  4+4 Dm7/C  8+4 G7/B  12+4 C  16+4 Am/C  20+4 D7/C  24+4 G/B  28+4 Cmaj7/B  "
         "32+4 Am7  36+4 D7  40+4 G  ";
