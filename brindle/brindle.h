@@ -32,6 +32,8 @@
 #include "brindle/analysis/ProgressionFinder.h"
 #include "brindle/analysis/ReadChordSheet.h"
 #include "brindle/analysis/ReadHarmony.h"
+#include "brindle/analysis/ReadNumerals.h"
+#include "brindle/analysis/ReadRomanText.h"
 #include "brindle/analysis/RomanNumeral.h"
 #include "brindle/analysis/RouteRanges.h"
 #include "brindle/analysis/ScaleLite.h"

@@ -3,9 +3,13 @@
 #include "cli/Input.h"
 #include "cli/Json.h"
 #include "cli/KeyText.h"
+#include "cli/RomanTextTable.h"
+#include "cli/TypedChords.h"
 
 #include "brindle/analysis/CHarmAnlsChords.h"
 #include "brindle/analysis/CKeyOfSong.h"
+#include "brindle/analysis/ReadNumerals.h"
+#include "brindle/analysis/ReadRomanText.h"
 #include "brindle/analysis/RomanNumeral.h"
 #include "brindle/chords/ReadChordText.h"
 #include "brindle/chords/WriteChordSymbol.h"
@@ -13,7 +17,9 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
 #include <memory>
+#include <span>
 
 namespace brindle::cli {
 namespace {
@@ -24,6 +30,8 @@ constexpr TCommandHelp kHelp{
     "  brindle numerals \"ii7 V7 | I^7\" --key \"Eb major\"\n"
     "  brindle numerals \"2-7 57 | 1\" --key G\n"
     "  brindle numerals \"Fm7 Bb7/D Eb\" --key Eb --figures\n"
+    "  brindle numerals \"i iio6 V6/5/V Cad64 V7\" --key \"C minor\" --figures\n"
+    "  brindle numerals --from romantext analysis.txt\n"
     "  brindle numerals \"Fm7 Bb7 Eb\" --key Eb --nashville\n"
     "  cat song.txt | brindle numerals - --key \"A minor\" --json\n",
 };
@@ -32,60 +40,37 @@ struct TNumeralsOptions {
     std::vector<std::string> mWords;
     std::string mKey;
     std::string mFrom = "guess";
+    bool mIsLenient = false;
     TNumeralOptions mNumerals;
     CFormatOptions mFormat;
 };
 
-// A word of the text: a chord, or a mark of the bars, which stays as it is.
-struct TWord {
-    std::string mTyped;
-    std::size_t mLine = 0;
-    std::size_t mColumn = 0;
-    CChordLite mChord;
+// The first chord tells whether the text has numerals. No chord symbol begins as a numeral does.
+bool AreNumerals(std::string_view text, const CSignKeyLite& key, const TNumeralsOptions& options) {
+    if (options.mFrom != "guess") return options.mFrom == "numerals";
+    const std::vector<CNumeralWord> words = NumeralWords(text);
+    const auto first = std::find_if(words.begin(), words.end(),
+                                    [](const CNumeralWord& word) { return !word.IsMark(); });
+    return first != words.end() && ChordFromNumeral(first->mText, key).has_value();
+}
 
-    [[nodiscard]] bool IsMark() const { return mTyped == "|" || mTyped == "."; }
-};
-
-std::vector<TWord> WordsWithPlaces(const std::vector<std::string>& lines) {
-    std::vector<TWord> words;
-    for (std::size_t line = 0; line < lines.size(); ++line) {
-        std::size_t from = 0;
-        for (const std::string& word : WordsOf(lines[line])) {
-            const std::size_t column = lines[line].find(word, from);
-            from = column + word.size();
-            words.push_back({word, line, column, {}});
+CNumeralsReading ReadChordWords(std::string_view text) {
+    CNumeralsReading reading{NumeralWords(text), {}};
+    for (CNumeralWord& word : reading.mWords) {
+        if (word.IsMark()) continue;
+        word.mChord = ReadChordText(word.mText).mChord;
+        if (word.mChord.IsUndef()) {
+            reading.mFaults.push_back({word.mLine, word.mColumn, "this is no chord"});
         }
     }
-    return words;
-}
-
-// The first chord tells whether the text has numerals. No chord symbol begins as a numeral does.
-bool AreNumerals(const std::vector<TWord>& words, const CSignKeyLite& key,
-                 const TNumeralsOptions& options) {
-    if (options.mFrom != "guess") return options.mFrom == "numerals";
-    for (const TWord& word : words) {
-        if (!word.IsMark()) return ChordFromNumeral(word.mTyped, key).has_value();
-    }
-    return false;
-}
-
-// False for the first word that is no chord; the others are then not read.
-bool ReadChord(TWord& word, bool isNumeral, const CSignKeyLite& key,
-               const TNumeralOptions& options) {
-    if (word.IsMark()) return true;
-    if (!isNumeral) {
-        word.mChord = ReadChordText(word.mTyped).mChord;
-    } else if (const auto chord = ChordFromNumeral(word.mTyped, key, options)) {
-        word.mChord = *chord;
-    }
-    return !word.mChord.IsUndef();
+    return reading;
 }
 
 // The numerals of all words in one key; empty for the marks.
-std::vector<std::string> Numerals(const std::vector<TWord>& words, const CSignKeyLite& key,
+std::vector<std::string> Numerals(const std::vector<CNumeralWord>& words, const CSignKeyLite& key,
                                   const TNumeralOptions& options) {
     CHarmAnlsChords chords;
-    for (const TWord& word : words) {
+    for (const CNumeralWord& word : words) {
         chords.emplace_back(word.mChord, static_cast<double>(chords.size()));
     }
     CKeyOfSong keys;
@@ -93,18 +78,18 @@ std::vector<std::string> Numerals(const std::vector<TWord>& words, const CSignKe
     return NumeralsOf(chords, keys, options);
 }
 
-std::string WordsJson(const std::vector<TWord>& words, const CSignKeyLite& key, bool areNumerals,
-                      TNumeralOptions options) {
+std::string WordsJson(const std::vector<CNumeralWord>& words, const CSignKeyLite& key,
+                      bool areNumerals, TNumeralOptions options) {
     options.mNashville = false;
     const std::vector<std::string> roman = Numerals(words, key, options);
     options.mNashville = true;
     const std::vector<std::string> nashville = Numerals(words, key, options);
     Json list = Json::array();
     for (std::size_t i = 0; i < words.size(); ++i) {
-        const TWord& word = words[i];
-        if (word.IsMark()) continue;
+        const CNumeralWord& word = words[i];
+        if (word.IsMark() || word.mChord.IsUndef()) continue;
         list.push_back(
-            {{"Symbol", areNumerals ? WriteChordSymbol(word.mChord) : Printable(word.mTyped)},
+            {{"Symbol", areNumerals ? WriteChordSymbol(word.mChord) : Printable(word.mText)},
              {"Numeral", roman[i]},
              {"Nashville", nashville[i]},
              {"RootKeyEnh", KeyEnhToJson(word.mChord.mRootKeyEnh)},
@@ -116,15 +101,15 @@ std::string WordsJson(const std::vector<TWord>& words, const CSignKeyLite& key, 
 }
 
 // The lines as they were typed, with the words turned.
-std::string WordsText(const std::vector<TWord>& words, const CSignKeyLite& key, bool toChords,
-                      const TNumeralOptions& options) {
+std::string WordsText(const std::vector<CNumeralWord>& words, const CSignKeyLite& key,
+                      bool toChords, const TNumeralOptions& options) {
     std::vector<std::string> turned(words.size());
     if (!toChords) turned = Numerals(words, key, options);
     std::string text;
     for (std::size_t i = 0; i < words.size(); ++i) {
         if (i > 0) text += words[i].mLine == words[i - 1].mLine ? ' ' : '\n';
-        if (words[i].IsMark()) {
-            text += words[i].mTyped;
+        if (words[i].mChord.IsUndef()) {
+            text += Printable(words[i].mText);
         } else {
             text += toChords ? WriteChordSymbol(words[i].mChord) : turned[i];
         }
@@ -132,25 +117,48 @@ std::string WordsText(const std::vector<TWord>& words, const CSignKeyLite& key, 
     return text + '\n';
 }
 
-TStatus Numerals(const TNumeralsOptions& options) {
+TStatus NumeralsOfWords(const TNumeralsOptions& options) {
+    if (options.mKey.empty()) {
+        return Fail(TStatus::BadUsage, "--key is required; see brindle numerals --help");
+    }
     const auto key = ReadKeyOption(options.mKey);
     if (!key) return TStatus::BadUsage;
     const auto lines = TypedLines(options.mWords);
     if (!lines) return TStatus::BadInput;
-    std::vector<TWord> words = WordsWithPlaces(*lines);
-    const bool areNumerals = AreNumerals(words, *key, options);
-    for (TWord& word : words) {
-        if (ReadChord(word, areNumerals, *key, options.mNumerals)) continue;
-        return FailAt(
-            TStatus::BadInput,
-            areNumerals ? "this is no Roman numeral and no Nashville number" : "this is no chord",
-            (*lines)[word.mLine], word.mColumn);
+    const std::string text = fmt::format("{}", fmt::join(*lines, "\n"));
+    const bool areNumerals = AreNumerals(text, *key, options);
+    const CNumeralsReading reading =
+        areNumerals ? ReadNumerals(text, *key, options.mNumerals) : ReadChordWords(text);
+    if (!reading.mFaults.empty()) {
+        const std::size_t count = options.mIsLenient ? reading.mFaults.size() : 1;
+        PrintFaults(text, std::span(reading.mFaults).first(count), options.mIsLenient);
+        if (!options.mIsLenient) return TStatus::BadInput;
     }
     if (options.mFormat.Format() == TFormat::Json) {
-        return Print(WordsJson(words, *key, areNumerals, options.mNumerals));
+        return Print(WordsJson(reading.mWords, *key, areNumerals, options.mNumerals));
     }
     const bool toChords = areNumerals && !options.mNumerals.mNashville;
-    return Print(WordsText(words, *key, toChords, options.mNumerals));
+    return Print(WordsText(reading.mWords, *key, toChords, options.mNumerals));
+}
+
+TStatus NumeralsOfAnalysis(const TNumeralsOptions& options) {
+    if (options.mWords.size() != 1) {
+        return Fail(TStatus::BadUsage, "--from romantext reads one file, or - for standard input");
+    }
+    const auto text = ReadInput(options.mWords.front());
+    if (!text) return TStatus::BadInput;
+    const CRomanTextReading reading = ReadRomanText(*text);
+    if (!reading.mFaults.empty()) {
+        const std::size_t count = options.mIsLenient ? reading.mFaults.size() : 1;
+        PrintFaults(*text, std::span(reading.mFaults).first(count), options.mIsLenient);
+        if (!options.mIsLenient) return TStatus::BadInput;
+    }
+    const bool isJson = options.mFormat.Format() == TFormat::Json;
+    return Print(isJson ? RomanTextJson(reading) : RomanTextText(reading, PaintOfOutput()));
+}
+
+TStatus Numerals(const TNumeralsOptions& options) {
+    return options.mFrom == "romantext" ? NumeralsOfAnalysis(options) : NumeralsOfWords(options);
 }
 
 }  // namespace
@@ -158,7 +166,9 @@ TStatus Numerals(const TNumeralsOptions& options) {
 void AddNumeralOptions(CCommand& command, TNumeralOptions& options) {
     command.AddFlag("--nashville", options.mNashville, "Print Nashville numbers: 2-7 57 1");
     command.AddFlag("--figures", options.mFigures,
-                    "Inversions are figures: V65, I6 (otherwise V7/7, I/3)");
+                    "Inversions are figures: V65, I6 (otherwise V7/^7, I/^3)");
+    command.AddFlag("--by-key", options.mByKey,
+                    "What has no sign is of the key: IV7 in C is Fmaj7, vi in A minor is F#m");
     command.AddFlag("--printed-signs", options.mPrintedSigns,
                     "Diminished chords as in print: \xC3\xB8 and \xC2\xB0 for h and o");
 }
@@ -166,11 +176,16 @@ void AddNumeralOptions(CCommand& command, TNumeralOptions& options) {
 void AddNumerals(CCommand& program) {
     CCommand& command = program.AddCommand(kHelp);
     const auto options = std::make_shared<TNumeralsOptions>();
-    command.AddArgument("TEXT", options->mWords, "Numerals or chords; - reads standard input")
+    command
+        .AddArgument("TEXT", options->mWords,
+                     "Numerals or chords, or the file of an analysis; - reads standard input")
         .Required();
-    command.AddOption("--key", "KEY", options->mKey, "The key, as in \"A minor\" or Bb").Required();
-    command.AddChoice("--from", options->mFrom, {"guess", "numerals", "chords"},
-                      "What the text has; the first word tells");
+    command.AddOption("--key", "KEY", options->mKey,
+                      "The key, as in \"A minor\" or Bb; an analysis has its own");
+    command.AddChoice("--from", options->mFrom, {"guess", "numerals", "chords", "romantext"},
+                      "What the text has; the first word tells numerals from chords");
+    command.AddFlag("--lenient", options->mIsLenient,
+                    "Go on where a word is not understood, and leave it as it is");
     AddNumeralOptions(command, options->mNumerals);
     options->mFormat.AddTo(command, {"text", "json"});
     command.OnCall([options] { return Numerals(*options); });

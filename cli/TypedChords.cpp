@@ -37,16 +37,19 @@ void PrintFault(std::string_view text, const CChordSheetFault& fault, bool isWar
                     fault.mColumn);
 }
 
-void PrintFaults(std::string_view text, const TChordSong& song, bool areWarnings) {
-    const std::size_t count = std::min(song.mFaults.size(), kMostWarnings);
-    for (std::size_t i = 0; i < count; ++i) PrintFault(text, song.mFaults[i], areWarnings);
-    if (song.mFaults.size() > count) {
+}  // namespace
+
+void PrintFaults(std::string_view text, std::span<const CChordSheetFault> faults,
+                 bool areWarnings) {
+    const std::size_t count = std::min(faults.size(), kMostWarnings);
+    for (const CChordSheetFault& fault : faults.first(count)) {
+        PrintFault(text, fault, areWarnings);
+    }
+    if (faults.size() > count) {
         Fail(TStatus::BadInput,
-             fmt::format("warning: and {} more like these", song.mFaults.size() - count));
+             fmt::format("warning: and {} more like these", faults.size() - count));
     }
 }
-
-}  // namespace
 
 void CTypedChords::AddTo(CCommand& command) {
     command.AddChoice("--symbols", mReader, {"all", "native"},
@@ -127,7 +130,7 @@ TChordSong CTypedChords::ReadSong(std::string_view text, const TChordStringParse
 std::optional<TChordSong> CTypedChords::ReadSongOrFail(std::string_view text,
                                                        const TChordStringParse& parse) const {
     TChordSong song = ReadSong(text, parse);
-    PrintFaults(text, song, mIsLenient);
+    PrintFaults(text, song.mFaults, mIsLenient);
     if (!song.mFaults.empty() && !mIsLenient) return std::nullopt;
     return song;
 }

@@ -7,6 +7,7 @@
 #include "brindle/analysis/ReadChordSheet.h"
 
 #include <optional>
+#include <span>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -31,6 +32,9 @@ struct TChordSong {
     /// What is not understood. Without --lenient the first fault, and then no chords.
     std::vector<CChordSheetFault> mFaults;
 };
+
+/// Prints faults with their lines and carets under the places, a score of them at most.
+void PrintFaults(std::string_view text, std::span<const CChordSheetFault> faults, bool areWarnings);
 
 /// How chords and songs that people type are read, with the options for it: --symbols and
 /// --lenient, and for songs --from and --even. Every subcommand that takes chords reads them here.

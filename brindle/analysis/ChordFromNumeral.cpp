@@ -1,262 +1,377 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/analysis/RomanNumeral.h"
+#include "brindle/analysis/internal/AugmentedSixths.h"
+#include "brindle/analysis/internal/CFoldedNumeral.h"
+#include "brindle/analysis/internal/NumeralDegree.h"
 #include "brindle/analysis/internal/NumeralTables.h"
+#include "brindle/analysis/internal/NumeralTones.h"
 #include "brindle/theory/CChordNamePrefs.h"
 #include "brindle/theory/KeyIntervals.h"
-#include "brindle/theory/KeyNames.h"
-#include "brindle/theory/MakeSensefulEnh.h"
 
 #include <algorithm>
+
+// A numeral is read in pieces, as the slashes cut it: the chord, what it is applied to (one degree
+// or several, the last of them in the key of the song), and a bass. The chord is a head, a degree
+// or a word such as Ger, and a tail with its signs and figures.
 
 namespace brindle {
 namespace {
 
-// No numeral is longer; what is longer is not looked at.
-constexpr std::size_t kLongestNumeral = 64;
+constexpr std::string_view kNoDegree = "this is no degree";
+constexpr std::string_view kNoSign = "this sign behind the degree is not understood";
+constexpr std::string_view kNoGroup = "what stands in brackets is not understood";
+constexpr std::string_view kNoTarget = "a degree or a bass is expected behind the slash";
+constexpr std::string_view kNoTones = "nothing is left of the chord";
+constexpr std::string_view kTooLong = "this is too long for a numeral";
+constexpr std::string_view kNoKey = "there is no key";
 
-constexpr int kMostAccidentals = 2;
+constexpr std::string_view kWhiteSpace = " \t\n\r\f\v";
 
-constexpr std::array<int, 7> kWhiteKeys{0, 2, 4, 5, 7, 9, 11};
+/// What the slashes cut. The views are pieces of the folded text.
+struct TPieces {
+    static constexpr std::size_t kMostTargets = 8;
 
-struct TReplacement {
-    std::string_view mWritten;
-    std::string_view mRead;
+    std::string_view mChord;
+    std::array<std::string_view, kMostTargets> mTargets;
+    std::size_t mTargetCount = 0;
+    std::string_view mBass;
+    /// Behind `/^`: the degree counts as it is written.
+    bool mIsExactBass = false;
+    /// The half-diminished sign of RomanText, vii/o7: then mChord is only the degree.
+    std::string_view mSlashedTail;
+    std::string_view mFault;
+    std::string_view mFaultPiece;
+
+    void Fail(std::string_view fault, std::string_view piece) {
+        mFault = fault;
+        mFaultPiece = piece;
+    }
 };
 
-// What people write for the signs of the tables.
-constexpr auto kOtherSigns = std::to_array<TReplacement>({
-    {"\xC3\xB8", "h"},      // ø
-    {"\xC3\x98", "h"},      // Ø
-    {"\xC2\xB0", "o"},      // °
-    {"\xC2\xBA", "o"},      // º
-    {"\xE2\x96\xB3", "^"},  // a white triangle
-    {"\xCE\x94", "^"},      // a Delta
-    {"maj", "^"},
-    {"M", "^"},
-    {"dim", "o"},
-    {"aug", "+"},
-});
+bool IsDigits(std::string_view text) {
+    return !text.empty() &&
+           std::all_of(text.begin(), text.end(), [](char c) { return c >= '0' && c <= '9'; });
+}
 
-std::string Folded(std::string_view text) {
-    std::string folded(text);
-    ConvertUtf8SharpAndFlatToAscii(folded);
-    for (const TReplacement& sign : kOtherSigns) {
-        for (std::size_t at = folded.find(sign.mWritten); at != std::string::npos;
-             at = folded.find(sign.mWritten, at + 1)) {
-            folded.replace(at, sign.mWritten.size(), sign.mRead);
+// Whether the digits on both sides of a slash are one figure, 6/5. A Nashville number has no such
+// figures: there 46/5 is a chord with a sixth over the fifth degree.
+bool IsSlashedFigure(std::string_view before, std::string_view behind) {
+    if (!IsDigits(behind) || behind.size() > 2 || ReadDegree(before).mIsDigit) return false;
+    const std::size_t last = before.find_last_not_of("0123456789/");
+    if (last == before.npos) return false;
+    std::array<char, 4> digits;
+    std::size_t count = 0;
+    for (const std::string_view text : {before.substr(last + 1), behind}) {
+        for (const char c : text) {
+            if (c == '/') continue;
+            if (count == digits.size()) return false;
+            digits[count++] = c;
         }
     }
-    return folded;
+    const std::string_view figure(digits.data(), count);
+    return std::find(kSlashedFigures.begin(), kSlashedFigures.end(), figure) !=
+           kSlashedFigures.end();
 }
 
-// The key so many letters and semitones above another: the third degree of E flat is a G.
-CKeyEnh SpelledAbove(const CKeyEnh& from, int letters, int semitones) {
-    const TEnh enh = MakeSensefulEnhForKeyNrAssumingCMajor(from.mKeyNr, from.mEnh);
-    const int natural = FoldIntoOctave(std::int64_t{from.mKeyNr} - EnhToSemitone(enh));
-    const auto letter = std::find(kWhiteKeys.begin(), kWhiteKeys.end(), natural);
-    const int keyNr = FoldIntoOctave(std::int64_t{from.mKeyNr} + semitones);
-    const int goal =
-        kWhiteKeys[static_cast<std::size_t>(letter - kWhiteKeys.begin() + letters) % 7];
-    const TEnh spelling = SemitoneToEnh(SmallestKeyIntvlBetween(goal, keyNr));
-    return {keyNr, MakeSensefulEnhForKeyNrAssumingCMajor(keyNr, spelling)};
-}
-
-/// A degree as it is written, and what is left of the text behind it.
-struct TReadDegree {
-    TNumeralDegree mDegree{0, 0};
-    bool mIsSmall = false;
-    bool mIsDigit = false;
-    std::string_view mRest;
-
-    [[nodiscard]] bool IsRead() const { return mDegree.mNumber > 0; }
-};
-
-// Sharps before the degree, flats as a negative number.
-int ReadAccidental(std::string_view& text) {
-    int accidental = 0;
-    while (!text.empty() && (text.front() == '#' || text.front() == 'b')) {
-        accidental += text.front() == '#' ? 1 : -1;
-        text.remove_prefix(1);
+// 7/5 is not a figure, but 7/5/3 is one.
+std::string_view TakeFigureWithSlashes(std::string_view& text) {
+    std::size_t end = std::min(text.find('/'), text.size());
+    for (int more = 0; more < 2; ++more) {
+        std::size_t next = end;
+        for (std::size_t probe = end, count = 0; probe < text.size() && count < 2; ++count) {
+            const std::size_t behind = std::min(text.find('/', probe + 1), text.size());
+            const std::string_view digits = text.substr(probe + 1, behind - probe - 1);
+            const bool isFigure = IsSlashedFigure(text.substr(0, probe), digits);
+            if (isFigure) next = behind;
+            if (!IsDigits(digits)) break;
+            probe = behind;
+        }
+        if (next == end) break;
+        end = next;
     }
-    return accidental;
+    const std::string_view figure = text.substr(0, end);
+    text.remove_prefix(end);
+    return figure;
 }
 
-// The longest Roman number that the text begins with, in large or in small letters.
-TReadDegree ReadRomanNumber(std::string_view text) {
-    TReadDegree read;
-    std::size_t longest = 0;
-    for (std::size_t i = 0; i < kRomanNumbers.size(); ++i) {
-        const std::string_view number = kRomanNumbers[i];
-        if (number.size() <= longest || number.size() > text.size()) continue;
-        const bool isSmall = text.front() >= 'a';
-        const bool isHere =
-            std::equal(number.begin(), number.end(), text.begin(), [&](char large, char typed) {
-                return typed == (isSmall ? static_cast<char>(large - 'A' + 'a') : large);
-            });
-        if (!isHere) continue;
-        longest = number.size();
-        read = {{static_cast<int>(i) + 1, 0}, isSmall, false, text.substr(longest)};
+const TAugmentedSixth* TakeAugmentedSixth(std::string_view& text) {
+    for (const TAugmentedSixth& chord : kAugmentedSixths) {
+        if (!text.starts_with(chord.mWord)) continue;
+        text.remove_prefix(chord.mWord.size());
+        return &chord;
     }
-    return read;
+    return nullptr;
 }
 
-TReadDegree ReadDegree(std::string_view text) {
-    constexpr std::string_view substitute = "sub";
-    const bool isSubstitute = text.starts_with(substitute);
-    if (isSubstitute) text.remove_prefix(substitute.size());
-    const int accidental = ReadAccidental(text);
-    if (text.empty() || accidental < -kMostAccidentals || accidental > kMostAccidentals) return {};
-    TReadDegree read;
-    if (text.front() >= '1' && text.front() <= '7') {
-        read = {{text.front() - '0', 0}, false, true, text.substr(1)};
-    } else {
-        read = ReadRomanNumber(text);
-    }
-    if (!read.IsRead()) return {};
-    read.mDegree.mAccidental = accidental;
-    if (isSubstitute) {
-        // A tritone away from the dominant.
-        if (read.mDegree.mNumber != 5 || accidental != 0 || read.mIsSmall) return {};
-        read.mDegree = {2, -1};
-    }
-    return read;
+bool IsWordOfNeapolitan(std::string_view text) {
+    return text.starts_with('N');
 }
 
-CKeyEnh KeyOfDegree(TNumeralDegree degree, const CSignKeyLite& key) {
-    const bool isMinor = key.mSignKeyType == TSignKeyType_Minor;
-    const bool isLowInMinor = degree.mNumber == 3 || degree.mNumber == 6 || degree.mNumber == 7;
-    if (isMinor && isLowInMinor && degree.mAccidental == -1) degree.mAccidental = 0;
-    const auto& degrees = DegreesOf(key.mSignKeyType);
-    const auto natural = std::find_if(degrees.begin(), degrees.end(), [&](const auto& candidate) {
-        return candidate.mNumber == degree.mNumber && candidate.mAccidental == 0;
-    });
-    const auto dist = static_cast<int>(natural - degrees.begin());
-    return SpelledAbove(key.mRootKeyEnh, degree.mNumber - 1, dist + degree.mAccidental);
-}
-
-/// The tones of a numeral above its root, and the tone that is the bass, 0 for the root.
-struct TReadTones {
-    CSemitones mSemitones;
-    int mBassTone = 0;
-};
-
-CSemitones TonesOfSign(std::string_view text, bool isMinor) {
-    const auto row = std::find_if(kNumeralSigns.begin(), kNumeralSigns.end(),
-                                  [&](const TNumeralSign& sign) { return sign.mText == text; });
-    if (row == kNumeralSigns.end()) return {};
-    return isMinor ? row->mMinor : row->mMajor;
-}
-
-TReadTones TonesOfFigure(std::string_view text, bool isMinor) {
-    for (const TInversionFigure& figure : kInversionFigures) {
-        if (!text.ends_with(figure.mFigure)) continue;
-        std::string sign(text.substr(0, text.size() - figure.mFigure.size()));
-        if (figure.mHasSeventh) sign += '7';
-        const CSemitones tones = TonesOfSign(sign, isMinor);
-        const int count = figure.mHasSeventh ? 4 : 3;
-        if (tones.size() == count) return {tones, figure.mTone};
-    }
-    return {};
-}
-
-TReadTones ReadTones(const TReadDegree& degree, bool figuresFirst) {
-    std::string_view text = degree.mRest;
-    bool isMinor = degree.mIsSmall;
-    if (degree.mIsDigit && (text.starts_with('-') || text.starts_with('m'))) {
-        isMinor = true;
-        text.remove_prefix(1);
-    }
-    const TReadTones plain{TonesOfSign(text, isMinor), 0};
-    const TReadTones figured = TonesOfFigure(text, isMinor);
-    const bool isFigured = !figured.mSemitones.IsEmpty();
-    if (isFigured && (figuresFirst || plain.mSemitones.IsEmpty())) return figured;
-    return plain;
-}
-
-// The interval of a tone that is counted from below.
-int IntvlOfTone(CSemitones semitones, int tone) {
-    for (int intvl = 0; intvl < 12; ++intvl) {
-        if (semitones.HasIntvl(intvl) && tone-- == 0) return intvl;
-    }
-    return 0;
-}
-
-// The letters from the root to a tone of a triad or a seventh chord: thirds upon thirds.
-CKeyEnh BassOfTone(const CKeyEnh& root, const TReadTones& tones) {
-    if (tones.mBassTone == 0) return CKeyEnh_Undef;
-    return SpelledAbove(root, 2 * tones.mBassTone, IntvlOfTone(tones.mSemitones, tones.mBassTone));
-}
-
-/// The texts between the slashes.
-struct TPieces {
-    std::string_view mNumeral;
-    std::string_view mTarget;
-    std::string_view mBass;
-    bool mIsValid = true;
-};
-
-bool IsRoman(std::string_view piece) {
+bool BeginsTarget(std::string_view piece) {
     const TReadDegree degree = ReadDegree(piece);
-    return degree.IsRead() && !degree.mIsDigit;
+    return (degree.IsRead() && !degree.mIsDigit) || IsWordOfNeapolitan(piece);
+}
+
+void CutPiece(std::string_view piece, TPieces& pieces) {
+    const bool isLast = !pieces.mBass.empty();
+    if (piece.empty() || isLast) return pieces.Fail(kNoTarget, piece);
+    if (BeginsTarget(piece)) {
+        if (pieces.mTargetCount == TPieces::kMostTargets) return pieces.Fail(kNoTarget, piece);
+        pieces.mTargets[pieces.mTargetCount++] = piece;
+        return;
+    }
+    pieces.mIsExactBass = piece.front() == '^';
+    if (pieces.mIsExactBass) piece.remove_prefix(1);
+    if (piece.empty()) return pieces.Fail(kNoTarget, piece);
+    pieces.mBass = piece;
 }
 
 TPieces PiecesOf(std::string_view text) {
     TPieces pieces;
-    std::size_t slash = text.find('/');
-    pieces.mNumeral = text.substr(0, slash);
-    while (slash != text.npos) {
-        text.remove_prefix(slash + 1);
-        slash = text.find('/');
-        const std::string_view piece = text.substr(0, slash);
-        const bool isTarget = IsRoman(piece) && pieces.mTarget.empty() && pieces.mBass.empty();
-        if (piece.empty() || (!isTarget && !pieces.mBass.empty())) pieces.mIsValid = false;
-        (isTarget ? pieces.mTarget : pieces.mBass) = piece;
+    pieces.mChord = TakeFigureWithSlashes(text);
+    while (!text.empty() && pieces.mFault.empty()) {
+        text.remove_prefix(1);
+        const std::string_view piece = text.substr(0, text.find('/'));
+        text.remove_prefix(piece.size());
+        const bool isFirst = pieces.mTargetCount == 0 && pieces.mBass.empty();
+        if (isFirst && piece.starts_with('o') && pieces.mSlashedTail.empty()) {
+            pieces.mSlashedTail = piece;
+        } else {
+            CutPiece(piece, pieces);
+        }
     }
     return pieces;
 }
 
-// "3", "b7" or "Eb".
-CKeyEnh ReadBass(std::string_view text, const CSignKeyLite& key) {
-    const TReadDegree degree = ReadDegree(text);
-    if (degree.IsRead()) {
-        const bool isBass = degree.mIsDigit && degree.mRest.empty();
-        return isBass ? KeyOfDegree(degree.mDegree, key) : CKeyEnh_Undef;
-    }
-    if (text.front() < 'A' || text.front() > 'G') return CKeyEnh_Undef;
-    CKeyEnh bass;
-    int consumed = 0;
-    bass.SetFromString(text, &consumed, ChordNamePrefsNonUTF8);
-    return static_cast<std::size_t>(consumed) == text.size() ? bass : CKeyEnh_Undef;
+/// A chord before its root and bass are spelled.
+struct TReadChord {
+    TNumeralDegree mDegree;
+    CSemitones mSemitones;
+    int mBass = 0;      ///< semitones above the root
+    int mBassStep = 1;  ///< the letters to it, 1 for the root
+    std::string_view mFault;
+    std::string_view mFaultPiece;
+};
+
+TReadChord Failed(std::string_view fault, std::string_view piece) {
+    TReadChord chord;
+    chord.mFault = fault;
+    chord.mFaultPiece = piece;
+    return chord;
 }
 
-// The key in which the numeral before the slash counts. It is major whatever the target, so that
-// viio is the leading tone of a minor chord, too.
-std::optional<CSignKeyLite> KeyOfTarget(std::string_view target, const CSignKeyLite& key) {
-    if (target.empty()) return key;
-    const TReadDegree degree = ReadDegree(target);
-    if (!degree.mRest.empty()) return std::nullopt;
-    return CSignKeyLite(KeyOfDegree(degree.mDegree, key), TSignKeyType_Major);
+bool ApplyGroups(const CFoldedNumeral& text, const TNumeralRoot& root, TReadTones& tones,
+                 TReadChord& chord) {
+    for (std::size_t i = 0; i < text.GroupCount(); ++i) {
+        if (ApplyGroup(text.Group(i), root, tones)) continue;
+        chord = Failed(kNoGroup, text.Group(i));
+        return false;
+    }
+    return true;
+}
+
+// Where the bass is left out, V6[no3][add4], the tone beside it that was added is the bass.
+int BassNearStep(CSemitones semitones, int step) {
+    for (const int near : {step, step + 1, step - 1}) {
+        const int bass = SemitoneOfStep(semitones, near);
+        if (bass >= 0) return bass;
+    }
+    return 0;
+}
+
+// The figure of such a chord, Ger6/5 or Ger+6; null for one that it does not have.
+const TAugmentedSixthFigure* FigureOfAugmentedSixth(std::string_view tail) {
+    if (tail.starts_with('+')) tail.remove_prefix(1);
+    const auto row =
+        std::find_if(kAugmentedSixthFigures.begin(), kAugmentedSixthFigures.end(),
+                     [&](const TAugmentedSixthFigure& known) { return known.mText == tail; });
+    return row == kAugmentedSixthFigures.end() ? nullptr : &*row;
+}
+
+// The letter of a tone above the flat sixth (third, fifth, sixth) or, in the French chord, above
+// the second degree.
+int StepInAugmentedSixth(int semitone, bool isFrench) {
+    if (semitone == 0) return 1;
+    if (semitone == 4) return 3;
+    if (semitone == 10) return isFrench ? 7 : 6;
+    return 5;
+}
+
+TReadChord ReadAugmentedSixth(const TAugmentedSixth& sixth, std::string_view tail,
+                              const CFoldedNumeral& text, TSignKeyType type) {
+    const TAugmentedSixthFigure* figure = FigureOfAugmentedSixth(tail);
+    if (figure == nullptr) return Failed(kNoSign, tail);
+    TReadChord chord;
+    chord.mDegree = FoldMinorFlat(sixth.mRoot, type);
+    const bool isFrench = sixth.mRoot.mNumber == 2;
+    chord.mBass = isFrench ? figure->mBassInFrench : figure->mBassInMost;
+    chord.mBassStep = StepInAugmentedSixth(chord.mBass, isFrench);
+    const int turn = sixth.mStepRoot;
+    TReadTones tones{sixth.mSemitones, 1};
+    tones.mSemitones.RotateRootToIx(turn);
+    const TNumeralDegree stepDegree = turn == 0 ? sixth.mRoot : TNumeralDegree{4, 1};
+    if (!ApplyGroups(text, {stepDegree, TSignKeyType_Minor, false}, tones, chord)) return chord;
+    tones.mSemitones.RotateRootToIx(12 - turn);
+    chord.mSemitones = tones.mSemitones;
+    return chord;
+}
+
+// In minor the leading tone is the root of viio7 and viiø7, whether or not it has its sharp. A viø7
+// is on the raised sixth for those who write figures.
+int RaisedInMinor(const TReadDegree& degree, bool isDiminished, const TNumeralOptions& options) {
+    if (!degree.mIsSmall || degree.mDegree.mAccidental != 0) return 0;
+    if (degree.mDegree.mNumber == 7) return isDiminished || options.mByKey ? 1 : 0;
+    if (degree.mDegree.mNumber != 6) return 0;
+    return options.mByKey || (isDiminished && options.mFigures) ? 1 : 0;
+}
+
+TNumeralDegree DegreeInKey(const TReadDegree& read, std::string_view tail, TSignKeyType type,
+                           const TNumeralOptions& options) {
+    TNumeralDegree degree = FoldMinorFlat(read.mDegree, type);
+    if (type != TSignKeyType_Minor) return degree;
+    const bool isDiminished = tail.starts_with('o') || tail.starts_with('h');
+    degree.mAccidental += RaisedInMinor(read, isDiminished, options);
+    return degree;
+}
+
+// vii/o7: the sign and the figures behind it.
+std::string_view HalfDiminishedTail(std::string_view slashed) {
+    constexpr auto tails = std::to_array<std::string_view>({"h", "h7", "h65", "h43", "h42", "h2"});
+    const auto row = std::find_if(tails.begin(), tails.end(), [&](std::string_view tail) {
+        return tail.substr(1) == slashed.substr(1);
+    });
+    return row == tails.end() ? std::string_view{} : *row;
+}
+
+/// The head of a chord, read: its degree, and the tail behind it.
+struct THead {
+    TReadDegree mDegree;
+    std::string_view mTail;
+    /// The word of the head goes with figures: N6 is an inversion.
+    bool mHasFigures = false;
+};
+
+THead ReadHead(std::string_view text, TSignKeyType type) {
+    for (const std::string_view word : {"Cad", "K"}) {
+        if (!text.starts_with(word)) continue;
+        const std::string_view tail = text.substr(word.size());
+        return {{{1, 0}, type == TSignKeyType_Minor, false, tail},
+                tail.empty() ? std::string_view("64") : tail,
+                true};
+    }
+    // A common-tone diminished chord has the tonic in it.
+    if (text.starts_with("CTo"))
+        return {{{1, 0}, true, false, text.substr(2)}, text.substr(2), true};
+    if (IsWordOfNeapolitan(text)) return {{{2, -1}, false, false, {}}, text.substr(1), true};
+    THead head{ReadDegree(text), {}, false};
+    head.mTail = head.mDegree.mRest;
+    return head;
+}
+
+TReadChord ReadChord(const TPieces& pieces, const CFoldedNumeral& text, TSignKeyType type,
+                     TNumeralOptions options) {
+    std::string_view tail = pieces.mChord;
+    if (const TAugmentedSixth* sixth = TakeAugmentedSixth(tail)) {
+        return ReadAugmentedSixth(*sixth, tail, text, type);
+    }
+    THead head = ReadHead(pieces.mChord, type);
+    if (!head.mDegree.IsRead()) return Failed(kNoDegree, pieces.mChord);
+    options.mFigures = options.mFigures || head.mHasFigures;
+    if (!pieces.mSlashedTail.empty()) {
+        const std::string_view tailOfSign = HalfDiminishedTail(pieces.mSlashedTail);
+        if (!head.mTail.empty() || tailOfSign.empty()) return Failed(kNoSign, pieces.mSlashedTail);
+        head.mTail = tailOfSign;
+    }
+    TReadChord chord;
+    chord.mDegree = DegreeInKey(head.mDegree, head.mTail, type, options);
+    const TNumeralRoot root{chord.mDegree, type, head.mDegree.mIsSmall};
+    TReadTones tones = TonesOfTail(head.mTail, root, options);
+    if (tones.mSemitones.IsEmpty()) return Failed(kNoSign, head.mTail);
+    if (!ApplyGroups(text, root, tones, chord)) return chord;
+    chord.mSemitones = tones.mSemitones;
+    if (tones.mBassStep != 1) {
+        chord.mBass = BassNearStep(tones.mSemitones, tones.mBassStep);
+        chord.mBassStep = StepOfSemitone(tones.mSemitones, chord.mBass);
+    }
+    return chord;
+}
+
+// "3", "b7" or "Eb".
+CKeyEnh ReadBass(const TPieces& pieces, const CSignKeyLite& key) {
+    const TReadDegree degree = ReadDegree(pieces.mBass);
+    if (degree.IsRead()) {
+        if (!degree.mIsDigit || !degree.mRest.empty()) return CKeyEnh_Undef;
+        return KeyOfDegree(
+            pieces.mIsExactBass ? degree.mDegree : FoldMinorFlat(degree.mDegree, key.mSignKeyType),
+            key);
+    }
+    const char letter = pieces.mBass.front();
+    if (pieces.mIsExactBass || letter < 'A' || letter > 'G') return CKeyEnh_Undef;
+    CKeyEnh bass;
+    int consumed = 0;
+    bass.SetFromString(pieces.mBass, &consumed, ChordNamePrefsNonUTF8);
+    return static_cast<std::size_t>(consumed) == pieces.mBass.size() ? bass : CKeyEnh_Undef;
+}
+
+// The key in which the numeral before the slash counts: that of the degree, minor for small
+// letters. The figures of a target do not count.
+std::optional<CSignKeyLite> KeyOfTarget(std::string_view target, const CSignKeyLite& key,
+                                        const TNumeralOptions& options) {
+    const THead head = ReadHead(target, key.mSignKeyType);
+    const TNumeralDegree degree = DegreeInKey(head.mDegree, head.mTail, key.mSignKeyType, options);
+    const TNumeralRoot root{degree, key.mSignKeyType, head.mDegree.mIsSmall};
+    if (TonesOfTail(head.mTail, root, options).mSemitones.IsEmpty()) return std::nullopt;
+    const bool isMinor = head.mDegree.mIsSmall || head.mTail.starts_with('m');
+    return CSignKeyLite(KeyOfDegree(degree, key),
+                        isMinor ? TSignKeyType_Minor : TSignKeyType_Major);
+}
+
+CNumeralReading Fault(std::string_view fault, std::string_view piece, const CFoldedNumeral& text) {
+    return {CChordLite_Undef, fault, text.OffsetOf(piece)};
+}
+
+CNumeralReading Finished(const TReadChord& chord, const CSignKeyLite& keyOfTarget,
+                         const TPieces& pieces, const CSignKeyLite& key,
+                         const CFoldedNumeral& text) {
+    const CKeyEnh root = KeyOfDegree(chord.mDegree, keyOfTarget);
+    CKeyEnh bass = CKeyEnh_Undef;
+    if (chord.mBass != 0) bass = SpelledAbove(root, chord.mBassStep - 1, chord.mBass);
+    if (!pieces.mBass.empty()) {
+        bass = ReadBass(pieces, key);
+        if (bass.IsUndef()) return Fault(kNoTarget, pieces.mBass, text);
+    }
+    return {CChordLite(root, bass, chord.mSemitones), {}, 0};
 }
 
 }  // namespace
 
+CNumeralReading ReadNumeral(std::string_view typed, const CSignKeyLite& key,
+                            const TNumeralOptions& options) {
+    if (key.IsUndef()) return {CChordLite_Undef, kNoKey, 0};
+    if (typed.find_first_of(kWhiteSpace) != typed.npos) return {CChordLite_Undef, kNoDegree, 0};
+    if (typed.size() > CFoldedNumeral::kLongest) return {CChordLite_Undef, kTooLong, 0};
+    const CFoldedNumeral text(typed);
+    if (!text.IsWhole())
+        return {CChordLite_Undef, kNoGroup, std::min(typed.find('['), typed.size())};
+    const TPieces pieces = PiecesOf(text.Text());
+    if (!pieces.mFault.empty()) return Fault(pieces.mFault, pieces.mFaultPiece, text);
+    CSignKeyLite keyOfTarget = key;
+    for (std::size_t i = pieces.mTargetCount; i-- > 0;) {
+        const auto target = KeyOfTarget(pieces.mTargets[i], keyOfTarget, options);
+        if (!target) return Fault(kNoSign, pieces.mTargets[i], text);
+        keyOfTarget = *target;
+    }
+    const TReadChord chord = ReadChord(pieces, text, keyOfTarget.mSignKeyType, options);
+    if (!chord.mFault.empty()) return Fault(chord.mFault, chord.mFaultPiece, text);
+    if (chord.mSemitones.IsEmpty()) return {CChordLite_Undef, kNoTones, 0};
+    return Finished(chord, keyOfTarget, pieces, key, text);
+}
+
 std::optional<CChordLite> ChordFromNumeral(std::string_view text, const CSignKeyLite& key,
                                            const TNumeralOptions& options) {
-    if (key.IsUndef() || text.size() > kLongestNumeral) return std::nullopt;
-    const std::string folded = Folded(text);
-    const TPieces pieces = PiecesOf(folded);
-    const TReadDegree degree = ReadDegree(pieces.mNumeral);
-    const auto keyOfTarget = KeyOfTarget(pieces.mTarget, key);
-    if (!pieces.mIsValid || !degree.IsRead() || !keyOfTarget) return std::nullopt;
-    const TReadTones tones = ReadTones(degree, options.mFigures);
-    if (tones.mSemitones.IsEmpty()) return std::nullopt;
-    const CKeyEnh root = KeyOfDegree(degree.mDegree, *keyOfTarget);
-    CKeyEnh bass = BassOfTone(root, tones);
-    if (!pieces.mBass.empty()) {
-        bass = ReadBass(pieces.mBass, key);
-        if (bass.IsUndef()) return std::nullopt;
-    }
-    return CChordLite(root, bass, tones.mSemitones);
+    const CNumeralReading reading = ReadNumeral(text, key, options);
+    if (reading.mChord.IsUndef()) return std::nullopt;
+    return reading.mChord;
 }
 
 }  // namespace brindle

@@ -4,71 +4,37 @@
 #include "brindle/analysis/CHarmAnlsChords.h"
 #include "brindle/analysis/CKeyOfSong.h"
 #include "brindle/analysis/internal/KeyChords.h"
-#include "brindle/analysis/internal/NumeralTables.h"
+#include "brindle/analysis/internal/NumeralDegree.h"
+#include "brindle/analysis/internal/NumeralSign.h"
+#include "brindle/analysis/internal/NumeralTones.h"
 #include "brindle/theory/KeyIntervals.h"
+#include "brindle/theory/MakeSensefulEnh.h"
 
 #include <algorithm>
-#include <iterator>
+#include <array>
+#include <cstdint>
 
 namespace brindle {
 namespace {
 
 constexpr int kDominantDegree = 7;
 
-bool IsSmall(TKeyChordClass chordClass) {
-    switch (chordClass) {
-        case TKeyChordClass_Min:
-        case TKeyChordClass_Min7:
-        case TKeyChordClass_HDim:
-        case TKeyChordClass_Dim:
-            return true;
-        case TKeyChordClass_Triad:
-        case TKeyChordClass_Maj7:
-        case TKeyChordClass_Dom:
-        case TKeyChordClass_Open:
-            return false;
-    }
-    return false;
+int IntvlBetween(const CKeyEnh& from, const CKeyEnh& to) {
+    return FoldIntoOctave(std::int64_t{to.mKeyNr} - from.mKeyNr);
 }
 
-std::string_view OpenSign(CSemitones semitones) {
-    const bool isSus4 = semitones.HasIntvl(5);
-    if (!isSus4 && !semitones.HasIntvl(2)) return "5";
-    if (semitones.HasIntvl(10)) return "7sus";
-    return isSus4 ? "sus" : "sus2";
+int DistToTonic(const CKeyEnh& keyEnh, const CSignKeyLite& key) {
+    return IntvlBetween(key.mRootKeyEnh, keyEnh);
 }
 
-// One of kNumeralSigns, of the chord's class.
-std::string_view SignOf(CSemitones semitones) {
-    const auto has = [&](int intvl) { return semitones.HasIntvl(intvl); };
-    switch (KeyChordClassOf(semitones)) {
-        case TKeyChordClass_Triad:
-            return "";
-        case TKeyChordClass_Maj7:
-            return has(11) ? "^7" : "6";
-        case TKeyChordClass_Dom:
-            if (has(8) && !has(7)) return has(10) ? "+7" : "+";
-            return "7";
-        case TKeyChordClass_Min:
-            if (has(11)) return "^7";
-            if (has(9)) return has(10) ? "13" : "6";
-            return "";
-        case TKeyChordClass_Min7:
-            return "7";
-        case TKeyChordClass_HDim:
-            return "h7";
-        case TKeyChordClass_Dim:
-            return has(9) ? "o7" : "o";
-        case TKeyChordClass_Open:
-            return OpenSign(semitones);
-    }
-    return "";
+TNumeralDegree DegreeAt(int dist, const CSignKeyLite& key) {
+    return DegreesOf(key.mSignKeyType)[static_cast<std::size_t>(dist)];
 }
 
-std::string DegreeText(int dist, bool isSmall, const CSignKeyLite& key, bool inDigits) {
-    const TNumeralDegree degree = DegreesOf(key.mSignKeyType)[static_cast<std::size_t>(dist)];
+std::string DegreeText(TNumeralDegree degree, bool isSmall, bool inDigits) {
     std::string text;
-    if (degree.mAccidental != 0) text = degree.mAccidental > 0 ? "#" : "b";
+    for (int i = degree.mAccidental; i > 0; --i) text += '#';
+    for (int i = degree.mAccidental; i < 0; ++i) text += 'b';
     if (inDigits) return text + static_cast<char>('0' + degree.mNumber);
     for (const char c : kRomanNumbers[static_cast<std::size_t>(degree.mNumber - 1)]) {
         text += isSmall ? static_cast<char>(c - 'A' + 'a') : c;
@@ -76,85 +42,102 @@ std::string DegreeText(int dist, bool isSmall, const CSignKeyLite& key, bool inD
     return text;
 }
 
-int DistToTonic(const CKeyEnh& keyEnh, const CSignKeyLite& key) {
-    return FoldIntoOctave(std::int64_t{keyEnh.mKeyNr} - key.mRootKeyEnh.mKeyNr);
-}
-
-/// What a chord is to the chord that follows it: "V", "subV" or "vii" of that chord's degree.
-struct TApplied {
-    std::string_view mNumeral;
-    std::string mTarget;
+/// The degree that a chord is written as, in its key or in that of the degree it is applied to.
+struct TWrittenDegree {
+    std::string mText;
+    TNumeralRoot mRoot;
+    CKeyEnh mKeyEnh;      ///< the root as the numeral spells it
+    std::string mTarget;  ///< "/ii", empty in the key
 };
 
-TApplied AppliedTo(const CChordLite& next, const CChordLite& chord, const CSignKeyLite& key) {
-    if (next.IsUndef()) return {};
-    const int target = DistToTonic(next.mRootKeyEnh, key);
-    if (target == 0 || !key.Semitones().HasIntvl(target)) return {};
+/// What a chord is to the chord that follows it.
+struct TApplied {
+    std::string_view mNumeral;
+    TNumeralDegree mDegree;
+};
+
+constexpr TApplied kDominant{"V", {5, 0}};
+constexpr TApplied kSubstitute{"subV", {2, -1}};
+constexpr TApplied kLeadingTone{"vii", {7, 0}};
+
+const TApplied* AppliedBy(const CChordLite& chord, const CSignKeyLite& key, int target) {
     const TKeyChordClass chordClass = KeyChordClassOf(chord.mSemitones);
     const int dist = DistToTonic(chord.mRootKeyEnh, key);
     const int up = FoldIntoOctave(target - dist);
-    std::string_view numeral;
-    if (chordClass == TKeyChordClass_Dom && dist != kDominantDegree) {
-        if (up == 5) numeral = "V";
-        if (up == 11) numeral = "subV";
-    } else if (chordClass == TKeyChordClass_Dim && up == 1) {
-        numeral = "vii";
+    if (chordClass == TKeyChordClass_Dim) return up == 1 ? &kLeadingTone : nullptr;
+    if (chordClass != TKeyChordClass_Dom || dist == kDominantDegree) return nullptr;
+    if (up == 5) return &kDominant;
+    return up == 11 ? &kSubstitute : nullptr;
+}
+
+// The degree as it is written in minor where the sign or the option would raise it: a flat stands
+// for the sixth and seventh of the scale.
+TNumeralDegree HeldInMinor(TNumeralDegree degree, CSemitones semitones, const CSignKeyLite& key,
+                           const TNumeralOptions& options) {
+    if (key.mSignKeyType != TSignKeyType_Minor || degree.mAccidental != 0) return degree;
+    if (!HasSmallNumeral(semitones) || degree.mNumber < 6) return degree;
+    const TKeyChordClass chordClass = KeyChordClassOf(semitones);
+    const bool isDiminished = chordClass == TKeyChordClass_HDim || chordClass == TKeyChordClass_Dim;
+    const bool isRaisedBySign = isDiminished && (degree.mNumber == 7 || options.mFigures);
+    if (isRaisedBySign || options.mByKey) degree.mAccidental = -1;
+    return degree;
+}
+
+TWrittenDegree OwnDegree(const CChordLite& chord, const CSignKeyLite& key,
+                         const TNumeralOptions& options) {
+    const bool isSmall = HasSmallNumeral(chord.mSemitones);
+    const TNumeralDegree degree = DegreeAt(DistToTonic(chord.mRootKeyEnh, key), key);
+    TNumeralDegree held = degree;
+    if (!options.mNashville) held = HeldInMinor(degree, chord.mSemitones, key, options);
+    std::string text = DegreeText(held, isSmall, options.mNashville);
+    const TKeyChordClass chordClass = KeyChordClassOf(chord.mSemitones);
+    const bool isMinor = chordClass == TKeyChordClass_Min || chordClass == TKeyChordClass_Min7;
+    if (options.mNashville && isMinor) text += '-';
+    return {text, {degree, key.mSignKeyType, isSmall}, KeyOfDegree(degree, key), {}};
+}
+
+TWrittenDegree DegreeBefore(const CChordLite* next, const CChordLite& chord,
+                            const CSignKeyLite& key, const TNumeralOptions& options) {
+    if (next == nullptr || next->IsUndef() || options.mNashville) {
+        return OwnDegree(chord, key, options);
     }
-    if (numeral.empty()) return {};
-    const bool isSmall = IsSmall(KeyChordClassOf(next.mSemitones));
-    return {numeral, DegreeText(target, isSmall, key, false)};
-}
-
-const TNumeralSign& SignInTable(std::string_view sign) {
-    return *std::find_if(kNumeralSigns.begin(), kNumeralSigns.end(),
-                         [&](const TNumeralSign& row) { return row.mText == sign; });
-}
-
-// The place of a tone in a chord from below, -1 if it is not there.
-int ToneOf(CSemitones chord, int intvl) {
-    if (!chord.HasIntvl(intvl)) return -1;
-    int tone = 0;
-    for (int below = 0; below < intvl; ++below) tone += chord.HasIntvl(below) ? 1 : 0;
-    return tone;
+    const int target = DistToTonic(next->mRootKeyEnh, key);
+    const TApplied* applied = nullptr;
+    if (target != 0 && key.Semitones().HasIntvl(target)) applied = AppliedBy(chord, key, target);
+    if (applied == nullptr) return OwnDegree(chord, key, options);
+    const bool isSmall = HasSmallNumeral(next->mSemitones);
+    const TNumeralDegree degree = DegreeAt(target, key);
+    // What is applied to a degree of minor counts as in major: the leading tone of ii is #1.
+    const CSignKeyLite keyOfTarget(KeyOfDegree(degree, key), TSignKeyType_Major);
+    const TNumeralDegree held = HeldInMinor(degree, next->mSemitones, key, options);
+    const TSignKeyType type = isSmall ? TSignKeyType_Minor : TSignKeyType_Major;
+    return {std::string(applied->mNumeral),
+            {applied->mDegree, type, HasSmallNumeral(chord.mSemitones)},
+            KeyOfDegree(applied->mDegree, keyOfTarget),
+            "/" + DegreeText(held, isSmall, false)};
 }
 
 // The sign with the figure of the bass in it; empty where the figures do not tell the bass.
-std::string SignWithFigure(std::string_view sign, bool isSmall, int bass) {
+std::string SignWithFigure(std::string_view sign, CSemitones semitones, int bass) {
     constexpr auto triads = std::to_array<std::string_view>({"", "o", "+"});
     const bool isTriad = std::find(triads.begin(), triads.end(), sign) != triads.end();
     const bool hasSeventh = sign.ends_with('7');
-    if (!isTriad && !hasSeventh) return {};
-    const TNumeralSign& row = SignInTable(sign);
-    const int tone = ToneOf(isSmall ? row.mMinor : row.mMajor, bass);
-    for (const TInversionFigure& figure : kInversionFigures) {
-        if (figure.mTone != tone || figure.mHasSeventh != hasSeventh) continue;
+    if ((!isTriad && !hasSeventh) || !semitones.HasIntvl(bass)) return {};
+    const int step = StepOfSemitone(semitones, bass);
+    const TFigureKind kind = hasSeventh ? TFigure_Seventh : TFigure_Triad;
+    for (const TNumeralFigure& figure : kNumeralFigures) {
+        if (figure.mKind != kind || figure.mBassStep != step || step == 1) continue;
         if (hasSeventh) sign.remove_suffix(1);
-        return std::string(sign) += figure.mFigure;
+        return std::string(sign) += figure.mText;
     }
     return {};
 }
 
-/// What stands behind the degree, and the bass behind the last slash.
-struct TTail {
-    std::string mSign;
-    std::string mBass;
-};
-
-TTail TailOf(const CChordLite& chord, const CSignKeyLite& key, bool isSmall,
-             const TNumeralOptions& options) {
-    TTail tail{std::string(SignOf(chord.mSemitones)), {}};
-    if (chord.HasBassNote()) {
-        const int bass =
-            FoldIntoOctave(std::int64_t{chord.mBassKeyEnh.mKeyNr} - chord.mRootKeyEnh.mKeyNr);
-        std::string figured;
-        if (options.mFigures) figured = SignWithFigure(tail.mSign, isSmall, bass);
-        if (!figured.empty()) return {figured, {}};
-        if (bass != 0)
-            tail.mBass = "/" + DegreeText(DistToTonic(chord.mBassKeyEnh, key), false, key, true);
-    }
-    // Among figures a bare 6 is an inversion.
-    if (options.mFigures && tail.mSign == "6") tail.mSign = "add6";
-    return tail;
+// A minor seventh that is not that of the key has a d where the key would tell the seventh.
+std::string_view SignByKey(std::string_view sign, const TNumeralRoot& root) {
+    if (root.mIsSmall || IntvlInKey(root, 7) == 10) return sign;
+    if (sign == "7") return "d7";
+    return sign == "+7" ? "+d7" : sign;
 }
 
 std::string WithPrintedSigns(std::string_view sign) {
@@ -171,28 +154,56 @@ std::string WithPrintedSigns(std::string_view sign) {
     return printed;
 }
 
+// Letters to a tone above the root when nothing tells its spelling.
+constexpr std::array<int, 12> kUsualLetters{0, 1, 1, 2, 2, 3, 4, 4, 5, 5, 6, 6};
+
+bool IsSpelled(const CKeyEnh& keyEnh) {
+    return IsSensefulEnhForKeyNr(keyEnh.mKeyNr, keyEnh.mEnh);
+}
+
+// The bass as it is spelled above its root, above that root as the numeral spells it.
+std::string BassText(const CChordLite& chord, const CKeyEnh& root, const CSignKeyLite& key) {
+    const int intvl = IntvlBetween(chord.mRootKeyEnh, chord.mBassKeyEnh);
+    const bool isSpelled = IsSpelled(chord.mRootKeyEnh) && IsSpelled(chord.mBassKeyEnh);
+    const int letters = isSpelled ? LettersBetween(chord.mRootKeyEnh, chord.mBassKeyEnh)
+                                  : kUsualLetters[static_cast<std::size_t>(intvl)];
+    return "/^" + DegreeText(DegreeOfKey(SpelledAbove(root, letters, intvl), key), false, true);
+}
+
+/// What stands behind the degree, and the bass behind the last slash.
+struct TTail {
+    std::string mSign;
+    std::string mBass;
+};
+
+TTail TailOf(const CChordLite& chord, const TWrittenDegree& degree, const CSignKeyLite& key,
+             const TNumeralOptions& options) {
+    const TChordSign sign = SignOfChord(chord.mSemitones, options);
+    std::string text(options.mByKey && sign.mAlterations.empty()
+                         ? SignByKey(sign.mSign, degree.mRoot)
+                         : sign.mSign);
+    // Among figures a bare 6 is an inversion.
+    if (text == "6" && (options.mFigures || options.mByKey)) text = "add6";
+    std::string bass;
+    const int intvl = chord.HasBassNote() ? IntvlBetween(chord.mRootKeyEnh, chord.mBassKeyEnh) : 0;
+    std::string figured;
+    if (intvl != 0 && options.mFigures && sign.mAlterations.empty()) {
+        figured = SignWithFigure(text, chord.mSemitones, intvl);
+    }
+    if (intvl != 0 && figured.empty()) bass = BassText(chord, degree.mKeyEnh, key);
+    if (!figured.empty()) text = figured;
+    if (options.mPrintedSigns) text = WithPrintedSigns(text);
+    return {text + sign.mAlterations, bass};
+}
+
 }  // namespace
 
 std::string RomanNumeral(const CChordLite& chord, const CSignKeyLite& key, const CChordLite* next,
                          const TNumeralOptions& options) {
     if (chord.IsUndef() || key.IsUndef()) return {};
-    const bool isSmall = IsSmall(KeyChordClassOf(chord.mSemitones));
-    TTail tail = TailOf(chord, key, isSmall, options);
-    if (options.mPrintedSigns && tail.mSign.find("sus") == std::string::npos) {
-        tail.mSign = WithPrintedSigns(tail.mSign);
-    }
-    if (next != nullptr && !options.mNashville) {
-        const TApplied applied = AppliedTo(*next, chord, key);
-        if (!applied.mNumeral.empty()) {
-            return std::string(applied.mNumeral) + tail.mSign + "/" + applied.mTarget + tail.mBass;
-        }
-    }
-    const int dist = DistToTonic(chord.mRootKeyEnh, key);
-    std::string numeral = DegreeText(dist, isSmall, key, options.mNashville);
-    const TKeyChordClass chordClass = KeyChordClassOf(chord.mSemitones);
-    const bool isMinor = chordClass == TKeyChordClass_Min || chordClass == TKeyChordClass_Min7;
-    if (options.mNashville && isMinor) numeral += '-';
-    return numeral + tail.mSign + tail.mBass;
+    const TWrittenDegree degree = DegreeBefore(next, chord, key, options);
+    const TTail tail = TailOf(chord, degree, key, options);
+    return degree.mText + tail.mSign + degree.mTarget + tail.mBass;
 }
 
 std::vector<std::string> NumeralsOf(const CHarmAnlsChords& chords, const CKeyOfSong& keys,

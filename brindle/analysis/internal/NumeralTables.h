@@ -6,6 +6,7 @@
 
 #include <array>
 #include <cstddef>
+#include <cstdint>
 #include <string_view>
 
 namespace brindle {
@@ -42,7 +43,8 @@ struct TNumeralSign {
     CSemitones mMinor;
 };
 
-// The whole text behind the number; h stands for ø, o for °, ^ for maj.
+// The whole text behind the number, or the beginning before alterations; h stands for ø, o for °,
+// ^ for maj. The first sign of a chord is the one that is written.
 // clang-format off
 inline constexpr auto kNumeralSigns = std::to_array<TNumeralSign>({
     // text   on a large numeral         on a small numeral
@@ -57,7 +59,7 @@ inline constexpr auto kNumeralSigns = std::to_array<TNumeralSign>({
     {"7",     {0, 4, 7, 10},             {0, 3, 7, 10}},
     {"9",     {0, 2, 4, 7, 10},          {0, 2, 3, 7, 10}},
     {"11",    {0, 2, 4, 5, 7, 10},       {0, 2, 3, 5, 7, 10}},
-    {"13",    {0, 2, 4, 7, 9, 10},       {0, 2, 3, 7, 9, 10}},
+    {"13",    {0, 2, 4, 5, 7, 9, 10},    {0, 2, 3, 5, 7, 9, 10}},
     {"7b9",   {0, 1, 4, 7, 10},          {0, 1, 3, 7, 10}},
     {"7#9",   {0, 3, 4, 7, 10},          {}},
     {"7b5",   {0, 4, 6, 10},             {0, 3, 6, 10}},
@@ -77,20 +79,68 @@ inline constexpr auto kNumeralSigns = std::to_array<TNumeralSign>({
 });
 // clang-format on
 
-/// The figures of an inversion: the tone of the chord that is its bass, 1 for the third to 3 for
-/// the seventh.
-struct TInversionFigure {
-    std::string_view mFigure;
-    int mTone;
-    bool mHasSeventh;
+/// What a figure says of the chord on a degree.
+enum TFigureKind : std::uint8_t {
+    TFigure_Triad,
+    TFigure_Seventh,
+    TFigure_Ninth,
+    TFigure_Eleventh,
+    TFigure_Thirteenth,
+    TFigure_Fourth,         ///< a fourth instead of the third
+    TFigure_SeventhFourth,  ///< the same under a seventh
+    TFigure_Second,         ///< a second instead of the third
 };
 
-inline constexpr auto kInversionFigures = std::to_array<TInversionFigure>({
-    {"6", 1, false},
-    {"64", 2, false},
-    {"65", 1, true},
-    {"43", 2, true},
-    {"42", 3, true},
+/// A figure as in a figured bass, its slashes left out.
+struct TNumeralFigure {
+    std::string_view mText;
+    TFigureKind mKind;
+    int mBassStep;  ///< the tone in the bass: 1, 3, 5 or 7
+    int mWithout;   ///< a tone that the figure leaves out, or 0
+};
+
+// The first of each kind and bass is the one that is written.
+// clang-format off
+inline constexpr auto kNumeralFigures = std::to_array<TNumeralFigure>({
+    {"",     TFigure_Triad,         1, 0},
+    {"3",    TFigure_Triad,         1, 0},
+    {"53",   TFigure_Triad,         1, 0},
+    {"8",    TFigure_Triad,         1, 0},
+    {"83",   TFigure_Triad,         1, 0},
+    {"853",  TFigure_Triad,         1, 0},
+    {"6",    TFigure_Triad,         3, 0},
+    {"63",   TFigure_Triad,         3, 0},
+    {"64",   TFigure_Triad,         5, 0},
+    {"7",    TFigure_Seventh,       1, 0},
+    {"753",  TFigure_Seventh,       1, 0},
+    {"87",   TFigure_Seventh,       1, 0},
+    {"73",   TFigure_Seventh,       1, 5},
+    {"75",   TFigure_Seventh,       1, 3},
+    {"65",   TFigure_Seventh,       3, 0},
+    {"653",  TFigure_Seventh,       3, 0},
+    {"43",   TFigure_Seventh,       5, 0},
+    {"643",  TFigure_Seventh,       5, 0},
+    {"42",   TFigure_Seventh,       7, 0},
+    {"2",    TFigure_Seventh,       7, 0},
+    {"642",  TFigure_Seventh,       7, 0},
+    {"9",    TFigure_Ninth,         1, 0},
+    {"97",   TFigure_Ninth,         1, 0},
+    {"973",  TFigure_Ninth,         1, 5},
+    {"975",  TFigure_Ninth,         1, 3},
+    {"9753", TFigure_Ninth,         1, 0},
+    {"11",   TFigure_Eleventh,      1, 0},
+    {"13",   TFigure_Thirteenth,    1, 0},
+    {"4",    TFigure_Fourth,        1, 0},
+    {"54",   TFigure_Fourth,        1, 0},
+    {"74",   TFigure_SeventhFourth, 1, 0},
+    {"754",  TFigure_SeventhFourth, 1, 0},
+    {"52",   TFigure_Second,        1, 0},
 });
+
+// Figures that people write with slashes, 6/5. Others behind a slash are the degree of a bass.
+inline constexpr auto kSlashedFigures = std::to_array<std::string_view>({
+    "65", "64", "43", "42", "53", "54", "653", "643", "642", "753", "754",
+});
+// clang-format on
 
 }  // namespace brindle

@@ -1,0 +1,54 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/analysis/ReadNumerals.h"
+
+#include <algorithm>
+
+namespace brindle {
+namespace {
+
+constexpr std::string_view kBlanks = " \t\r\f\v";
+
+std::size_t CharactersOf(std::string_view text) {
+    return static_cast<std::size_t>(std::count_if(text.begin(), text.end(), [](char c) {
+        return (static_cast<unsigned char>(c) & 0xC0U) != 0x80U;
+    }));
+}
+
+}  // namespace
+
+std::vector<CNumeralWord> NumeralWords(std::string_view text) {
+    std::vector<CNumeralWord> words;
+    std::size_t line = 1;
+    std::size_t column = 1;
+    while (!text.empty()) {
+        const bool isBreak = text.front() == '\n';
+        if (isBreak || kBlanks.find(text.front()) != kBlanks.npos) {
+            line += isBreak ? 1 : 0;
+            column = isBreak ? 1 : column + 1;
+            text.remove_prefix(1);
+            continue;
+        }
+        const std::string_view word = text.substr(0, text.find_first_of(" \t\r\f\v\n"));
+        words.push_back({std::string(word), line, column, {}});
+        column += CharactersOf(word);
+        text.remove_prefix(word.size());
+    }
+    return words;
+}
+
+CNumeralsReading ReadNumerals(std::string_view text, const CSignKeyLite& key,
+                              const TNumeralOptions& options) {
+    CNumeralsReading reading{NumeralWords(text), {}};
+    for (CNumeralWord& word : reading.mWords) {
+        if (word.IsMark()) continue;
+        const CNumeralReading numeral = ReadNumeral(word.mText, key, options);
+        word.mChord = numeral.mChord;
+        if (numeral.mFault.empty()) continue;
+        const auto before = std::string_view(word.mText).substr(0, numeral.mFaultOffset);
+        reading.mFaults.push_back(
+            {word.mLine, word.mColumn + CharactersOf(before), std::string(numeral.mFault)});
+    }
+    return reading;
+}
+
+}  // namespace brindle

@@ -1,0 +1,44 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/analysis/ReadChordSheet.h"
+#include "brindle/analysis/RomanNumeral.h"
+
+#include <cstddef>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace brindle {
+
+/// A word of a text of numerals.
+struct CNumeralWord {
+    std::string mText;
+    /// From 1; the column in characters, not bytes.
+    std::size_t mLine = 0;
+    std::size_t mColumn = 0;
+    /// Undefined for a mark and for what is not understood.
+    CChordLite mChord;
+
+    /// A bar line or a hold: `|`, `||`, `.`
+    [[nodiscard]] bool IsMark() const { return mText == "|" || mText == "||" || mText == "."; }
+};
+
+/// What ReadNumerals makes of a text.
+struct CNumeralsReading {
+    std::vector<CNumeralWord> mWords;
+    /// Empty if all is understood.
+    std::vector<CChordSheetFault> mFaults;
+};
+
+/// The words between white space, with their places; their chords are undefined.
+[[nodiscard]] std::vector<CNumeralWord> NumeralWords(std::string_view text);
+
+/// Reads a text of Roman numerals or Nashville numbers with bar lines: `ii7 V7 | I^7 .`
+///
+/// A word that is not understood is a fault and has no chord; the others are read all the same.
+/// Time is linear in the length of the text.
+[[nodiscard]] CNumeralsReading ReadNumerals(std::string_view text, const CSignKeyLite& key,
+                                            const TNumeralOptions& options = {});
+
+}  // namespace brindle

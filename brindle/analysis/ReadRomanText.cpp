@@ -1,0 +1,276 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/analysis/ReadRomanText.h"
+
+#include "brindle/analysis/RomanNumeral.h"
+#include "brindle/analysis/internal/RomanTextWords.h"
+
+#include <algorithm>
+#include <array>
+#include <optional>
+#include <unordered_map>
+
+namespace brindle {
+namespace {
+
+constexpr std::size_t kMostMeasures = 1'000'000;
+constexpr std::size_t kMostCopiedWords = 1'000'000;
+constexpr std::size_t kMostFaults = 1'000;
+
+/// What stands behind the number of a measure.
+struct TMeasureText {
+    std::string_view mText;
+    std::string_view mLine;
+    std::size_t mLineNumber = 0;
+};
+
+std::size_t CharactersBefore(std::string_view line, const char* end) {
+    const auto count = end - line.data();
+    return static_cast<std::size_t>(std::count_if(line.begin(), line.begin() + count, [](char c) {
+        return (static_cast<unsigned char>(c) & 0xC0U) != 0x80U;
+    }));
+}
+
+bool IsDoubleBar(std::string_view word) {
+    return word.find_first_not_of("|:") == word.npos && word.find('|') != word.npos;
+}
+
+bool IsNoChord(std::string_view word) {
+    return word == "NC" || word == "N.C." || word == "NC.";
+}
+
+class CRomanTextReader {
+public:
+    CRomanTextReading Read(std::string_view text);
+
+private:
+    CRomanTextReading mReading;
+    std::unordered_map<int, TMeasureText> mMeasures;
+    TTimeSignature mTime;
+    std::optional<CSignKeyLite> mKey;
+    double mEnd = 0.0;
+    int mLastNumber = -1;
+    std::size_t mCopiedWords = 0;
+    /// Of a copy the faults are told already.
+    bool mIsCopy = false;
+    std::string_view mLine;
+    std::size_t mLineNumber = 0;
+
+    /// Where the next numeral of a measure stands.
+    struct TPlace {
+        double mBarPosition = 0.0;
+        double mBarLength = 0.0;
+        double mPosition = 0.0;
+        double mPickup = 0.0;  ///< how much of the bar is not there, at its beginning
+        bool mHasBeat = false;
+        bool mHasKey = false;
+    };
+
+    void ReadLine();
+    void ReadMeasureLine(std::string_view rest, const TMeasureRange& range);
+    void ReadHeader(std::size_t colon);
+    void ReadTime(std::string_view value);
+    void CopyMeasures(const TMeasureRange& range, std::string_view source);
+    void FillTo(int number);
+    void AddMeasure(int number, const TMeasureText& measure, bool hasLetter);
+    void ReadWord(std::string_view word, TPlace& place);
+    void ReadBeat(double beat, std::string_view word, TPlace& place);
+    void ReadNumeralAt(std::string_view word, TPlace& place);
+    void AddChord(CRomanTextChord chord, std::string_view word, TPlace& place);
+    void SetLengths();
+
+    void Fail(std::string_view what, std::string_view where, bool isNote = false);
+};
+
+void CRomanTextReader::Fail(std::string_view what, std::string_view where, bool isNote) {
+    auto& list = isNote ? mReading.mNotes : mReading.mFaults;
+    if (mIsCopy || list.size() >= kMostFaults) return;
+    list.push_back({mLineNumber, CharactersBefore(mLine, where.data()) + 1, std::string(what)});
+}
+
+CRomanTextReading CRomanTextReader::Read(std::string_view text) {
+    constexpr std::string_view byteOrderMark = "\xEF\xBB\xBF";
+    if (text.starts_with(byteOrderMark)) text.remove_prefix(byteOrderMark.size());
+    while (!text.empty()) {
+        mLine = text.substr(0, text.find('\n'));
+        text.remove_prefix(std::min(mLine.size() + 1, text.size()));
+        ++mLineNumber;
+        ReadLine();
+    }
+    SetLengths();
+    return std::move(mReading);
+}
+
+void CRomanTextReader::ReadLine() {
+    std::string_view line = Trimmed(mLine);
+    if (line.empty()) return;
+    if (const auto range = TakeMeasures(line)) return ReadMeasureLine(line, *range);
+    const std::size_t colon = mLine.find(':');
+    if (colon != mLine.npos) return ReadHeader(colon);
+    Fail("this is neither a measure nor a header", line);
+}
+
+void CRomanTextReader::ReadHeader(std::size_t colon) {
+    const std::string_view name = Trimmed(mLine.substr(0, colon));
+    const std::string_view value = Trimmed(mLine.substr(colon + 1));
+    const auto set = [&](std::string& field) {
+        if (field.empty()) field = value;
+    };
+    if (name == "Title" || name == "Piece") return set(mReading.mTitle);
+    if (name == "Movement") return set(mReading.mMovement);
+    if (name == "Composer") return set(mReading.mComposer);
+    if (name == "Analyst") return set(mReading.mAnalyst);
+    if (name == "Time Signature" || name == "Time signature") return ReadTime(value);
+    if (name == "Pedal") Fail("pedals are left out", name, true);
+}
+
+void CRomanTextReader::ReadTime(std::string_view value) {
+    const auto time = TimeSignatureOf(value);
+    if (!time) return Fail("this is no time signature", value);
+    mTime = *time;
+    if (!mReading.mTimes.empty() && mReading.mTimes.back().mPosition == mEnd) {
+        mReading.mTimes.pop_back();
+    }
+    mReading.mTimes.push_back({time->mBeats, time->mBeatValue, mEnd});
+}
+
+void CRomanTextReader::ReadMeasureLine(std::string_view rest, const TMeasureRange& range) {
+    rest = Trimmed(rest);
+    if (range.mIsVariant) return Fail("another reading of the measure is left out", mLine, true);
+    if (rest.starts_with('=')) return CopyMeasures(range, Trimmed(rest.substr(1)));
+    if (range.mLast != range.mFirst) return Fail("more than one measure is a copy, with =", mLine);
+    if (rest.starts_with(':')) rest.remove_prefix(1);
+    const TMeasureText measure{rest, mLine, mLineNumber};
+    if (!range.mHasLetter) mMeasures.insert_or_assign(range.mFirst, measure);
+    AddMeasure(range.mFirst, measure, range.mHasLetter);
+}
+
+void CRomanTextReader::CopyMeasures(const TMeasureRange& range, std::string_view source) {
+    const std::string_view typed = source;
+    const auto from = TakeMeasures(source);
+    if (!from || !Trimmed(source).empty()) return Fail("measures are expected behind =", typed);
+    const int count = from->mLast - from->mFirst + 1;
+    if (range.mLast - range.mFirst + 1 != count) {
+        return Fail("the copy is not as long as what is copied", typed);
+    }
+    for (int i = 0; i < count; ++i) {
+        const auto measure = mMeasures.find(from->mFirst + i);
+        if (measure == mMeasures.end()) return Fail("a measure that is copied is not there", typed);
+        const TMeasureText text = measure->second;
+        mCopiedWords += text.mText.size() / 2 + 1;
+        if (mCopiedWords > kMostCopiedWords) return Fail("too much is copied", typed);
+        mMeasures.insert_or_assign(range.mFirst + i, text);
+        mIsCopy = true;
+        AddMeasure(range.mFirst + i, text, false);
+        mIsCopy = false;
+    }
+}
+
+// Measures that are not written go on with the chord before them.
+void CRomanTextReader::FillTo(int number) {
+    const double length = mTime.BarLength();
+    while (mLastNumber >= 0 && mLastNumber + 1 < number && mReading.mBars.size() < kMostMeasures) {
+        mReading.mBars.push_back({++mLastNumber, mEnd, length});
+        mEnd += length;
+    }
+}
+
+void CRomanTextReader::AddMeasure(int number, const TMeasureText& measure, bool hasLetter) {
+    if (number < mLastNumber || (number == mLastNumber && !hasLetter)) {
+        Fail("the number of the measure is not higher than the one before", mLine);
+    }
+    FillTo(number);
+    if (mReading.mBars.size() >= kMostMeasures) return Fail("there are too many measures", mLine);
+    mLastNumber = number;
+    TPlace place{mEnd, mTime.BarLength(), mEnd};
+    std::string_view rest = measure.mText;
+    while (true) {
+        const std::string_view word = TakeWord(rest);
+        if (word.empty()) break;
+        ReadWord(word, place);
+    }
+    const double length = place.mBarLength - place.mPickup;
+    mReading.mBars.push_back({number, place.mBarPosition, length});
+    mEnd = place.mBarPosition + length;
+}
+
+void CRomanTextReader::ReadWord(std::string_view word, TPlace& place) {
+    if (const auto beat = BeatOf(word)) return ReadBeat(*beat, word, place);
+    if (const auto key = KeyOf(word)) {
+        mKey = *key;
+        place.mHasKey = true;
+        return;
+    }
+    if (IsDoubleBar(word)) {
+        mReading.mDoubleBars.push_back(place.mPosition);
+        return;
+    }
+    ReadNumeralAt(word, place);
+}
+
+void CRomanTextReader::ReadBeat(double beat, std::string_view word, TPlace& place) {
+    const double into = (beat - 1.0) * mTime.BeatLength();
+    const bool isPickup = mLastNumber == 0 && !place.mHasBeat && place.mPickup == 0.0;
+    if (into >= place.mBarLength) return Fail("the bar has no such beat", word);
+    if (isPickup) place.mPickup = into;
+    const double position = place.mBarPosition + into - place.mPickup;
+    if (position < place.mPosition) return Fail("the beat is before the one that was told", word);
+    place.mPosition = position;
+    place.mHasBeat = true;
+}
+
+void CRomanTextReader::ReadNumeralAt(std::string_view word, TPlace& place) {
+    CRomanTextChord chord;
+    chord.mNumeral = word;
+    chord.mPosition = place.mPosition;
+    chord.mChord = CChordLite_NoChordYield;
+    if (mKey) chord.mKey = *mKey;
+    if (!IsNoChord(word)) {
+        if (!mKey) return Fail("a numeral needs a key before it, as in C: I", word);
+        const CNumeralReading reading =
+            ReadNumeral(word, *mKey, {.mFigures = true, .mByKey = true});
+        if (reading.mChord.IsUndef()) {
+            Fail(reading.mFault, word.substr(std::min(reading.mFaultOffset, word.size())));
+        } else {
+            chord.mChord = reading.mChord;
+        }
+    }
+    AddChord(std::move(chord), word, place);
+}
+
+void CRomanTextReader::AddChord(CRomanTextChord chord, std::string_view word, TPlace& place) {
+    const bool isNewKey = mReading.mKeys.empty() || mReading.mKeys.back().mKey != chord.mKey;
+    if (isNewKey && !chord.mKey.IsUndef()) {
+        mReading.mKeys.push_back({chord.mKey, chord.mPosition});
+    }
+    const bool hasOther =
+        !mReading.mChords.empty() && mReading.mChords.back().mPosition == chord.mPosition;
+    if (!hasOther) {
+        mReading.mChords.push_back(std::move(chord));
+    } else if (place.mHasKey) {
+        // One chord in two keys: where the old key ends and the new one begins.
+        CRomanTextChord& pivot = mReading.mChords.back();
+        chord.mKeyBefore = pivot.mKey;
+        chord.mNumeralBefore = std::move(pivot.mNumeral);
+        pivot = std::move(chord);
+    } else {
+        Fail("there is a chord on this beat already", word);
+    }
+    place.mHasKey = false;
+}
+
+void CRomanTextReader::SetLengths() {
+    double end = mEnd;
+    for (auto chord = mReading.mChords.rbegin(); chord != mReading.mChords.rend(); ++chord) {
+        chord->mLength = end - chord->mPosition;
+        end = chord->mPosition;
+    }
+    if (mReading.mTimes.empty() && !mReading.mBars.empty()) mReading.mTimes.push_back({4, 4, 0.0});
+}
+
+}  // namespace
+
+CRomanTextReading ReadRomanText(std::string_view text) {
+    return CRomanTextReader().Read(text);
+}
+
+}  // namespace brindle

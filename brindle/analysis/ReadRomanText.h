@@ -1,0 +1,81 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/analysis/ReadChordSheet.h"
+#include "brindle/chords/CChordLite.h"
+#include "brindle/theory/CSignKeyLite.h"
+
+#include <cstddef>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace brindle {
+
+// An analysis as musicologists keep it in a text file, RomanText: headers, then a line for each
+// measure with keys, beats and numerals, `m1 C: I b3 V65/V`. All positions and lengths are in
+// quarter notes, from the first measure as it is written: repeats are not played.
+
+/// A chord of such an analysis.
+struct CRomanTextChord {
+    /// "No Chord Yield" for `NC` and for a numeral that is not understood.
+    CChordLite mChord;
+    CSignKeyLite mKey;
+    /// As it is written.
+    std::string mNumeral;
+    double mPosition = 0.0;
+    double mLength = 0.0;
+    /// The chord where two keys meet: its numeral in the key before, else undefined and empty.
+    CSignKeyLite mKeyBefore;
+    std::string mNumeralBefore;
+};
+
+/// The key from a position on.
+struct CRomanTextKey {
+    CSignKeyLite mKey;
+    double mPosition = 0.0;
+};
+
+struct CRomanTextBar {
+    int mNumber = 0;
+    double mPosition = 0.0;
+    double mLength = 0.0;
+};
+
+struct CRomanTextTime {
+    int mBeats = 4;
+    int mBeatValue = 4;
+    double mPosition = 0.0;
+};
+
+/// What ReadRomanText makes of a text.
+struct CRomanTextReading {
+    std::string mTitle;
+    std::string mMovement;
+    std::string mComposer;
+    std::string mAnalyst;
+    std::vector<CRomanTextChord> mChords;
+    std::vector<CRomanTextKey> mKeys;
+    /// Measures that are left out between two others are there, too: the chord before them sounds.
+    std::vector<CRomanTextBar> mBars;
+    std::vector<CRomanTextTime> mTimes;
+    /// Where `||` and other double bars stand.
+    std::vector<double> mDoubleBars;
+    /// Empty if all is understood; what is not, is left out.
+    std::vector<CChordSheetFault> mFaults;
+    /// What is understood and left out: other readings of a measure, pedals.
+    std::vector<CChordSheetFault> mNotes;
+};
+
+/// Reads an analysis in RomanText.
+///
+/// Numerals are read by ReadNumeral with `mFigures` and `mByKey`. The beat is that of the time
+/// signature: a dotted quarter in 6/8, the whole bar in 3/8. `b2.33` is a third of a beat behind
+/// the second one. `m5-8 = m1-4` copies measures, in the key of the place. A chord sounds up to the
+/// next one or the end. A measure 0 begins with its first beat.
+///
+/// Time is linear in the length of what is read and copied; more than a million measures or copied
+/// words are a fault.
+[[nodiscard]] CRomanTextReading ReadRomanText(std::string_view text);
+
+}  // namespace brindle

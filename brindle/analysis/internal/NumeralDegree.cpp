@@ -1,0 +1,118 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/analysis/internal/NumeralDegree.h"
+
+#include "brindle/theory/KeyIntervals.h"
+#include "brindle/theory/MakeSensefulEnh.h"
+
+#include <algorithm>
+
+namespace brindle {
+namespace {
+
+constexpr int kMostAccidentals = 2;
+
+constexpr std::array<int, 7> kMajorDegrees{0, 2, 4, 5, 7, 9, 11};
+constexpr std::array<int, 7> kMinorDegrees{0, 2, 3, 5, 7, 8, 10};
+
+// Sharps before the degree, flats as a negative number. A minus is a flat.
+int TakeAccidentals(std::string_view& text) {
+    int accidental = 0;
+    while (!text.empty() && (text.front() == '#' || text.front() == 'b' || text.front() == '-')) {
+        accidental += text.front() == '#' ? 1 : -1;
+        text.remove_prefix(1);
+    }
+    return accidental;
+}
+
+// The longest Roman number that the text begins with, in large or in small letters.
+TReadDegree ReadRomanNumber(std::string_view text) {
+    TReadDegree read;
+    std::size_t longest = 0;
+    for (std::size_t i = 0; i < kRomanNumbers.size(); ++i) {
+        const std::string_view number = kRomanNumbers[i];
+        if (number.size() <= longest || number.size() > text.size()) continue;
+        const bool isSmall = text.front() >= 'a';
+        const bool isHere =
+            std::equal(number.begin(), number.end(), text.begin(), [&](char large, char typed) {
+                return typed == (isSmall ? static_cast<char>(large - 'A' + 'a') : large);
+            });
+        if (!isHere) continue;
+        longest = number.size();
+        read = {{static_cast<int>(i) + 1, 0}, isSmall, false, text.substr(longest)};
+    }
+    return read;
+}
+
+// The index of the letter, 0 for C.
+int LetterOf(const CKeyEnh& keyEnh) {
+    const TEnh enh = MakeSensefulEnhForKeyNrAssumingCMajor(keyEnh.mKeyNr, keyEnh.mEnh);
+    const int natural = FoldIntoOctave(std::int64_t{keyEnh.mKeyNr} - EnhToSemitone(enh));
+    const auto letter = std::find(kMajorDegrees.begin(), kMajorDegrees.end(), natural);
+    return static_cast<int>(letter - kMajorDegrees.begin()) % 7;
+}
+
+}  // namespace
+
+TReadDegree ReadDegree(std::string_view text) {
+    constexpr std::string_view substitute = "sub";
+    const bool isSubstitute = text.starts_with(substitute);
+    if (isSubstitute) text.remove_prefix(substitute.size());
+    const int accidental = TakeAccidentals(text);
+    if (text.empty() || accidental < -kMostAccidentals || accidental > kMostAccidentals) return {};
+    TReadDegree read;
+    if (text.front() >= '1' && text.front() <= '7') {
+        read = {{text.front() - '0', 0}, false, true, text.substr(1)};
+    } else {
+        read = ReadRomanNumber(text);
+    }
+    if (!read.IsRead()) return {};
+    read.mDegree.mAccidental = accidental;
+    if (isSubstitute) {
+        // A tritone away from the dominant.
+        if (read.mDegree.mNumber != 5 || accidental != 0 || read.mIsSmall) return {};
+        read.mDegree = {2, -1};
+    }
+    return read;
+}
+
+TNumeralDegree FoldMinorFlat(TNumeralDegree degree, TSignKeyType type) {
+    const bool isLowInMinor = degree.mNumber == 3 || degree.mNumber == 6 || degree.mNumber == 7;
+    if (type == TSignKeyType_Minor && isLowInMinor && degree.mAccidental == -1) {
+        degree.mAccidental = 0;
+    }
+    return degree;
+}
+
+int SemitonesOfDegree(TNumeralDegree degree, TSignKeyType type) {
+    const auto& degrees = type == TSignKeyType_Minor ? kMinorDegrees : kMajorDegrees;
+    return degrees[static_cast<std::size_t>(degree.mNumber - 1)] + degree.mAccidental;
+}
+
+CKeyEnh SpelledAbove(const CKeyEnh& from, int letters, int semitones) {
+    const int keyNr = FoldIntoOctave(std::int64_t{from.mKeyNr} + semitones);
+    const auto letter = static_cast<std::size_t>(LetterOf(from) + letters + 7) % 7;
+    const TEnh spelling = SemitoneToEnh(SmallestKeyIntvlBetween(kMajorDegrees[letter], keyNr));
+    return {keyNr, MakeSensefulEnhForKeyNrAssumingCMajor(keyNr, spelling)};
+}
+
+int LettersBetween(const CKeyEnh& from, const CKeyEnh& to) {
+    return (LetterOf(to) - LetterOf(from) + 7) % 7;
+}
+
+CKeyEnh KeyOfDegree(TNumeralDegree degree, const CSignKeyLite& key) {
+    return SpelledAbove(key.mRootKeyEnh, degree.mNumber - 1,
+                        SemitonesOfDegree(degree, key.mSignKeyType));
+}
+
+TNumeralDegree DegreeOfKey(const CKeyEnh& keyEnh, const CSignKeyLite& key) {
+    const int dist = FoldIntoOctave(std::int64_t{keyEnh.mKeyNr} - key.mRootKeyEnh.mKeyNr);
+    TNumeralDegree degree{LettersBetween(key.mRootKeyEnh, keyEnh) + 1, 0};
+    const int natural = SemitonesOfDegree(degree, key.mSignKeyType);
+    degree.mAccidental = SmallestKeyIntvlBetween(natural, dist);
+    if (degree.mAccidental >= -kMostAccidentals && degree.mAccidental <= kMostAccidentals) {
+        return degree;
+    }
+    return DegreesOf(key.mSignKeyType)[static_cast<std::size_t>(dist)];
+}
+
+}  // namespace brindle

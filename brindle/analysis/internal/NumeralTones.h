@@ -1,0 +1,46 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/analysis/internal/NumeralTables.h"
+#include "brindle/theory/CSemitones.h"
+
+#include <string_view>
+
+namespace brindle {
+
+struct TNumeralOptions;
+
+/// What the tones of a numeral are counted from: its degree, and whether the key is minor.
+struct TNumeralRoot {
+    TNumeralDegree mDegree;
+    TSignKeyType mKeyType;
+    bool mIsSmall;
+};
+
+/// The tones of a numeral above its root, and which of them is the bass: 1 for the root, 3 for the
+/// third and so on.
+struct TReadTones {
+    CSemitones mSemitones;
+    int mBassStep = 1;
+};
+
+/// The tones of what stands behind a degree: `7`, `o65`, `^7#11`, `sus`. Empty if it says nothing.
+[[nodiscard]] TReadTones TonesOfTail(std::string_view tail, const TNumeralRoot& root,
+                                     const TNumeralOptions& options);
+
+/// Changes the tones by what stands in square brackets: `no5`, `add4`, `b3`. The tones that are
+/// added are those of the key. False if it is not understood.
+[[nodiscard]] bool ApplyGroup(std::string_view group, const TNumeralRoot& root, TReadTones& tones);
+
+/// The interval from the root of a numeral to the tone of the key so many steps above it, 1 for the
+/// root.
+[[nodiscard]] int IntvlInKey(const TNumeralRoot& root, int step);
+
+/// Semitones from the root to the tone of a step, -1 if the chord has none.
+[[nodiscard]] int SemitoneOfStep(CSemitones semitones, int step);
+
+/// The step of a tone above the root, 1 to 7: what is a minor third in one chord is an augmented
+/// ninth, 2, in another.
+[[nodiscard]] int StepOfSemitone(CSemitones semitones, int semitone);
+
+}  // namespace brindle

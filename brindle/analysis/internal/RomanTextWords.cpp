@@ -1,0 +1,157 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/analysis/internal/RomanTextWords.h"
+
+#include "brindle/theory/CChordNamePrefs.h"
+
+#include <algorithm>
+#include <array>
+#include <charconv>
+#include <cmath>
+
+namespace brindle {
+namespace {
+
+constexpr std::string_view kBlanks = " \t\r\f\v";
+
+// No music is longer, no bar has more beats.
+constexpr int kMostMeasures = 999'999;
+constexpr int kMostBeats = 99;
+
+bool IsDigit(char c) {
+    return c >= '0' && c <= '9';
+}
+
+// A whole number up to a limit; nothing, and nothing taken, otherwise.
+std::optional<int> TakeWhole(std::string_view& text, int most) {
+    int number = 0;
+    const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), number);
+    if (text.empty() || !IsDigit(text.front()) || error != std::errc() || number > most) {
+        return std::nullopt;
+    }
+    text.remove_prefix(static_cast<std::size_t>(end - text.data()));
+    return number;
+}
+
+bool Take(std::string_view& text, std::string_view word) {
+    if (!text.starts_with(word)) return false;
+    text.remove_prefix(word.size());
+    return true;
+}
+
+// The fraction that was meant: .33 is a third. One digit is exact but for thirds.
+double FractionOf(std::string_view digits) {
+    double fraction = 0.0;
+    double unit = 0.1;
+    for (const char c : digits) {
+        fraction += unit * (c - '0');
+        unit /= 10.0;
+    }
+    if (digits == "3") return 1.0 / 3.0;
+    if (digits == "6" || digits == "7") return 2.0 / 3.0;
+    if (digits.size() < 2) return fraction;
+    constexpr double tolerance = 0.0075;
+    for (const int parts : {1, 2, 4, 3, 8, 6, 16, 12}) {
+        const double near = std::round(fraction * parts) / parts;
+        if (std::abs(fraction - near) < tolerance) return near;
+    }
+    return fraction;
+}
+
+bool IsCompound(const TTimeSignature& time) {
+    if (time.mIsSlow || time.mBeats % 3 != 0) return false;
+    return time.mBeats > 3 || time.mBeatValue >= 8;
+}
+
+}  // namespace
+
+std::optional<TMeasureRange> TakeMeasures(std::string_view& text) {
+    std::string_view rest = text;
+    if (!Take(rest, "m")) return std::nullopt;
+    const auto first = TakeWhole(rest, kMostMeasures);
+    if (!first) return std::nullopt;
+    TMeasureRange range{*first, *first};
+    if (Take(rest, "var")) {
+        range.mIsVariant = true;
+        while (!rest.empty() && IsDigit(rest.front())) rest.remove_prefix(1);
+    } else if (!rest.empty() && rest.front() >= 'a' && rest.front() <= 'z') {
+        range.mHasLetter = true;
+        rest.remove_prefix(1);
+    }
+    if (Take(rest, "-")) {
+        Take(rest, "m");
+        const auto last = TakeWhole(rest, kMostMeasures);
+        if (!last || *last < *first) return std::nullopt;
+        range.mLast = *last;
+    }
+    const bool isWhole = rest.empty() || rest.front() == '=' || rest.front() == ':' ||
+                         kBlanks.find(rest.front()) != kBlanks.npos;
+    if (!isWhole) return std::nullopt;
+    text = rest;
+    return range;
+}
+
+std::optional<double> BeatOf(std::string_view word) {
+    if (!Take(word, "b")) return std::nullopt;
+    const auto beat = TakeWhole(word, kMostBeats);
+    if (!beat || *beat < 1) return std::nullopt;
+    if (word.empty()) return *beat;
+    if (!Take(word, ".") || word.empty() || word.size() > 9) return std::nullopt;
+    if (!std::all_of(word.begin(), word.end(), IsDigit)) return std::nullopt;
+    return *beat + FractionOf(word);
+}
+
+std::optional<CSignKeyLite> KeyOf(std::string_view word) {
+    if (word.size() < 2 || word.back() != ':') return std::nullopt;
+    word.remove_suffix(1);
+    const bool isMinor = word.front() >= 'a' && word.front() <= 'g';
+    if (!isMinor && (word.front() < 'A' || word.front() > 'G')) return std::nullopt;
+    constexpr std::size_t longest = 16;
+    if (word.size() > longest) return std::nullopt;
+    std::string name(word);
+    if (isMinor) name.front() = static_cast<char>(name.front() - 'a' + 'A');
+    std::replace(name.begin() + 1, name.end(), '-', 'b');
+    CKeyEnh root;
+    int consumed = 0;
+    root.SetFromString(name, &consumed, ChordNamePrefsNonUTF8);
+    if (static_cast<std::size_t>(consumed) != name.size()) return std::nullopt;
+    return CSignKeyLite(root, isMinor ? TSignKeyType_Minor : TSignKeyType_Major);
+}
+
+double TTimeSignature::BeatLength() const {
+    return (IsCompound(*this) ? 12.0 : 4.0) / mBeatValue;
+}
+
+std::optional<TTimeSignature> TimeSignatureOf(std::string_view text) {
+    TTimeSignature time;
+    text = Trimmed(text);
+    if (text == "C") return time;
+    if (text == "Cut" || text == "cut" || text == "C|") return TTimeSignature{2, 2};
+    time.mIsSlow = Take(text, "slow");
+    if (!time.mIsSlow) (void)Take(text, "fast");
+    text = Trimmed(text);
+    const auto beats = TakeWhole(text, kMostBeats);
+    if (!beats || *beats < 1 || !Take(text, "/")) return std::nullopt;
+    const auto value = TakeWhole(text, 64);
+    constexpr std::array<int, 7> values{1, 2, 4, 8, 16, 32, 64};
+    if (!value || !text.empty()) return std::nullopt;
+    if (std::find(values.begin(), values.end(), *value) == values.end()) return std::nullopt;
+    time.mBeats = *beats;
+    time.mBeatValue = *value;
+    return time;
+}
+
+std::string_view TakeWord(std::string_view& text) {
+    const std::size_t begin = std::min(text.find_first_not_of(kBlanks), text.size());
+    text.remove_prefix(begin);
+    const std::string_view word = text.substr(0, text.find_first_of(kBlanks));
+    text.remove_prefix(word.size());
+    return word;
+}
+
+std::string_view Trimmed(std::string_view text) {
+    const std::size_t begin = text.find_first_not_of(kBlanks);
+    if (begin == text.npos) return {};
+    return text.substr(begin, text.find_last_not_of(kBlanks) + 1 - begin);
+}
+
+}  // namespace brindle
