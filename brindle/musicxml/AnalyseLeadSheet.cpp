@@ -3,6 +3,7 @@
 #include "brindle/chords/CChordHeavy.h"
 #include "brindle/musicxml/CChordSetFromMusicXml.h"
 #include "brindle/musicxml/TMusicXMLDoc.h"
+#include "brindle/musicxml/internal/PlaceChordsOfScore.h"
 #include "brindle/theory/CChordNamePrefs.h"
 
 #include <algorithm>
@@ -55,28 +56,34 @@ void CHarmonicAnalyse::AnalyseFromMusicXMLFile(const std::string& path, TAnalyse
     AnalyseFromMusicXMLDoc(doc, analyse);
 }
 
-void CHarmonicAnalyse::AnalyseFromMusicXMLDoc(const TMusicXMLDoc& doc, TAnalyse analyse) {
-    mChords.clear();
-    mSignKeys.insert(mSignKeys.end(), doc.HarmSignKeys.begin(), doc.HarmSignKeys.end());
-    if (mSignKeys.empty()) mSignKeys.emplace_back();
-    const CSignKeyFinder finder(mSignKeys);
+void PlaceChordsOfScore(const CHarmAnlsChords& chords, double end, CHarmonicAnalyse& analyse) {
+    CHarmAnlsSignKeys& signKeys = analyse.mSignKeys;
+    if (signKeys.empty()) signKeys.emplace_back();
+    const CSignKeyFinder finder(signKeys);
     bool wasPlaced = false;
-    double endPosition = kPosUndef;
-    for (const TMusicXMLHarmony& harmony : doc.Harmonies) {
-        if (IsNoChord(harmony)) continue;
-        const CHarmAnlsChordWithPos chord = ChordOf(harmony);
-        mChords.push_back(chord);
-        if (CHarmAnlsSignKey* signKey = finder.At(harmony.mPosition)) {
+    for (const CHarmAnlsChordWithPos& chord : chords) {
+        if (CHarmAnlsSignKey* signKey = finder.At(chord.mPosition)) {
             if (signKey->mHarmCenters.empty()) signKey->mHarmCenters.emplace_back();
             signKey->mHarmCenters.back().mChords.push_back(chord);
             wasPlaced = true;
         }
-        endPosition = harmony.mPosition + harmony.mDuration;
     }
-    CHarmAnlsCenters& lastCenters = mSignKeys.back().mHarmCenters;
-    if (wasPlaced && !lastCenters.empty() && endPosition != kPosUndef) {
-        lastCenters.back().mChords.push_back(CHarmAnlsChordWithPos(CHarmAnlsChord(), endPosition));
+    CHarmAnlsCenters& lastCenters = signKeys.back().mHarmCenters;
+    if (wasPlaced && !lastCenters.empty() && end != kPosUndef) {
+        lastCenters.back().mChords.push_back(CHarmAnlsChordWithPos(CHarmAnlsChord(), end));
     }
+}
+
+void CHarmonicAnalyse::AnalyseFromMusicXMLDoc(const TMusicXMLDoc& doc, TAnalyse analyse) {
+    mChords.clear();
+    mSignKeys.insert(mSignKeys.end(), doc.HarmSignKeys.begin(), doc.HarmSignKeys.end());
+    double end = kPosUndef;
+    for (const TMusicXMLHarmony& harmony : doc.Harmonies) {
+        if (IsNoChord(harmony)) continue;
+        mChords.push_back(ChordOf(harmony));
+        end = harmony.mPosition + harmony.mDuration;
+    }
+    PlaceChordsOfScore(mChords, end, *this);
     mChordSequences = doc.ChordSequences;
     Analyse(analyse);
 }

@@ -71,7 +71,7 @@ TEST_CASE("Lead sheets are played through as their signs and words say") {
         const std::string path = std::string(BRINDLE_TEST_DATA) + "/leadsheets/" + row.mFile;
         std::string bytes = ReadWholeFile(path).value();
         if (IsScoreContainer(bytes)) bytes = ScoreInContainer(bytes).value();
-        CHECK(Shown(PlayScore(ReadScore(bytes).mScore.mMeasures)) == row.mOrder);
+        CHECK(Shown(PlayInOrder(ReadScore(bytes).mScore.mMarks)) == row.mOrder);
 
         TMusicXMLDoc doc;
         REQUIRE(doc.LoadAsPlayed(path));

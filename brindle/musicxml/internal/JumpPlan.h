@@ -1,18 +1,21 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "brindle/musicxml/internal/WrittenScore.h"
+#include "brindle/musicxml/internal/PlayMarks.h"
 
 #include <cstddef>
 #include <cstdint>
 #include <limits>
 #include <map>
-#include <optional>
+#include <span>
 #include <vector>
 
 namespace brindle {
 
 inline constexpr std::size_t kNoMeasure = std::numeric_limits<std::size_t>::max();
+
+/// The marks of each measure, in the order in which they are written.
+using TMarksOfMeasures = std::span<const TPlayMarks>;
 
 /// One ending of a repeat: the measures under one bracket, up to the sign that goes back.
 struct TEnding {
@@ -59,13 +62,27 @@ struct TMeasurePlan {
     std::size_t mCodaTarget = kNoMeasure;
 };
 
-/// All ways through a score, told from its marks.
+/// All ways through a song, told from its marks.
 struct TJumpPlan {
     std::vector<TMeasurePlan> mMeasures;
     std::vector<TEnding> mEndings;
     std::vector<TEndingGroup> mGroups;
+
+    /// Null for a measure in no ending.
+    [[nodiscard]] const TEnding* EndingAt(std::size_t ix) const {
+        const std::size_t ending = mMeasures[ix].mEnding;
+        return ending == kNoMeasure ? nullptr : &mEndings[ending];
+    }
+    [[nodiscard]] const TEndingGroup& GroupOf(const TEnding& ending) const {
+        return mGroups[ending.mGroup];
+    }
 };
 
-[[nodiscard]] TJumpPlan MakeJumpPlan(const TScoreMeasures& measures);
+[[nodiscard]] TJumpPlan MakeJumpPlan(TMarksOfMeasures marks);
+
+/// The first steps of making a plan: its endings and their groups, then its repeats. The plan has
+/// its measures.
+void PlanEndings(TMarksOfMeasures marks, TJumpPlan& plan);
+void PlanRepeats(TMarksOfMeasures marks, TJumpPlan& plan);
 
 }  // namespace brindle

@@ -1,11 +1,13 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "brindle/musicxml/internal/CursorReader.h"
 #include "brindle/musicxml/internal/HarmonyReader.h"
+#include "brindle/musicxml/internal/PlayMarkReader.h"
 #include "brindle/musicxml/internal/ScoreElements.h"
+#include "brindle/musicxml/internal/SignatureReader.h"
 #include "brindle/musicxml/internal/WrittenScore.h"
 
-#include <string>
 #include <string_view>
 
 namespace brindle {
@@ -13,11 +15,12 @@ namespace brindle {
 class XmlAttributes;
 
 /// Reads one measure of one part: how long it is, where its harmonies stand, and what steers the
-/// playing.
+/// playing. Each subject has a reader of its own, and each element one of these readers.
 class CMeasureReader {
 public:
     /// Reads into the last measure of the part, which is there already.
-    explicit CMeasureReader(TScorePart& part) : mPart(part) {}
+    explicit CMeasureReader(TScorePart& part)
+        : mPart(part), mCursor(part), mSignatures(part), mMarks(part) {}
 
     void Started(TScoreElement element, TScoreElement parent, const XmlAttributes& attributes);
     /// `text` is what stands in the element, without white space around it.
@@ -26,41 +29,15 @@ public:
     void Finish();
 
 private:
-    [[nodiscard]] TScoreMeasure& Measure() { return mPart.mMeasures.back(); }
-    [[nodiscard]] TPlayMarks& Marks() { return Measure().mMarks; }
-    [[nodiscard]] TTicks TicksOf(double duration) const;
-
-    void StartedRepeat(const XmlAttributes& attributes);
-    void StartedEnding(const XmlAttributes& attributes);
-    void StartedSound(const XmlAttributes& attributes);
-    void EndedNote();
-    void Move(TTicks ticks);
-    void EndedDivisions(std::string_view text);
-    void EndedBeatType(std::int32_t beatType);
-    void EndedWords(std::string_view text);
-    void EndedDirection();
-    void EndedHarmony();
+    void StartedHarmony(TScoreElement element, const XmlAttributes& attributes);
+    void EndedHarmony(TScoreElement element, TScoreElement parent, std::string_view text);
 
     TScorePart& mPart;
-    TTicks mCursor = 0;
-
-    double mDuration = 0.0;  // of the note or the move that is being read
-    bool mIsChordNote = false;
-    bool mIsGraceNote = false;
-
+    CCursorReader mCursor;
+    CSignatureReader mSignatures;
+    CPlayMarkReader mMarks;
     CHarmonyReader mHarmony;
     double mHarmonyOffset = 0.0;
-
-    TScoreTime mTime;
-    std::int32_t mBeats = 0;
-    bool mHasFifths = false;
-    bool mIsOtherStaffKey = false;
-    TScoreKey mKey;
-
-    std::string mWords;  // of the direction that is being read
-    bool mHasCodaSign = false;
-    bool mIsAtLeft = false;  // of the bar line that is being read
-    bool mIsAtRight = false;
 };
 
 }  // namespace brindle

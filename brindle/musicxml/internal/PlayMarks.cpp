@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "brindle/musicxml/internal/WrittenScore.h"
+#include "brindle/musicxml/internal/PlayMarks.h"
 
 namespace brindle {
 

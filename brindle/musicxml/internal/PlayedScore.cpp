@@ -2,9 +2,6 @@
 #include "brindle/musicxml/internal/PlayedScore.h"
 
 #include "brindle/musicxml/PlayedMeasures.h"
-#include "brindle/musicxml/TMusicXMLDoc.h"
-#include "brindle/musicxml/internal/PlayingOrder.h"
-#include "brindle/musicxml/internal/WrittenScore.h"
 #include "brindle/theory/CSignKeyHeavy.h"
 
 #include <algorithm>
@@ -28,20 +25,21 @@ CSignKeyLite SignKeyOf(const TScoreKey& key) {
 /// Lays the measures out in playing order.
 class CLayout {
 public:
-    CLayout(const TWrittenScore& score, TMusicXMLDoc& doc) : mScore(score), mDoc(doc) {}
+    explicit CLayout(TPlayedScore& score)
+        : mScore(score.mWritten), mOrder(score.mOrder), mDoc(score.mDoc), mEnd(score.mEnd) {}
 
     /// False when the song was cut.
     bool Run() {
         FindWhatHolds();
-        const TPlayingOrder order = PlayScore(mScore.mMeasures);
-        const std::size_t mostBytes = MakeRoom(order);
-        for (const std::uint32_t ix : order.mMeasures) {
+        mOrder = PlayInOrder(mScore.mMarks);
+        const std::size_t mostBytes = MakeRoom();
+        for (const std::uint32_t ix : mOrder.mMeasures) {
             if (mBytes > mostBytes) break;
             Play(ix);
         }
         SetDurations();
-        AppendCopies(order);
-        return !order.mWasCut && mBytes <= mostBytes;
+        AppendCopies();
+        return !mOrder.mWasCut && mBytes <= mostBytes;
     }
 
 private:
@@ -58,7 +56,7 @@ private:
     }
 
     // A long song takes much room; it is taken once. Gives how much it may be.
-    std::size_t MakeRoom(const TPlayingOrder& order) {
+    std::size_t MakeRoom() {
         std::vector<std::size_t> bytes;
         for (const TScoreMeasure& measure : mScore.mMeasures) {
             std::size_t sum = 0;
@@ -71,13 +69,13 @@ private:
         const std::size_t mostBytes = PlayLimitsOf(bytes.size(), written).mBytes;
         std::size_t count = 0;
         std::size_t sum = 0;
-        for (const std::uint32_t ix : order.mMeasures) {
+        for (const std::uint32_t ix : mOrder.mMeasures) {
             sum += bytes[ix];
             if (sum > mostBytes) break;
             count += mScore.mMeasures[ix].mHarmonies.size();
         }
         mDoc.Harmonies.reserve(count);
-        mDoc.HarmBarlines.reserve(order.mMeasures.size());
+        mDoc.HarmBarlines.reserve(mOrder.mMeasures.size());
         return mostBytes;
     }
 
@@ -127,32 +125,29 @@ private:
         if (!std::is_sorted(harmonies.begin(), harmonies.end(), isEarlier)) {
             std::stable_sort(harmonies.begin(), harmonies.end(), isEarlier);
         }
-        double next = QuartersOf(mPosition);
+        mEnd = QuartersOf(mPosition);
+        double next = mEnd;
         for (std::size_t i = harmonies.size(); i-- > 0;) {
             harmonies[i].mDuration = std::max(0.0, next - harmonies[i].mPosition);
             next = harmonies[i].mPosition;
         }
     }
 
-    // A copy reaches as far as the same measures follow on each other.
-    void AppendCopies(const TPlayingOrder& order) {
-        const auto& played = order.mMeasures;
-        for (const TJumpBack& jump : order.mJumpsBack) {
-            if (jump.mTo >= mDoc.HarmBarlines.size()) break;
-            std::size_t length = 0;
-            while (jump.mTo + length < mDoc.HarmBarlines.size() && jump.mFrom + length < jump.mTo &&
-                   played[jump.mFrom + length] == played[jump.mTo + length]) {
-                ++length;
-            }
+    void AppendCopies() {
+        const std::size_t count = mDoc.HarmBarlines.size();
+        for (const TJumpBack& jump : mOrder.mJumpsBack) {
+            if (jump.mTo >= count) break;
             const auto back = static_cast<std::int32_t>(jump.mTo - jump.mFrom);
             mDoc.HarmCopies.push_back({.mTargetPos = mDoc.HarmBarlines[jump.mTo].mPosition,
                                        .mSourceOffsetBars = -back,
-                                       .mLengthBars = length});
+                                       .mLengthBars = std::min(jump.mLength, count - jump.mTo)});
         }
     }
 
     const TWrittenScore& mScore;
+    TPlayingOrder& mOrder;
     TMusicXMLDoc& mDoc;
+    double& mEnd;
     std::vector<std::optional<TScoreTime>> mTimes;  // that hold in each measure
     std::vector<std::optional<TScoreKey>> mKeys;
     TTicks mPosition = 0;
@@ -163,8 +158,8 @@ private:
 
 }  // namespace
 
-bool LayOutAsPlayed(const TWrittenScore& score, TMusicXMLDoc& doc) {
-    return CLayout(score, doc).Run();
+bool LayOutAsPlayed(TPlayedScore& score) {
+    return CLayout(score).Run();
 }
 
 }  // namespace brindle

@@ -1,13 +1,49 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "brindle/musicxml/TMusicXMLDoc.h"
+#include "brindle/musicxml/internal/PlayingOrder.h"
+#include "brindle/musicxml/internal/WrittenScore.h"
+#include "brindle/platform/Error.h"
+
+#include <cstddef>
+#include <optional>
+#include <string_view>
+
 namespace brindle {
 
-struct TMusicXMLDoc;
-struct TWrittenScore;
+/// Of the errors of loading a score as it is played.
+inline constexpr std::string_view kLoadFaultDomain = "brindle.musicxml";
+enum TLoadFault : int {
+    LoadFault_File = 1,
+    LoadFault_Container = 2,
+    LoadFault_Score = 3,
+    LoadFault_Endless = 4,
+};
 
-/// Appends what a score holds to `doc`, in playing order. False when the song was cut at
-/// kMaxPlayedMeasures or kMaxPlayedBytes.
-bool LayOutAsPlayed(const TWrittenScore& score, TMusicXMLDoc& doc);
+/// Why there is no score, or not all of it.
+struct TScoreFault {
+    Error mError;
+    /// From 1; 0 where the fault has no place in a text.
+    std::size_t mLine = 0;
+    std::size_t mColumn = 0;
+};
+
+/// A score as it is written and as it is played.
+struct TPlayedScore {
+    TWrittenScore mWritten;
+    TPlayingOrder mOrder;
+    TMusicXMLDoc mDoc;
+    /// In quarters.
+    double mEnd = 0.0;
+    std::optional<TScoreFault> mFault;
+};
+
+/// Reads a score, plain or in a container, and plays it.
+[[nodiscard]] TPlayedScore PlayScoreBytes(std::string_view bytes);
+
+/// Plays `score.mWritten` into its other fields. False when the song was cut, as it is too long or
+/// its harmonies take more than kMaxPlayedBytes.
+bool LayOutAsPlayed(TPlayedScore& score);
 
 }  // namespace brindle

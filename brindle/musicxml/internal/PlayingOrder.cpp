@@ -2,7 +2,6 @@
 #include "brindle/musicxml/internal/PlayingOrder.h"
 
 #include "brindle/musicxml/PlayedMeasures.h"
-#include "brindle/musicxml/internal/JumpPlan.h"
 
 #include <algorithm>
 
@@ -10,18 +9,61 @@ namespace brindle {
 
 namespace {
 
+/// The repeat that is being played.
+class CPasses {
+public:
+    /// From 1, for the repeat that begins at `start`.
+    [[nodiscard]] std::int32_t PassOf(std::size_t start) const {
+        return mStart == start ? mPass : 1;
+    }
+    void GoBackTo(std::size_t start) {
+        mPass = PassOf(start) + 1;
+        mStart = start;
+    }
+    void Leave() { mStart = kNoMeasure; }
+
+private:
+    std::size_t mStart = kNoMeasure;
+    std::int32_t mPass = 1;
+};
+
+/// What the last jump asks for.
+class CLastJump {
+public:
+    /// A jump that tells neither "al Fine" nor "al Coda" obeys both where it finds them. What
+    /// stands up to `end` was played before.
+    void Jump(const TPlayMarks& marks, std::size_t end) {
+        mIsPlayingAgain = true;
+        mEnd = end;
+        mToFine = marks.mAlFine || !marks.mAlCoda;
+        mToCoda = marks.mAlCoda || !marks.mAlFine;
+    }
+    void ReachCoda() { *this = {}; }
+    void Pass(std::size_t ix) { mIsPlayingAgain = mIsPlayingAgain && ix < mEnd; }
+
+    [[nodiscard]] bool IsPlayingAgain() const { return mIsPlayingAgain; }
+    [[nodiscard]] bool StopsAtFine() const { return mToFine; }
+    [[nodiscard]] bool GoesToCoda() const { return mToCoda; }
+
+private:
+    bool mIsPlayingAgain = false;
+    bool mToFine = false;
+    bool mToCoda = false;
+    std::size_t mEnd = 0;
+};
+
 class CPlayer {
 public:
-    explicit CPlayer(const TScoreMeasures& measures)
-        : mWritten(measures),
-          mPlan(MakeJumpPlan(measures)),
-          mMostPlayed(PlayLimitsOf(measures.size(), 0).mMeasures),
-          mLastPlayed(measures.size(), kNoMeasure),
-          mHasJumped(measures.size(), false) {}
+    explicit CPlayer(TMarksOfMeasures marks)
+        : mMarks(marks),
+          mPlan(MakeJumpPlan(marks)),
+          mMostPlayed(PlayLimitsOf(marks.size(), 0).mMeasures),
+          mLastPlayed(marks.size(), kNoMeasure),
+          mHasJumped(marks.size(), false) {}
 
     [[nodiscard]] TPlayingOrder Play() {
         std::size_t ix = 0;
-        while (ix < mWritten.size()) {
+        while (ix < mMarks.size()) {
             if (const std::size_t other = ChooseEnding(ix); other != ix) {
                 ix = other;
                 continue;
@@ -34,6 +76,7 @@ public:
             mOrder.mMeasures.push_back(static_cast<std::uint32_t>(ix));
             ix = Next(ix);
         }
+        for (TJumpBack& jump : mOrder.mJumpsBack) Measure(jump);
         return std::move(mOrder);
     }
 
@@ -45,9 +88,9 @@ private:
             mIsEndingChosen = false;
             return ix;
         }
-        const TEndingGroup& group = mPlan.mGroups[mPlan.mEndings[at].mGroup];
+        const TEndingGroup& group = mPlan.GroupOf(mPlan.mEndings[at]);
         if (group.mFirstEnding != at) return ix;
-        const std::size_t chosen = EndingOf(group, PassOf(group.mRepeatStart));
+        const std::size_t chosen = EndingOf(group, mPasses.PassOf(group.mRepeatStart));
         if (chosen == kNoMeasure) return group.mBehind;
         mIsEndingChosen = chosen != at;
         return mPlan.mEndings[chosen].mFirst;
@@ -58,10 +101,12 @@ private:
         const std::size_t last = first + group.mEndingCount - 1;
         const std::size_t lastOrNone =
             group.mEndingCount == 1 && mPlan.mEndings[last].mGoesBack ? kNoMeasure : last;
-        if (mIsAfterJump && !group.mIsForAfterJump) {
-            if (mToFine && group.mEndingWithFine != kNoMeasure) return group.mEndingWithFine;
-            if (mToCoda && group.mEndingWithToCoda != kNoMeasure) return group.mEndingWithToCoda;
-            return lastOrNone;
+        if (mJump.IsPlayingAgain() && !group.mIsForAfterJump) {
+            if (mJump.StopsAtFine() && group.mEndingWithFine != kNoMeasure) {
+                return group.mEndingWithFine;
+            }
+            const bool leads = mJump.GoesToCoda() && group.mEndingWithToCoda != kNoMeasure;
+            return leads ? group.mEndingWithToCoda : lastOrNone;
         }
         const auto& endings = group.mEndingOfPass;
         if (const auto it = endings.find(pass); it != endings.end()) return it->second;
@@ -70,64 +115,65 @@ private:
 
     [[nodiscard]] std::size_t Next(std::size_t ix) {
         const TMeasurePlan& plan = mPlan.mMeasures[ix];
-        const TPlayMarks& marks = mWritten[ix].mMarks;
-        if (mToFine && marks.mFine) return mWritten.size();
+        if (mJump.StopsAtFine() && mMarks[ix].mFine) return mMarks.size();
         if (plan.mRepeatStart != kNoMeasure) {
-            if (GoesBackAt(ix, ix)) return GoBack(ix);
-            LeaveRepeat();
+            if (GoesBackAt(ix, ix)) return GoBack(plan.mRepeatStart);
+            mPasses.Leave();
         }
-        if (mToCoda && plan.mCodaTarget != kNoMeasure) return GoToCoda(plan.mCodaTarget);
-        if (plan.mJumpTarget != kNoMeasure && !mHasJumped[ix]) {
-            const bool isLastPass = plan.mRepeatEnd == kNoMeasure || plan.mRepeatEnd == ix ||
-                                    !GoesBackAt(plan.mRepeatEnd, ix);
-            if (isLastPass) return Jump(ix);
+        if (mJump.GoesToCoda() && plan.mCodaTarget != kNoMeasure) {
+            return GoToCoda(plan.mCodaTarget);
         }
-        if (mIsAfterJump && ix >= mJumpedFrom) mIsAfterJump = false;
-        if (plan.mEnding != kNoMeasure && ix == mPlan.mEndings[plan.mEnding].mLast) {
-            LeaveRepeat();
-            return mPlan.mGroups[mPlan.mEndings[plan.mEnding].mGroup].mBehind;
-        }
-        return ix + 1;
+        if (JumpsAt(ix)) return Jump(ix);
+        mJump.Pass(ix);
+        return Behind(ix);
+    }
+
+    // The next measure, or the one behind all endings.
+    [[nodiscard]] std::size_t Behind(std::size_t ix) {
+        const TEnding* ending = mPlan.EndingAt(ix);
+        if (ending == nullptr || ix != ending->mLast) return ix + 1;
+        mPasses.Leave();
+        return mPlan.GroupOf(*ending).mBehind;
     }
 
     // Whether this pass goes back at `end`, seen from the measure `ix` in front of it.
     [[nodiscard]] bool GoesBackAt(std::size_t end, std::size_t ix) const {
         const TMeasurePlan& plan = mPlan.mMeasures[end];
-        if (mIsAfterJump && !mWritten[end].mMarks.mRepeatAfterJump) return false;
-        const std::int32_t pass = PassOf(plan.mRepeatStart);
+        if (mJump.IsPlayingAgain() && !mMarks[end].mRepeatAfterJump) return false;
+        const std::int32_t pass = mPasses.PassOf(plan.mRepeatStart);
         if (plan.mEnding == kNoMeasure) return pass < plan.mRepeatTimes;
         std::size_t ending = plan.mEnding;
-        const TEndingGroup& group = mPlan.mGroups[mPlan.mEndings[ending].mGroup];
+        const TEndingGroup& group = mPlan.GroupOf(mPlan.mEndings[ending]);
         if (mPlan.mMeasures[ix].mEnding == kNoMeasure) ending = EndingOf(group, pass);
         if (ending == kNoMeasure || !mPlan.mEndings[ending].mGoesBack) return false;
         const bool isLast = ending + 1 == group.mFirstEnding + group.mEndingCount;
         return !isLast || group.mEndingCount == 1 || pass < plan.mRepeatTimes;
     }
 
-    [[nodiscard]] std::size_t GoBack(std::size_t ix) {
-        const std::size_t start = mPlan.mMeasures[ix].mRepeatStart;
-        mPass = PassOf(start) + 1;
-        mRepeatStart = start;
+    [[nodiscard]] std::size_t GoBack(std::size_t start) {
+        mPasses.GoBackTo(start);
         AppendJumpBack(start);
         return start;
     }
 
     [[nodiscard]] std::size_t GoToCoda(std::size_t coda) {
-        mToCoda = mToFine = mIsAfterJump = false;
-        LeaveRepeat();
+        mJump.ReachCoda();
+        mPasses.Leave();
         mIsEndingChosen = mPlan.mMeasures[coda].mEnding != kNoMeasure;
         return coda;
     }
 
-    // A jump that tells neither "al Fine" nor "al Coda" obeys both where it finds them.
+    [[nodiscard]] bool JumpsAt(std::size_t ix) const {
+        const TMeasurePlan& plan = mPlan.mMeasures[ix];
+        if (plan.mJumpTarget == kNoMeasure || mHasJumped[ix]) return false;
+        const bool isInRepeat = plan.mRepeatEnd != kNoMeasure && plan.mRepeatEnd != ix;
+        return !isInRepeat || !GoesBackAt(plan.mRepeatEnd, ix);
+    }
+
     [[nodiscard]] std::size_t Jump(std::size_t ix) {
-        const TPlayMarks& marks = mWritten[ix].mMarks;
         mHasJumped[ix] = true;
-        mIsAfterJump = true;
-        mJumpedFrom = EndOfRepeatAround(ix);
-        mToFine = marks.mAlFine || !marks.mAlCoda;
-        mToCoda = marks.mAlCoda || !marks.mAlFine;
-        LeaveRepeat();
+        mJump.Jump(mMarks[ix], EndOfRepeatAround(ix));
+        mPasses.Leave();
         const std::size_t target = mPlan.mMeasures[ix].mJumpTarget;
         AppendJumpBack(target);
         return target;
@@ -137,9 +183,8 @@ private:
     [[nodiscard]] std::size_t EndOfRepeatAround(std::size_t ix) const {
         const std::size_t repeatEnd = mPlan.mMeasures[ix].mRepeatEnd;
         const std::size_t end = repeatEnd == kNoMeasure ? ix : repeatEnd;
-        const std::size_t ending = mPlan.mMeasures[end].mEnding;
-        if (ending == kNoMeasure) return end;
-        return mPlan.mGroups[mPlan.mEndings[ending].mGroup].mBehind - 1;
+        const TEnding* ending = mPlan.EndingAt(end);
+        return ending == nullptr ? end : mPlan.GroupOf(*ending).mBehind - 1;
     }
 
     void AppendJumpBack(std::size_t target) {
@@ -147,32 +192,29 @@ private:
         mOrder.mJumpsBack.push_back({mOrder.mMeasures.size(), mLastPlayed[target]});
     }
 
-    [[nodiscard]] std::int32_t PassOf(std::size_t repeatStart) const {
-        return mRepeatStart == repeatStart ? mPass : 1;
+    void Measure(TJumpBack& jump) const {
+        const std::vector<std::uint32_t>& played = mOrder.mMeasures;
+        while (jump.mTo + jump.mLength < played.size() && jump.mFrom + jump.mLength < jump.mTo &&
+               played[jump.mFrom + jump.mLength] == played[jump.mTo + jump.mLength]) {
+            ++jump.mLength;
+        }
     }
-    void LeaveRepeat() { mRepeatStart = kNoMeasure; }
 
-    const TScoreMeasures& mWritten;
+    TMarksOfMeasures mMarks;
     TJumpPlan mPlan;
     std::size_t mMostPlayed;
     TPlayingOrder mOrder;
     std::vector<std::size_t> mLastPlayed;  // of each measure, an index into the order
     std::vector<bool> mHasJumped;
-
-    std::size_t mRepeatStart = kNoMeasure;  // of the repeat that is being played
-    std::int32_t mPass = 1;
+    CPasses mPasses;
+    CLastJump mJump;
     bool mIsEndingChosen = false;
-
-    bool mIsAfterJump = false;
-    std::size_t mJumpedFrom = 0;
-    bool mToFine = false;
-    bool mToCoda = false;
 };
 
 }  // namespace
 
-TPlayingOrder PlayScore(const TScoreMeasures& measures) {
-    return CPlayer(measures).Play();
+TPlayingOrder PlayInOrder(TMarksOfMeasures marks) {
+    return CPlayer(marks).Play();
 }
 
 }  // namespace brindle

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "brindle/musicxml/internal/WrittenScore.h"
+#include "brindle/musicxml/internal/JumpPlan.h"
 
 #include <cstddef>
 #include <cstdint>
@@ -14,9 +14,11 @@ struct TJumpBack {
     /// Indexes into the played measures: the copy, and where the same measure was played before.
     std::size_t mTo = 0;
     std::size_t mFrom = 0;
+    /// So many measures follow on each other here as they did there.
+    std::size_t mLength = 0;
 };
 
-/// The measures of a score in the order in which they are played.
+/// The measures of a song in the order in which they are played.
 struct TPlayingOrder {
     std::vector<std::uint32_t> mMeasures;
     std::vector<TJumpBack> mJumpsBack;
@@ -27,6 +29,6 @@ struct TPlayingOrder {
 /// Follows repeats, endings and jumps. A jump is made once, at the end of its measure and after the
 /// last pass of a repeat around it. What was played before it is played again without repeats and
 /// with the last endings.
-[[nodiscard]] TPlayingOrder PlayScore(const TScoreMeasures& measures);
+[[nodiscard]] TPlayingOrder PlayInOrder(TMarksOfMeasures marks);
 
 }  // namespace brindle

@@ -4,6 +4,7 @@
 #include "brindle/musicxml/TMusicXMLDoc.h"
 #include "brindle/musicxml/internal/MeasureReader.h"
 #include "brindle/musicxml/internal/ScoreElements.h"
+#include "brindle/platform/ReadNumber.h"
 #include "brindle/platform/XmlStreamParser.h"
 
 #include <cmath>
@@ -43,12 +44,17 @@ public:
             OpenPart(attributes.Value("id"));
         } else if (element == Measure && parent != Part) {
             ++mMeasureCount;
+            mNumber = attributes.Value("number");
         } else if (element == Measure || element == Part) {
             if (element == Part) {
                 OpenPart(attributes.Value("id"));
                 AppendMissedMeasures();
             }
             OpenMeasure();
+            TakeNumber(element == Measure ? attributes.Value("number") : mNumber);
+        } else if (element == Sound) {
+            TakeTempo(attributes.Value("tempo"));
+            if (mReader) mReader->Started(element, parent, attributes);
         } else if (mReader) {
             mReader->Started(element, parent, attributes);
         }
@@ -63,6 +69,8 @@ public:
             mMovementTitle = text;
         } else if (element == WorkTitle) {
             mWorkTitle = text;
+        } else if (element == Creator) {
+            AddMaker(text);
         } else if ((element == Measure && parent == Part) ||
                    (element == Part && parent == Measure)) {
             CloseMeasure();
@@ -83,7 +91,9 @@ public:
     [[nodiscard]] TWrittenScore Take() {
         TWrittenScore score;
         score.mTitle = mMovementTitle.empty() ? mWorkTitle : mMovementTitle;
-        score.mMeasures = JoinParts();
+        score.mMakers = std::move(mMakers);
+        score.mTempo = mTempo;
+        JoinParts(score);
         return score;
     }
 
@@ -96,10 +106,27 @@ private:
         mPart = &mParts[it->second];
     }
 
+    void TakeNumber(std::string_view number) {
+        if (!WasCut()) mPart->mMeasures.back().mNumber = number;
+    }
+
+    // The first one; marks of the metronome are given as sounds, too.
+    void TakeTempo(std::string_view text) {
+        const double tempo = text.empty() ? 0.0 : ReadDecimal(text);
+        if (!mTempo && tempo > 0.0 && std::isfinite(tempo)) mTempo = tempo;
+    }
+
+    void AddMaker(std::string_view maker) {
+        if (maker.empty() || mMakers.size() > kXmlMaxTextLength) return;
+        if (!mMakers.empty()) mMakers += ", ";
+        mMakers += maker;
+    }
+
     void Append(std::size_t count) {
         mAllMeasures += count;
         if (WasCut()) return;
         mPart->mMeasures.resize(mPart->mMeasures.size() + count);
+        mPart->mMarks.resize(mPart->mMeasures.size());
     }
 
     // Measures in which a score that lists the parts of each measure did not name this part.
@@ -111,7 +138,7 @@ private:
     void OpenMeasure() {
         Append(1);
         if (WasCut()) return;
-        mPart->mMeasures.back().mMarks.mRepeatForward = mPart->mRepeatBeginsNext;
+        mPart->mMarks.back().mRepeatForward = mPart->mRepeatBeginsNext;
         mPart->mRepeatBeginsNext = false;
         mReader.emplace(*mPart);
     }
@@ -122,24 +149,28 @@ private:
     }
 
     // The harmonies, keys and times are those of one part, the marks those of all.
-    [[nodiscard]] TScoreMeasures JoinParts() {
-        if (mParts.empty()) return {};
+    void JoinParts(TWrittenScore& score) {
+        if (mParts.empty()) return;
         std::size_t chosen = 0;
         while (chosen < mParts.size() && !mParts[chosen].mHasHarmonies) ++chosen;
         if (chosen == mParts.size()) chosen = 0;
-        TScoreMeasures measures = std::move(mParts[chosen].mMeasures);
+        score.mMeasures = std::move(mParts[chosen].mMeasures);
+        score.mMarks = std::move(mParts[chosen].mMarks);
         for (std::size_t i = 0; i < mParts.size(); ++i) {
-            if (i != chosen) Join(mParts[i], measures);
+            if (i != chosen) Join(mParts[i], score);
         }
-        return measures;
     }
 
-    static void Join(const TScorePart& part, TScoreMeasures& measures) {
+    static void Join(const TScorePart& part, TWrittenScore& score) {
+        TScoreMeasures& measures = score.mMeasures;
         if (measures.size() < part.mMeasures.size()) measures.resize(part.mMeasures.size());
+        score.mMarks.resize(measures.size());
         for (std::size_t i = 0; i < part.mMeasures.size(); ++i) {
             const TScoreMeasure& other = part.mMeasures[i];
             TScoreMeasure& measure = measures[i];
-            measure.mMarks.Add(other.mMarks);
+            score.mMarks[i].Add(part.mMarks[i]);
+            if (measure.mNumber.empty()) measure.mNumber = other.mNumber;
+            if (measure.mRehearsal.empty()) measure.mRehearsal = other.mRehearsal;
             measure.mHasRehearsal |= other.mHasRehearsal;
             measure.mHasSlash |= other.mHasSlash;
             if (!measure.mTime) measure.mTime = other.mTime;
@@ -153,6 +184,9 @@ private:
     bool mIsScore = false;
     std::string mMovementTitle;
     std::string mWorkTitle;
+    std::string mMakers;
+    std::optional<double> mTempo;
+    std::string mNumber;            // of the measure, where a score lists its parts
     std::deque<TScorePart> mParts;  // a deque, since readers of measures point into it
     std::map<std::string, std::size_t, std::less<>> mPartOfId;
     TScorePart* mPart = nullptr;

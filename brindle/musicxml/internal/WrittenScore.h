@@ -2,6 +2,7 @@
 #pragma once
 
 #include "brindle/musicxml/TMusicXMLHarmony.h"
+#include "brindle/musicxml/internal/PlayMarks.h"
 #include "brindle/theory/TSignKeyType.h"
 
 #include <algorithm>
@@ -52,48 +53,6 @@ struct TWrittenHarmony {
     TMusicXMLHarmony mHarmony;
 };
 
-/// A place that jumps lead to, with the name that the score gives it, if any.
-struct TJumpMark {
-    bool mIsSet = false;
-    std::string mName;
-
-    void Set(std::string_view name = {}) {
-        mIsSet = true;
-        if (mName.empty()) mName = name;
-    }
-    void Add(const TJumpMark& other) {
-        if (other.mIsSet) Set(other.mName);
-    }
-};
-
-/// What steers the playing, gathered from signs, words and sound instructions alike.
-struct TPlayMarks {
-    bool mRepeatForward = false;
-    bool mRepeatBackward = false;
-    /// Whether the repeat is taken again after a jump back.
-    bool mRepeatAfterJump = false;
-    /// How often the repeat that ends (or else begins) here is played; 0 where nothing tells it.
-    std::int32_t mRepeatTimes = 0;
-
-    bool mEndingStarts = false;
-    bool mEndingStops = false;
-    /// The passes in which the ending is played, as written.
-    std::vector<std::int32_t> mEndingNumbers;
-
-    bool mDaCapo = false;
-    TJumpMark mDalSegno;
-    bool mAlFine = false;
-    bool mAlCoda = false;
-    TJumpMark mSegno;
-    TJumpMark mCoda;
-    TJumpMark mToCoda;
-    bool mFine = false;
-
-    [[nodiscard]] bool Jumps() const { return mDaCapo || mDalSegno.mIsSet; }
-    /// Joins what another part of the score tells about the same measure.
-    void Add(const TPlayMarks& other);
-};
-
 struct TScoreMeasure {
     std::vector<TWrittenHarmony> mHarmonies;
     /// What its notes and rests fill; 0 for an empty measure.
@@ -102,7 +61,9 @@ struct TScoreMeasure {
     TTicks mOtherLength = 0;
     std::optional<TScoreTime> mTime;
     std::optional<TScoreKey> mKey;
-    TPlayMarks mMarks;
+    /// As printed.
+    std::string mNumber;
+    std::string mRehearsal;
     bool mHasRehearsal = false;
     bool mHasSlash = false;
 };
@@ -112,6 +73,8 @@ using TScoreMeasures = std::vector<TScoreMeasure>;
 /// One part of a score, while it is read.
 struct TScorePart {
     TScoreMeasures mMeasures;
+    /// Of each measure.
+    std::vector<TPlayMarks> mMarks;
     /// Units of duration in a quarter note; 0 until the score tells it.
     double mDivisions = 0.0;
     bool mHasHarmonies = false;
@@ -121,7 +84,13 @@ struct TScorePart {
 
 struct TWrittenScore {
     std::string mTitle;
+    /// Composers and writers, separated by ", ".
+    std::string mMakers;
+    /// Quarter notes a minute at the beginning.
+    std::optional<double> mTempo;
     TScoreMeasures mMeasures;
+    /// Of each measure.
+    std::vector<TPlayMarks> mMarks;
 };
 
 }  // namespace brindle

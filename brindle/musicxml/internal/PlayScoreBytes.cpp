@@ -1,0 +1,93 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/musicxml/ScoreContainer.h"
+#include "brindle/musicxml/internal/PlayedScore.h"
+#include "brindle/musicxml/internal/ScoreReader.h"
+#include "brindle/platform/Utf8.h"
+
+#include <algorithm>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <utility>
+
+namespace brindle {
+
+namespace {
+
+std::string_view WithoutLeadingWhite(std::string_view bytes) {
+    return bytes.substr(std::min(bytes.find_first_not_of(" \t\r\n"), bytes.size()));
+}
+
+// The bytes as UTF-8 if they are Latin-1 with letters that UTF-8 does not know.
+std::optional<std::string> FromLatin1(std::string_view bytes) {
+    bool isUtf8 = true;
+    for (std::string_view rest = bytes; !rest.empty() && isUtf8;) {
+        const std::size_t length = Utf8Length(rest);
+        isUtf8 = length > 0;
+        rest.remove_prefix(length);
+    }
+    if (isUtf8 || bytes.find('\0') != bytes.npos) return std::nullopt;
+    std::string text;
+    text.reserve(bytes.size());
+    for (const char c : bytes) {
+        const auto byte = static_cast<unsigned char>(c);
+        if (byte < 0x80) {
+            text += c;
+        } else {
+            text += static_cast<char>(0xC0 | byte >> 6);
+            text += static_cast<char>(0x80 | (byte & 0x3F));
+        }
+    }
+    return text;
+}
+
+// Some scores say UTF-8, or nothing, and are Latin-1.
+TScoreReading ReadScoreInAnyEncoding(std::string_view bytes) {
+    TScoreReading reading = ReadScore(WithoutLeadingWhite(bytes));
+    if (!reading.mError) return reading;
+    if (const auto text = FromLatin1(WithoutLeadingWhite(bytes))) {
+        TScoreReading other = ReadScore(*text);
+        if (!other.mError) return other;
+    }
+    return reading;
+}
+
+TScoreFault FaultOf(TLoadFault fault, std::string description) {
+    return {{std::string(kLoadFaultDomain), fault, std::move(description)}};
+}
+
+TScoreFault FaultOf(const XmlError& error) {
+    TScoreFault fault = FaultOf(LoadFault_Score, error.mDescription);
+    if (error.mLine <= 0) return fault;
+    fault.mLine = static_cast<std::size_t>(error.mLine);
+    fault.mColumn = static_cast<std::size_t>(error.mColumn);
+    return fault;
+}
+
+}  // namespace
+
+TPlayedScore PlayScoreBytes(std::string_view bytes) {
+    TPlayedScore played;
+    std::optional<std::string> unpacked;
+    if (IsScoreContainer(bytes)) {
+        unpacked = ScoreInContainer(bytes);
+        if (!unpacked) {
+            played.mFault = FaultOf(LoadFault_Container, "no score in the container");
+            return played;
+        }
+        bytes = *unpacked;
+    }
+    TScoreReading reading = ReadScoreInAnyEncoding(bytes);
+    if (reading.mError) {
+        played.mFault = FaultOf(*reading.mError);
+        return played;
+    }
+    played.mWritten = std::move(reading.mScore);
+    played.mDoc.Title = played.mWritten.mTitle;
+    if (!LayOutAsPlayed(played) || reading.mWasCut) {
+        played.mFault = FaultOf(LoadFault_Endless, "the song is too long to be played");
+    }
+    return played;
+}
+
+}  // namespace brindle
