@@ -144,16 +144,6 @@ std::string Present(const TAnalysedSong& analysed, const TAnalyseOptions& option
     return AnalysisText(SongOf(analysed, options), PaintOfOutput());
 }
 
-// The key that a chord text states for itself, if it is one.
-CHarmAnlsSignKeys StatedKey(const std::string& typed) {
-    const CKeyText key = ReadKeyText(FoldAccidentals(typed));
-    if (typed.empty() || !key.mError.empty()) return {};
-    CHarmAnlsSignKey stated;
-    stated.mPosition = 0.0;
-    stated.mSignKey = key.mSignKey;
-    return {stated};
-}
-
 TStatus AnalyseText(const TTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
                     const TAnalyseOptions& options, TAnalysedSong& analysed) {
     TChordStringParse parse;
@@ -164,9 +154,8 @@ TStatus AnalyseText(const TTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
     if (options.mFormat.Format() == TFormat::Native) reading.UseNative();
     const auto song = reading.ReadSongOrFail(typed.mText, parse);
     if (!song) return TStatus::BadInput;
-    analysed.mAnalyse.AnalyseFromChords(song->mChords,
-                                        signKeys.empty() ? StatedKey(song->mKey) : signKeys,
-                                        RouteOf(options.mRoute));
+    analysed.mAnalyse.AnalyseFromChords(
+        song->mChords, signKeys.empty() ? song->mStatedKeys : signKeys, RouteOf(options.mRoute));
     analysed.mSymbols = song->mSymbols;
     analysed.mBeatsPerBar = song->mBeatsPerBar;
     return TStatus::Success;

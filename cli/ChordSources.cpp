@@ -1,16 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "cli/ChordSources.h"
 
-#include "cli/Input.h"
-#include "cli/LeadSheet.h"
-
 #include "brindle/analysis/CHarmAnlsChords.h"
-#include "brindle/chords/CChordHeavy.h"
-#include "brindle/musicxml/CChordSetFromMusicXml.h"
-#include "brindle/musicxml/TMusicXMLDoc.h"
 #include "brindle/platform/AtomicFile.h"
-#include "brindle/platform/Error.h"
-#include "brindle/theory/CChordNamePrefs.h"
 
 #include <fmt/format.h>
 
@@ -18,7 +10,6 @@
 #include <array>
 #include <cmath>
 #include <filesystem>
-#include <sstream>
 #include <utility>
 
 namespace brindle::cli {
@@ -57,54 +48,18 @@ TChordSource Failed(std::string error) {
     return {{}, std::move(error)};
 }
 
-TChordSource FromLeadSheet(std::string_view bytes) {
-    TMusicXMLDoc doc;
-    Error error;
-    if (!doc.LoadAsPlayedFromBytes(bytes, &error)) return Failed(error.description);
+TChordSource FromSong(const CSong& song) {
     CSequences sequences;
-    for (const TMusicXMLHarmony& harmony : doc.Harmonies) {
-        CChordLite chord;
-        if (!IsNoChord(harmony)) {
-            chord.SetFromChordHeavy(CChordSetFromMusicXml(harmony, 24, CurrentChordNamePrefs));
-        }
-        if (chord.IsUndef()) {
-            sequences.Cut();
-        } else {
-            sequences.Add(chord, harmony.mDuration);
-        }
-    }
-    return sequences.Finish();
-}
-
-TChordSource FromChordStrings(const std::string& text) {
-    CSequences sequences;
-    std::istringstream lines(text);
-    for (std::string line; std::getline(lines, line);) {
-        std::erase_if(line, [](char c) { return c == ' ' || c == '\t' || c == '\r'; });
-        if (line.empty()) continue;
-        for (const CHarmAnlsChordWithLength& chord : HarmChordsFromChordString(line)) {
-            if (IsUndefinedForMarkov(chord)) {
-                sequences.Cut();
-            } else {
-                sequences.Add(chord, chord.mLength);
-            }
-        }
-        sequences.Cut();
-    }
-    return sequences.Finish();
-}
-
-TChordSource FromChordText(const std::string& text, const TChordStringParse& parse,
-                           const CTypedChords& reading) {
-    const TChordSong song = reading.ReadSong(text, parse);
-    if (!song.mFaults.empty() && !reading.IsLenient()) {
-        const CChordSheetFault& fault = song.mFaults.front();
-        return Failed(
-            fmt::format("line {}, column {}: {}", fault.mLine, fault.mColumn, fault.mText));
-    }
+    // The lines of chord strings do not go on from each other.
+    auto section = song.mSections.begin();
+    const bool isCut = song.mFormat == TSongFormat_ChordStrings;
     const CHarmAnlsChords& chords = song.mChords;
-    CSequences sequences;
     for (std::size_t ix = 0; ix + 1 < chords.size(); ++ix) {
+        while (isCut && section != song.mSections.end() &&
+               section->mPosition <= chords[ix].mPosition) {
+            sequences.Cut();
+            ++section;
+        }
         if (chords[ix].IsUndef()) {
             sequences.Cut();
         } else {
@@ -112,6 +67,11 @@ TChordSource FromChordText(const std::string& text, const TChordStringParse& par
         }
     }
     return sequences.Finish();
+}
+
+std::string FaultText(const CSongFault& fault) {
+    if (fault.mLine == 0) return fault.mText;
+    return fmt::format("line {}, column {}: {}", fault.mLine, fault.mColumn, fault.mText);
 }
 
 bool HasKnownEnding(const fs::path& path) {
@@ -141,11 +101,11 @@ TChordSource ReadChordSource(const std::string& path, const TChordStringParse& p
     if (!fs::exists(path, error)) return Failed("no such file");
     const auto bytes = ReadWholeFile(path, kMaxFileBytes);
     if (!bytes) return Failed("it cannot be read, or is larger than 64 MiB");
-    if (HasScoreBytes(*bytes)) return FromLeadSheet(*bytes);
-    const std::string text = FoldAccidentals(*bytes);
-    const std::size_t begin = text.find_first_not_of(" \t\r\n");
-    return begin != text.npos && text[begin] == '(' ? FromChordStrings(text)
-                                                    : FromChordText(*bytes, parse, reading);
+    const CSong song = reading.ReadSource(*bytes, parse);
+    const auto fault = std::find_if(song.mFaults.begin(), song.mFaults.end(),
+                                    [](const CSongFault& f) { return !f.mIsNote; });
+    const bool isGivenUp = fault != song.mFaults.end() && !reading.IsLenient();
+    return isGivenUp ? Failed(FaultText(*fault)) : FromSong(song);
 }
 
 std::vector<TFoundFile> FindChordSources(const std::vector<std::string>& paths) {

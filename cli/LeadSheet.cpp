@@ -8,11 +8,11 @@
 #include "brindle/platform/Error.h"
 #include "brindle/platform/XmlStreamParser.h"
 #include "brindle/present/ShownNames.h"
+#include "brindle/song/ReadSong.h"
 
 #include <fmt/format.h>
 
 #include <algorithm>
-#include <array>
 #include <cmath>
 
 namespace brindle::cli {
@@ -52,14 +52,9 @@ std::string FaultOf(std::string_view bytes) {
 
 }  // namespace
 
-// No chord text begins with a tag, a mark of the byte order, or the letters of a zip archive and
-// what follows them.
 bool HasScoreBytes(std::string_view bytes) {
-    for (const std::string_view mark : {"\xEF\xBB\xBF", "\xFF\xFE", "\xFE\xFF"}) {
-        if (bytes.substr(0, mark.size()) == mark) bytes.remove_prefix(mark.size());
-    }
-    const std::size_t first = bytes.find_first_not_of(std::string_view(" \t\r\n\0", 5));
-    return bytes.substr(0, 4) == "PK\x03\x04" || (first != bytes.npos && bytes[first] == '<');
+    const TSongFormat format = SongFormatOf(bytes);
+    return format == TSongFormat_MusicXml || format == TSongFormat_CompressedMusicXml;
 }
 
 std::optional<TTypedSong> ReadTypedSong(const std::vector<std::string>& words,

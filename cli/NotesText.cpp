@@ -48,7 +48,8 @@ public:
         const std::string_view octave = word.substr(static_cast<std::size_t>(consumed));
         if (octave.empty()) return Add(NoteNrFrom(mNext, key.mKeyNr), key.mEnh, word);
         const auto octaveNr = WholeNumber(octave);
-        if (!octaveNr) return fmt::format("behind the key stands its octave, not {}", Printable(octave));
+        if (!octaveNr)
+            return fmt::format("behind the key stands its octave, not {}", Printable(octave));
         const int octaveOfMiddleC = 3 + mPrefs.mOctaveNaming;
         return Add((std::int64_t{*octaveNr} - octaveOfMiddleC) * 12 + kMiddleC + key.mKeyNr,
                    key.mEnh, word);

@@ -3,6 +3,7 @@
 
 #include "cli/CommandLine.h"
 #include "cli/Input.h"
+#include "cli/LeadSheet.h"
 #include "cli/Output.h"
 
 #include "brindle/analysis/TChordStringParse.h"
@@ -11,6 +12,7 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <array>
 
 namespace brindle::cli {
 namespace {
@@ -18,10 +20,30 @@ namespace {
 /// Nobody reads more warnings.
 constexpr std::size_t kMostWarnings = 20;
 
-TChordSheetForm FormOf(const std::string& name) {
-    if (name == "chordpro") return TChordSheet_ChordPro;
-    if (name == "ireal") return TChordSheet_IReal;
-    return name == "auto" ? TChordSheet_Auto : TChordSheet_Plain;
+/// The forms that --from names.
+struct TFormRow {
+    std::string_view mName;
+    TSongFormat mFormat;
+};
+
+constexpr auto kForms = std::to_array<TFormRow>({
+    {"auto", TSongFormat_Auto},
+    {"plain", TSongFormat_ChordText},
+    {"lyrics", TSongFormat_ChordsAboveLyrics},
+    {"chordpro", TSongFormat_ChordPro},
+    {"ireal", TSongFormat_Chart},
+    {"strings", TSongFormat_ChordStrings},
+});
+
+/// A chart may stand in a link or in a page of links; all of these are named alike.
+TSongFormat FormatOf(std::string_view name, std::string_view text) {
+    const auto* const row = std::find_if(kForms.begin(), kForms.end(),
+                                         [&](const TFormRow& form) { return form.mName == name; });
+    const TSongFormat format = row == kForms.end() ? TSongFormat_Auto : row->mFormat;
+    if (format != TSongFormat_Chart) return format;
+    const TSongFormat found = SongFormatOf(text);
+    const bool isLink = found == TSongFormat_ChartLink || found == TSongFormat_ChartPage;
+    return isLink ? found : format;
 }
 
 std::string_view Line(std::string_view text, std::size_t number) {
@@ -30,8 +52,12 @@ std::string_view Line(std::string_view text, std::size_t number) {
 }
 
 /// Prints a fault with its line and a caret under the place.
-void PrintFault(std::string_view text, const CChordSheetFault& fault, bool isWarning) {
-    std::string message = isWarning ? "warning: " : "";
+void PrintFault(std::string_view text, const CSongFault& fault, bool isWarning) {
+    std::string message = isWarning || fault.mIsNote ? "warning: " : "";
+    if (fault.mLine == 0) {
+        Fail(TStatus::BadInput, message + Printable(fault.mText));
+        return;
+    }
     if (text.find('\n') != text.npos) message += fmt::format("line {}: ", fault.mLine);
     FailAtCharacter(TStatus::BadInput, message + Printable(fault.mText), Line(text, fault.mLine),
                     fault.mColumn);
@@ -39,10 +65,9 @@ void PrintFault(std::string_view text, const CChordSheetFault& fault, bool isWar
 
 }  // namespace
 
-void PrintFaults(std::string_view text, std::span<const CChordSheetFault> faults,
-                 bool areWarnings) {
+void PrintFaults(std::string_view text, std::span<const CTextFault> faults, bool areWarnings) {
     const std::size_t count = std::min(faults.size(), kMostWarnings);
-    for (const CChordSheetFault& fault : faults.first(count)) {
+    for (const CTextFault& fault : faults.first(count)) {
         PrintFault(text, fault, areWarnings);
     }
     if (faults.size() > count) {
@@ -60,8 +85,14 @@ void CTypedChords::AddTo(CCommand& command) {
 
 void CTypedChords::AddTo(CCommand& command, const std::string& fromPurpose) {
     AddTo(command);
-    command.AddChoice("--from", mForm, {"plain", "chordpro", "ireal", "auto"}, fromPurpose);
+    command.AddChoice("--from", mForm, {"auto", "plain", "lyrics", "chordpro", "ireal", "strings"},
+                      fromPurpose);
     command.AddFlag("--even", mIsEven, "The chords of a bar without holds share it evenly");
+}
+
+bool TChordSong::HasFault() const {
+    return std::any_of(mFaults.begin(), mFaults.end(),
+                       [](const CSongFault& fault) { return !fault.mIsNote; });
 }
 
 std::optional<std::vector<CChordLite>> CTypedChords::ReadSymbols(
@@ -94,7 +125,7 @@ bool CTypedChords::TakeReading(const std::string& symbol, const CChordTextReadin
     }
     if (fault.empty()) return true;
     chords.back() = CChordLite_NoChordYield;
-    PrintFault(symbol, {1, pos, fault}, mIsLenient);
+    PrintFault(symbol, {.mLine = 1, .mColumn = pos, .mText = fault}, mIsLenient);
     return mIsLenient;
 }
 
@@ -112,26 +143,36 @@ TChordSong CTypedChords::ReadSong(std::string_view text, const TChordStringParse
         song.mBeatsPerBar = parse.mBeatsPerBar;
         return song;
     }
-    CChordSheetPrefs prefs;
-    prefs.mForm = FormOf(mForm);
+    CSong read = ReadSource(text, parse);
+    song.mChords = std::move(read.mChords);
+    song.mSymbols = CChordSymbols(read.mSymbols, song.mChords);
+    song.mBeatsPerBar = read.mBeatsPerBar;
+    song.mStatedKeys = std::move(read.mStatedKeys);
+    song.mFaults = std::move(read.mFaults);
+    return song;
+}
+
+CSong CTypedChords::ReadSource(std::string_view bytes, const TChordStringParse& parse) const {
+    if (IsNative() && !HasScoreBytes(bytes)) {
+        CSong song;
+        song.mChords.ParseStringIntoChords(FoldAccidentals(bytes), parse);
+        song.mBeatsPerBar = parse.mBeatsPerBar;
+        return song;
+    }
+    CSongPrefs prefs;
+    prefs.mFormat = HasScoreBytes(bytes) ? TSongFormat_Auto : FormatOf(mForm, bytes);
     prefs.mBeatsPerBar = parse.mBeatsPerBar;
     prefs.mBeatsPerChord = parse.mBeatsPerChord;
     prefs.mEven = mIsEven;
     prefs.mLenient = mIsLenient;
-    CChordSheetReading reading = ReadChordSheet(text, prefs);
-    song.mChords = std::move(reading.mChords);
-    song.mSymbols = CChordSymbols(reading.mSymbols, song.mChords);
-    song.mBeatsPerBar = reading.mBeatsPerBar;
-    song.mKey = std::move(reading.mKey);
-    song.mFaults = std::move(reading.mFaults);
-    return song;
+    return brindle::ReadSong(bytes, prefs);
 }
 
 std::optional<TChordSong> CTypedChords::ReadSongOrFail(std::string_view text,
                                                        const TChordStringParse& parse) const {
     TChordSong song = ReadSong(text, parse);
     PrintFaults(text, song.mFaults, mIsLenient);
-    if (!song.mFaults.empty() && !mIsLenient) return std::nullopt;
+    if (song.HasFault() && !mIsLenient) return std::nullopt;
     return song;
 }
 

@@ -4,7 +4,7 @@
 #include "cli/ChordSymbols.h"
 
 #include "brindle/analysis/CHarmAnlsChords.h"
-#include "brindle/analysis/ReadChordSheet.h"
+#include "brindle/song/ReadSong.h"
 
 #include <optional>
 #include <span>
@@ -28,13 +28,16 @@ struct TChordSong {
     /// That of the song, or of the options if the song does not tell.
     double mBeatsPerBar = 4.0;
     /// Empty if the song does not tell.
-    std::string mKey;
-    /// What is not understood. Without --lenient the first fault, and then no chords.
-    std::vector<CChordSheetFault> mFaults;
+    CHarmAnlsSignKeys mStatedKeys;
+    /// What is not understood or was left out. Without --lenient a fault that is no note is the
+    /// last one, and then there are no chords.
+    std::vector<CSongFault> mFaults;
+
+    [[nodiscard]] bool HasFault() const;
 };
 
 /// Prints faults with their lines and carets under the places, a score of them at most.
-void PrintFaults(std::string_view text, std::span<const CChordSheetFault> faults, bool areWarnings);
+void PrintFaults(std::string_view text, std::span<const CTextFault> faults, bool areWarnings);
 
 /// How chords and songs that people type are read, with the options for it: --symbols and
 /// --lenient, and for songs --from and --even. Every subcommand that takes chords reads them here.
@@ -53,12 +56,15 @@ public:
         const std::vector<std::string>& symbols) const;
     [[nodiscard]] std::optional<CChordLite> ReadSymbol(const std::string& symbol) const;
 
-    /// Reads a song and leaves its faults to the caller. The beats are those of `parse`.
+    /// Reads a typed song and leaves its faults to the caller. The beats are those of `parse`.
     [[nodiscard]] TChordSong ReadSong(std::string_view text, const TChordStringParse& parse) const;
     /// The same with the faults printed: as warnings with --lenient, else as an error, and then
     /// there is no song.
     [[nodiscard]] std::optional<TChordSong> ReadSongOrFail(std::string_view text,
                                                            const TChordStringParse& parse) const;
+
+    /// The song of a source of any form, a score or a text.
+    [[nodiscard]] CSong ReadSource(std::string_view bytes, const TChordStringParse& parse) const;
 
 private:
     [[nodiscard]] bool IsNative() const { return mReader == "native"; }
@@ -66,7 +72,7 @@ private:
                                    std::vector<CChordLite>& chords) const;
 
     std::string mReader = "all";
-    std::string mForm = "plain";
+    std::string mForm = "auto";
     bool mIsLenient = false;
     bool mIsEven = false;
 };

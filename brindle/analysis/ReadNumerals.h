@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "brindle/analysis/ReadChordSheet.h"
 #include "brindle/analysis/RomanNumeral.h"
+#include "brindle/platform/CTextFault.h"
 
 #include <cstddef>
 #include <string>
@@ -28,7 +28,7 @@ struct CNumeralWord {
 struct CNumeralsReading {
     std::vector<CNumeralWord> mWords;
     /// Empty if all is understood.
-    std::vector<CChordSheetFault> mFaults;
+    std::vector<CTextFault> mFaults;
 };
 
 /// The words between white space, with their places; their chords are undefined.

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "brindle/analysis/ReadChordSheet.h"
 #include "brindle/chords/CChordLite.h"
+#include "brindle/platform/CTextFault.h"
 #include "brindle/theory/CSignKeyLite.h"
 
 #include <cstddef>
@@ -62,9 +62,9 @@ struct CRomanTextReading {
     /// Where `||` and other double bars stand.
     std::vector<double> mDoubleBars;
     /// Empty if all is understood; what is not, is left out.
-    std::vector<CChordSheetFault> mFaults;
+    std::vector<CTextFault> mFaults;
     /// What is understood and left out: other readings of a measure, pedals.
-    std::vector<CChordSheetFault> mNotes;
+    std::vector<CTextFault> mNotes;
 };
 
 /// Reads an analysis in RomanText.

@@ -3,6 +3,7 @@
 
 #include "brindle/analysis/CHarmAnlsChords.h"
 #include "brindle/analysis/CHarmAnlsSignKeys.h"
+#include "brindle/platform/CTextFault.h"
 #include "brindle/song/TSongFormat.h"
 #include "brindle/theory/CSignKeyLite.h"
 
@@ -62,19 +63,8 @@ struct CSongRemark {
     friend bool operator==(const CSongRemark&, const CSongRemark&) = default;
 };
 
-/// What is wrong with a song or was left out of it, and where.
-struct CSongFault {
-    /// From 1; 0 where the fault is that of the whole source.
-    std::size_t mLine = 0;
-    /// In characters (not bytes) from 1.
-    std::size_t mColumn = 0;
-    std::string mText;
-    /// The chords are all there and what stands here was left out, such as the other songs of a
-    /// list. Any other fault takes all chords of a song, unless the reading is lenient.
-    bool mIsNote = false;
-
-    friend bool operator==(const CSongFault&, const CSongFault&) = default;
-};
+/// What is wrong with a song or was left out of it, and where. Of a note the chords are all there.
+using CSongFault = CTextFault;
 
 /// A song from any source, played through its repeats, endings and jumps. A value.
 ///

@@ -29,8 +29,9 @@ struct CSongPrefs {
 /// Reads a song in any form.
 ///
 /// Nothing is printed or thrown for bad music or bad bytes: faults are in the song. Of a source
-/// with many songs this is the first. At most 64 times the written bars and 100,000 bars are
-/// played; a song that goes on is at fault. Time is n log n in what is read and played.
+/// with many songs this is the first. Repeats and jumps may play 64 times what is written, 10,000
+/// bars and chords in any case and 100,000 at most; a song that goes on is at fault. Time is n log
+/// n in what is read and played.
 [[nodiscard]] CSong ReadSong(std::string_view bytes, const CSongPrefs& prefs = {});
 
 /// All songs of a source: those of a link or of a page; of any other form there is one.

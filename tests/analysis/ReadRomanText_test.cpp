@@ -27,9 +27,9 @@ std::string ChordsText(const CRomanTextReading& reading) {
     return text;
 }
 
-std::string FaultsText(const std::vector<CChordSheetFault>& faults) {
+std::string FaultsText(const std::vector<CTextFault>& faults) {
     std::string text;
-    for (const CChordSheetFault& fault : faults) {
+    for (const CTextFault& fault : faults) {
         text += fmt::format("{}{}:{} {}", text.empty() ? "" : "; ", fault.mLine, fault.mColumn,
                             fault.mText);
     }

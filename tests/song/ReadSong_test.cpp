@@ -1,34 +1,279 @@
 // SPDX-License-Identifier: MIT
-#include "brindle/song/ReadSong.h"
+#include "SongForms.h"
+
+#include "brindle/musicxml/TMusicXMLDoc.h"
+#include "brindle/song/AnalyseSong.h"
+#include "brindle/song/internal/ChartLinks.h"
 
 #include <doctest/doctest.h>
 #include <fmt/format.h>
 
+#include <filesystem>
+#include <sstream>
 #include <string>
 
 using namespace brindle;
+using namespace brindle::test;
 
 namespace {
 
-/// "C@0 F@4 end@8", by what was typed.
-std::string Shown(const CSong& song) {
-    std::string text;
-    for (std::size_t i = 0; i < song.mChords.size(); ++i) {
-        const bool isEnd = i == song.mSymbols.size();
-        text += fmt::format("{}{}@{:.4g}", i > 0 ? " " : "", isEnd ? "end" : song.mSymbols[i],
-                            song.mChords[i].mPosition);
+const std::string kLeadSheets = BRINDLE_TEST_DATA "/leadsheets";
+
+/// As a link needs it.
+std::string Escaped(std::string_view text) {
+    std::string escaped;
+    for (const char c : text) {
+        const bool isPlain = (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z') || c == '=';
+        escaped +=
+            isPlain ? std::string(1, c) : fmt::format("%{:02X}", static_cast<unsigned>(c) & 0xFFu);
     }
-    return text;
+    return escaped;
 }
+
+std::string ScrambledSong(std::string_view title, std::string_view key, std::string_view chart) {
+    return fmt::format("{}=Writer Some==Medium Swing={}==1r34LbKcu7{}==140=3", title, key,
+                       ChartLinks::Unscrambled(chart));
+}
+
+const char* const kBlues =
+    "*A[T44F7   |Bb7   |F7   |C-7 F7 |Bb7   |Bo7   |F7   |Ah7 D7b9 |G-7   |C7   |F7 D7 |G-7 C7 Z";
 
 }  // namespace
 
-TEST_CASE("A song in any form becomes chords in time") {
-    CHECK(Shown(ReadSong("Dm7 G7 | C . . . |")) == "Dm7@0 G7@1 C@4 end@8");
-    CHECK(Shown(ReadSong("(4,C);(2,U);(2,G7)")) == "C@0 U@4 G7@6 end@8");
-    CHECK(Shown(ReadSong("*A[T44C^7 |A-7 D7 Z")) == "C^7@0 A-7@4 D7@6 end@8");
-    const CSong score = ReadSongFile(BRINDLE_SOURCE_DIR "/examples/scores/frere-jacques.musicxml");
-    CHECK(score.mFormat == TSongFormat_MusicXml);
-    CHECK(score.mChords.size() > 4);
-    CHECK(score.mFaults.empty());
+TEST_CASE("A source is read as what it looks like") {
+    struct TRow {
+        TSongFormat mFormat;
+        const char* mSource;
+    };
+    const TRow rows[] = {
+        {TSongFormat_ChordText, "Dm7 G7 | C . . . |"},
+        {TSongFormat_ChordText, "C F Hello"},
+        {TSongFormat_ChordText, "Hello | C"},
+        {TSongFormat_ChordText, "Verse: C F G\nChorus: Am G"},
+        {TSongFormat_ChordText, "(C) F G"},
+        {TSongFormat_ChordText, "|: A [1. D :| [2. E |"},
+        {TSongFormat_ChordText, ""},
+        {TSongFormat_ChordStrings, "(4,C);(2,U);(2,G7)"},
+        {TSongFormat_ChordStrings, "(1e999,C);(4,F)"},
+        {TSongFormat_ChordText, "(9) C, F"},
+        {TSongFormat_ChordPro, "{title: x}\nC"},
+        {TSongFormat_ChordPro, "{Meta: artist x}\nOh [C]my"},
+        {TSongFormat_ChordPro, "A[G]Mazing [D]Grace"},
+        {TSongFormat_ChordPro, "[Am] [F] [C]"},
+        {TSongFormat_Chart, "{*AT44C^7 |A-7 D7 }"},
+        {TSongFormat_Chart, "Song=Writer=Swing=Eb=n=T34F-7 |x Z"},
+        {TSongFormat_ChartLink, "irealb://Song%3D"},
+        {TSongFormat_ChartPage, "<!DOCTYPE html><a href=\"irealb://\">x</a>"},
+        {TSongFormat_MusicXml, "\xEF\xBB\xBF <?xml version=\"1.0\"?><score-partwise/>"},
+        {TSongFormat_ChordsAboveLyrics, "G       C\nAmazing grace how sweet"},
+        {TSongFormat_ChordsAboveLyrics, "[Verse 1]\nG C D\n[A]\nEm"},
+        {TSongFormat_ChordsAboveLyrics, "Am\nGo Down\nAm   E\nAm I blue\n"},
+        {TSongFormat_ChordsAboveLyrics, "e|--3--5--|\nB|--0--0--|\n\nC\nDown by the river"},
+    };
+    for (const TRow& row : rows) {
+        CAPTURE(row.mSource);
+        CHECK(SongFormatOf(row.mSource) == row.mFormat);
+    }
+    for (const char* song :
+         {"after-youve-gone", "amazing-grace", "auld-lang-syne", "greensleeves", "rising-sun"}) {
+        const CSong read =
+            ReadSongFile(fmt::format("{}/examples/songs/{}.txt", BRINDLE_SOURCE_DIR, song));
+        CAPTURE(song);
+        CHECK(read.mFormat == TSongFormat_ChordText);
+        CHECK(read.mFaults.empty());
+        CHECK(read.mChords.size() > 8);
+    }
+}
+
+TEST_CASE("Chords above lyrics are read with what the sheet tells") {
+    const CSong song = ReadSong(
+        "Down the Line\nby Some Body\n\nKey: Em\nCapo: 2nd fret\nTempo: 92\nTime: 3/4\n\n"
+        "[Intro] G D x2\n\n[Verse 1]\nG        D\nA line of song\nA\nAm I blue\nEm\nA\n"
+        "Chorus:\nC  (N.C.)  G/B\nDo go down\ne|--0--2--|\n");
+    CHECK(song.mFormat == TSongFormat_ChordsAboveLyrics);
+    CHECK(song.mTitle == "Down the Line");
+    CHECK(song.mMakers == "Some Body");
+    CHECK(song.mCapo == 2);
+    CHECK(song.mTempo == 92.0);
+    CHECK(song.mBeatsPerBar == 3.0);
+    CHECK(song.mStatedKey == CSignKeyLite("E minor"));
+    CHECK(song.mFaults.empty());
+    // The last A has chords above it and no lyrics below: it is sung.
+    CHECK(Shown(song) == "G@0 D@1 G@2 D@3 G@4 D@5 A@6 Em@7 C@8 (N.C.)@9 G/B@10 end@11");
+    CHECK(ShownSections(song) == "Intro@0, Verse 1@4, Chorus@8");
+    CHECK(Shown(ReadSong("C Hmaj9x G\nla la la")) == R"(1:8: Hmaj9x: "x" at 6 is not understood)");
+}
+
+TEST_CASE("Directives of lyrics with chords are kept") {
+    const CSong song = ReadSong(
+        "{title: One}\n{subtitle: Two}\n{artist: Some Body}\n{composer: Any One}\n{key: G}\n"
+        "{tempo: 120}\n{time: 3/4}\n{capo: 3}\n{transpose: -2}\n{album: Three}\n"
+        "{meta: lyricist No One}\n{soc}\n[G]La [C]la\n{eoc}\n{sov: Verse 1}\n{key: Am}\n[Am]Oh\n"
+        "{chorus}\n{comment: D.C.}\n");
+    CHECK(song.mTitle == "One");
+    CHECK(song.mMakers == "Some Body, Any One, No One");
+    CHECK(song.mRemarks == std::vector<CSongRemark>{{"subtitle", "Two"}, {"album", "Three"}});
+    CHECK(song.mTempo == 120.0);
+    CHECK(song.mCapo == 3);
+    CHECK(song.mTranspose == -2);
+    REQUIRE(song.mStatedKeys.size() >= 2);
+    CHECK(song.mStatedKeys[0].mSignKey == CSignKeyLite("G major"));
+    CHECK(song.mStatedKeys[1].mSignKey == CSignKeyLite("A minor"));
+    CHECK(song.mStatedKeys[1].mPosition == 2.0);
+    CHECK(Shown(song) == "G@0 C@1 Am@2 G@3 C@4 G@5 C@6 Am@7 G@8 C@9 end@10");
+    const CSong notes = ReadSong("{title: x}\n{time: often}\n{tempo: slow}\n{chorus}\n[C]x");
+    CHECK(Faults(notes) ==
+          "2:8: a time is written as in 3/4; 3:9: a tempo is a number of beats a minute; "
+          "4:8: there is no chorus before this one");
+    CHECK_FALSE(notes.HasFault());
+    CHECK(Shown(notes) == "C@0 end@1");
+}
+
+TEST_CASE("Typed songs are played as scores are") {
+    struct TRow {
+        const char* mText;
+        const char* mShown;
+    };
+    const TRow rows[] = {
+        {"C | F Fine | G | D.C. al Fine", "C F G C F"},
+        {"C | Segno F | G | D.S.", "C F G F G"},
+        {"C | \U0001D10B F | To Coda | G | D.S. al Coda | Coda Am |", "C F G F Am"},
+        {"C | F \U0001D10C | G | D.C. al Coda | \U0001D10C Am |", "C F G C F Am"},
+        {"C | F | \U0001D10C G | D.C. | \U0001D10C Am |", "C F G C F Am"},
+        {"|: C | F :| (3x) G", "C F C F C F G"},
+        {"|: C [2. F :| [2. G", "C F C G"},
+        {"|: C [1 F :| [1 G | Am", "C F C G Am"},
+        {"|: C :| [1 F | G", "C C F G"},
+        {"|: C [1 F :| [2 G Fine :| Am | D.C. al Fine", "C F C G Am C G"},
+        {"Verse: C F To Coda G D.C. al Coda Coda: Am", "C F G C F Am"},
+    };
+    for (const TRow& row : rows) {
+        CAPTURE(row.mText);
+        CHECK(Played(ReadSong(row.mText)) == row.mShown);
+    }
+    CHECK(Played(ReadSong("*A[T44C |F <Fine>|<D.C. al Fine>G Z")) == "C F G C F");
+    CHECK(Played(ReadSong("{*AT44C |SF Q|G |<*12D.S. al Coda>E-Z QA-Z")) == "C F G E- F A-");
+    const CSong repeated = ReadSong("C | F |: G | Am :|");
+    CHECK(repeated.mRepeats == std::vector<CSongRepeat>{{16, 8, 2}});
+    CHECK(ShownBars(repeated) == "1@0+4 2@4+4 3@8+4 4@12+4 3@16+4 4@20+4");
+    CHECK(ShownBars(ReadSong("C F G")) == "");
+}
+
+TEST_CASE("Links and pages with charts are read") {
+    const std::string twelve =
+        "F7@0 Bb7@4 F7@8 C-7@12 F7@14 Bb7@16 Bo7@20 F7@24 Ah7@28 D7b9@30 "
+        "G-7@32 C7@36 F7@40 D7@42 G-7@44 C7@46 end@48";
+    const std::string link =
+        "irealb://" + Escaped(ScrambledSong("Blues: One", "F", kBlues) + "===" +
+                              ScrambledSong("Two", "A-", "{T34A-7 LZE7 Kcl }Z") + "===My List");
+    const std::vector<CSong> songs = ReadSongs(link);
+    REQUIRE(songs.size() == 2);
+    CHECK(songs[0].mTitle == "Blues: One");
+    CHECK(songs[0].mMakers == "Writer Some");
+    CHECK(songs[0].mStyle == "Medium Swing");
+    CHECK(songs[0].mTempo == 140.0);
+    CHECK(songs[0].mStatedKey == CSignKeyLite("F major"));
+    CHECK(songs[0].mFormat == TSongFormat_ChartLink);
+    CHECK(songs[0].mRemarks == std::vector<CSongRemark>{{"list", "My List"}});
+    CHECK(Shown(songs[0]) == twelve);
+    CHECK(songs[1].mStatedKey == CSignKeyLite("A minor"));
+    CHECK(Played(songs[1]) == "A-7 E7 E7 A-7 E7 E7");
+    CHECK(Faults(ReadSong(link)) == "0:0: one more song of this source is left out");
+    CHECK(Shown(ReadSong(link)) == twelve);
+
+    const std::string plain = "irealbook://" + Escaped(fmt::format("Three=W=Swing=F=n={}", kBlues));
+    CHECK(Shown(ReadSong(plain)) == twelve);
+    const std::string page = fmt::format(
+        "<!DOCTYPE html><html><body>\n<p><a href=\"{}\">2 songs</a>\n<a href='{}'>x</a></html>",
+        link, plain);
+    REQUIRE(ReadSongs(page).size() == 3);
+    CHECK(ReadSongs(page)[2].mTitle == "Three");
+    CHECK(ReadSongs(page)[2].mFormat == TSongFormat_ChartPage);
+    CHECK(Faults(ReadSong("<html>nothing</html>")) == "1:1: no chart stands here");
+    const std::string faulty = "\nirealb://" + Escaped(ScrambledSong("X", "C", "[T44C |?Z"));
+    CHECK(Faults(ReadSong(faulty)) == "2:1: X, character 8 of the chart: \"?\" is not understood");
+}
+
+TEST_CASE("Blocks of fifty characters are scrambled, and scrambling twice changes nothing") {
+    std::string text;
+    for (int i = 0; i < 101; ++i) text += static_cast<char>('0' + i % 64);
+    const std::string scrambled = ChartLinks::Unscrambled(text);
+    CHECK(scrambled.substr(0, 6) == "a`_^]5");
+    CHECK(scrambled.substr(45, 5) == "43210");
+    CHECK(scrambled[10] == text[39]);
+    CHECK(scrambled[24] == text[24]);
+    // One character behind the last block: that block is as it was.
+    CHECK(scrambled.substr(50) == text.substr(50));
+    for (std::size_t size = 0; size <= text.size(); ++size) {
+        const std::string part = text.substr(0, size);
+        CHECK(ChartLinks::Unscrambled(ChartLinks::Unscrambled(part)) == part);
+    }
+}
+
+TEST_CASE("Chord strings are put one behind the other, and their faults are told") {
+    const CSong song = ReadSong("(4,C);(2,U);(2,F\u266F7/C#)\n(1.5, G7)");
+    CHECK(Shown(song) == "C@0 U@4 F#7/C#@6 G7@8 end@9.5");
+    CHECK(ShownSections(song) == "@8");
+    CHECK(Shown(ReadSong("(4,C)\n(2,G);(x,F)")) ==
+          "2:7: \"(x,F)\" is no length and chord, as in (4,C)");
+}
+
+TEST_CASE("What cannot be read is a fault and no song") {
+    CHECK(Faults(ReadSongFile("/no/such/file")) == "0:0: there is no such file");
+    CHECK(Faults(ReadSongFile("/")) == "0:0: the file cannot be read, or is larger than 256 MiB");
+    CHECK(Faults(ReadSong("<score-partwise>\n <part></parts>")).substr(0, 2) == "2:");
+    CHECK(Faults(ReadSong("I: V", {.mFormat = TSongFormat_RomanText})) ==
+          "0:0: there is no reader of Roman numerals yet");
+    std::string archive = "PK\x03\x04";
+    archive.resize(100);
+    CHECK(Faults(ReadSong(archive)) == "0:0: no score in the container");
+}
+
+TEST_CASE("Lead sheets become songs with the bars that are printed") {
+    const CSong song = ReadSongFile(kLeadSheets + "/what_child_is_this.musicxml");
+    CHECK(song.mFaults.empty());
+    REQUIRE(song.mBars.size() == 35);
+    // An upbeat of an eighth.
+    CHECK(song.mBars[0].mLength == 0.5);
+    CHECK(song.mBars[1].mPosition == 0.5);
+    CHECK(song.mBars[1].mTime == CSongTime{6, 8});
+    CHECK(song.mBeatsPerBar == 3.0);
+    CHECK(song.mChords.back().mPosition == 102.5);
+    CHECK(song.mRepeats.size() == 1);
+    CHECK(song.mBars[19].mNumber == song.mBars[3].mNumber);
+}
+
+TEST_CASE("A song of a score is analysed as the score itself is") {
+    for (const auto& entry : std::filesystem::directory_iterator(kLeadSheets)) {
+        if (entry.path().extension() == ".txt") continue;
+        const std::string path = entry.path().string();
+        CAPTURE(path);
+        TMusicXMLDoc doc;
+        REQUIRE(doc.LoadAsPlayed(path));
+        CHarmonicAnalyse analyse;
+        analyse.AnalyseFromMusicXMLDoc(doc, TAnalyse_TonicProgressions);
+        const CSong song = ReadSongFile(path);
+        CHECK(song.mFaults.empty());
+        CHECK(song.mTitle == doc.Title);
+        const CSongAnalysis found = AnalyseSong(song);
+        CHECK(found.mAnalyse.mSignKeys == analyse.mSignKeys);
+        CHECK(found.mNumerals.size() == song.mChords.size());
+    }
+}
+
+TEST_CASE("A song is analysed in the key that it states, or in the one that is given") {
+    const CSong song = ReadSong("{key: A minor}\n[Am] [Dm] [E7] [Am] [Am] [Dm] [E7] [Am]");
+    CAnalyseSongOptions options;
+    options.mReadings = options.mCopies = true;
+    const CSongAnalysis stated = AnalyseSong(song, options);
+    REQUIRE_FALSE(stated.mAnalyse.mSignKeys.empty());
+    CHECK(stated.mAnalyse.mSignKeys[0].mSignKey == CSignKeyLite("A minor"));
+    CHECK(stated.mKeys.mKey == CSignKeyLite("A minor"));
+    CHECK(stated.mNumerals[2] == "V7");
+    CHECK(stated.mCopies.size() == 1);
+    CHECK_FALSE(stated.mReadings.empty());
+    options.mSignKeys.emplace_back().mSignKey = CSignKeyLite("E major");
+    options.mSignKeys[0].mPosition = 0.0;
+    CHECK(AnalyseSong(song, options).mAnalyse.mSignKeys[0].mSignKey == CSignKeyLite("E major"));
+    CHECK(AnalyseSong(CSong()).mNumerals.empty());
 }

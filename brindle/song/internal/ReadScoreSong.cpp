@@ -1,29 +1,97 @@
 // SPDX-License-Identifier: MIT
-#include "brindle/musicxml/TMusicXMLDoc.h"
-#include "brindle/platform/Error.h"
+#include "brindle/musicxml/internal/PlayedScore.h"
 #include "brindle/song/HarmonySymbols.h"
 #include "brindle/song/internal/SongReaders.h"
+#include "brindle/song/internal/StatedKey.h"
+
+#include <algorithm>
+#include <map>
+#include <utility>
 
 namespace brindle::SongReaders {
 
-CSong ReadScoreSong(std::string_view bytes, TSongFormat format) {
-    CSong song;
-    song.mFormat = format;
-    TMusicXMLDoc doc;
-    Error error;
-    if (!doc.LoadAsPlayedFromBytes(bytes, &error)) {
-        song.mFaults.push_back({1, 1, error.description});
-        return song;
+namespace {
+
+/// The length that most bars have, 0 without bars.
+double CommonLength(const std::vector<CSongBar>& bars) {
+    std::map<double, std::size_t> counts;
+    for (const CSongBar& bar : bars) ++counts[bar.mLength];
+    const auto most = std::max_element(
+        counts.begin(), counts.end(),
+        [](const auto& one, const auto& other) { return one.second < other.second; });
+    return most == counts.end() ? 0.0 : most->first;
+}
+
+double BeatsPerBarOf(const CSong& song) {
+    constexpr double kUsual = 4.0;
+    double length = CommonLength(song.mBars);
+    const auto timed = std::find_if(song.mBars.begin(), song.mBars.end(),
+                                    [](const CSongBar& bar) { return !bar.mTime.IsUndef(); });
+    if (timed != song.mBars.end()) {
+        length = 4.0 * timed->mTime.mNumerator / timed->mTime.mDenominator;
     }
-    song.mTitle = doc.Title;
-    for (const TMusicXMLHarmony& harmony : doc.Harmonies) {
+    return length >= 1.0 / 64 && length <= 1024.0 ? length : kUsual;
+}
+
+void AppendChords(const TPlayedScore& score, CSong& song) {
+    for (const TMusicXMLHarmony& harmony : score.mDoc.Harmonies) {
         song.mChords.emplace_back(ChordOfHarmony(harmony), harmony.mPosition);
         song.mSymbols.push_back(HarmonySymbol(harmony));
     }
-    if (!doc.Harmonies.empty()) {
-        const TMusicXMLHarmony& last = doc.Harmonies.back();
-        song.mChords.emplace_back(CChordLite_Undef, last.mPosition + last.mDuration);
+    if (song.mChords.empty()) return;
+    // An offset may move the last chord behind the last bar line.
+    const double end = std::max(score.mEnd, song.mChords.back().mPosition);
+    song.mChords.emplace_back(CChordLite_Undef, end);
+}
+
+void AppendBars(const TPlayedScore& score, CSong& song) {
+    const auto& lines = score.mDoc.HarmBarlines;
+    std::size_t time = 0;
+    const auto& times = score.mDoc.TimeSignatures;
+    for (std::size_t i = 0; i < lines.size(); ++i) {
+        const TScoreMeasure& measure = score.mWritten.mMeasures[score.mOrder.mMeasures[i]];
+        const double begin = lines[i].mPosition;
+        const double end = i + 1 < lines.size() ? lines[i + 1].mPosition : score.mEnd;
+        while (time < times.size() && times[time].mPosition <= begin) ++time;
+        CSongBar& bar = song.mBars.emplace_back();
+        bar.mNumber = measure.mNumber;
+        bar.mPosition = begin;
+        bar.mLength = end - begin;
+        if (time > 0) bar.mTime = {times[time - 1].mNumerator, times[time - 1].mDenominator};
+        if (measure.mHasRehearsal) song.mSections.push_back({measure.mRehearsal, begin});
     }
+}
+
+void AppendRepeats(const TPlayedScore& score, CSong& song) {
+    const auto& lines = score.mDoc.HarmBarlines;
+    for (const TJumpBack& jump : score.mOrder.mJumpsBack) {
+        if (jump.mTo >= lines.size()) return;
+        song.mRepeats.push_back(
+            {lines[jump.mTo].mPosition, lines[jump.mFrom].mPosition, jump.mLength});
+    }
+}
+
+}  // namespace
+
+CSong ReadScoreSong(std::string_view bytes, TSongFormat format) {
+    const TPlayedScore score = PlayScoreBytes(bytes);
+    CSong song;
+    song.mFormat = format;
+    song.mTitle = score.mWritten.mTitle;
+    song.mMakers = score.mWritten.mMakers;
+    if (score.mFault) {
+        song.mFaults.push_back(
+            {score.mFault->mLine, score.mFault->mColumn, score.mFault->mError.description});
+        return song;
+    }
+    song.mTempo = score.mWritten.mTempo;
+    AppendChords(score, song);
+    AppendBars(score, song);
+    AppendRepeats(score, song);
+    for (const CHarmAnlsSignKey& key : score.mDoc.HarmSignKeys) {
+        AppendStatedKey(key.mSignKey, key.mPosition, song);
+    }
+    song.mBeatsPerBar = BeatsPerBarOf(song);
     return song;
 }
 

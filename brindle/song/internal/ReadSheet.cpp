@@ -1,37 +1,98 @@
 // SPDX-License-Identifier: MIT
-#include "brindle/analysis/ReadChordSheet.h"
 #include "brindle/song/internal/SongReaders.h"
+#include "brindle/song/internal/SongTokens.h"
+
+#include <algorithm>
+#include <cmath>
 
 namespace brindle::SongReaders {
 
-CSong ReadSheet(std::string_view text, TSongFormat format, const CSongPrefs& prefs) {
-    CChordSheetPrefs sheetPrefs;
-    sheetPrefs.mForm = format == TSongFormat_ChordPro ? TChordSheet_ChordPro
-                       : format == TSongFormat_Chart  ? TChordSheet_IReal
-                                                      : TChordSheet_Plain;
-    sheetPrefs.mBeatsPerBar = prefs.mBeatsPerBar;
-    sheetPrefs.mBeatsPerChord = prefs.mBeatsPerChord;
-    sheetPrefs.mEven = prefs.mEven || format == TSongFormat_EvenText;
-    sheetPrefs.mLenient = prefs.mLenient;
-    sheetPrefs.mChordTextPrefs = prefs.mChordTextPrefs;
-    CChordSheetReading reading = ReadChordSheet(text, sheetPrefs);
-    CSong song;
-    song.mFormat = format;
-    song.mTitle = reading.mTitle;
-    song.mChords = reading.mChords;
-    song.mSymbols = reading.mSymbols;
-    song.mBeatsPerBar = reading.mBeatsPerBar;
-    for (const auto& section : reading.mSections) {
-        song.mSections.push_back({section.mName, section.mPosition});
+using namespace SongText;
+
+namespace {
+
+/// Turns bytes into lines and columns, counted on from one place to the next.
+class CLineCount {
+public:
+    explicit CLineCount(std::string_view text) : mText(text) {}
+
+    /// Offsets must ascend.
+    CSongFault Place(const TTextFault& fault) {
+        for (; mOffset < fault.mOffset && mOffset < mText.size(); ++mOffset) {
+            const char c = mText[mOffset];
+            if (c == '\n') {
+                ++mLine;
+                mColumn = 1;
+            } else if ((static_cast<unsigned char>(c) & 0xC0) != 0x80) {
+                ++mColumn;
+            }
+        }
+        return {mLine, mColumn, fault.mText, fault.mIsNote};
     }
-    for (const auto& fault : reading.mFaults) {
-        song.mFaults.push_back({fault.mLine, fault.mColumn, fault.mText});
-    }
-    return song;
+
+private:
+    std::string_view mText;
+    std::size_t mOffset = 0;
+    std::size_t mLine = 1;
+    std::size_t mColumn = 1;
+};
+
+bool IsLength(double beats) {
+    return std::isfinite(beats) && beats > 0.0;
 }
 
-std::vector<CSong> ReadChartLinks(std::string_view text, TSongFormat, const CSongPrefs& prefs) {
-    return {ReadSheet(text, TSongFormat_Chart, prefs)};
+void Cut(TSongFormat format, CTokenList& list) {
+    switch (format) {
+        case TSongFormat_ChordPro:
+            return CutChordPro(list);
+        case TSongFormat_ChordsAboveLyrics:
+            return CutChordsAboveLyrics(list);
+        case TSongFormat_Chart:
+            return CutChart(list);
+        default:
+            list.mIsEven = format == TSongFormat_EvenText;
+            return CutChordText(list);
+    }
+}
+
+/// By their places; without a lenient reading the first one that is no note is the last.
+void TakeFaults(const CTokenList& list, CSong& song) {
+    std::vector<TTextFault> faults = list.Faults();
+    std::stable_sort(faults.begin(), faults.end(), [](const TTextFault& a, const TTextFault& b) {
+        return a.mOffset < b.mOffset;
+    });
+    CLineCount lines(list.Text());
+    for (const TTextFault& fault : faults) {
+        song.mFaults.push_back(lines.Place(fault));
+        if (!fault.mIsNote && !list.Prefs().mLenient) break;
+    }
+    GiveUpWhatIsAtFault(song, list.Prefs().mLenient);
+}
+
+}  // namespace
+
+CSong ReadSheet(std::string_view text, TSongFormat format, const CSongPrefs& prefs) {
+    constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
+    if (text.starts_with(kByteOrderMark)) text.remove_prefix(kByteOrderMark.size());
+    CSong song;
+    song.mFormat = format;
+    song.mBeatsPerBar = prefs.mBeatsPerBar;
+    CTokenList list(text, prefs, song);
+    if (!IsLength(prefs.mBeatsPerBar) || !IsLength(prefs.mBeatsPerChord)) {
+        list.AddFault(text, "bars and chords have a length above 0");
+        TakeFaults(list, song);
+        song.mChords.clear();
+        return song;
+    }
+    Cut(format, list);
+    if (list.mHasH) list.MakeGerman();
+    const auto time =
+        std::find_if(list.mTokens.begin(), list.mTokens.end(),
+                     [](const TToken& token) { return token.mKind == TTokenKind::Time; });
+    if (time != list.mTokens.end()) song.mBeatsPerBar = time->mTime.mNumerator;
+    if (!list.IsGivenUp()) PlaySheet(list);
+    TakeFaults(list, song);
+    return song;
 }
 
 }  // namespace brindle::SongReaders

@@ -1,0 +1,23 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <cstddef>
+#include <string>
+
+namespace brindle {
+
+/// What is wrong in a text that somebody wrote, or was left out of it, and where.
+struct CTextFault {
+    /// From 1; 0 where the fault is that of the whole text.
+    std::size_t mLine = 0;
+    /// In characters (not bytes) from 1.
+    std::size_t mColumn = 0;
+    std::string mText;
+    /// All else is there and what stands here was left out, such as the other songs of a list. Any
+    /// other fault takes the whole result, unless the reading is lenient.
+    bool mIsNote = false;
+
+    friend bool operator==(const CTextFault&, const CTextFault&) = default;
+};
+
+}  // namespace brindle

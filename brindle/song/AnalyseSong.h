@@ -1,0 +1,40 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/analysis/CHarmonicAnalyse.h"
+#include "brindle/analysis/CKeyOfSong.h"
+#include "brindle/analysis/CopiedPassages.h"
+#include "brindle/song/CSong.h"
+
+#include <string>
+#include <vector>
+
+namespace brindle {
+
+/// What is to be found in a song.
+struct CAnalyseSongOptions {
+    TAnalyse mRoute = TAnalyse_TonicProgressions;
+    /// Instead of the keys that the song states; empty for those.
+    CHarmAnlsSignKeys mSignKeys;
+    /// All readings that progressions to a tonic allow.
+    bool mReadings = false;
+    /// Passages that repeat earlier ones.
+    bool mCopies = false;
+};
+
+/// What was found in a song. Empty for a song without chords.
+struct CSongAnalysis {
+    /// Its `mChords` are those of the song.
+    CHarmonicAnalyse mAnalyse;
+    /// Empty if they were not asked for.
+    CHarmAnlsCenters mReadings;
+    std::vector<TCopiedPassage> mCopies;
+    CKeyOfSong mKeys;
+    /// Of each chord in the key of its region; empty for one that has none.
+    std::vector<std::string> mNumerals;
+};
+
+/// Finds centers and functions, the key and the local keys of a song, its readings and copies.
+[[nodiscard]] CSongAnalysis AnalyseSong(const CSong& song, const CAnalyseSongOptions& options = {});
+
+}  // namespace brindle

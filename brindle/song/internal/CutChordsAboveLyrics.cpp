@@ -1,0 +1,129 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/platform/ReadNumber.h"
+#include "brindle/song/internal/LineKinds.h"
+#include "brindle/song/internal/PlayWords.h"
+#include "brindle/song/internal/SongTokens.h"
+#include "brindle/song/internal/SongWords.h"
+
+#include <algorithm>
+#include <cmath>
+#include <string>
+
+namespace brindle::SongText {
+
+namespace {
+
+/// More than anybody means by "x3" behind a line.
+constexpr int kMostTimes = 16;
+
+/// How often a line is played that ends in "x3"; the words are taken off.
+int TakeTimes(std::string_view& line) {
+    const std::size_t blank = line.find_last_of(kBlanks);
+    if (blank == line.npos) return 1;
+    const std::string_view word = line.substr(blank + 1);
+    const std::size_t digits = word.find_first_of("0123456789");
+    const bool isTimes = digits != word.npos && word.find_first_of("xX") != word.npos &&
+                         LengthOfPlayWords(word) == word.size();
+    if (!isTimes) return 1;
+    line = Trimmed(line.substr(0, blank));
+    return std::clamp(ReadInteger(word.substr(digits)), 1, kMostTimes);
+}
+
+class CSheet {
+public:
+    explicit CSheet(CTokenList& list) : mList(list), mLines(LinesOf(list.Text())) {}
+
+    void Cut() {
+        TakeHead();
+        for (const TSheetLine& line : mLines) {
+            if (mList.IsGivenUp()) return;
+            if (line.mKind == TLineKind::Field) TakeField(line.mText);
+            if (line.mKind == TLineKind::Section) {
+                mList.Add(TTokenKind::Section, NameOfSection(line.mText));
+            }
+            if (line.mKind == TLineKind::Chords) TakeChords(line.mText);
+        }
+    }
+
+private:
+    /// The first lines are the title and the maker if a blank line parts them from the song.
+    void TakeHead() {
+        CSong& song = mList.Song();
+        const auto isWord = [](const TSheetLine& line) { return line.mKind == TLineKind::Lyrics; };
+        auto begin = std::find_if(mLines.begin(), mLines.end(), [](const TSheetLine& line) {
+            return line.mKind != TLineKind::Blank;
+        });
+        const auto end = std::find_if_not(begin, mLines.end(), isWord);
+        const bool isHead = begin != end && end - begin <= 3 &&
+                            (end == mLines.end() || end->mKind == TLineKind::Blank ||
+                             end->mKind == TLineKind::Field);
+        if (!isHead) return;
+        song.mTitle = begin->mText;
+        if (++begin != end) song.mMakers = WithoutBy(begin->mText);
+    }
+
+    static std::string_view WithoutBy(std::string_view makers) {
+        std::string_view rest = makers;
+        return Lower(TakeWordOf(rest)) == "by" && !rest.empty() ? rest : makers;
+    }
+
+    void TakeField(std::string_view line) {
+        CSong& song = mList.Song();
+        const std::size_t end = std::min(line.find_first_of(": \t"), line.size());
+        const std::string name = Lower(line.substr(0, end));
+        const std::string_view value =
+            Trimmed(line.substr(std::min(line.find_first_not_of(": \t", end), line.size())));
+        if (name == "title") {
+            song.mTitle = value;
+        } else if (name == "artist" || name == "composer" || name == "by") {
+            if (song.mMakers.empty()) song.mMakers = value;
+        } else if (name == "style") {
+            song.mStyle = value;
+        } else if (name == "key") {
+            mList.Add(TTokenKind::Key, value);
+        } else if (name == "capo") {
+            song.mCapo = std::clamp(ReadInteger(value), 0, 24);
+        } else if (name == "tempo" || name == "bpm") {
+            const double tempo = value.empty() ? 0.0 : ReadDecimal(value);
+            if (tempo > 0.0 && std::isfinite(tempo)) song.mTempo = tempo;
+        } else if (name == "time") {
+            TakeTime(value);
+        } else {
+            song.mRemarks.push_back({name, std::string(value)});
+        }
+    }
+
+    void TakeTime(std::string_view text) {
+        const CSongTime time = ReadTime(text);
+        if (!time.IsUndef()) mList.Add(TTokenKind::Time).mTime = time;
+    }
+
+    void TakeChords(std::string_view line) {
+        const std::size_t bracket = line.front() == '[' ? line.find(']') : line.npos;
+        if (bracket != line.npos && !IsDigit(line[1])) {
+            mList.Add(TTokenKind::Section, Trimmed(line.substr(1, bracket - 1)));
+            line = Trimmed(line.substr(bracket + 1));
+        }
+        const std::string_view whole = line;
+        const int times = TakeTimes(line);
+        const std::size_t begin = mList.mTokens.size();
+        CutChordLine(line, mList);
+        const std::size_t end = mList.mTokens.size();
+        for (int i = 1; i < times; ++i) {
+            if (!mList.AddAgain(begin, end)) {
+                return mList.AddFault(whole, "its repeated lines make the song too long");
+            }
+        }
+    }
+
+    CTokenList& mList;
+    std::vector<TSheetLine> mLines;
+};
+
+}  // namespace
+
+void CutChordsAboveLyrics(CTokenList& list) {
+    CSheet(list).Cut();
+}
+
+}  // namespace brindle::SongText

@@ -1,0 +1,171 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/song/internal/LineKinds.h"
+
+#include "brindle/chords/ReadChordText.h"
+#include "brindle/song/internal/PlayWords.h"
+#include "brindle/song/internal/SongWords.h"
+
+#include <algorithm>
+#include <array>
+#include <cstddef>
+#include <string>
+
+namespace brindle::SongText {
+
+namespace {
+
+constexpr auto kSectionWords = std::to_array<std::string_view>(
+    {"intro",      "verse",  "chorus",     "refrain", "bridge",     "prechorus",
+     "pre-chorus", "outro",  "ending",     "solo",    "interlude",  "instrumental",
+     "coda",       "hook",   "tag",        "break",   "turnaround", "middle",
+     "strophe",    "refrão", "estribillo", "couplet", "vers",       "part"});
+
+constexpr auto kFieldNames =
+    std::to_array<std::string_view>({"title", "artist", "composer", "by", "key", "capo", "tempo",
+                                     "bpm", "time", "style", "tuning"});
+
+// Chords that are words, too.
+constexpr auto kWordsOrChords =
+    std::to_array<std::string_view>({"A", "Am", "Go", "Do", "Bo", "Co"});
+
+bool IsAnyOf(std::string_view word, const auto& list) {
+    return std::find(list.begin(), list.end(), word) != list.end();
+}
+
+bool IsLetter(char c) {
+    return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z') || (c & 0x80) != 0;
+}
+
+bool IsBarSign(std::string_view word) {
+    return word.find_first_not_of("|:.-/%") == word.npos;
+}
+
+/// A chord, a sign between chords or words that steer the playing.
+bool IsChordWord(std::string_view word) {
+    if (IsBarSign(word) || LengthOfPlayWords(word) == word.size()) return true;
+    if (word.size() > 2 && word.front() == '(' && word.back() == ')') {
+        word = word.substr(1, word.size() - 2);
+    }
+    const bool begins = (word[0] >= 'A' && word[0] <= 'H') || word[0] == 'N' || word[0] == '(';
+    return begins && ReadChordText(word).mKind != TChordText_NotUnderstood;
+}
+
+/// No slip of a chord, but a word: "Down", "I", "don't".
+bool IsLyricWord(std::string_view word) {
+    const bool hasLettersAlone = std::all_of(word.begin(), word.end(), [](char c) {
+        return IsLetter(c) || std::string_view("'’,.!?-\";").find(c) != std::string_view::npos;
+    });
+    return hasLettersAlone && (word.size() > 2 || !(word[0] >= 'A' && word[0] <= 'H'));
+}
+
+bool IsTablature(std::string_view line) {
+    return line.find("--") != line.npos && line.find('|') != line.npos &&
+           std::count(line.begin(), line.end(), '-') * 3 > static_cast<std::ptrdiff_t>(line.size());
+}
+
+bool IsField(std::string_view line) {
+    const std::size_t colon = line.find(':');
+    if (colon != line.npos) return IsAnyOf(Lower(Trimmed(line.substr(0, colon))), kFieldNames);
+    std::string_view rest = line;
+    return Lower(TakeWordOf(rest)) == "capo" && !rest.empty() && IsDigit(rest[0]);
+}
+
+bool IsSection(std::string_view line) {
+    const std::string_view name = NameOfSection(line);
+    if (name.empty()) return false;
+    if (name.size() < line.size() && line.front() == '[') {
+        return name.size() == 1 || !IsChordWord(name);
+    }
+    std::string_view rest = name;
+    const std::string first = Lower(TakeWordOf(rest));
+    if (IsAnyOf(first, kSectionWords)) return rest.size() <= 12 && rest.find('|') == rest.npos;
+    return name.size() < line.size() && !IsChordWord(name) && rest.empty();
+}
+
+TLineKind KindOfWords(std::string_view line) {
+    std::size_t chords = 0;
+    std::size_t others = 0;
+    std::size_t lyrics = 0;
+    for (std::string_view rest = line; !rest.empty();) {
+        const std::string_view word = TakeWordOf(rest);
+        const bool isChord = IsChordWord(word);
+        chords += isChord;
+        others += !isChord;
+        lyrics += !isChord && IsLyricWord(word);
+    }
+    const bool isLyrics = others > chords || (others == chords && lyrics == others);
+    return isLyrics && line.find_first_of("|{") == line.npos ? TLineKind::Lyrics
+                                                             : TLineKind::Chords;
+}
+
+TLineKind KindOf(std::string_view line) {
+    if (line.empty()) return TLineKind::Blank;
+    if (IsTablature(line)) return TLineKind::Tablature;
+    if (IsField(line)) return TLineKind::Field;
+    if (IsSection(line)) return TLineKind::Section;
+    // `Intro: G C`, `[Intro] G C`
+    const std::size_t name = line.front() == '[' ? line.find(']') : line.find(": ");
+    if (name != line.npos && IsSection(line.substr(0, name + 1))) line.remove_prefix(name + 1);
+    return KindOfWords(line);
+}
+
+bool CouldBeLyrics(std::string_view line) {
+    for (std::string_view rest = line; !rest.empty();) {
+        if (!IsAnyOf(TakeWordOf(rest), kWordsOrChords)) return false;
+    }
+    return true;
+}
+
+/// "A" behind a line of chords, with no lyrics of its own, is a line of lyrics.
+void ResolveByNeighbours(std::vector<TSheetLine>& lines) {
+    for (std::size_t i = 1; i < lines.size(); ++i) {
+        if (lines[i].mKind != TLineKind::Chords || !CouldBeLyrics(lines[i].mText)) continue;
+        const bool isBehindChords = lines[i - 1].mKind == TLineKind::Chords;
+        const bool hasLyrics = i + 1 < lines.size() && lines[i + 1].mKind == TLineKind::Lyrics;
+        if (isBehindChords && !hasLyrics) lines[i].mKind = TLineKind::Lyrics;
+    }
+}
+
+}  // namespace
+
+std::string_view NameOfSection(std::string_view line) {
+    if (line.size() > 2 && line.front() == '[' && line.back() == ']') {
+        const std::string_view name = line.substr(1, line.size() - 2);
+        return name.find_first_of("[]") == name.npos && !IsDigit(name[0]) ? Trimmed(name)
+                                                                          : std::string_view();
+    }
+    if (line.ends_with(':')) line.remove_suffix(1);
+    return line.find_first_of(":|[]{}") == line.npos ? Trimmed(line) : std::string_view();
+}
+
+std::vector<TSheetLine> LinesOf(std::string_view text) {
+    std::vector<TSheetLine> lines;
+    while (!text.empty()) {
+        const std::string_view line = Trimmed(TakeLine(text));
+        lines.push_back({line, KindOf(line)});
+    }
+    ResolveByNeighbours(lines);
+    return lines;
+}
+
+bool HasChordInBrackets(std::string_view text) {
+    while (!text.empty()) {
+        const std::string_view line = Trimmed(TakeLine(text));
+        std::size_t begin = line.find('[');
+        while (begin != line.npos) {
+            const std::size_t end = line.find_first_of("[]", begin + 1);
+            if (end == line.npos) break;
+            const std::string_view inside = line.substr(begin + 1, end - begin - 1);
+            const bool isWholeLine = inside.size() + 2 == line.size();
+            const bool isName = isWholeLine && inside.size() == 1;
+            if (line[end] == ']' && !inside.empty() && !isName && inside[0] >= 'A' &&
+                inside[0] <= 'H' && ReadChordText(inside).mKind == TChordText_Chord) {
+                return true;
+            }
+            begin = line[end] == '[' ? end : line.find('[', end);
+        }
+    }
+    return false;
+}
+
+}  // namespace brindle::SongText

@@ -1,0 +1,38 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <cstdint>
+#include <string_view>
+#include <vector>
+
+namespace brindle::SongText {
+
+/// What a line of a song sheet is, when chords stand above lyrics.
+enum class TLineKind : std::uint8_t {
+    Blank,
+    Chords,
+    /// A name of a part alone: `[Verse 1]`, `Chorus:`.
+    Section,
+    /// A name and what it is: `Key: G`.
+    Field,
+    /// Strings of an instrument with frets on them.
+    Tablature,
+    Lyrics,
+};
+
+struct TSheetLine {
+    /// Without white space around it.
+    std::string_view mText;
+    TLineKind mKind = TLineKind::Blank;
+};
+
+/// The lines of a text. Lines such as "A" and "Go" are told from their neighbours.
+[[nodiscard]] std::vector<TSheetLine> LinesOf(std::string_view text);
+
+/// `Verse 1` of `[Verse 1]` and of `Verse 1:`.
+[[nodiscard]] std::string_view NameOfSection(std::string_view line);
+
+/// Whether `[G]` stands in a text as a chord.
+[[nodiscard]] bool HasChordInBrackets(std::string_view text);
+
+}  // namespace brindle::SongText
