@@ -2,7 +2,7 @@
 // The program with a memory that runs short at each of its requests in turn: it tells and ends, or
 // does all that it does with memory.
 
-#include "Transcript.h"
+#include "tests/support/Transcript.h"
 
 #include <doctest/doctest.h>
 #include <fmt/format.h>
