@@ -66,8 +66,9 @@ constexpr bool CanBeginSign(char c) {
 
 const TReplacement* SignAt(std::string_view text) {
     if (!CanBeginSign(text.front())) return nullptr;
-    const auto sign = std::find_if(kOtherSigns.begin(), kOtherSigns.end(),
-                                   [&](const auto& row) { return text.starts_with(row.mWritten); });
+    const auto sign = std::find_if(kOtherSigns.begin(), kOtherSigns.end(), [&](const auto& row) {
+        return row.mWritten.front() == text.front() && text.starts_with(row.mWritten);
+    });
     return sign == kOtherSigns.end() ? nullptr : &*sign;
 }
 

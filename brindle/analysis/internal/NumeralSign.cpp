@@ -54,6 +54,7 @@ const TNumeralSign& NearestSign(CSemitones semitones, bool isSmall, bool byKey) 
     if (byKey && DependsOnKey(nearest->mText)) nearest = &RowOf("7");
     int best = DistanceOf(TonesOf(*nearest, isSmall), semitones);
     for (const TNumeralSign& row : kNumeralSigns) {
+        if (best == 0) break;
         const CSemitones tones = TonesOf(row, isSmall);
         if (tones.IsEmpty() || (byKey && DependsOnKey(row.mText))) continue;
         const int distance = DistanceOf(tones, semitones);
