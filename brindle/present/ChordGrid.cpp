@@ -84,7 +84,7 @@ std::string AsciiName(std::optional<std::string> name) {
 
 /// Names what the strings sound. Other names are those of whole chords that are nearly as likely.
 void SetNames(CChordGrid& grid) {
-    constexpr int kNearlyAsLikely = 50;
+    constexpr int kNearlyAsLikely = 12;
     const auto names = NameFingering(grid.mPitches, grid.mTuning);
     if (names.empty()) return;
     grid.mName = names.front().mSymbol;
