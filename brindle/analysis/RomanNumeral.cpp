@@ -46,7 +46,7 @@ std::string DegreeText(TNumeralDegree degree, bool isSmall, bool inDigits) {
 struct TWrittenDegree {
     std::string mText;
     TNumeralRoot mRoot;
-    CKeyEnh mKeyEnh;      ///< the root as the numeral spells it
+    int mNumber;          ///< of the root in the key, 1 to 7, whatever its accidental
     std::string mTarget;  ///< "/ii", empty in the key
 };
 
@@ -93,7 +93,7 @@ TWrittenDegree OwnDegree(const CChordLite& chord, const CSignKeyLite& key,
     const TKeyChordClass chordClass = KeyChordClassOf(chord.mSemitones);
     const bool isMinor = chordClass == TKeyChordClass_Min || chordClass == TKeyChordClass_Min7;
     if (options.mNashville && isMinor) text += '-';
-    return {text, {degree, key.mSignKeyType, isSmall}, KeyOfDegree(degree, key), {}};
+    return {text, {degree, key.mSignKeyType, isSmall}, degree.mNumber, {}};
 }
 
 TWrittenDegree DegreeBefore(const CChordLite* next, const CChordLite& chord,
@@ -107,13 +107,11 @@ TWrittenDegree DegreeBefore(const CChordLite* next, const CChordLite& chord,
     if (applied == nullptr) return OwnDegree(chord, key, options);
     const bool isSmall = HasSmallNumeral(next->mSemitones);
     const TNumeralDegree degree = DegreeAt(target, key);
-    // What is applied to a degree of minor counts as in major: the leading tone of ii is #1.
-    const CSignKeyLite keyOfTarget(KeyOfDegree(degree, key), TSignKeyType_Major);
     const TNumeralDegree held = HeldInMinor(degree, next->mSemitones, key, options);
     const TSignKeyType type = isSmall ? TSignKeyType_Minor : TSignKeyType_Major;
     return {std::string(applied->mNumeral),
             {applied->mDegree, type, HasSmallNumeral(chord.mSemitones)},
-            KeyOfDegree(applied->mDegree, keyOfTarget),
+            (degree.mNumber + applied->mDegree.mNumber - 2) % 7 + 1,
             "/" + DegreeText(held, isSmall, false)};
 }
 
@@ -161,13 +159,18 @@ bool IsSpelled(const CKeyEnh& keyEnh) {
     return IsSensefulEnhForKeyNr(keyEnh.mKeyNr, keyEnh.mEnh);
 }
 
-// The bass as it is spelled above its root, above that root as the numeral spells it.
-std::string BassText(const CChordLite& chord, const CKeyEnh& root, const CSignKeyLite& key) {
+// The degree of the bass, as many letters above the root as it is spelled; the usual one of its
+// sound where that takes more than two accidentals. Counted in degrees, so that it is the same in
+// all keys.
+TNumeralDegree BassDegree(const CChordLite& chord, int rootNumber, const CSignKeyLite& key) {
     const int intvl = IntvlBetween(chord.mRootKeyEnh, chord.mBassKeyEnh);
     const bool isSpelled = IsSpelled(chord.mRootKeyEnh) && IsSpelled(chord.mBassKeyEnh);
     const int letters = isSpelled ? LettersBetween(chord.mRootKeyEnh, chord.mBassKeyEnh)
                                   : kUsualLetters[static_cast<std::size_t>(intvl)];
-    return "/^" + DegreeText(DegreeOfKey(SpelledAbove(root, letters, intvl), key), false, true);
+    TNumeralDegree degree{(rootNumber - 1 + letters) % 7 + 1, 0};
+    const int dist = DistToTonic(chord.mBassKeyEnh, key);
+    degree.mAccidental = SmallestKeyIntvlBetween(SemitonesOfDegree(degree, key.mSignKeyType), dist);
+    return degree.mAccidental < -2 || degree.mAccidental > 2 ? DegreeAt(dist, key) : degree;
 }
 
 /// What stands behind the degree, and the bass behind the last slash.
@@ -190,7 +193,9 @@ TTail TailOf(const CChordLite& chord, const TWrittenDegree& degree, const CSignK
     if (intvl != 0 && options.mFigures && sign.mAlterations.empty()) {
         figured = SignWithFigure(text, chord.mSemitones, intvl);
     }
-    if (intvl != 0 && figured.empty()) bass = BassText(chord, degree.mKeyEnh, key);
+    if (intvl != 0 && figured.empty()) {
+        bass = "/^" + DegreeText(BassDegree(chord, degree.mNumber, key), false, true);
+    }
     if (!figured.empty()) text = figured;
     if (options.mPrintedSigns) text = WithPrintedSigns(text);
     return {text + sign.mAlterations, bass};

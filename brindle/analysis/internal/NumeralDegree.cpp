@@ -104,15 +104,4 @@ CKeyEnh KeyOfDegree(TNumeralDegree degree, const CSignKeyLite& key) {
                         SemitonesOfDegree(degree, key.mSignKeyType));
 }
 
-TNumeralDegree DegreeOfKey(const CKeyEnh& keyEnh, const CSignKeyLite& key) {
-    const int dist = FoldIntoOctave(std::int64_t{keyEnh.mKeyNr} - key.mRootKeyEnh.mKeyNr);
-    TNumeralDegree degree{LettersBetween(key.mRootKeyEnh, keyEnh) + 1, 0};
-    const int natural = SemitonesOfDegree(degree, key.mSignKeyType);
-    degree.mAccidental = SmallestKeyIntvlBetween(natural, dist);
-    if (degree.mAccidental >= -kMostAccidentals && degree.mAccidental <= kMostAccidentals) {
-        return degree;
-    }
-    return DegreesOf(key.mSignKeyType)[static_cast<std::size_t>(dist)];
-}
-
 }  // namespace brindle

@@ -31,9 +31,6 @@ struct TReadDegree {
 /// The spelled key of a degree: the third degree of E flat is a G.
 [[nodiscard]] CKeyEnh KeyOfDegree(TNumeralDegree degree, const CSignKeyLite& key);
 
-/// The degree that a spelled key is; with more than two accidentals the usual one of that sound.
-[[nodiscard]] TNumeralDegree DegreeOfKey(const CKeyEnh& keyEnh, const CSignKeyLite& key);
-
 /// The key so many letters and semitones above another; -1 letters is one below.
 [[nodiscard]] CKeyEnh SpelledAbove(const CKeyEnh& from, int letters, int semitones);
 
