@@ -47,12 +47,12 @@ Json RandomJson(std::mt19937& random, int depth) {
         case 5:
         case 6: {
             Json list = Json::array();
-            for (unsigned n = below(8); n > 0; --n) list.push_back(RandomJson(random, depth - 1));
+            for (auto n = below(8); n > 0; --n) list.push_back(RandomJson(random, depth - 1));
             return list;
         }
         default: {
             Json object = Json::object();
-            for (unsigned n = below(6); n > 0; --n) {
+            for (auto n = below(6); n > 0; --n) {
                 object[std::string(1 + below(30), static_cast<char>('a' + n))] =
                     RandomJson(random, depth - 1);
             }
