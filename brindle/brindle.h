@@ -175,6 +175,7 @@
 #include "brindle/present/KeysJson.h"
 #include "brindle/present/KeysSvg.h"
 #include "brindle/present/KeysText.h"
+#include "brindle/present/LeadSheetSvg.h"
 #include "brindle/present/MarkovMidi.h"
 #include "brindle/present/MarkovText.h"
 #include "brindle/present/MidiFile.h"

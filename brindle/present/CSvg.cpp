@@ -17,15 +17,14 @@ constexpr double kLetterWidth = 0.62;
 
 constexpr std::string_view kEllipsis = "\xE2\x80\xA6";
 
-// Two digits are finer than any screen, and make small files.
-std::string Coordinate(double value) {
+}  // namespace
+
+std::string SvgNumber(double value) {
     std::string text = fmt::format("{:.2f}", value);
     text.erase(text.find_last_not_of('0') + 1);
     if (text.back() == '.') text.pop_back();
     return text;
 }
-
-}  // namespace
 
 std::string XmlEscaped(std::string_view text) {
     std::string escaped;
@@ -70,8 +69,8 @@ double TextWidth(std::string_view text, double fontSize) {
 void CSvg::Rect(double x, double y, double width, double height, std::string_view fill,
                 std::string_view tooltip) {
     const std::string shape =
-        fmt::format(R"(<rect x="{}" y="{}" width="{}" height="{}" rx="3" fill="{}")", Coordinate(x),
-                    Coordinate(y), Coordinate(width), Coordinate(height), fill);
+        fmt::format(R"(<rect x="{}" y="{}" width="{}" height="{}" rx="3" fill="{}")", SvgNumber(x),
+                    SvgNumber(y), SvgNumber(width), SvgNumber(height), fill);
     mBody += shape;
     mBody += tooltip.empty() ? "/>\n" : "><title>" + XmlEscaped(tooltip) + "</title></rect>\n";
 }
@@ -80,19 +79,19 @@ void CSvg::Line(double x1, double y1, double x2, double y2, std::string_view col
     fmt::format_to(std::back_inserter(mBody),
                    R"(<line x1="{}" y1="{}" x2="{}" y2="{}" stroke="{}"/>)"
                    "\n",
-                   Coordinate(x1), Coordinate(y1), Coordinate(x2), Coordinate(y2), color);
+                   SvgNumber(x1), SvgNumber(y1), SvgNumber(x2), SvgNumber(y2), color);
 }
 
 void CSvg::Circle(double x, double y, double radius, std::string_view fill, std::string_view line) {
     fmt::format_to(std::back_inserter(mBody),
                    R"(<circle cx="{}" cy="{}" r="{}" fill="{}" stroke="{}"/>)"
                    "\n",
-                   Coordinate(x), Coordinate(y), Coordinate(radius), fill, line);
+                   SvgNumber(x), SvgNumber(y), SvgNumber(radius), fill, line);
 }
 
 void CSvg::Text(double x, double y, std::string_view text, const CSvgFont& font) {
     fmt::format_to(std::back_inserter(mBody), R"(<text x="{}" y="{}" font-size="{}" fill="{}")",
-                   Coordinate(x), Coordinate(y), Coordinate(font.mSize), font.mColor);
+                   SvgNumber(x), SvgNumber(y), SvgNumber(font.mSize), font.mColor);
     if (font.mBold) mBody += R"( font-weight="bold")";
     if (!font.mAnchor.empty()) mBody += fmt::format(R"( text-anchor="{}")", font.mAnchor);
     mBody += ">" + XmlEscaped(text) + "</text>\n";
@@ -107,8 +106,8 @@ void CSvg::TextCut(double x, double y, double width, std::string_view text, cons
 }
 
 std::string CSvg::File(double width, double height, std::string_view title) const {
-    const std::string w = Coordinate(width);
-    const std::string h = Coordinate(height);
+    const std::string w = SvgNumber(width);
+    const std::string h = SvgNumber(height);
     std::string file = R"(<?xml version="1.0" encoding="UTF-8"?>)"
                        "\n";
     file += fmt::format(

@@ -12,6 +12,9 @@ namespace brindle {
 /// A color as "#rrggbb"; `hue` in degrees, the others in percent.
 [[nodiscard]] std::string HslColor(int hue, int saturation, int lightness);
 
+/// A coordinate with at most two digits behind the point, which are finer than any screen.
+[[nodiscard]] std::string SvgNumber(double value);
+
 /// How a text is written into a picture.
 struct CSvgFont {
     double mSize = 12.0;

@@ -15,6 +15,10 @@ enum TShade : int {
     Shade_SignKey = 82,
     Shade_Reading = 82,
     Shade_Chord = 93,
+    Shade_Sheet = 96,  ///< behind the chords of a lead sheet, and the names of its keys
+    Shade_SheetName = 34,
+    Shade_NightSheet = 20,  ///< the same on dark paper
+    Shade_NightSheetName = 78,
 };
 
 // The color of a key: neighbours on the circle of fifths have neighbouring colors, and minor keys

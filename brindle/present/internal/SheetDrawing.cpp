@@ -1,0 +1,405 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/present/internal/SheetDrawing.h"
+
+#include "brindle/present/CSvg.h"
+#include "brindle/present/internal/SheetStyle.h"
+
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <cmath>
+
+namespace brindle::LeadSheet {
+namespace {
+
+// A line from above: the brackets of endings, the names of sections and keys, arrows, the band with
+// the chords, brackets.
+constexpr double kEndingHeight = 15.0;
+constexpr double kHeadHeight = 18.0;
+constexpr double kArrowHeight = 13.0;
+constexpr double kLevelHeight = 5.5;
+constexpr double kBracketHeight = 9.0;
+constexpr double kLineGap = 11.0;
+
+constexpr double kBandPadding = 6.0;
+constexpr double kSymbolRise = 18.0;   // from the padding to the base line of the symbols
+constexpr double kNumeralDrop = 19.0;  // to that of the numerals
+
+constexpr double kSectionSize = 12.0;
+constexpr double kKeyNameSize = 11.5;
+constexpr double kRemarkSize = 11.0;
+constexpr double kNumberSize = 9.5;
+constexpr double kLegendSize = 11.0;
+constexpr double kHeadGap = 8.0;
+
+bool HasHeads(const CSheetBar& bar) {
+    return bar.mBeginsSection || !bar.mRemark.empty() || bar.mTimes > 2;
+}
+
+/// The heights of the parts of a line.
+struct CHeights {
+    double mEndings = 0.0;
+    double mHeads = 0.0;
+    double mArrows = 0.0;
+    double mBand = 0.0;
+    double mBrackets = 0.0;
+
+    CHeights(const CSheetScore& score, std::size_t index) {
+        const CLineMarks& marks = score.mMarks[index];
+        for (const CKeyMark& key : marks.mKeys) {
+            if (key.mIsNew) mHeads = kHeadHeight;
+        }
+        for (const CPlacedBar& placed : score.mLines.mLines[index].mBars) {
+            const CSheetBar& bar = score.mSheet.mBars[placed.mBar];
+            if (bar.mIsInEnding) mEndings = kEndingHeight;
+            if (HasHeads(bar)) mHeads = kHeadHeight;
+        }
+        const std::size_t levels = marks.Levels();
+        if (levels > 0) mArrows = kArrowHeight + kLevelHeight * static_cast<double>(levels - 1);
+        if (!marks.mBrackets.empty()) mBrackets = kBracketHeight;
+        mBand = 2 * kBandPadding + score.mLines.mScale * (kSymbolRise + kNumeralDrop);
+    }
+
+    [[nodiscard]] double BandTop() const { return mEndings + mHeads + mArrows; }
+    [[nodiscard]] double BandEnd() const { return BandTop() + mBand; }
+};
+
+class CLineDrawing {
+public:
+    CLineDrawing(CSheetPen& pen, const CSheetScore& score, std::size_t index, double x, double y)
+        : mPen(pen),
+          mScore(score),
+          mLine(score.mLines.mLines[index]),
+          mMarks(score.mMarks[index]),
+          mHeights(score, index),
+          mX(x),
+          mY(y),
+          mTop(y + mHeights.BandTop()),
+          mBottom(y + mHeights.BandEnd()) {}
+
+    void Draw() {
+        for (const CKeyMark& key : mMarks.mKeys) {
+            if (key.mKey.mRootKeyEnh.IsUndef()) continue;
+            mPen.Rect(mX + key.mBegin, mTop, key.mEnd - key.mBegin, mBottom - mTop,
+                      BandStyle(key.mKey));
+        }
+        DrawNumber();
+        for (const CPlacedBar& bar : mLine.mBars) DrawBar(bar);
+        DrawHeads();
+        for (const CLinkMark& arrow : mMarks.mArrows) DrawArrow(arrow);
+        for (const CLinkMark& bracket : mMarks.mBrackets) DrawBracket(bracket);
+    }
+
+private:
+    [[nodiscard]] const CSheetBar& BarOf(const CPlacedBar& placed) const {
+        return mScore.mSheet.mBars[placed.mBar];
+    }
+    [[nodiscard]] double Middle() const { return (mTop + mBottom) / 2; }
+    [[nodiscard]] double Scale() const { return mScore.mLines.mScale; }
+
+    void DrawNumber() {
+        const CPlacedBar& first = mLine.mBars.front();
+        const CSheetBar& bar = BarOf(first);
+        if (!first.mIsBegin || bar.mIsUpbeat) return;
+        mPen.Text(mX - 7, mTop + kNumberSize, kNumberSize, CutToWidth(bar.mNumber, 3.0),
+                  "ita quiet", "end");
+    }
+
+    void DrawBar(const CPlacedBar& placed) {
+        const CSheetBar& bar = BarOf(placed);
+        if (placed.mIsBegin) DrawBegin(placed);
+        if (placed.mIsEnd) DrawEnd(placed);
+        if (bar.mIsInEnding) DrawEnding(placed);
+        if (!bar.mTime.IsUndef() && placed.mIsBegin) DrawTime(placed);
+        for (const CPlacedChord& chord : placed.mChords) DrawChord(chord);
+        if (placed.mChords.empty()) DrawEmpty(placed);
+    }
+
+    void BarLine(double x, std::string_view style = "bar") {
+        mPen.Line(mX + x, mTop, mX + x, mBottom, style);
+    }
+
+    void DrawBegin(const CPlacedBar& placed) {
+        const CSheetBar& bar = BarOf(placed);
+        const bool isFirst = placed.mX == 0.0;
+        if (bar.mBeginsRepeat) {
+            BarLine(placed.mX + 1.7, "thick");
+            BarLine(placed.mX + 5.6);
+            DrawDots(placed.mX + 9.8);
+        } else if (isFirst) {
+            BarLine(placed.mX);
+        }
+    }
+
+    void DrawEnd(const CPlacedBar& placed) {
+        const CSheetBar& bar = BarOf(placed);
+        const double x = placed.End();
+        const bool isLast = placed.mBar + 1 == mScore.mSheet.mBars.size();
+        const bool isDouble = !isLast && mScore.mSheet.mBars[placed.mBar + 1].mBeginsSection;
+        if (bar.mEndsRepeat || isLast) {
+            BarLine(x - 1.7, "thick");
+            BarLine(x - 5.6);
+            if (bar.mEndsRepeat) DrawDots(x - 9.8);
+            return;
+        }
+        BarLine(x);
+        if (isDouble) BarLine(x - 3.0);
+    }
+
+    void DrawDots(double x) {
+        mPen.Dot(mX + x, Middle() - 5, 1.8, "ink");
+        mPen.Dot(mX + x, Middle() + 5, 1.8, "ink");
+    }
+
+    void DrawEnding(const CPlacedBar& placed) {
+        const CSheetBar& bar = BarOf(placed);
+        const double y = mY + 2.5;
+        const double end = mX + placed.End() - (bar.mClosesEnding ? 2.0 : 0.0);
+        mPen.Line(mX + placed.mX + 1, y, end, y, "bar");
+        if (bar.mClosesEnding && placed.mIsEnd) mPen.Line(end, y, end, y + 9, "bar");
+        if (bar.mEnding.empty() || !placed.mIsBegin) return;
+        mPen.Line(mX + placed.mX + 1, y, mX + placed.mX + 1, y + 9, "bar");
+        mPen.Text(mX + placed.mX + 6, y + 10.5, kRemarkSize,
+                  CutToWidth(bar.mEnding, (placed.mWidth - 8) / kRemarkSize), "num ink");
+    }
+
+    void DrawTime(const CPlacedBar& placed) {
+        const CSheetBar& bar = BarOf(placed);
+        constexpr double kSize = 19.0;
+        const double x =
+            mX + placed.mX + (bar.mBeginsRepeat ? kRepeatWidth : 0.0) + kTimeWidth / 2 + 3;
+        const auto draw = [&](int number, double y) {
+            const std::string text = fmt::format("{}", number);
+            const double size = std::min(kSize, kTimeWidth / WidthOf(text) * 1.1);
+            mPen.Text(x, y, size, text, "ttl ink", "middle");
+        };
+        draw(bar.mTime.mNumerator, Middle() - 1.5);
+        draw(bar.mTime.mDenominator, Middle() + kSize * 0.7);
+    }
+
+    void DrawChord(const CPlacedChord& chord) {
+        const CChordTexts& texts = mScore.mTexts[chord.mChord];
+        const double baseLine = mTop + kBandPadding + Scale() * kSymbolRise;
+        mPen.Runs(mX + chord.mX, baseLine, Scale() * kSymbolSize, texts.mSymbol, "sym ink");
+        if (texts.mNumeral.empty()) return;
+        mPen.Runs(mX + chord.mX, baseLine + Scale() * kNumeralDrop, Scale() * kNumeralSize,
+                  texts.mNumeral, "num ink");
+    }
+
+    void DrawEmpty(const CPlacedBar& placed) {
+        const CSheetBar& bar = BarOf(placed);
+        const double left = mX + placed.mX + LeftPadding(bar);
+        const double right = mX + placed.End() - RightPadding(bar);
+        const double x = (left + right) / 2;
+        if (bar.mBarCount > 1) return DrawLongRest(left, right, bar.mBarCount);
+        const bool sounds = bar.mBegin > 0;
+        if (!sounds) {
+            mPen.Rect(x - 5, Middle() - 2.5, 10, 5, "quiet");
+        } else if (IsSimple(placed.mBar)) {
+            DrawSlash(x);
+            mPen.Dot(x - 7, Middle() - 4.5, 1.7, "quiet");
+            mPen.Dot(x + 7, Middle() + 4.5, 1.7, "quiet");
+        } else {
+            for (const double part : {0.125, 0.375, 0.625, 0.875}) {
+                DrawSlash(left + part * (right - left));
+            }
+        }
+    }
+
+    // Whether the bar before holds one chord and nothing else, so that it can be told to go on.
+    [[nodiscard]] bool IsSimple(std::size_t index) const {
+        if (index == 0) return false;
+        const CSheetBar& before = mScore.mSheet.mBars[index - 1];
+        return before.mEnd - before.mBegin <= 1 && before.mBarCount == 1;
+    }
+
+    void DrawSlash(double x) {
+        mPen.Path(fmt::format("M{} {}l8 -14h4l-8 14z", SvgNumber(x - 6), SvgNumber(Middle() + 7)),
+                  "quiet");
+    }
+
+    void DrawLongRest(double left, double right, std::size_t count) {
+        mPen.Line(left, Middle() + 5, right, Middle() + 5, "thick");
+        for (const double x : {left, right}) mPen.Line(x, Middle() - 2, x, Middle() + 12, "bar");
+        mPen.Text((left + right) / 2, Middle() - 3, kKeyNameSize + 3, fmt::format("{}", count),
+                  "ttl ink", "middle");
+    }
+
+    // The names of sections and keys and the remarks, from the left; each moves aside for those
+    // before it.
+    void DrawHeads() {
+        double free = 0.0;
+        std::size_t key = 0;
+        const auto drawKeys = [&](double end) {
+            for (; key < mMarks.mKeys.size() && mMarks.mKeys[key].mBegin < end; ++key) {
+                if (mMarks.mKeys[key].mIsNew) DrawKeyName(mMarks.mKeys[key], free);
+            }
+        };
+        for (const CPlacedBar& placed : mLine.mBars) {
+            const CSheetBar& bar = BarOf(placed);
+            if (placed.mIsBegin && bar.mBeginsSection) DrawSection(placed, free);
+            drawKeys(placed.End());
+            if (placed.mIsBegin && !bar.mRemark.empty()) {
+                DrawHead(placed.mX + 2, kRemarkSize, bar.mRemark, "ita quiet", free);
+            }
+            if (placed.mIsEnd && bar.mTimes > 2) {
+                const std::string times = fmt::format("\xC3\x97{}", bar.mTimes);
+                const double width = kSectionSize * WidthOf(times);
+                DrawHead(placed.End() - width, kSectionSize, times, "ttl ink", free);
+            }
+        }
+    }
+
+    [[nodiscard]] double HeadLine() const { return mY + mHeights.mEndings + 12.0; }
+
+    void DrawHead(double x, double size, const std::string& text, std::string_view style,
+                  double& free) {
+        x = std::max(x, free);
+        const std::string cut = CutToWidth(text, (HeadEnd() - x) / size);
+        if (x + size > HeadEnd()) return;
+        mPen.Text(mX + x, HeadLine(), size, cut, style);
+        free = x + size * WidthOf(cut) + kHeadGap;
+    }
+
+    // A short line may have names that are longer.
+    [[nodiscard]] double HeadEnd() const { return std::max(mLine.Width(), 180.0); }
+
+    void DrawSection(const CPlacedBar& placed, double& free) {
+        const std::string& name = BarOf(placed).mSection;
+        if (name.empty()) return;
+        const double x = std::max(placed.mX, free);
+        const std::string text = CutToWidth(name, (HeadEnd() - x - 8) / kSectionSize);
+        const double width = kSectionSize * WidthOf(text) + 8;
+        mPen.Rect(mX + x, HeadLine() - 11, width, 14.5, "thin box");
+        mPen.Text(mX + x + width / 2, HeadLine(), kSectionSize, text, "sec ink", "middle");
+        free = x + width + kHeadGap;
+    }
+
+    void DrawKeyName(const CKeyMark& key, double& free) {
+        DrawHead(key.mBegin + 1, kKeyNameSize, NameOfKey(key.mKey), "sec " + NameStyle(key.mKey),
+                 free);
+    }
+
+    void DrawArrow(const CLinkMark& arrow) {
+        const double base = mTop - 2;
+        const double rise = 13.0 + kLevelHeight * 4 / 3 * static_cast<double>(arrow.mLevel);
+        DrawArrowShape(mPen, mX + arrow.mBegin, mX + arrow.mEnd, base, rise, arrow);
+    }
+
+public:
+    static void DrawArrowShape(CSheetPen& pen, double begin, double end, double base, double rise,
+                               const CLinkMark& arrow) {
+        const double top = base - 0.75 * rise;
+        const double bend = std::min(22.0, 0.36 * (end - begin));
+        const std::string_view style = arrow.mIsDotted ? "dot" : "arc";
+        const bool fades = arrow.mGoesOn || arrow.mGoesBack;
+        const double beginY = arrow.mIsFromBefore ? top : base;
+        const double endY = fades ? top : base;
+        const double beginTop = arrow.mIsFromBefore ? top : base - rise;
+        const double endTop = fades ? top : base - rise;
+        pen.Path(fmt::format("M{} {}C{} {} {} {} {} {}", SvgNumber(begin), SvgNumber(beginY),
+                             SvgNumber(begin + bend), SvgNumber(beginTop), SvgNumber(end - bend),
+                             SvgNumber(endTop), SvgNumber(end), SvgNumber(endY)),
+                 style);
+        if (arrow.mGoesOn) return;
+        DrawArrowHead(pen, end, endY, bend, endY - endTop);
+    }
+
+private:
+    // The way of the arrow at its end is (across, down).
+    static void DrawArrowHead(CSheetPen& pen, double x, double y, double across, double down) {
+        constexpr double kLength = 6.5;
+        constexpr double kHalfWidth = 2.3;
+        const double length = std::max(1e-3, std::hypot(across, down));
+        const double dx = across / length;
+        const double dy = down / length;
+        const double baseX = x - kLength * dx;
+        const double baseY = y - kLength * dy;
+        pen.Path(
+            fmt::format("M{} {}L{} {}L{} {}z", SvgNumber(x + dx), SvgNumber(y + dy),
+                        SvgNumber(baseX - kHalfWidth * dy), SvgNumber(baseY + kHalfWidth * dx),
+                        SvgNumber(baseX + kHalfWidth * dy), SvgNumber(baseY - kHalfWidth * dx)),
+            "head");
+    }
+
+    void DrawBracket(const CLinkMark& bracket) {
+        const double y = mBottom + 3;
+        std::string path = fmt::format("M{} {}", SvgNumber(mX + bracket.mBegin),
+                                       SvgNumber(bracket.mIsFromBefore ? y + 5 : y));
+        if (!bracket.mIsFromBefore) path += "v5";
+        path += fmt::format("H{}", SvgNumber(mX + bracket.mEnd));
+        if (!bracket.mGoesOn) path += "v-5";
+        mPen.Path(path, bracket.mIsDotted ? "dot" : "arc");
+    }
+
+    CSheetPen& mPen;
+    const CSheetScore& mScore;
+    const CSheetLine& mLine;
+    const CLineMarks& mMarks;
+    CHeights mHeights;
+    double mX;
+    double mY;
+    double mTop;
+    double mBottom;
+};
+
+/// What the marks of a score are.
+struct CMarkKinds {
+    bool mHasArrow = false;
+    bool mHasDottedArrow = false;
+    bool mHasBracket = false;
+
+    explicit CMarkKinds(const CSheetScore& score) {
+        for (const CLineMarks& marks : score.mMarks) {
+            for (const CLinkMark& arrow : marks.mArrows) {
+                (arrow.mIsDotted ? mHasDottedArrow : mHasArrow) = true;
+            }
+            mHasBracket = mHasBracket || !marks.mBrackets.empty();
+        }
+    }
+};
+
+}  // namespace
+
+double HeightOf(const CSheetScore& score, std::size_t line) {
+    const CHeights heights(score, line);
+    return heights.BandEnd() + heights.mBrackets + kLineGap;
+}
+
+void DrawLine(CSheetPen& pen, const CSheetScore& score, std::size_t line, double x, double y) {
+    CLineDrawing(pen, score, line, x, y).Draw();
+}
+
+void DrawLegend(CSheetPen& pen, const CSheetScore& score, double x, double y, double width) {
+    const double end = x + width;
+    const auto explain = [&](double sample, std::string_view text) {
+        x += sample + 5;
+        pen.Text(x, y, kLegendSize, text, "ita quiet");
+        x += kLegendSize * WidthOf(text) * 0.85 + 16;
+    };
+    const auto fits = [&](std::string_view text) {
+        return x + 40 + kLegendSize * WidthOf(text) < end;
+    };
+    const auto arrow = [&](bool isDotted, std::string_view text) {
+        if (!fits(text)) return;
+        CLinkMark mark;
+        mark.mIsDotted = isDotted;
+        CLineDrawing::DrawArrowShape(pen, x, x + 24, y, 12, mark);
+        explain(26, text);
+    };
+    const CMarkKinds kinds(score);
+    if (kinds.mHasArrow) arrow(false, "a dominant resolves");
+    if (kinds.mHasDottedArrow) arrow(true, "what stands for a dominant resolves");
+    if (kinds.mHasBracket && fits("a second with its dominant")) {
+        pen.Path(fmt::format("M{} {}v5h24v-5", SvgNumber(x), SvgNumber(y - 6)), "arc");
+        explain(24, "ii and V");
+    }
+    const bool hasKeys = !score.mMarks.empty() && !score.mMarks[0].mKeys.empty() &&
+                         !score.mMarks[0].mKeys[0].mKey.mRootKeyEnh.IsUndef();
+    if (hasKeys && fits("the color is that of the key")) {
+        pen.Rect(x, y - 8, 14, 9, BandStyle(score.mMarks[0].mKeys[0].mKey));
+        explain(14, "the color is that of the key");
+    }
+}
+
+}  // namespace brindle::LeadSheet

@@ -1,0 +1,254 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/present/internal/SheetRepeats.h"
+
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <cmath>
+#include <utility>
+
+namespace brindle::LeadSheet {
+namespace {
+
+constexpr double kTolerance = 1e-6;
+
+// A first ending that is longer is no ending to the eye.
+constexpr std::size_t kLongestEnding = 8;
+
+/// A repeat in bars: from `mAgain` on, `mCount` bars are those from `mSource` on.
+struct CRepeat {
+    std::size_t mSource = 0;
+    std::size_t mAgain = 0;
+    std::size_t mCount = 0;
+};
+
+/// A passage that is played several times in a row.
+struct CPassage {
+    std::size_t mBegin = 0;
+    /// Where each time begins behind the first, ascending.
+    std::vector<std::size_t> mAgain;
+    /// So many bars are common to all times, and the first time has so many.
+    std::size_t mCommon = 0;
+    std::size_t mLength = 0;
+    /// Of each time behind the first, whether it is the same to its end.
+    std::vector<bool> mIsWhole;
+    /// Behind the last bar that belongs to it.
+    std::size_t mEnd = 0;
+
+    [[nodiscard]] bool HasEndings() const { return mCommon < mLength; }
+};
+
+class CFolding {
+public:
+    CFolding(const CSong& song, CSheet& sheet)
+        : mSong(song), mSheet(sheet), mBars(sheet.mBars), mIsHidden(sheet.mBars.size(), false) {}
+
+    void Fold() {
+        const std::vector<CRepeat> repeats = Repeats();
+        for (std::size_t i = 0; i < repeats.size();) {
+            std::size_t next = i + 1;
+            if (!mIsHidden[repeats[i].mAgain]) next = FoldFrom(repeats, i);
+            i = next;
+        }
+        std::size_t kept = 0;
+        for (std::size_t i = 0; i < mBars.size(); ++i) {
+            if (mIsHidden[i]) continue;
+            if (kept != i) mBars[kept] = std::move(mBars[i]);
+            ++kept;
+        }
+        mBars.resize(kept);
+    }
+
+private:
+    // The bar that begins there, `kNone` if there is none.
+    [[nodiscard]] std::size_t BarAt(double position) const {
+        const auto bar = std::lower_bound(
+            mBars.begin(), mBars.end(), position - kTolerance,
+            [](const CSheetBar& one, double begin) { return one.mPosition < begin; });
+        const bool isThere = bar != mBars.end() && bar->mPosition <= position + kTolerance;
+        return isThere ? static_cast<std::size_t>(bar - mBars.begin()) : kNone;
+    }
+
+    // In the order of playing. No two of them reach over each other.
+    [[nodiscard]] std::vector<CRepeat> Repeats() const {
+        std::vector<CRepeat> repeats;
+        for (const CSongRepeat& told : mSong.mRepeats) {
+            const CRepeat repeat{BarAt(told.mSourcePosition), BarAt(told.mPosition),
+                                 told.mBarCount};
+            if (repeat.mAgain == kNone || repeat.mSource >= repeat.mAgain) continue;
+            repeats.push_back(repeat);
+        }
+        std::sort(repeats.begin(), repeats.end(), [](const CRepeat& one, const CRepeat& other) {
+            return one.mAgain < other.mAgain;
+        });
+        for (std::size_t i = 0; i < repeats.size(); ++i) {
+            const std::size_t end = i + 1 < repeats.size() ? repeats[i + 1].mAgain : mBars.size();
+            repeats[i].mCount =
+                CountSame(repeats[i], std::min(repeats[i].mCount, end - repeats[i].mAgain));
+        }
+        return repeats;
+    }
+
+    [[nodiscard]] std::size_t CountSame(const CRepeat& repeat, std::size_t most) const {
+        std::size_t count = 0;
+        while (count < most && AreSame(repeat.mSource + count, repeat.mAgain + count)) ++count;
+        return count;
+    }
+
+    [[nodiscard]] bool AreSame(std::size_t a, std::size_t b) const {
+        const CSheetBar& one = mBars[a];
+        const CSheetBar& other = mBars[b];
+        if (one.mEnd - one.mBegin != other.mEnd - other.mBegin) return false;
+        for (std::size_t i = 0; i < one.mEnd - one.mBegin; ++i) {
+            const std::size_t chord = one.mBegin + i;
+            const std::size_t again = other.mBegin + i;
+            const double offset = mSheet.mPositions[chord] - one.mPosition;
+            const double offsetAgain = mSheet.mPositions[again] - other.mPosition;
+            if (std::fabs(offset - offsetAgain) > kTolerance || !AreSameChord(chord, again)) {
+                return false;
+            }
+        }
+        return true;
+    }
+
+    [[nodiscard]] bool AreSameChord(std::size_t a, std::size_t b) const {
+        const auto& symbols = mSong.mSymbols;
+        if (std::max(a, b) < symbols.size()) return symbols[a] == symbols[b];
+        return static_cast<const CChordLite&>(mSong.mChords[a]) == mSong.mChords[b];
+    }
+
+    // Folds the passage whose second time is the repeat `first`, or tells in a remark what it is.
+    // The repeat behind what was folded.
+    std::size_t FoldFrom(const std::vector<CRepeat>& repeats, std::size_t first) {
+        CPassage passage;
+        passage.mBegin = repeats[first].mSource;
+        passage.mLength = repeats[first].mAgain - passage.mBegin;
+        passage.mCommon = passage.mLength;
+        std::size_t next = first;
+        while (next < repeats.size() && Takes(passage, repeats, next)) {
+            const CRepeat& repeat = repeats[next];
+            passage.mAgain.push_back(repeat.mAgain);
+            passage.mIsWhole.push_back(repeat.mCount >= passage.mLength);
+            passage.mCommon = std::min(passage.mCommon, repeat.mCount);
+            ++next;
+        }
+        if (passage.mAgain.empty() || !IsFree(passage)) {
+            Remark(repeats[first]);
+            return first + 1;
+        }
+        FindEnd(passage);
+        Hide(passage);
+        WriteSigns(passage);
+        return next;
+    }
+
+    // Whether a repeat is one more time of the passage.
+    [[nodiscard]] static bool Takes(const CPassage& passage, const std::vector<CRepeat>& repeats,
+                                    std::size_t index) {
+        const CRepeat& repeat = repeats[index];
+        const bool isFirst = passage.mAgain.empty();
+        const std::size_t before = isFirst ? passage.mBegin : passage.mAgain.back();
+        if (repeat.mSource != passage.mBegin && repeat.mSource != before) return false;
+        if (!isFirst && passage.mIsWhole.back() && repeat.mAgain != before + passage.mLength) {
+            return false;
+        }
+        const std::size_t common = std::min(repeat.mCount, passage.mLength);
+        if (common == passage.mLength) return true;
+        // All times that end on their own are to leave the passage at the same place, and an ending
+        // is short.
+        const bool isSamePlace = passage.HasEndings() ? common == passage.mCommon : true;
+        const std::size_t ending = passage.mLength - common;
+        const bool isShort = repeat.mAgain - before - common <= kLongestEnding;
+        return common > 0 && isSamePlace && isShort && ending <= std::min(common, kLongestEnding);
+    }
+
+    // Whether the first time of the passage is drawn and takes no sign twice.
+    [[nodiscard]] bool IsFree(const CPassage& passage) const {
+        const std::size_t last = passage.mBegin + passage.mLength - 1;
+        if (mIsHidden[passage.mBegin] || mIsHidden[last]) return false;
+        if (mBars[passage.mBegin].mBeginsRepeat || mBars[last].mEndsRepeat) return false;
+        for (std::size_t i = passage.mBegin + passage.mCommon; i <= last; ++i) {
+            if (mIsHidden[i] || mBars[i].mIsInEnding || mBars[i].mBeginsRepeat) return false;
+        }
+        return true;
+    }
+
+    // The last ending is as long as the first, and ends before a section or a repeat.
+    void FindEnd(CPassage& passage) const {
+        const std::size_t last = passage.mAgain.back();
+        if (passage.mIsWhole.back()) {
+            passage.mEnd = last + passage.mLength;
+            return;
+        }
+        const std::size_t begin = last + passage.mCommon;
+        const std::size_t most = std::min(mBars.size(), last + passage.mLength);
+        passage.mEnd = std::min(begin + 1, mBars.size());
+        while (passage.mEnd < most && !mBars[passage.mEnd].mBeginsSection) ++passage.mEnd;
+    }
+
+    void Hide(const CPassage& passage) {
+        for (std::size_t time = 0; time < passage.mAgain.size(); ++time) {
+            const std::size_t count = passage.mIsWhole[time] ? passage.mLength : passage.mCommon;
+            for (std::size_t i = 0; i < count; ++i) {
+                HideBar(passage.mAgain[time] + i, passage.mBegin + i);
+            }
+        }
+    }
+
+    void HideBar(std::size_t bar, std::size_t drawn) {
+        mIsHidden[bar] = true;
+        for (std::size_t i = mBars[bar].mBegin; i < mBars[bar].mEnd; ++i) {
+            mSheet.mDrawnAs[i] = mSheet.mDrawnAs[mBars[drawn].mBegin + i - mBars[bar].mBegin];
+        }
+    }
+
+    void WriteSigns(const CPassage& passage) {
+        mBars[passage.mBegin].mBeginsRepeat = true;
+        const std::size_t last = passage.mBegin + passage.mLength - 1;
+        mBars[last].mEndsRepeat = true;
+        if (!passage.HasEndings()) {
+            mBars[last].mTimes = passage.mAgain.size() + 1;
+            return;
+        }
+        std::string firstLabel = "1.";
+        for (std::size_t time = 0; time < passage.mAgain.size(); ++time) {
+            const std::string label = fmt::format("{}.", time + 2);
+            if (passage.mIsWhole[time]) {
+                firstLabel += " " + label;
+                continue;
+            }
+            const bool isLast = time + 1 == passage.mAgain.size();
+            const std::size_t end = isLast ? passage.mEnd : passage.mAgain[time + 1];
+            WriteEnding(passage.mAgain[time] + passage.mCommon, end, label, !isLast);
+        }
+        WriteEnding(passage.mBegin + passage.mCommon, last + 1, firstLabel, true);
+    }
+
+    void WriteEnding(std::size_t begin, std::size_t end, std::string label, bool goesBack) {
+        if (begin >= end || end > mBars.size()) return;
+        mBars[begin].mEnding = std::move(label);
+        for (std::size_t i = begin; i < end; ++i) mBars[i].mIsInEnding = true;
+        mBars[end - 1].mClosesEnding = goesBack;
+        if (goesBack) mBars[end - 1].mEndsRepeat = true;
+    }
+
+    void Remark(const CRepeat& repeat) {
+        if (repeat.mCount < 2) return;
+        const std::string& first = mBars[repeat.mSource].mNumber;
+        const std::string& last = mBars[repeat.mSource + repeat.mCount - 1].mNumber;
+        mBars[repeat.mAgain].mRemark = fmt::format("= bars {}\xE2\x80\x93{}", first, last);
+    }
+
+    const CSong& mSong;
+    CSheet& mSheet;
+    std::vector<CSheetBar>& mBars;
+    std::vector<bool> mIsHidden;
+};
+
+}  // namespace
+
+void FoldRepeats(const CSong& song, CSheet& sheet) {
+    if (!song.mRepeats.empty()) CFolding(song, sheet).Fold();
+}
+
+}  // namespace brindle::LeadSheet
