@@ -6,6 +6,7 @@
 #include "cli/Input.h"
 #include "cli/KeyText.h"
 #include "cli/LeadSheet.h"
+#include "cli/SheetPicture.h"
 #include "cli/SongCopies.h"
 #include "cli/SongKeys.h"
 #include "cli/TypedChords.h"
@@ -57,6 +58,7 @@ struct TAnalyseOptions {
     CTypedChords mReading;
     bool mReadings = false;
     bool mGrids = false;
+    CSheetPicture mSheetPicture;
     CFormatOptions mFormat;
 };
 
@@ -84,7 +86,7 @@ std::optional<std::string> Contradiction(const TAnalyseOptions& options) {
     if (options.mGrids && options.mFormat.Format() != TFormat::Svg) {
         return "--grids belong into a picture, --format svg";
     }
-    return std::nullopt;
+    return options.mSheetPicture.Contradiction();
 }
 
 /// A song that has been analysed, and what its presentations need beside that.
@@ -116,6 +118,23 @@ std::string Picture(const CShownSong& song, bool withGrids) {
     if (database == nullptr) return AnalysisSvg(song);
     const TChordGrids grids = GridsOfSong(*database, song);
     return AnalysisSvg(song, &grids);
+}
+
+// Readings and grids are drawn over the time axis alone.
+bool IsLeadSheet(const TAnalyseOptions& options) {
+    return options.mFormat.Format() == TFormat::Svg && !options.mSheetPicture.IsAxis() &&
+           !options.mReadings && !options.mGrids;
+}
+
+std::string LeadSheet(const TTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
+                      const TAnalyseOptions& options) {
+    TChordStringParse parse;
+    parse.mBeatsPerBar = options.mBeatsPerBar;
+    parse.mBeatsPerChord = options.mBeatsPerChord;
+    parse.mChordNamePrefs = NamePrefs();
+    const CSong song = options.mReading.ReadSource(typed.mText, parse);
+    return options.mSheetPicture.Draw(song,
+                                      signKeys.empty() ? CSignKeyLite{} : signKeys[0].mSignKey);
 }
 
 std::string Present(const TAnalysedSong& analysed, const TAnalyseOptions& options) {
@@ -203,6 +222,7 @@ TStatus Analyse(const TAnalyseOptions& options) {
     const TStatus status = typed->mIsScore ? AnalyseScore(*typed, signKeys, options, analysed)
                                            : AnalyseText(*typed, signKeys, options, analysed);
     if (status != TStatus::Success) return status;
+    if (IsLeadSheet(options)) return Print(LeadSheet(*typed, signKeys, options));
     if (options.mReadings) {
         analysed.mReadings =
             CAnalyseHarmCenterAlternatives(analysed.mAnalyse.mChords).BestResults();
@@ -227,6 +247,7 @@ void AddAnalyse(CCommand& program) {
     options->mReading.AddTo(command, "In what form the chord text is written");
     command.AddFlag("--grids", options->mGrids,
                     "Draw a guitar fingering under each chord of the picture");
+    options->mSheetPicture.AddTo(command);
     options->mFormat.AddTo(command, {"text", "json", "native", "svg"});
     command.OnCall([options] { return Analyse(*options); });
 }

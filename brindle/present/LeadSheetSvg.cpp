@@ -145,7 +145,8 @@ private:
                      CutToWidth(mSong.mTitle, InnerWidth() / kTitleSize), "ttl ink", "middle");
             y += kTitleSize + 8;
         }
-        const double half = InnerWidth() / 2 / kMakersSize - 1;
+        const bool sharesLine = !Style().empty() && !mSong.mMakers.empty();
+        const double half = InnerWidth() / kMakersSize / (sharesLine ? 2.0 : 1.0) - 1.0;
         if (!Style().empty()) {
             pen.Text(mLeft, y + kMakersSize - 2, kMakersSize, CutToWidth(Style(), half), "ita ink");
         }
@@ -180,16 +181,17 @@ private:
     std::vector<std::size_t> mPages;
 };
 
-// A song that fits two pages only if it is set smaller is set smaller.
+// A song that fits one page or two only if it is set smaller is set smaller.
 CSheetPages LayOut(const CSong& song, const CSongReading& reading,
                    const CLeadSheetOptions& options) {
-    constexpr std::size_t kMostPages = 2;
     CSheetPages pages(song, reading, options, 1.0);
-    constexpr std::size_t kTooMany = 3 * kMostPages;
-    if (pages.Count() <= kMostPages || pages.Count() > kTooMany) return pages;
-    for (const double scale : {0.875, 0.75}) {
+    // A little smaller for one page, more so for two; nothing makes two pages of seven.
+    if (pages.Count() == 1 || pages.Count() > 6) return pages;
+    const std::size_t most = pages.Count() == 2 ? 1 : 2;
+    for (const double scale : {0.875, 0.75, 0.67}) {
         CSheetPages smaller(song, reading, options, scale);
-        if (smaller.Count() <= kMostPages) return smaller;
+        if (smaller.Count() <= most) return smaller;
+        if (most == 1) break;
     }
     return pages;
 }

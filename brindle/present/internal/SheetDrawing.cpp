@@ -155,11 +155,12 @@ private:
         const CSheetBar& bar = BarOf(placed);
         const double y = mY + 2.5;
         const double end = mX + placed.End() - (bar.mClosesEnding ? 2.0 : 0.0);
-        mPen.Line(mX + placed.mX + 1, y, end, y, "bar");
+        const double begin = mX + placed.mX + (bar.mEnding.empty() ? 0.0 : 2.0);
+        mPen.Line(begin, y, end, y, "bar");
         if (bar.mClosesEnding && placed.mIsEnd) mPen.Line(end, y, end, y + 9, "bar");
         if (bar.mEnding.empty() || !placed.mIsBegin) return;
-        mPen.Line(mX + placed.mX + 1, y, mX + placed.mX + 1, y + 9, "bar");
-        mPen.Text(mX + placed.mX + 6, y + 10.5, kRemarkSize,
+        mPen.Line(begin, y, begin, y + 9, "bar");
+        mPen.Text(begin + 5, y + 10.5, kRemarkSize,
                   CutToWidth(bar.mEnding, (placed.mWidth - 8) / kRemarkSize), "num ink");
     }
 
@@ -208,7 +209,7 @@ private:
 
     // Whether the bar before holds one chord and nothing else, so that it can be told to go on.
     [[nodiscard]] bool IsSimple(std::size_t index) const {
-        if (index == 0) return false;
+        if (index == 0 || !mScore.mSheet.mBars[index].mEnding.empty()) return false;
         const CSheetBar& before = mScore.mSheet.mBars[index - 1];
         return before.mEnd - before.mBegin <= 1 && before.mBarCount == 1;
     }

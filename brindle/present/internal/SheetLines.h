@@ -65,8 +65,8 @@ struct CSheetLines {
 };
 
 /// Breaks the bars into lines of that width with at most so many bars. A line ends before a
-/// section; where bars are too full, a line is halved, so that phrases stay at their places. Chords
-/// lie in their bars as their beats do, and move aside where they would touch.
+/// section and before a jump; where bars are too full, a line is halved, so that phrases stay at
+/// their places. Chords lie in their bars as their beats do, and move aside where they would touch.
 [[nodiscard]] CSheetLines BreakLines(const CSheet& sheet, const std::vector<CChordTexts>& texts,
                                      double width, std::size_t barsPerLine);
 
@@ -75,7 +75,7 @@ struct CSheetLines {
 [[nodiscard]] double RightPadding(const CSheetBar& bar);
 
 /// Room for a time signature and for a repeat sign.
-inline constexpr double kTimeWidth = 17.0;
+inline constexpr double kTimeWidth = 20.0;
 inline constexpr double kRepeatWidth = 13.0;
 
 }  // namespace brindle::LeadSheet

@@ -66,10 +66,17 @@ CSheetLinks MakeLinks(const CSong& song, const CSongReading& reading, const CShe
         links[from] = {from, to > from ? to : kNone, isDotted};
     }
     CSheetLinks drawn;
+    std::vector<std::size_t> lastSource(count, kNone);
+    const auto isArrow = [&](std::size_t chord) {
+        return kinds[chord] == TLink::Arrow || kinds[chord] == TLink::DottedArrow;
+    };
     for (std::size_t i = 0; i < count; ++i) {
-        const bool isArrow = kinds[i] == TLink::Arrow || kinds[i] == TLink::DottedArrow;
-        if (isArrow) {
-            drawn.mArrows.push_back(links[i]);
+        if (isArrow(i) && links[i].mTo != kNone) lastSource[links[i].mTo] = i;
+    }
+    for (std::size_t i = 0; i < count; ++i) {
+        if (isArrow(i)) {
+            const bool isLast = links[i].mTo == kNone || lastSource[links[i].mTo] == i;
+            if (isLast) drawn.mArrows.push_back(links[i]);
         } else if (kinds[i] != TLink::None && links[i].mTo != kNone) {
             drawn.mBrackets.push_back(links[i]);
         }

@@ -27,8 +27,8 @@ struct CSheetLinks {
     std::vector<CSheetLink> mBrackets;
 };
 
-/// The links between chords that are drawn, in their order. Of a chord that is written several
-/// times in a row the last one leads on. A passage that is drawn once for several times leads where
+/// The links between chords that are drawn, in their order. Of the chords that lead to the same
+/// chord the last one has the arrow. A passage that is drawn once for several times leads where
 /// it leads the first time that this is not back.
 [[nodiscard]] CSheetLinks MakeLinks(const CSong& song, const CSongReading& reading,
                                     const CSheet& sheet);

@@ -95,7 +95,8 @@ private:
         const CSignKeyLite& key = reading.mChords[chord.mChord].mKey;
         if (key.mRootKeyEnh.IsUndef() || key == keys.back().mKey) return;
         const bool isFirst = chord.mChord == bar.mChords.front().mChord;
-        const double x = isFirst ? bar.mX : chord.mX - kLevelGap;
+        const bool isFirstKey = keys.back().mKey.mRootKeyEnh.IsUndef();
+        const double x = isFirstKey ? 0.0 : isFirst ? bar.mX : chord.mX - kLevelGap;
         keys.back().mEnd = x;
         if (keys.back().mEnd <= keys.back().mBegin) keys.pop_back();
         keys.push_back({x, x, key, true});

@@ -34,7 +34,7 @@ constexpr std::string_view kMinus = "\xE2\x88\x92";
 // Nobody reads a longer symbol.
 constexpr std::size_t kMostCharacters = 24;
 
-constexpr double kAccidentalSize = 0.85;
+constexpr double kAccidentalSize = 0.95;
 constexpr double kAccidentalRaise = 0.1;
 constexpr double kMarkSize = 0.82;
 constexpr double kFigureSize = 0.66;
@@ -153,6 +153,12 @@ std::string Shortened(std::string_view text) {
     return FirstCharacters(printable, kMostCharacters - 1) + std::string(kEllipsis);
 }
 
+// The figures of a numeral: a major seventh is written in words.
+std::string NumeralFigures(std::string_view text) {
+    if (TakeWord(text, "^")) return "maj" + Figures(text);
+    return Figures(text);
+}
+
 // The letters of a degree, or the name of a sixth chord.
 std::string TakeDegree(std::string_view& text) {
     for (const std::string_view name : {"Ger", "It", "Fr", "Cad", "N"}) {
@@ -171,7 +177,7 @@ void AddNumeralPart(CTextRuns& runs, std::string_view part) {
     const std::string degree = TakeDegree(part);
     Add(runs, degree);
     const bool isFigures = !degree.empty();
-    Add(runs, Figures(part), isFigures ? kFigureSize : 1.0, isFigures ? kFigureRaise : 0.0);
+    Add(runs, NumeralFigures(part), isFigures ? kFigureSize : 1.0, isFigures ? kFigureRaise : 0.0);
 }
 
 }  // namespace

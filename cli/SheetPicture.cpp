@@ -1,0 +1,43 @@
+// SPDX-License-Identifier: MIT
+#include "cli/SheetPicture.h"
+
+#include "cli/CCommand.h"
+
+#include "brindle/analysis/ReadHarmony.h"
+#include "brindle/song/CSong.h"
+
+namespace brindle::cli {
+
+void CSheetPicture::AddTo(CCommand& command) {
+    command.AddChoice("--picture", mPicture, {"sheet", "axis"},
+                      "Draw a lead sheet, or a time axis with the centers");
+    command.AddOption("--bars-per-line", "N", mOptions.mBarsPerLine,
+                      "Bars on a line of the lead sheet (default: 4)");
+    command.AddOption("--width", "PIXELS", mOptions.mWidth,
+                      "Width of an endless lead sheet (default: 800)");
+    command.AddChoice("--page", mPage, {"endless", "a4"}, "Paper of the lead sheet");
+    command.AddChoice("--theme", mTheme, {"auto", "light", "dark"},
+                      "Colors of the lead sheet; auto are those that the viewer prefers");
+}
+
+std::optional<std::string> CSheetPicture::Contradiction() const {
+    if (mOptions.mBarsPerLine < 1 || mOptions.mBarsPerLine > 16) {
+        return "--bars-per-line takes 1 to 16 bars";
+    }
+    if (!(mOptions.mWidth >= 200.0 && mOptions.mWidth <= 4000.0)) {
+        return "--width takes 200 to 4000 pixels";
+    }
+    return std::nullopt;
+}
+
+std::string CSheetPicture::Draw(const CSong& song, const CSignKeyLite& key) const {
+    CReadingOptions reading;
+    reading.mKeys.mBeatsPerBar = song.mBeatsPerBar;
+    reading.mStatedKey = key;
+    CLeadSheetOptions options = mOptions;
+    options.mPage = mPage == "a4" ? TSheetPage_A4 : TSheetPage_Endless;
+    if (mTheme != "auto") options.mTheme = mTheme == "dark" ? TSheetTheme_Dark : TSheetTheme_Light;
+    return LeadSheetSvg(song, ReadHarmony(song.mChords, reading), options);
+}
+
+}  // namespace brindle::cli

@@ -1,0 +1,40 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/present/LeadSheetSvg.h"
+
+#include <optional>
+#include <string>
+
+namespace brindle {
+struct CSignKeyLite;
+struct CSong;
+}  // namespace brindle
+
+namespace brindle::cli {
+
+class CCommand;
+
+/// The options --picture, --bars-per-line, --width, --page and --theme, and the lead sheet that
+/// they ask for.
+class CSheetPicture {
+public:
+    void AddTo(CCommand& command);
+
+    /// What is wrong with the options.
+    [[nodiscard]] std::optional<std::string> Contradiction() const;
+
+    /// Whether the time axis with the centers is wanted instead.
+    [[nodiscard]] bool IsAxis() const { return mPicture == "axis"; }
+
+    /// The picture of a song; `key` is undefined, or holds in place of what the song states.
+    [[nodiscard]] std::string Draw(const CSong& song, const CSignKeyLite& key) const;
+
+private:
+    std::string mPicture = "sheet";
+    std::string mPage = "endless";
+    std::string mTheme = "auto";
+    CLeadSheetOptions mOptions;
+};
+
+}  // namespace brindle::cli
