@@ -122,7 +122,7 @@ void WriteScore(CJsonWriter& json, const TMusicXMLDoc& sheet) {
 
 std::string AnalysisJson(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings,
                          const TSymbolOfChord& symbolOf, const CShownKeys& keys,
-                         const TMusicXMLDoc* sheet) {
+                         const TMusicXMLDoc* sheet, const CReadSong* song) {
     CJsonWriter json;
     CAnalysisWriter writer(json, symbolOf);
     json.BeginObject();
@@ -134,6 +134,7 @@ std::string AnalysisJson(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters
         writer.WriteList(*readings);
     }
     WriteKeys(json, keys);
+    if (song != nullptr) WriteReading(json, *song);
     json.EndObject();
     return std::move(json).Text();
 }

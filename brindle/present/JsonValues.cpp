@@ -62,6 +62,16 @@ Json KeyEnhsToJson(const std::vector<CKeyEnh>& keys) {
     return list;
 }
 
+void WriteSignKey(CJsonWriter& json, const CSignKeyLite& key) {
+    if (key.IsUndef()) {
+        json.Null();
+        return;
+    }
+    json.BeginObject().Key("Name").String(key.NameLong(NamePrefs()));
+    WriteKeyEnh(json.Key("CKeyEnh"), key.mRootKeyEnh);
+    json.Key("Type").String(JSONWord(key.mSignKeyType)).EndObject();
+}
+
 void WriteIntervals(CJsonWriter& json, CSemitones semitones) {
     json.BeginArray();
     for (int intvl = 0; intvl < 12; ++intvl) {

@@ -4,6 +4,7 @@
 #include "brindle/present/CJsonWriter.h"
 #include "brindle/theory/CKeyEnh.h"
 #include "brindle/theory/CSemitones.h"
+#include "brindle/theory/CSignKeyLite.h"
 
 #include <nlohmann/json_fwd.hpp>
 #include <string>
@@ -21,6 +22,9 @@ using Json = nlohmann::ordered_json;
 void WriteKeyEnh(CJsonWriter& json, const CKeyEnh& keyEnh);
 [[nodiscard]] Json KeyEnhToJson(const CKeyEnh& keyEnh);
 [[nodiscard]] Json KeyEnhsToJson(const std::vector<CKeyEnh>& keys);
+
+/// Name, root and type; null for the undefined key.
+void WriteSignKey(CJsonWriter& json, const CSignKeyLite& key);
 
 /// The semitones of a mask in ascending order.
 void WriteIntervals(CJsonWriter& json, CSemitones semitones);

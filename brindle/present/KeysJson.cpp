@@ -9,16 +9,6 @@
 namespace brindle {
 namespace {
 
-void WriteSignKey(CJsonWriter& json, const CSignKeyLite& key) {
-    if (key.IsUndef()) {
-        json.Null();
-        return;
-    }
-    json.BeginObject().Key("Name").String(key.NameLong(NamePrefs()));
-    WriteKeyEnh(json.Key("CKeyEnh"), key.mRootKeyEnh);
-    json.Key("Type").String(JSONWord(key.mSignKeyType)).EndObject();
-}
-
 // The object is left open for the points.
 void BeginKeyOfSong(CJsonWriter& json, const CShownKeys& keys) {
     json.Key("KeyOfSong").BeginObject();
@@ -59,13 +49,14 @@ void WriteRegions(CJsonWriter& json, const CShownKeys& keys) {
 
 }  // namespace
 
-std::string KeysJson(const CShownKeys& keys) {
+std::string KeysJson(const CShownKeys& keys, const CReadSong* song) {
     CJsonWriter json;
     json.BeginObject();
     BeginKeyOfSong(json, keys);
     WriteScores(json, keys);
     json.EndObject();
     WriteRegions(json, keys);
+    if (song != nullptr) WriteReading(json, *song);
     json.EndObject();
     return std::move(json).Text();
 }

@@ -1,0 +1,173 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/present/ReadingText.h"
+
+#include "brindle/present/CTable.h"
+#include "brindle/present/ShownNames.h"
+#include "brindle/present/ShownText.h"
+#include "brindle/present/internal/ReadingBars.h"
+#include "brindle/present/internal/ReadingLines.h"
+#include "brindle/present/internal/ReadingNotes.h"
+
+#include <fmt/format.h>
+
+#include <algorithm>
+
+namespace brindle {
+namespace {
+
+std::string KeyDetails(const CSong& song, const CSongReading& reading) {
+    std::string text;
+    const bool isStated = song.mStatedKey && *song.mStatedKey == reading.mKey;
+    if (isStated) text += ", as stated";
+    if (reading.mConfidence != kPosUndef) {
+        text += fmt::format(", {} (confidence {:.2f})", ConfidenceInWords(reading.mConfidence),
+                            reading.mConfidence);
+    }
+    return text;
+}
+
+/// "32 bars of 3/4"; the time only where all bars have one.
+std::string BarsText(const CSong& song) {
+    if (song.mBars.empty()) return {};
+    std::string text = song.mBars.size() == 1 ? "1 bar" : fmt::format("{} bars", song.mBars.size());
+    const CSongTime& time = song.mBars.front().mTime;
+    const bool isOneTime = std::all_of(song.mBars.begin(), song.mBars.end(),
+                                       [&](const CSongBar& bar) { return bar.mTime == time; });
+    if (isOneTime && !time.IsUndef()) {
+        text += fmt::format(" of {}/{}", time.mNumerator, time.mDenominator);
+    }
+    return text;
+}
+
+std::string Head(const CSong& song, const CSongReading& reading, const CPaint& paint) {
+    std::string text;
+    if (!song.mTitle.empty()) text += paint.Strong(Printable(song.mTitle)) + '\n';
+    if (!song.mMakers.empty()) text += paint.Faint(Printable(song.mMakers)) + '\n';
+    const std::string bars = BarsText(song);
+    if (!bars.empty()) text += paint.Faint(bars) + '\n';
+    if (!text.empty()) text += '\n';
+    if (reading.mKey.IsUndef()) return text + paint.Strong("No key: no chords") + '\n';
+    text += paint.Strong("Key of the song " + reading.mKey.NameLong(NamePrefs())) +
+            paint.Faint(KeyDetails(song, reading)) + '\n';
+    for (const std::string& line : KeyContradictions(song, reading)) text += line + '\n';
+    return text;
+}
+
+/// Where a chord stands, as the first two cells of a line; the bar only where it begins.
+class CPlaceCells {
+public:
+    explicit CPlaceCells(const CBars& bars) : mBars(bars) {}
+
+    [[nodiscard]] std::string Bar(double position) {
+        const long bar = mBars.BarOf(position);
+        const bool isSame = bar == mBarBefore;
+        mBarBefore = bar;
+        return isSame ? "" : fmt::format("{}", bar);
+    }
+    [[nodiscard]] std::string Beat(double position) const {
+        return ShortNumber(mBars.BeatOf(position));
+    }
+
+private:
+    const CBars& mBars;
+    long mBarBefore = 0;
+};
+
+std::string LongTable(const CSong& song, const CSongReading& reading, const CBars& bars,
+                      std::span<const std::string> numerals, const CPaint& paint) {
+    CTable table(
+        {" bar", " beat", "chord", "key", "numeral", "function", "relation", "resolves to"});
+    CPlaceCells place(bars);
+    for (std::size_t ix = 0; ix < ChordCountOf(song); ++ix) {
+        const CChordReading& chord = reading.mChords[ix];
+        const double position = song.mChords[ix].mPosition;
+        const auto target = static_cast<std::size_t>(chord.mResolvesTo);
+        const bool isLed = chord.mResolvesTo >= 0 && target < song.mSymbols.size();
+        const bool isChord = !chord.mKey.IsUndef();
+        table.AddRow(
+            {place.Bar(position), place.Beat(position),
+             ix < song.mSymbols.size() ? Printable(song.mSymbols[ix]) : "",
+             isChord ? chord.mKey.NameShort(NamePrefs()) : "-",
+             numerals[ix].empty() ? "-" : numerals[ix], std::string(NameOf(chord.mFunction)),
+             chord.mRelation == TChordRelation_None ? "" : std::string(NameOf(chord.mRelation)),
+             isLed ? Printable(song.mSymbols[target]) : ""});
+    }
+    return table.Text(paint);
+}
+
+/// "bars 13 to 21 repeat bars 1 to 9".
+std::string RepeatText(const CRepeatedBars& repeat) {
+    const auto bars = [&](long first) {
+        return repeat.mCount == 1 ? fmt::format("bar {}", first)
+                                  : fmt::format("bars {} to {}", first, first + repeat.mCount - 1);
+    };
+    return fmt::format("{} {} {}", bars(repeat.mFirst), repeat.mCount == 1 ? "repeats" : "repeat",
+                       bars(repeat.mSource));
+}
+
+void AppendParagraph(std::string& text, std::string_view head,
+                     const std::vector<std::string>& lines, const CPaint& paint) {
+    if (lines.empty()) return;
+    text += '\n' + paint.Accent(head) + '\n';
+    for (const std::string& line : lines) text += "  " + Printable(line) + '\n';
+}
+
+std::vector<std::string> NumeralsOf(const CSongReading& reading,
+                                    const CReadingTextOptions& options) {
+    std::vector<std::string> numerals(options.mNumerals.begin(), options.mNumerals.end());
+    numerals.resize(std::max(numerals.size(), reading.mChords.size()));
+    if (!options.mNumerals.empty()) return numerals;
+    for (std::size_t ix = 0; ix < reading.mChords.size(); ++ix) {
+        numerals[ix] = reading.mChords[ix].mNumeral;
+    }
+    return numerals;
+}
+
+}  // namespace
+
+std::string_view ConfidenceInWords(double confidence) {
+    if (confidence >= 0.9) return "clear";
+    if (confidence >= 0.7) return "likely";
+    if (confidence >= 0.5) return "doubtful";
+    return "hardly shown by the chords";
+}
+
+std::string ReadingText(const CSong& song, const CSongReading& reading,
+                        const CReadingTextOptions& options, const CPaint& paint) {
+    std::string text = Head(song, reading, paint);
+    if (reading.mKey.IsUndef()) return text;
+    const CBars bars = BarsOfSong(song);
+    const std::vector<CReadingBar> readingBars = ReadingBarsOf(song, bars);
+    const std::vector<std::string> numerals = NumeralsOf(reading, options);
+    text += '\n';
+    text += options.mIsLong
+                ? LongTable(song, reading, bars, numerals, paint)
+                : ReadingLines(song, reading, {readingBars, numerals, options.mWidth}, paint);
+    std::vector<std::string> repeats;
+    for (const CRepeatedBars& repeat : RepeatedBarsOf(song, bars, readingBars)) {
+        repeats.push_back(RepeatText(repeat));
+    }
+    AppendParagraph(text, "Repeats", repeats, paint);
+    AppendParagraph(text, "Notes", ReadingNotes(song, reading, bars), paint);
+    return text;
+}
+
+std::string RegionsText(const CSong& song, const CSongReading& reading,
+                        const CReadingTextOptions& options, const CPaint& paint) {
+    std::string text = Head(song, reading, paint);
+    if (reading.mRegions.empty()) return text;
+    const CBars bars = BarsOfSong(song);
+    const std::vector<std::string> numerals = NumeralsOf(reading, options);
+    CTable table({"key", "where", "numerals"});
+    for (const CKeyRegion& region : reading.mRegions) {
+        std::vector<std::string> words;
+        for (std::size_t ix = region.mBegin; ix < region.mEnd; ++ix) {
+            if (!numerals[ix].empty()) words.push_back(numerals[ix]);
+        }
+        table.AddRow({region.mKey.NameLong(NamePrefs()),
+                      BarsOf({region.mPosition, region.mEndPosition}, bars), FirstAndLast(words)});
+    }
+    return text + '\n' + table.Text(paint, "  ");
+}
+
+}  // namespace brindle

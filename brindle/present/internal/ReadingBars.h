@@ -1,0 +1,47 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/present/CBars.h"
+#include "brindle/song/CSong.h"
+
+#include <cstddef>
+#include <vector>
+
+namespace brindle {
+
+/// A bar of a song and the chords that begin in it, or a long row of bars in which none does.
+struct CReadingBar {
+    /// Counted from 1, as played.
+    long mNumber = 1;
+    long mCount = 1;
+    /// The chords [mBegin, mEnd) of the song.
+    std::size_t mBegin = 0;
+    std::size_t mEnd = 0;
+
+    [[nodiscard]] bool HasChords() const { return mBegin < mEnd; }
+};
+
+/// How the bars of a song are counted.
+[[nodiscard]] CBars BarsOfSong(const CSong& song);
+
+/// From the first bar to the one in which the last chord ends. What has no place in time is left
+/// out.
+[[nodiscard]] std::vector<CReadingBar> ReadingBarsOf(const CSong& song, const CBars& bars);
+
+/// The number of chords without the end marker.
+[[nodiscard]] std::size_t ChordCountOf(const CSong& song);
+
+/// Bars that are the same as earlier ones.
+struct CRepeatedBars {
+    /// Numbers of bars.
+    long mFirst = 1;
+    long mSource = 1;
+    long mCount = 0;
+};
+
+/// Passages of whole bars that repeat earlier ones, each as long as it goes and of the earliest
+/// source; in the order of time, without overlaps. Bars that only hold one chord are no passage.
+[[nodiscard]] std::vector<CRepeatedBars> RepeatedBarsOf(
+    const CSong& song, const CBars& bars, const std::vector<CReadingBar>& readingBars);
+
+}  // namespace brindle

@@ -1,0 +1,27 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/analysis/ReadHarmony.h"
+#include "brindle/present/CPaint.h"
+#include "brindle/present/internal/ReadingBars.h"
+
+#include <span>
+#include <string>
+
+namespace brindle {
+
+/// What lines of bars are made of.
+struct CReadingLines {
+    std::span<const CReadingBar> mBars;
+    /// One for each chord.
+    std::span<const std::string> mNumerals;
+    std::size_t mWidth = 80;
+};
+
+/// The bars of a song, four a line, two or one: the chords, the numerals below, and above the names
+/// of the keys where they begin. A part of the song begins a new line, an upbeat has one for
+/// itself.
+[[nodiscard]] std::string ReadingLines(const CSong& song, const CSongReading& reading,
+                                       const CReadingLines& lines, const CPaint& paint);
+
+}  // namespace brindle

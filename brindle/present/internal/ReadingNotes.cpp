@@ -1,0 +1,207 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/present/internal/ReadingNotes.h"
+
+#include "brindle/present/ShownNames.h"
+#include "brindle/present/internal/CChordsAround.h"
+#include "brindle/present/internal/ReadingBars.h"
+#include "brindle/theory/KeyIntervals.h"
+
+#include <fmt/format.h>
+
+#include <map>
+#include <utility>
+
+namespace brindle {
+namespace {
+
+constexpr std::size_t kMostPlaces = 6;
+/// Dominants in a row that are worth a word.
+constexpr std::size_t kShortestChain = 3;
+
+/// What was noted, and all its places.
+struct TNote {
+    std::string mText;
+    std::vector<CTimeRange> mPlaces;
+};
+
+std::string PlacesText(const std::vector<CTimeRange>& places, const CBars& bars) {
+    std::string text;
+    for (std::size_t i = 0; i < places.size() && i < kMostPlaces; ++i) {
+        if (i > 0) text += ", ";
+        text += BarsOf(places[i], bars);
+    }
+    if (places.size() > kMostPlaces) {
+        text += fmt::format(" and {} more", places.size() - kMostPlaces);
+    }
+    return text;
+}
+
+bool IsDominant(const CChordReading& reading) {
+    return reading.mRelation == TChordRelation_Dominant ||
+           reading.mRelation == TChordRelation_SubstituteDominant;
+}
+
+class CNoteTaker {
+public:
+    CNoteTaker(const CSong& song, const CSongReading& reading)
+        : mSong(song), mReading(reading), mAround(song, reading) {}
+
+    [[nodiscard]] std::vector<TNote> TakeNotes() {
+        for (std::size_t ix = 0; ix < mReading.mChords.size(); ++ix) {
+            if (!mAround.HasChord(ix) || mAround.IsRepeated(ix)) continue;
+            NoteSecond(ix);
+            NoteChain(ix);
+            NoteColor(ix);
+        }
+        return std::move(mNotes);
+    }
+
+private:
+    [[nodiscard]] const CChordReading& At(std::ptrdiff_t ix) const {
+        return mReading.mChords[static_cast<std::size_t>(ix)];
+    }
+    [[nodiscard]] std::string Symbol(std::size_t ix) const {
+        return mAround.Symbol(static_cast<std::ptrdiff_t>(ix));
+    }
+
+    // From the bar of one chord to the bar in which another begins.
+    void Note(std::string text, std::size_t first, std::size_t last) {
+        constexpr double barely = 1e-6;
+        const CTimeRange place{mSong.mChords[first].mPosition,
+                               mSong.mChords[last].mPosition + barely};
+        const auto [known, isNew] = mNumbers.try_emplace(text, mNotes.size());
+        if (isNew) mNotes.push_back({std::move(text), {}});
+        mNotes[known->second].mPlaces.push_back(place);
+    }
+
+    // ii V I, of which the I may be missing.
+    void NoteSecond(std::size_t ix) {
+        const CChordReading& second = mReading.mChords[ix];
+        const std::ptrdiff_t dominant = second.mResolvesTo;
+        if (second.mRelation != TChordRelation_RelatedSecond || dominant < 0) return;
+        const CSignKeyLite key = ServedKey(second);
+        const int up = mAround.Root(static_cast<std::ptrdiff_t>(ix)) - key.mRootKeyEnh.mKeyNr;
+        if (!IsDominant(At(dominant)) || FoldIntoOctave(up) != 2) return;
+        const bool isSubstitute = At(dominant).mRelation == TChordRelation_SubstituteDominant;
+        std::string text = isSubstitute ? "ii subV" : "ii V";
+        std::ptrdiff_t last = dominant;
+        const std::ptrdiff_t goal = At(dominant).mResolvesTo;
+        const bool arrives = goal >= 0 && !IsDominant(At(goal)) &&
+                             mAround.Root(goal) == FoldIntoOctave(key.mRootKeyEnh.mKeyNr);
+        if (arrives) {
+            text += key.mSignKeyType == TSignKeyType_Minor ? " i" : " I";
+            last = goal;
+        }
+        Note(text + " of " + key.NameLong(NamePrefs()), ix, static_cast<std::size_t>(last));
+    }
+
+    // E7 A7 D7 G7: told where it begins, so that each chord is looked at once.
+    void NoteChain(std::size_t ix) {
+        if (ix < mChainEnd || !IsDominant(mReading.mChords[ix])) return;
+        std::string text = Symbol(ix);
+        std::size_t count = 1;
+        std::size_t last = ix;
+        for (std::ptrdiff_t next = NextInChain(last); next >= 0; next = NextInChain(last)) {
+            last = static_cast<std::size_t>(next);
+            if (++count <= 2 * kMostPlaces) text += ' ' + Symbol(last);
+        }
+        mChainEnd = last + 1;
+        if (count < kShortestChain) return;
+        if (count > 2 * kMostPlaces) text += " ...";
+        Note(text + ": each the dominant of the next", ix, last);
+    }
+
+    [[nodiscard]] std::ptrdiff_t NextInChain(std::size_t ix) const {
+        const std::ptrdiff_t next = mAround.Next(ix);
+        const bool isIn = next >= 0 && mReading.mChords[ix].mResolvesTo == next &&
+                          IsDominant(At(next)) &&
+                          mAround.Root(next) != mReading.mKey.mRootKeyEnh.mKeyNr;
+        return isIn ? next : kNoneAround;
+    }
+
+    void NoteColor(std::size_t ix) {
+        const CChordReading& chord = mReading.mChords[ix];
+        if (chord.mDeceptive) {
+            const std::ptrdiff_t next = mAround.Next(ix);
+            Note("deceptive cadence to " + mAround.Symbol(next), ix,
+                 next < 0 ? ix : static_cast<std::size_t>(next));
+        }
+        const std::string text = ColorOf(chord);
+        if (!text.empty()) Note(Symbol(ix) + ' ' + text, ix, ix);
+    }
+
+    [[nodiscard]] static std::string ColorOf(const CChordReading& chord) {
+        const std::string key = chord.mKey.NameLong(NamePrefs());
+        switch (chord.mRelation) {
+            case TChordRelation_Borrowed:
+                return "is borrowed from " + ParallelName(chord.mKey);
+            case TChordRelation_SubstituteDominant:
+                return "is a substitute dominant, " + chord.mNumeral + " of " + key;
+            case TChordRelation_Backdoor:
+                return chord.mFunction == THarmFunction_Dominant
+                           ? "is the backdoor dominant of " + key
+                           : std::string();
+            case TChordRelation_Neapolitan:
+            case TChordRelation_AugmentedSixth:
+                return "is " + chord.mNumeral + " of " + key;
+            case TChordRelation_Blues:
+                return "has the seventh of the blues";
+            default:
+                return {};
+        }
+    }
+
+    [[nodiscard]] static std::string ParallelName(CSignKeyLite key) {
+        const bool isMinor = key.mSignKeyType == TSignKeyType_Minor;
+        key.mSignKeyType = isMinor ? TSignKeyType_Major : TSignKeyType_Minor;
+        return key.NameLong(NamePrefs());
+    }
+
+    const CSong& mSong;
+    const CSongReading& mReading;
+    CChordsAround mAround;
+    std::vector<TNote> mNotes;
+    std::map<std::string, std::size_t> mNumbers;
+    std::size_t mChainEnd = 0;
+};
+
+bool SoundsAlike(const CSignKeyLite& a, const CSignKeyLite& b) {
+    return a.mRootKeyEnh.mKeyNr == b.mRootKeyEnh.mKeyNr && a.mSignKeyType == b.mSignKeyType;
+}
+
+}  // namespace
+
+std::vector<std::string> ReadingNotes(const CSong& song, const CSongReading& reading,
+                                      const CBars& bars) {
+    std::vector<std::string> lines;
+    for (const TNote& note : CNoteTaker(song, reading).TakeNotes()) {
+        lines.push_back(PlacesText(note.mPlaces, bars) + ": " + note.mText);
+    }
+    return lines;
+}
+
+std::vector<std::string> KeyContradictions(const CSong& song, const CSongReading& reading) {
+    std::vector<std::string> lines;
+    if (reading.mKey.IsUndef()) return lines;
+    const CSignKeyLite found = FindKeys(song.mChords, {.mBeatsPerBar = song.mBeatsPerBar}).mKey;
+    const std::string read = reading.mKey.NameLong(NamePrefs());
+    const std::string shown = found.NameLong(NamePrefs());
+    const bool isFound = SoundsAlike(found, reading.mKey);
+    const bool isStated = song.mStatedKey && !song.mStatedKey->IsUndef();
+    if (isStated && !SoundsAlike(*song.mStatedKey, reading.mKey)) {
+        lines.push_back(fmt::format("The stated key is {}, but the chords show {}.",
+                                    song.mStatedKey->NameLong(NamePrefs()), read));
+    }
+    if (isFound) return lines;
+    if (isStated && SoundsAlike(*song.mStatedKey, reading.mKey)) {
+        lines.push_back(
+            fmt::format("{} is the stated key; the chords alone would show {}.", read, shown));
+    } else {
+        lines.push_back(fmt::format(
+            "Counted one by one the chords are in {}; what they circle around makes it {}.", shown,
+            read));
+    }
+    return lines;
+}
+
+}  // namespace brindle
