@@ -45,8 +45,6 @@ constexpr auto kWholeChordRows = std::to_array<TSuffixRow>({
     {Tones(0, 4, 8), "aug"},
     {Tones(0, 7), "5"},
     {Tones(0, 2, 5, 7), "sus24"},
-    {Tones(0, 2, 4, 7, 9), "69"},
-    {Tones(0, 2, 3, 7, 9), "m69"},
 });
 
 struct TNumberRow {
@@ -67,6 +65,7 @@ constexpr auto kNumberRows = std::to_array<TNumberRow>({
     {Tones(2, 5, 11), "maj11"},
     {Tones(2, 11), "maj9"},
     {Tones(11), "maj7"},
+    {Tones(2, 9), "69"},
     {Tones(9), "6"},
 });
 

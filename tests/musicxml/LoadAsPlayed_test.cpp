@@ -243,6 +243,9 @@ TEST_CASE("Kinds in other words are put into the words of the library") {
          "<degree-type>add</degree-type></degree>",
          "pedal +5"},
         {"<kind text='N.C.'>none</kind>", "none"},
+        {"<kind>augmented-ninth</kind>", "augmented-seventh +add 9"},
+        {"<kind text='9+'>augmented-ninth</kind>", "augmented-seventh +add 9"},
+        {"<kind text='9+'>other</kind>", "augmented-seventh +add 9"},
     };
     for (const TRow& row : rows) {
         INFO(row.mXml);

@@ -49,8 +49,8 @@ TEST_CASE("A letter a tritone away from the usual string is tuned down to") {
     };
     const TCase cases[] = {
         {"EADGBE", "E2 A2 D3 G3 B3 E4"},        {"DADGAD", "D2 A2 D3 G3 A3 D4"},
-        {"BbADGBE", "Bb1 A2 D3 G3 B3 E4"},      {"EEbDGBE", "E2 Eb2 D3 G3 B3 E4"},
-        {"E\u266DADGBE", "Eb2 A2 D3 G3 B3 E4"}, {"GDAE", "G2 D3 A3 E4"},
+        {"BbADGBE", "Bb1 A2 D3 G3 B3 E4"},      {"EEbDGBE", "E2 D#2 D3 G3 B3 E4"},
+        {"E\u266DADGBE", "D#2 A2 D3 G3 B3 E4"}, {"GDAE", "G2 D3 A3 E4"},
     };
     for (const auto& [text, tuning] : cases) {
         INFO(text);

@@ -31,6 +31,7 @@ MORE_COMMANDS = [
     'analyse "" --json',
     "harmonies examples/scores/beautiful-dreamer.musicxml --json",
     "harmonies --from-notes examples/scores/prelude-in-c.musicxml --json",
+    'key "F# minor" --json',
     "grid x02210 --json",
     "grid Am --json",
     "grids list --json",
@@ -134,7 +135,7 @@ def values_of(text, name):
 
 
 def main():
-    program, source = sys.argv[1], pathlib.Path(sys.argv[2])
+    program, source = map(pathlib.Path.resolve, map(pathlib.Path, sys.argv[1:3]))
     schemas = Schemas(source / "docs/schema")
     faults = [f"not noticed: {json.dumps(fault)}" for fault in planted_faults_pass(schemas)]
     schemas.used.clear()
