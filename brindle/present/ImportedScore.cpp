@@ -11,6 +11,8 @@
 
 #include <algorithm>
 #include <array>
+#include <map>
+#include <memory>
 #include <string_view>
 
 namespace brindle {
@@ -77,14 +79,12 @@ public:
         std::swap(imported.mEvents, mScore->mEventsBeforePart);
         imported.mID = part.mID;
         imported.mName = part.FindBestPartName();
-        for (const CMuxmlScoreInstrument& instrument : part.mScoreInstruments) {
-            const XmlNode scorePart = instrument.mXML.parent();
-            if (scorePart.attribute("id") != part.mID) continue;
-            imported.mProgram = MidiNumber(scorePart, "midi-program");
-            imported.mChannel = MidiNumber(scorePart, "midi-channel");
-            ReadInstruments(scorePart, imported);
-            break;
-        }
+        if (mScoreParts->empty()) ReadScoreParts(part);
+        const auto scorePart = mScoreParts->find(part.mID);
+        if (scorePart == mScoreParts->end()) return;
+        imported.mProgram = MidiNumber(scorePart->second, "midi-program");
+        imported.mChannel = MidiNumber(scorePart->second, "midi-channel");
+        ReadInstruments(scorePart->second, imported);
     }
 
     void Add(std::int32_t position, std::string what) const {
@@ -159,6 +159,16 @@ private:
         return mScore->mParts.size() == (mScore->mIsInPart ? 1U : 0U);
     }
 
+    // The list of parts, once for all of them; of equal identifiers the first counts. The
+    // instruments that an import tells are only those whose identifiers begin as that of their
+    // part.
+    void ReadScoreParts(const CMuxmlPart& part) const {
+        for (const XmlNode& entry : part.mPartXML.parent().child("part-list").children()) {
+            if (entry.name() != "score-part") continue;
+            mScoreParts->try_emplace(entry.attribute("id").value_or(""), entry);
+        }
+    }
+
     static void ReadInstruments(const XmlNode& scorePart, CImportedPart& part) {
         for (const XmlNode& midi : scorePart.descendants("midi-instrument")) {
             part.mInstruments.insert_or_assign(
@@ -186,6 +196,8 @@ private:
     }
 
     CImportedScore* mScore;
+    std::shared_ptr<std::map<std::string, XmlNode>> mScoreParts =
+        std::make_shared<std::map<std::string, XmlNode>>();
 };
 
 }  // namespace

@@ -31,7 +31,7 @@ std::string LaidOut(const Json& json, std::size_t indent) {
 }
 
 Json RandomJson(std::mt19937& random, int depth) {
-    const auto below = [&](unsigned limit) { return random() % limit; };
+    const auto below = [&](unsigned limit) { return static_cast<unsigned>(random() % limit); };
     switch (depth == 0 ? below(5) : below(9)) {
         case 0:
             return nullptr;
