@@ -29,6 +29,7 @@ constexpr double kFooter = 34.0;
 constexpr double kPrintMargin = 18.0;
 
 constexpr double kTitleSize = 25.0;
+constexpr double kSmallestTitleSize = 16.0;
 constexpr double kMakersSize = 13.0;
 
 // A bar that is narrower is hard to read.
@@ -131,7 +132,7 @@ private:
             y += height;
         }
         if (mScore.mLines.mLines.empty()) y += 40.0;
-        if (!mIsA4) mHeight = y + Bottom();
+        if (!mIsA4) mHeight = std::ceil(y + Bottom());
     }
 
     [[nodiscard]] std::size_t EndOf(std::size_t page) const {
@@ -141,8 +142,10 @@ private:
     void DrawHead(CSheetPen& pen) const {
         double y = Top();
         if (!mSong.mTitle.empty()) {
-            pen.Text(mWidth / 2, y + kTitleSize - 4, kTitleSize,
-                     CutToWidth(mSong.mTitle, InnerWidth() / kTitleSize), "ttl ink", "middle");
+            const double fitting = InnerWidth() / std::max(1.0, WidthOf(mSong.mTitle));
+            const double size = std::clamp(fitting, kSmallestTitleSize, kTitleSize);
+            pen.Text(mWidth / 2, y + kTitleSize - 4, size,
+                     CutToWidth(mSong.mTitle, InnerWidth() / size), "ttl ink", "middle");
             y += kTitleSize + 8;
         }
         const bool sharesLine = !Style().empty() && !mSong.mMakers.empty();
@@ -188,7 +191,7 @@ CSheetPages LayOut(const CSong& song, const CSongReading& reading,
     // A little smaller for one page, more so for two; nothing makes two pages of seven.
     if (pages.Count() == 1 || pages.Count() > 6) return pages;
     const std::size_t most = pages.Count() == 2 ? 1 : 2;
-    for (const double scale : {0.875, 0.75, 0.67}) {
+    for (const double scale : {0.875, 0.75, 0.65}) {
         CSheetPages smaller(song, reading, options, scale);
         if (smaller.Count() <= most) return smaller;
         if (most == 1) break;
@@ -196,14 +199,20 @@ CSheetPages LayOut(const CSong& song, const CSongReading& reading,
     return pages;
 }
 
+// What is read out is no longer than what a reader sees.
+std::string Bounded(const std::string& text) {
+    constexpr std::size_t kMostCharacters = 160;
+    return FirstCharacters(text, kMostCharacters);
+}
+
 std::string TitleElement(const CSong& song) {
-    return "<title>" + XmlEscaped(Printable(song.mTitle.empty() ? "Lead sheet" : song.mTitle)) +
-           "</title>\n";
+    const std::string title = song.mTitle.empty() ? "Lead sheet" : Bounded(song.mTitle);
+    return "<title>" + XmlEscaped(Printable(title)) + "</title>\n";
 }
 
 std::string Description(const CSong& song, const CSongReading& reading) {
     std::string text = "Lead sheet";
-    if (!song.mMakers.empty()) text += " of a song by " + song.mMakers;
+    if (!song.mMakers.empty()) text += " of a song by " + Bounded(song.mMakers);
     const std::string key = NameOfKey(reading.mKey);
     if (!key.empty()) text += " in " + key;
     const std::size_t count = CountChords(song);

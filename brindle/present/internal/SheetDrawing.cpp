@@ -19,7 +19,7 @@ constexpr double kHeadHeight = 18.0;
 constexpr double kArrowHeight = 13.0;
 constexpr double kLevelHeight = 5.5;
 constexpr double kBracketHeight = 9.0;
-constexpr double kLineGap = 11.0;
+constexpr double kLineGap = 9.5;
 
 constexpr double kBandPadding = 6.0;
 constexpr double kSymbolRise = 18.0;   // from the padding to the base line of the symbols
