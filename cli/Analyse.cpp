@@ -15,8 +15,11 @@
 #include "brindle/analysis/TChordStringParse.h"
 #include "brindle/present/AnalysisJson.h"
 #include "brindle/present/AnalysisSvg.h"
-#include "brindle/present/AnalysisText.h"
+#include "brindle/present/CentersText.h"
+#include "brindle/present/Explain.h"
+#include "brindle/present/ReadingText.h"
 #include "brindle/present/ShownNames.h"
+#include "brindle/song/ReadSongHarmony.h"
 
 #include <fmt/format.h>
 
@@ -29,9 +32,10 @@ namespace {
 
 constexpr TCommandHelp kHelp{
     "analyse",
-    "Find the keys, the harmonic centers and the function of each chord of a song",
+    "Read a song as a teacher does: keys, numerals, what each chord is and leads to",
     "  brindle analyse \"Dm7 G7 | C\"\n"
-    "  brindle analyse --key \"A minor\" --readings \"Am Dm | E7 Am\"\n"
+    "  brindle analyse --long --explain \"C E7 | Am D7 | G7 C\"\n"
+    "  brindle analyse --key \"A minor\" --centers \"Am Dm | E7 Am\"\n"
     "  brindle analyse --file song.txt --beats-per-bar 3 --format svg >song.svg\n"
     "  brindle analyse song.musicxml --format svg >song.svg\n"
     "  brindle analyse --from chordpro --beats-per-chord 4 --file song.cho\n"
@@ -57,6 +61,9 @@ struct TAnalyseOptions {
     double mBeatsPerChord = 1.0;
     CTypedChords mReading;
     bool mReadings = false;
+    bool mCenters = false;
+    bool mLong = false;
+    bool mExplain = false;
     bool mGrids = false;
     CSheetPicture mSheetPicture;
     CFormatOptions mFormat;
@@ -80,6 +87,13 @@ std::optional<std::string> Contradiction(const TAnalyseOptions& options) {
         if (beats >= kShortest && beats <= kLongest) continue;
         return "--beats-per-bar and --beats-per-chord take 1/1024 to 1024 beats";
     }
+    const bool isText = options.mFormat.Format() == TFormat::Text;
+    if ((options.mLong || options.mCenters) && !isText) {
+        return "--long and --centers are for text, --format text";
+    }
+    if (options.mExplain && !isText && options.mFormat.Format() != TFormat::Json) {
+        return "--explain has words for --format text and json";
+    }
     if (options.mReadings && options.mFormat.Format() == TFormat::Native) {
         return "--readings has no native form; --format json shows them";
     }
@@ -96,6 +110,11 @@ struct TAnalysedSong {
     std::optional<CChordSymbols> mSymbols;
     std::optional<TMusicXMLDoc> mSheet;
     double mBeatsPerBar = 4.0;
+    /// As it is played; without chords for a score in another timing.
+    CSong mSong;
+    CSongReading mReading;
+    /// Empty if they were not asked for.
+    std::vector<std::string> mExplanations;
 };
 
 CShownSong SongOf(const TAnalysedSong& analysed, const TAnalyseOptions& options) {
@@ -126,26 +145,37 @@ bool IsLeadSheet(const TAnalyseOptions& options) {
            !options.mReadings && !options.mGrids;
 }
 
-std::string LeadSheet(const TTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
-                      const TAnalyseOptions& options) {
-    TChordStringParse parse;
-    parse.mBeatsPerBar = options.mBeatsPerBar;
-    parse.mBeatsPerChord = options.mBeatsPerChord;
-    parse.mChordNamePrefs = NamePrefs();
-    const CSong song = options.mReading.ReadSource(typed.mText, parse);
-    return options.mSheetPicture.Draw(song,
-                                      signKeys.empty() ? CSignKeyLite{} : signKeys[0].mSignKey);
+/// Another route than the usual one is asked for to see its centers.
+bool WantsCenters(const TAnalyseOptions& options) {
+    return options.mCenters || options.mReadings || options.mRoute != "tonic";
+}
+
+std::string Text(const TAnalysedSong& analysed, const TAnalyseOptions& options) {
+    const CPaint paint = PaintOfOutput();
+    std::string text =
+        ReadingText(analysed.mSong, analysed.mReading,
+                    {.mWidth = WidthOfOutput(), .mIsLong = options.mLong, .mNumerals = {}}, paint);
+    text += ExplanationsText(analysed.mSong, analysed.mExplanations, paint);
+    if (WantsCenters(options)) text += '\n' + CentersText(SongOf(analysed, options), paint);
+    return text;
+}
+
+std::string AnalysedJson(const TAnalysedSong& analysed, const TAnalyseOptions& options) {
+    const CReadSong read{analysed.mSong, analysed.mReading, analysed.mExplanations};
+    const bool isPlayed = options.mTiming == "played" || !analysed.mSheet;
+    return AnalysisJson(
+        analysed.mAnalyse, options.mReadings ? &analysed.mReadings : nullptr,
+        [&](const CHarmAnlsChordWithPos& chord) -> const std::string& {
+            return analysed.mSymbols->SymbolOf(chord);
+        },
+        KeysOf(analysed), analysed.mSheet ? &*analysed.mSheet : nullptr,
+        isPlayed ? &read : nullptr);
 }
 
 std::string Present(const TAnalysedSong& analysed, const TAnalyseOptions& options) {
     switch (options.mFormat.Format()) {
         case TFormat::Json:
-            return AnalysisJson(
-                analysed.mAnalyse, options.mReadings ? &analysed.mReadings : nullptr,
-                [&](const CHarmAnlsChordWithPos& chord) -> const std::string& {
-                    return analysed.mSymbols->SymbolOf(chord);
-                },
-                KeysOf(analysed), analysed.mSheet ? &*analysed.mSheet : nullptr);
+            return AnalysedJson(analysed, options);
         case TFormat::Native: {
             std::ostringstream native;
             analysed.mAnalyse.AppendJSONString(native);
@@ -160,7 +190,7 @@ std::string Present(const TAnalysedSong& analysed, const TAnalyseOptions& option
         case TFormat::Chords:
             break;
     }
-    return AnalysisText(SongOf(analysed, options), PaintOfOutput());
+    return Text(analysed, options);
 }
 
 TStatus AnalyseText(const TTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
@@ -177,6 +207,7 @@ TStatus AnalyseText(const TTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
         song->mChords, signKeys.empty() ? song->mStatedKeys : signKeys, RouteOf(options.mRoute));
     analysed.mSymbols = song->mSymbols;
     analysed.mBeatsPerBar = song->mBeatsPerBar;
+    analysed.mSong = song->mSong;
     return TStatus::Success;
 }
 
@@ -199,7 +230,19 @@ TStatus AnalyseScore(const TTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
     analyse.AnalyseFromMusicXMLDoc(sheet, RouteOf(options.mRoute));
     analyse.mChords = WithRests(analyse.mChords, sheet);
     analysed.mSymbols.emplace(sheet, analyse.mChords);
+    analysed.mSong = options.mReading.ReadSource(typed.mText, {});
     return TStatus::Success;
+}
+
+void ReadHarmonyOf(TAnalysedSong& analysed, const CHarmAnlsSignKeys& signKeys,
+                   const TAnalyseOptions& options) {
+    CReadingOptions reading;
+    if (!signKeys.empty()) {
+        reading.mStatedKey = signKeys.front().mSignKey;
+        analysed.mSong.mStatedKey = reading.mStatedKey;
+    }
+    analysed.mReading = ReadSongHarmony(analysed.mSong, reading);
+    if (options.mExplain) analysed.mExplanations = Explain(analysed.mSong, analysed.mReading);
 }
 
 TStatus Analyse(const TAnalyseOptions& options) {
@@ -222,7 +265,13 @@ TStatus Analyse(const TAnalyseOptions& options) {
     const TStatus status = typed->mIsScore ? AnalyseScore(*typed, signKeys, options, analysed)
                                            : AnalyseText(*typed, signKeys, options, analysed);
     if (status != TStatus::Success) return status;
-    if (IsLeadSheet(options)) return Print(LeadSheet(*typed, signKeys, options));
+<<<<<<< HEAD
+=======
+    ReadHarmonyOf(analysed, signKeys, options);
+>>>>>>> 660fae4 (Show the reading of a song first in analyse and keys, the stated centers on demand)
+    if (IsLeadSheet(options)) {
+        return Print(options.mSheetPicture.Draw(analysed.mSong, analysed.mReading));
+    }
     if (options.mReadings) {
         analysed.mReadings =
             CAnalyseHarmCenterAlternatives(analysed.mAnalyse.mChords).BestResults();
@@ -242,6 +291,11 @@ void AddAnalyse(CCommand& program) {
     AddBeats(command, options->mBeatsPerBar, options->mBeatsPerChord);
     command.AddChoice("--timing", options->mTiming, {"played", "native"},
                       "How the chords of a score follow each other");
+    command.AddFlag("--long", options->mLong,
+                    "A line for each chord, with what it is and leads to");
+    command.AddFlag("--explain", options->mExplain, "A sentence for each chord");
+    command.AddFlag("--centers", options->mCenters,
+                    "Show the centers that stated progressions lead to, too");
     command.AddFlag("--readings", options->mReadings,
                     "Show all readings that progressions to a tonic allow");
     options->mReading.AddTo(command, "In what form the chord text is written");

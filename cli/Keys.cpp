@@ -3,6 +3,7 @@
 #include "cli/ChordTextOptions.h"
 #include "cli/CommandLine.h"
 #include "cli/Input.h"
+#include "cli/KeyText.h"
 #include "cli/LeadSheet.h"
 #include "cli/SongKeys.h"
 #include "cli/TypedChords.h"
@@ -11,8 +12,9 @@
 #include "brindle/analysis/TChordStringParse.h"
 #include "brindle/present/KeysJson.h"
 #include "brindle/present/KeysSvg.h"
-#include "brindle/present/KeysText.h"
+#include "brindle/present/ReadingText.h"
 #include "brindle/present/ShownNames.h"
+#include "brindle/song/ReadSongHarmony.h"
 
 #include <memory>
 #include <optional>
@@ -41,6 +43,7 @@ constexpr double kMostPoints = 1000.0;
 struct TKeysOptions {
     std::vector<std::string> mWords;
     std::string mFile;
+    std::string mKey;
     double mBeatsPerChord = 1.0;
     CKeyOptions mKeys;
     TNumeralOptions mNumerals;
@@ -67,14 +70,14 @@ std::optional<std::string> Contradiction(const TKeysOptions& options) {
     return std::nullopt;
 }
 
-std::string Present(const CShownSong& song, TFormat format) {
-    if (format == TFormat::Svg) return KeysSvg(song);
-    if (format != TFormat::Json) return KeysText(song, PaintOfOutput());
-    return KeysJson(song.mKeys);
-}
+/// A song, and its keys made ready for the eye.
+struct TSongWithKeys {
+    CSong mSong;
+    CShownSong mShown;
+};
 
 // Nothing when the text is not understood; then the error has been printed.
-std::optional<CShownSong> SongOfText(const TTypedSong& typed, const TKeysOptions& options) {
+std::optional<TSongWithKeys> SongOfText(const TTypedSong& typed, const TKeysOptions& options) {
     TChordStringParse parse;
     parse.mBeatsPerBar = options.mKeys.mBeatsPerBar;
     parse.mBeatsPerChord = options.mBeatsPerChord;
@@ -87,35 +90,65 @@ std::optional<CShownSong> SongOfText(const TTypedSong& typed, const TKeysOptions
     CKeyOptions keyOptions = options.mKeys;
     keyOptions.mBeatsPerBar = read->mBeatsPerBar;
     song.mKeys = MakeSongKeys(chordsOnly.mChords, read->mSymbols, keyOptions, options.mNumerals);
-    return song;
+    return TSongWithKeys{std::move(read->mSong), std::move(song)};
 }
 
-CShownSong SongOfScore(TMusicXMLDoc& sheet, const TKeysOptions& options) {
+std::optional<TSongWithKeys> SongOfScore(const TTypedSong& typed, const TKeysOptions& options) {
+    auto sheet = ReadLeadSheet(typed, TTiming::Played);
+    if (!sheet) return std::nullopt;
     CHarmonicAnalyse chordsOnly;
-    chordsOnly.AnalyseFromMusicXMLDoc(sheet, TAnalyse_None);
-    chordsOnly.mChords = WithRests(chordsOnly.mChords, sheet);
-    const CChordSymbols symbols(sheet, chordsOnly.mChords);
-    CShownSong song = MakeSong(chordsOnly, nullptr, symbols, sheet);
+    chordsOnly.AnalyseFromMusicXMLDoc(*sheet, TAnalyse_None);
+    chordsOnly.mChords = WithRests(chordsOnly.mChords, *sheet);
+    const CChordSymbols symbols(*sheet, chordsOnly.mChords);
+    CShownSong song = MakeSong(chordsOnly, nullptr, symbols, *sheet);
     CKeyOptions keyOptions = options.mKeys;
-    keyOptions.mBeatsPerBar = BeatsPerBarOf(sheet);
+    keyOptions.mBeatsPerBar = BeatsPerBarOf(*sheet);
     song.mKeys = MakeSongKeys(chordsOnly.mChords, symbols, keyOptions, options.mNumerals);
-    return song;
+    return TSongWithKeys{options.mReading.ReadSource(typed.mText, {}), std::move(song)};
+}
+
+// The numerals of a reading are those of theory text. Others are asked for by options.
+std::vector<std::string> OtherNumerals(const CSong& song, const CSongReading& reading,
+                                       const TNumeralOptions& options) {
+    if (!options.mNashville && !options.mFigures && !options.mPrintedSigns && !options.mByKey) {
+        return {};
+    }
+    CKeyOfSong keys;
+    keys.mKey = reading.mKey;
+    keys.mConfidence = reading.mConfidence;
+    keys.mRegions = reading.mRegions;
+    return NumeralsOf(song.mChords, keys, options);
+}
+
+std::string Present(const TSongWithKeys& song, const CSongReading& reading,
+                    const TKeysOptions& options) {
+    const TFormat format = options.mFormat.Format();
+    if (format == TFormat::Svg) return KeysSvg(song.mShown);
+    const CReadSong read{song.mSong, reading};
+    if (format == TFormat::Json) return KeysJson(song.mShown.mKeys, &read);
+    const auto numerals = OtherNumerals(song.mSong, reading, options.mNumerals);
+    return RegionsText(song.mSong, reading,
+                       {.mWidth = WidthOfOutput(), .mIsLong = false, .mNumerals = numerals},
+                       PaintOfOutput());
 }
 
 TStatus Keys(const TKeysOptions& options) {
     if (const auto contradiction = Contradiction(options)) {
         return Fail(TStatus::BadUsage, *contradiction);
     }
+    CReadingOptions readingOptions;
+    readingOptions.mKeys = options.mKeys;
+    if (!options.mKey.empty()) {
+        const auto key = ReadKeyOption(options.mKey);
+        if (!key) return TStatus::BadUsage;
+        readingOptions.mStatedKey = *key;
+    }
     const auto typed = ReadTypedSong(options.mWords, options.mFile);
     if (!typed) return TStatus::BadInput;
-    const TFormat format = options.mFormat.Format();
-    if (!typed->mIsScore) {
-        const auto song = SongOfText(*typed, options);
-        return song ? Print(Present(*song, format)) : TStatus::BadInput;
-    }
-    auto sheet = ReadLeadSheet(*typed, TTiming::Played);
-    if (!sheet) return TStatus::BadInput;
-    return Print(Present(SongOfScore(*sheet, options), format));
+    auto song = typed->mIsScore ? SongOfScore(*typed, options) : SongOfText(*typed, options);
+    if (!song) return TStatus::BadInput;
+    if (!options.mKey.empty()) song->mSong.mStatedKey = readingOptions.mStatedKey;
+    return Print(Present(*song, ReadSongHarmony(song->mSong, readingOptions), options));
 }
 
 }  // namespace
@@ -124,6 +157,7 @@ void AddKeys(CCommand& program) {
     CCommand& command = program.AddCommand(kHelp);
     const auto options = std::make_shared<TKeysOptions>();
     AddSongSource(command, options->mWords, options->mFile);
+    command.AddOption("--key", "KEY", options->mKey, "The stated key, as in \"A minor\" or Bb");
     AddBeats(command, options->mKeys.mBeatsPerBar, options->mBeatsPerChord);
     command.AddOption("--home-bonus", "POINTS", options->mKeys.mHomeBonus,
                       "What a chord gains in the key of the song (default: 0.3)");

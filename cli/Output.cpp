@@ -2,6 +2,7 @@
 #include "cli/Output.h"
 
 #include <fmt/format.h>
+#include <sys/ioctl.h>
 #include <unistd.h>
 
 #include <cerrno>
@@ -67,6 +68,14 @@ TStatus Print(std::string_view text) {
 
 CPaint PaintOfOutput() {
     return CPaint(WantsColor());
+}
+
+std::size_t WidthOfOutput() {
+    constexpr std::size_t usual = 80;
+    winsize size{};
+    if (isatty(STDOUT_FILENO) != 1) return usual;
+    if (ioctl(STDOUT_FILENO, TIOCGWINSZ, &size) != 0 || size.ws_col == 0) return usual;
+    return size.ws_col;
 }
 
 }  // namespace brindle::cli

@@ -37,4 +37,7 @@ TStatus Print(std::string_view text);
 /// Colours if standard output is a terminal, nothing elsewhere or with NO_COLOR.
 [[nodiscard]] CPaint PaintOfOutput();
 
+/// Characters of a line of the terminal, 80 if standard output is none.
+[[nodiscard]] std::size_t WidthOfOutput();
+
 }  // namespace brindle::cli

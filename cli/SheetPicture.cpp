@@ -3,9 +3,6 @@
 
 #include "cli/CCommand.h"
 
-#include "brindle/analysis/ReadHarmony.h"
-#include "brindle/song/CSong.h"
-
 namespace brindle::cli {
 
 void CSheetPicture::AddTo(CCommand& command) {
@@ -30,14 +27,11 @@ std::optional<std::string> CSheetPicture::Contradiction() const {
     return std::nullopt;
 }
 
-std::string CSheetPicture::Draw(const CSong& song, const CSignKeyLite& key) const {
-    CReadingOptions reading;
-    reading.mKeys.mBeatsPerBar = song.mBeatsPerBar;
-    reading.mStatedKey = key;
+std::string CSheetPicture::Draw(const CSong& song, const CSongReading& reading) const {
     CLeadSheetOptions options = mOptions;
     options.mPage = mPage == "a4" ? TSheetPage_A4 : TSheetPage_Endless;
     if (mTheme != "auto") options.mTheme = mTheme == "dark" ? TSheetTheme_Dark : TSheetTheme_Light;
-    return LeadSheetSvg(song, ReadHarmony(song.mChords, reading), options);
+    return LeadSheetSvg(song, reading, options);
 }
 
 }  // namespace brindle::cli

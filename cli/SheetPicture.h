@@ -7,8 +7,8 @@
 #include <string>
 
 namespace brindle {
-struct CSignKeyLite;
 struct CSong;
+struct CSongReading;
 }  // namespace brindle
 
 namespace brindle::cli {
@@ -27,8 +27,8 @@ public:
     /// Whether the time axis with the centers is wanted instead.
     [[nodiscard]] bool IsAxis() const { return mPicture == "axis"; }
 
-    /// The picture of a song; `key` is undefined, or holds in place of what the song states.
-    [[nodiscard]] std::string Draw(const CSong& song, const CSignKeyLite& key) const;
+    /// The picture of a song.
+    [[nodiscard]] std::string Draw(const CSong& song, const CSongReading& reading) const;
 
 private:
     std::string mPicture = "sheet";

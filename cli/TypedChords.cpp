@@ -141,14 +141,19 @@ TChordSong CTypedChords::ReadSong(std::string_view text, const TChordStringParse
         song.mChords.ParseStringIntoChords(FoldAccidentals(text), parse);
         song.mSymbols = CChordSymbols(text, parse, song.mChords);
         song.mBeatsPerBar = parse.mBeatsPerBar;
+        song.mSong.mChords = song.mChords;
+        song.mSong.mBeatsPerBar = parse.mBeatsPerBar;
+        for (const CHarmAnlsChordWithPos& chord : song.mChords) {
+            song.mSong.mSymbols.push_back(song.mSymbols.SymbolOf(chord));
+        }
         return song;
     }
-    CSong read = ReadSource(text, parse);
-    song.mChords = std::move(read.mChords);
-    song.mSymbols = CChordSymbols(read.mSymbols, song.mChords);
-    song.mBeatsPerBar = read.mBeatsPerBar;
-    song.mStatedKeys = std::move(read.mStatedKeys);
-    song.mFaults = std::move(read.mFaults);
+    song.mSong = ReadSource(text, parse);
+    song.mChords = song.mSong.mChords;
+    song.mSymbols = CChordSymbols(song.mSong.mSymbols, song.mChords);
+    song.mBeatsPerBar = song.mSong.mBeatsPerBar;
+    song.mStatedKeys = song.mSong.mStatedKeys;
+    song.mFaults = song.mSong.mFaults;
     return song;
 }
 

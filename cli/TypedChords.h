@@ -29,6 +29,8 @@ struct TChordSong {
     double mBeatsPerBar = 4.0;
     /// Empty if the song does not tell.
     CHarmAnlsSignKeys mStatedKeys;
+    /// All of it.
+    CSong mSong;
     /// What is not understood or was left out. Without --lenient a fault that is no note is the
     /// last one, and then there are no chords.
     std::vector<CSongFault> mFaults;

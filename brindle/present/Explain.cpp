@@ -2,10 +2,15 @@
 #include "brindle/present/Explain.h"
 
 #include "brindle/platform/Localization.h"
+#include "brindle/present/CTable.h"
+#include "brindle/present/ShownText.h"
 #include "brindle/present/TonalityName.h"
 #include "brindle/present/internal/CChordsAround.h"
+#include "brindle/present/internal/ReadingBars.h"
 #include "brindle/present/internal/Sentences.h"
 #include "brindle/theory/KeyIntervals.h"
+
+#include <fmt/format.h>
 
 #include <string_view>
 
@@ -239,6 +244,21 @@ std::vector<std::string> Explain(const CSong& song, const CSongReading& reading)
         sentences[ix] = Filled(LocalizedString(english), chord);
     }
     return sentences;
+}
+
+std::string ExplanationsText(const CSong& song, const std::vector<std::string>& sentences,
+                             const CPaint& paint) {
+    if (sentences.empty()) return {};
+    const CBars bars = BarsOfSong(song);
+    CTable table({" bar", "what each chord does"});
+    std::string_view before;
+    for (std::size_t ix = 0; ix < sentences.size(); ++ix) {
+        if (sentences[ix].empty() || sentences[ix] == before) continue;
+        before = sentences[ix];
+        table.AddRow(
+            {fmt::format("{}", bars.BarOf(song.mChords[ix].mPosition)), Printable(sentences[ix])});
+    }
+    return '\n' + table.Text(paint);
 }
 
 }  // namespace brindle

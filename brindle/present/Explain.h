@@ -2,9 +2,9 @@
 #pragma once
 
 #include "brindle/analysis/ReadHarmony.h"
+#include "brindle/present/CPaint.h"
 #include "brindle/song/CSong.h"
 
-#include <cstddef>
 #include <string>
 #include <vector>
 
@@ -16,5 +16,11 @@ namespace brindle {
 /// The sentences are in the language of the user, as LocalizedString finds them. Chords are named
 /// as the song writes them, keys as the language does: "h-Moll", "si mineur".
 [[nodiscard]] std::vector<std::string> Explain(const CSong& song, const CSongReading& reading);
+
+/// The sentences as a paragraph, each behind its bar; what is said of the same chord twice in a row
+/// once. Empty without sentences.
+[[nodiscard]] std::string ExplanationsText(const CSong& song,
+                                           const std::vector<std::string>& sentences,
+                                           const CPaint& paint);
 
 }  // namespace brindle

@@ -1,9 +1,8 @@
 // SPDX-License-Identifier: MIT
-#include "brindle/present/AnalysisText.h"
+#include "brindle/present/CentersText.h"
 
 #include "brindle/present/CBars.h"
 #include "brindle/present/CTable.h"
-#include "brindle/present/KeysText.h"
 #include "brindle/present/ShownNames.h"
 #include "brindle/present/ShownText.h"
 
@@ -22,38 +21,24 @@ std::string DistanceText(int distance) {
 class CTextWriter {
 public:
     CTextWriter(const CShownSong& song, const CPaint& paint)
-        : mPaint(paint), mBars(song.mBeatsPerBar, song.mBarStarts) {}
+        : mPaint(paint),
+          mBars(song.mBeatsPerBar, song.mBarStarts),
+          mHasReadings(song.mHasReadings) {}
 
-    void WriteScore(const CShownSong& song) {
-        const CShownScore& score = song.mScore;
-        if (!score.mTitle.empty()) mText += mPaint.Strong(score.mTitle) + '\n';
-        if (song.mBarStarts.empty()) return;
-        if (!mText.empty()) mText += '\n';
-        std::string times;
-        for (const CShownScore::CTime& time : score.mTimes) {
-            Append(times, time.mName);
-            if (score.mTimes.size() > 1)
-                times += fmt::format(" from bar {}", mBars.BarOf(time.mPosition));
-        }
-        std::string sections;
-        for (const double section : score.mSections) {
-            Append(sections, fmt::format("{}", mBars.BarOf(section)));
-        }
-        WriteFact("bars", fmt::format("{}", song.mBarStarts.size()));
-        if (!times.empty()) WriteFact("time", times);
-        if (!sections.empty()) WriteFact("sections", "from bars " + sections);
-        for (const CShownScore::CCopy& copy : score.mCopies) {
-            WriteFact("copy", CopyText(copy));
-        }
+    void WriteHeading() {
+        mText += mPaint.Strong("Centers by progressions: ") +
+                 "where stated progressions lead, each for itself.\n"
+                 "A center may differ from the key above, which is that of the whole song.\n";
     }
 
     void Write(const CShownSignKey& signKey) {
         StartParagraph();
-        mText += mPaint.Strong("Sign key " + signKey.mName);
+        mText += mPaint.Strong("Key signature " + signKey.mName);
         mText += mPaint.Faint(fmt::format(", from bar {}\n", mBars.BarOf(signKey.mBegin)));
         bool isAfterChords = true;
         for (const CShownCenter& center : signKey.mCenters) {
             const bool hasChords = !center.mChords.empty();
+            if (!hasChords && !center.mHarmCenter.IsUndef() && !mHasReadings) continue;
             if (isAfterChords || hasChords) StartParagraph();
             WriteHead(center);
             if (hasChords) WriteChords(center.mChords);
@@ -68,13 +53,6 @@ public:
         WriteChords(chords);
     }
 
-    void WriteKeys(const CShownKeys& keys) {
-        const std::string summary = KeysSummary(keys, mBars, mPaint);
-        if (summary.empty()) return;
-        StartParagraph();
-        mText += summary;
-    }
-
     void WriteReadings(const std::vector<CShownCenter>& readings) {
         StartParagraph();
         mText += mPaint.Strong("Readings") + "\n\n";
@@ -82,10 +60,10 @@ public:
             mText += "    none found\n";
             return;
         }
-        CTable table({"center", "where", "probability", "chords"});
+        CTable table({"center", "where", "readings", "chords"});
         for (const CShownCenter& reading : readings) {
             table.AddRow({reading.mName, BarsOf(reading.mRange, mBars),
-                          fmt::format("{:.2f}", reading.mProbability), SymbolsOf(reading)});
+                          ShortNumber(reading.mProbability), SymbolsOf(reading)});
         }
         Write(table);
     }
@@ -93,39 +71,20 @@ public:
     [[nodiscard]] std::string Text() && { return std::move(mText); }
 
 private:
-    static void Append(std::string& list, const std::string& element) {
-        if (!list.empty()) list += ", ";
-        list += element;
-    }
-
-    void WriteFact(std::string_view name, const std::string& fact) {
-        mText += mPaint.Faint(fmt::format("  {:<8}  ", name)) + fact + '\n';
-    }
-
-    // "bars 17 to 32 as bars 1 to 16"
-    [[nodiscard]] std::string CopyText(const CShownScore::CCopy& copy) const {
-        const auto bars = [&](double position) {
-            const long first = mBars.BarOf(position);
-            const long last = first + static_cast<long>(copy.mBarCount) - 1;
-            return last <= first ? fmt::format("bar {}", first)
-                                 : fmt::format("bars {} to {}", first, last);
-        };
-        return bars(copy.mBegin) + " as " + bars(copy.mSource);
-    }
-
     void StartParagraph() {
         if (!mText.empty()) mText += '\n';
     }
 
     void WriteHead(const CShownCenter& center) {
         const bool hasChords = !center.mChords.empty();
-        std::string details = hasChords ? ", " + BarsOf(center.mRange, mBars)
-                                        : fmt::format(", from bar {}, without chords of its own",
-                                                      mBars.BarOf(center.mRange.mBegin));
-        if (center.mProbability != kPosUndef) {
-            details += fmt::format(", probability {:.2f}", center.mProbability);
+        const std::string head = (hasChords ? "Center " : "also heard: ") + center.mName;
+        std::string details = hasChords
+                                  ? ", " + BarsOf(center.mRange, mBars)
+                                  : fmt::format(", from bar {}", mBars.BarOf(center.mRange.mBegin));
+        if (center.mProbability != kPosUndef && center.mProbability > 1.0) {
+            details += fmt::format(", {} readings agree", ShortNumber(center.mProbability));
         }
-        mText += "  " + mPaint.Accent("Center " + center.mName) + mPaint.Faint(details) + '\n';
+        mText += "  " + mPaint.Accent(head) + mPaint.Faint(details) + '\n';
         if (hasChords) mText += '\n';
     }
 
@@ -154,17 +113,17 @@ private:
 
     const CPaint& mPaint;
     CBars mBars;
+    bool mHasReadings;
     std::string mText;
 };
 
 }  // namespace
 
-std::string AnalysisText(const CShownSong& song, const CPaint& paint) {
+std::string CentersText(const CShownSong& song, const CPaint& paint) {
     CTextWriter writer(song, paint);
-    writer.WriteScore(song);
+    writer.WriteHeading();
     for (const CShownSignKey& signKey : song.mSignKeys) writer.Write(signKey);
     writer.WriteLooseChords(song.mLooseChords);
-    writer.WriteKeys(song.mKeys);
     if (song.mHasReadings) writer.WriteReadings(song.mReadings);
     return std::move(writer).Text();
 }
