@@ -265,10 +265,7 @@ TStatus Analyse(const TAnalyseOptions& options) {
     const TStatus status = typed->mIsScore ? AnalyseScore(*typed, signKeys, options, analysed)
                                            : AnalyseText(*typed, signKeys, options, analysed);
     if (status != TStatus::Success) return status;
-<<<<<<< HEAD
-=======
     ReadHarmonyOf(analysed, signKeys, options);
->>>>>>> 660fae4 (Show the reading of a song first in analyse and keys, the stated centers on demand)
     if (IsLeadSheet(options)) {
         return Print(options.mSheetPicture.Draw(analysed.mSong, analysed.mReading));
     }
