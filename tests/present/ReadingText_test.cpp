@@ -1,0 +1,96 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/present/ReadingText.h"
+
+#include "brindle/present/ShownText.h"
+#include "brindle/song/ReadSong.h"
+#include "brindle/song/ReadSongHarmony.h"
+
+#include <doctest/doctest.h>
+
+#include <sstream>
+#include <string>
+
+namespace brindle::test {
+namespace {
+
+std::string Shown(const CSong& song, const CReadingTextOptions& options = {}) {
+    return ReadingText(song, ReadSongHarmony(song), options, CPaint(false));
+}
+
+std::string Shown(std::string_view text, const CReadingTextOptions& options = {}) {
+    return Shown(ReadSong(text), options);
+}
+
+bool Has(const std::string& text, std::string_view part) {
+    return text.find(part) != text.npos;
+}
+
+TEST_CASE("A song stands four bars a line, chords over numerals, keys where they change") {
+    CHECK(Shown("Dm7 G7 | Cmaj7 | Fm7 Bb7 | Ebmaj7 | Am7b5 D7 | Gm |") ==
+          "6 bars\n"
+          "\n"
+          "Key of the song Eb Major, hardly shown by the chords (confidence 0.34)\n"
+          "\n");
+}
+
+TEST_CASE("A line has as many bars as its width holds, and no line is wider") {
+    std::string text;
+    for (int i = 0; i < 12; ++i) text += "Ebmaj7 Cm7b5 F7b9 Bbmaj7 | ";
+    for (const std::size_t width : {200U, 80U, 40U}) {
+        const std::string shown = Shown(text, {.mWidth = width, .mIsLong = false, .mNumerals = {}});
+        std::istringstream lines(shown);
+        std::size_t widest = 0;
+        for (std::string line; std::getline(lines, line);) {
+            if (Has(line, "|")) widest = std::max(widest, CountCharacters(line));
+        }
+        CAPTURE(shown);
+        CHECK(widest <= width);
+    }
+}
+
+TEST_CASE("What repeats is told in whole bars") {
+    const std::string shown =
+        Shown("C | Am | F | G | C | Am | Dm | E7 | C | Am | F | G | C | Am | Dm | E7 | Am |");
+    CHECK(Has(shown, "  bars 9 to 16 repeat bars 1 to 8\n"));
+}
+
+TEST_CASE("Bars that hold a chord show it, and a long row of them its number") {
+    CHECK(Has(Shown("C | . | F G | . Am | C |"), "1 | C | . | F  G"));
+    CSong song = ReadSong("C F G7 C");
+    song.mBars.clear();
+    song.mChords.back().mPosition = 4000.0;
+    CHECK(Has(Shown(song), ". x 999 |"));
+}
+
+TEST_CASE("Notes tell ii V I with all its places") {
+    const std::string shown = Shown("C | Dm7 G7 | C | F | Dm7 G7 | C |");
+    CHECK(Has(shown, "  bars 2 to 3, bars 5 to 6: ii V I of C Major\n"));
+}
+
+TEST_CASE("Keys that contradict are told") {
+    CSong song = ReadSong("C | F | G7 | C | F | G7 | C |");
+    CHECK(!Has(Shown(song), "stated"));
+    song.mStatedKey = CSignKeyLite({9, TEnh_n}, TSignKeyType_Minor);
+    CHECK(Has(Shown(song), "A Minor is the stated key; the chords alone would show C Major.\n"));
+    song.mFormat = TSongFormat_MusicXml;
+    CHECK(Has(Shown(song), "The stated key is A Minor, but the chords show C Major.\n"));
+}
+
+TEST_CASE("Well-known forms have one key, the one that musicians name") {
+    CHECK(Has(Shown("Am | F | C | G | Am | F | C | G |"), "Key of the song C Major"));
+    CHECK(Has(Shown("C7 | F7 | C7 | C7 | F7 | F7 | C7 | C7 | G7 | F7 | C7 | G7 |"),
+              "Key of the song C Major"));
+    CHECK(Has(Shown("Bb6 G7 | Cm7 F7 | Bb6 G7 | Cm7 F7 | Bb7 | Eb7 | Bb6 F7 | Bb6 | D7 | . | G7 | "
+                    ". | C7 | . | F7 | . |"),
+              "Key of the song Bb Major"));
+}
+
+TEST_CASE("A song without chords, or with chords in no time, is shown as such") {
+    CHECK(Shown("") == "No key: no chords\n");
+    CSong song = ReadSong("C F G7 C");
+    for (CHarmAnlsChordWithPos& chord : song.mChords) chord.mPosition = kPosUndef;
+    CHECK(Has(Shown(song), "Key of the song"));
+}
+
+}  // namespace
+}  // namespace brindle::test
