@@ -133,7 +133,7 @@ TEST_CASE("Well-known songs pass through the keys that musicians hear in them") 
             agreed += found[i] == marks.mKeyOfChord[i] ? 1U : 0U;
         }
     }
-    // docs/keys.md quotes these.
+    // docs/reading.md quotes these.
     CHECK(fmt::format("{} of {} songs, {} of {} chords", songs, kMarkedSongs.size(), agreed,
                       chords) == "29 of 30 songs, 438 of 481 chords");
 }

@@ -29,6 +29,7 @@ MORE_COMMANDS = [
     "analyse examples/scores/beautiful-dreamer.musicxml --json",
     "analyse examples/scores/beautiful-dreamer.musicxml --json --timing native",
     'analyse "" --json',
+    'analyse "C E7 Am | Dm7 G7 | C N.C. Fm C" --json --explain',
     "harmonies examples/scores/beautiful-dreamer.musicxml --json",
     "harmonies --from-notes examples/scores/prelude-in-c.musicxml --json",
     'key "F# minor" --json',
