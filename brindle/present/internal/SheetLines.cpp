@@ -30,7 +30,7 @@ struct CPart {
     double mShare = 1.0;   // of a usual bar
 
     [[nodiscard]] double Need(double scale) const {
-        return std::max(kNarrowestBar, mFixed + scale * mChords);
+        return mPlaced.mChords.empty() ? std::max(kNarrowestBar, mFixed) : mFixed + scale * mChords;
     }
 };
 
@@ -138,7 +138,7 @@ private:
         double fixed = 0.0;
         double chords = 0.0;
         for (const CPart& part : parts) {
-            fixed += std::max(part.mFixed, kNarrowestBar - part.mChords);
+            fixed += part.Need(0.0);
             chords += part.mChords;
         }
         if (chords > 0.0) {
