@@ -1,5 +1,4 @@
 // SPDX-License-Identifier: MIT
-#include "cli/ChordSymbols.h"
 #include "cli/ChordTextOptions.h"
 #include "cli/CommandLine.h"
 #include "cli/GridDatabase.h"
@@ -7,19 +6,21 @@
 #include "cli/KeyText.h"
 #include "cli/LeadSheet.h"
 #include "cli/SheetPicture.h"
-#include "cli/SongCopies.h"
-#include "cli/SongKeys.h"
 #include "cli/TypedChords.h"
 
 #include "brindle/analysis/CAnalyseHarmCenterAlternatives.h"
 #include "brindle/analysis/TChordStringParse.h"
 #include "brindle/present/AnalysisJson.h"
 #include "brindle/present/AnalysisSvg.h"
+#include "brindle/present/CChordSymbols.h"
 #include "brindle/present/CentersText.h"
 #include "brindle/present/Explain.h"
+#include "brindle/present/MakeSongCopies.h"
+#include "brindle/present/MakeSongKeys.h"
 #include "brindle/present/ReadingText.h"
 #include "brindle/present/ShownNames.h"
 #include "brindle/song/ReadSongHarmony.h"
+#include "brindle/song/SheetTimes.h"
 
 #include <fmt/format.h>
 

@@ -1,12 +1,12 @@
 // SPDX-License-Identifier: MIT
-#include "cli/ChordSymbols.h"
 #include "cli/ChordTextOptions.h"
 #include "cli/CommandLine.h"
 #include "cli/Json.h"
-#include "cli/SongCopies.h"
 
 #include "brindle/present/CBars.h"
+#include "brindle/present/CChordSymbols.h"
 #include "brindle/present/CTable.h"
+#include "brindle/present/MakeSongCopies.h"
 
 #include <memory>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "cli/Song.h"
+#include "brindle/present/MakeSong.h"
 
 #include "brindle/chords/CChordLite.h"
 #include "brindle/guitarchords/GChDatabase.h"

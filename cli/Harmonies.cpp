@@ -4,11 +4,13 @@
 #include "cli/Json.h"
 #include "cli/KeyText.h"
 #include "cli/LeadSheet.h"
-#include "cli/SheetChordText.h"
 
 #include "brindle/present/CBars.h"
 #include "brindle/present/CTable.h"
 #include "brindle/present/ShownNames.h"
+#include "brindle/song/HarmonySymbols.h"
+#include "brindle/song/SheetTimes.h"
+#include "brindle/song/WriteChordText.h"
 
 #include <fmt/format.h>
 
@@ -76,8 +78,8 @@ std::string HarmoniesText(const TMusicXMLDoc& sheet) {
             barBefore = bar;
         }
         cells.insert(cells.end(),
-                     {TimeText(harmony.mPosition), TimeText(harmony.mDuration), SymbolOf(harmony),
-                      Printable(harmony.mKind), DegreesText(harmony)});
+                     {TimeText(harmony.mPosition), TimeText(harmony.mDuration),
+                      HarmonySymbol(harmony), Printable(harmony.mKind), DegreesText(harmony)});
         table.AddRow(std::move(cells));
     }
     const CPaint paint = PaintOfOutput();
@@ -97,7 +99,7 @@ std::string HarmoniesJson(const TMusicXMLDoc& sheet) {
         }
         list.push_back({{"Position", NumberToJson(harmony.mPosition)},
                         {"Duration", NumberToJson(harmony.mDuration)},
-                        {"Symbol", SymbolOf(harmony)},
+                        {"Symbol", HarmonySymbol(harmony)},
                         {"RootKeyEnh", KeyEnhToJson(harmony.mRoot.ToKeyEnh(NamePrefs()))},
                         {"BassKeyEnh", KeyEnhToJson(harmony.mBass.ToKeyEnh(NamePrefs()))},
                         {"Kind", Printable(harmony.mKind)},

@@ -1,20 +1,21 @@
 // SPDX-License-Identifier: MIT
-#include "cli/ChordSymbols.h"
 #include "cli/ChordTextOptions.h"
 #include "cli/CommandLine.h"
 #include "cli/Input.h"
 #include "cli/KeyText.h"
 #include "cli/LeadSheet.h"
-#include "cli/SongKeys.h"
 #include "cli/TypedChords.h"
 
 #include "brindle/analysis/CHarmonicAnalyse.h"
 #include "brindle/analysis/TChordStringParse.h"
+#include "brindle/present/CChordSymbols.h"
 #include "brindle/present/KeysJson.h"
 #include "brindle/present/KeysSvg.h"
+#include "brindle/present/MakeSongKeys.h"
 #include "brindle/present/ReadingText.h"
 #include "brindle/present/ShownNames.h"
 #include "brindle/song/ReadSongHarmony.h"
+#include "brindle/song/SheetTimes.h"
 
 #include <memory>
 #include <optional>

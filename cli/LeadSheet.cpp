@@ -7,13 +7,11 @@
 #include "brindle/musicxml/ScoreContainer.h"
 #include "brindle/platform/Error.h"
 #include "brindle/platform/XmlStreamParser.h"
-#include "brindle/present/ShownNames.h"
 #include "brindle/song/ReadSong.h"
 
 #include <fmt/format.h>
 
 #include <algorithm>
-#include <cmath>
 
 namespace brindle::cli {
 namespace {
@@ -89,36 +87,6 @@ std::optional<TMusicXMLDoc> ReadLeadSheet(const TTypedSong& song, TTiming timing
     const std::string& bytes = unpacked ? *unpacked : song.mText;
     if (!sheet.LoadFromMusicXML(bytes)) return Unreadable(song, FaultOf(bytes));
     return sheet;
-}
-
-bool HasTimes(const TMusicXMLDoc& sheet) {
-    return std::all_of(sheet.Harmonies.begin(), sheet.Harmonies.end(), [](const auto& harmony) {
-        return harmony.mPosition >= 0.0 && harmony.mDuration >= 0.0 &&
-               harmony.mPosition + harmony.mDuration < 1e9;
-    });
-}
-
-double EndOf(const TMusicXMLDoc& sheet) {
-    if (sheet.Harmonies.empty()) return 0.0;
-    return sheet.Harmonies.back().mPosition + sheet.Harmonies.back().mDuration;
-}
-
-CHarmAnlsChords WithRests(const CHarmAnlsChords& chords, const TMusicXMLDoc& sheet) {
-    CHarmAnlsChords all;
-    auto chord = chords.begin();
-    for (const TMusicXMLHarmony& harmony : sheet.Harmonies) {
-        if (IsNoChord(harmony)) {
-            all.push_back(CHarmAnlsChordWithPos(CHarmAnlsChord(), harmony.mPosition));
-        } else if (chord != chords.end()) {
-            all.push_back(*chord++);
-        }
-    }
-    if (!all.empty()) all.push_back(CHarmAnlsChordWithPos(CHarmAnlsChord(), EndOf(sheet)));
-    return all;
-}
-
-std::string SymbolOf(const TMusicXMLHarmony& harmony) {
-    return HarmonySymbol(harmony);
 }
 
 }  // namespace brindle::cli

@@ -1,9 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "brindle/analysis/CHarmAnlsChords.h"
 #include "brindle/musicxml/TMusicXMLDoc.h"
-#include "brindle/song/HarmonySymbols.h"
 
 #include <optional>
 #include <string>
@@ -38,19 +36,5 @@ struct TTypedSong {
 /// The chords of a score, plain or compressed. Nothing when it cannot be read; then the error has
 /// been printed.
 [[nodiscard]] std::optional<TMusicXMLDoc> ReadLeadSheet(const TTypedSong& song, TTiming timing);
-
-/// Whether every chord has a place in time; a score read as TTiming::Native may have others.
-[[nodiscard]] bool HasTimes(const TMusicXMLDoc& sheet);
-
-/// Where the last chord ends.
-[[nodiscard]] double EndOf(const TMusicXMLDoc& sheet);
-
-/// `chords`, which an analysis read from the score, in the form that a chord text gives: with an
-/// undefined chord where no chord sounds, and one at the end.
-[[nodiscard]] CHarmAnlsChords WithRests(const CHarmAnlsChords& chords, const TMusicXMLDoc& sheet);
-
-/// The chord symbol of a harmony as a lead sheet prints it, in a form that reads back as the same
-/// chord where there is one: "F#m7b5/C", "N.C.".
-[[nodiscard]] std::string SymbolOf(const TMusicXMLHarmony& harmony);
 
 }  // namespace brindle::cli

@@ -3,7 +3,6 @@
 #include "cli/Input.h"
 #include "cli/Json.h"
 #include "cli/KeyText.h"
-#include "cli/RomanTextTable.h"
 #include "cli/TypedChords.h"
 
 #include "brindle/analysis/CHarmAnlsChords.h"
@@ -13,6 +12,7 @@
 #include "brindle/analysis/RomanNumeral.h"
 #include "brindle/chords/ReadChordText.h"
 #include "brindle/chords/WriteChordSymbol.h"
+#include "brindle/present/RomanTextTable.h"
 #include "brindle/present/ShownNames.h"
 
 #include <fmt/format.h>

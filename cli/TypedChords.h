@@ -1,9 +1,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "cli/ChordSymbols.h"
-
 #include "brindle/analysis/CHarmAnlsChords.h"
+#include "brindle/present/CChordSymbols.h"
 #include "brindle/song/ReadSong.h"
 
 #include <optional>

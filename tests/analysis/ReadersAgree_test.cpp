@@ -15,8 +15,9 @@ TEST_CASE("Where both readers understand a text they agree") {
     int compared = 0;
     for (int i = 0; i < 2000; ++i) {
         const std::string text = test::RandomChordText(chance);
-        // `C /E` is one chord for the one and two for the other.
-        if (text.find(" /") != text.npos) continue;
+        // `C /E` is one chord for the one and two for the other; `X7` is no chord,
+        // or how often a repeat is played.
+        if (text.find(" /") != text.npos || text.find("X7") != text.npos) continue;
         const TChordStringParse parse = test::RandomBeats(chance);
         CSongPrefs prefs;
         prefs.mFormat = TSongFormat_ChordText;

@@ -1,15 +1,16 @@
 // SPDX-License-Identifier: MIT
-#include "cli/SheetChordText.h"
+#include "brindle/song/WriteChordText.h"
 
-#include "cli/LeadSheet.h"
-#include "cli/Song.h"
+#include "brindle/musicxml/TMusicXMLDoc.h"
+#include "brindle/song/HarmonySymbols.h"
+#include "brindle/song/SheetTimes.h"
 
 #include <algorithm>
 #include <array>
 #include <cmath>
 #include <cstdint>
 
-namespace brindle::cli {
+namespace brindle {
 namespace {
 
 // More steps than this are no song but a file of hundreds of megabytes.
@@ -77,7 +78,7 @@ private:
     }
 
     static std::string SymbolText(const TMusicXMLHarmony& harmony) {
-        const std::string symbol = SymbolOf(harmony);
+        const std::string symbol = HarmonySymbol(harmony);
         return symbol == kNoChordSymbol || symbol == "?" ? std::string(kRest) : symbol;
     }
 
@@ -113,4 +114,4 @@ std::optional<TChordText> WriteChordText(const TMusicXMLDoc& sheet) {
     return CWriter(sheet).Write();
 }
 
-}  // namespace brindle::cli
+}  // namespace brindle

@@ -1,13 +1,12 @@
 // SPDX-License-Identifier: MIT
-#include "cli/SongCopies.h"
-
-#include "cli/ChordSymbols.h"
+#include "brindle/present/MakeSongCopies.h"
 
 #include "brindle/analysis/CopiedPassages.h"
+#include "brindle/present/CChordSymbols.h"
 
 #include <algorithm>
 
-namespace brindle::cli {
+namespace brindle {
 namespace {
 
 // `count` chords from number `first` on; the last chord of the list ends where it begins.
@@ -34,4 +33,4 @@ std::vector<CShownCopy> MakeSongCopies(const CHarmonicAnalyse& analyse,
     return copies;
 }
 
-}  // namespace brindle::cli
+}  // namespace brindle

@@ -1,11 +1,10 @@
 // SPDX-License-Identifier: MIT
-#include "cli/SongKeys.h"
+#include "brindle/present/MakeSongKeys.h"
 
-#include "cli/ChordSymbols.h"
-
+#include "brindle/present/CChordSymbols.h"
 #include "brindle/present/ShownNames.h"
 
-namespace brindle::cli {
+namespace brindle {
 
 CShownKeys MakeSongKeys(const CHarmAnlsChords& chords, const CChordSymbols& symbols,
                         const CKeyOptions& options, const TNumeralOptions& numeralOptions) {
@@ -32,4 +31,4 @@ CShownKeys MakeSongKeys(const CHarmAnlsChords& chords, const CChordSymbols& symb
     return keys;
 }
 
-}  // namespace brindle::cli
+}  // namespace brindle

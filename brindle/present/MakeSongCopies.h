@@ -1,14 +1,14 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "cli/Song.h"
+#include "brindle/present/MakeSong.h"
 
 #include <vector>
 
-namespace brindle::cli {
+namespace brindle {
 
 /// The passages of a song that repeat earlier ones, by position, with their exact ranges.
 [[nodiscard]] std::vector<CShownCopy> MakeSongCopies(const CHarmonicAnalyse& analyse,
                                                      const CChordSymbols& symbols);
 
-}  // namespace brindle::cli
+}  // namespace brindle

@@ -6,22 +6,17 @@
 #include "brindle/present/ShownSong.h"
 
 namespace brindle {
-struct TMusicXMLDoc;
-}
-
-namespace brindle::cli {
 
 class CChordSymbols;
+struct TMusicXMLDoc;
 
-/// `readings` may be null.
+/// An analysis made ready for the eye. `readings` may be null. The copies are those of
+/// MakeSongCopies, as they are wanted by pictures only.
 [[nodiscard]] CShownSong MakeSong(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings,
                                   const CChordSymbols& symbols, double beatsPerBar);
-
-/// The length of the bars of a score by its first time signature; without one, that of most bars.
-[[nodiscard]] double BeatsPerBarOf(const TMusicXMLDoc& sheet);
 
 /// The same for the chords of a score.
 [[nodiscard]] CShownSong MakeSong(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings,
                                   const CChordSymbols& symbols, const TMusicXMLDoc& sheet);
 
-}  // namespace brindle::cli
+}  // namespace brindle

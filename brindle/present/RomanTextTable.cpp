@@ -1,18 +1,18 @@
 // SPDX-License-Identifier: MIT
-#include "cli/RomanTextTable.h"
-
-#include "cli/Json.h"
+#include "brindle/present/RomanTextTable.h"
 
 #include "brindle/analysis/ReadRomanText.h"
-#include "brindle/chords/CChordHeavy.h"
+#include "brindle/chords/WriteChordSymbol.h"
 #include "brindle/present/CTable.h"
+#include "brindle/present/JsonValues.h"
 #include "brindle/present/ShownNames.h"
-
-#include <fmt/format.h>
+#include "brindle/present/ShownText.h"
 
 #include <algorithm>
+#include <iterator>
+#include <nlohmann/json.hpp>
 
-namespace brindle::cli {
+namespace brindle {
 namespace {
 
 std::string NameOf(const CSignKeyLite& key) {
@@ -27,16 +27,12 @@ const CRomanTextBar& BarAt(const CRomanTextReading& reading, double position) {
     return *std::prev(behind);
 }
 
-std::string SymbolOrNone(const CChordLite& chord) {
-    return chord.IsUndef() ? "N.C." : SymbolOf(chord);
-}
-
 Json ChordJson(const CRomanTextChord& chord) {
     Json json{{"Position", chord.mPosition},
               {"Length", chord.mLength},
               {"Key", NameOf(chord.mKey)},
               {"Numeral", Printable(chord.mNumeral)},
-              {"Symbol", SymbolOrNone(chord.mChord)},
+              {"Symbol", WriteChordSymbol(chord.mChord)},
               {"RootKeyEnh", KeyEnhToJson(chord.mChord.mRootKeyEnh)},
               {"BassKeyEnh", KeyEnhToJson(chord.mChord.mBassKeyEnh)},
               {"Semitones", chord.mChord.mSemitones.Mask()}};
@@ -56,17 +52,6 @@ Json ListJson(const TList& list, TMake make) {
 
 }  // namespace
 
-std::string SymbolOf(const CChordLite& chord) {
-    CChordNamePrefs prefs = NamePrefs();
-    prefs.mOptionBrackets = 1;
-    prefs.mChordPrefC = 2;
-    const CChordLite withoutBass(chord.mRootKeyEnh, CKeyEnh_Undef, chord.mSemitones);
-    std::string symbol = withoutBass.ToChordHeavy(CChordHeavy::DefaultWrapIntvl).Name(prefs);
-    std::erase(symbol, ' ');
-    if (chord.IsSlashChord()) symbol += "/" + KeyName(chord.mBassKeyEnh);
-    return symbol;
-}
-
 std::string RomanTextText(const CRomanTextReading& reading, const CPaint& paint) {
     CTable table({" bar", " position", " length", "key", "numeral", "chord"});
     for (const CRomanTextChord& chord : reading.mChords) {
@@ -74,7 +59,7 @@ std::string RomanTextText(const CRomanTextReading& reading, const CPaint& paint)
         if (!chord.mNumeralBefore.empty()) numeral += " = " + Printable(chord.mNumeralBefore);
         table.AddRow({std::to_string(BarAt(reading, chord.mPosition).mNumber),
                       ShortNumber(chord.mPosition), ShortNumber(chord.mLength), NameOf(chord.mKey),
-                      numeral, SymbolOrNone(chord.mChord)});
+                      numeral, WriteChordSymbol(chord.mChord)});
     }
     return table.Text(paint);
 }
@@ -104,4 +89,4 @@ std::string RomanTextJson(const CRomanTextReading& reading) {
          {"Chords", ListJson(reading.mChords, ChordJson)}});
 }
 
-}  // namespace brindle::cli
+}  // namespace brindle

@@ -1,15 +1,15 @@
 // SPDX-License-Identifier: MIT
-#include "cli/ChordSymbols.h"
-
-#include "cli/LeadSheet.h"
-#include "cli/Output.h"
+#include "brindle/present/CChordSymbols.h"
 
 #include "brindle/analysis/ParseStringIntoHarmAnlsChords.h"
 #include "brindle/analysis/TChordStringParse.h"
+#include "brindle/musicxml/TMusicXMLDoc.h"
+#include "brindle/present/ShownText.h"
+#include "brindle/song/HarmonySymbols.h"
 
 #include <algorithm>
 
-namespace brindle::cli {
+namespace brindle {
 namespace {
 
 // What the reader of chord texts leaves out before it looks for tokens.
@@ -53,7 +53,7 @@ CChordSymbols::CChordSymbols(const TMusicXMLDoc& sheet, const CHarmAnlsChords& c
     for (std::size_t i = 0; i < count; ++i) {
         mPositions.push_back(chords[i].mPosition);
         mChords.push_back(chords[i]);
-        mSymbols.push_back(cli::SymbolOf(sheet.Harmonies[i]));
+        mSymbols.push_back(HarmonySymbol(sheet.Harmonies[i]));
     }
 }
 
@@ -71,4 +71,4 @@ const std::string& CChordSymbols::SymbolOf(const CHarmAnlsChordWithPos& chord) c
     return mSymbols[begin];
 }
 
-}  // namespace brindle::cli
+}  // namespace brindle

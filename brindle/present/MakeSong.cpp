@@ -1,23 +1,21 @@
 // SPDX-License-Identifier: MIT
-#include "cli/Song.h"
+#include "brindle/present/MakeSong.h"
 
-#include "cli/ChordSymbols.h"
-#include "cli/LeadSheet.h"
-#include "cli/Output.h"
-#include "cli/SongKeys.h"
-
+#include "brindle/musicxml/TMusicXMLDoc.h"
+#include "brindle/present/CChordSymbols.h"
+#include "brindle/present/MakeSongKeys.h"
 #include "brindle/present/ShownNames.h"
+#include "brindle/present/ShownText.h"
+#include "brindle/song/HarmonySymbols.h"
+#include "brindle/song/SheetTimes.h"
 
 #include <fmt/format.h>
 
 #include <algorithm>
-#include <map>
 #include <utility>
 
-namespace brindle::cli {
+namespace brindle {
 namespace {
-
-constexpr double kUsualBeatsPerBar = 4.0;
 
 class CSongMaker {
 public:
@@ -127,30 +125,7 @@ CShownScore ScoreOf(const TMusicXMLDoc& sheet) {
     return score;
 }
 
-double BarLength(const TMusicXMLTimeSignature& time) {
-    if (time.mNumerator < 1 || time.mDenominator < 1) return 0.0;
-    return 4.0 * time.mNumerator / time.mDenominator;
-}
-
-// The length that most bars have, 0 without bars.
-double CommonBarLength(const std::vector<CHarmBarline>& barlines) {
-    std::map<double, std::size_t> counts;
-    for (std::size_t i = 0; i + 1 < barlines.size(); ++i) {
-        ++counts[barlines[i + 1].mPosition - barlines[i].mPosition];
-    }
-    const auto most = std::max_element(
-        counts.begin(), counts.end(),
-        [](const auto& one, const auto& other) { return one.second < other.second; });
-    return most == counts.end() ? 0.0 : most->first;
-}
-
 }  // namespace
-
-double BeatsPerBarOf(const TMusicXMLDoc& sheet) {
-    const double length = sheet.TimeSignatures.empty() ? CommonBarLength(sheet.HarmBarlines)
-                                                       : BarLength(sheet.TimeSignatures.front());
-    return length >= 1.0 / 64 && length <= 1024.0 ? length : kUsualBeatsPerBar;
-}
 
 CShownSong MakeSong(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings,
                     const CChordSymbols& symbols, const TMusicXMLDoc& sheet) {
@@ -190,4 +165,4 @@ CShownSong MakeSong(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* rea
     return song;
 }
 
-}  // namespace brindle::cli
+}  // namespace brindle

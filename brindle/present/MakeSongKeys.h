@@ -1,16 +1,16 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "cli/Song.h"
+#include "brindle/present/MakeSong.h"
 
 #include "brindle/analysis/CKeyOfSong.h"
 #include "brindle/analysis/RomanNumeral.h"
 
-namespace brindle::cli {
+namespace brindle {
 
 /// Finds the keys of a song and prepares them for the eye, with the numeral of each chord.
 [[nodiscard]] CShownKeys MakeSongKeys(const CHarmAnlsChords& chords, const CChordSymbols& symbols,
                                       const CKeyOptions& options,
                                       const TNumeralOptions& numeralOptions = {});
 
-}  // namespace brindle::cli
+}  // namespace brindle

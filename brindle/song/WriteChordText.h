@@ -5,10 +5,8 @@
 #include <string>
 
 namespace brindle {
-struct TMusicXMLDoc;
-}
 
-namespace brindle::cli {
+struct TMusicXMLDoc;
 
 /// The chords of a score as a chord text, and with which lengths `analyse` reads it back.
 struct TChordText {
@@ -21,4 +19,4 @@ struct TChordText {
 /// a reader with bars of one length sees one, too. Nothing for a song that is too long.
 [[nodiscard]] std::optional<TChordText> WriteChordText(const TMusicXMLDoc& sheet);
 
-}  // namespace brindle::cli
+}  // namespace brindle

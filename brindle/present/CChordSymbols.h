@@ -8,11 +8,9 @@
 #include <vector>
 
 namespace brindle {
+
 struct TChordStringParse;
 struct TMusicXMLDoc;
-}  // namespace brindle
-
-namespace brindle::cli {
 
 /// The symbol that stands for a chord of an analysis: what the user typed at its position. Every
 /// presentation asks here, so that printed chord names have one place.
@@ -39,4 +37,4 @@ private:
     std::vector<std::string> mSymbols;
 };
 
-}  // namespace brindle::cli
+}  // namespace brindle
