@@ -33,6 +33,7 @@ constexpr auto kForms = std::to_array<TFormRow>({
     {"chordpro", TSongFormat_ChordPro},
     {"ireal", TSongFormat_Chart},
     {"strings", TSongFormat_ChordStrings},
+    {"romantext", TSongFormat_RomanText},
 });
 
 /// A chart may stand in a link or in a page of links; all of these are named alike.
@@ -85,7 +86,8 @@ void CTypedChords::AddTo(CCommand& command) {
 
 void CTypedChords::AddTo(CCommand& command, const std::string& fromPurpose) {
     AddTo(command);
-    command.AddChoice("--from", mForm, {"auto", "plain", "lyrics", "chordpro", "ireal", "strings"},
+    command.AddChoice("--from", mForm,
+                      {"auto", "plain", "lyrics", "chordpro", "ireal", "strings", "romantext"},
                       fromPurpose);
     command.AddFlag("--even", mIsEven, "The chords of a bar without holds share it evenly");
 }

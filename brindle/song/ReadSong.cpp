@@ -36,7 +36,7 @@ CSong ReadOneSong(std::string_view bytes, TSongFormat format, const CSongPrefs& 
         case TSongFormat_ChordStrings:
             return SongReaders::ReadChordStrings(bytes, prefs);
         case TSongFormat_RomanText:
-            return FailedSong(format, "there is no reader of Roman numerals yet");
+            return SongReaders::ReadRomanSong(bytes, prefs);
         case TSongFormat_ChordText:
         case TSongFormat_EvenText:
         case TSongFormat_ChordsAboveLyrics:

@@ -57,8 +57,41 @@ bool HasChordsAboveLyrics(std::string_view text) {
     return has(TLineKind::Chords) && (has(TLineKind::Lyrics) || has(TLineKind::Section));
 }
 
+bool IsMeasureNumber(std::string_view word) {
+    return word.size() > 1 && word[0] == 'm' && std::all_of(word.begin() + 1, word.end(), IsDigit);
+}
+
+/// `C:`, `f#:`
+bool IsKeyMark(std::string_view word) {
+    if (word.size() < 2 || word.back() != ':') return false;
+    const char letter = word[0];
+    const bool isNote = (letter >= 'A' && letter <= 'G') || (letter >= 'a' && letter <= 'g');
+    return isNote && word.substr(1, word.size() - 2).find_first_not_of("#b-") == word.npos;
+}
+
+std::string_view TakeWord(std::string_view& line) {
+    line = WithoutBlanksInFront(line);
+    const std::string_view word = line.substr(0, line.find_first_of(" \t\r"));
+    line.remove_prefix(word.size());
+    return word;
+}
+
+/// The first measure of an analysis states its key: `m1 C: I`, `m0 b3 f#: V7`.
+bool HasMeasureWithKey(std::string_view text) {
+    while (!text.empty()) {
+        std::string_view line = TakeLine(text);
+        if (!IsMeasureNumber(TakeWord(line))) continue;
+        for (std::string_view word = TakeWord(line); !word.empty(); word = TakeWord(line)) {
+            if (IsKeyMark(word)) return true;
+        }
+        return false;
+    }
+    return false;
+}
+
 TSongFormat FormatOfText(std::string_view text) {
     if (BeginsWithChordString(text)) return TSongFormat_ChordStrings;
+    if (HasMeasureWithKey(text)) return TSongFormat_RomanText;
     if (HasDirective(text) || HasChordInBrackets(text)) return TSongFormat_ChordPro;
     if (HasChordsAboveLyrics(text)) return TSongFormat_ChordsAboveLyrics;
     return HasMarkOfChart(text) ? TSongFormat_Chart : TSongFormat_ChordText;

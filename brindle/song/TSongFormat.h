@@ -28,7 +28,7 @@ enum TSongFormat : std::uint8_t {
     TSongFormat_MusicXml,
     /// A zip container with a score in it, `.mxl`.
     TSongFormat_CompressedMusicXml,
-    /// Analyses in Roman numerals. There is no reader yet: naming this format is a fault.
+    /// Analyses in Roman numerals, a line for each measure: `m1 C: I b3 V65/V`.
     TSongFormat_RomanText,
 };
 

@@ -56,6 +56,9 @@ TEST_CASE("A source is read as what it looks like") {
         {TSongFormat_ChordStrings, "(4,C);(2,U);(2,G7)"},
         {TSongFormat_ChordStrings, "(1e999,C);(4,F)"},
         {TSongFormat_ChordText, "(9) C, F"},
+        {TSongFormat_RomanText, "Composer: Somebody\n\nm1 C: I b3 V\nm2 I"},
+        {TSongFormat_RomanText, "m0 b4 f#: V7\nm1 i"},
+        {TSongFormat_ChordText, "m1 C F\nm2 G"},
         {TSongFormat_ChordPro, "{title: x}\nC"},
         {TSongFormat_ChordPro, "{Meta: artist x}\nOh [C]my"},
         {TSongFormat_ChordPro, "A[G]Mazing [D]Grace"},
@@ -218,12 +221,44 @@ TEST_CASE("Chord strings are put one behind the other, and their faults are told
           "2:7: \"(x,F)\" is no length and chord, as in (4,C)");
 }
 
+TEST_CASE("An analysis in Roman numerals is a song in the keys that it states") {
+    const std::string analysis =
+        "Title: Piece\nComposer: Somebody\nAnalyst: Another\nTime Signature: 3/4\n"
+        "m0 b3 C: V\nm1 I b3 V65/V\nm2 V b2 G: I\nm3 NC b2 vi6\n";
+    const CSong song = ReadSong(analysis);
+    CHECK(song.mFormat == TSongFormat_RomanText);
+    CHECK(song.mTitle == "Piece");
+    CHECK(song.mMakers == "Somebody");
+    CHECK(song.mRemarks == std::vector<CSongRemark>{{"analyst", "Another"}});
+    CHECK(song.mBeatsPerBar == 3.0);
+    CHECK(Shown(song) == "G@0 C@1 D7/F#@3 G@4 G@5 N.C.@7 Em/G@8 end@10");
+    REQUIRE(song.mBars.size() == 4);
+    CHECK(song.mBars[0].mNumber == "0");
+    CHECK(song.mBars[0].mLength == 1.0);
+    CHECK(song.mBars[3].mPosition == 7.0);
+    CHECK(song.mBars[3].mTime == CSongTime{3, 4});
+    REQUIRE(song.mStatedKeys.size() == 2);
+    CHECK(song.mStatedKey == CSignKeyLite({0, TEnh_n}, TSignKeyType_Major));
+    CHECK(song.mStatedKeys[1].mPosition == 5.0);
+
+    // Nothing sounds before the first numeral.
+    CHECK(Shown(ReadSong("m1 b2 C: I")) == "N.C.@0 C@1 end@4");
+    // A numeral that is none takes the song, unless the reading is lenient.
+    const std::string wrong = "m1 C: I b3 Q\nm2 V";
+    CHECK(ReadSong(wrong).mChords.empty());
+    CHECK(Faults(ReadSong(wrong)).substr(0, 5) == "1:12:");
+    CHECK(ReadSong(wrong, {.mLenient = true}).mChords.size() > 2);
+    // What is understood and left out is a note.
+    const CSong noted = ReadSong("m1 C: I\nm1var1 vi\n");
+    CHECK_FALSE(noted.HasFault());
+    CHECK(noted.mFaults.size() == 1);
+    CHECK(Shown(noted) == "C@0 end@4");
+}
+
 TEST_CASE("What cannot be read is a fault and no song") {
     CHECK(Faults(ReadSongFile("/no/such/file")) == "0:0: there is no such file");
     CHECK(Faults(ReadSongFile("/")) == "0:0: the file cannot be read, or is larger than 256 MiB");
     CHECK(Faults(ReadSong("<score-partwise>\n <part></parts>")).substr(0, 2) == "2:");
-    CHECK(Faults(ReadSong("I: V", {.mFormat = TSongFormat_RomanText})) ==
-          "0:0: there is no reader of Roman numerals yet");
     std::string archive = "PK\x03\x04";
     archive.resize(100);
     CHECK(Faults(ReadSong(archive)) == "0:0: no score in the container");

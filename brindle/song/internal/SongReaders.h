@@ -18,6 +18,9 @@ namespace brindle::SongReaders {
 
 [[nodiscard]] CSong ReadChordStrings(std::string_view text, const CSongPrefs& prefs);
 
+/// An analysis in Roman numerals. Repeats are not played: what is written stands once.
+[[nodiscard]] CSong ReadRomanSong(std::string_view text, const CSongPrefs& prefs);
+
 /// A score, plain or in a container.
 [[nodiscard]] CSong ReadScoreSong(std::string_view bytes, TSongFormat format);
 
