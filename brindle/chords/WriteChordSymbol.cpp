@@ -6,6 +6,7 @@
 
 #include "brindle/chords/WriteChordSymbol.h"
 
+#include "brindle/chords/internal/SignsOfRoot.h"
 #include "brindle/theory/KeyIntervals.h"
 #include "brindle/theory/KeyNames.h"
 
@@ -205,14 +206,12 @@ std::string WithUnicodeSigns(std::string_view text) {
     return signs;
 }
 
-// `Dbb6` is D flat with a flat six, and `B##9` has a sharp nine; a blank keeps the sign at the
-// root.
-bool TakesSignOf(const CKeyEnh& root, const std::string& suffix) {
+}  // namespace
+
+bool TakesSignOf(const CKeyEnh& root, std::string_view suffix) {
     const bool hasTwoSigns = std::abs(EnhToSemitone(WithTwoSignsAtMost(root).mEnh)) == 2;
     return hasTwoSigns && !suffix.empty() && IsDigit(suffix.front());
 }
-
-}  // namespace
 
 std::string ChordSymbolSuffix(CSemitones semitones) {
     const auto tones = static_cast<TTones>(semitones.Mask());

@@ -46,6 +46,17 @@ TEST_CASE("Players' names of chords that a root alone does not tell") {
     }
 }
 
+TEST_CASE("A figure behind a root with two signs does not take one of them") {
+    bool isSeen = false;
+    for (const CNamedChord& name : NameNotes(std::vector{CNote(69, TEnh_bb), CNote(60, TEnh_bb)})) {
+        if (name.mRoot.mKeyNr != 0) continue;
+        isSeen = true;
+        CHECK(name.mExactSymbol == "Dbb 6(no3,no5)");
+        CHECK(ReadChordText(name.mExactSymbol).mChord.mRootKeyEnh == CKeyEnh{0, TEnh_bb});
+    }
+    CHECK(isSeen);
+}
+
 TEST_CASE("A named chord tells its bass, what is left out and what is added") {
     const CNamedChord seventh = NameNotes(Midi({48, 52, 58})).front();
     CHECK(seventh.mSymbol == "C7");

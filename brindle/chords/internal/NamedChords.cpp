@@ -2,6 +2,7 @@
 #include "brindle/chords/internal/NamedChords.h"
 #include "brindle/chords/WriteChordSymbol.h"
 #include "brindle/chords/internal/NamedChordSpelling.h"
+#include "brindle/chords/internal/SignsOfRoot.h"
 #include "brindle/chords/internal/SpelledOutChord.h"
 
 #include <algorithm>
@@ -78,6 +79,7 @@ std::vector<CNote> Spelled(std::span<const CNote> sorted, const CNamedChordSpell
 std::string SymbolOf(const CNamedChord& chord, const std::string& suffix) {
     std::string symbol = WriteNoteName(chord.mRoot);
     const bool looksLikeSign = !suffix.empty() && (suffix[0] == 'b' || suffix[0] == '#');
+    if (TakesSignOf(chord.mRoot, suffix)) symbol += ' ';
     if (looksLikeSign) symbol += '(';
     symbol += suffix;
     if (looksLikeSign) symbol += ')';
