@@ -91,12 +91,13 @@ bool WriteInto(const fs::path& path, const TWriteBytes& writeBytes) {
 }
 
 bool WriteFile(const fs::path& path, const fs::path& scratchFolder, const TWriteBytes& writeBytes) {
+    struct stat status {};
+    const bool isThere = stat(path.c_str(), &status) == 0;
+    if (isThere && S_ISDIR(status.st_mode)) return false;
+    // By its own name: a link such as /dev/fd/3 to a pipe names no file that could be followed.
+    if (isThere && !S_ISREG(status.st_mode)) return WriteInto(path, writeBytes);
     const auto target = WholeFiles::BehindLinks(path);
     if (!target) return false;
-    struct stat status {};
-    const bool isThere = stat(target->c_str(), &status) == 0;
-    if (isThere && S_ISDIR(status.st_mode)) return false;
-    if (isThere && !S_ISREG(status.st_mode)) return WriteInto(*target, writeBytes);
     const fs::path scratch = scratchFolder.empty() ? *target : scratchFolder / target->filename();
     const auto rights = isThere ? std::optional<mode_t>(status.st_mode & 07777) : std::nullopt;
     return ReplaceFile(*target, scratch, rights, writeBytes);

@@ -120,6 +120,18 @@ TEST_CASE("A pipe takes the bytes and stays a pipe") {
     CHECK(S_ISFIFO(ModeOf(path)));
 }
 
+TEST_CASE("A pipe is written by the name of its descriptor, which is a link to no file") {
+    std::array<int, 2> ends{};
+    REQUIRE(pipe(ends.data()) == 0);
+    CHECK(WriteFileAtomically("/dev/fd/" + std::to_string(ends[1]), "into the pipe"));
+    CHECK(close(ends[1]) == 0);
+    std::array<char, 32> bytes{};
+    const auto count = read(ends[0], bytes.data(), bytes.size());
+    CHECK(std::string_view(bytes.data(), count > 0 ? static_cast<std::size_t>(count) : 0) ==
+          "into the pipe");
+    CHECK(close(ends[0]) == 0);
+}
+
 TEST_CASE("A device stays a device") {
     const CScratchFolder folder;
     const std::string path = folder.File("null");
