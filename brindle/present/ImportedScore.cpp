@@ -14,6 +14,7 @@
 #include <map>
 #include <memory>
 #include <string_view>
+#include <utility>
 
 namespace brindle {
 namespace {
@@ -69,22 +70,22 @@ std::string_view WordOf(Enumeration value) {
     return mBiMap<Enumeration>.WordOf(value).value_or("?");
 }
 
+using TListedParts = std::map<std::string, CImportedPart, std::less<>>;
+
 class CFiller {
 public:
     explicit CFiller(CImportedScore& score) : mScore(&score) {}
 
     void PartStart(const CMuxmlPart& part) const {
-        CImportedPart& imported = mScore->mParts.emplace_back();
+        if (mScore->mParts.empty()) *mListedParts = ListedParts(part.mPartXML);
+        // Taken: many parts with one identifier must not each have a copy.
+        auto listed = mListedParts->extract(part.mID);
+        CImportedPart& imported = mScore->mParts.emplace_back(
+            listed.empty() ? CImportedPart() : std::move(listed.mapped()));
         mScore->mIsInPart = true;
         std::swap(imported.mEvents, mScore->mEventsBeforePart);
         imported.mID = part.mID;
         imported.mName = part.FindBestPartName();
-        if (mScoreParts->empty()) ReadScoreParts(part);
-        const auto scorePart = mScoreParts->find(part.mID);
-        if (scorePart == mScoreParts->end()) return;
-        imported.mProgram = MidiNumber(scorePart->second, "midi-program");
-        imported.mChannel = MidiNumber(scorePart->second, "midi-channel");
-        ReadInstruments(scorePart->second, imported);
     }
 
     void Add(std::int32_t position, std::string what) const {
@@ -159,17 +160,23 @@ private:
         return mScore->mParts.size() == (mScore->mIsInPart ? 1U : 0U);
     }
 
-    // The list of parts, once for all of them; of equal identifiers the first counts. The
-    // instruments that an import tells are only those whose identifiers begin as that of their
-    // part.
-    void ReadScoreParts(const CMuxmlPart& part) const {
-        for (const XmlNode& entry : part.mPartXML.parent().child("part-list").children()) {
-            if (entry.name() != "score-part") continue;
-            mScoreParts->try_emplace(entry.attribute("id").value_or(""), entry);
+    // How MIDI plays the parts of the list, once for all of them; of equal identifiers the first
+    // counts. The instruments that an import tells are only those whose identifiers begin as that
+    // of their part.
+    static TListedParts ListedParts(XmlNode node) {
+        while (const XmlNode parent = node.parent()) node = parent;
+        TListedParts parts;
+        for (const XmlNode& scorePart : node.child("part-list").children()) {
+            if (scorePart.name() != "score-part") continue;
+            parts.try_emplace(scorePart.attribute("id").value_or(""), ListedPart(scorePart));
         }
+        return parts;
     }
 
-    static void ReadInstruments(const XmlNode& scorePart, CImportedPart& part) {
+    static CImportedPart ListedPart(const XmlNode& scorePart) {
+        CImportedPart part;
+        part.mProgram = MidiNumber(scorePart, "midi-program");
+        part.mChannel = MidiNumber(scorePart, "midi-channel");
         for (const XmlNode& midi : scorePart.descendants("midi-instrument")) {
             part.mInstruments.insert_or_assign(
                 midi.attribute("id").value_or(""),
@@ -177,6 +184,7 @@ private:
                                     MidiNumber(midi, "midi-channel"),
                                     MidiNumber(midi, "midi-unpitched")});
         }
+        return part;
     }
 
     // Notes of a part with one instrument need not name it. Null if it is not known.
@@ -196,8 +204,7 @@ private:
     }
 
     CImportedScore* mScore;
-    std::shared_ptr<std::map<std::string, XmlNode>> mScoreParts =
-        std::make_shared<std::map<std::string, XmlNode>>();
+    std::shared_ptr<TListedParts> mListedParts = std::make_shared<TListedParts>();
 };
 
 }  // namespace

@@ -76,6 +76,16 @@ TEST_CASE(
     CHECK(untold.mTracks[0].mNotes.at(0).mChannel == 9);
 }
 
+TEST_CASE(
+    "Parts with one identifier share no instruments, so that no score takes quadratic memory") {
+    const CImportedScore score =
+        Import(Instrument("I36", 36),
+               Drum("") + "</measure></part><part id='P1'><measure number='1'>" + Drum(""));
+    REQUIRE(score.mParts.size() == 2);
+    CHECK(score.mParts[0].mInstruments.size() == 1);
+    CHECK(score.mParts[1].mInstruments.empty());
+}
+
 TEST_CASE("A note whose tie does not end sounds as long as it is written, and is told") {
     const CImportedScore score =
         Import("", Pitched("<tie type='start'/>") +
