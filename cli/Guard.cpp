@@ -31,10 +31,16 @@ TStatus TellCurrentException() {
     std::_Exit(static_cast<int>(TellCurrentException()));
 }
 
+struct TTerminateHandler {
+    TTerminateHandler() { std::set_terminate(EndAtOnce); }
+};
+
+// Made before all else: what the library of options makes before main asks for memory, too.
+[[maybe_unused, gnu::init_priority(101)]] const TTerminateHandler kTerminateHandler;
+
 }  // namespace
 
 TStatus Guarded(TStatus (*run)(int argc, char** argv), int argc, char** argv) {
-    std::set_terminate(EndAtOnce);
     try {
         return run(argc, argv);
     } catch (...) {

@@ -3,6 +3,8 @@
 
 #include "brindle/neural/ChordAnalysisNeuronalNet.h"
 
+#include <new>
+
 namespace brindle {
 
 NeuronalNet& NetForSingleChordAnalysis() {
@@ -17,9 +19,18 @@ std::mutex& LockOfNetForSingleChordAnalysis() {
 
 namespace {
 
+bool MakeNet() noexcept {
+    try {
+        (void)NetForSingleChordAnalysis();
+    } catch (const std::bad_alloc&) {
+        return false;  // no reason to end a host before its main: the first use makes it
+    }
+    return true;
+}
+
 // Made at load, not at first use: building it later would take the calculation parameters away
 // from a net that the host has built.
-[[maybe_unused]] const NeuronalNet& kMadeAtLoad = NetForSingleChordAnalysis();
+[[maybe_unused]] const bool kIsMadeAtLoad = MakeNet();
 
 }  // namespace
 
