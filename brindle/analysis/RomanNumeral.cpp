@@ -6,6 +6,7 @@
 #include "brindle/analysis/internal/KeyChords.h"
 #include "brindle/analysis/internal/NumeralDegree.h"
 #include "brindle/analysis/internal/NumeralSign.h"
+#include "brindle/analysis/internal/NumeralText.h"
 #include "brindle/analysis/internal/NumeralTones.h"
 #include "brindle/theory/KeyIntervals.h"
 #include "brindle/theory/MakeSensefulEnh.h"
@@ -33,11 +34,11 @@ TNumeralDegree DegreeAt(int dist, const CSignKeyLite& key) {
 
 std::string DegreeText(TNumeralDegree degree, bool isSmall, bool inDigits) {
     std::string text;
-    for (int i = degree.mAccidental; i > 0; --i) text += '#';
-    for (int i = degree.mAccidental; i < 0; ++i) text += 'b';
-    if (inDigits) return text + static_cast<char>('0' + degree.mNumber);
-    for (const char c : kRomanNumbers[static_cast<std::size_t>(degree.mNumber - 1)]) {
-        text += isSmall ? static_cast<char>(c - 'A' + 'a') : c;
+    if (inDigits) {
+        AppendAccidentals(text, degree.mAccidental);
+        text += static_cast<char>('0' + degree.mNumber);
+    } else {
+        AppendDegree(text, degree, isSmall);
     }
     return text;
 }

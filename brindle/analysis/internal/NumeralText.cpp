@@ -46,12 +46,17 @@ std::string_view NumeralSignOf(CSemitones semitones) {
 }
 
 const TNumeralDegree& NumeralDegreeOf(int degree, int key) {
-    const auto& degrees = IsMinorKey(key) ? kDegreesInMinor : kDegreesInMajor;
-    return degrees[static_cast<std::size_t>(degree)];
+    const TSignKeyType type = IsMinorKey(key) ? TSignKeyType_Minor : TSignKeyType_Major;
+    return DegreesOf(type)[static_cast<std::size_t>(degree)];
+}
+
+void AppendAccidentals(std::string& text, int accidental) {
+    for (; accidental > 0; --accidental) text += '#';
+    for (; accidental < 0; ++accidental) text += 'b';
 }
 
 void AppendDegree(std::string& text, const TNumeralDegree& degree, bool isSmall) {
-    if (degree.mAccidental != 0) text += degree.mAccidental > 0 ? '#' : 'b';
+    AppendAccidentals(text, degree.mAccidental);
     for (const char c : kRomanNumbers[static_cast<std::size_t>(degree.mNumber - 1)]) {
         text += isSmall ? static_cast<char>(c - 'A' + 'a') : c;
     }
