@@ -57,6 +57,10 @@ constexpr auto kForms = std::to_array<TFormCase>({
     {"C major", "V54",        "Gsus4"},
     {"C major", "V4",         "Gsus4"},
     {"C major", "V4-3",       "Gsus4"},
+    {"C major", "V9-8",       "Gadd9"},
+    {"C major", "V8-7",       "G"},
+    {"C major", "V7-9",       "G7b9",     kSigns},
+    {"C major", "I6/3",       "C/E",      kSigns},
     {"C major", "V75",        "G7(no3)"},
     {"C major", "V\xE2\x81\xB6\xE2\x82\x85", "G7/B"},
     // Qualities
@@ -83,6 +87,10 @@ constexpr auto kForms = std::to_array<TFormCase>({
     {"C major", "V7(b9,#11)", "G7b9#11",  kSigns},
     {"C major", "V13#11",     "G13#11",   kSigns},
     {"C major", "isus4",      "Csus4",    kSigns},
+    {"C major", "Ib7",        "C7",       kSigns},
+    {"C major", "I[b7]",      "C7"},
+    {"C major", "\xE2\x85\xB1" "7", "Dm7"},
+    {"C major", "\xE2\x85\xB6\xC2\xB0", "Bdim"},
     // Chords of their own
     {"C major", "N",          "Db"},
     {"C major", "N6",         "Db/F",     kSigns},
@@ -265,6 +273,32 @@ TEST_CASE("What is applied to a degree counts from it") {
                 CheckRead(numeral + degree, key, (row.mRoot + target) % 12, row.mTones);
                 CheckRead(numeral + Small(degree), key, (row.mRoot + target) % 12, row.mTones);
             }
+        }
+    }
+}
+
+TEST_CASE("A suspension with its resolution is the suspension above the root") {
+    struct TCase {
+        std::string_view mKey;
+        std::string_view mNumeral;
+        CSemitones mTones;
+    };
+    constexpr auto cases = std::to_array<TCase>({
+        {"C major", "V6-5", {0, 4, 9}},
+        {"C major", "V64-53", {0, 5, 9}},
+        {"A minor", "V64-53", {0, 5, 8}},
+        {"A minor", "i6-5", {0, 3, 8}},
+        {"C major", "I9-8", {0, 2, 4, 7}},
+        {"C major", "V8-7", {0, 4, 7}},
+        {"C major", "V54-3", {0, 5, 7}},
+        {"C major", "V74-3", {0, 5, 7, 10}},
+    });
+    for (const TCase& row : cases) {
+        for (const TNumeralOptions& options : {kSigns, kFigures, kByKey}) {
+            INFO(std::string(row.mNumeral));
+            const CNumeralReading reading = ReadNumeral(row.mNumeral, Key(row.mKey), options);
+            CHECK(reading.mChord.mSemitones == row.mTones);
+            CHECK_FALSE(reading.mChord.HasBassNote());
         }
     }
 }

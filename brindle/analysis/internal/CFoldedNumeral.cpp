@@ -56,6 +56,13 @@ constexpr auto kOtherSigns = std::to_array<TReplacement>({
     {"\xE2\x85\xA4", "V"},
     {"\xE2\x85\xA5", "VI"},
     {"\xE2\x85\xA6", "VII"},
+    {"\xE2\x85\xB0", "i"},
+    {"\xE2\x85\xB1", "ii"},
+    {"\xE2\x85\xB2", "iii"},
+    {"\xE2\x85\xB3", "iv"},
+    {"\xE2\x85\xB4", "v"},
+    {"\xE2\x85\xB5", "vi"},
+    {"\xE2\x85\xB6", "vii"},
 });
 
 // Digits and most letters stand for themselves.

@@ -89,6 +89,9 @@ enum TFigureKind : std::uint8_t {
     TFigure_Fourth,         ///< a fourth instead of the third
     TFigure_SeventhFourth,  ///< the same under a seventh
     TFigure_Second,         ///< a second instead of the third
+    TFigure_Sixth,          ///< a sixth instead of the fifth
+    TFigure_SixthFourth,    ///< a sixth and a fourth above the root
+    TFigure_AddedNinth,     ///< a ninth without a seventh
 };
 
 /// A figure as in a figured bass, its slashes left out.
@@ -135,11 +138,20 @@ inline constexpr auto kNumeralFigures = std::to_array<TNumeralFigure>({
     {"74",   TFigure_SeventhFourth, 1, 0},
     {"754",  TFigure_SeventhFourth, 1, 0},
     {"52",   TFigure_Second,        1, 0},
+    // A suspension with its resolution: the suspension is the chord.
+    {"4-3",   TFigure_Fourth,       1, 0},
+    {"54-3",  TFigure_Fourth,       1, 0},
+    {"74-3",  TFigure_SeventhFourth, 1, 0},
+    {"754-3", TFigure_SeventhFourth, 1, 0},
+    {"6-5",   TFigure_Sixth,        1, 0},
+    {"64-53", TFigure_SixthFourth,  1, 0},
+    {"9-8",   TFigure_AddedNinth,   1, 0},
+    {"8-7",   TFigure_Triad,        1, 0},
 });
 
 // Figures that people write with slashes, 6/5. Others behind a slash are the degree of a bass.
 inline constexpr auto kSlashedFigures = std::to_array<std::string_view>({
-    "65", "64", "43", "42", "53", "54", "653", "643", "642", "753", "754",
+    "65", "64", "63", "43", "42", "53", "54", "653", "643", "642", "753", "754",
 });
 // clang-format on
 

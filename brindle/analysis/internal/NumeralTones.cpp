@@ -48,6 +48,12 @@ int TakeNumber(std::string_view& text) {
     return number;
 }
 
+// An accidental changes the number as in chord symbols, too: b7 is the same as 7.
+int SemitonesOfNumber(int number, int accidental) {
+    const int semitones = kSemitonesOfNumber[static_cast<std::size_t>(number)] + accidental;
+    return number == 7 && accidental < 0 ? semitones + 1 : semitones;
+}
+
 int StepOfNumber(int number) {
     return (number - 1) % 7 + 1;
 }
@@ -95,13 +101,10 @@ const TNumeralFigure* FigureOf(std::string_view text) {
     constexpr std::size_t longest = 8;
     std::array<char, longest> digits;
     std::size_t count = 0;
-    // Of a suspension and its resolution, V4-3, the suspension is the chord.
-    if (const std::size_t dash = text.find("4-3"); dash != text.npos && dash + 3 == text.size()) {
-        text.remove_suffix(2);
-    }
     for (const char c : text) {
         if (c == '/') continue;
-        if (c < '0' || c > '9' || count == longest) return nullptr;
+        const bool isOfFigure = (c >= '0' && c <= '9') || c == '-';
+        if (!isOfFigure || count == longest) return nullptr;
         digits[count++] = c;
     }
     const std::string_view figure(digits.data(), count);
@@ -130,7 +133,17 @@ int SeventhOf(const TNumeralRoot& root, const TQuality& quality, bool byKey) {
 }
 
 bool HasSeventh(TFigureKind kind) {
-    return kind != TFigure_Triad && kind != TFigure_Fourth && kind != TFigure_Second;
+    return kind == TFigure_Seventh || kind == TFigure_Ninth || kind == TFigure_Eleventh ||
+           kind == TFigure_Thirteenth || kind == TFigure_SeventhFourth;
+}
+
+bool HasNinth(TFigureKind kind) {
+    return kind == TFigure_Ninth || kind == TFigure_Eleventh || kind == TFigure_Thirteenth ||
+           kind == TFigure_AddedNinth;
+}
+
+bool HasFourthForThird(TFigureKind kind) {
+    return kind == TFigure_Fourth || kind == TFigure_SeventhFourth || kind == TFigure_SixthFourth;
 }
 
 // The tones of a figure in the root position.
@@ -140,8 +153,10 @@ CSemitones TonesOfKind(TFigureKind kind, const TNumeralRoot& root, const TQualit
         return byKey ? IntvlInKey(root, step) : usual;
     };
     CSemitones tones{0};
-    tones.SetSemitone(FifthOf(quality), true);
-    if (kind == TFigure_Fourth || kind == TFigure_SeventhFourth) {
+    // The sixth that falls to the fifth is that of the key in all texts: C above E in A minor.
+    const bool hasSixth = kind == TFigure_Sixth || kind == TFigure_SixthFourth;
+    tones.SetSemitone(hasSixth ? IntvlInKey(root, 6) : FifthOf(quality), true);
+    if (HasFourthForThird(kind)) {
         tones.SetSemitone(tension(4, 5), true);
     } else if (kind == TFigure_Second) {
         tones.SetSemitone(tension(2, 2), true);
@@ -149,9 +164,7 @@ CSemitones TonesOfKind(TFigureKind kind, const TNumeralRoot& root, const TQualit
         tones.SetSemitone(ThirdOf(root, quality), true);
     }
     if (HasSeventh(kind)) tones.SetSemitone(SeventhOf(root, quality, byKey), true);
-    const bool hasNinth =
-        kind == TFigure_Ninth || kind == TFigure_Eleventh || kind == TFigure_Thirteenth;
-    if (hasNinth) tones.SetSemitone(tension(2, 2), true);
+    if (HasNinth(kind)) tones.SetSemitone(tension(2, 2), true);
     const bool hasEleventh = kind == TFigure_Eleventh || kind == TFigure_Thirteenth;
     if (hasEleventh) tones.SetSemitone(tension(4, 5), true);
     if (kind == TFigure_Thirteenth) tones.SetSemitone(tension(6, 9), true);
@@ -204,8 +217,7 @@ bool TakeAddition(std::string_view& text, CSemitones& tones) {
     const int number = TakeNumber(text);
     if (number < 2 || number > 13) return false;
     if (isMajorSeventh && number != 7) return false;
-    const int semitone = kSemitonesOfNumber[static_cast<std::size_t>(number)] + accidental;
-    tones.AddIntvl(isMajorSeventh ? kMajorSeventh : semitone);
+    tones.AddIntvl(isMajorSeventh ? kMajorSeventh : SemitonesOfNumber(number, accidental));
     return true;
 }
 
@@ -350,8 +362,7 @@ bool ApplyGroup(std::string_view group, const TNumeralRoot& root, TReadTones& to
             tones.mSemitones.AddIntvl(present + accidental);
         } else {
             if (number > 13) return false;
-            tones.mSemitones.AddIntvl(kSemitonesOfNumber[static_cast<std::size_t>(number)] +
-                                      accidental);
+            tones.mSemitones.AddIntvl(SemitonesOfNumber(number, accidental));
         }
         while (Take(group, ",") || Take(group, " ")) {
         }
