@@ -16,6 +16,9 @@ constexpr std::size_t kMostMeasures = 1'000'000;
 constexpr std::size_t kMostCopiedWords = 1'000'000;
 constexpr std::size_t kMostFaults = 1'000;
 
+constexpr std::string_view kNotHigher =
+    "the number of the measure is not higher than the one before";
+
 /// What stands behind the number of a measure.
 struct TMeasureText {
     std::string_view mText;
@@ -152,6 +155,7 @@ void CRomanTextReader::CopyMeasures(const TMeasureRange& range, std::string_view
     if (range.mLast - range.mFirst + 1 != count) {
         return Fail("the copy is not as long as what is copied", typed);
     }
+    if (range.mFirst <= mLastNumber) Fail(kNotHigher, mLine);
     for (int i = 0; i < count; ++i) {
         const auto measure = mMeasures.find(from->mFirst + i);
         if (measure == mMeasures.end()) return Fail("a measure that is copied is not there", typed);
@@ -176,7 +180,7 @@ void CRomanTextReader::FillTo(int number) {
 
 void CRomanTextReader::AddMeasure(int number, const TMeasureText& measure, bool hasLetter) {
     if (number < mLastNumber || (number == mLastNumber && !hasLetter)) {
-        Fail("the number of the measure is not higher than the one before", mLine);
+        Fail(kNotHigher, mLine);
     }
     FillTo(number);
     if (mReading.mBars.size() >= kMostMeasures) return Fail("there are too many measures", mLine);

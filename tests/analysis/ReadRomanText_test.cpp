@@ -127,6 +127,7 @@ TEST_CASE("What is wrong is told with its line and column, and the rest is read"
         "m4-6 = m1-2\n"
         "m4-5 = m1-2\n"
         "m4 = x\n"
+        "m1 = m1\n"
         "Time Signature: 5/6\n"
         "Pedal: G m1 b1 m2 b1\n"
         "nonsense\n");
@@ -143,10 +144,11 @@ TEST_CASE("What is wrong is told with its line and column, and the rest is read"
           "5:8 the copy is not as long as what is copied; "
           "6:8 a measure that is copied is not there; "
           "7:6 measures are expected behind =; "
-          "8:17 this is no time signature; "
-          "10:1 this is neither a measure nor a header");
+          "8:1 the number of the measure is not higher than the one before; "
+          "9:17 this is no time signature; "
+          "11:1 this is neither a measure nor a header");
     CHECK(FaultsText(reading.mNotes) ==
-          "3:1 another reading of the measure is left out; 9:1 pedals are left out");
+          "3:1 another reading of the measure is left out; 10:1 pedals are left out");
 }
 
 TEST_CASE("Hostile analyses end") {
