@@ -26,28 +26,38 @@ int LetterOfKey(const CKeyEnh& keyEnh) {
     return letters[static_cast<std::size_t>(natural)];
 }
 
+// Behind the last place at which a chord is written.
+std::size_t EndOf(std::span<const TKeyChord> heard, std::size_t ix, std::size_t count) {
+    return ix + 1 < heard.size() ? heard[ix + 1].mBegin : count;
+}
+
+// The spelling that one of the times tells at which the chord is written.
 std::vector<TSeventhSpelling> SeventhsOf(const CHarmAnlsChords& chords,
                                          std::span<const TKeyChord> heard,
                                          std::span<const TSeventhSpelling> stated) {
     std::vector<TSeventhSpelling> sevenths(heard.size(), TSeventhSpelling_Undef);
     for (std::size_t i = 0; i < heard.size(); ++i) {
-        const std::size_t ix = heard[i].mBegin;
-        if (ix < stated.size()) sevenths[i] = stated[ix];
-        if (sevenths[i] != TSeventhSpelling_Undef) continue;
-        sevenths[i] = SeventhSpellingOf(chords[ix].mRootKeyEnh, chords[ix].mBassKeyEnh);
+        const std::size_t end = EndOf(heard, i, chords.size());
+        for (std::size_t ix = heard[i].mBegin; ix < end; ++ix) {
+            sevenths[i] = ix < stated.size() ? stated[ix] : TSeventhSpelling_Undef;
+            if (sevenths[i] == TSeventhSpelling_Undef) {
+                sevenths[i] = SeventhSpellingOf(chords[ix].mRootKeyEnh, chords[ix].mBassKeyEnh);
+            }
+            if (sevenths[i] != TSeventhSpelling_Undef) break;
+        }
     }
     return sevenths;
 }
 
-// The reading of each chord stands at its first place in the list, its indices count the chords
-// that are heard.
+// The reading of each chord stands at its first place in the list.
 std::vector<CChordReading> ReadChords(std::size_t count, std::span<const TKeyChord> heard,
-                                      const TSongKeys& keys,
+                                      const TSongKeys& keys, const CKeySpeller& speller,
                                       std::span<const TSeventhSpelling> sevenths) {
     const std::vector<std::ptrdiff_t> under = HarmonyChain(heard, keys.mKinds, keys.mTraits.mHome);
     std::vector<CChordReading> readings(count);
     for (std::size_t i = 0; i < heard.size(); ++i) {
         CChordReading& reading = readings[heard[i].mBegin];
+        reading.mKey = speller.SignKeyOf(keys.mKeys[i]);
         reading.mUnder = under[i];
         reading.mResolvesTo = under[i];
     }
@@ -55,20 +65,13 @@ std::vector<CChordReading> ReadChords(std::size_t count, std::span<const TKeyCho
     return readings;
 }
 
-// Makes the indices places in the list, and gives chords that are written again the same reading.
+// Gives chords that are written again the same reading.
 void Spread(const CHarmAnlsChords& chords, std::span<const TKeyChord> heard,
             std::vector<CChordReading>& readings) {
-    const auto placeOf = [&](std::ptrdiff_t ix) {
-        return ix < 0 ? ix
-                      : static_cast<std::ptrdiff_t>(heard[static_cast<std::size_t>(ix)].mBegin);
-    };
     for (std::size_t i = 0; i < heard.size(); ++i) {
-        const std::size_t end = i + 1 < heard.size() ? heard[i + 1].mBegin : chords.size();
-        CChordReading& reading = readings[heard[i].mBegin];
-        reading.mResolvesTo = placeOf(reading.mResolvesTo);
-        reading.mUnder = placeOf(reading.mUnder);
+        const std::size_t end = EndOf(heard, i, chords.size());
         for (std::size_t ix = heard[i].mBegin + 1; ix < end; ++ix) {
-            if (!chords[ix].IsUndef()) readings[ix] = reading;
+            if (!chords[ix].IsUndef()) readings[ix] = readings[heard[i].mBegin];
         }
     }
 }
@@ -94,16 +97,13 @@ CSongReading ReadHarmony(const CHarmAnlsChords& chords, const CReadingOptions& o
         return song;
     }
     const TSongKeys keys = FindSongKeys(heard, options.mKeys, NumberOfKey(options.mStatedKey));
-    const CKeySpeller speller(chords);
+    const CKeySpeller speller(chords, options.mStatedKey);
     const int home = keys.mTraits.mHome;
-    song.mKey = options.mStatedKey.IsUndef() ? speller.SignKeyOf(home) : options.mStatedKey;
+    song.mKey = speller.SignKeyOf(home);
     song.mConfidence = ConfidenceOf(keys.mScores, home);
     song.mRegions = KeyRegionsOf(chords, heard, keys.mKeys, speller);
-    song.mChords =
-        ReadChords(chords.size(), heard, keys, SeventhsOf(chords, heard, options.mSevenths));
-    for (std::size_t i = 0; i < heard.size(); ++i) {
-        song.mChords[heard[i].mBegin].mKey = speller.SignKeyOf(keys.mKeys[i]);
-    }
+    song.mChords = ReadChords(chords.size(), heard, keys, speller,
+                              SeventhsOf(chords, heard, options.mSevenths));
     Spread(chords, heard, song.mChords);
     return song;
 }

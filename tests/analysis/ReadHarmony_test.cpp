@@ -189,6 +189,12 @@ TEST_CASE("A stated key is home, and its share tells whether the chords show it"
     CHECK(ReadHarmony(BarsOf("Am | F | E7 | Am"), {.mStatedKey = aMinor}).mConfidence > 0.9);
     const CSignKeyLite fSharp({6, TEnh_s}, TSignKeyType_Major);
     CHECK(ReadHarmony(chords, {.mStatedKey = fSharp}).mConfidence < 0.01);
+    // It keeps its spelling where the chords have another one.
+    const CSignKeyLite gFlat({6, TEnh_b}, TSignKeyType_Major);
+    const CSongReading flat = ReadHarmony(BarsOf("F# | B | C#7 | F#"), {.mStatedKey = gFlat});
+    CHECK(flat.mKey == gFlat);
+    CHECK(flat.mRegions.front().mKey == gFlat);
+    CHECK(flat.mChords.front().mKey == gFlat);
     // A vamp of ii and V is one of i and IV, unless its key is stated.
     const CHarmAnlsChords vamp = BarsOf("Dm7 | G7 | Dm7 | G7");
     const CSignKeyLite cMajor({0, TEnh_n}, TSignKeyType_Major);
@@ -237,6 +243,9 @@ TEST_CASE("A seventh chord written with an augmented sixth is a German sixth, al
     CHECK(numeral("Cm | Fm | Ab7 | G | Cm", {none, none, seventh}, 2) ==
           "subV7/V substitute dominant");
     CHECK(numeral("C | F | Eb7 | D7 | G7 | C", {none, none, sixth}, 2) == "Ger6/V augmented sixth");
+    // It is told the second time that the chord is written.
+    CHECK(numeral("Em7 | Am7 | C7 | C7 | B7 | Em7", {none, none, none, sixth}, 2) ==
+          "Ger6 augmented sixth");
     // The bass has letters of its own.
     CHECK(numeral("Em7 | Am7 | C7/A# | B7 | Em7", {}, 2) == "Ger6 augmented sixth");
     CHECK(numeral("Em7 | Am7 | C7/Bb | B7 | Em7", {}, 2) == "subV7/V substitute dominant");

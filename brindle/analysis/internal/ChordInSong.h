@@ -26,6 +26,11 @@ struct TSongToName {
     [[nodiscard]] CChordReading& ReadingOf(std::size_t ix) const {
         return mReadings[mChords[ix].mBegin];
     }
+    /// The place in the list of a chord that is heard; -1 for none.
+    [[nodiscard]] std::ptrdiff_t PlaceOf(std::ptrdiff_t ix) const {
+        if (ix < 0) return kNoChord;
+        return static_cast<std::ptrdiff_t>(mChords[static_cast<std::size_t>(ix)].mBegin);
+    }
 };
 
 /// A chord to be named, with what its rules ask for. Degrees are semitones above the tonic of its

@@ -131,7 +131,8 @@ void NameHarmonies(const TSongToName& song) {
         const CChordInSong chord(song, i);
         CChordReading& reading = song.ReadingOf(i);
         reading.mDeceptive = IsDeceptive(chord, reading);
-        reading.mResolvesTo = Resolution(chord, {reading, isLed[i]});
+        reading.mResolvesTo = song.PlaceOf(Resolution(chord, {reading, isLed[i]}));
+        reading.mUnder = song.PlaceOf(reading.mUnder);
     }
 }
 

@@ -45,7 +45,8 @@ void Apply(const CChordInSong& chord, std::string_view prefix, int target, std::
 /// Names what no other rule does.
 void NameChordOfKey(const CChordInSong& chord, TChordName& name);
 
-/// Names all chords of a song. In the end `mResolvesTo` is the chord that each resolves to.
+/// Names all chords of a song. In the end `mResolvesTo` is the chord that each resolves to, and
+/// this and `mUnder` are places in the list.
 void NameHarmonies(const TSongToName& song);
 
 }  // namespace brindle

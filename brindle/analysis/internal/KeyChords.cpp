@@ -24,9 +24,9 @@ TKeyChord KeyChordOf(const CHarmAnlsChords& chords, std::size_t ix) {
             static_cast<std::int8_t>(FoldIntoOctave(chord.mRootKeyEnh.mKeyNr)),
             static_cast<std::int8_t>(FoldIntoOctave(bass.mKeyNr)),
             chord.HasBassNote(),
+            static_cast<std::uint32_t>(ix),
             chord.mSemitones,
-            BeatsOf(chords, ix),
-            ix};
+            BeatsOf(chords, ix)};
 }
 
 bool IsSameChord(const TKeyChord& a, const TKeyChord& b) {

@@ -45,9 +45,11 @@ struct TKeyChord {
     std::int8_t mRoot;  ///< pitch class, 0 to 11
     std::int8_t mBass;  ///< pitch class, that of the root without a bass
     bool mHasBass;
+    /// Its place in the list of chords. Small, since long songs wait for memory; a list with more
+    /// places would take 160 GB.
+    std::uint32_t mBegin;
     CSemitones mSemitones;
     double mBeats;
-    std::size_t mBegin;  ///< its place in the list of chords
 
     [[nodiscard]] constexpr bool Has(int intvl) const { return mSemitones.HasIntvl(intvl); }
 };

@@ -60,7 +60,7 @@ double ConfidenceOf(const std::array<double, kKeyCount>& scores, int key) {
     return std::exp(scores[static_cast<std::size_t>(key)] - most) / sum;
 }
 
-CKeySpeller::CKeySpeller(const CHarmAnlsChords& chords) {
+CKeySpeller::CKeySpeller(const CHarmAnlsChords& chords, const CSignKeyLite& statedKey) {
     std::array<TEnh, 12> enhs;
     enhs.fill(TEnh_Undef);
     for (const CHarmAnlsChord& chord : chords) {
@@ -75,6 +75,8 @@ CKeySpeller::CKeySpeller(const CHarmAnlsChords& chords) {
                                IsMinorKey(key) ? TSignKeyType_Minor : TSignKeyType_Major);
         signKey.SetRootNoteEnhWithLeastSigns();
     }
+    const int stated = NumberOfKey(statedKey);
+    if (stated >= 0) mSignKeys[static_cast<std::size_t>(stated)] = statedKey;
 }
 
 std::vector<CKeyRegion> KeyRegionsOf(const CHarmAnlsChords& chords,

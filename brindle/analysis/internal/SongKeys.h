@@ -33,10 +33,10 @@ struct TSongKeys {
 [[nodiscard]] double ConfidenceOf(const std::array<double, kKeyCount>& scores, int key);
 
 /// Key numbers as sign keys. Where two spellings have as many signs, F sharp and G flat major, the
-/// first chord on the tonic decides.
+/// first chord on the tonic decides. The stated key keeps the spelling in which it is stated.
 class CKeySpeller {
 public:
-    explicit CKeySpeller(const CHarmAnlsChords& chords);
+    explicit CKeySpeller(const CHarmAnlsChords& chords, const CSignKeyLite& statedKey = {});
 
     [[nodiscard]] const CSignKeyLite& SignKeyOf(int key) const {
         return mSignKeys[static_cast<std::size_t>(key)];
