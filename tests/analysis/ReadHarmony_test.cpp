@@ -202,6 +202,21 @@ TEST_CASE("A stated key is home, and its share tells whether the chords show it"
     CHECK(ReadHarmony(vamp, {.mStatedKey = cMajor}).mChords[1].mNumeral == "V7");
 }
 
+TEST_CASE("Of two keys with equal scores the lower one is that of the song") {
+    // 3.475 points for D and for F major.
+    const CChordLite d{{2, TEnh_n}, CKeyEnh_Undef, CSemitones(2039)};
+    const CChordLite c{{0, TEnh_n}, CKeyEnh_Undef, CSemitones(1494)};
+    const CChordLite gFlat{{6, TEnh_b}, {10, TEnh_b}, CSemitones(2641)};
+    CHarmAnlsChords chords;
+    chords.emplace_back(d, 0.0);
+    chords.emplace_back(c, 8.0);
+    chords.emplace_back(gFlat, 24.0);
+    chords.emplace_back(CChordLite_Undef, 32.0);
+    const CSongReading reading = ReadHarmony(chords);
+    CHECK(ShortKey(reading.mKey) == "D");
+    CHECK(reading.mChords.front().mUnder == 2);
+}
+
 TEST_CASE("The letters of a seventh tell an augmented sixth") {
     struct TCase {
         CKeyEnh mRoot;

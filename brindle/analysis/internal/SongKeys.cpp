@@ -26,6 +26,16 @@ CKeyOptions Checked(CKeyOptions options) {
     return options;
 }
 
+// Scores that differ by no more than the rounding of their sums are equal, so that no order of
+// adding decides.
+int LowestOfTheBest(const std::array<double, kKeyCount>& scores) {
+    constexpr double rounding = 1e-9;
+    const double least = *std::max_element(scores.begin(), scores.end()) - rounding;
+    const auto winner = std::find_if(scores.begin(), scores.end(),
+                                     [least](double score) { return score >= least; });
+    return static_cast<int>(winner - scores.begin());
+}
+
 int HomeOf(std::span<const TKeyChord> chords, int bestScored, int statedKey) {
     if (statedKey >= 0) return statedKey;
     const int vamp = KeyOfVamp(chords);
@@ -38,8 +48,7 @@ TSongKeys FindSongKeys(std::span<const TKeyChord> chords, const CKeyOptions& opt
                        int statedKey) {
     TSongKeys found;
     found.mScores = KeyScores(chords);
-    const auto winner = std::max_element(found.mScores.begin(), found.mScores.end());
-    found.mBestScored = static_cast<int>(winner - found.mScores.begin());
+    found.mBestScored = LowestOfTheBest(found.mScores);
     found.mTraits = SongTraitsOf(chords, HomeOf(chords, found.mBestScored, statedKey));
     found.mKinds = KeyChordKindsOf(chords);
     const int home = found.mTraits.mHome;
