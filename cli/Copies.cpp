@@ -1,11 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "cli/ChordTextOptions.h"
 #include "cli/CommandLine.h"
-#include "cli/Json.h"
 
-#include "brindle/present/CBars.h"
-#include "brindle/present/CChordSymbols.h"
-#include "brindle/present/CTable.h"
+#include "brindle/present/CopiesText.h"
 #include "brindle/present/MakeSongCopies.h"
 
 #include <memory>
@@ -28,40 +25,6 @@ struct TCopiesOptions {
     CChordTextOptions mText;
     CFormatOptions mFormat;
 };
-
-Json RangeToJson(const CTimeRange& range) {
-    return {{"Position", NumberToJson(range.mBegin)}, {"End", NumberToJson(range.mEnd)}};
-}
-
-std::string CopiesJson(const std::vector<CShownCopy>& copies) {
-    Json list = Json::array();
-    for (const CShownCopy& shown : copies) {
-        list.push_back({{"TargetPos", NumberToJson(shown.mCopy.mTargetPos)},
-                        {"SourceOffsetBars", shown.mCopy.mSourceOffsetBars},
-                        {"LengthBars", shown.mCopy.mLengthBars},
-                        {"Source", RangeToJson(shown.mSource)},
-                        {"Target", RangeToJson(shown.mTarget)},
-                        {"Symbols", shown.mSymbols}});
-    }
-    return JsonText({{"HarmCopies", list}});
-}
-
-std::string LengthText(double bars) {
-    return ShortNumber(bars) + (bars == 1.0 ? " bar" : " bars");
-}
-
-std::string CopiesText(const std::vector<CShownCopy>& copies, double beatsPerBar,
-                       const CPaint& paint) {
-    if (copies.empty()) return "no passage is repeated\n";
-    const CBars bars(beatsPerBar);
-    CTable table({"source", "target", "length", "chords"});
-    for (const CShownCopy& shown : copies) {
-        table.AddRow({BarsOf(shown.mSource, bars), BarsOf(shown.mTarget, bars),
-                      LengthText((shown.mTarget.mEnd - shown.mTarget.mBegin) / beatsPerBar),
-                      FirstAndLast(shown.mSymbols)});
-    }
-    return table.Text(paint);
-}
 
 TStatus Copies(const TCopiesOptions& options) {
     if (const auto contradiction = options.mText.Contradiction()) {

@@ -1,14 +1,10 @@
 // SPDX-License-Identifier: MIT
 #include "cli/CommandLine.h"
 #include "cli/HarmoniesFromNotes.h"
-#include "cli/Json.h"
 #include "cli/KeyText.h"
 #include "cli/LeadSheet.h"
 
-#include "brindle/present/CBars.h"
-#include "brindle/present/CTable.h"
-#include "brindle/present/ShownNames.h"
-#include "brindle/song/HarmonySymbols.h"
+#include "brindle/present/HarmoniesText.h"
 #include "brindle/song/SheetTimes.h"
 #include "brindle/song/WriteChordText.h"
 
@@ -42,71 +38,6 @@ struct THarmoniesOptions {
     std::string mKey;
     CFormatOptions mFormat;
 };
-
-std::string DegreesText(const TMusicXMLHarmony& harmony) {
-    std::string text;
-    for (const TMusicXMLDegree& degree : harmony.mDegrees) {
-        if (!text.empty()) text += ", ";
-        text += Printable(degree.mType) + ' ';
-        if (degree.mAlter != 0) text += degree.mAlter < 0 ? 'b' : '#';
-        text += Printable(degree.mValue);
-    }
-    return text;
-}
-
-// A score read as the library does may have chords without a place in time.
-std::string TimeText(double time) {
-    return time > -1e9 && time < 1e9 ? ShortNumber(time) : "-";
-}
-
-std::string HarmoniesText(const TMusicXMLDoc& sheet) {
-    std::vector<double> starts;
-    for (const CHarmBarline& barline : sheet.HarmBarlines) starts.push_back(barline.mPosition);
-    const bool hasBars = !starts.empty();
-    const CBars bars(1.0, std::move(starts));
-    CTable table(
-        hasBars ? std::vector<std::string>{" bar", " beat", " position", " length", "chord", "kind",
-                                           "degrees"}
-                : std::vector<std::string>{" position", " length", "chord", "kind", "degrees"});
-    long barBefore = 0;
-    for (const TMusicXMLHarmony& harmony : sheet.Harmonies) {
-        std::vector<std::string> cells;
-        if (hasBars) {
-            const long bar = bars.BarOf(harmony.mPosition);
-            cells = {bar == barBefore ? "" : fmt::format("{}", bar),
-                     ShortNumber(bars.BeatOf(harmony.mPosition))};
-            barBefore = bar;
-        }
-        cells.insert(cells.end(),
-                     {TimeText(harmony.mPosition), TimeText(harmony.mDuration),
-                      HarmonySymbol(harmony), Printable(harmony.mKind), DegreesText(harmony)});
-        table.AddRow(std::move(cells));
-    }
-    const CPaint paint = PaintOfOutput();
-    std::string text;
-    if (!sheet.Title.empty()) text = paint.Strong(Printable(sheet.Title)) + "\n\n";
-    return text + table.Text(paint);
-}
-
-std::string HarmoniesJson(const TMusicXMLDoc& sheet) {
-    Json list = Json::array();
-    for (const TMusicXMLHarmony& harmony : sheet.Harmonies) {
-        Json degrees = Json::array();
-        for (const TMusicXMLDegree& degree : harmony.mDegrees) {
-            degrees.push_back({{"Value", Printable(degree.mValue)},
-                               {"Alter", degree.mAlter},
-                               {"Type", Printable(degree.mType)}});
-        }
-        list.push_back({{"Position", NumberToJson(harmony.mPosition)},
-                        {"Duration", NumberToJson(harmony.mDuration)},
-                        {"Symbol", HarmonySymbol(harmony)},
-                        {"RootKeyEnh", KeyEnhToJson(harmony.mRoot.ToKeyEnh(NamePrefs()))},
-                        {"BassKeyEnh", KeyEnhToJson(harmony.mBass.ToKeyEnh(NamePrefs()))},
-                        {"Kind", Printable(harmony.mKind)},
-                        {"Degrees", degrees}});
-    }
-    return JsonText({{"Title", Printable(sheet.Title)}, {"Harmonies", list}});
-}
 
 TStatus PrintChordText(const TMusicXMLDoc& sheet, const std::string& name) {
     if (!HasTimes(sheet)) {
@@ -154,7 +85,7 @@ TStatus Harmonies(const THarmoniesOptions& options) {
     if (!sheet) return TStatus::BadInput;
     if (options.mFormat.Format() == TFormat::Chords) return PrintChordText(*sheet, typed->mName);
     const bool isJson = options.mFormat.Format() == TFormat::Json;
-    return Print(isJson ? HarmoniesJson(*sheet) : HarmoniesText(*sheet));
+    return Print(isJson ? HarmoniesJson(*sheet) : HarmoniesText(*sheet, PaintOfOutput()));
 }
 
 }  // namespace

@@ -1,0 +1,22 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/chords/CChordLite.h"
+#include "brindle/present/CPaint.h"
+
+#include <string>
+#include <vector>
+
+namespace brindle {
+
+/// A chord and the symbol that it was read from.
+struct TReadChord {
+    std::string mSymbol;
+    CChordLite mChord;
+};
+
+/// Root, bass, tones and hash code of chords, as a table and as JSON, see docs/json.md.
+[[nodiscard]] std::string ChordsText(const std::vector<TReadChord>& chords, const CPaint& paint);
+[[nodiscard]] std::string ChordsJson(const std::vector<TReadChord>& chords);
+
+}  // namespace brindle
