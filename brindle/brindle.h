@@ -190,6 +190,7 @@
 #include "brindle/present/ReadingJson.h"
 #include "brindle/present/ReadingText.h"
 #include "brindle/present/RomanTextTable.h"
+#include "brindle/present/ShowSong.h"
 #include "brindle/present/ShownNames.h"
 #include "brindle/present/ShownSong.h"
 #include "brindle/present/ShownText.h"

@@ -1,9 +1,10 @@
 // SPDX-License-Identifier: MIT
-// A small host program: reads a song, from a file in any form or from a text, analyses it and
-// prints what it finds.
+// A small host program: reads a song, from a file in any form or from a text, analyses it, and
+// writes what it finds as JSON and as a picture.
 
 #include "brindle/brindle.h"
 
+#include <fstream>
 #include <iostream>
 
 int main(int argc, char** argv) {
@@ -15,14 +16,7 @@ int main(int argc, char** argv) {
     if (song.HasFault()) return 1;
 
     const brindle::CSongAnalysis found = brindle::AnalyseSong(song);
-    for (const auto& signKey : found.mAnalyse.mSignKeys) {
-        std::cout << signKey.mSignKey.NameLong(brindle::CurrentChordNamePrefs) << '\n';
-        for (const auto& center : signKey.mHarmCenters) {
-            for (const auto& chord : center.mChords) {
-                std::cout << "  beat " << chord.mPosition << ": " << chord.mRootDistToHarmCenter
-                          << " semitones above the center\n";
-            }
-        }
-    }
-    return 0;
+    std::cout << found.mKeys.mKey.NameLong(brindle::CurrentChordNamePrefs) << '\n';
+    std::ofstream("song.json") << brindle::AnalysisJson(song, found);
+    std::ofstream("song.svg") << brindle::AnalysisSvg(brindle::ShowSong(song, found));
 }

@@ -1,0 +1,70 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/present/ShowSong.h"
+
+#include "brindle/present/AnalysisJson.h"
+#include "brindle/present/CChordSymbols.h"
+#include "brindle/present/MakeSong.h"
+#include "brindle/present/MakeSongCopies.h"
+#include "brindle/present/ShownText.h"
+#include "brindle/song/AnalyseSong.h"
+
+#include <algorithm>
+#include <string>
+
+namespace brindle {
+
+namespace {
+
+bool AreBarsEqual(const CSong& song) {
+    return std::all_of(song.mBars.begin(), song.mBars.end(),
+                       [&](const CSongBar& bar) { return bar.mLength == song.mBeatsPerBar; });
+}
+
+CShownScore ScoreOf(const CSong& song) {
+    CShownScore score;
+    score.mTitle = Printable(song.mTitle);
+    CSongTime time;
+    for (const CSongBar& bar : song.mBars) {
+        if (bar.mTime.IsUndef() || bar.mTime == time) continue;
+        time = bar.mTime;
+        score.mTimes.push_back({bar.mPosition, std::to_string(time.mNumerator) + "/" +
+                                                   std::to_string(time.mDenominator)});
+    }
+    for (const CSongSection& section : song.mSections) {
+        score.mSections.push_back(section.mPosition);
+    }
+    for (const CSongRepeat& repeat : song.mRepeats) {
+        score.mCopies.push_back({repeat.mPosition, repeat.mSourcePosition, repeat.mBarCount});
+    }
+    return score;
+}
+
+const CHarmAnlsCenters* ReadingsOf(const CSongAnalysis& found) {
+    return found.mReadings.empty() ? nullptr : &found.mReadings;
+}
+
+}  // namespace
+
+CShownSong ShowSong(const CSong& song, const CSongAnalysis& found) {
+    const CChordSymbols symbols(song.mSymbols, song.mChords);
+    CShownSong shown = MakeSong(found.mAnalyse, ReadingsOf(found), symbols, song.mBeatsPerBar);
+    shown.mScore = ScoreOf(song);
+    if (!AreBarsEqual(song)) {
+        for (const CSongBar& bar : song.mBars) shown.mBarStarts.push_back(bar.mPosition);
+    }
+    if (!found.mCopies.empty()) shown.mCopies = MakeSongCopies(found.mAnalyse, symbols);
+    return shown;
+}
+
+std::string AnalysisJson(const CSong& song, const CSongAnalysis& found) {
+    const CChordSymbols symbols(song.mSymbols, song.mChords);
+    const CShownSong shown = ShowSong(song, found);
+    return AnalysisJson(
+        found.mAnalyse, ReadingsOf(found),
+        [&](const CHarmAnlsChordWithPos& chord) -> const std::string& {
+            return symbols.SymbolOf(chord);
+        },
+        shown.mKeys);
+}
+
+}  // namespace brindle

@@ -1,0 +1,104 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/present/ShowSong.h"
+
+#include "brindle/musicxml/TMusicXMLDoc.h"
+#include "brindle/present/AnalysisSvg.h"
+#include "brindle/song/AnalyseSong.h"
+#include "brindle/song/ReadSong.h"
+#include "brindle/song/SheetTimes.h"
+
+#include <doctest/doctest.h>
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <nlohmann/json.hpp>
+#include <string>
+#include <vector>
+
+namespace brindle::test {
+namespace {
+
+/// "C 0-4; G 4-8", in the order of time.
+std::string ShownChords(const CShownSong& song) {
+    std::vector<CShownChord> chords;
+    ForEachChord(song, [&](const CShownChord& chord) { chords.push_back(chord); });
+    std::stable_sort(chords.begin(), chords.end(), [](const auto& a, const auto& b) {
+        return a.mRange.mBegin < b.mRange.mBegin;
+    });
+    std::string text;
+    for (const CShownChord& chord : chords) {
+        text += fmt::format("{}{} {:g}-{:g}", text.empty() ? "" : "; ", chord.mSymbol,
+                            chord.mRange.mBegin, chord.mRange.mEnd);
+    }
+    return text;
+}
+
+CShownSong Shown(const CSong& song) {
+    return ShowSong(song, AnalyseSong(song));
+}
+
+TEST_CASE("Of several chords at one place the last one sounds and the others last no time") {
+    CSong song = ReadSong("C F G C");
+    song.mChords[2].mPosition = song.mChords[1].mPosition;
+    const std::string shown = ShownChords(Shown(song));
+    CAPTURE(shown);
+    CHECK(shown.find("C 0-1") == 0);
+    CHECK(shown.find("F 1-1") != shown.npos);
+    CHECK(shown.find("G 1-3") != shown.npos);
+    CHECK(shown.find("F 1-3") == shown.npos);
+}
+
+TEST_CASE("A length of bars that no music has is four beats") {
+    struct TRow {
+        int mNumerator;
+        int mDenominator;
+        double mBeats;
+    };
+    const TRow rows[] = {{3, 4, 3.0},       {6, 8, 3.0},    {1, 256, 1.0 / 64}, {1, 512, 4.0},
+                         {1024, 4, 1024.0}, {1025, 4, 4.0}, {0, 4, 4.0},        {4, 0, 4.0}};
+    for (const TRow& row : rows) {
+        CAPTURE(row.mNumerator);
+        CAPTURE(row.mDenominator);
+        TMusicXMLDoc sheet;
+        sheet.TimeSignatures.emplace_back();
+        sheet.TimeSignatures.back().mNumerator = row.mNumerator;
+        sheet.TimeSignatures.back().mDenominator = row.mDenominator;
+        CHECK(BeatsPerBarOf(sheet) == row.mBeats);
+    }
+    CHECK(BeatsPerBarOf({}) == 4.0);
+}
+
+TEST_CASE("Without a time signature bars are as long as most of them") {
+    TMusicXMLDoc sheet;
+    for (const double position : {0.0, 1.0, 4.0, 7.0, 10.0}) {
+        sheet.HarmBarlines.emplace_back();
+        sheet.HarmBarlines.back().mPosition = position;
+    }
+    CHECK(BeatsPerBarOf(sheet) == 3.0);
+}
+
+TEST_CASE("Any song becomes a picture and JSON without a command line") {
+    const CSong song = ReadSong("Title: Piece\nTime Signature: 3/4\nm0 b3 C: V\nm1 I\nm2 V7\nm3 I");
+    CAnalyseSongOptions options;
+    options.mReadings = true;
+    const CSongAnalysis found = AnalyseSong(song, options);
+    const CShownSong shown = ShowSong(song, found);
+    CHECK(ShownChords(shown) == "G 0-1; C 1-4; G7 4-7; C 7-10");
+    CHECK(shown.mBarStarts == std::vector<double>{0.0, 1.0, 4.0, 7.0});
+    CHECK(shown.mScore.mTitle == "Piece");
+    REQUIRE(shown.mScore.mTimes.size() == 1);
+    CHECK(shown.mScore.mTimes[0].mName == "3/4");
+    CHECK(shown.mHasReadings);
+    CHECK(AnalysisSvg(shown).find("G7") != std::string::npos);
+    const auto json = nlohmann::json::parse(AnalysisJson(song, found));
+    CHECK(json.contains("Readings"));
+    CHECK(json.at("HarmSignKeys").size() == found.mAnalyse.mSignKeys.size());
+
+    const CShownSong even = Shown(ReadSong("C | F | G | C |"));
+    CHECK(even.mBarStarts.empty());
+    CHECK_FALSE(even.mHasReadings);
+    CHECK(ShownChords(Shown(CSong())).empty());
+}
+
+}  // namespace
+}  // namespace brindle::test
