@@ -390,16 +390,16 @@ void DrawLegend(CSheetPen& pen, const CSheetScore& score, double x, double y, do
     };
     const CMarkKinds kinds(score);
     if (kinds.mHasArrow) arrow(false, "a dominant resolves");
-    if (kinds.mHasDottedArrow) arrow(true, "what stands for a dominant resolves");
-    if (kinds.mHasBracket && fits("a second with its dominant")) {
+    if (kinds.mHasDottedArrow) arrow(true, "a substitute resolves");
+    if (kinds.mHasBracket && fits("ii and V")) {
         pen.Path(fmt::format("M{} {}v5h24v-5", SvgNumber(x), SvgNumber(y - 6)), "arc");
         explain(24, "ii and V");
     }
     const bool hasKeys = !score.mMarks.empty() && !score.mMarks[0].mKeys.empty() &&
                          !score.mMarks[0].mKeys[0].mKey.mRootKeyEnh.IsUndef();
-    if (hasKeys && fits("the color is that of the key")) {
+    if (hasKeys && fits("color of the key")) {
         pen.Rect(x, y - 8, 14, 9, BandStyle(score.mMarks[0].mKeys[0].mKey));
-        explain(14, "the color is that of the key");
+        explain(14, "color of the key");
     }
 }
 
