@@ -77,7 +77,8 @@ private:
 
     void WriteHead(const CShownCenter& center) {
         const bool hasChords = !center.mChords.empty();
-        const std::string head = (hasChords ? "Center " : "also heard: ") + center.mName;
+        const std::string head =
+            (hasChords || center.mHarmCenter.IsUndef() ? "Center " : "also heard: ") + center.mName;
         std::string details = hasChords
                                   ? ", " + BarsOf(center.mRange, mBars)
                                   : fmt::format(", from bar {}", mBars.BarOf(center.mRange.mBegin));

@@ -3,16 +3,19 @@
 #include "brindle/present/internal/ReadingBars.h"
 
 #include <algorithm>
+#include <iterator>
 #include <map>
+#include <queue>
 #include <tuple>
 
 namespace brindle {
 namespace {
 
-/// A shorter passage is no news in a song that is longer.
-constexpr TPlace kShortestPassage = 4;
-constexpr TPlace kShortestOfShortSong = 2;
-constexpr std::size_t kShortSong = 16;
+/// A passage is worth a word from an eighth of the song on, but not below four bars, and from eight
+/// on in any song.
+TPlace ShortestPassage(std::size_t barCount) {
+    return static_cast<TPlace>(std::clamp<std::size_t>(barCount / 8, 4, 8));
+}
 
 /// What sounds from a beat of a bar on.
 using TSound = std::tuple<double, int, int, std::uint64_t>;
@@ -86,10 +89,47 @@ std::vector<TPlace> LongestEarlier(const CSuffixes& suffixes) {
     return longest;
 }
 
-bool AreAllEqual(const std::vector<TPlace>& numbers, TPlace begin, TPlace count) {
-    const auto first = numbers.begin() + static_cast<std::ptrdiff_t>(begin);
-    return std::all_of(first, first + static_cast<std::ptrdiff_t>(count),
+/// A passage that repeats an earlier one.
+struct TPassage {
+    TPlace mPlace = 0;
+    TPlace mCount = 0;
+
+    /// The longest comes first, of those the earliest.
+    friend bool operator<(const TPassage& a, const TPassage& b) {
+        return a.mCount != b.mCount ? a.mCount < b.mCount : a.mPlace > b.mPlace;
+    }
+};
+
+bool AreAllEqual(const std::vector<TPlace>& numbers, const TPassage& passage) {
+    const auto first = numbers.begin() + static_cast<std::ptrdiff_t>(passage.mPlace);
+    return std::all_of(first, first + static_cast<std::ptrdiff_t>(passage.mCount),
                        [&](TPlace number) { return number == *first; });
+}
+
+/// The longest passages that do not overlap, by place. What a longer one leaves of a passage is
+/// tried again; each place is in the queue once at a time.
+std::map<TPlace, TPlace> LongestPassages(const std::vector<TPlace>& longest, TPlace shortest) {
+    std::priority_queue<TPassage> queue;
+    for (TPlace place = 0; place < longest.size(); ++place) {
+        if (longest[place] >= shortest) queue.push({place, longest[place]});
+    }
+    std::map<TPlace, TPlace> taken;
+    while (!queue.empty()) {
+        TPassage passage = queue.top();
+        queue.pop();
+        const auto behind = taken.upper_bound(passage.mPlace);
+        const bool isCovered =
+            behind != taken.begin() &&
+            std::prev(behind)->first + std::prev(behind)->second > passage.mPlace;
+        if (isCovered) continue;
+        if (behind != taken.end() && behind->first < passage.mPlace + passage.mCount) {
+            passage.mCount = behind->first - passage.mPlace;
+            if (passage.mCount >= shortest) queue.push(passage);
+        } else {
+            taken.emplace(passage.mPlace, passage.mCount);
+        }
+    }
+    return taken;
 }
 
 }  // namespace
@@ -100,20 +140,14 @@ std::vector<CRepeatedBars> RepeatedBarsOf(const CSong& song, const CBars& bars,
     if (readingBars.size() < 2) return repeats;
     const std::vector<TPlace> numbers = CBarNumbers(song, bars).NumbersOf(readingBars);
     const CSuffixes suffixes(numbers);
-    const std::vector<TPlace> longest = LongestEarlier(suffixes);
-    const TPlace shortest =
-        readingBars.size() <= kShortSong ? kShortestOfShortSong : kShortestPassage;
-    for (TPlace place = 0; place < suffixes.Count();) {
-        const TPlace count = longest[place];
-        if (count < shortest || AreAllEqual(numbers, place, count)) {
-            ++place;
-            continue;
-        }
+    const auto passages =
+        LongestPassages(LongestEarlier(suffixes), ShortestPassage(readingBars.size()));
+    for (const auto& [place, count] : passages) {
+        if (AreAllEqual(numbers, {place, count})) continue;
         const TPlace source = suffixes.NextPlace(suffixes.RanksOfPassage(place, count), 0);
         const CReadingBar& last = readingBars[place + count - 1];
         const long first = readingBars[place].mNumber;
         repeats.push_back({first, readingBars[source].mNumber, last.mNumber + last.mCount - first});
-        place += count;
     }
     return repeats;
 }
