@@ -29,8 +29,20 @@ TEST_CASE("A song stands four bars a line, chords over numerals, keys where they
     CHECK(Shown("Dm7 G7 | Cmaj7 | Fm7 Bb7 | Ebmaj7 | Am7b5 D7 | Gm |") ==
           "6 bars\n"
           "\n"
-          "Key of the song Eb Major, hardly shown by the chords (confidence 0.34)\n"
-          "\n");
+          "Key of the song C Major, doubtful (confidence 0.54)\n"
+          "\n"
+          "    C Major               Eb Major\n"
+          "1 | Dm7      G7 | Cmaj7 | Fm7       Bb7 | Ebmaj7 |\n"
+          "  | ii7      V7 | I^7   | ii7       V7  | I^7    |\n"
+          "\n"
+          "    G Minor\n"
+          "5 | Am7b5    D7 | Gm    |\n"
+          "  | iih7     V7 | i     |\n"
+          "\n"
+          "Notes\n"
+          "  bars 1 to 2: ii V I of C Major\n"
+          "  bars 3 to 4: ii V I of Eb Major\n"
+          "  bars 5 to 6: ii V i of G Minor\n");
 }
 
 TEST_CASE("A line has as many bars as its width holds, and no line is wider") {
@@ -55,7 +67,9 @@ TEST_CASE("What repeats is told in whole bars") {
 }
 
 TEST_CASE("Bars that hold a chord show it, and a long row of them its number") {
-    CHECK(Has(Shown("C | . | F G | . Am | C |"), "1 | C | . | F  G"));
+    const std::string held = Shown("C | . | F G | . Am | C |");
+    CAPTURE(held);
+    CHECK(Has(held, "1 | C | . | F   G | .  Am |\n"));
     CSong song = ReadSong("C F G7 C");
     song.mBars.clear();
     song.mChords.back().mPosition = 4000.0;
