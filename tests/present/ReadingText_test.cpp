@@ -90,6 +90,13 @@ TEST_CASE("Keys that contradict are told") {
     CHECK(Has(Shown(song), "The stated key is A Minor, but the chords show C Major.\n"));
 }
 
+TEST_CASE("A key in which no passage is heard is told to be one") {
+    const std::string_view word =
+        "No passage is heard in C Major itself, only in keys around it.\n";
+    CHECK(Has(Shown("C D"), word));
+    CHECK(!Has(Shown("C F G7 C"), word));
+}
+
 TEST_CASE("Well-known forms have one key, the one that musicians name") {
     CHECK(Has(Shown("Am | F | C | G | Am | F | C | G |"), "Key of the song C Major"));
     CHECK(Has(Shown("C7 | F7 | C7 | C7 | F7 | F7 | C7 | C7 | G7 | F7 | C7 | G7 |"),

@@ -8,6 +8,7 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
 #include <map>
 #include <utility>
 
@@ -187,6 +188,13 @@ std::vector<std::string> KeyContradictions(const CSong& song, const CSongReading
     const std::string read = reading.mKey.NameLong(NamePrefs());
     const std::string shown = found.NameLong(NamePrefs());
     const bool isFound = SoundsAlike(found, reading.mKey);
+    const bool isHeard = std::any_of(
+        reading.mRegions.begin(), reading.mRegions.end(),
+        [&](const CKeyRegion& region) { return SoundsAlike(region.mKey, reading.mKey); });
+    if (!isHeard) {
+        lines.push_back(
+            fmt::format("No passage is heard in {} itself, only in keys around it.", read));
+    }
     const bool isStated = song.mStatedKey && !song.mStatedKey->IsUndef();
     if (isStated && !SoundsAlike(*song.mStatedKey, reading.mKey)) {
         lines.push_back(fmt::format("The stated key is {}, but the chords show {}.",
