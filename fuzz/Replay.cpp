@@ -24,16 +24,19 @@ void Replay(const std::filesystem::path& path) {
 
 int main(int argc, char** argv) {
     int count = 0;
-    for (int i = 1; i < argc; ++i) {
-        if (std::filesystem::is_directory(argv[i])) {
-            for (const auto& entry : std::filesystem::directory_iterator(argv[i])) {
+    // A target may leave the folder.
+    std::vector<std::filesystem::path> paths;
+    for (int i = 1; i < argc; ++i) paths.push_back(std::filesystem::absolute(argv[i]));
+    for (const auto& path : paths) {
+        if (std::filesystem::is_directory(path)) {
+            for (const auto& entry : std::filesystem::directory_iterator(path)) {
                 if (entry.is_regular_file()) {
                     Replay(entry.path());
                     ++count;
                 }
             }
         } else {
-            Replay(argv[i]);
+            Replay(path);
             ++count;
         }
     }

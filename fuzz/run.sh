@@ -4,7 +4,7 @@
 set -euo pipefail
 source "$(dirname "$(readlink -f "${BASH_SOURCE[0]}")")/../cmake/setup.sh"
 need_packages clang libclang-rt-14-dev
-build fuzz all
+build fuzz fuzzers
 
 for source in "$root"/fuzz/*_fuzz.cpp; do
     name=$(basename "$source" .cpp) subject=$(basename "$source" _fuzz.cpp)
@@ -13,6 +13,8 @@ for source in "$root"/fuzz/*_fuzz.cpp; do
     options=(-max_total_time="${1:-10}" -max_len=65536 -timeout=10 -rss_limit_mb=2048 -print_final_stats=1
              -artifact_prefix="$root/build/fuzz/$name-")
     [ ! -f "$root/fuzz/$subject.dict" ] || options+=(-dict="$root/fuzz/$subject.dict")
+    # Options of one fuzzer: an input that takes long is cut, longer seeds are replayed by the tests.
+    [ ! -f "$root/fuzz/$subject.options" ] || mapfile -t -O "${#options[@]}" options <"$root/fuzz/$subject.options"
     mkdir -p "$found"
     if ! "$root/build/fuzz/bin/$name" "${options[@]}" "$found" "$root/fuzz/corpus/$subject" >"$log" 2>&1; then
         tail -40 "$log"
