@@ -6,6 +6,7 @@
 
 #include <fstream>
 #include <iostream>
+#include <string>
 
 int main(int argc, char** argv) {
     const brindle::CSong song =
@@ -19,4 +20,9 @@ int main(int argc, char** argv) {
     std::cout << found.mKeys.mKey.NameLong(brindle::CurrentChordNamePrefs) << '\n';
     std::ofstream("song.json") << brindle::AnalysisJson(song, found);
     std::ofstream("song.svg") << brindle::AnalysisSvg(brindle::ShowSong(song, found));
+
+    const brindle::CSongReading reading = brindle::ReadSongHarmony(song);
+    for (const std::string& sentence : brindle::Explain(song, reading)) {
+        if (!sentence.empty()) std::cout << sentence << '\n';
+    }
 }
