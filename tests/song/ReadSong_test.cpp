@@ -139,6 +139,9 @@ TEST_CASE("Typed songs are played as scores are") {
     };
     const TRow rows[] = {
         {"C | F Fine | G | D.C. al Fine", "C F G C F"},
+        {"C | F Fine | G | D C al Fine", "C F G C F"},
+        {"C | F Fine | G | D. C.", "C F G C F"},
+        {"G D C G", "G D C G"},
         {"C | Segno F | G | D.S.", "C F G F G"},
         {"C | \U0001D10B F | To Coda | G | D.S. al Coda | Coda Am |", "C F G F Am"},
         {"C | F \U0001D10C | G | D.C. al Coda | \U0001D10C Am |", "C F G C F Am"},

@@ -73,6 +73,7 @@ std::string_view WordAt(std::string_view text, std::size_t pos) {
 std::size_t LengthOfPlayWords(std::string_view text) {
     if (text.starts_with(kSegnoSign)) return kSegnoSign.size();
     std::string joined;
+    bool hasBareLetter = false;
     std::size_t found = 0;
     std::size_t end = 0;
     for (int count = 0; count < kMostWords; ++count) {
@@ -82,7 +83,11 @@ std::size_t LengthOfPlayWords(std::string_view text) {
         end += word.size();
         if (count == 0 && IsTimes(folded)) return end;
         joined += folded;
-        if (std::find(kPhrases.begin(), kPhrases.end(), joined) != kPhrases.end()) found = end;
+        hasBareLetter = hasBareLetter || word.size() == 1;
+        // "D C" are two chords, "D. C." and "D C al Fine" are none.
+        const bool areChords = hasBareLetter && joined.size() == 2;
+        const bool isPhrase = std::find(kPhrases.begin(), kPhrases.end(), joined) != kPhrases.end();
+        if (isPhrase && !areChords) found = end;
         while (end < text.size() && (text[end] == ' ' || text[end] == '\t')) ++end;
     }
     return found;
