@@ -63,8 +63,8 @@ struct MusicXmlParserDelegate {
     std::function<void(std::string_view name, std::int32_t midiChannel)>
         didEncounterInstrumentWithName;
     std::function<void(const CMuxmlNote& note)> didEncounterNote;
-    /// A note whose tie never ends, with the length of what is tied to it. Told before the end of the
-    /// part; such a note is no other call.
+    /// A note whose tie never ends, with the length of what is tied to it. Told before the end of
+    /// the part; such a note is no other call.
     std::function<void(const CMuxmlNote& note)> didLeaveTieOpen;
     std::function<void(const CPositionedXMLElement& direction)> didEncounterDirection;
     /// `didEncounterCtrChangePedal:pedalType:value:` Not sent.

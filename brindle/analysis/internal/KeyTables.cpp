@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 // Made by tools/make_reading_model.py from data/reading-model.json. The figures were counted and
-// fitted by us on annotated chord corpora: When in Rome, Jazz Harmony Treebank, a jazz chord corpus,
-// McGill Billboard and Nottingham.
+// fitted by us on annotated chord corpora: When in Rome, Jazz Harmony Treebank, a jazz chord
+// corpus, McGill Billboard and Nottingham.
 
 #include "brindle/analysis/internal/KeyTables.h"
 
