@@ -67,16 +67,17 @@ private:
 using TWriteBytes = std::function<bool(int file)>;
 
 /// Writes to `scratch`, with some letters behind it, and renames that. The rights are exact, or
-/// those of a new file without them.
-bool ReplaceFile(const fs::path& path, fs::path scratch, std::optional<mode_t> rights,
+/// those of a new file where `rights` is null.
+bool ReplaceFile(const fs::path& path, fs::path scratch, const mode_t* rights,
                  const TWriteBytes& writeBytes) {
     constexpr mode_t kNewFileRights = 0666;
     ScratchEntries::RemoveOld(scratch);
-    COpenFile file(ScratchEntries::OpenNewFile(scratch, rights.value_or(kNewFileRights)));
+    COpenFile file(
+        ScratchEntries::OpenNewFile(scratch, rights != nullptr ? *rights : kNewFileRights));
     if (!file.IsOpen()) return false;
     const ScratchEntries::CRemover remover(scratch);
-    const bool ok = (!rights || fchmod(file.Get(), *rights) == 0) && writeBytes(file.Get()) &&
-                    fsync(file.Get()) == 0;
+    const bool ok = (rights == nullptr || fchmod(file.Get(), *rights) == 0) &&
+                    writeBytes(file.Get()) && fsync(file.Get()) == 0;
     if (!file.Close() || !ok || rename(scratch.c_str(), path.c_str()) != 0) return false;
     WholeFiles::FlushFolder(path.parent_path());
     return true;
@@ -99,8 +100,8 @@ bool WriteFile(const fs::path& path, const fs::path& scratchFolder, const TWrite
     const auto target = WholeFiles::BehindLinks(path);
     if (!target) return false;
     const fs::path scratch = scratchFolder.empty() ? *target : scratchFolder / target->filename();
-    const auto rights = isThere ? std::optional<mode_t>(status.st_mode & 07777) : std::nullopt;
-    return ReplaceFile(*target, scratch, rights, writeBytes);
+    const mode_t rights = isThere ? status.st_mode & 07777 : 0;
+    return ReplaceFile(*target, scratch, isThere ? &rights : nullptr, writeBytes);
 }
 
 }  // namespace
