@@ -122,7 +122,8 @@ bool WriteFileAtomically(const fs::path& path, const std::function<void(std::ost
 }
 
 bool WritePrivateFileAtomically(const fs::path& path, std::string_view bytes) {
-    return ReplaceFile(path, path, 0600,
+    constexpr mode_t kPrivate = 0600;
+    return ReplaceFile(path, path, &kPrivate,
                        [bytes](int file) { return WholeFiles::WriteAll(file, bytes); });
 }
 

@@ -6,6 +6,7 @@
 #include <nlohmann/json.hpp>
 
 #include <fstream>
+#include <utility>
 
 namespace brindle::test {
 namespace {
@@ -18,9 +19,11 @@ nlohmann::json ModelJson() {
 // A table in tenths as the JSON has it.
 template <class TTable>
 nlohmann::json InPoints(const TTable& table) {
-    nlohmann::json rows = table;
-    for (nlohmann::json& row : rows) {
-        for (nlohmann::json& cell : row) cell = cell.get<double>() / 10.0;
+    nlohmann::json rows = nlohmann::json::array();
+    for (const auto& row : table) {
+        nlohmann::json cells = nlohmann::json::array();
+        for (const auto tenths : row) cells.push_back(tenths / 10.0);
+        rows.push_back(std::move(cells));
     }
     return rows;
 }
