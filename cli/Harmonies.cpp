@@ -77,6 +77,10 @@ TStatus FromNotes(const TTypedSong& song, const THarmoniesOptions& options) {
 }
 
 TStatus Harmonies(const THarmoniesOptions& options) {
+    const bool isOfNotes = !options.mKey.empty() || options.mEvery != "change";
+    if (isOfNotes && !options.mIsFromNotes) {
+        return Fail(TStatus::BadUsage, "--key and --every go with --from-notes");
+    }
     const auto typed = ReadTypedSong({}, options.mFile);
     if (!typed) return TStatus::BadInput;
     if (options.mIsFromNotes) return FromNotes(*typed, options);

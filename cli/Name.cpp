@@ -60,6 +60,16 @@ std::optional<int> ReadNeighbour(const std::string& option, const std::string& t
     return std::nullopt;
 }
 
+bool IsAsPlayed(const TNameOptions& options) {
+    return options.mMethod == "notes" || options.mMethod == "both";
+}
+
+/// Whether anything is told that only the names as played take up.
+bool HasContext(const TNameOptions& options) {
+    return !options.mKey.empty() || !options.mBefore.empty() || !options.mAfter.empty() ||
+           options.mBass != "usual" || options.mIsExact || options.mCandidates != 1;
+}
+
 /// Reads what was told about the notes besides themselves. False after an error.
 bool ReadContext(TNameOptions& options) {
     if (!options.mKey.empty()) {
@@ -77,6 +87,12 @@ bool ReadContext(TNameOptions& options) {
         static_cast<void>(Fail(TStatus::BadUsage, "--progression goes with --method notes"));
         return false;
     }
+    if (!IsAsPlayed(options) && HasContext(options)) {
+        static_cast<void>(Fail(TStatus::BadUsage,
+                               "--key, --before, --after, --bass, --candidates and --exact go with "
+                               "--method notes or both"));
+        return false;
+    }
     if (options.mAllRoots) options.mCandidates = kMostCandidates;
     return ReadRoot(options);
 }
@@ -90,6 +106,7 @@ TStatus Name(TNameOptions options) {
     for (const std::string& line : *lines) {
         const std::string typed = FoldAccidentals(line);
         TNotesText notes = ReadNotesText(typed, options.mNaming.Prefs());
+        if (notes.mError.empty() && notes.mTyped.empty()) notes.mError = "there are no notes";
         if (notes.mError.empty()) {
             sets.push_back(std::move(notes));
         } else {
@@ -97,9 +114,8 @@ TStatus Name(TNameOptions options) {
         }
     }
     if (sets.empty()) return status;
-    const bool isAsPlayed = options.mMethod == "notes" || options.mMethod == "both";
     const TStatus printed =
-        Print(isAsPlayed ? NameAsPlayed(sets, options) : NameByRoot(sets, options));
+        Print(IsAsPlayed(options) ? NameAsPlayed(sets, options) : NameByRoot(sets, options));
     return printed == TStatus::Success ? status : printed;
 }
 
@@ -123,7 +139,7 @@ void AddName(CCommand& program) {
         .InRange(1, kMostCandidates);
     command.AddFlag("--exact", options->mIsExact, "Say all that is left out: C7(no5)");
     command.AddOption("--root", "KEY", options->mRoot, "The root; without it, it is searched");
-    command.AddFlag("--all-roots", options->mAllRoots, "The names with each of the twelve roots");
+    command.AddFlag("--all-roots", options->mAllRoots, "The names with each root that has one");
     options->mFormat.AddTo(command, {"text", "json"});
     options->mNaming.AddTo(command);
     command.OnCall([options] { return Name(*options); });

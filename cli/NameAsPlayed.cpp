@@ -35,6 +35,14 @@ TNamesOfSets AllNames(const std::vector<TNotesText>& sets, const TNameOptions& o
         std::stable_partition(ofSet.begin(), ofSet.end(), [&](const CNamedChord& name) {
             return name.mRoot.mKeyNr == options.mRootKey.mKeyNr;
         });
+        const bool isOfRoot = options.mRootKey.IsUndef() || ofSet.empty() ||
+                              ofSet.front().mRoot.mKeyNr == options.mRootKey.mKeyNr;
+        if (isOfRoot) continue;
+        static_cast<void>(Fail(TStatus::BadInput,
+                               fmt::format("these notes have no name over {}; --method net names "
+                                           "them over any root",
+                                           options.mRoot)));
+        ofSet.clear();
     }
     return names;
 }

@@ -4,6 +4,7 @@
 #include "cli/Output.h"
 
 #include "brindle/theory/CChordNamePrefs.h"
+#include "brindle/theory/KeyIntervals.h"
 
 #include <fmt/format.h>
 
@@ -51,8 +52,11 @@ public:
         if (!octaveNr)
             return fmt::format("behind the key stands its octave, not {}", Printable(octave));
         const int octaveOfMiddleC = 3 + mPrefs.mOctaveNaming;
-        return Add((std::int64_t{*octaveNr} - octaveOfMiddleC) * 12 + kMiddleC + key.mKeyNr,
-                   key.mEnh, word);
+        // The octave is that of the letter: Cb4 is below C4.
+        const int signs = EnhToSemitone(key.mEnh);
+        const int aboveC = FoldIntoOctave(key.mKeyNr - signs) + signs;
+        return Add((std::int64_t{*octaveNr} - octaveOfMiddleC) * 12 + kMiddleC + aboveC, key.mEnh,
+                   word);
     }
 
     [[nodiscard]] TNotesText Notes() && { return std::move(mNotes); }
@@ -79,6 +83,12 @@ private:
     std::int64_t mNext = kMiddleC;
 };
 
+/// With the octave of its letter: note 60 is C4 or B#3.
+std::string NoteText(const CNote& note, const CChordNamePrefs& prefs) {
+    const std::int64_t natural = note.mNoteNr - EnhToSemitone(note.mEnh);
+    return note.KeyName(prefs) + CNote(std::max<std::int64_t>(natural, 0), TEnh_n).OctName(prefs);
+}
+
 }  // namespace
 
 TNotesText ReadNotesText(std::string_view text, const CChordNamePrefs& prefs) {
@@ -97,7 +107,7 @@ TNotesText ReadNotesText(std::string_view text, const CChordNamePrefs& prefs) {
 std::string NotesName(std::span<const CNote> notes, const CChordNamePrefs& prefs) {
     std::string name;
     for (const CNote& note : notes) {
-        name += (name.empty() ? "" : " ") + note.KeyName(prefs) + note.OctName(prefs);
+        name += (name.empty() ? "" : " ") + NoteText(note, prefs);
     }
     return name;
 }
@@ -105,8 +115,7 @@ std::string NotesName(std::span<const CNote> notes, const CChordNamePrefs& prefs
 Json NotesToJson(std::span<const CNote> notes, const CChordNamePrefs& prefs) {
     Json list = Json::array();
     for (const CNote& note : notes) {
-        list.push_back(
-            {{"Name", note.KeyName(prefs) + note.OctName(prefs)}, {"NoteNr", note.mNoteNr}});
+        list.push_back({{"Name", NoteText(note, prefs)}, {"NoteNr", note.mNoteNr}});
     }
     return list;
 }
