@@ -15,14 +15,14 @@ using namespace brindle;
 
 namespace {
 
-struct TChord {
+struct CChord {
     CChordHeavy mChord;
     int mRootKeyNr;
 };
 
 /// Major and minor triads and dominant sevenths in all keys and inversions.
-std::vector<TChord> Chords() {
-    std::vector<TChord> chords;
+std::vector<CChord> Chords() {
+    std::vector<CChord> chords;
     for (const CIntvlSet& shape :
          {CIntvlSet(0, 4, 7), CIntvlSet(0, 3, 7), CIntvlSet(0, 4, 7, 10)}) {
         for (int root = 48; root < 60; ++root) {
@@ -40,7 +40,7 @@ std::vector<TChord> Chords() {
 }
 
 void PointsOfAllKeys(benchmark::State& state) {
-    const std::vector<TChord> chords = Chords();
+    const std::vector<CChord> chords = Chords();
     std::size_t ix = 0;
     int sum = 0;
     for (auto _ : state) {
@@ -68,7 +68,7 @@ void DecideByNet(benchmark::State& state) {
 BENCHMARK(DecideByNet);
 
 void FindAndSpell(benchmark::State& state, TSingleChordAnalysisAlgo algo) {
-    const std::vector<TChord> chords = Chords();
+    const std::vector<CChord> chords = Chords();
     std::size_t ix = 0;
     int wrong = 0;
     for (auto _ : state) {

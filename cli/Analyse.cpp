@@ -31,7 +31,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr TCommandHelp kHelp{
+constexpr CCommandHelp kHelp{
     "analyse",
     "Read a song as a teacher does: keys, numerals, what each chord is and leads to",
     "  brindle analyse \"Dm7 G7 | C\"\n"
@@ -52,7 +52,7 @@ constexpr TCommandHelp kHelp{
 constexpr double kShortest = 1.0 / 1024;
 constexpr double kLongest = 1024.0;
 
-struct TAnalyseOptions {
+struct CAnalyseOptions {
     std::vector<std::string> mWords;
     std::string mFile;
     std::string mRoute = "tonic";
@@ -77,7 +77,7 @@ TAnalyse RouteOf(const std::string& name) {
 }
 
 // What is wrong with options that are fine one by one.
-std::optional<std::string> Contradiction(const TAnalyseOptions& options) {
+std::optional<std::string> Contradiction(const CAnalyseOptions& options) {
     if (options.mWords.empty() && options.mFile.empty()) {
         return "a song is needed: a TEXT, a score, --file PATH, or - for standard input";
     }
@@ -105,7 +105,7 @@ std::optional<std::string> Contradiction(const TAnalyseOptions& options) {
 }
 
 /// A song that has been analysed, and what its presentations need beside that.
-struct TAnalysedSong {
+struct CAnalysedSong {
     CHarmonicAnalyse mAnalyse;
     CHarmAnlsCenters mReadings;
     std::optional<CChordSymbols> mSymbols;
@@ -118,7 +118,7 @@ struct TAnalysedSong {
     std::vector<std::string> mExplanations;
 };
 
-CShownSong SongOf(const TAnalysedSong& analysed, const TAnalyseOptions& options) {
+CShownSong SongOf(const CAnalysedSong& analysed, const CAnalyseOptions& options) {
     const CHarmAnlsCenters* readings = options.mReadings ? &analysed.mReadings : nullptr;
     if (analysed.mSheet) {
         return MakeSong(analysed.mAnalyse, readings, *analysed.mSymbols, *analysed.mSheet);
@@ -126,7 +126,7 @@ CShownSong SongOf(const TAnalysedSong& analysed, const TAnalyseOptions& options)
     return MakeSong(analysed.mAnalyse, readings, *analysed.mSymbols, analysed.mBeatsPerBar);
 }
 
-CShownKeys KeysOf(const TAnalysedSong& analysed) {
+CShownKeys KeysOf(const CAnalysedSong& analysed) {
     const double beatsPerBar =
         analysed.mSheet ? BeatsPerBarOf(*analysed.mSheet) : analysed.mBeatsPerBar;
     return MakeSongKeys(analysed.mAnalyse.mChords, *analysed.mSymbols,
@@ -141,17 +141,17 @@ std::string Picture(const CShownSong& song, bool withGrids) {
 }
 
 // Readings and grids are drawn over the time axis alone.
-bool IsLeadSheet(const TAnalyseOptions& options) {
+bool IsLeadSheet(const CAnalyseOptions& options) {
     return options.mFormat.Format() == TFormat::Svg && !options.mSheetPicture.IsAxis() &&
            !options.mReadings && !options.mGrids;
 }
 
 /// Another route than the usual one is asked for to see its centers.
-bool WantsCenters(const TAnalyseOptions& options) {
+bool WantsCenters(const CAnalyseOptions& options) {
     return options.mCenters || options.mReadings || options.mRoute != "tonic";
 }
 
-std::string Text(const TAnalysedSong& analysed, const TAnalyseOptions& options) {
+std::string Text(const CAnalysedSong& analysed, const CAnalyseOptions& options) {
     const CPaint paint = PaintOfOutput();
     std::string text =
         ReadingText(analysed.mSong, analysed.mReading,
@@ -161,7 +161,7 @@ std::string Text(const TAnalysedSong& analysed, const TAnalyseOptions& options) 
     return text;
 }
 
-std::string AnalysedJson(const TAnalysedSong& analysed, const TAnalyseOptions& options) {
+std::string AnalysedJson(const CAnalysedSong& analysed, const CAnalyseOptions& options) {
     const CReadSong read{analysed.mSong, analysed.mReading, analysed.mExplanations};
     const bool isPlayed = options.mTiming == "played" || !analysed.mSheet;
     return AnalysisJson(
@@ -173,7 +173,7 @@ std::string AnalysedJson(const TAnalysedSong& analysed, const TAnalyseOptions& o
         isPlayed ? &read : nullptr);
 }
 
-std::string Present(const TAnalysedSong& analysed, const TAnalyseOptions& options) {
+std::string Present(const CAnalysedSong& analysed, const CAnalyseOptions& options) {
     switch (options.mFormat.Format()) {
         case TFormat::Json:
             return AnalysedJson(analysed, options);
@@ -194,8 +194,8 @@ std::string Present(const TAnalysedSong& analysed, const TAnalyseOptions& option
     return Text(analysed, options);
 }
 
-TStatus AnalyseText(const TTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
-                    const TAnalyseOptions& options, TAnalysedSong& analysed) {
+TStatus AnalyseText(const CTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
+                    const CAnalyseOptions& options, CAnalysedSong& analysed) {
     TChordStringParse parse;
     parse.mBeatsPerBar = options.mBeatsPerBar;
     parse.mBeatsPerChord = options.mBeatsPerChord;
@@ -212,8 +212,8 @@ TStatus AnalyseText(const TTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
     return TStatus::Success;
 }
 
-TStatus AnalyseScore(const TTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
-                     const TAnalyseOptions& options, TAnalysedSong& analysed) {
+TStatus AnalyseScore(const CTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
+                     const CAnalyseOptions& options, CAnalysedSong& analysed) {
     analysed.mSheet =
         ReadLeadSheet(typed, options.mTiming == "native" ? TTiming::Native : TTiming::Played);
     if (!analysed.mSheet) return TStatus::BadInput;
@@ -235,8 +235,8 @@ TStatus AnalyseScore(const TTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
     return TStatus::Success;
 }
 
-void ReadHarmonyOf(TAnalysedSong& analysed, const CHarmAnlsSignKeys& signKeys,
-                   const TAnalyseOptions& options) {
+void ReadHarmonyOf(CAnalysedSong& analysed, const CHarmAnlsSignKeys& signKeys,
+                   const CAnalyseOptions& options) {
     CReadingOptions reading;
     if (!signKeys.empty()) {
         reading.mStatedKey = signKeys.front().mSignKey;
@@ -246,7 +246,7 @@ void ReadHarmonyOf(TAnalysedSong& analysed, const CHarmAnlsSignKeys& signKeys,
     if (options.mExplain) analysed.mExplanations = Explain(analysed.mSong, analysed.mReading);
 }
 
-TStatus Analyse(const TAnalyseOptions& options) {
+TStatus Analyse(const CAnalyseOptions& options) {
     if (const auto contradiction = Contradiction(options)) {
         return Fail(TStatus::BadUsage, *contradiction);
     }
@@ -262,7 +262,7 @@ TStatus Analyse(const TAnalyseOptions& options) {
     const auto typed = ReadTypedSong(options.mWords, options.mFile);
     if (!typed) return TStatus::BadInput;
 
-    TAnalysedSong analysed;
+    CAnalysedSong analysed;
     const TStatus status = typed->mIsScore ? AnalyseScore(*typed, signKeys, options, analysed)
                                            : AnalyseText(*typed, signKeys, options, analysed);
     if (status != TStatus::Success) return status;
@@ -281,7 +281,7 @@ TStatus Analyse(const TAnalyseOptions& options) {
 
 void AddAnalyse(CCommand& program) {
     CCommand& command = program.AddCommand(kHelp);
-    const auto options = std::make_shared<TAnalyseOptions>();
+    const auto options = std::make_shared<CAnalyseOptions>();
     AddSongSource(command, options->mWords, options->mFile);
     command.AddChoice("--route", options->mRoute, {"tonic", "cadence", "weights", "none"},
                       "How centers are searched");

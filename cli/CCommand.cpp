@@ -93,20 +93,20 @@ COption& COption::InGroup(const std::string& heading) {
     return *this;
 }
 
-CCommand::CCommand(const TCommandHelp& help, const std::string& version)
+CCommand::CCommand(const CCommandHelp& help, const std::string& version)
     : mApp(std::make_shared<CLI::App>(help.mPurpose, help.mName)),
       mStatus(std::make_shared<TStatus>(TStatus::Success)) {
     mApp->set_version_flag("--version", version);
     ShowExamplesFirst(*mApp, help.mExamples);
 }
 
-CCommand::CCommand(CCommand& above, const TCommandHelp& help)
+CCommand::CCommand(CCommand& above, const CCommandHelp& help)
     : mApp(above.mApp->get_subcommand_ptr(above.mApp->add_subcommand(help.mName, help.mPurpose))),
       mStatus(above.mStatus) {
     ShowExamplesFirst(*mApp, help.mExamples);
 }
 
-CCommand& CCommand::AddCommand(const TCommandHelp& help) {
+CCommand& CCommand::AddCommand(const CCommandHelp& help) {
     mApp->require_subcommand(1);
     mCommands.push_back(CCommand(*this, help));
     return mCommands.back();

@@ -18,7 +18,7 @@ class Option;
 namespace brindle::cli {
 
 /// What a command is called, what it does, and calls of it that work.
-struct TCommandHelp {
+struct CCommandHelp {
     const char* mName;
     const char* mPurpose;
     /// They stand at the top of the help; null for those of the command above.
@@ -53,10 +53,10 @@ private:
 class CCommand {
 public:
     /// The program.
-    CCommand(const TCommandHelp& help, const std::string& version);
+    CCommand(const CCommandHelp& help, const std::string& version);
 
     /// Adds a command, of which the command line then has to tell one.
-    CCommand& AddCommand(const TCommandHelp& help);
+    CCommand& AddCommand(const CCommandHelp& help);
 
     /// What is told without a name: one word, or several.
     COption AddArgument(const std::string& name, std::string& word, const std::string& purpose);
@@ -87,7 +87,7 @@ public:
     [[nodiscard]] TStatus Run(int argc, const char* const* argv);
 
 private:
-    CCommand(CCommand& above, const TCommandHelp& help);
+    CCommand(CCommand& above, const CCommandHelp& help);
 
     std::shared_ptr<CLI::App> mApp;
     /// How the command that is called ends; one for the program and all its commands.

@@ -11,7 +11,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr TCommandHelp kHelp{
+constexpr CCommandHelp kHelp{
     "chord",
     "Read chord symbols: root, bass, semitones, basic chord and hash code",
     "  brindle chord F#m7/C# Bb13\n"
@@ -20,18 +20,18 @@ constexpr TCommandHelp kHelp{
     "  cat symbols.txt | brindle chord -\n",
 };
 
-struct TChordOptions {
+struct CChordOptions {
     std::vector<std::string> mSymbols;
     CTypedChords mReading;
     CFormatOptions mFormat;
 };
 
-TStatus Chord(const TChordOptions& options) {
+TStatus Chord(const CChordOptions& options) {
     const auto symbols = TypedSymbols(options.mSymbols);
     if (!symbols) return TStatus::BadInput;
     const auto read = options.mReading.ReadSymbols(*symbols);
     if (!read) return TStatus::BadInput;
-    std::vector<TReadChord> chords;
+    std::vector<CReadChord> chords;
     for (std::size_t i = 0; i < symbols->size(); ++i) {
         chords.push_back({Printable((*symbols)[i]), (*read)[i]});
     }
@@ -43,7 +43,7 @@ TStatus Chord(const TChordOptions& options) {
 
 void AddChord(CCommand& program) {
     CCommand& command = program.AddCommand(kHelp);
-    const auto options = std::make_shared<TChordOptions>();
+    const auto options = std::make_shared<CChordOptions>();
     command.AddArgument("SYMBOL", options->mSymbols, "Chord symbols; - reads standard input")
         .Required();
     options->mReading.AddTo(command);

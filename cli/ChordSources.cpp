@@ -34,21 +34,21 @@ public:
     void Cut() {
         if (!mSource.mSequences.back().empty()) mSource.mSequences.emplace_back();
     }
-    [[nodiscard]] TChordSource Finish() {
+    [[nodiscard]] CChordSource Finish() {
         if (mSource.mSequences.back().empty()) mSource.mSequences.pop_back();
         if (mSource.mSequences.empty() && mSource.mError.empty()) mSource.mError = "no chords";
         return std::move(mSource);
     }
 
 private:
-    TChordSource mSource{{{}}, {}};
+    CChordSource mSource{{{}}, {}};
 };
 
-TChordSource Failed(std::string error) {
+CChordSource Failed(std::string error) {
     return {{}, std::move(error)};
 }
 
-TChordSource FromSong(const CSong& song) {
+CChordSource FromSong(const CSong& song) {
     CSequences sequences;
     // The lines of chord strings do not go on from each other.
     auto section = song.mSections.begin();
@@ -79,7 +79,7 @@ bool HasKnownEnding(const fs::path& path) {
     return std::find(endings.begin(), endings.end(), path.extension().string()) != endings.end();
 }
 
-void AddFolder(const std::string& folder, std::vector<TFoundFile>& files) {
+void AddFolder(const std::string& folder, std::vector<CFoundFile>& files) {
     const std::size_t before = files.size();
     std::error_code error;
     const auto skip = fs::directory_options::skip_permission_denied;
@@ -90,12 +90,12 @@ void AddFolder(const std::string& folder, std::vector<TFoundFile>& files) {
         }
     }
     std::sort(files.begin() + static_cast<std::ptrdiff_t>(before), files.end(),
-              [](const TFoundFile& a, const TFoundFile& b) { return a.mPath < b.mPath; });
+              [](const CFoundFile& a, const CFoundFile& b) { return a.mPath < b.mPath; });
 }
 
 }  // namespace
 
-TChordSource ReadChordSource(const std::string& path, const TChordStringParse& parse,
+CChordSource ReadChordSource(const std::string& path, const TChordStringParse& parse,
                              const CTypedChords& reading) {
     std::error_code error;
     if (!fs::exists(path, error)) return Failed("no such file");
@@ -108,8 +108,8 @@ TChordSource ReadChordSource(const std::string& path, const TChordStringParse& p
     return isGivenUp ? Failed(FaultText(*fault)) : FromSong(song);
 }
 
-std::vector<TFoundFile> FindChordSources(const std::vector<std::string>& paths) {
-    std::vector<TFoundFile> files;
+std::vector<CFoundFile> FindChordSources(const std::vector<std::string>& paths) {
+    std::vector<CFoundFile> files;
     for (const std::string& path : paths) {
         std::error_code error;
         if (fs::is_directory(path, error)) {

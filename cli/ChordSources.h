@@ -12,7 +12,7 @@
 namespace brindle::cli {
 
 /// A file with chords that have lengths.
-struct TChordSource {
+struct CChordSource {
     /// The chords, cut where there is no chord.
     std::vector<CHarmAnlsChordsWithLength> mSequences;
     /// What is wrong, if the file cannot be read.
@@ -21,17 +21,17 @@ struct TChordSource {
 
 /// Reads a lead sheet in MusicXML, chord strings such as (4,C);(2,G7), one a line, or a chord text.
 /// The content tells which of them it is.
-[[nodiscard]] TChordSource ReadChordSource(const std::string& path, const TChordStringParse& parse,
+[[nodiscard]] CChordSource ReadChordSource(const std::string& path, const TChordStringParse& parse,
                                            const CTypedChords& reading);
 
 /// A file that was named or that stands in a folder that was.
-struct TFoundFile {
+struct CFoundFile {
     std::string mPath;
     bool mIsNamed = false;
 };
 
 /// The files themselves and those in the folders, in alphabetic order, whose names end in .xml,
 /// .musicxml, .mxl or .txt.
-[[nodiscard]] std::vector<TFoundFile> FindChordSources(const std::vector<std::string>& paths);
+[[nodiscard]] std::vector<CFoundFile> FindChordSources(const std::vector<std::string>& paths);
 
 }  // namespace brindle::cli

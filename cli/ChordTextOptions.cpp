@@ -29,14 +29,14 @@ void AddBeats(CCommand& command, double& beatsPerBar, double& beatsPerChord) {
                       "Length of a chord in beats (default: 1)");
 }
 
-void CChordTextOptions::AddTo(CCommand& command) {
+void CChordReadingOptions::AddTo(CCommand& command) {
     command.AddArgument("TEXT", mWords, "Chord text; - reads standard input");
     command.AddOption("--file", "PATH", mFile, "Read the chord text from a file");
     AddBeats(command, mBeatsPerBar, mBeatsPerChord);
     mReading.AddTo(command, "In what form the chord text is written");
 }
 
-std::optional<std::string> CChordTextOptions::Contradiction() const {
+std::optional<std::string> CChordReadingOptions::Contradiction() const {
     if (mWords.empty() && mFile.empty()) {
         return "a chord text is needed: a TEXT, --file PATH, or - for standard input";
     }
@@ -50,7 +50,7 @@ std::optional<std::string> CChordTextOptions::Contradiction() const {
     return std::nullopt;
 }
 
-std::optional<TChordSong> CChordTextOptions::ReadSong() const {
+std::optional<CChordSong> CChordReadingOptions::ReadSong() const {
     const auto typed = mFile.empty() ? TextFromWords(mWords) : ReadInput(mFile);
     if (!typed) return std::nullopt;
     TChordStringParse parse;

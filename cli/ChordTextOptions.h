@@ -18,14 +18,14 @@ void AddSongSource(CCommand& command, std::vector<std::string>& words, std::stri
 void AddBeats(CCommand& command, double& beatsPerBar, double& beatsPerChord);
 
 /// The options of a command that reads one chord text: TEXT, --file, the beats, and how it is read.
-class CChordTextOptions {
+class CChordReadingOptions {
 public:
     void AddTo(CCommand& command);
 
     /// What is wrong with options that are fine one by one.
     [[nodiscard]] std::optional<std::string> Contradiction() const;
     /// The song. Nothing when it cannot be read; then the error has been printed.
-    [[nodiscard]] std::optional<TChordSong> ReadSong() const;
+    [[nodiscard]] std::optional<CChordSong> ReadSong() const;
 
 private:
     std::vector<std::string> mWords;

@@ -8,7 +8,7 @@
 #include <vector>
 
 namespace brindle {
-struct TNumeralOptions;
+struct CNumeralOptions;
 }
 
 namespace brindle::cli {
@@ -27,7 +27,7 @@ private:
 };
 
 /// Adds the options that tell how numerals are written.
-void AddNumeralOptions(CCommand& command, TNumeralOptions& options);
+void AddNumeralOptions(CCommand& command, CNumeralOptions& options);
 
 // The subcommands.
 

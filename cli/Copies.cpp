@@ -10,7 +10,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr TCommandHelp kHelp{
+constexpr CCommandHelp kHelp{
     "copies",
     "Find the passages of a song that repeat earlier ones, chord for chord",
     "  brindle copies --beats-per-chord 4 \"C Am F G C Am F G\"\n"
@@ -21,12 +21,12 @@ constexpr TCommandHelp kHelp{
     "line, and . holds the chord before it for one more step.\n",
 };
 
-struct TCopiesOptions {
-    CChordTextOptions mText;
+struct CCopiesOptions {
+    CChordReadingOptions mText;
     CFormatOptions mFormat;
 };
 
-TStatus Copies(const TCopiesOptions& options) {
+TStatus Copies(const CCopiesOptions& options) {
     if (const auto contradiction = options.mText.Contradiction()) {
         return Fail(TStatus::BadUsage, *contradiction);
     }
@@ -44,7 +44,7 @@ TStatus Copies(const TCopiesOptions& options) {
 
 void AddCopies(CCommand& program) {
     CCommand& command = program.AddCommand(kHelp);
-    const auto options = std::make_shared<TCopiesOptions>();
+    const auto options = std::make_shared<CCopiesOptions>();
     options->mText.AddTo(command);
     options->mFormat.AddTo(command, {"text", "json"});
     command.OnCall([options] { return Copies(*options); });

@@ -13,7 +13,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr TCommandHelp kHelp{
+constexpr CCommandHelp kHelp{
     "function",
     "Tell the function of chords in a key: Roman numerals and function letters",
     "  brindle function Dm7 G7 C --key C\n"
@@ -21,14 +21,14 @@ constexpr TCommandHelp kHelp{
     "  cat symbols.txt | brindle function - --key Eb\n",
 };
 
-struct TFunctionOptions {
+struct CFunctionOptions {
     std::vector<std::string> mSymbols;
     std::string mKey;
     CTypedChords mReading;
     CFormatOptions mFormat;
 };
 
-TStatus Function(const TFunctionOptions& options) {
+TStatus Function(const CFunctionOptions& options) {
     const auto key = ReadKeyOption(options.mKey);
     if (!key) return TStatus::BadUsage;
     const auto symbols = TypedSymbols(options.mSymbols);
@@ -36,7 +36,7 @@ TStatus Function(const TFunctionOptions& options) {
     const auto chords = options.mReading.ReadSymbols(*symbols);
     if (!chords) return TStatus::BadInput;
     const CSignKeyHeavy signKey = key->ToSignKeyHeavy();
-    std::vector<TChordFunction> functions;
+    std::vector<CChordFunction> functions;
     for (std::size_t i = 0; i < symbols->size(); ++i) {
         functions.push_back(FunctionOf((*symbols)[i], (*chords)[i], signKey));
     }
@@ -49,7 +49,7 @@ TStatus Function(const TFunctionOptions& options) {
 
 void AddFunction(CCommand& program) {
     CCommand& command = program.AddCommand(kHelp);
-    const auto options = std::make_shared<TFunctionOptions>();
+    const auto options = std::make_shared<CFunctionOptions>();
     command.AddArgument("SYMBOL", options->mSymbols, "Chord symbols; - reads standard input")
         .Required();
     command.AddOption("--key", "KEY", options->mKey, "The key, as in \"A minor\" or Bb").Required();

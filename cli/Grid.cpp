@@ -17,7 +17,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr TCommandHelp kHelp{
+constexpr CCommandHelp kHelp{
     "grid",
     "Name the chord of a guitar fingering, or show the fingerings of a chord",
     "  brindle grid x32010\n"
@@ -31,7 +31,7 @@ constexpr TCommandHelp kHelp{
 
 constexpr int kMostCapo = 24;
 
-struct TGridOptions {
+struct CGridOptions {
     std::vector<std::string> mWords;
     std::string mTuning = "EADGBE";
     int mCapo = 0;
@@ -59,7 +59,7 @@ TGrids GridsOfFrets(const std::string& word, const std::vector<int>& frets,
 /// Looks chords up; the packages are read when the first chord is asked for.
 class CLookUp {
 public:
-    CLookUp(const TGridOptions& options, const GChShortTuning& tuning)
+    CLookUp(const CGridOptions& options, const GChShortTuning& tuning)
         : mOptions(options), mTuning(tuning) {}
 
     TGrids GridsOf(const std::string& word) {
@@ -79,18 +79,18 @@ public:
     }
 
 private:
-    const TGridOptions& mOptions;
+    const CGridOptions& mOptions;
     GChShortTuning mTuning;
     std::unique_ptr<GChDatabase> mDatabase;
 };
 
-TStatus Present(const std::vector<CChordGrid>& grids, const TGridOptions& options) {
+TStatus Present(const std::vector<CChordGrid>& grids, const CGridOptions& options) {
     if (options.mFormat.Format() == TFormat::Json) return Print(GridsJson(grids));
     if (options.mFormat.Format() == TFormat::Text) return Print(GridsText(grids, PaintOfOutput()));
     return Print(GridsSvg(grids, Printable(fmt::format("{}", fmt::join(options.mWords, " ")))));
 }
 
-TStatus Grid(const TGridOptions& options) {
+TStatus Grid(const CGridOptions& options) {
     const auto tuning = ReadTuning(options.mTuning);
     if (!tuning) {
         return Fail(TStatus::BadUsage, Printable(options.mTuning) +
@@ -119,7 +119,7 @@ TStatus Grid(const TGridOptions& options) {
 
 void AddGrid(CCommand& program) {
     CCommand& command = program.AddCommand(kHelp);
-    const auto options = std::make_shared<TGridOptions>();
+    const auto options = std::make_shared<CGridOptions>();
     command
         .AddArgument("GRID", options->mWords, "Fingerings or chord symbols; - reads standard input")
         .Required();

@@ -18,7 +18,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr TCommandHelp kHelp{
+constexpr CCommandHelp kHelp{
     "grids",
     "List, show, export and import packages of guitar fingerings",
     "  brindle grids list\n"
@@ -30,7 +30,7 @@ constexpr TCommandHelp kHelp{
     "package that comes with the program, together with the user's own.\n",
 };
 
-struct TPackageOptions {
+struct CPackageOptions {
     std::string mPath;
     std::string mFile = "-";
     CFormatOptions mFormat;
@@ -58,7 +58,7 @@ std::string LibrariesText(const GChDatabase& database) {
     return text;
 }
 
-TStatus List(const TPackageOptions& options) {
+TStatus List(const CPackageOptions& options) {
     const auto database = ReadGrids(options.mPath);
     if (database == nullptr) return TStatus::BadInput;
     if (options.mFormat.Format() != TFormat::Json) return Print(LibrariesText(*database));
@@ -69,7 +69,7 @@ TStatus List(const TPackageOptions& options) {
     return Print(JsonText({{"Libraries", list}}));
 }
 
-TStatus Show(const TPackageOptions& options) {
+TStatus Show(const CPackageOptions& options) {
     const auto database = ReadGrids(options.mPath);
     if (database == nullptr) return TStatus::BadInput;
     std::vector<CChordGrid> grids;
@@ -84,7 +84,7 @@ TStatus Show(const TPackageOptions& options) {
     return Print(GridsText(grids, PaintOfOutput()));
 }
 
-TStatus Export(const TPackageOptions& options) {
+TStatus Export(const CPackageOptions& options) {
     const auto database = ReadGrids(options.mPath);
     if (database == nullptr) return TStatus::BadInput;
     return Print(JsonText(DatabaseToJson(*database)));
@@ -97,7 +97,7 @@ bool CanBeKept(const GChDatabase& database) {
     return DatabaseToJson(readBack) == DatabaseToJson(database);
 }
 
-TStatus Import(const TPackageOptions& options) {
+TStatus Import(const CPackageOptions& options) {
     const auto text = ReadInput(options.mFile);
     if (!text) return TStatus::BadInput;
     const std::string from =
@@ -120,12 +120,12 @@ TStatus Import(const TPackageOptions& options) {
         Printable(options.mPath) + " cannot be written, or holds something else than a package");
 }
 
-using TAction = TStatus (*)(const TPackageOptions&);
+using TAction = TStatus (*)(const CPackageOptions&);
 
 /// Adds "grids <name>"; `formats` are none for an action that has only one.
 CCommand& AddAction(CCommand& grids, const char* name, const char* purpose, TAction action,
                     const std::vector<std::string>& formats,
-                    const std::shared_ptr<TPackageOptions>& options) {
+                    const std::shared_ptr<CPackageOptions>& options) {
     CCommand& command = grids.AddCommand({name, purpose, nullptr});
     command.AddArgument("PATH", options->mPath, "The package");
     if (!formats.empty()) options->mFormat.AddTo(command, formats);
@@ -137,7 +137,7 @@ CCommand& AddAction(CCommand& grids, const char* name, const char* purpose, TAct
 
 void AddGrids(CCommand& program) {
     CCommand& command = program.AddCommand(kHelp);
-    const auto options = [] { return std::make_shared<TPackageOptions>(); };
+    const auto options = [] { return std::make_shared<CPackageOptions>(); };
     AddAction(command, "list", "Show the libraries", List, {"text", "json"}, options());
     AddAction(command, "show", "Draw all fingerings", Show, {"text", "json", "svg"}, options());
     AddAction(command, "export", "Print a package as JSON", Export, {}, options());

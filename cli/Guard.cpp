@@ -31,12 +31,12 @@ TStatus TellCurrentException() {
     std::_Exit(static_cast<int>(TellCurrentException()));
 }
 
-struct TTerminateHandler {
-    TTerminateHandler() { std::set_terminate(EndAtOnce); }
+struct CTerminateHandler {
+    CTerminateHandler() { std::set_terminate(EndAtOnce); }
 };
 
 // Made before all else: what the library of options makes before main asks for memory, too.
-[[maybe_unused, gnu::init_priority(101)]] const TTerminateHandler kTerminateHandler;
+[[maybe_unused, gnu::init_priority(101)]] const CTerminateHandler kTerminateHandler;
 
 }  // namespace
 

@@ -16,7 +16,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr TCommandHelp kHelp{
+constexpr CCommandHelp kHelp{
     "harmonies",
     "List the chords of a score in the order in which they are played",
     "  brindle harmonies song.musicxml\n"
@@ -30,7 +30,7 @@ constexpr TCommandHelp kHelp{
     "written, for scores without chord symbols.\n",
 };
 
-struct THarmoniesOptions {
+struct CHarmoniesOptions {
     std::string mFile;
     std::string mTiming = "played";
     bool mIsFromNotes = false;
@@ -61,7 +61,7 @@ TChordEvery EveryOf(const std::string& word) {
     return word == "beat" ? TChordEvery::Beat : TChordEvery::Change;
 }
 
-TStatus FromNotes(const TTypedSong& song, const THarmoniesOptions& options) {
+TStatus FromNotes(const CTypedSong& song, const CHarmoniesOptions& options) {
     const TFormat format = options.mFormat.Format();
     if (format == TFormat::Chords) {
         return Fail(TStatus::BadUsage, "--from-notes has no --format chords");
@@ -76,7 +76,7 @@ TStatus FromNotes(const TTypedSong& song, const THarmoniesOptions& options) {
     return PrintChordsFromNotes(song, how, format == TFormat::Json);
 }
 
-TStatus Harmonies(const THarmoniesOptions& options) {
+TStatus Harmonies(const CHarmoniesOptions& options) {
     const bool isOfNotes = !options.mKey.empty() || options.mEvery != "change";
     if (isOfNotes && !options.mIsFromNotes) {
         return Fail(TStatus::BadUsage, "--key and --every go with --from-notes");
@@ -96,7 +96,7 @@ TStatus Harmonies(const THarmoniesOptions& options) {
 
 void AddHarmonies(CCommand& program) {
     CCommand& command = program.AddCommand(kHelp);
-    const auto options = std::make_shared<THarmoniesOptions>();
+    const auto options = std::make_shared<CHarmoniesOptions>();
     command.AddArgument("FILE", options->mFile, "A score in MusicXML; - reads standard input")
         .Required();
     command.AddChoice("--timing", options->mTiming, {"played", "native"},

@@ -17,14 +17,14 @@ namespace {
 class CNoAlerts {
 public:
     CNoAlerts() {
-        SetAlertHandler([](const TAlert&) {});
+        SetAlertHandler([](const CAlert&) {});
     }
     CNoAlerts(const CNoAlerts&) = delete;
     CNoAlerts& operator=(const CNoAlerts&) = delete;
     ~CNoAlerts() { SetAlertHandler({}); }
 };
 
-std::optional<CScoreNotes> ReadNotes(const TTypedSong& song) {
+std::optional<CScoreNotes> ReadNotes(const CTypedSong& song) {
     const CNoAlerts quiet;
     CScoreNotes notes;
     Error error;
@@ -36,7 +36,7 @@ std::optional<CScoreNotes> ReadNotes(const TTypedSong& song) {
 
 }  // namespace
 
-TStatus PrintChordsFromNotes(const TTypedSong& song, const CChordsFromNotesOptions& options,
+TStatus PrintChordsFromNotes(const CTypedSong& song, const CChordsFromNotesOptions& options,
                              bool isJson) {
     const auto notes = ReadNotes(song);
     if (!notes) return TStatus::BadInput;

@@ -9,7 +9,7 @@
 namespace brindle::cli {
 
 /// Prints the chords that the notes of a score make, as a table or as JSON.
-TStatus PrintChordsFromNotes(const TTypedSong& song, const CChordsFromNotesOptions& options,
+TStatus PrintChordsFromNotes(const CTypedSong& song, const CChordsFromNotesOptions& options,
                              bool isJson);
 
 }  // namespace brindle::cli

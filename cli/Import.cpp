@@ -23,7 +23,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr TCommandHelp kHelp{
+constexpr CCommandHelp kHelp{
     "import",
     "Import a MusicXML score as timed notes",
     "  brindle import song.musicxml\n"
@@ -31,7 +31,7 @@ constexpr TCommandHelp kHelp{
     "  brindle import song.mxl --midi song.mid\n",
 };
 
-struct TImportOptions {
+struct CImportOptions {
     std::string mFile;
     std::string mFormat = "text";
     bool mJson = false;
@@ -44,7 +44,7 @@ struct TImportOptions {
 class CAlertsAsErrors {
 public:
     explicit CAlertsAsErrors(const std::string& name) {
-        SetAlertHandler([this, name](const TAlert& alert) {
+        SetAlertHandler([this, name](const CAlert& alert) {
             ++mCount;
             Fail(TStatus::BadInput,
                  fmt::format("{}: {}: {}", Printable(name), Printable(alert.messageText),
@@ -134,7 +134,7 @@ std::string ResultLine(bool isOk, const Error& error) {
     return line.dump(-1, ' ', false, Json::error_handler_t::replace) + '\n';
 }
 
-TStatus Import(const TImportOptions& options) {
+TStatus Import(const CImportOptions& options) {
     if (options.mMidiFile == "") return Fail(TStatus::BadUsage, "--midi needs the name of a file");
     const std::string name = options.mFile == "-" ? "standard input" : options.mFile;
     const CAlertsAsErrors alerts(name);
@@ -173,7 +173,7 @@ TStatus Import(const TImportOptions& options) {
 
 void AddImport(CCommand& program) {
     CCommand& command = program.AddCommand(kHelp);
-    const auto options = std::make_shared<TImportOptions>();
+    const auto options = std::make_shared<CImportOptions>();
     command
         .AddArgument("FILE", options->mFile,
                      "A score in MusicXML, compressed if its name ends in .mxl; - reads standard "

@@ -19,7 +19,7 @@ constexpr std::size_t kMaxInputBytes = std::size_t{64} << 20;
 
 constexpr std::string_view kWhiteSpace = " \t\n\v\f\r";
 
-struct TCloser {
+struct CCloser {
     void operator()(std::FILE* file) const { std::fclose(file); }
 };
 
@@ -58,7 +58,7 @@ bool IsStandardInput(const std::vector<std::string>& words) {
 
 std::optional<std::string> ReadInput(const std::string& path) {
     if (path == "-") return ReadAll(stdin, "standard input");
-    const std::unique_ptr<std::FILE, TCloser> file(std::fopen(path.c_str(), "rb"));
+    const std::unique_ptr<std::FILE, CCloser> file(std::fopen(path.c_str(), "rb"));
     if (file == nullptr) return Unreadable(path, std::strerror(errno));
     return ReadAll(file.get(), path);
 }

@@ -14,7 +14,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr TCommandHelp kHelp{
+constexpr CCommandHelp kHelp{
     "key",
     "Read a key: its signs, notes, relative key and one-byte code",
     "  brindle key \"F# minor\"\n"
@@ -59,7 +59,7 @@ std::string KeyText(const CSignKeyLite& key, const CPaint& paint) {
         HasCode(code) ? fmt::format("{}", code) : "none");
 }
 
-TStatus Key(const TLineOptions& options) {
+TStatus Key(const CLineOptions& options) {
     return PrintLineByLine(
         options, "Keys", ReadKeyText, [](const CKeyText& read) { return KeyToJson(read.mSignKey); },
         [](const CKeyText& read) { return KeyText(read.mSignKey, PaintOfOutput()); });
@@ -69,7 +69,7 @@ TStatus Key(const TLineOptions& options) {
 
 void AddKey(CCommand& program) {
     CCommand& command = program.AddCommand(kHelp);
-    const auto options = std::make_shared<TLineOptions>();
+    const auto options = std::make_shared<CLineOptions>();
     command.AddArgument("KEY", options->mWords, "A key, major or minor; - reads one a line")
         .Required();
     options->mFormat.AddTo(command, {"text", "json"});

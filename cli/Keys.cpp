@@ -23,7 +23,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr TCommandHelp kHelp{
+constexpr CCommandHelp kHelp{
     "keys",
     "Find the key of a song and the keys that it passes through, with Roman numerals",
     "  brindle keys \"Dm7 G7 | Cmaj7 . | Fm7 Bb7 | Ebmaj7 .\" --beats-per-chord 2\n"
@@ -41,19 +41,19 @@ constexpr double kShortest = 1.0 / 1024;
 constexpr double kLongest = 1024.0;
 constexpr double kMostPoints = 1000.0;
 
-struct TKeysOptions {
+struct CKeysOptions {
     std::vector<std::string> mWords;
     std::string mFile;
     std::string mKey;
     double mBeatsPerChord = 1.0;
     CKeyOptions mKeys;
-    TNumeralOptions mNumerals;
+    CNumeralOptions mNumerals;
     CTypedChords mReading;
     CFormatOptions mFormat;
 };
 
 // What is wrong with options that are fine one by one.
-std::optional<std::string> Contradiction(const TKeysOptions& options) {
+std::optional<std::string> Contradiction(const CKeysOptions& options) {
     if (options.mWords.empty() && options.mFile.empty()) {
         return "a song is needed: a TEXT, a score, --file PATH, or - for standard input";
     }
@@ -72,13 +72,13 @@ std::optional<std::string> Contradiction(const TKeysOptions& options) {
 }
 
 /// A song, and its keys made ready for the eye.
-struct TSongWithKeys {
+struct CSongWithKeys {
     CSong mSong;
     CShownSong mShown;
 };
 
 // Nothing when the text is not understood; then the error has been printed.
-std::optional<TSongWithKeys> SongOfText(const TTypedSong& typed, const TKeysOptions& options) {
+std::optional<CSongWithKeys> SongOfText(const CTypedSong& typed, const CKeysOptions& options) {
     TChordStringParse parse;
     parse.mBeatsPerBar = options.mKeys.mBeatsPerBar;
     parse.mBeatsPerChord = options.mBeatsPerChord;
@@ -91,10 +91,10 @@ std::optional<TSongWithKeys> SongOfText(const TTypedSong& typed, const TKeysOpti
     CKeyOptions keyOptions = options.mKeys;
     keyOptions.mBeatsPerBar = read->mBeatsPerBar;
     song.mKeys = MakeSongKeys(chordsOnly.mChords, read->mSymbols, keyOptions, options.mNumerals);
-    return TSongWithKeys{std::move(read->mSong), std::move(song)};
+    return CSongWithKeys{std::move(read->mSong), std::move(song)};
 }
 
-std::optional<TSongWithKeys> SongOfScore(const TTypedSong& typed, const TKeysOptions& options) {
+std::optional<CSongWithKeys> SongOfScore(const CTypedSong& typed, const CKeysOptions& options) {
     auto sheet = ReadLeadSheet(typed, TTiming::Played);
     if (!sheet) return std::nullopt;
     CHarmonicAnalyse chordsOnly;
@@ -105,12 +105,12 @@ std::optional<TSongWithKeys> SongOfScore(const TTypedSong& typed, const TKeysOpt
     CKeyOptions keyOptions = options.mKeys;
     keyOptions.mBeatsPerBar = BeatsPerBarOf(*sheet);
     song.mKeys = MakeSongKeys(chordsOnly.mChords, symbols, keyOptions, options.mNumerals);
-    return TSongWithKeys{options.mReading.ReadSource(typed.mText, {}), std::move(song)};
+    return CSongWithKeys{options.mReading.ReadSource(typed.mText, {}), std::move(song)};
 }
 
 // The numerals of a reading are those of theory text. Others are asked for by options.
 std::vector<std::string> OtherNumerals(const CSong& song, const CSongReading& reading,
-                                       const TNumeralOptions& options) {
+                                       const CNumeralOptions& options) {
     if (!options.mNashville && !options.mFigures && !options.mPrintedSigns && !options.mByKey) {
         return {};
     }
@@ -121,8 +121,8 @@ std::vector<std::string> OtherNumerals(const CSong& song, const CSongReading& re
     return NumeralsOf(song.mChords, keys, options);
 }
 
-std::string Present(const TSongWithKeys& song, const CSongReading& reading,
-                    const TKeysOptions& options) {
+std::string Present(const CSongWithKeys& song, const CSongReading& reading,
+                    const CKeysOptions& options) {
     const TFormat format = options.mFormat.Format();
     if (format == TFormat::Svg) return KeysSvg(song.mShown);
     const CReadSong read{song.mSong, reading};
@@ -133,7 +133,7 @@ std::string Present(const TSongWithKeys& song, const CSongReading& reading,
                        PaintOfOutput());
 }
 
-TStatus Keys(const TKeysOptions& options) {
+TStatus Keys(const CKeysOptions& options) {
     if (const auto contradiction = Contradiction(options)) {
         return Fail(TStatus::BadUsage, *contradiction);
     }
@@ -156,7 +156,7 @@ TStatus Keys(const TKeysOptions& options) {
 
 void AddKeys(CCommand& program) {
     CCommand& command = program.AddCommand(kHelp);
-    const auto options = std::make_shared<TKeysOptions>();
+    const auto options = std::make_shared<CKeysOptions>();
     AddSongSource(command, options->mWords, options->mFile);
     command.AddOption("--key", "KEY", options->mKey, "The stated key, as in \"A minor\" or Bb");
     AddBeats(command, options->mKeys.mBeatsPerBar, options->mBeatsPerChord);

@@ -29,7 +29,7 @@ bool HasScoreName(std::string_view name) {
     return ending == ".musicxml" || ending == ".xml" || ending == ".mxl";
 }
 
-std::optional<TMusicXMLDoc> Unreadable(const TTypedSong& song, std::string_view reason) {
+std::optional<TMusicXMLDoc> Unreadable(const CTypedSong& song, std::string_view reason) {
     Fail(TStatus::BadInput, fmt::format("{}: {}", Printable(song.mName), Printable(reason)));
     return std::nullopt;
 }
@@ -55,9 +55,9 @@ bool HasScoreBytes(std::string_view bytes) {
     return format == TSongFormat_MusicXml || format == TSongFormat_CompressedMusicXml;
 }
 
-std::optional<TTypedSong> ReadTypedSong(const std::vector<std::string>& words,
+std::optional<CTypedSong> ReadTypedSong(const std::vector<std::string>& words,
                                         const std::string& file) {
-    TTypedSong song;
+    CTypedSong song;
     song.mName = file;
     if (file.empty() && words.size() == 1 && (words[0] == "-" || HasScoreName(words[0]))) {
         song.mName = words[0];
@@ -70,7 +70,7 @@ std::optional<TTypedSong> ReadTypedSong(const std::vector<std::string>& words,
     return song;
 }
 
-std::optional<TMusicXMLDoc> ReadLeadSheet(const TTypedSong& song, TTiming timing) {
+std::optional<TMusicXMLDoc> ReadLeadSheet(const CTypedSong& song, TTiming timing) {
     TMusicXMLDoc sheet;
     if (timing == TTiming::Played) {
         Error error;

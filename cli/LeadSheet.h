@@ -17,7 +17,7 @@ enum class TTiming {
 };
 
 /// What the user names or types as a song, not yet understood.
-struct TTypedSong {
+struct CTypedSong {
     std::string mName;  ///< of the file, empty for what stands on the command line
     std::string mText;
     /// Whether it is a score in MusicXML, by its name or by its first bytes.
@@ -27,7 +27,7 @@ struct TTypedSong {
 /// The song in a file, or in the words of a command line: one word that ends like the name of a
 /// score (.musicxml, .xml, .mxl) is the name of a file, and "-" reads standard input. Nothing when
 /// it cannot be read; then the error has been printed.
-[[nodiscard]] std::optional<TTypedSong> ReadTypedSong(const std::vector<std::string>& words,
+[[nodiscard]] std::optional<CTypedSong> ReadTypedSong(const std::vector<std::string>& words,
                                                       const std::string& file);
 
 /// Whether a file that begins so is a score and no chord text.
@@ -35,6 +35,6 @@ struct TTypedSong {
 
 /// The chords of a score, plain or compressed. Nothing when it cannot be read; then the error has
 /// been printed.
-[[nodiscard]] std::optional<TMusicXMLDoc> ReadLeadSheet(const TTypedSong& song, TTiming timing);
+[[nodiscard]] std::optional<TMusicXMLDoc> ReadLeadSheet(const CTypedSong& song, TTiming timing);
 
 }  // namespace brindle::cli

@@ -14,7 +14,7 @@
 namespace brindle::cli {
 
 /// The options of a command that reads one thing a line.
-struct TLineOptions {
+struct CLineOptions {
     std::vector<std::string> mWords;
     CFormatOptions mFormat;
 };
@@ -39,7 +39,7 @@ std::variant<TStatus, std::vector<std::invoke_result_t<Read, const std::string&>
 /// Reads each typed line and prints what the lines mean: one JSON list of that name, or texts with
 /// a blank line between. `read` is that of ReadLines; `toJson` and `toText` take its records.
 template <class Read, class ToJson, class ToText>
-TStatus PrintLineByLine(const TLineOptions& options, const char* listName, Read read, ToJson toJson,
+TStatus PrintLineByLine(const CLineOptions& options, const char* listName, Read read, ToJson toJson,
                         ToText toText) {
     const auto lines = ReadLines(options.mWords, read);
     if (lines.index() == 0) return std::get<0>(lines);

@@ -16,7 +16,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr TCommandHelp kHelp{
+constexpr CCommandHelp kHelp{
     "markov",
     "Learn chord sequences and make new ones in their manner",
     "  brindle markov learn --order 3 -o model.json songs/\n"

@@ -9,7 +9,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr TCommandHelp kHelp{
+constexpr CCommandHelp kHelp{
     "fill",
     "Put a chord into each gap of a sequence, by what the model knows of its neighbours",
     "  brindle markov fill model.json \"(4,C);(4,U);(4,G7);(4,C)\"\n"
@@ -19,7 +19,7 @@ constexpr TCommandHelp kHelp{
 // A gap and the end of a sequence are symbols, too, and can be drawn for a gap.
 constexpr int kDraws = 100;
 
-struct TFillOptions {
+struct CFillOptions {
     std::string mModel;
     std::string mSequence;
     std::optional<std::uint64_t> mSeed;
@@ -67,7 +67,7 @@ std::string FilledJson(const MarkovSequence& sequence, const MarkovSequence& typ
     return JsonText({{"ChordString", ChordString(sequence, spelling)}, {"Symbols", symbols}});
 }
 
-TStatus MarkovFill(const TFillOptions& options) {
+TStatus MarkovFill(const CFillOptions& options) {
     auto model = ReadModel(options.mModel);
     if (!model) return TStatus::BadInput;
     const auto symbols = ReadSymbols("SEQUENCE", options.mSequence);
@@ -89,7 +89,7 @@ TStatus MarkovFill(const TFillOptions& options) {
 
 void AddMarkovFill(CCommand& markov) {
     CCommand& command = markov.AddCommand(kHelp);
-    const auto options = std::make_shared<TFillOptions>();
+    const auto options = std::make_shared<CFillOptions>();
     command.AddArgument("MODEL", options->mModel, "Model file; - reads standard input").Required();
     command.AddArgument("SEQUENCE", options->mSequence, "Chords with their lengths; U is a gap")
         .Required();

@@ -13,7 +13,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr TCommandHelp kHelp{
+constexpr CCommandHelp kHelp{
     "generate",
     "Make a new chord sequence of a length, or one that fills the gaps of a template",
     "  brindle markov generate model.json --beats 32\n"
@@ -29,7 +29,7 @@ constexpr std::uint64_t kMostSteps = 1'000'000;
 constexpr std::uint64_t kShortestOrder = 1;
 constexpr std::uint64_t kMostAttempts = 10'000'000;
 
-struct TGenerateOptions {
+struct CGenerateOptions {
     std::string mModel;
     double mBeats = 0.0;
     std::string mTemplate;
@@ -50,7 +50,7 @@ struct TGenerateOptions {
 };
 
 /// What was drawn.
-struct TGenerated {
+struct CGenerated {
     TMarkovSampledSequence mChosen;
     /// The heaviest first.
     std::vector<TMarkovSampledSequence> mSequences;
@@ -58,7 +58,7 @@ struct TGenerated {
     std::vector<double> mShares;
 };
 
-std::optional<std::string> Contradiction(const TGenerateOptions& options) {
+std::optional<std::string> Contradiction(const CGenerateOptions& options) {
     if (options.mTemplate.empty() == (options.mBeats == 0.0)) {
         return "either --beats or --template is needed";
     }
@@ -66,7 +66,7 @@ std::optional<std::string> Contradiction(const TGenerateOptions& options) {
 }
 
 std::optional<TMarkovGenerateOptions> OptionsFor(VariableLengthMarkovModel& model,
-                                                 const TGenerateOptions& options) {
+                                                 const CGenerateOptions& options) {
     TMarkovGenerateOptions generate;
     std::vector<CMarkovObject> wanted;
     if (options.mTemplate.empty()) {
@@ -90,8 +90,8 @@ std::optional<TMarkovGenerateOptions> OptionsFor(VariableLengthMarkovModel& mode
     return generate;
 }
 
-TGenerated Generate(VariableLengthMarkovModel& model, const TMarkovGenerateOptions& options) {
-    TGenerated generated;
+CGenerated Generate(VariableLengthMarkovModel& model, const TMarkovGenerateOptions& options) {
+    CGenerated generated;
     model.SampleSequenceWithLength(generated.mChosen, generated.mSequences, true, options);
     std::reverse(generated.mSequences.begin(), generated.mSequences.end());
     // Relative to the heaviest, since the weights themselves may be too small for a number.
@@ -118,7 +118,7 @@ Json SampledToJson(const TMarkovSampledObject& sampled, const CMarkovSpelling& s
     return json;
 }
 
-std::string GeneratedJson(const TGenerated& generated) {
+std::string GeneratedJson(const CGenerated& generated) {
     const CMarkovSpelling spelling(generated.mChosen.mSymbols);
     Json symbols = Json::array();
     for (const auto& sampled : generated.mChosen.mSampledObjects) {
@@ -137,7 +137,7 @@ std::string GeneratedJson(const TGenerated& generated) {
                      {"Sequences", sequences}});
 }
 
-std::string OthersText(const TGenerated& generated, const TGenerateOptions& options,
+std::string OthersText(const CGenerated& generated, const CGenerateOptions& options,
                        const CMarkovSpelling& spelling, const CPaint& paint) {
     std::string text;
     std::size_t shown = 0;
@@ -153,14 +153,14 @@ std::string OthersText(const TGenerated& generated, const TGenerateOptions& opti
     return text;
 }
 
-std::string GeneratedText(const TGenerated& generated, const TGenerateOptions& options) {
+std::string GeneratedText(const CGenerated& generated, const CGenerateOptions& options) {
     const CPaint paint = PaintOfOutput();
     const CMarkovSpelling spelling(generated.mChosen.mSymbols);
     return BarsText(generated.mChosen.mSymbols, spelling, options.mBeatsPerBar, 4) + '\n' +
            OthersText(generated, options, spelling, paint);
 }
 
-TStatus MarkovGenerate(const TGenerateOptions& options) {
+TStatus MarkovGenerate(const CGenerateOptions& options) {
     if (const auto contradiction = Contradiction(options)) {
         return Fail(TStatus::BadUsage, *contradiction);
     }
@@ -171,7 +171,7 @@ TStatus MarkovGenerate(const TGenerateOptions& options) {
     model->SetSearchLimits({options.mAttempts, kMostSteps});
     const auto generateOptions = OptionsFor(*model, options);
     if (!generateOptions) return TStatus::BadUsage;
-    const TGenerated generated = Generate(*model, *generateOptions);
+    const CGenerated generated = Generate(*model, *generateOptions);
     if (generated.mSequences.empty()) {
         return Fail(
             TStatus::BadInput,
@@ -189,7 +189,7 @@ TStatus MarkovGenerate(const TGenerateOptions& options) {
                                                            : GeneratedText(generated, options));
 }
 
-void AddHistoryOptions(CCommand& command, TGenerateOptions& options) {
+void AddHistoryOptions(CCommand& command, CGenerateOptions& options) {
     command
         .AddOption("--order", "N", options.mOrder, "Longest history (default: that of the model)")
         .InRange(kShortestOrder, kLongestOrder);
@@ -216,7 +216,7 @@ void AddHistoryOptions(CCommand& command, TGenerateOptions& options) {
 
 void AddMarkovGenerate(CCommand& markov) {
     CCommand& command = markov.AddCommand(kHelp);
-    const auto options = std::make_shared<TGenerateOptions>();
+    const auto options = std::make_shared<CGenerateOptions>();
     command.AddArgument("MODEL", options->mModel, "Model file; - reads standard input").Required();
     command.AddOption("--beats", "BEATS", options->mBeats, "Length of the sequence")
         .InRange(1.0, kMostBeats);

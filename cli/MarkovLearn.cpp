@@ -14,7 +14,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr TCommandHelp kHelp{
+constexpr CCommandHelp kHelp{
     "learn",
     "Learn which chord follows which in lead sheets, chord strings and chord texts",
     "  brindle markov learn -o model.json song.musicxml songs/\n"
@@ -25,7 +25,7 @@ constexpr TCommandHelp kHelp{
     "chord is held on. Folders are walked for .xml, .musicxml, .mxl and .txt.\n",
 };
 
-struct TLearnOptions {
+struct CLearnOptions {
     std::vector<std::string> mFiles;
     std::string mModel;
     std::uint64_t mOrder = 3;
@@ -36,7 +36,7 @@ struct TLearnOptions {
 };
 
 /// What was read and learned.
-struct TLearned {
+struct CLearned {
     std::size_t mFiles = 0;
     std::size_t mChords = 0;
     /// Names of files and what is wrong with them.
@@ -55,16 +55,16 @@ void Learn(VariableLengthMarkovModel& model, CHarmAnlsChordsWithLength chords, b
     model.EndSequence();
 }
 
-TLearned LearnFiles(VariableLengthMarkovModel& model, const TLearnOptions& options) {
+CLearned LearnFiles(VariableLengthMarkovModel& model, const CLearnOptions& options) {
     TChordStringParse parse;
     parse.mBeatsPerBar = options.mBeatsPerBar;
     parse.mChordNamePrefs = NamePrefs();
-    const std::vector<TFoundFile> files = FindChordSources(options.mFiles);
-    TLearned learned;
+    const std::vector<CFoundFile> files = FindChordSources(options.mFiles);
+    CLearned learned;
     CProgress progress(files.size());
-    for (const TFoundFile& file : files) {
+    for (const CFoundFile& file : files) {
         progress.Step(file.mPath);
-        const TChordSource source = ReadChordSource(file.mPath, parse, options.mReading);
+        const CChordSource source = ReadChordSource(file.mPath, parse, options.mReading);
         if (!source.mError.empty()) {
             learned.mUnread.emplace_back(file.mPath, source.mError);
             learned.mIsNamedFileUnread = learned.mIsNamedFileUnread || file.mIsNamed;
@@ -79,7 +79,7 @@ TLearned LearnFiles(VariableLengthMarkovModel& model, const TLearnOptions& optio
     return learned;
 }
 
-std::string LearnedJson(const TLearned& learned, const VariableLengthMarkovModel& model) {
+std::string LearnedJson(const CLearned& learned, const VariableLengthMarkovModel& model) {
     Json unread = Json::array();
     for (const auto& [name, error] : learned.mUnread) {
         unread.push_back({{"File", Printable(name)}, {"Error", Printable(error)}});
@@ -96,23 +96,23 @@ std::string Plural(std::size_t count, std::string_view one, std::string_view man
     return fmt::format("{} {}", count, count == 1 ? one : many);
 }
 
-std::string LearnedText(const TLearned& learned, const VariableLengthMarkovModel& model) {
+std::string LearnedText(const CLearned& learned, const VariableLengthMarkovModel& model) {
     return fmt::format("learned {} from {}: {}, {}\n", Plural(learned.mChords, "chord", "chords"),
                        Plural(learned.mFiles, "file", "files"),
                        Plural(model.mObjects.size(), "symbol", "symbols"),
                        Plural(model.mTransitionMap.size(), "history", "histories"));
 }
 
-void ReportUnread(const TLearned& learned) {
+void ReportUnread(const CLearned& learned) {
     for (const auto& [name, error] : learned.mUnread) {
         Fail(TStatus::BadInput,
              fmt::format("{} was left out: {}", Printable(name), Printable(error)));
     }
 }
 
-TStatus MarkovLearn(const TLearnOptions& options) {
+TStatus MarkovLearn(const CLearnOptions& options) {
     VariableLengthMarkovModel model(options.mOrder);
-    const TLearned learned = LearnFiles(model, options);
+    const CLearned learned = LearnFiles(model, options);
     ReportUnread(learned);
     if (learned.mFiles == 0) return Fail(TStatus::BadInput, "there was nothing to learn");
     if (!model.SaveToFile(options.mModel)) {
@@ -129,7 +129,7 @@ TStatus MarkovLearn(const TLearnOptions& options) {
 
 void AddMarkovLearn(CCommand& markov) {
     CCommand& command = markov.AddCommand(kHelp);
-    const auto options = std::make_shared<TLearnOptions>();
+    const auto options = std::make_shared<CLearnOptions>();
     command.AddArgument("FILES", options->mFiles, "Files and folders").Required();
     command.AddOption("-o,--output", "MODEL", options->mModel, "The model file that is written")
         .Required();

@@ -13,14 +13,14 @@
 namespace brindle::cli {
 namespace {
 
-constexpr TCommandHelp kHelp{
+constexpr CCommandHelp kHelp{
     "show",
     "Show what a model has learned: its size, how sure it is, and what follows a history",
     "  brindle markov show model.json\n"
     "  brindle markov show model.json --history \"(4,Dm7);(4,G7)\"\n",
 };
 
-struct TShowOptions {
+struct CShowOptions {
     std::string mModel;
     std::string mHistory;
     std::uint64_t mTop = 10;
@@ -28,7 +28,7 @@ struct TShowOptions {
 };
 
 /// The histories of one length.
-struct TLengthRow {
+struct CLengthRow {
     std::size_t mLength = 0;
     std::size_t mHistories = 0;
     /// Means over all places of what was learned.
@@ -36,17 +36,17 @@ struct TLengthRow {
     double mMaxEntropy = 0.0;
 };
 
-struct TContinuation {
+struct CContinuation {
     MarkovIterator mSymbol;
     std::uint32_t mCount = 0;
     double mProbability = 0.0;
 };
 
-TLengthRow RowOf(const VariableLengthMarkovModel& model, std::size_t length) {
-    TLengthRow row{length};
+CLengthRow RowOf(const VariableLengthMarkovModel& model, std::size_t length) {
+    CLengthRow row{length};
     double places = 0.0;
     MarkovProbabilities table;
-    for (const TMarkovTransitions* const entry : model.mTransitionMap.OfLength(length)) {
+    for (const CMarkovTransitions* const entry : model.mTransitionMap.OfLength(length)) {
         model.ProbabilitiesForNextSymbol(entry->mHistory, table);
         double count = 0.0;
         for (const auto& successor : entry->mCounts) count += successor.second;
@@ -64,8 +64,8 @@ TLengthRow RowOf(const VariableLengthMarkovModel& model, std::size_t length) {
     return row;
 }
 
-std::vector<TLengthRow> RowsOf(const VariableLengthMarkovModel& model) {
-    std::vector<TLengthRow> rows;
+std::vector<CLengthRow> RowsOf(const VariableLengthMarkovModel& model) {
+    std::vector<CLengthRow> rows;
     for (std::size_t length = 1; length <= model.mMaxHistoryLength; ++length) {
         rows.push_back(RowOf(model, length));
     }
@@ -73,7 +73,7 @@ std::vector<TLengthRow> RowsOf(const VariableLengthMarkovModel& model) {
 }
 
 /// Of the history, or of its longest end that the model knows, the most frequent first.
-std::vector<TContinuation> ContinuationsOf(const VariableLengthMarkovModel& model,
+std::vector<CContinuation> ContinuationsOf(const VariableLengthMarkovModel& model,
                                            MarkovSequence& history) {
     const MarkovCounts* counts = nullptr;
     const auto isContinued = [&] {
@@ -81,7 +81,7 @@ std::vector<TContinuation> ContinuationsOf(const VariableLengthMarkovModel& mode
         return counts != nullptr && !counts->empty();
     };
     while (!history.empty() && !isContinued()) history.erase(history.begin());
-    std::vector<TContinuation> continuations;
+    std::vector<CContinuation> continuations;
     if (counts == nullptr) return continuations;
     MarkovProbabilities table;
     model.ProbabilitiesForNextSymbol(history, table);
@@ -91,23 +91,23 @@ std::vector<TContinuation> ContinuationsOf(const VariableLengthMarkovModel& mode
     }
     std::stable_sort(
         continuations.begin(), continuations.end(),
-        [](const TContinuation& a, const TContinuation& b) { return a.mCount > b.mCount; });
+        [](const CContinuation& a, const CContinuation& b) { return a.mCount > b.mCount; });
     return continuations;
 }
 
 /// One spelling for the history and what follows it.
 CMarkovSpelling SpellingOf(MarkovSequence sequence,
-                           const std::vector<TContinuation>& continuations) {
-    for (const TContinuation& continuation : continuations) {
+                           const std::vector<CContinuation>& continuations) {
+    for (const CContinuation& continuation : continuations) {
         sequence.push_back(continuation.mSymbol);
     }
     return CMarkovSpelling(sequence);
 }
 
 std::string ShownJson(const VariableLengthMarkovModel& model, const MarkovSequence& history,
-                      const std::vector<TContinuation>& continuations) {
+                      const std::vector<CContinuation>& continuations) {
     Json rows = Json::array();
-    for (const TLengthRow& row : RowsOf(model)) {
+    for (const CLengthRow& row : RowsOf(model)) {
         rows.push_back({{"HistoryLength", row.mLength},
                         {"Histories", row.mHistories},
                         {"Entropy", NumberToJson(row.mEntropy)},
@@ -115,7 +115,7 @@ std::string ShownJson(const VariableLengthMarkovModel& model, const MarkovSequen
     }
     const CMarkovSpelling spelling = SpellingOf(history, continuations);
     Json following = Json::array();
-    for (const TContinuation& continuation : continuations) {
+    for (const CContinuation& continuation : continuations) {
         Json symbol = SymbolToJson(*continuation.mSymbol, spelling);
         symbol["Count"] = continuation.mCount;
         symbol["Probability"] = NumberToJson(continuation.mProbability);
@@ -130,16 +130,16 @@ std::string ShownJson(const VariableLengthMarkovModel& model, const MarkovSequen
 }
 
 std::string ShownText(const VariableLengthMarkovModel& model, const MarkovSequence& history,
-                      const std::vector<TContinuation>& continuations, const CPaint& paint) {
+                      const std::vector<CContinuation>& continuations, const CPaint& paint) {
     CTable lengths({" history length", " histories", " mean entropy", " of at most"});
-    for (const TLengthRow& row : RowsOf(model)) {
+    for (const CLengthRow& row : RowsOf(model)) {
         lengths.AddRow({fmt::format("{}", row.mLength), fmt::format("{}", row.mHistories),
                         fmt::format("{:.3f}", row.mEntropy),
                         fmt::format("{:.3f}", row.mMaxEntropy)});
     }
     const CMarkovSpelling spelling = SpellingOf(history, continuations);
     CTable following({" count", " probability", "symbol"});
-    for (const TContinuation& continuation : continuations) {
+    for (const CContinuation& continuation : continuations) {
         following.AddRow({fmt::format("{}", continuation.mCount),
                           fmt::format("{:.3f}", continuation.mProbability),
                           ChordString({&continuation.mSymbol, 1}, spelling)});
@@ -149,7 +149,7 @@ std::string ShownText(const VariableLengthMarkovModel& model, const MarkovSequen
                        lengths.Text(paint), ChordString(history, spelling), following.Text(paint));
 }
 
-TStatus MarkovShow(const TShowOptions& options) {
+TStatus MarkovShow(const CShowOptions& options) {
     auto model = ReadModel(options.mModel);
     if (!model) return TStatus::BadInput;
     MarkovSequence history;
@@ -176,7 +176,7 @@ TStatus MarkovShow(const TShowOptions& options) {
 
 void AddMarkovShow(CCommand& markov) {
     CCommand& command = markov.AddCommand(kHelp);
-    const auto options = std::make_shared<TShowOptions>();
+    const auto options = std::make_shared<CShowOptions>();
     command.AddArgument("MODEL", options->mModel, "Model file; - reads standard input").Required();
     command.AddOption("--history", "CHORDS", options->mHistory,
                       "Show what follows these chords (default: the start of a sequence)");

@@ -11,7 +11,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr TCommandHelp kHelp{
+constexpr CCommandHelp kHelp{
     "name",
     "Name the chord of some notes",
     "  brindle name E2 G3 C4\n"
@@ -35,7 +35,7 @@ TBassUse BassUseOf(const std::string& word) {
 }
 
 /// Reads the root behind --root. False when it is none; then the error has been printed.
-bool ReadRoot(TNameOptions& options) {
+bool ReadRoot(CNameOptions& options) {
     if (options.mRoot.empty()) return true;
     const std::string typed = FoldAccidentals(options.mRoot);
     int consumed = 0;
@@ -49,7 +49,7 @@ bool ReadRoot(TNameOptions& options) {
 
 /// The root of a neighbouring chord. Nothing when it is no chord; then the error has been printed.
 std::optional<int> ReadNeighbour(const std::string& option, const std::string& typed,
-                                 const TNameOptions& options) {
+                                 const CNameOptions& options) {
     if (typed.empty()) return kKeyNrUndef;
     const CChordTextReading read =
         ReadChordText(typed, {.mBIsBFlat = options.mNaming.Prefs().mBForBFlat});
@@ -60,18 +60,18 @@ std::optional<int> ReadNeighbour(const std::string& option, const std::string& t
     return std::nullopt;
 }
 
-bool IsAsPlayed(const TNameOptions& options) {
+bool IsAsPlayed(const CNameOptions& options) {
     return options.mMethod == "notes" || options.mMethod == "both";
 }
 
 /// Whether anything is told that only the names as played take up.
-bool HasContext(const TNameOptions& options) {
+bool HasContext(const CNameOptions& options) {
     return !options.mKey.empty() || !options.mBefore.empty() || !options.mAfter.empty() ||
            options.mBass != "usual" || options.mIsExact || options.mCandidates != 1;
 }
 
 /// Reads what was told about the notes besides themselves. False after an error.
-bool ReadContext(TNameOptions& options) {
+bool ReadContext(CNameOptions& options) {
     if (!options.mKey.empty()) {
         const auto key = ReadKeyOption(options.mKey);
         if (!key) return false;
@@ -97,15 +97,15 @@ bool ReadContext(TNameOptions& options) {
     return ReadRoot(options);
 }
 
-TStatus Name(TNameOptions options) {
+TStatus Name(CNameOptions options) {
     if (!ReadContext(options)) return TStatus::BadUsage;
     const auto lines = TypedLines(options.mWords);
     if (!lines) return TStatus::BadInput;
     TStatus status = TStatus::Success;
-    std::vector<TNotesText> sets;
+    std::vector<CNotesText> sets;
     for (const std::string& line : *lines) {
         const std::string typed = FoldAccidentals(line);
-        TNotesText notes = ReadNotesText(typed, options.mNaming.Prefs());
+        CNotesText notes = ReadNotesText(typed, options.mNaming.Prefs());
         if (notes.mError.empty() && notes.mTyped.empty()) notes.mError = "there are no notes";
         if (notes.mError.empty()) {
             sets.push_back(std::move(notes));
@@ -123,7 +123,7 @@ TStatus Name(TNameOptions options) {
 
 void AddName(CCommand& program) {
     CCommand& command = program.AddCommand(kHelp);
-    const auto options = std::make_shared<TNameOptions>();
+    const auto options = std::make_shared<CNameOptions>();
     command.AddArgument("NOTE", options->mWords, "Notes of a chord; - reads one chord a line")
         .Required();
     command.AddChoice("--method", options->mMethod, {"notes", "both", "net", "score"},

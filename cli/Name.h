@@ -13,7 +13,7 @@
 namespace brindle::cli {
 
 /// What `name` was asked for.
-struct TNameOptions {
+struct CNameOptions {
     std::vector<std::string> mWords;
     std::string mMethod = "notes";
     std::string mKey;
@@ -34,11 +34,11 @@ struct TNameOptions {
 // The output of `name` for sets of notes.
 
 /// By how common chords are.
-[[nodiscard]] std::string NameAsPlayed(const std::vector<TNotesText>& sets,
-                                       const TNameOptions& options);
+[[nodiscard]] std::string NameAsPlayed(const std::vector<CNotesText>& sets,
+                                       const CNameOptions& options);
 
 /// By a search for the root, "net" or "score", and the name of the chord over it.
-[[nodiscard]] std::string NameByRoot(const std::vector<TNotesText>& sets,
-                                     const TNameOptions& options);
+[[nodiscard]] std::string NameByRoot(const std::vector<CNotesText>& sets,
+                                     const CNameOptions& options);
 
 }  // namespace brindle::cli

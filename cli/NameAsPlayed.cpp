@@ -15,16 +15,16 @@ namespace {
 
 using TNamesOfSets = std::vector<std::vector<CNamedChord>>;
 
-std::vector<CNamedChord> NamesOf(const std::vector<CNote>& notes, const TNameOptions& options) {
+std::vector<CNamedChord> NamesOf(const std::vector<CNote>& notes, const CNameOptions& options) {
     auto context = options.mContext;
     if (options.mMethod == "both") context.mRootCosts = RootCostsByNet(notes);
     return NameNotes(notes, context);
 }
 
 /// All names, with that over the root of --root first.
-TNamesOfSets AllNames(const std::vector<TNotesText>& sets, const TNameOptions& options) {
+TNamesOfSets AllNames(const std::vector<CNotesText>& sets, const CNameOptions& options) {
     std::vector<std::vector<CNote>> notes;
-    for (const TNotesText& set : sets) notes.push_back(set.mTyped);
+    for (const CNotesText& set : sets) notes.push_back(set.mTyped);
     TNamesOfSets names;
     if (options.mProgression) {
         names = NameProgression(notes, options.mContext);
@@ -58,7 +58,7 @@ std::string DegreesText(const std::vector<CChordDegree>& degrees) {
 }
 
 // With the key names of JSON, in ASCII.
-Json NamedToJson(const CNamedChord& named, const TNameOptions& options) {
+Json NamedToJson(const CNamedChord& named, const CNameOptions& options) {
     CChordNamePrefs notePrefs = NamePrefs();
     notePrefs.mOctaveNaming = options.mNaming.Prefs().mOctaveNaming;
     const CChordNamePrefs prefs = options.mNaming.PlayersPrefs();
@@ -74,7 +74,7 @@ Json NamedToJson(const CNamedChord& named, const TNameOptions& options) {
             {"Cost", named.mCost}};
 }
 
-std::string NamesJson(const TNamesOfSets& sets, const TNameOptions& options) {
+std::string NamesJson(const TNamesOfSets& sets, const CNameOptions& options) {
     Json list = Json::array();
     for (const auto& names : sets) {
         if (names.empty()) continue;
@@ -88,7 +88,7 @@ std::string NamesJson(const TNamesOfSets& sets, const TNameOptions& options) {
     return JsonText({{"Chords", list}});
 }
 
-std::string NamesText(const TNamesOfSets& sets, const TNameOptions& options) {
+std::string NamesText(const TNamesOfSets& sets, const CNameOptions& options) {
     const CChordNamePrefs prefs = options.mNaming.PlayersPrefs();
     const auto keyName = [&](const CKeyEnh& key) {
         return key.IsUndef() ? "-" : KeyNrAndEnhToName(key.mKeyNr, key.mEnh, prefs);
@@ -112,7 +112,7 @@ std::string NamesText(const TNamesOfSets& sets, const TNameOptions& options) {
 
 }  // namespace
 
-std::string NameAsPlayed(const std::vector<TNotesText>& sets, const TNameOptions& options) {
+std::string NameAsPlayed(const std::vector<CNotesText>& sets, const CNameOptions& options) {
     const TNamesOfSets names = AllNames(sets, options);
     if (options.mFormat.Format() == TFormat::Json) return NamesJson(names, options);
     return NamesText(names, options);

@@ -14,7 +14,7 @@ namespace brindle::cli {
 namespace {
 
 // The name that the notes have with one root.
-struct TNamed {
+struct CNamed {
     CKeyEnh mRoot;
     CKeyEnh mBass;  // where it is not the root
     std::string mName;
@@ -24,9 +24,9 @@ struct TNamed {
 };
 
 // All names of some notes, the best one first.
-struct TNamedNotes {
+struct CNamedNotes {
     std::vector<CNote> mNotes;
-    std::vector<TNamed> mNames;
+    std::vector<CNamed> mNames;
 };
 
 // Octaves do not matter for a name, but the lowest octave of the keyboard is that of the root and
@@ -57,9 +57,9 @@ CChordHeavy ChordOn(const CKeyEnh& root, const CMySet<CNote>& notes) {
     return chord;
 }
 
-TNamed NameOn(const CKeyEnh& root, const CMySet<CNote>& notes, const CChordNamePrefs& prefs) {
+CNamed NameOn(const CKeyEnh& root, const CMySet<CNote>& notes, const CChordNamePrefs& prefs) {
     const CChordHeavy chord = ChordOn(root, notes);
-    TNamed named;
+    CNamed named;
     named.mRoot = root;
     named.mName = chord.NameWithSlash(prefs);  // which spells the bass
     if (chord.IsSlashChord()) named.mBass = chord.BassKeyEnh();
@@ -87,12 +87,12 @@ CKeyEnh SpelledRoot(int keyNr, const CMySet<CNote>& notes) {
     return root.KeyEnh();
 }
 
-TNamedNotes NamesOf(const CMySet<CNote>& typed, const TNameOptions& options) {
+CNamedNotes NamesOf(const CMySet<CNote>& typed, const CNameOptions& options) {
     const CChordNamePrefs prefs = options.mNaming.Prefs();
     const CMySet<CNote> notes = AwayFromTheEnds(typed);
     const bool isSearched = options.mRootKey.IsUndef();
     const CKeyEnh root = isSearched ? LikeliestRoot(notes, options.mMethod) : options.mRootKey;
-    TNamedNotes named{{typed.begin(), typed.end()}, {NameOn(root, notes, prefs)}};
+    CNamedNotes named{{typed.begin(), typed.end()}, {NameOn(root, notes, prefs)}};
     if (!options.mAllRoots || root.IsUndef()) return named;
     for (int intvl = 1; intvl < 12; ++intvl) {
         const CKeyEnh other = SpelledRoot(FoldIntoOctave(root.mKeyNr + intvl), notes);
@@ -101,11 +101,11 @@ TNamedNotes NamesOf(const CMySet<CNote>& typed, const TNameOptions& options) {
     // Roots that sound come before those that are left out.
     std::stable_sort(
         named.mNames.begin() + 1, named.mNames.end(),
-        [](const TNamed& a, const TNamed& b) { return a.mIsSounding && !b.mIsSounding; });
+        [](const CNamed& a, const CNamed& b) { return a.mIsSounding && !b.mIsSounding; });
     return named;
 }
 
-Json NameToJson(const TNamed& named) {
+Json NameToJson(const CNamed& named) {
     return {{"Name", named.mName},
             {"RootKeyEnh", KeyEnhToJson(named.mRoot)},
             {"BassKeyEnh", KeyEnhToJson(named.mBass)},
@@ -114,32 +114,32 @@ Json NameToJson(const TNamed& named) {
             {"RootSounds", named.mIsSounding}};
 }
 
-std::string NamesJson(const std::vector<TNamedNotes>& chords, const TNameOptions& options) {
+std::string NamesJson(const std::vector<CNamedNotes>& chords, const CNameOptions& options) {
     CChordNamePrefs notePrefs = NamePrefs();
     notePrefs.mOctaveNaming = options.mNaming.Prefs().mOctaveNaming;
     Json list = Json::array();
-    for (const TNamedNotes& chord : chords) {
+    for (const CNamedNotes& chord : chords) {
         Json json{{"Notes", NotesToJson(chord.mNotes, notePrefs)}};
         json.update(NameToJson(chord.mNames.front()));
         if (options.mAllRoots) {
             json["AllRoots"] = Json::array();
-            for (const TNamed& named : chord.mNames) json["AllRoots"].push_back(NameToJson(named));
+            for (const CNamed& named : chord.mNames) json["AllRoots"].push_back(NameToJson(named));
         }
         list.push_back(std::move(json));
     }
     return JsonText({{"Chords", list}});
 }
 
-std::string NamesText(const std::vector<TNamedNotes>& chords, const TNameOptions& options,
+std::string NamesText(const std::vector<CNamedNotes>& chords, const CNameOptions& options,
                       const CPaint& paint) {
     const CChordNamePrefs prefs = options.mNaming.Prefs();
     const auto nameOf = [&](const CKeyEnh& key) {
         return key.IsUndef() ? "-" : KeyNrAndEnhToName(key.mKeyNr, key.mEnh, prefs);
     };
     CTable table({"notes", "name", "root", "bass", "basic chord"});
-    for (const TNamedNotes& chord : chords) {
+    for (const CNamedNotes& chord : chords) {
         std::string notes = NotesName(chord.mNotes, prefs);
-        for (const TNamed& named : chord.mNames) {
+        for (const CNamed& named : chord.mNames) {
             const std::string root = nameOf(named.mRoot);
             table.AddRow({std::exchange(notes, {}), named.mName,
                           named.mIsSounding ? root : '(' + root + ')', nameOf(named.mBass),
@@ -149,16 +149,16 @@ std::string NamesText(const std::vector<TNamedNotes>& chords, const TNameOptions
     return table.Text(paint);
 }
 
-std::vector<TNamedNotes> AllNames(const std::vector<TNotesText>& sets,
-                                  const TNameOptions& options) {
-    std::vector<TNamedNotes> chords;
-    for (const TNotesText& set : sets) chords.push_back(NamesOf(set.mNotes, options));
+std::vector<CNamedNotes> AllNames(const std::vector<CNotesText>& sets,
+                                  const CNameOptions& options) {
+    std::vector<CNamedNotes> chords;
+    for (const CNotesText& set : sets) chords.push_back(NamesOf(set.mNotes, options));
     return chords;
 }
 
 }  // namespace
 
-std::string NameByRoot(const std::vector<TNotesText>& sets, const TNameOptions& options) {
+std::string NameByRoot(const std::vector<CNotesText>& sets, const CNameOptions& options) {
     const auto chords = AllNames(sets, options);
     if (options.mFormat.Format() == TFormat::Json) return NamesJson(chords, options);
     return NamesText(chords, options, PaintOfOutput());

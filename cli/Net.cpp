@@ -14,7 +14,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr TCommandHelp kHelp{
+constexpr CCommandHelp kHelp{
     "net",
     "Show the neural net that hears the roots of chords",
     "  brindle net trace\n"
@@ -22,13 +22,13 @@ constexpr TCommandHelp kHelp{
     "  brindle net weights --json\n",
 };
 
-constexpr TCommandHelp kTraceHelp{
+constexpr CCommandHelp kTraceHelp{
     "trace",
     "Its shape and the properties of its neurons",
     "  brindle net trace\n",
 };
 
-constexpr TCommandHelp kWeightsHelp{
+constexpr CCommandHelp kWeightsHelp{
     "weights",
     "A report: the patterns that it gets wrong, its weights, and a form that can be loaded",
     "  brindle net weights >net.txt\n",
@@ -36,7 +36,7 @@ constexpr TCommandHelp kWeightsHelp{
 
 constexpr int kOutputCount = 12;
 
-training_pattern TrainingPattern(const TChordRootPattern& pattern, std::size_t inputCount) {
+training_pattern TrainingPattern(const CChordRootPattern& pattern, std::size_t inputCount) {
     training_pattern training;
     for (std::size_t i = 0; i < inputCount; ++i) {
         training.mInputs.push_back((pattern.mInputs >> i & 1) != 0 ? 1.0 : 0.0);
@@ -51,7 +51,7 @@ training_pattern TrainingPattern(const TChordRootPattern& pattern, std::size_t i
 // Every input that a voicing of the usual chords can give.
 std::vector<training_pattern> AllPatterns(const NeuronalNet& net) {
     std::vector<training_pattern> patterns;
-    for (const TChordRootPattern& pattern : ChordRootPatterns()) {
+    for (const CChordRootPattern& pattern : ChordRootPatterns()) {
         patterns.push_back(
             TrainingPattern(pattern, static_cast<std::size_t>(net.get_input_neuron_count())));
     }
@@ -110,7 +110,7 @@ TStatus PrintWeights(const CFormatOptions& format) {
 
 using TPrinter = TStatus (*)(const CFormatOptions& format);
 
-void AddPrinter(CCommand& net, const TCommandHelp& help, TPrinter print) {
+void AddPrinter(CCommand& net, const CCommandHelp& help, TPrinter print) {
     CCommand& command = net.AddCommand(help);
     const auto format = std::make_shared<CFormatOptions>();
     format->AddTo(command, {"text", "json"});

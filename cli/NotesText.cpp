@@ -59,7 +59,7 @@ public:
                    word);
     }
 
-    [[nodiscard]] TNotesText Notes() && { return std::move(mNotes); }
+    [[nodiscard]] CNotesText Notes() && { return std::move(mNotes); }
 
 private:
     std::string Add(std::int64_t noteNr, TEnh enh, std::string_view word) {
@@ -79,7 +79,7 @@ private:
     }
 
     const CChordNamePrefs& mPrefs;
-    TNotesText mNotes;
+    CNotesText mNotes;
     std::int64_t mNext = kMiddleC;
 };
 
@@ -91,7 +91,7 @@ std::string NoteText(const CNote& note, const CChordNamePrefs& prefs) {
 
 }  // namespace
 
-TNotesText ReadNotesText(std::string_view text, const CChordNamePrefs& prefs) {
+CNotesText ReadNotesText(std::string_view text, const CChordNamePrefs& prefs) {
     constexpr std::string_view blanks = " \t\r\n";
     CNotesReader reader(prefs);
     std::size_t begin = text.find_first_not_of(blanks);

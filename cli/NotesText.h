@@ -15,7 +15,7 @@
 namespace brindle::cli {
 
 /// Notes that were typed, or what is wrong with them and where.
-struct TNotesText {
+struct CNotesText {
     /// All of them as they were typed; MIDI numbers have no spelling.
     std::vector<CNote> mTyped;
     /// Each sounding note once, MIDI numbers with the usual spelling.
@@ -29,7 +29,7 @@ inline constexpr std::size_t kMostTypedNotes = 128;
 
 /// Reads "C4 Eb4 67": keys with their octave, or MIDI numbers of 0 to 127. A key without octave is
 /// the next one above the note before it, the first one that of middle C.
-[[nodiscard]] TNotesText ReadNotesText(std::string_view text, const CChordNamePrefs& prefs);
+[[nodiscard]] CNotesText ReadNotesText(std::string_view text, const CChordNamePrefs& prefs);
 
 /// "C4 Eb4 G4"
 [[nodiscard]] std::string NotesName(std::span<const CNote> notes, const CChordNamePrefs& prefs);

@@ -24,7 +24,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr TCommandHelp kHelp{
+constexpr CCommandHelp kHelp{
     "numerals",
     "Turn Roman numerals or Nashville numbers into chords of a key, and chords into these",
     "  brindle numerals \"ii7 V7 | I^7\" --key \"Eb major\"\n"
@@ -36,17 +36,17 @@ constexpr TCommandHelp kHelp{
     "  cat song.txt | brindle numerals - --key \"A minor\" --json\n",
 };
 
-struct TNumeralsOptions {
+struct CNumeralsOptions {
     std::vector<std::string> mWords;
     std::string mKey;
     std::string mFrom = "guess";
     bool mIsLenient = false;
-    TNumeralOptions mNumerals;
+    CNumeralOptions mNumerals;
     CFormatOptions mFormat;
 };
 
 // The first chord tells whether the text has numerals. No chord symbol begins as a numeral does.
-bool AreNumerals(std::string_view text, const CSignKeyLite& key, const TNumeralsOptions& options) {
+bool AreNumerals(std::string_view text, const CSignKeyLite& key, const CNumeralsOptions& options) {
     if (options.mFrom != "guess") return options.mFrom == "numerals";
     const std::vector<CNumeralWord> words = NumeralWords(text);
     const auto first = std::find_if(words.begin(), words.end(),
@@ -68,7 +68,7 @@ CNumeralsReading ReadChordWords(std::string_view text) {
 
 // The numerals of all words in one key; empty for the marks.
 std::vector<std::string> Numerals(const std::vector<CNumeralWord>& words, const CSignKeyLite& key,
-                                  const TNumeralOptions& options) {
+                                  const CNumeralOptions& options) {
     CHarmAnlsChords chords;
     for (const CNumeralWord& word : words) {
         chords.emplace_back(word.mChord, static_cast<double>(chords.size()));
@@ -79,7 +79,7 @@ std::vector<std::string> Numerals(const std::vector<CNumeralWord>& words, const 
 }
 
 std::string WordsJson(const std::vector<CNumeralWord>& words, const CSignKeyLite& key,
-                      bool areNumerals, TNumeralOptions options) {
+                      bool areNumerals, CNumeralOptions options) {
     options.mNashville = false;
     const std::vector<std::string> roman = Numerals(words, key, options);
     options.mNashville = true;
@@ -102,7 +102,7 @@ std::string WordsJson(const std::vector<CNumeralWord>& words, const CSignKeyLite
 
 // The lines as they were typed, with the words turned.
 std::string WordsText(const std::vector<CNumeralWord>& words, const CSignKeyLite& key,
-                      bool toChords, const TNumeralOptions& options) {
+                      bool toChords, const CNumeralOptions& options) {
     std::vector<std::string> turned(words.size());
     if (!toChords) turned = Numerals(words, key, options);
     std::string text;
@@ -117,7 +117,7 @@ std::string WordsText(const std::vector<CNumeralWord>& words, const CSignKeyLite
     return text + '\n';
 }
 
-TStatus NumeralsOfWords(const TNumeralsOptions& options) {
+TStatus NumeralsOfWords(const CNumeralsOptions& options) {
     if (options.mKey.empty()) {
         return Fail(TStatus::BadUsage, "--key is required; see brindle numerals --help");
     }
@@ -141,7 +141,7 @@ TStatus NumeralsOfWords(const TNumeralsOptions& options) {
     return Print(WordsText(reading.mWords, *key, toChords, options.mNumerals));
 }
 
-TStatus NumeralsOfAnalysis(const TNumeralsOptions& options) {
+TStatus NumeralsOfAnalysis(const CNumeralsOptions& options) {
     if (options.mWords.size() != 1) {
         return Fail(TStatus::BadUsage, "--from romantext reads one file, or - for standard input");
     }
@@ -157,13 +157,13 @@ TStatus NumeralsOfAnalysis(const TNumeralsOptions& options) {
     return Print(isJson ? RomanTextJson(reading) : RomanTextText(reading, PaintOfOutput()));
 }
 
-TStatus Numerals(const TNumeralsOptions& options) {
+TStatus Numerals(const CNumeralsOptions& options) {
     return options.mFrom == "romantext" ? NumeralsOfAnalysis(options) : NumeralsOfWords(options);
 }
 
 }  // namespace
 
-void AddNumeralOptions(CCommand& command, TNumeralOptions& options) {
+void AddNumeralOptions(CCommand& command, CNumeralOptions& options) {
     command.AddFlag("--nashville", options.mNashville, "Print Nashville numbers: 2-7 57 1");
     command.AddFlag("--figures", options.mFigures,
                     "Inversions are figures: V65, I6 (otherwise V7/^7, I/^3)");
@@ -175,7 +175,7 @@ void AddNumeralOptions(CCommand& command, TNumeralOptions& options) {
 
 void AddNumerals(CCommand& program) {
     CCommand& command = program.AddCommand(kHelp);
-    const auto options = std::make_shared<TNumeralsOptions>();
+    const auto options = std::make_shared<CNumeralsOptions>();
     command
         .AddArgument("TEXT", options->mWords,
                      "Numerals or chords, or the file of an analysis; - reads standard input")

@@ -10,7 +10,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr TCommandHelp kHelp{
+constexpr CCommandHelp kHelp{
     "brindle",
     "Music theory and harmony analysis",
     "  brindle analyse \"Dm7 G7 | C\"\n"

@@ -14,7 +14,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr TCommandHelp kHelp{
+constexpr CCommandHelp kHelp{
     "scale",
     "Read a scale: its notes as they are spelled, mask, type and signs",
     "  brindle scale \"D dorian\"\n"
@@ -67,7 +67,7 @@ std::string ScaleText(const CScaleHeavy& scale, const CPaint& paint) {
         TypeText(scale.ScaleType()), SignsText(scale.SignsCount()));
 }
 
-TStatus Scale(const TLineOptions& options) {
+TStatus Scale(const CLineOptions& options) {
     return PrintLineByLine(
         options, "Scales", ReadScaleText,
         [](const CScaleText& read) { return ScaleToJson(read.mScale); },
@@ -78,7 +78,7 @@ TStatus Scale(const TLineOptions& options) {
 
 void AddScale(CCommand& program) {
     CCommand& command = program.AddCommand(kHelp);
-    const auto options = std::make_shared<TLineOptions>();
+    const auto options = std::make_shared<CLineOptions>();
     command
         .AddArgument("SCALE", options->mWords, "A key and the name of a scale; - reads one a line")
         .Required();

@@ -21,12 +21,12 @@ namespace {
 constexpr std::size_t kMostWarnings = 20;
 
 /// The forms that --from names.
-struct TFormRow {
+struct CFormRow {
     std::string_view mName;
     TSongFormat mFormat;
 };
 
-constexpr auto kForms = std::to_array<TFormRow>({
+constexpr auto kForms = std::to_array<CFormRow>({
     {"auto", TSongFormat_Auto},
     {"plain", TSongFormat_ChordText},
     {"lyrics", TSongFormat_ChordsAboveLyrics},
@@ -39,7 +39,7 @@ constexpr auto kForms = std::to_array<TFormRow>({
 /// A chart may stand in a link or in a page of links; all of these are named alike.
 TSongFormat FormatOf(std::string_view name, std::string_view text) {
     const auto* const row = std::find_if(kForms.begin(), kForms.end(),
-                                         [&](const TFormRow& form) { return form.mName == name; });
+                                         [&](const CFormRow& form) { return form.mName == name; });
     const TSongFormat format = row == kForms.end() ? TSongFormat_Auto : row->mFormat;
     if (format != TSongFormat_Chart) return format;
     const TSongFormat found = SongFormatOf(text);
@@ -92,7 +92,7 @@ void CTypedChords::AddTo(CCommand& command, const std::string& fromPurpose) {
     command.AddFlag("--even", mIsEven, "The chords of a bar without holds share it evenly");
 }
 
-bool TChordSong::HasFault() const {
+bool CChordSong::HasFault() const {
     return std::any_of(mFaults.begin(), mFaults.end(),
                        [](const CSongFault& fault) { return !fault.mIsNote; });
 }
@@ -106,7 +106,7 @@ std::optional<std::vector<CChordLite>> CTypedChords::ReadSymbols(
         }
         return chords;
     }
-    CChordTextPrefs prefs;
+    CChordTextOptions prefs;
     for (const std::string& symbol : symbols) {
         prefs.mBIsBFlat = prefs.mBIsBFlat || ReadChordText(symbol).mHasH;
     }
@@ -137,8 +137,8 @@ std::optional<CChordLite> CTypedChords::ReadSymbol(const std::string& symbol) co
     return chords->front();
 }
 
-TChordSong CTypedChords::ReadSong(std::string_view text, const TChordStringParse& parse) const {
-    TChordSong song;
+CChordSong CTypedChords::ReadSong(std::string_view text, const TChordStringParse& parse) const {
+    CChordSong song;
     if (IsNative()) {
         song.mChords.ParseStringIntoChords(FoldAccidentals(text), parse);
         song.mSymbols = CChordSymbols(text, parse, song.mChords);
@@ -166,7 +166,7 @@ CSong CTypedChords::ReadSource(std::string_view bytes, const TChordStringParse& 
         song.mBeatsPerBar = parse.mBeatsPerBar;
         return song;
     }
-    CSongPrefs prefs;
+    CSongOptions prefs;
     prefs.mFormat = HasScoreBytes(bytes) ? TSongFormat_Auto : FormatOf(mForm, bytes);
     prefs.mBeatsPerBar = parse.mBeatsPerBar;
     prefs.mBeatsPerChord = parse.mBeatsPerChord;
@@ -175,9 +175,9 @@ CSong CTypedChords::ReadSource(std::string_view bytes, const TChordStringParse& 
     return brindle::ReadSong(bytes, prefs);
 }
 
-std::optional<TChordSong> CTypedChords::ReadSongOrFail(std::string_view text,
+std::optional<CChordSong> CTypedChords::ReadSongOrFail(std::string_view text,
                                                        const TChordStringParse& parse) const {
-    TChordSong song = ReadSong(text, parse);
+    CChordSong song = ReadSong(text, parse);
     PrintFaults(text, song.mFaults, mIsLenient);
     if (song.HasFault() && !mIsLenient) return std::nullopt;
     return song;

@@ -20,7 +20,7 @@ namespace brindle::cli {
 class CCommand;
 
 /// A song as somebody typed it.
-struct TChordSong {
+struct CChordSong {
     /// With the end marker.
     CHarmAnlsChords mChords;
     CChordSymbols mSymbols;
@@ -58,10 +58,10 @@ public:
     [[nodiscard]] std::optional<CChordLite> ReadSymbol(const std::string& symbol) const;
 
     /// Reads a typed song and leaves its faults to the caller. The beats are those of `parse`.
-    [[nodiscard]] TChordSong ReadSong(std::string_view text, const TChordStringParse& parse) const;
+    [[nodiscard]] CChordSong ReadSong(std::string_view text, const TChordStringParse& parse) const;
     /// The same with the faults printed: as warnings with --lenient, else as an error, and then
     /// there is no song.
-    [[nodiscard]] std::optional<TChordSong> ReadSongOrFail(std::string_view text,
+    [[nodiscard]] std::optional<CChordSong> ReadSongOrFail(std::string_view text,
                                                            const TChordStringParse& parse) const;
 
     /// The song of a source of any form, a score or a text.

@@ -14,7 +14,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr TCommandHelp kHelp{
+constexpr CCommandHelp kHelp{
     "types",
     "List the catalogue of chord types: id, name, intervals, and the name on C",
     "  brindle types\n"

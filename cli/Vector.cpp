@@ -17,7 +17,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr TCommandHelp kHelp{
+constexpr CCommandHelp kHelp{
     "vector",
     "Write chords as vectors of 46 places for learning systems, and read vectors back",
     "  brindle vector C/E F#m7\n"
@@ -29,14 +29,14 @@ constexpr TCommandHelp kHelp{
     "to 11; and the bass from C to B. A vector may also be a JSON list of 46 numbers.\n",
 };
 
-struct TVectorOptions {
+struct CVectorOptions {
     std::vector<std::string> mWords;
     CTypedChords mReading;
     CFormatOptions mFormat;
 };
 
 /// A chord, its vector, and what the vector says.
-struct TShownVector {
+struct CShownVector {
     std::string mSymbol;  // empty when the vector was typed
     std::vector<float> mVector;
     CHarmAnlsChordForMetro mReadBack;
@@ -48,10 +48,10 @@ bool IsVectorText(std::string_view typed) {
     return !typed.empty() && std::string_view("01[{").find(typed.front()) != typed.npos;
 }
 
-TShownVector Show(const std::string& typed, const CChordLite& chord) {
-    TShownVector shown;
+CShownVector Show(const std::string& typed, const CChordLite& chord) {
+    CShownVector shown;
     if (IsVectorText(typed)) {
-        TChordVectorText text = ReadChordVector(typed);
+        CChordVectorText text = ReadChordVector(typed);
         shown.mVector = std::move(text.mVector);
         shown.mError = std::move(text.mError);
         shown.mColumn = text.mColumn;
@@ -70,7 +70,7 @@ std::string NameOf(const CHarmAnlsChordForMetro& chord) {
     return WriteChordSymbol(chord);
 }
 
-Json VectorToJson(const TShownVector& shown) {
+Json VectorToJson(const CShownVector& shown) {
     Json places = Json::array();
     for (const float place : shown.mVector) places.push_back(place == 1.0F ? 1 : 0);
     const CHarmAnlsChordForMetro& chord = shown.mReadBack;
@@ -85,15 +85,15 @@ Json VectorToJson(const TShownVector& shown) {
               {"Intervals", IntervalsToJson(chord.mSemitones)}}}};
 }
 
-std::string VectorsJson(const std::vector<TShownVector>& vectors) {
+std::string VectorsJson(const std::vector<CShownVector>& vectors) {
     Json list = Json::array();
-    for (const TShownVector& vector : vectors) list.push_back(VectorToJson(vector));
+    for (const CShownVector& vector : vectors) list.push_back(VectorToJson(vector));
     return JsonText({{"Vectors", list}});
 }
 
-std::string VectorsText(const std::vector<TShownVector>& vectors, const CPaint& paint) {
+std::string VectorsText(const std::vector<CShownVector>& vectors, const CPaint& paint) {
     CTable table({"chord", "vector", "reads back"});
-    for (const TShownVector& shown : vectors) {
+    for (const CShownVector& shown : vectors) {
         const std::string name = NameOf(shown.mReadBack);
         table.AddRow(
             {shown.mSymbol.empty() ? "-" : shown.mSymbol, WriteChordVector(shown.mVector), name});
@@ -142,18 +142,18 @@ std::optional<std::vector<std::string>> TypedThings(const std::vector<std::strin
     return things;
 }
 
-TStatus Vector(const TVectorOptions& options) {
+TStatus Vector(const CVectorOptions& options) {
     const auto things = TypedThings(options.mWords);
     if (!things) return TStatus::BadInput;
     std::vector<std::string> symbols;
     std::remove_copy_if(things->begin(), things->end(), std::back_inserter(symbols), IsVectorText);
     const auto chords = options.mReading.ReadSymbols(symbols);
     if (!chords) return TStatus::BadInput;
-    std::vector<TShownVector> vectors;
+    std::vector<CShownVector> vectors;
     auto chord = chords->begin();
     for (const std::string& typed : *things) {
         vectors.push_back(Show(typed, IsVectorText(typed) ? CChordLite() : *chord++));
-        const TShownVector& shown = vectors.back();
+        const CShownVector& shown = vectors.back();
         if (shown.mError.empty()) continue;
         return FailAt(TStatus::BadInput, shown.mError, typed, shown.mColumn);
     }
@@ -165,7 +165,7 @@ TStatus Vector(const TVectorOptions& options) {
 
 void AddVector(CCommand& program) {
     CCommand& command = program.AddCommand(kHelp);
-    const auto options = std::make_shared<TVectorOptions>();
+    const auto options = std::make_shared<CVectorOptions>();
     command
         .AddArgument("CHORD", options->mWords,
                      "Chord symbols or vectors; - reads standard input, a vector or chords a line")

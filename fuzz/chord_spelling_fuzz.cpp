@@ -10,7 +10,7 @@
 /// and a normalised symbol must stay as it is (printed names have other rules).
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
     if (size == 0) return 0;
-    brindle::CChordTextPrefs prefs;
+    brindle::CChordTextOptions prefs;
     prefs.mBIsBFlat = (data[0] & 1) != 0;
     prefs.mSolfege = (data[0] & 2) != 0;
     prefs.mLowerCaseIsMinor = (data[0] & 4) != 0;

@@ -33,7 +33,7 @@ void CheckChord(const CHarmAnlsChordForMetro& chord) {
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
     const std::string_view text(reinterpret_cast<const char*>(data), size);
-    const brindle::TChordVectorText read = brindle::ReadChordVector(text);
+    const brindle::CChordVectorText read = brindle::ReadChordVector(text);
     Check(read.mVector.size() == (read.mError.empty() ? 46 : 0) && read.mColumn <= size);
     CHarmAnlsChordForMetro chord;
     chord.SetFromChordVectorRepresentation(read.mVector);

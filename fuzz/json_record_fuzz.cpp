@@ -26,8 +26,8 @@ std::string Written(const TRecord& record) {
     return stream.str();
 }
 
-template <typename TRead>
-void Check(const Json& json, TRead read) {
+template <typename CRead>
+void Check(const Json& json, CRead read) {
     const std::string first = Written(read(json));
     const std::string second = Written(read(Json::parse(first, nullptr, false)));
     if (Written(read(Json::parse(second, nullptr, false))) != second) std::abort();

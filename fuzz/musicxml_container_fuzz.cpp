@@ -81,7 +81,7 @@ std::string ArchiveOf(std::string_view text) {
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
     constexpr std::size_t kMostBytes = 16384;
     if (size > kMostBytes) return 0;
-    SetAlertHandler([](const TAlert&) {});
+    SetAlertHandler([](const CAlert&) {});
     const std::string archive = ArchiveOf({reinterpret_cast<const char*>(data), size});
     std::string score;
     if (MusicXmlParser::unpackCompressedMusicXML(archive, score)) return 0;

@@ -16,7 +16,7 @@
 using namespace brindle;
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
-    SetAlertHandler([](const TAlert&) {});
+    SetAlertHandler([](const CAlert&) {});
     std::size_t written = 0;
     const auto host = std::make_shared<MusicXmlParserDelegate>(MuxmlJsonLines(
         TMuxmlEnumForm_Word, [&written](const std::string& line) { written += line.size(); }));

@@ -12,7 +12,7 @@ constexpr std::size_t kLongestText = 65536;
 
 // What is read is written, and read again as the same tones.
 void CheckWritten(const brindle::CChordLite& chord, const brindle::CSignKeyLite& key,
-                  const brindle::TNumeralOptions& options) {
+                  const brindle::CNumeralOptions& options) {
     const auto numeral = brindle::RomanNumeral(chord, key, nullptr, options);
     const auto read = brindle::ChordFromNumeral(numeral, key, options);
     if (!read || read->mSemitones != chord.mSemitones ||
@@ -21,7 +21,7 @@ void CheckWritten(const brindle::CChordLite& chord, const brindle::CSignKeyLite&
     }
 }
 
-void ReadAsNumerals(std::string_view text, const brindle::TNumeralOptions& options) {
+void ReadAsNumerals(std::string_view text, const brindle::CNumeralOptions& options) {
     for (const char* name : {"Eb major", "F# minor"}) {
         const brindle::CSignKeyLite key(name);
         const auto reading = brindle::ReadNumerals(text, key, options);

@@ -30,7 +30,7 @@ void Check(const brindle::CSong& song, bool isLenient) {
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
     constexpr std::size_t kMostBytes = 4096;
     if (size < 2 || size > kMostBytes) return 0;
-    brindle::CSongPrefs prefs;
+    brindle::CSongOptions prefs;
     prefs.mFormat = static_cast<brindle::TSongFormat>(data[0] % 12);
     prefs.mEven = (data[1] & 4) != 0;
     prefs.mLenient = (data[1] & 8) != 0;

@@ -31,7 +31,7 @@ namespace brindle {
 /// A row of the chord types: what is behind the root, the degrees from the root up (in brackets
 /// those that are usually left out), how rare the type is, and how rare it is over a bass so many
 /// semitones above its root.
-struct TNamingTypeRow {
+struct CNamingTypeRow {
     std::string_view mSuffix;
     std::string_view mDegrees;
     std::int16_t mCost;
@@ -80,7 +80,7 @@ def context_table(context, name, constant, meaning):
 def source():
     types = rows("types.tsv")
     text = HEAD + "// At equal costs the upper row wins.\n"
-    text += f"inline constexpr std::array<TNamingTypeRow, {len(types)}> kNamingTypeRows{{{{\n"
+    text += f"inline constexpr std::array<CNamingTypeRow, {len(types)}> kNamingTypeRows{{{{\n"
     text += "".join(type_row(row) for row in types) + "}};\n"
     context = rows("context.tsv")
     text += "".join(context_table(context, *table) for table in CONTEXTS)

@@ -16,9 +16,9 @@ namespace brindle {
 namespace {
 
 /// A reading with what the groups are formed by, so that sorting stays within one block of memory.
-struct TReading {
+struct CReading {
     const CHarmAnlsCentersInChords* mCenters;
-    TChordRange mOverall;
+    CChordRange mOverall;
     std::size_t mPlace;
 
     [[nodiscard]] bool HasAtMostOneCenter() const { return mCenters->size() <= 1; }
@@ -33,7 +33,7 @@ bool LessByRangeAndCenter(const CHarmAnlsCenterInChords& a, const CHarmAnlsCente
 }
 
 /// Readings without centers go first and all have the same overall range.
-bool LessByOverallRange(const TReading& a, const TReading& b) {
+bool LessByOverallRange(const CReading& a, const CReading& b) {
     if (a.mCenters->empty() || b.mCenters->empty()) {
         return a.mCenters->empty() && !b.mCenters->empty();
     }
@@ -41,19 +41,19 @@ bool LessByOverallRange(const TReading& a, const TReading& b) {
     return a.mOverall.mEnd < b.mOverall.mEnd;
 }
 
-bool LessByRanges(const TReading& a, const TReading& b) {
+bool LessByRanges(const CReading& a, const CReading& b) {
     if (a.HasAtMostOneCenter() && b.HasAtMostOneCenter()) return LessByOverallRange(a, b);
     return std::lexicographical_compare(a.mCenters->begin(), a.mCenters->end(), b.mCenters->begin(),
                                         b.mCenters->end(), LessByRange);
 }
 
-bool LessByCenters(const TReading& a, const TReading& b) {
+bool LessByCenters(const CReading& a, const CReading& b) {
     return std::lexicographical_compare(a.mCenters->begin(), a.mCenters->end(), b.mCenters->begin(),
                                         b.mCenters->end(), LessByRangeAndCenter);
 }
 
-std::vector<TReading> ReadingsOf(const CHarmAnlsCenterAlternatives& alternatives) {
-    std::vector<TReading> readings;
+std::vector<CReading> ReadingsOf(const CHarmAnlsCenterAlternatives& alternatives) {
+    std::vector<CReading> readings;
     readings.reserve(alternatives.size());
     for (const CHarmAnlsCenterAlternative& alternative : alternatives) {
         const auto [begin, end] = alternative.mCenters.OverallBeginAndEndInputChord();
@@ -65,12 +65,12 @@ std::vector<TReading> ReadingsOf(const CHarmAnlsCenterAlternatives& alternatives
 /// Hands each group of readings that are equal under `less` to `visit`, in the order of the list.
 template <class Less, class Visit>
 void ForEachGroup(const CHarmAnlsCenterAlternatives& alternatives, Less less, Visit visit) {
-    std::vector<TReading> readings = ReadingsOf(alternatives);
+    std::vector<CReading> readings = ReadingsOf(alternatives);
     std::stable_sort(readings.begin(), readings.end(), less);
     for (auto first = readings.begin(); first != readings.end();) {
         const auto last = std::find_if(
-            first, readings.end(), [&](const TReading& reading) { return less(*first, reading); });
-        visit(std::span<const TReading>(first, last));
+            first, readings.end(), [&](const CReading& reading) { return less(*first, reading); });
+        visit(std::span<const CReading>(first, last));
         first = last;
     }
 }
@@ -83,7 +83,7 @@ bool EachHasOneCenter(const CHarmAnlsCenterAlternatives& alternatives) {
 /// With one center each, one erasure never spares another: what contains the container contains
 /// the contained, too, and the longest one stays.
 std::vector<bool> ContainedReadingsOfOneCenter(const CHarmAnlsCenterAlternatives& alternatives) {
-    std::vector<TChordRange> ranges;
+    std::vector<CChordRange> ranges;
     ranges.reserve(alternatives.size());
     for (const CHarmAnlsCenterAlternative& alternative : alternatives) {
         const CHarmAnlsCenterInChords& center = alternative.mCenters.front();
@@ -141,9 +141,9 @@ bool CHarmAnlsCenterAlternatives::HasLongerContainingAlternernative(const_iterat
 }
 
 void CHarmAnlsCenterAlternatives::RecalculateProbabilitiesOfSimultaneousAlternatives() {
-    ForEachGroup(*this, LessByOverallRange, [this](std::span<const TReading> group) {
+    ForEachGroup(*this, LessByOverallRange, [this](std::span<const CReading> group) {
         if (group.size() == 1) return;
-        for (const TReading& reading : group) {
+        for (const CReading& reading : group) {
             (*this)[reading.mPlace].mProbability = 1.0 / static_cast<double>(group.size());
         }
     });
@@ -157,9 +157,9 @@ void CHarmAnlsCenterAlternatives::RemoveShorterContainedHarmCenters() {
 
 void CHarmAnlsCenterAlternatives::Deduplication() {
     std::vector<bool> isRepeated(size());
-    ForEachGroup(*this, LessByCenters, [&](std::span<const TReading> group) {
+    ForEachGroup(*this, LessByCenters, [&](std::span<const CReading> group) {
         CHarmAnlsCenterAlternative& kept = (*this)[group.front().mPlace];
-        for (const TReading& repeated : group.subspan(1)) {
+        for (const CReading& repeated : group.subspan(1)) {
             kept.mProbability += (*this)[repeated.mPlace].mProbability;
             isRepeated[repeated.mPlace] = true;
         }
@@ -170,9 +170,9 @@ void CHarmAnlsCenterAlternatives::Deduplication() {
 
 void CHarmAnlsCenterAlternatives::RemoveNonSureAlternativesWithSameRangeAsSureAlternative() {
     std::vector<bool> isOutdone(size());
-    ForEachGroup(*this, LessByRanges, [&](std::span<const TReading> group) {
+    ForEachGroup(*this, LessByRanges, [&](std::span<const CReading> group) {
         bool isSure = false;
-        for (const TReading& reading : group) {
+        for (const CReading& reading : group) {
             isOutdone[reading.mPlace] = isSure;
             isSure = isSure || (*this)[reading.mPlace].mProbability == 1.0;
         }

@@ -49,7 +49,7 @@ CHarmAnlsCenter CHarmAnlsCenterInChords::ToHarmAnlsCenter(const CHarmAnlsChords&
 }
 
 void CHarmAnlsCentersInChords::RemoveShorterContainedHarmCenters() {
-    std::vector<TChordRange> ranges;
+    std::vector<CChordRange> ranges;
     ranges.reserve(size());
     for (const CHarmAnlsCenterInChords& center : *this) {
         ranges.push_back({center.mBegin, center.mEnd});

@@ -10,8 +10,8 @@ namespace brindle {
 
 namespace {
 
-template <class TChord>
-void WriteInBraces(std::ostream& stream, const TChord& chord) {
+template <class CChord>
+void WriteInBraces(std::ostream& stream, const CChord& chord) {
     PlainText::Write(stream, "{");
     chord.AppendJSONClassSubstring(stream);
     PlainText::Write(stream, "}");

@@ -30,13 +30,13 @@ CSemitones MajorOrMinorOf(CSemitones chord) {
 }
 
 /// A triad and what becomes of it under a minor or a major seventh.
-struct TWithSevenths {
+struct CWithSevenths {
     CSemitones mMinorSeventh;
     CSemitones mMajorSeventh;
     CSemitones mOtherwise;
 };
 
-CSemitones Choose(CSemitones chord, const TWithSevenths& choice) {
+CSemitones Choose(CSemitones chord, const CWithSevenths& choice) {
     if (chord.HasIntvl(10)) return choice.mMinorSeventh;
     return chord.HasIntvl(11) ? choice.mMajorSeventh : choice.mOtherwise;
 }

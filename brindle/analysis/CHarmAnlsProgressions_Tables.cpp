@@ -9,24 +9,24 @@ namespace brindle {
 namespace {
 
 /// A chord of a row: its quality, and its root in semitones above the tonic.
-struct TElement {
+struct CElement {
     const CSemitonesMatch* mQuality;
     int mRootDist;
 };
 
-struct TRow {
-    std::vector<TElement> mElements;
+struct CRow {
+    std::vector<CElement> mElements;
     int mPriority;
     TSignKeyType mSignKeyType;
 };
 
-CHarmAnlsProgressions TableOf(std::span<const TRow> rows) {
+CHarmAnlsProgressions TableOf(std::span<const CRow> rows) {
     CHarmAnlsProgressions table;
     table.reserve(rows.size());
-    for (const TRow& row : rows) {
+    for (const CRow& row : rows) {
         std::vector<CHarmAnlsProgressionEl> elements;
         elements.reserve(row.mElements.size());
-        for (const TElement& element : row.mElements) {
+        for (const CElement& element : row.mElements) {
             elements.push_back({element.mRootDist, element.mRootDist, *element.mQuality});
         }
         table.emplace_back(std::move(elements), row.mPriority, row.mSignKeyType);
@@ -48,7 +48,7 @@ constexpr TSignKeyType kMinor = TSignKeyType_Minor;
 
 CHarmAnlsProgressions MakeTonicProgressions() {
     // elements: quality and distance from the tonic                            priority  mode
-    const TRow rows[] = {
+    const CRow rows[] = {
         {{{Dominant7, 7}, {Major, 0}},                                               9, kMajor},
         {{{Major, 7}, {Major, 0}},                                                   8, kMajor},
         {{{Major, 0}, {Major, 5}},                                                   8, kMajor},  // ends on the subdominant
@@ -70,7 +70,7 @@ CHarmAnlsProgressions MakeTonicProgressions() {
 
 CHarmAnlsProgressions MakeCadenceProgressions() {
     // elements: quality and distance from the tonic                            priority  mode
-    const TRow rows[] = {
+    const CRow rows[] = {
         {{{Minor, 9}, {Minor, 2}, {Major, 7}, {Major, 0}},                           8, kMajor},
         {{{Minor, 2}, {Major, 7}, {Major, 0}},                                       8, kMajor},
         {{{Major, 7}, {Major, 0}},                                                   4, kMajor},

@@ -97,7 +97,7 @@ public:
 
 private:
     /// Whether a tonic progression begins at a chord, its center, and where it begins.
-    struct TFoundHarmCenter {
+    struct CFoundHarmCenter {
         bool mFound = false;
         CHarmCenterLite mHarmCenter;
         CHarmAnlsChords::const_iterator mChord;
@@ -122,7 +122,7 @@ private:
     void _FindAndInsertHarmCentersUsingCenterWeightAnalysis(
         const CHarmCenterWeightAnalysisParams& params, TOnlyUndefCenters onlyUndef);
     /// The sign key is not read.
-    [[nodiscard]] TFoundHarmCenter _FindHarmCenterViaTonicProgression(
+    [[nodiscard]] CFoundHarmCenter _FindHarmCenterViaTonicProgression(
         CHarmAnlsChords::const_iterator chord, const CHarmAnlsChords& chords,
         const CHarmAnlsSignKey& signKey) const;
     /// Grows first..last (both chords of `chords`) over the chords that fit the center; `last`

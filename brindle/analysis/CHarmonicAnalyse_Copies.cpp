@@ -82,21 +82,21 @@ void SeparateNotNumbers(const CHarmAnlsChordsWithLength& chords, std::vector<TPl
     }
 }
 
-void Append(const std::vector<TCopiedPassage>& passages, CHarmCopies& copies) {
-    for (const TCopiedPassage& passage : passages) copies.push_back(passage.mCopy);
+void Append(const std::vector<CCopiedPassage>& passages, CHarmCopies& copies) {
+    for (const CCopiedPassage& passage : passages) copies.push_back(passage.mCopy);
 }
 
 }  // namespace
 
-std::vector<TCopiedPassage> FindCopiedPassages(const CHarmonicAnalyse& analyse) {
+std::vector<CCopiedPassage> FindCopiedPassages(const CHarmonicAnalyse& analyse) {
     CHarmAnlsChordsWithLength chords;
     analyse.ListAllHarmChordsWithLength(chords);
     THarmRepeatingSequences sequences;
     analyse.GenerateVectorWithRepeatingSequenceIndices(sequences, chords);
-    std::vector<TCopiedPassage> passages;
+    std::vector<CCopiedPassage> passages;
     CCopyFinder(chords, sequences, 0).AppendCopies(0, passages);
     std::stable_sort(passages.begin(), passages.end(),
-                     [](const TCopiedPassage& a, const TCopiedPassage& b) {
+                     [](const CCopiedPassage& a, const CCopiedPassage& b) {
                          return a.mCopy.mTargetPos < b.mCopy.mTargetPos;
                      });
     return passages;
@@ -162,7 +162,7 @@ void CHarmonicAnalyse::RecursiveFillWithSequences(const CHarmAnlsChordsWithLengt
                                                   const THarmRepeatingSequences& sequences,
                                                   std::uint64_t start, std::int32_t position,
                                                   CHarmCopies& copies) const {
-    std::vector<TCopiedPassage> passages;
+    std::vector<CCopiedPassage> passages;
     CCopyFinder(chords, sequences, start).AppendCopies(position, passages);
     Append(passages, copies);
 }

@@ -20,13 +20,13 @@ namespace brindle {
 namespace {
 
 /// The range that a match gives its center: chord indexes, `mNext` is behind the last one.
-struct TMatchedRange {
+struct CMatchedRange {
     std::size_t mFirst;
     std::size_t mNext;
 };
 
 /// Grows the range of a match at `at` within the chords from `begin` on.
-TMatchedRange RangeOfMatch(const CHarmCenterLite& center, const CHarmAnlsChords& chords,
+CMatchedRange RangeOfMatch(const CHarmCenterLite& center, const CHarmAnlsChords& chords,
                            std::size_t begin, std::size_t at) {
     const auto listBegin = chords.begin() + static_cast<std::ptrdiff_t>(begin);
     auto first = chords.begin() + static_cast<std::ptrdiff_t>(at);
@@ -111,7 +111,7 @@ public:
     }
     /// What ChangeRangeOfHarmCenter does: the chords before the range go to the preceding center if
     /// the center was to reach that far, and those behind it are left for a new one.
-    bool GiveRange(TMatchedRange range) {
+    bool GiveRange(CMatchedRange range) {
         const double start = mChords[range.mFirst].mPosition;
         if (Center().mPosition < start) GiveToPreceding(range.mFirst);
         Center().mPosition = start;
@@ -167,7 +167,7 @@ public:
         at = mNext;
         return CProgressionFinder(mProgressions, Chords()).NextBestRow(at);
     }
-    bool GiveRange(TMatchedRange range) {
+    bool GiveRange(CMatchedRange range) {
         const auto center = mCenters.ChangeRangeOfHarmCenter(
             mCenters.begin() + static_cast<std::ptrdiff_t>(mIndex),
             Chords()[range.mFirst].mPosition, PositionAt(Chords(), range.mNext));
@@ -243,7 +243,7 @@ void CHarmonicAnalyse::_FindAndInsertHarmCenterUsingTonicProgressions_ForSignKey
     }
 }
 
-CHarmonicAnalyse::TFoundHarmCenter CHarmonicAnalyse::_FindHarmCenterViaTonicProgression(
+CHarmonicAnalyse::CFoundHarmCenter CHarmonicAnalyse::_FindHarmCenterViaTonicProgression(
     CHarmAnlsChords::const_iterator chord, const CHarmAnlsChords& chords,
     const CHarmAnlsSignKey& /*signKey*/) const {
     const auto matches = mProgressions.FindAndSortForwardMatchingProgressions(chord, chords);

@@ -16,7 +16,7 @@ constexpr std::string_view kWhiteSpace = " \t\n\v\f\r";
 // in the first half, so that it could have been as long as the other half.
 constexpr std::ptrdiff_t kHalfWindow = 128;
 
-struct TSeparator {
+struct CSeparator {
     const char* mBegin;
     const char* mEnd;
     [[nodiscard]] bool IsEmpty() const { return mBegin == mEnd; }
@@ -30,14 +30,14 @@ public:
     CWindowedSearch(std::string_view text, const std::regex& regex)
         : mBegin(text.data()), mEnd(text.data() + text.size()), mRegex(regex) {}
 
-    [[nodiscard]] std::optional<TSeparator> FirstFrom(const char* from) const {
+    [[nodiscard]] std::optional<CSeparator> FirstFrom(const char* from) const {
         std::cmatch match;
         while (true) {
             const bool isLast = mEnd - from <= 2 * kHalfWindow;
             const char* const stop = isLast ? mEnd : from + 2 * kHalfWindow;
             const bool found = std::regex_search(from, stop, match, mRegex, Flags(from, stop));
             if (found && (isLast || match[0].first - from < kHalfWindow)) {
-                return TSeparator{match[0].first, match[0].second};
+                return CSeparator{match[0].first, match[0].second};
             }
             if (isLast) return std::nullopt;
             from += kHalfWindow;
@@ -45,14 +45,14 @@ public:
     }
 
     /// After an empty match: a match that begins here and is not empty, or one further on.
-    [[nodiscard]] std::optional<TSeparator> NextFrom(const char* from) const {
+    [[nodiscard]] std::optional<CSeparator> NextFrom(const char* from) const {
         if (from == mEnd) return std::nullopt;
         const char* const stop = mEnd - from <= kHalfWindow ? mEnd : from + kHalfWindow;
         const TFlags flags = Flags(from, stop) | std::regex_constants::match_not_null |
                              std::regex_constants::match_continuous;
         std::cmatch match;
         if (std::regex_search(from, stop, match, mRegex, flags)) {
-            return TSeparator{match[0].first, match[0].second};
+            return CSeparator{match[0].first, match[0].second};
         }
         return FirstFrom(from + 1);
     }

@@ -28,7 +28,7 @@ constexpr std::string_view kNoKey = "there is no key";
 constexpr std::string_view kWhiteSpace = " \t\n\r\f\v";
 
 /// What the slashes cut. The views are pieces of the folded text.
-struct TPieces {
+struct CNumeralPieces {
     static constexpr std::size_t kMostTargets = 8;
 
     std::string_view mChord;
@@ -94,8 +94,8 @@ std::string_view TakeFigureWithSlashes(std::string_view& text) {
     return figure;
 }
 
-const TAugmentedSixth* TakeAugmentedSixth(std::string_view& text) {
-    for (const TAugmentedSixth& chord : kAugmentedSixths) {
+const CAugmentedSixth* TakeAugmentedSixth(std::string_view& text) {
+    for (const CAugmentedSixth& chord : kAugmentedSixths) {
         if (!text.starts_with(chord.mWord)) continue;
         text.remove_prefix(chord.mWord.size());
         return &chord;
@@ -108,15 +108,16 @@ bool IsWordOfNeapolitan(std::string_view text) {
 }
 
 bool BeginsTarget(std::string_view piece) {
-    const TReadDegree degree = ReadDegree(piece);
+    const CReadDegree degree = ReadDegree(piece);
     return (degree.IsRead() && !degree.mIsDigit) || IsWordOfNeapolitan(piece);
 }
 
-void CutPiece(std::string_view piece, TPieces& pieces) {
+void CutPiece(std::string_view piece, CNumeralPieces& pieces) {
     const bool isLast = !pieces.mBass.empty();
     if (piece.empty() || isLast) return pieces.Fail(kNoTarget, piece);
     if (BeginsTarget(piece)) {
-        if (pieces.mTargetCount == TPieces::kMostTargets) return pieces.Fail(kNoTarget, piece);
+        if (pieces.mTargetCount == CNumeralPieces::kMostTargets)
+            return pieces.Fail(kNoTarget, piece);
         pieces.mTargets[pieces.mTargetCount++] = piece;
         return;
     }
@@ -126,8 +127,8 @@ void CutPiece(std::string_view piece, TPieces& pieces) {
     pieces.mBass = piece;
 }
 
-TPieces PiecesOf(std::string_view text) {
-    TPieces pieces;
+CNumeralPieces PiecesOf(std::string_view text) {
+    CNumeralPieces pieces;
     pieces.mChord = TakeFigureWithSlashes(text);
     while (!text.empty() && pieces.mFault.empty()) {
         text.remove_prefix(1);
@@ -144,8 +145,8 @@ TPieces PiecesOf(std::string_view text) {
 }
 
 /// A chord before its root and bass are spelled.
-struct TReadChord {
-    TNumeralDegree mDegree;
+struct CReadChord {
+    CNumeralDegree mDegree;
     CSemitones mSemitones;
     int mBass = 0;      ///< semitones above the root
     int mBassStep = 1;  ///< the letters to it, 1 for the root
@@ -153,15 +154,15 @@ struct TReadChord {
     std::string_view mFaultPiece;
 };
 
-TReadChord Failed(std::string_view fault, std::string_view piece) {
-    TReadChord chord;
+CReadChord Failed(std::string_view fault, std::string_view piece) {
+    CReadChord chord;
     chord.mFault = fault;
     chord.mFaultPiece = piece;
     return chord;
 }
 
-bool ApplyGroups(const CFoldedNumeral& text, const TNumeralRoot& root, TReadTones& tones,
-                 TReadChord& chord) {
+bool ApplyGroups(const CFoldedNumeral& text, const CNumeralRoot& root, CReadTones& tones,
+                 CReadChord& chord) {
     for (std::size_t i = 0; i < text.GroupCount(); ++i) {
         if (ApplyGroup(text.Group(i), root, tones)) continue;
         chord = Failed(kNoGroup, text.Group(i));
@@ -180,11 +181,11 @@ int BassNearStep(CSemitones semitones, int step) {
 }
 
 // The figure of such a chord, Ger6/5 or Ger+6; null for one that it does not have.
-const TAugmentedSixthFigure* FigureOfAugmentedSixth(std::string_view tail) {
+const CAugmentedSixthFigure* FigureOfAugmentedSixth(std::string_view tail) {
     if (tail.starts_with('+')) tail.remove_prefix(1);
     const auto row =
         std::find_if(kAugmentedSixthFigures.begin(), kAugmentedSixthFigures.end(),
-                     [&](const TAugmentedSixthFigure& known) { return known.mText == tail; });
+                     [&](const CAugmentedSixthFigure& known) { return known.mText == tail; });
     return row == kAugmentedSixthFigures.end() ? nullptr : &*row;
 }
 
@@ -197,19 +198,19 @@ int StepInAugmentedSixth(int semitone, bool isFrench) {
     return 5;
 }
 
-TReadChord ReadAugmentedSixth(const TAugmentedSixth& sixth, std::string_view tail,
+CReadChord ReadAugmentedSixth(const CAugmentedSixth& sixth, std::string_view tail,
                               const CFoldedNumeral& text, TSignKeyType type) {
-    const TAugmentedSixthFigure* figure = FigureOfAugmentedSixth(tail);
+    const CAugmentedSixthFigure* figure = FigureOfAugmentedSixth(tail);
     if (figure == nullptr) return Failed(kNoSign, tail);
-    TReadChord chord;
+    CReadChord chord;
     chord.mDegree = FoldMinorFlat(sixth.mRoot, type);
     const bool isFrench = sixth.mRoot.mNumber == 2;
     chord.mBass = isFrench ? figure->mBassInFrench : figure->mBassInMost;
     chord.mBassStep = StepInAugmentedSixth(chord.mBass, isFrench);
     const int turn = sixth.mStepRoot;
-    TReadTones tones{sixth.mSemitones, 1};
+    CReadTones tones{sixth.mSemitones, 1};
     tones.mSemitones.RotateRootToIx(turn);
-    const TNumeralDegree stepDegree = turn == 0 ? sixth.mRoot : TNumeralDegree{4, 1};
+    const CNumeralDegree stepDegree = turn == 0 ? sixth.mRoot : CNumeralDegree{4, 1};
     if (!ApplyGroups(text, {stepDegree, TSignKeyType_Minor, false}, tones, chord)) return chord;
     tones.mSemitones.RotateRootToIx(12 - turn);
     chord.mSemitones = tones.mSemitones;
@@ -218,16 +219,16 @@ TReadChord ReadAugmentedSixth(const TAugmentedSixth& sixth, std::string_view tai
 
 // In minor the leading tone is the root of viio7 and viiø7, whether or not it has its sharp. A viø7
 // is on the raised sixth for those who write figures.
-int RaisedInMinor(const TReadDegree& degree, bool isDiminished, const TNumeralOptions& options) {
+int RaisedInMinor(const CReadDegree& degree, bool isDiminished, const CNumeralOptions& options) {
     if (!degree.mIsSmall || degree.mDegree.mAccidental != 0) return 0;
     if (degree.mDegree.mNumber == 7) return isDiminished || options.mByKey ? 1 : 0;
     if (degree.mDegree.mNumber != 6) return 0;
     return options.mByKey || (isDiminished && options.mFigures) ? 1 : 0;
 }
 
-TNumeralDegree DegreeInKey(const TReadDegree& read, std::string_view tail, TSignKeyType type,
-                           const TNumeralOptions& options) {
-    TNumeralDegree degree = FoldMinorFlat(read.mDegree, type);
+CNumeralDegree DegreeInKey(const CReadDegree& read, std::string_view tail, TSignKeyType type,
+                           const CNumeralOptions& options) {
+    CNumeralDegree degree = FoldMinorFlat(read.mDegree, type);
     if (type != TSignKeyType_Minor) return degree;
     const bool isDiminished = tail.starts_with('o') || tail.starts_with('h');
     degree.mAccidental += RaisedInMinor(read, isDiminished, options);
@@ -244,14 +245,14 @@ std::string_view HalfDiminishedTail(std::string_view slashed) {
 }
 
 /// The head of a chord, read: its degree, and the tail behind it.
-struct THead {
-    TReadDegree mDegree;
+struct CHead {
+    CReadDegree mDegree;
     std::string_view mTail;
     /// The word of the head goes with figures: N6 is an inversion.
     bool mHasFigures = false;
 };
 
-THead ReadHead(std::string_view text, TSignKeyType type) {
+CHead ReadHead(std::string_view text, TSignKeyType type) {
     for (const std::string_view word : {"Cad", "K"}) {
         if (!text.starts_with(word)) continue;
         const std::string_view tail = text.substr(word.size());
@@ -263,18 +264,18 @@ THead ReadHead(std::string_view text, TSignKeyType type) {
     if (text.starts_with("CTo"))
         return {{{1, 0}, true, false, text.substr(2)}, text.substr(2), true};
     if (IsWordOfNeapolitan(text)) return {{{2, -1}, false, false, {}}, text.substr(1), true};
-    THead head{ReadDegree(text), {}, false};
+    CHead head{ReadDegree(text), {}, false};
     head.mTail = head.mDegree.mRest;
     return head;
 }
 
-TReadChord ReadChord(const TPieces& pieces, const CFoldedNumeral& text, TSignKeyType type,
-                     TNumeralOptions options) {
+CReadChord ReadChord(const CNumeralPieces& pieces, const CFoldedNumeral& text, TSignKeyType type,
+                     CNumeralOptions options) {
     std::string_view tail = pieces.mChord;
-    if (const TAugmentedSixth* sixth = TakeAugmentedSixth(tail)) {
+    if (const CAugmentedSixth* sixth = TakeAugmentedSixth(tail)) {
         return ReadAugmentedSixth(*sixth, tail, text, type);
     }
-    THead head = ReadHead(pieces.mChord, type);
+    CHead head = ReadHead(pieces.mChord, type);
     if (!head.mDegree.IsRead()) return Failed(kNoDegree, pieces.mChord);
     options.mFigures = options.mFigures || head.mHasFigures;
     if (!pieces.mSlashedTail.empty()) {
@@ -282,10 +283,10 @@ TReadChord ReadChord(const TPieces& pieces, const CFoldedNumeral& text, TSignKey
         if (!head.mTail.empty() || tailOfSign.empty()) return Failed(kNoSign, pieces.mSlashedTail);
         head.mTail = tailOfSign;
     }
-    TReadChord chord;
+    CReadChord chord;
     chord.mDegree = DegreeInKey(head.mDegree, head.mTail, type, options);
-    const TNumeralRoot root{chord.mDegree, type, head.mDegree.mIsSmall};
-    TReadTones tones = TonesOfTail(head.mTail, root, options);
+    const CNumeralRoot root{chord.mDegree, type, head.mDegree.mIsSmall};
+    CReadTones tones = TonesOfTail(head.mTail, root, options);
     if (tones.mSemitones.IsEmpty()) return Failed(kNoSign, head.mTail);
     if (!ApplyGroups(text, root, tones, chord)) return chord;
     chord.mSemitones = tones.mSemitones;
@@ -297,8 +298,8 @@ TReadChord ReadChord(const TPieces& pieces, const CFoldedNumeral& text, TSignKey
 }
 
 // "3", "b7" or "Eb".
-CKeyEnh ReadBass(const TPieces& pieces, const CSignKeyLite& key) {
-    const TReadDegree degree = ReadDegree(pieces.mBass);
+CKeyEnh ReadBass(const CNumeralPieces& pieces, const CSignKeyLite& key) {
+    const CReadDegree degree = ReadDegree(pieces.mBass);
     if (degree.IsRead()) {
         if (!degree.mIsDigit || !degree.mRest.empty()) return CKeyEnh_Undef;
         return KeyOfDegree(
@@ -316,10 +317,10 @@ CKeyEnh ReadBass(const TPieces& pieces, const CSignKeyLite& key) {
 // The key in which the numeral before the slash counts: that of the degree, minor for small
 // letters. The figures of a target do not count.
 std::optional<CSignKeyLite> KeyOfTarget(std::string_view target, const CSignKeyLite& key,
-                                        const TNumeralOptions& options) {
-    const THead head = ReadHead(target, key.mSignKeyType);
-    const TNumeralDegree degree = DegreeInKey(head.mDegree, head.mTail, key.mSignKeyType, options);
-    const TNumeralRoot root{degree, key.mSignKeyType, head.mDegree.mIsSmall};
+                                        const CNumeralOptions& options) {
+    const CHead head = ReadHead(target, key.mSignKeyType);
+    const CNumeralDegree degree = DegreeInKey(head.mDegree, head.mTail, key.mSignKeyType, options);
+    const CNumeralRoot root{degree, key.mSignKeyType, head.mDegree.mIsSmall};
     if (TonesOfTail(head.mTail, root, options).mSemitones.IsEmpty()) return std::nullopt;
     const bool isMinor = head.mDegree.mIsSmall || head.mTail.starts_with('m');
     return CSignKeyLite(KeyOfDegree(degree, key),
@@ -330,8 +331,8 @@ CNumeralReading Fault(std::string_view fault, std::string_view piece, const CFol
     return {CChordLite_Undef, fault, text.OffsetOf(piece)};
 }
 
-CNumeralReading Finished(const TReadChord& chord, const CSignKeyLite& keyOfTarget,
-                         const TPieces& pieces, const CSignKeyLite& key,
+CNumeralReading Finished(const CReadChord& chord, const CSignKeyLite& keyOfTarget,
+                         const CNumeralPieces& pieces, const CSignKeyLite& key,
                          const CFoldedNumeral& text) {
     const CKeyEnh root = KeyOfDegree(chord.mDegree, keyOfTarget);
     CKeyEnh bass = CKeyEnh_Undef;
@@ -346,14 +347,14 @@ CNumeralReading Finished(const TReadChord& chord, const CSignKeyLite& keyOfTarge
 }  // namespace
 
 CNumeralReading ReadNumeral(std::string_view typed, const CSignKeyLite& key,
-                            const TNumeralOptions& options) {
+                            const CNumeralOptions& options) {
     if (key.IsUndef()) return {CChordLite_Undef, kNoKey, 0};
     if (typed.find_first_of(kWhiteSpace) != typed.npos) return {CChordLite_Undef, kNoDegree, 0};
     if (typed.size() > CFoldedNumeral::kLongest) return {CChordLite_Undef, kTooLong, 0};
     const CFoldedNumeral text(typed);
     if (!text.IsWhole())
         return {CChordLite_Undef, kNoGroup, std::min(typed.find('['), typed.size())};
-    const TPieces pieces = PiecesOf(text.Text());
+    const CNumeralPieces pieces = PiecesOf(text.Text());
     if (!pieces.mFault.empty()) return Fault(pieces.mFault, pieces.mFaultPiece, text);
     CSignKeyLite keyOfTarget = key;
     for (std::size_t i = pieces.mTargetCount; i-- > 0;) {
@@ -361,14 +362,14 @@ CNumeralReading ReadNumeral(std::string_view typed, const CSignKeyLite& key,
         if (!target) return Fault(kNoSign, pieces.mTargets[i], text);
         keyOfTarget = *target;
     }
-    const TReadChord chord = ReadChord(pieces, text, keyOfTarget.mSignKeyType, options);
+    const CReadChord chord = ReadChord(pieces, text, keyOfTarget.mSignKeyType, options);
     if (!chord.mFault.empty()) return Fault(chord.mFault, chord.mFaultPiece, text);
     if (chord.mSemitones.IsEmpty()) return {CChordLite_Undef, kNoTones, 0};
     return Finished(chord, keyOfTarget, pieces, key, text);
 }
 
 std::optional<CChordLite> ChordFromNumeral(std::string_view text, const CSignKeyLite& key,
-                                           const TNumeralOptions& options) {
+                                           const CNumeralOptions& options) {
     const CNumeralReading reading = ReadNumeral(text, key, options);
     if (reading.mChord.IsUndef()) return std::nullopt;
     return reading.mChord;

@@ -11,17 +11,17 @@
 namespace brindle {
 
 /// A range of a chord list.
-struct TChordRange {
+struct CChordRange {
     CHarmAnlsChords::const_iterator mBegin;
     /// One behind the last chord.
     CHarmAnlsChords::const_iterator mEnd;
 
-    friend bool operator==(const TChordRange&, const TChordRange&) = default;
+    friend bool operator==(const CChordRange&, const CChordRange&) = default;
 };
 
 /// For each range of one list of chords whether a longer one of them contains it. Equal ranges do
 /// not contain each other.
-[[nodiscard]] std::vector<bool> ContainedInLongerRange(std::span<const TChordRange> ranges);
+[[nodiscard]] std::vector<bool> ContainedInLongerRange(std::span<const CChordRange> ranges);
 
 /// Erases the elements whose mark is set. Returns whether there were any.
 template <class List>

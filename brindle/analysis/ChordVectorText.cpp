@@ -15,16 +15,16 @@ constexpr std::string_view kBetween = " \t\r\n,";
 // Where a new group of digits begins.
 constexpr std::array<std::size_t, 4> kGroups = {3, 15, 22, 34};
 
-TChordVectorText Fault(std::string error, std::size_t column) {
+CChordVectorText Fault(std::string error, std::size_t column) {
     return {{}, std::move(error), column};
 }
 
-TChordVectorText CheckedCount(std::vector<float> vector) {
+CChordVectorText CheckedCount(std::vector<float> vector) {
     if (vector.size() == CHarmAnlsChordForMetro::VectorSize) return {std::move(vector), {}, 0};
     return Fault("a vector has 46 places, here are " + std::to_string(vector.size()), 0);
 }
 
-TChordVectorText ReadDigits(std::string_view text) {
+CChordVectorText ReadDigits(std::string_view text) {
     std::vector<float> vector;
     for (std::size_t column = 0; column < text.size(); ++column) {
         if (kBetween.find(text[column]) != kBetween.npos) continue;
@@ -36,7 +36,7 @@ TChordVectorText ReadDigits(std::string_view text) {
     return CheckedCount(std::move(vector));
 }
 
-TChordVectorText ReadJson(std::string_view text) {
+CChordVectorText ReadJson(std::string_view text) {
     const auto json = nlohmann::json::parse(text.begin(), text.end(), nullptr, false);
     const bool isObject = json.is_object() && json.contains("VectorRep");
     const nlohmann::json& list = isObject ? json.at("VectorRep") : json;
@@ -51,7 +51,7 @@ TChordVectorText ReadJson(std::string_view text) {
 
 }  // namespace
 
-TChordVectorText ReadChordVector(std::string_view text) {
+CChordVectorText ReadChordVector(std::string_view text) {
     const std::size_t first = text.find_first_not_of(kBetween);
     const bool isJson = first != text.npos && (text[first] == '[' || text[first] == '{');
     return isJson ? ReadJson(text.substr(first)) : ReadDigits(text);

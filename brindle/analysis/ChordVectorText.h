@@ -10,7 +10,7 @@
 namespace brindle {
 
 /// What a text says about the vector of a chord (see CHarmAnlsChordForMetro).
-struct TChordVectorText {
+struct CChordVectorText {
     /// 46 places of 0.0 or 1.0; empty if the text is no vector.
     std::vector<float> mVector;
     /// What is wrong, and where, counted from 0 in bytes; empty if nothing is.
@@ -20,7 +20,7 @@ struct TChordVectorText {
 
 /// Reads 46 digits 0 and 1 with any white space and commas between, or a JSON list of 46 numbers,
 /// or the JSON object that CHarmAnlsChordForMetro writes.
-[[nodiscard]] TChordVectorText ReadChordVector(std::string_view text);
+[[nodiscard]] CChordVectorText ReadChordVector(std::string_view text);
 
 /// The digits in groups: special chords, root, basic chord, semitones, bass.
 [[nodiscard]] std::string WriteChordVector(std::span<const float> vector);

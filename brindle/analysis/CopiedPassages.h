@@ -12,7 +12,7 @@ class CHarmonicAnalyse;
 
 /// A copy together with the chords that it is made of: bars and beats of a CHarmCopy are cut to
 /// whole numbers, these are exact.
-struct TCopiedPassage {
+struct CCopiedPassage {
     CHarmCopy mCopy;
     /// Number of the first chord of the source and of the copy in the list `mChords`, from 0.
     std::uint64_t mSource = 0;
@@ -22,6 +22,6 @@ struct TCopiedPassage {
 };
 
 /// The copies that CHarmonicAnalyse::FindHarmCopies finds, in the same order.
-[[nodiscard]] std::vector<TCopiedPassage> FindCopiedPassages(const CHarmonicAnalyse& analyse);
+[[nodiscard]] std::vector<CCopiedPassage> FindCopiedPassages(const CHarmonicAnalyse& analyse);
 
 }  // namespace brindle

@@ -7,9 +7,9 @@ namespace brindle {
 
 CKeyOfSong FindKeys(const CHarmAnlsChords& chords, const CKeyOptions& options) {
     CKeyOfSong found;
-    const std::vector<TKeyChord> heard = KeyChordsOf(chords);
+    const std::vector<CKeyChord> heard = KeyChordsOf(chords);
     if (heard.empty()) return found;
-    const TSongKeys keys = FindSongKeys(heard, options);
+    const CSongKeys keys = FindSongKeys(heard, options);
     const CKeySpeller speller(chords);
     found.mScores = keys.mScores;
     found.mKey = speller.SignKeyOf(keys.mBestScored);

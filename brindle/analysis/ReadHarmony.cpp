@@ -27,13 +27,13 @@ int LetterOfKey(const CKeyEnh& keyEnh) {
 }
 
 // Behind the last place at which a chord is written.
-std::size_t EndOf(std::span<const TKeyChord> heard, std::size_t ix, std::size_t count) {
+std::size_t EndOf(std::span<const CKeyChord> heard, std::size_t ix, std::size_t count) {
     return ix + 1 < heard.size() ? heard[ix + 1].mBegin : count;
 }
 
 // The spelling that one of the times tells at which the chord is written.
 std::vector<TSeventhSpelling> SeventhsOf(const CHarmAnlsChords& chords,
-                                         std::span<const TKeyChord> heard,
+                                         std::span<const CKeyChord> heard,
                                          std::span<const TSeventhSpelling> stated) {
     std::vector<TSeventhSpelling> sevenths(heard.size(), TSeventhSpelling_Undef);
     for (std::size_t i = 0; i < heard.size(); ++i) {
@@ -50,8 +50,8 @@ std::vector<TSeventhSpelling> SeventhsOf(const CHarmAnlsChords& chords,
 }
 
 // The reading of each chord stands at its first place in the list.
-std::vector<CChordReading> ReadChords(std::size_t count, std::span<const TKeyChord> heard,
-                                      const TSongKeys& keys, const CKeySpeller& speller,
+std::vector<CChordReading> ReadChords(std::size_t count, std::span<const CKeyChord> heard,
+                                      const CSongKeys& keys, const CKeySpeller& speller,
                                       std::span<const TSeventhSpelling> sevenths) {
     const std::vector<std::ptrdiff_t> under = HarmonyChain(heard, keys.mKinds, keys.mTraits.mHome);
     std::vector<CChordReading> readings(count);
@@ -66,7 +66,7 @@ std::vector<CChordReading> ReadChords(std::size_t count, std::span<const TKeyCho
 }
 
 // Gives chords that are written again the same reading.
-void Spread(const CHarmAnlsChords& chords, std::span<const TKeyChord> heard,
+void Spread(const CHarmAnlsChords& chords, std::span<const CKeyChord> heard,
             std::vector<CChordReading>& readings) {
     for (std::size_t i = 0; i < heard.size(); ++i) {
         const std::size_t end = EndOf(heard, i, chords.size());
@@ -91,12 +91,12 @@ TSeventhSpelling SeventhSpellingOf(const CKeyEnh& root, const CKeyEnh& seventh) 
 
 CSongReading ReadHarmony(const CHarmAnlsChords& chords, const CReadingOptions& options) {
     CSongReading song;
-    const std::vector<TKeyChord> heard = KeyChordsOf(chords);
+    const std::vector<CKeyChord> heard = KeyChordsOf(chords);
     if (heard.empty()) {
         song.mChords.resize(chords.size());
         return song;
     }
-    const TSongKeys keys = FindSongKeys(heard, options.mKeys, NumberOfKey(options.mStatedKey));
+    const CSongKeys keys = FindSongKeys(heard, options.mKeys, NumberOfKey(options.mStatedKey));
     const CKeySpeller speller(chords, options.mStatedKey);
     const int home = keys.mTraits.mHome;
     song.mKey = speller.SignKeyOf(home);

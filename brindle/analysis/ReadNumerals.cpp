@@ -37,7 +37,7 @@ std::vector<CNumeralWord> NumeralWords(std::string_view text) {
 }
 
 CNumeralsReading ReadNumerals(std::string_view text, const CSignKeyLite& key,
-                              const TNumeralOptions& options) {
+                              const CNumeralOptions& options) {
     CNumeralsReading reading{NumeralWords(text), {}};
     for (CNumeralWord& word : reading.mWords) {
         if (word.IsMark()) continue;

@@ -39,6 +39,6 @@ struct CNumeralsReading {
 /// A word that is not understood is a fault and has no chord; the others are read all the same.
 /// Time is linear in the length of the text.
 [[nodiscard]] CNumeralsReading ReadNumerals(std::string_view text, const CSignKeyLite& key,
-                                            const TNumeralOptions& options = {});
+                                            const CNumeralOptions& options = {});
 
 }  // namespace brindle

@@ -20,7 +20,7 @@ constexpr std::string_view kNotHigher =
     "the number of the measure is not higher than the one before";
 
 /// What stands behind the number of a measure.
-struct TMeasureText {
+struct CMeasureText {
     std::string_view mText;
     std::string_view mLine;
     std::size_t mLineNumber = 0;
@@ -47,8 +47,8 @@ public:
 
 private:
     CRomanTextReading mReading;
-    std::unordered_map<int, TMeasureText> mMeasures;
-    TTimeSignature mTime;
+    std::unordered_map<int, CMeasureText> mMeasures;
+    CTimeSignature mTime;
     std::optional<CSignKeyLite> mKey;
     double mEnd = 0.0;
     int mLastNumber = -1;
@@ -59,7 +59,7 @@ private:
     std::size_t mLineNumber = 0;
 
     /// Where the next numeral of a measure stands.
-    struct TPlace {
+    struct CPlaceInText {
         double mBarPosition = 0.0;
         double mBarLength = 0.0;
         double mPosition = 0.0;
@@ -69,16 +69,16 @@ private:
     };
 
     void ReadLine();
-    void ReadMeasureLine(std::string_view rest, const TMeasureRange& range);
+    void ReadMeasureLine(std::string_view rest, const CMeasureRange& range);
     void ReadHeader(std::size_t colon);
     void ReadTime(std::string_view value);
-    void CopyMeasures(const TMeasureRange& range, std::string_view source);
+    void CopyMeasures(const CMeasureRange& range, std::string_view source);
     void FillTo(int number);
-    void AddMeasure(int number, const TMeasureText& measure, bool hasLetter);
-    void ReadWord(std::string_view word, TPlace& place);
-    void ReadBeat(double beat, std::string_view word, TPlace& place);
-    void ReadNumeralAt(std::string_view word, TPlace& place);
-    void AddChord(CRomanTextChord chord, std::string_view word, TPlace& place);
+    void AddMeasure(int number, const CMeasureText& measure, bool hasLetter);
+    void ReadWord(std::string_view word, CPlaceInText& place);
+    void ReadBeat(double beat, std::string_view word, CPlaceInText& place);
+    void ReadNumeralAt(std::string_view word, CPlaceInText& place);
+    void AddChord(CRomanTextChord chord, std::string_view word, CPlaceInText& place);
     void SetLengths();
 
     void Fail(std::string_view what, std::string_view where, bool isNote = false);
@@ -136,18 +136,18 @@ void CRomanTextReader::ReadTime(std::string_view value) {
     mReading.mTimes.push_back({time->mBeats, time->mBeatValue, mEnd});
 }
 
-void CRomanTextReader::ReadMeasureLine(std::string_view rest, const TMeasureRange& range) {
+void CRomanTextReader::ReadMeasureLine(std::string_view rest, const CMeasureRange& range) {
     rest = Trimmed(rest);
     if (range.mIsVariant) return Fail("another reading of the measure is left out", mLine, true);
     if (rest.starts_with('=')) return CopyMeasures(range, Trimmed(rest.substr(1)));
     if (range.mLast != range.mFirst) return Fail("more than one measure is a copy, with =", mLine);
     if (rest.starts_with(':')) rest.remove_prefix(1);
-    const TMeasureText measure{rest, mLine, mLineNumber};
+    const CMeasureText measure{rest, mLine, mLineNumber};
     if (!range.mHasLetter) mMeasures.insert_or_assign(range.mFirst, measure);
     AddMeasure(range.mFirst, measure, range.mHasLetter);
 }
 
-void CRomanTextReader::CopyMeasures(const TMeasureRange& range, std::string_view source) {
+void CRomanTextReader::CopyMeasures(const CMeasureRange& range, std::string_view source) {
     const std::string_view typed = source;
     const auto from = TakeMeasures(source);
     if (!from || !Trimmed(source).empty()) return Fail("measures are expected behind =", typed);
@@ -159,7 +159,7 @@ void CRomanTextReader::CopyMeasures(const TMeasureRange& range, std::string_view
     for (int i = 0; i < count; ++i) {
         const auto measure = mMeasures.find(from->mFirst + i);
         if (measure == mMeasures.end()) return Fail("a measure that is copied is not there", typed);
-        const TMeasureText text = measure->second;
+        const CMeasureText text = measure->second;
         mCopiedWords += text.mText.size() / 2 + 1;
         if (mCopiedWords > kMostCopiedWords) return Fail("too much is copied", typed);
         mMeasures.insert_or_assign(range.mFirst + i, text);
@@ -178,14 +178,14 @@ void CRomanTextReader::FillTo(int number) {
     }
 }
 
-void CRomanTextReader::AddMeasure(int number, const TMeasureText& measure, bool hasLetter) {
+void CRomanTextReader::AddMeasure(int number, const CMeasureText& measure, bool hasLetter) {
     if (number < mLastNumber || (number == mLastNumber && !hasLetter)) {
         Fail(kNotHigher, mLine);
     }
     FillTo(number);
     if (mReading.mBars.size() >= kMostMeasures) return Fail("there are too many measures", mLine);
     mLastNumber = number;
-    TPlace place{mEnd, mTime.BarLength(), mEnd};
+    CPlaceInText place{mEnd, mTime.BarLength(), mEnd};
     std::string_view rest = measure.mText;
     while (true) {
         const std::string_view word = TakeWord(rest);
@@ -197,7 +197,7 @@ void CRomanTextReader::AddMeasure(int number, const TMeasureText& measure, bool 
     mEnd = place.mBarPosition + length;
 }
 
-void CRomanTextReader::ReadWord(std::string_view word, TPlace& place) {
+void CRomanTextReader::ReadWord(std::string_view word, CPlaceInText& place) {
     if (const auto beat = BeatOf(word)) return ReadBeat(*beat, word, place);
     if (const auto key = KeyOf(word)) {
         mKey = *key;
@@ -211,7 +211,7 @@ void CRomanTextReader::ReadWord(std::string_view word, TPlace& place) {
     ReadNumeralAt(word, place);
 }
 
-void CRomanTextReader::ReadBeat(double beat, std::string_view word, TPlace& place) {
+void CRomanTextReader::ReadBeat(double beat, std::string_view word, CPlaceInText& place) {
     const double into = (beat - 1.0) * mTime.BeatLength();
     const bool isPickup = mLastNumber == 0 && !place.mHasBeat && place.mPickup == 0.0;
     if (into >= place.mBarLength) return Fail("the bar has no such beat", word);
@@ -222,7 +222,7 @@ void CRomanTextReader::ReadBeat(double beat, std::string_view word, TPlace& plac
     place.mHasBeat = true;
 }
 
-void CRomanTextReader::ReadNumeralAt(std::string_view word, TPlace& place) {
+void CRomanTextReader::ReadNumeralAt(std::string_view word, CPlaceInText& place) {
     CRomanTextChord chord;
     chord.mNumeral = word;
     chord.mPosition = place.mPosition;
@@ -241,7 +241,7 @@ void CRomanTextReader::ReadNumeralAt(std::string_view word, TPlace& place) {
     AddChord(std::move(chord), word, place);
 }
 
-void CRomanTextReader::AddChord(CRomanTextChord chord, std::string_view word, TPlace& place) {
+void CRomanTextReader::AddChord(CRomanTextChord chord, std::string_view word, CPlaceInText& place) {
     const bool isNewKey = mReading.mKeys.empty() || mReading.mKeys.back().mKey != chord.mKey;
     if (isNewKey && !chord.mKey.IsUndef()) {
         mReading.mKeys.push_back({chord.mKey, chord.mPosition});

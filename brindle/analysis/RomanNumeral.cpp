@@ -28,11 +28,11 @@ int DistToTonic(const CKeyEnh& keyEnh, const CSignKeyLite& key) {
     return IntvlBetween(key.mRootKeyEnh, keyEnh);
 }
 
-TNumeralDegree DegreeAt(int dist, const CSignKeyLite& key) {
+CNumeralDegree DegreeAt(int dist, const CSignKeyLite& key) {
     return DegreesOf(key.mSignKeyType)[static_cast<std::size_t>(dist)];
 }
 
-std::string DegreeText(TNumeralDegree degree, bool isSmall, bool inDigits) {
+std::string DegreeText(CNumeralDegree degree, bool isSmall, bool inDigits) {
     std::string text;
     if (inDigits) {
         AppendAccidentals(text, degree.mAccidental);
@@ -44,24 +44,24 @@ std::string DegreeText(TNumeralDegree degree, bool isSmall, bool inDigits) {
 }
 
 /// The degree that a chord is written as, in its key or in that of the degree it is applied to.
-struct TWrittenDegree {
+struct CWrittenDegree {
     std::string mText;
-    TNumeralRoot mRoot;
+    CNumeralRoot mRoot;
     int mNumber;          ///< of the root in the key, 1 to 7, whatever its accidental
     std::string mTarget;  ///< "/ii", empty in the key
 };
 
 /// What a chord is to the chord that follows it.
-struct TApplied {
+struct CApplied {
     std::string_view mNumeral;
-    TNumeralDegree mDegree;
+    CNumeralDegree mDegree;
 };
 
-constexpr TApplied kDominant{"V", {5, 0}};
-constexpr TApplied kSubstitute{"subV", {2, -1}};
-constexpr TApplied kLeadingTone{"vii", {7, 0}};
+constexpr CApplied kDominant{"V", {5, 0}};
+constexpr CApplied kSubstitute{"subV", {2, -1}};
+constexpr CApplied kLeadingTone{"vii", {7, 0}};
 
-const TApplied* AppliedBy(const CChordLite& chord, const CSignKeyLite& key, int target) {
+const CApplied* AppliedBy(const CChordLite& chord, const CSignKeyLite& key, int target) {
     const TKeyChordClass chordClass = KeyChordClassOf(chord.mSemitones);
     const int dist = DistToTonic(chord.mRootKeyEnh, key);
     const int up = FoldIntoOctave(target - dist);
@@ -73,8 +73,8 @@ const TApplied* AppliedBy(const CChordLite& chord, const CSignKeyLite& key, int 
 
 // The degree as it is written in minor where the sign or the option would raise it: a flat stands
 // for the sixth and seventh of the scale.
-TNumeralDegree HeldInMinor(TNumeralDegree degree, CSemitones semitones, const CSignKeyLite& key,
-                           const TNumeralOptions& options) {
+CNumeralDegree HeldInMinor(CNumeralDegree degree, CSemitones semitones, const CSignKeyLite& key,
+                           const CNumeralOptions& options) {
     if (key.mSignKeyType != TSignKeyType_Minor || degree.mAccidental != 0) return degree;
     if (!HasSmallNumeral(semitones) || degree.mNumber < 6) return degree;
     const TKeyChordClass chordClass = KeyChordClassOf(semitones);
@@ -84,11 +84,11 @@ TNumeralDegree HeldInMinor(TNumeralDegree degree, CSemitones semitones, const CS
     return degree;
 }
 
-TWrittenDegree OwnDegree(const CChordLite& chord, const CSignKeyLite& key,
-                         const TNumeralOptions& options) {
+CWrittenDegree OwnDegree(const CChordLite& chord, const CSignKeyLite& key,
+                         const CNumeralOptions& options) {
     const bool isSmall = HasSmallNumeral(chord.mSemitones);
-    const TNumeralDegree degree = DegreeAt(DistToTonic(chord.mRootKeyEnh, key), key);
-    TNumeralDegree held = degree;
+    const CNumeralDegree degree = DegreeAt(DistToTonic(chord.mRootKeyEnh, key), key);
+    CNumeralDegree held = degree;
     if (!options.mNashville) held = HeldInMinor(degree, chord.mSemitones, key, options);
     std::string text = DegreeText(held, isSmall, options.mNashville);
     const TKeyChordClass chordClass = KeyChordClassOf(chord.mSemitones);
@@ -97,18 +97,18 @@ TWrittenDegree OwnDegree(const CChordLite& chord, const CSignKeyLite& key,
     return {text, {degree, key.mSignKeyType, isSmall}, degree.mNumber, {}};
 }
 
-TWrittenDegree DegreeBefore(const CChordLite* next, const CChordLite& chord,
-                            const CSignKeyLite& key, const TNumeralOptions& options) {
+CWrittenDegree DegreeBefore(const CChordLite* next, const CChordLite& chord,
+                            const CSignKeyLite& key, const CNumeralOptions& options) {
     if (next == nullptr || next->IsUndef() || options.mNashville) {
         return OwnDegree(chord, key, options);
     }
     const int target = DistToTonic(next->mRootKeyEnh, key);
-    const TApplied* applied = nullptr;
+    const CApplied* applied = nullptr;
     if (target != 0 && key.Semitones().HasIntvl(target)) applied = AppliedBy(chord, key, target);
     if (applied == nullptr) return OwnDegree(chord, key, options);
     const bool isSmall = HasSmallNumeral(next->mSemitones);
-    const TNumeralDegree degree = DegreeAt(target, key);
-    const TNumeralDegree held = HeldInMinor(degree, next->mSemitones, key, options);
+    const CNumeralDegree degree = DegreeAt(target, key);
+    const CNumeralDegree held = HeldInMinor(degree, next->mSemitones, key, options);
     const TSignKeyType type = isSmall ? TSignKeyType_Minor : TSignKeyType_Major;
     return {std::string(applied->mNumeral),
             {applied->mDegree, type, HasSmallNumeral(chord.mSemitones)},
@@ -124,7 +124,7 @@ std::string SignWithFigure(std::string_view sign, CSemitones semitones, int bass
     if ((!isTriad && !hasSeventh) || !semitones.HasIntvl(bass)) return {};
     const int step = StepOfSemitone(semitones, bass);
     const TFigureKind kind = hasSeventh ? TFigure_Seventh : TFigure_Triad;
-    for (const TNumeralFigure& figure : kNumeralFigures) {
+    for (const CNumeralFigure& figure : kNumeralFigures) {
         if (figure.mKind != kind || figure.mBassStep != step || step == 1) continue;
         if (hasSeventh) sign.remove_suffix(1);
         return std::string(sign) += figure.mText;
@@ -133,7 +133,7 @@ std::string SignWithFigure(std::string_view sign, CSemitones semitones, int bass
 }
 
 // A minor seventh that is not that of the key has a d where the key would tell the seventh.
-std::string_view SignByKey(std::string_view sign, const TNumeralRoot& root) {
+std::string_view SignByKey(std::string_view sign, const CNumeralRoot& root) {
     if (root.mIsSmall || IntvlInKey(root, 7) == 10) return sign;
     if (sign == "7") return "d7";
     return sign == "+7" ? "+d7" : sign;
@@ -163,26 +163,26 @@ bool IsSpelled(const CKeyEnh& keyEnh) {
 // The degree of the bass, as many letters above the root as it is spelled; the usual one of its
 // sound where that takes more than two accidentals. Counted in degrees, so that it is the same in
 // all keys.
-TNumeralDegree BassDegree(const CChordLite& chord, int rootNumber, const CSignKeyLite& key) {
+CNumeralDegree BassDegree(const CChordLite& chord, int rootNumber, const CSignKeyLite& key) {
     const int intvl = IntvlBetween(chord.mRootKeyEnh, chord.mBassKeyEnh);
     const bool isSpelled = IsSpelled(chord.mRootKeyEnh) && IsSpelled(chord.mBassKeyEnh);
     const int letters = isSpelled ? LettersBetween(chord.mRootKeyEnh, chord.mBassKeyEnh)
                                   : kUsualLetters[static_cast<std::size_t>(intvl)];
-    TNumeralDegree degree{(rootNumber - 1 + letters) % 7 + 1, 0};
+    CNumeralDegree degree{(rootNumber - 1 + letters) % 7 + 1, 0};
     const int dist = DistToTonic(chord.mBassKeyEnh, key);
     degree.mAccidental = SmallestKeyIntvlBetween(SemitonesOfDegree(degree, key.mSignKeyType), dist);
     return degree.mAccidental < -2 || degree.mAccidental > 2 ? DegreeAt(dist, key) : degree;
 }
 
 /// What stands behind the degree, and the bass behind the last slash.
-struct TTail {
+struct CTail {
     std::string mSign;
     std::string mBass;
 };
 
-TTail TailOf(const CChordLite& chord, const TWrittenDegree& degree, const CSignKeyLite& key,
-             const TNumeralOptions& options) {
-    const TChordSign sign = SignOfChord(chord.mSemitones, options);
+CTail TailOf(const CChordLite& chord, const CWrittenDegree& degree, const CSignKeyLite& key,
+             const CNumeralOptions& options) {
+    const CChordSign sign = SignOfChord(chord.mSemitones, options);
     std::string text(options.mByKey && sign.mAlterations.empty()
                          ? SignByKey(sign.mSign, degree.mRoot)
                          : sign.mSign);
@@ -205,17 +205,17 @@ TTail TailOf(const CChordLite& chord, const TWrittenDegree& degree, const CSignK
 }  // namespace
 
 std::string RomanNumeral(const CChordLite& chord, const CSignKeyLite& key, const CChordLite* next,
-                         const TNumeralOptions& options) {
+                         const CNumeralOptions& options) {
     if (chord.IsUndef() || key.IsUndef()) return {};
-    const TWrittenDegree degree = DegreeBefore(next, chord, key, options);
-    const TTail tail = TailOf(chord, degree, key, options);
+    const CWrittenDegree degree = DegreeBefore(next, chord, key, options);
+    const CTail tail = TailOf(chord, degree, key, options);
     return degree.mText + tail.mSign + degree.mTarget + tail.mBass;
 }
 
 std::vector<std::string> NumeralsOf(const CHarmAnlsChords& chords, const CKeyOfSong& keys,
-                                    const TNumeralOptions& options) {
+                                    const CNumeralOptions& options) {
     std::vector<std::string> numerals(chords.size());
-    const std::vector<TKeyChord> heard = KeyChordsOf(chords);
+    const std::vector<CKeyChord> heard = KeyChordsOf(chords);
     auto region = keys.mRegions.rbegin();
     const CChordLite* next = nullptr;
     std::size_t end = chords.size();

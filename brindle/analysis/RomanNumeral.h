@@ -16,7 +16,7 @@ class CHarmAnlsChords;
 struct CKeyOfSong;
 
 /// How numerals are written, and which of two readings some of them have.
-struct TNumeralOptions {
+struct CNumeralOptions {
     /// Nashville numbers: 2-7 5 1 instead of ii7 V I.
     bool mNashville = false;
     /// Inversions as figures: V65, I6, and viø7 in minor is on the raised sixth degree. Otherwise
@@ -44,12 +44,12 @@ struct TNumeralOptions {
 /// ChordFromNumeral with the same options reads the same tones and the same bass.
 [[nodiscard]] std::string RomanNumeral(const CChordLite& chord, const CSignKeyLite& key,
                                        const CChordLite* next = nullptr,
-                                       const TNumeralOptions& options = {});
+                                       const CNumeralOptions& options = {});
 
 /// The numeral of each chord of a list in its region; empty for the undefined ones.
 [[nodiscard]] std::vector<std::string> NumeralsOf(const CHarmAnlsChords& chords,
                                                   const CKeyOfSong& keys,
-                                                  const TNumeralOptions& options = {});
+                                                  const CNumeralOptions& options = {});
 
 /// What ReadNumeral makes of a text.
 struct CNumeralReading {
@@ -69,11 +69,11 @@ struct CNumeralReading {
 /// to (V7/V/V, in the key that its letters tell), a digit (I/3, also I/^3) or a letter (I/E) is the
 /// bass. Tones in square brackets are those of the key: V[no3][add4]. Time is linear in the length.
 [[nodiscard]] CNumeralReading ReadNumeral(std::string_view text, const CSignKeyLite& key,
-                                          const TNumeralOptions& options = {});
+                                          const CNumeralOptions& options = {});
 
 /// The same without the reason; nothing if the text is no numeral.
 [[nodiscard]] std::optional<CChordLite> ChordFromNumeral(std::string_view text,
                                                          const CSignKeyLite& key,
-                                                         const TNumeralOptions& options = {});
+                                                         const CNumeralOptions& options = {});
 
 }  // namespace brindle

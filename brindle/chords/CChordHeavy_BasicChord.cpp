@@ -11,7 +11,7 @@ namespace brindle {
 namespace {
 
 /// What decides the skeleton: the intervals in any octave, and the one that only the bass has.
-struct THeardIntvls {
+struct CHeardIntvls {
     const CIntvlSet& intvls;
     int bassAloneIntvl;
 
@@ -19,7 +19,7 @@ struct THeardIntvls {
     [[nodiscard]] bool BassAloneOn(int intvl) const { return bassAloneIntvl == intvl; }
 };
 
-std::optional<TBasicChord> WithMajorThird(const THeardIntvls& heard) {
+std::optional<TBasicChord> WithMajorThird(const CHeardIntvls& heard) {
     // Cm over E: the major third is only the bass.
     if (heard.BassAloneOn(4) && heard.Has(3)) return std::nullopt;
     if (!heard.Has(8)) return TBasicChord::Major;
@@ -27,19 +27,19 @@ std::optional<TBasicChord> WithMajorThird(const THeardIntvls& heard) {
     return heard.Has(7) ? TBasicChord::Major : TBasicChord::Augmented;
 }
 
-TBasicChord WithMinorThirdAndFlatFifth(const THeardIntvls& heard) {
+TBasicChord WithMinorThirdAndFlatFifth(const CHeardIntvls& heard) {
     if (heard.Has(7) && !heard.BassAloneOn(7)) return TBasicChord::Minor;
     if (heard.BassAloneOn(10)) return TBasicChord::Diminished;
     return heard.Has(10) ? TBasicChord::Minor : TBasicChord::Diminished;
 }
 
-std::optional<TBasicChord> WithMinorThird(const THeardIntvls& heard) {
+std::optional<TBasicChord> WithMinorThird(const CHeardIntvls& heard) {
     if (heard.Has(6)) return WithMinorThirdAndFlatFifth(heard);
     if (heard.Has(7) || heard.BassAloneOn(8) || !heard.Has(8)) return TBasicChord::Minor;
     return std::nullopt;
 }
 
-TBasicChord WithoutThird(const THeardIntvls& heard) {
+TBasicChord WithoutThird(const CHeardIntvls& heard) {
     if (!heard.Has(7)) return TBasicChord::None;
     if (heard.Has(5)) return TBasicChord::Sus4;
     if (heard.Has(2)) return TBasicChord::Sus2;
@@ -47,13 +47,13 @@ TBasicChord WithoutThird(const THeardIntvls& heard) {
     return TBasicChord::Drone;
 }
 
-struct TXGRow {
+struct CXGRow {
     CSemitones intvls;
     int index;
 };
 
 // clang-format off
-constexpr auto kXGRows = std::to_array<TXGRow>({
+constexpr auto kXGRows = std::to_array<CXGRow>({
     {CSemitones{0, 4, 7},         0},   {CSemitones{0, 3, 7},         8},
     {CSemitones{0, 4, 7, 9},      1},   {CSemitones{0, 3, 7, 9},      9},
     {CSemitones{0, 4, 7, 11},     2},   {CSemitones{0, 3, 7, 10},    10},
@@ -106,7 +106,7 @@ std::optional<CSemitones> WithinOctave(const CIntvlSet& intvls) {
 
 TBasicChord CChordHeavy::BasicChord() const {
     const CIntvlSet& intvls = IntvlSet();
-    const THeardIntvls heard{intvls, BassNoteHasIntvlAlone() ? _BassIntvl() : kIntvlUndef};
+    const CHeardIntvls heard{intvls, BassNoteHasIntvlAlone() ? _BassIntvl() : kIntvlUndef};
     if (heard.Has(4)) {
         if (const auto basicChord = WithMajorThird(heard)) return *basicChord;
     }
@@ -125,7 +125,7 @@ CSemitones CChordHeavy::BasicChordSemitones() const {
 int CChordHeavy::XGChordIx() const {
     const auto intvls = WithinOctave(IntvlSet());
     const auto row = std::find_if(kXGRows.begin(), kXGRows.end(),
-                                  [&](const TXGRow& xgRow) { return xgRow.intvls == intvls; });
+                                  [&](const CXGRow& xgRow) { return xgRow.intvls == intvls; });
     return row != kXGRows.end() ? row->index : XGChordIxOf(BasicChord());
 }
 

@@ -14,48 +14,48 @@ namespace brindle {
 namespace {
 
 /// What decides how an interval is named.
-struct TNamedChord {
+struct CChordToName {
     const CIntvlSet& intvls;
     CSemitones semitones;
     TBasicChord basicChord;
     std::int32_t majorSeventhPref;
 };
 
-using TCondition = bool (*)(const TNamedChord&);
+using TCondition = bool (*)(const CChordToName&);
 
 /// The chord is a plain triad apart from the interval in question.
 template <int... Intvls>
-bool OnlyAmong(const TNamedChord& chord) {
+bool OnlyAmong(const CChordToName& chord) {
     constexpr CSemitones allowed{Intvls...};
     return (chord.semitones.Mask() & ~allowed.Mask()) == 0;
 }
 
 template <int... Intvls>
-bool HasAnyOf(const TNamedChord& chord) {
+bool HasAnyOf(const CChordToName& chord) {
     return (chord.intvls.HasIntvlInAnyOctave(Intvls) || ...);
 }
 
 template <TBasicChord... BasicChords>
-bool Is(const TNamedChord& chord) {
+bool Is(const CChordToName& chord) {
     return ((chord.basicChord == BasicChords) || ...);
 }
 
 template <std::int32_t Pref>
-bool MajorSeventhPrefIs(const TNamedChord& chord) {
+bool MajorSeventhPrefIs(const CChordToName& chord) {
     return chord.majorSeventhPref == Pref;
 }
 
 /// A sixth above a seventh is a thirteenth, unless an altered fifth stands beside it.
-bool IsThirteenth(const TNamedChord& chord) {
+bool IsThirteenth(const CChordToName& chord) {
     return !HasAnyOf<8>(chord) && HasAnyOf<10, 11>(chord);
 }
 
-bool Otherwise(const TNamedChord&) {
+bool Otherwise(const CChordToName&) {
     return true;
 }
 
 /// What an interval adds to the name. The first row of the interval that fits decides.
-struct TOptionRule {
+struct COptionRule {
     int intvl;
     TCondition fits;
     int key = 0;
@@ -67,7 +67,7 @@ using enum TBasicChord;
 constexpr bool kGoesOn = true;
 
 // clang-format off
-constexpr auto kOptionRules = std::to_array<TOptionRule>({
+constexpr auto kOptionRules = std::to_array<COptionRule>({
     // interval, condition, key, option
     { 1, OnlyAmong<0, 1, 3, 4, 7>,       13, TChordOption_add_b9},
     { 1, Otherwise,                      13, TChordOption_b9},
@@ -100,8 +100,8 @@ constexpr auto kOptionRules = std::to_array<TOptionRule>({
 });
 // clang-format on
 
-void AddOptionsOfIntvl(int intvl, const TNamedChord& chord, TChordOptionsMap& options) {
-    for (const TOptionRule& rule : kOptionRules) {
+void AddOptionsOfIntvl(int intvl, const CChordToName& chord, TChordOptionsMap& options) {
+    for (const COptionRule& rule : kOptionRules) {
         if (rule.intvl != intvl || !rule.fits(chord)) continue;
         if (rule.option) options.emplace(rule.key, *rule.option);
         if (!rule.goesOn) return;
@@ -110,7 +110,7 @@ void AddOptionsOfIntvl(int intvl, const TNamedChord& chord, TChordOptionsMap& op
 
 enum class TSign { None, Flat, Sharp };
 
-struct TOptionText {
+struct COptionText {
     TChordOption option;
     std::string_view before;
     TSign sign;
@@ -118,7 +118,7 @@ struct TOptionText {
 };
 
 // clang-format off
-constexpr auto kOptionTexts = std::to_array<TOptionText>({
+constexpr auto kOptionTexts = std::to_array<COptionText>({
     {TChordOption_b9,     "",     TSign::Flat,  "9"},
     {TChordOption_add_b9, "add ", TSign::Flat,  "9"},
     {TChordOption_9,      "",     TSign::None,  "9"},
@@ -153,7 +153,7 @@ static_assert(EachRowStandsAtItsOption());
 void AppendOptionName(std::string& name, TChordOption option, const CChordNamePrefs& prefs) {
     const auto ix = static_cast<std::size_t>(option);
     if (ix >= kOptionTexts.size()) return;
-    const TOptionText& text = kOptionTexts[ix];
+    const COptionText& text = kOptionTexts[ix];
     name += text.before;
     if (text.sign == TSign::Flat) name += FlatAsUTF8OrNot(prefs);
     if (text.sign == TSign::Sharp) name += SharpAsUTF8OrNot(prefs);
@@ -177,7 +177,7 @@ TChordOptionsMap CChordHeavy::OptionsMap(const CChordNamePrefs& prefs) const {
     TChordOptionsMap options;
     const CIntvlSet& intvls = IntvlSet();
     if (intvls.empty()) return options;
-    const TNamedChord chord{intvls, Semitones(), BasicChord(), prefs.mChordPrefC};
+    const CChordToName chord{intvls, Semitones(), BasicChord(), prefs.mChordPrefC};
     // Behind the slash the bass is named already. Kept: only a bass above the root is found, since
     // one in octave -1 with a key below the root's stands an octave higher in the set.
     const bool omitBass = prefs.mOmitBassOption && !IsNarrowChord();

@@ -19,14 +19,14 @@ bool IsMinorType(TScaleType type) {
 }
 
 /// What a basic chord gains by its root's distance to the root of the key, 0 to 11.
-struct TBonusRow {
+struct CBonusRow {
     TBasicChord basicChord;
     std::array<int, 12> inMinor;
     std::array<int, 12> inMajor;
 };
 
 // clang-format off
-constexpr auto kBonusRows = std::to_array<TBonusRow>({
+constexpr auto kBonusRows = std::to_array<CBonusRow>({
     {TBasicChord::Major,      {0, 0, 0, 2, 0, 1, 0, 2, 2, 0, 2, 0}, {2, 0, 0, 0, 2, 2, 0, 2, 0, 0, 0, 0}},
     {TBasicChord::Minor,      {2, 0, 0, 0, 0, 2, 0, 2, 0, 2, 0, 0}, {0, 0, 2, 0, 2, 0, 0, 0, 0, 2, 0, 0}},
     {TBasicChord::Augmented,  {1, 1, 1, 1, 1, 1, 0, 2, 0, 0, 0, 0}, {2, 2, 2, 2, 2, 2, 2, 2, 2, 2, 2, 2}},
@@ -39,7 +39,7 @@ constexpr auto kBonusRows = std::to_array<TBonusRow>({
 
 int Bonus(TBasicChord basicChord, int distance, bool minor) {
     const auto row = std::find_if(kBonusRows.begin(), kBonusRows.end(),
-                                  [=](const TBonusRow& r) { return r.basicChord == basicChord; });
+                                  [=](const CBonusRow& r) { return r.basicChord == basicChord; });
     if (row == kBonusRows.end() || distance == kIntvlUndef) return 0;
     return (minor ? row->inMinor : row->inMajor)[static_cast<std::size_t>(distance)];
 }

@@ -11,13 +11,13 @@ namespace brindle {
 namespace {
 
 /// A chord shape and its tones that must be in the key together with the root.
-struct TShapeInKey {
+struct CShapeInKey {
     CSemitones semitones;
     CSemitones furtherTones;
 };
 
 // clang-format off
-constexpr auto kShapesInKey = std::to_array<TShapeInKey>({
+constexpr auto kShapesInKey = std::to_array<CShapeInKey>({
     // Kept: the first three pass on the root alone.
     {CSemitones( 145), {}},                       // major triad            0 4 7
     {CSemitones( 273), {}},                       // augmented triad        0 4 8
@@ -42,7 +42,7 @@ CSemitones FurtherTonesOfOtherShape(const CSemitones& semitones) {
 CSemitones FurtherTones(const CSemitones& semitones) {
     const auto shape =
         std::find_if(kShapesInKey.begin(), kShapesInKey.end(),
-                     [&](const TShapeInKey& row) { return row.semitones == semitones; });
+                     [&](const CShapeInKey& row) { return row.semitones == semitones; });
     return shape != kShapesInKey.end() ? shape->furtherTones : FurtherTonesOfOtherShape(semitones);
 }
 

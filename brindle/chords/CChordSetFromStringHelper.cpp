@@ -38,11 +38,11 @@ constexpr auto kOptionRowsByFirstByte = [] {
     return rowsByByte;
 }();
 
-bool Matches(const TKeywords& keywords, std::string_view text, int pos) {
+bool Matches(const CKeywords& keywords, std::string_view text, int pos) {
     return CompareLowercaseStrs(TSpaces_AnyRemainder, keywords, text, pos).first;
 }
 
-bool MatchesAndAdvances(const TKeywords& keywords, std::string_view text, int& pos) {
+bool MatchesAndAdvances(const CKeywords& keywords, std::string_view text, int& pos) {
     return CompareLowercaseStrsAndOnMatchAdvanceStringPos(TSpaces_AnyRemainder, keywords, text,
                                                           pos);
 }
@@ -71,7 +71,7 @@ void CChordSetFromStringHelper::SetFromString(std::string_view symbol, CChordLit
     chord.mRootKeyEnh.SetFromString(symbol, &pos, prefs);
     const CSemitones basicChord = helper._BasicChordSemitonesFromString(pos);
     chord.mBassKeyEnh = helper._BassKeyNrAndEnhFromString(prefs);
-    const TIntvlsOfOptions options = helper._AddAndEraseIntvlsForOptionsFromString(pos);
+    const CIntvlsOfOptions options = helper._AddAndEraseIntvlsForOptionsFromString(pos);
     chord.mSemitones = basicChord + Reduced(options.mAdd) - Reduced(options.mErase);
 }
 
@@ -101,7 +101,7 @@ CSemitones CChordSetFromStringHelper::_BasicChordSemitonesFromString(int& pos) {
     // The "m" of "maj 7" is not minor. The option itself is read later.
     const bool isMajorOption = Matches(kMaj7Keywords, LowercaseText(), pos) ||
                                Matches(kMaj9Keywords, LowercaseText(), pos);
-    for (const TBasicChordRow& row : kBasicChordRows) {
+    for (const CBasicChordRow& row : kBasicChordRows) {
         if (isMajorOption && row.mBasicChord == TBasicChord::Minor) continue;
         if (!MatchesAndAdvances(row.mKeywords, LowercaseText(), pos)) continue;
         mBasicChord = row.mBasicChord;
@@ -119,11 +119,11 @@ CKeyEnh CChordSetFromStringHelper::_BassKeyNrAndEnhFromString(const CChordNamePr
     return bass;
 }
 
-CChordSetFromStringHelper::TIntvlsOfOptions
+CChordSetFromStringHelper::CIntvlsOfOptions
 CChordSetFromStringHelper::_AddAndEraseIntvlsForOptionsFromString(int pos) {
     mLowercaseText = ConvertUtf8SharpAndFlatToAscii(mLowercaseText);
     const std::string_view text = LowercaseText();
-    TIntvlsOfOptions options;
+    CIntvlsOfOptions options;
     SkipLeadingBlanks(text, pos);
     while (static_cast<std::size_t>(pos) < text.size()) {
         _AddAndEraseIntvlsForSingleOptionFromString(text, pos, options);
@@ -132,10 +132,10 @@ CChordSetFromStringHelper::_AddAndEraseIntvlsForOptionsFromString(int pos) {
 }
 
 void CChordSetFromStringHelper::_AddAndEraseIntvlsForSingleOptionFromString(
-    std::string_view text, int& pos, TIntvlsOfOptions& options) const {
+    std::string_view text, int& pos, CIntvlsOfOptions& options) const {
     const auto first = static_cast<unsigned char>(text[static_cast<std::size_t>(pos)]);
     for (std::uint32_t rows = kOptionRowsByFirstByte[first]; rows != 0; rows &= rows - 1) {
-        const TOptionRow& row = kOptionRows[static_cast<std::size_t>(std::countr_zero(rows))];
+        const COptionRow& row = kOptionRows[static_cast<std::size_t>(std::countr_zero(rows))];
         if (!MatchesAndAdvances(row.mKeywords, text, pos)) continue;
         const bool isFirst = options.mAdd == 0;
         options.mAdd |= mBasicChord == TBasicChord::Diminished ? row.mAddIfDiminished : row.mAdd;

@@ -28,7 +28,7 @@ public:
 private:
     /// Masks of intervals above the root, an octave and more: bit 14 is the ninth, bit 2 the
     /// second.
-    struct TIntvlsOfOptions {
+    struct CIntvlsOfOptions {
         std::uint32_t mAdd = 0;
         std::uint32_t mErase = 0;
     };
@@ -44,9 +44,9 @@ private:
     [[nodiscard]] CSemitones _BasicChordSemitonesFromString(int& pos);
     [[nodiscard]] CKeyEnh _BassKeyNrAndEnhFromString(const CChordNamePrefs& prefs) const;
     /// Folds UTF-8 signs in the text, so it comes last.
-    [[nodiscard]] TIntvlsOfOptions _AddAndEraseIntvlsForOptionsFromString(int pos);
+    [[nodiscard]] CIntvlsOfOptions _AddAndEraseIntvlsForOptionsFromString(int pos);
     void _AddAndEraseIntvlsForSingleOptionFromString(std::string_view text, int& pos,
-                                                     TIntvlsOfOptions& options) const;
+                                                     CIntvlsOfOptions& options) const;
 
     /// What the text names itself; None for a major chord.
     TBasicChord mBasicChord = TBasicChord::None;

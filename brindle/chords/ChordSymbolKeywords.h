@@ -13,10 +13,10 @@
 namespace brindle::ChordSymbol {
 
 /// The keywords of one thing, in the order in which they are tried.
-class TKeywords {
+class CKeywords {
 public:
     template <class... T>
-    consteval explicit TKeywords(T... texts) : mTexts{texts...}, mCount(sizeof...(texts)) {}
+    consteval explicit CKeywords(T... texts) : mTexts{texts...}, mCount(sizeof...(texts)) {}
 
     [[nodiscard]] constexpr const std::string_view* begin() const { return mTexts.data(); }
     [[nodiscard]] constexpr const std::string_view* end() const { return mTexts.data() + mCount; }
@@ -34,32 +34,32 @@ template <class... T>
     return (TIntvls{0} | ... | (TIntvls{1} << intvls));
 }
 
-inline constexpr TKeywords kUndefKeywords("undef", "-");
-inline constexpr TKeywords kNoChordForceKeywords("nochordforce");
-inline constexpr TKeywords kNoChordYieldKeywords("nochordyield", "nochord");
+inline constexpr CKeywords kUndefKeywords("undef", "-");
+inline constexpr CKeywords kNoChordForceKeywords("nochordforce");
+inline constexpr CKeywords kNoChordYieldKeywords("nochordyield", "nochord");
 
-inline constexpr TKeywords kSus2Keywords("sus 2", "sus2", "s 2", "s2");
-inline constexpr TKeywords kSus4Keywords("sus 4", "sus4", "sus", "s 4", "s4");
-inline constexpr TKeywords kMaj7Keywords("maj 7", "maj7", "ma 7", "ma7", "j 7", "j7");
-inline constexpr TKeywords kMaj9Keywords("maj 9", "maj9", "ma 9", "ma9", "j 9", "j9");
+inline constexpr CKeywords kSus2Keywords("sus 2", "sus2", "s 2", "s2");
+inline constexpr CKeywords kSus4Keywords("sus 4", "sus4", "sus", "s 4", "s4");
+inline constexpr CKeywords kMaj7Keywords("maj 7", "maj7", "ma 7", "ma7", "j 7", "j7");
+inline constexpr CKeywords kMaj9Keywords("maj 9", "maj9", "ma 9", "ma9", "j 9", "j9");
 
-struct TBasicChordRow {
-    TKeywords mKeywords;
+struct CBasicChordRow {
+    CKeywords mKeywords;
     TBasicChord mBasicChord;
 };
 
 // Behind the root. There is no word for major: it is what remains.
-inline constexpr auto kBasicChordRows = std::to_array<TBasicChordRow>({
-    {TKeywords("min", "mi", "m", "-"), TBasicChord::Minor},
-    {TKeywords("aug"), TBasicChord::Augmented},
-    {TKeywords("dim"), TBasicChord::Diminished},
+inline constexpr auto kBasicChordRows = std::to_array<CBasicChordRow>({
+    {CKeywords("min", "mi", "m", "-"), TBasicChord::Minor},
+    {CKeywords("aug"), TBasicChord::Augmented},
+    {CKeywords("dim"), TBasicChord::Diminished},
     {kSus2Keywords, TBasicChord::Sus2},
     {kSus4Keywords, TBasicChord::Sus4},
-    {TKeywords("drone"), TBasicChord::Drone},
+    {CKeywords("drone"), TBasicChord::Drone},
 });
 
-struct TOptionRow {
-    TKeywords mKeywords;
+struct COptionRow {
+    CKeywords mKeywords;
     TIntvls mAdd;
     /// Added too when no option before this one has added anything: C9 and C13 bring the sevenths
     /// and ninths below them, C6 9 does not.
@@ -75,29 +75,29 @@ inline constexpr TIntvls kThirds = Intvls(3, 4);
 // Kept: "b9" brings a minor seventh even as "add b9", "5" takes the thirds away, and "b13" leaves
 // the fifth alone where "#5" removes it.
 // clang-format off
-inline constexpr auto kOptionRows = std::to_array<TOptionRow>({
+inline constexpr auto kOptionRows = std::to_array<COptionRow>({
     // keywords                                     add             if first        erase
-    {TKeywords("b5"),                               Intvls(6),      0,              Intvls(7)},
-    {TKeywords("5"),                                Intvls(7),      0,              kThirds},
-    {TKeywords("b13"),                              Intvls(8),      0,              0},
-    {TKeywords("#5"),                               Intvls(8),      0,              Intvls(7)},
-    {TKeywords("6"),                                Intvls(9),      0,              0},
-    {TKeywords("seventh", "7"),                     Intvls(10),     0,              0, Intvls(9)},
+    {CKeywords("b5"),                               Intvls(6),      0,              Intvls(7)},
+    {CKeywords("5"),                                Intvls(7),      0,              kThirds},
+    {CKeywords("b13"),                              Intvls(8),      0,              0},
+    {CKeywords("#5"),                               Intvls(8),      0,              Intvls(7)},
+    {CKeywords("6"),                                Intvls(9),      0,              0},
+    {CKeywords("seventh", "7"),                     Intvls(10),     0,              0, Intvls(9)},
     {kMaj7Keywords,                                 Intvls(11),     0,              0},
-    {TKeywords("add b9", "addb9", "b9"),            Intvls(10, 13), 0,              0},
-    {TKeywords("9"),                                Intvls(14),     Intvls(10),     0},
-    {TKeywords("add 9", "add 2", "add9", "add2"),   Intvls(14),     0,              0},
+    {CKeywords("add b9", "addb9", "b9"),            Intvls(10, 13), 0,              0},
+    {CKeywords("9"),                                Intvls(14),     Intvls(10),     0},
+    {CKeywords("add 9", "add 2", "add9", "add2"),   Intvls(14),     0,              0},
     {kMaj9Keywords,                                 Intvls(11, 14), 0,              0},
-    {TKeywords("#9"),                               Intvls(15),     0,              0},
-    {TKeywords("b3"),                               Intvls(3),      0,              0},
-    {TKeywords("3"),                                Intvls(4),      0,              0},
-    {TKeywords("11"),                               Intvls(17),     Intvls(10, 14), 0},
-    {TKeywords("#11"),                              Intvls(18),     Intvls(10, 14), 0},
-    {TKeywords("add 11", "add11", "add 4", "add4"), Intvls(17),     0,              0},
-    {TKeywords("add #11", "add#11", "add #4", "add#4"),
+    {CKeywords("#9"),                               Intvls(15),     0,              0},
+    {CKeywords("b3"),                               Intvls(3),      0,              0},
+    {CKeywords("3"),                                Intvls(4),      0,              0},
+    {CKeywords("11"),                               Intvls(17),     Intvls(10, 14), 0},
+    {CKeywords("#11"),                              Intvls(18),     Intvls(10, 14), 0},
+    {CKeywords("add 11", "add11", "add 4", "add4"), Intvls(17),     0,              0},
+    {CKeywords("add #11", "add#11", "add #4", "add#4"),
                                                     Intvls(18),     0,              0},
-    {TKeywords("13"),                               Intvls(21),     Intvls(10, 14, 17), 0},
-    {TKeywords("omit 3", "omit3", "no 3", "no3"),   0,              0,              kThirds},
+    {CKeywords("13"),                               Intvls(21),     Intvls(10, 14, 17), 0},
+    {CKeywords("omit 3", "omit3", "no 3", "no3"),   0,              0,              kThirds},
     {kSus2Keywords,                                 Intvls(2),      0,              kThirds},
     {kSus4Keywords,                                 Intvls(5),      0,              kThirds},
 });

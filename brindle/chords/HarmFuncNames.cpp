@@ -11,7 +11,7 @@ namespace brindle {
 
 namespace {
 
-struct THarmFuncName {
+struct CHarmFuncName {
     std::string_view roman;
     std::string_view inMajor;
     std::string_view inMinor;
@@ -19,7 +19,7 @@ struct THarmFuncName {
 
 // clang-format off
 // By the number of the function. The "##" mark the spots that have no function letter of their own.
-constexpr auto kHarmFuncNames = std::to_array<THarmFuncName>({
+constexpr auto kHarmFuncNames = std::to_array<CHarmFuncName>({
     {"I",      "T",                "T"},
     {"Im",     "t",                "t"},
     {"II",     "DD / SP",          "DD / SP"},
@@ -52,7 +52,7 @@ bool IsFunctionMinorType(TScaleType type) {
 std::string_view HarmFuncName(int harmFunc, TScaleType type, const CChordNamePrefs& prefs) {
     const auto ix = static_cast<std::size_t>(harmFunc);
     if (ix >= kHarmFuncNames.size()) return "undef";
-    const THarmFuncName& name = kHarmFuncNames[ix];
+    const CHarmFuncName& name = kHarmFuncNames[ix];
     if (prefs.mChordPrefF != 1) return name.roman;
     return IsFunctionMinorType(type) ? name.inMinor : name.inMajor;
 }

@@ -10,14 +10,14 @@ namespace {
 
 constexpr std::size_t kMostChoices = 5;
 
-int CostOfStep(const TNamingCandidate& chord, const TNamingCandidate& next) {
+int CostOfStep(const CNamingCandidate& chord, const CNamingCandidate& next) {
     const bool isSame = chord.mRoot == next.mRoot && chord.TonesOfType() == next.TonesOfType();
     if (isSame) return 0;
     // The mean of what both chords say to the step, weighed as NameNotes weighs known neighbours.
     return (NextRootCost(chord, next.mRoot) + PreviousRootCost(next, chord.mRoot)) * 4 / 10;
 }
 
-using TChoices = std::vector<std::span<const TNamingCandidate>>;
+using TChoices = std::vector<std::span<const CNamingCandidate>>;
 
 TChoices ChoicesOf(const std::vector<CNamingCandidates>& candidates) {
     TChoices choices;
@@ -29,9 +29,9 @@ TChoices ChoicesOf(const std::vector<CNamingCandidates>& candidates) {
 }
 
 /// The candidates with the chosen one at the front.
-std::vector<TNamingCandidate> WithFirst(std::span<const TNamingCandidate> candidates,
+std::vector<CNamingCandidate> WithFirst(std::span<const CNamingCandidate> candidates,
                                         std::size_t chosen) {
-    std::vector<TNamingCandidate> list(candidates.begin(), candidates.end());
+    std::vector<CNamingCandidate> list(candidates.begin(), candidates.end());
     if (chosen >= list.size()) return list;
     const auto place = list.begin() + static_cast<std::ptrdiff_t>(chosen);
     std::rotate(list.begin(), place, place + 1);
@@ -50,7 +50,7 @@ std::vector<std::vector<CNamedChord>> NameProgression(std::span<const std::vecto
         if (ix + 1 < sets.size()) own.mNextRoot = kKeyNrUndef;
         candidates.emplace_back(NoteKeysOf(sets[ix]), own);
     }
-    const auto costOf = [](const TNamingCandidate& candidate) { return candidate.mCost; };
+    const auto costOf = [](const CNamingCandidate& candidate) { return candidate.mCost; };
     const auto path = CheapestPath(ChoicesOf(candidates), costOf, CostOfStep);
     std::vector<std::vector<CNamedChord>> names;
     names.reserve(sets.size());

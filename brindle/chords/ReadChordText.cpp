@@ -2,7 +2,7 @@
 #include "brindle/chords/ReadChordText.h"
 
 #include "brindle/chords/internal/CChordTextParser.h"
-#include "brindle/chords/internal/CFoldedText.h"
+#include "brindle/chords/internal/CUnifiedText.h"
 #include "brindle/chords/internal/NonChordTexts.h"
 #include "brindle/chords/internal/WriteParserText.h"
 #include "brindle/theory/CChordNamePrefs.h"
@@ -20,7 +20,7 @@ const CChordNamePrefs& ParserPrefs(bool bIsBFlat) {
     return bIsBFlat ? bIsFlat : bIsNatural;
 }
 
-CChordTextReading NotUnderstood(const TFaultAt& fault, const CFoldedText& text) {
+CChordTextReading NotUnderstood(const CFaultAt& fault, const CUnifiedText& text) {
     CChordTextReading reading;
     reading.mFaultPos = CharacterPos(text.Input(), text.InputOffset(fault.mPos));
     reading.mFault = FaultText(fault, text);
@@ -34,15 +34,15 @@ void SetParserText(CChordTextReading& reading, std::string_view input, bool bIsB
         reading.mParserTextIsExact = true;
         return;
     }
-    TParserText written = WriteParserText(reading.mChord, prefs);
+    CParserText written = WriteParserText(reading.mChord, prefs);
     reading.mParserText = std::move(written.mText);
     reading.mParserTextIsExact = written.mIsExact;
 }
 
 }  // namespace
 
-CChordTextReading ReadChordText(std::string_view text, const CChordTextPrefs& prefs) {
-    const CFoldedText folded(text);
+CChordTextReading ReadChordText(std::string_view text, const CChordTextOptions& prefs) {
+    const CUnifiedText folded(text);
     if (folded.IsEmpty()) return NotUnderstood({TFault::Empty}, folded);
     if (auto nonChord = ReadNonChord(folded)) return *std::move(nonChord);
     CChordTextParser parser(folded, prefs);
@@ -56,7 +56,7 @@ CChordTextReading ReadChordText(std::string_view text, const CChordTextPrefs& pr
 }
 
 std::optional<std::string> NormaliseChordSymbol(std::string_view text,
-                                                const CChordTextPrefs& prefs) {
+                                                const CChordTextOptions& prefs) {
     CChordTextReading reading = ReadChordText(text, prefs);
     if (reading.mKind != TChordText_Chord) return std::nullopt;
     return std::move(reading.mParserText);

@@ -20,7 +20,7 @@ enum TChordTextKind : std::uint8_t {
 };
 
 /// How a chord text is read.
-struct CChordTextPrefs {
+struct CChordTextOptions {
     /// The letter B is B flat, and H is B natural. `Bb` and `Bes` are B flat all the same. A song
     /// that has any H is to be read so throughout.
     bool mBIsBFlat = false;
@@ -59,11 +59,11 @@ struct CChordTextReading {
 /// It knows the whole of its grammar and tells what it does not understand, where
 /// CChordSetFromStringHelper steps over it. Time is linear in the length of the text.
 [[nodiscard]] CChordTextReading ReadChordText(std::string_view text,
-                                              const CChordTextPrefs& prefs = {});
+                                              const CChordTextOptions& prefs = {});
 
 /// The `mParserText` of a chord; nothing for any other text. Normalising the result again changes
 /// nothing, except with `mOwnName`: the result is no printed name.
 [[nodiscard]] std::optional<std::string> NormaliseChordSymbol(std::string_view text,
-                                                              const CChordTextPrefs& prefs = {});
+                                                              const CChordTextOptions& prefs = {});
 
 }  // namespace brindle

@@ -17,16 +17,16 @@ namespace {
 
 /// A degree that a chord may leave open, as the two intervals it can stand on. The first is taken
 /// if the base scale has both.
-struct TPick {
+struct CPick {
     int first;
     int second;
 };
 
-constexpr TPick kThird{3, 4};
-constexpr TPick kFifth{7, 6};
-constexpr auto kOtherDegrees = std::to_array<TPick>({{2, 1}, {5, 6}, {5, 7}, {9, 8}, {10, 11}});
+constexpr CPick kThird{3, 4};
+constexpr CPick kFifth{7, 6};
+constexpr auto kOtherDegrees = std::to_array<CPick>({{2, 1}, {5, 6}, {5, 7}, {9, 8}, {10, 11}});
 
-void FillDegree(CSemitones& scale, const CSemitones& base, TPick pick) {
+void FillDegree(CSemitones& scale, const CSemitones& base, CPick pick) {
     if (scale.HasIntvl(pick.first) || scale.HasIntvl(pick.second)) return;
     if (base.HasIntvl(pick.first)) {
         scale.AddIntvl(pick.first);
@@ -106,7 +106,7 @@ CScaleHeavy CScaleHeavy::ConstructScaleForChord(const CChordHeavy& chord) const 
     } else {
         FillDegree(scale, base, kFifth);
     }
-    for (const TPick pick : kOtherDegrees) FillDegree(scale, base, pick);
+    for (const CPick pick : kOtherDegrees) FillDegree(scale, base, pick);
 
     const TEnh enh = MakeSensefulEnhForKeyNrAssumingCMajor(root.mKeyNr, root.mEnh);
     return {CKeyEnh{root.mKeyNr, enh}, scale};

@@ -33,13 +33,13 @@ constexpr bool HasAny(TTones tones, TTones wanted) {
     return (tones & wanted) != 0;
 }
 
-struct TSuffixRow {
+struct CSuffixRow {
     TTones mTones;
     std::string_view mText;
 };
 
 // Chords that have a sign of their own.
-constexpr auto kWholeChordRows = std::to_array<TSuffixRow>({
+constexpr auto kWholeChordRows = std::to_array<CSuffixRow>({
     {Tones(0, 3, 6), "dim"},
     {Tones(0, 3, 6, 9), "dim7"},
     {Tones(0, 3, 6, 11), "dim(maj7)"},
@@ -48,14 +48,14 @@ constexpr auto kWholeChordRows = std::to_array<TSuffixRow>({
     {Tones(0, 2, 5, 7), "sus24"},
 });
 
-struct TNumberRow {
+struct CNumberRow {
     TTones mTones;
     std::string_view mText;
     bool mIsForSus4Alone = false;
 };
 
 // The first that is contained. With a third, 13 has the eleventh below it.
-constexpr auto kNumberRows = std::to_array<TNumberRow>({
+constexpr auto kNumberRows = std::to_array<CNumberRow>({
     {Tones(2, 9, 10), "13", true},
     {Tones(2, 5, 9, 10), "13"},
     {Tones(2, 5, 10), "11"},
@@ -112,7 +112,7 @@ private:
     void TakeNumber() {
         const auto* const row =
             std::find_if(kNumberRows.begin(), kNumberRows.end(),
-                         [&](const TNumberRow& number) { return IsNumber(number); });
+                         [&](const CNumberRow& number) { return IsNumber(number); });
         if (row == kNumberRows.end()) return;
         mRest &= ~row->mTones;
         const bool isMajor = row->mText.front() == 'm';
@@ -122,7 +122,7 @@ private:
 
     /// A number that brings several tones brings none that is altered as well, and only one
     /// seventh.
-    [[nodiscard]] bool IsNumber(const TNumberRow& row) const {
+    [[nodiscard]] bool IsNumber(const CNumberRow& row) const {
         if (!Has(mRest, row.mTones) || (row.mIsForSus4Alone && !mIsSus4)) return false;
         const bool isSingle = (row.mTones & (row.mTones - 1)) == 0;
         if (isSingle) return true;
@@ -217,7 +217,7 @@ std::string ChordSymbolSuffix(CSemitones semitones) {
     const auto tones = static_cast<TTones>(semitones.Mask());
     const auto* const whole =
         std::find_if(kWholeChordRows.begin(), kWholeChordRows.end(),
-                     [&](const TSuffixRow& row) { return row.mTones == tones; });
+                     [&](const CSuffixRow& row) { return row.mTones == tones; });
     if (whole != kWholeChordRows.end()) return std::string(whole->mText);
     return CSuffixWriter(tones).Write();
 }
@@ -248,7 +248,7 @@ std::string WriteChordSymbol(const CChordLite& chord, const CChordSymbolStyle& s
     return symbol;
 }
 
-CChordTextPrefs ReadingPrefsOf(const CChordSymbolStyle& style) {
+CChordTextOptions ReadingPrefsOf(const CChordSymbolStyle& style) {
     return {.mBIsBFlat = style.mNotes == TNoteNaming_German,
             .mSolfege = style.mNotes == TNoteNaming_Solfege};
 }

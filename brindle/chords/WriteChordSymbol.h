@@ -41,6 +41,6 @@ struct CChordSymbolStyle {
 [[nodiscard]] std::string WriteNoteName(const CKeyEnh& note, const CChordSymbolStyle& style = {});
 
 /// How ReadChordText reads what is written in a style.
-[[nodiscard]] CChordTextPrefs ReadingPrefsOf(const CChordSymbolStyle& style);
+[[nodiscard]] CChordTextOptions ReadingPrefsOf(const CChordSymbolStyle& style);
 
 }  // namespace brindle

@@ -59,22 +59,22 @@ std::size_t CountEntries(const fs::path& folder) {
 }
 
 /// What stands at a path where a package is to be written.
-enum class TPlace { Free, EmptyPackage, Package, Foreign };
+enum class TDestination { Free, EmptyPackage, Package, Foreign };
 
-TPlace PlaceAt(const fs::path& path) {
+TDestination PlaceAt(const fs::path& path) {
     std::error_code error;
-    if (!fs::exists(fs::status(path, error))) return TPlace::Free;
+    if (!fs::exists(fs::status(path, error))) return TDestination::Free;
     const auto folder = ReadFolder(path);
-    if (!folder) return TPlace::Foreign;
+    if (!folder) return TDestination::Foreign;
     // Entries that cannot be read are not in the tree; they are of value, too.
-    if (CountEntries(path) != folder->mChildren.size()) return TPlace::Foreign;
+    if (CountEntries(path) != folder->mChildren.size()) return TDestination::Foreign;
     bool isEmpty = true;
     for (const auto& [name, child] : folder->mChildren) {
         if (name == kInfoName && !child.mIsFolder) continue;
-        if (!IsLibrary(child)) return TPlace::Foreign;
+        if (!IsLibrary(child)) return TDestination::Foreign;
         isEmpty = false;
     }
-    return isEmpty ? TPlace::EmptyPackage : TPlace::Package;
+    return isEmpty ? TDestination::EmptyPackage : TDestination::Package;
 }
 
 }  // namespace
@@ -87,7 +87,7 @@ void GChDatabase::setDefaultUserPackagePath(std::string_view path) {
 
 bool GChDatabase::readOneRegularFile(std::string_view bytes, const fs::path& libraryPath) {
     using LibraryFile::THeadFault;
-    LibraryFile::TLibraryHead head;
+    LibraryFile::CLibraryHead head;
     const THeadFault fault = LibraryFile::ReadHead(bytes, head);
     if (fault != THeadFault::None) return fault == THeadFault::NoTuningChunk;
     if (!mLocalizedDefaultTuningName.empty() && head.mTuningName == kGChDefaultTuningName) {
@@ -144,7 +144,8 @@ FileNode GChDatabase::writeLibrariesToDbPackageWrapper(bool onlyUserLibraries) c
 bool GChDatabase::writeLibraries(const std::vector<std::shared_ptr<GChLibrary>>& libraries,
                                  std::string_view toNewDbPackagePath) {
     const fs::path path = ExpandTilde(toNewDbPackagePath);
-    return PlaceAt(path) != TPlace::Foreign && WriteFolderAtomically(path, PackageOf(libraries));
+    return PlaceAt(path) != TDestination::Foreign &&
+           WriteFolderAtomically(path, PackageOf(libraries));
 }
 
 bool GChDatabase::updateDatabaseFiles() {
@@ -162,8 +163,8 @@ bool GChDatabase::updateDatabaseFiles() {
 
 bool GChCreateDbPackageAtPath(std::string_view path) {
     const fs::path packagePath = ExpandTilde(path);
-    const TPlace place = PlaceAt(packagePath);
-    if (place != TPlace::Free && place != TPlace::EmptyPackage) return false;
+    const TDestination place = PlaceAt(packagePath);
+    if (place != TDestination::Free && place != TDestination::EmptyPackage) return false;
     std::error_code ignored;
     fs::create_directories(packagePath.parent_path(), ignored);
     return WriteFolderAtomically(packagePath, EmptyPackage());

@@ -8,7 +8,7 @@ namespace brindle {
 namespace {
 
 bool ComesBefore(const CMarkovCounts::TCount& a, const CMarkovCounts::TCount& b) {
-    return TMarkovLess()(a.first, b.first);
+    return CMarkovLess()(a.first, b.first);
 }
 
 }  // namespace

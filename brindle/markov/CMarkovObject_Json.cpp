@@ -64,7 +64,7 @@ CMarkovObject CMarkovObject::JSONDeserialization_Helper::CMarkovObjectFromJSONSt
 
 void CMarkovObjects::AppendJSONString(std::ostream& stream) const {
     PlainText::Write(stream, "[");
-    for (const TMarkovStoredObject& object : mList) {
+    for (const CMarkovStoredObject& object : mList) {
         if (object.mPlace > 0) PlainText::Write(stream, ",\n");
         object.AppendJSONString(stream);
     }

@@ -8,8 +8,8 @@ namespace brindle {
 MarkovIterator CMarkovObjects::insertObjectIfUnique(const CMarkovObject& object) {
     const MarkovIterator found = getIteratorToObject(object);
     if (found != end()) return found;
-    TMarkovStoredObject& stored =
-        mList.emplace_back(TMarkovStoredObject{object, static_cast<std::uint32_t>(size()), 0});
+    CMarkovStoredObject& stored =
+        mList.emplace_back(CMarkovStoredObject{object, static_cast<std::uint32_t>(size()), 0});
     const MarkovIterator added = std::prev(end());
     const auto nextClass = static_cast<std::uint32_t>(mOrderClasses.size());
     stored.mOrderClass = mOrderClasses.emplace(added, nextClass).first->second;

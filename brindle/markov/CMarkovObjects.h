@@ -18,7 +18,7 @@
 namespace brindle {
 
 /// A symbol in the store of a model.
-struct TMarkovStoredObject : CMarkovObject {
+struct CMarkovStoredObject : CMarkovObject {
     /// Its place in the store, counted from 0.
     std::uint32_t mPlace = 0;
     /// The same for symbols that have one place in tables, see `operator<`: C sharp and D flat.
@@ -26,10 +26,10 @@ struct TMarkovStoredObject : CMarkovObject {
 };
 
 /// Where a symbol stands in the store of its model; valid as long as that is not cleared.
-using MarkovIterator = std::list<TMarkovStoredObject>::const_iterator;
+using MarkovIterator = std::list<CMarkovStoredObject>::const_iterator;
 
 /// The order of tables, which compare their symbols and never where these are stored.
-struct TMarkovLess {
+struct CMarkovLess {
     bool operator()(MarkovIterator a, MarkovIterator b) const { return *a < *b; }
 };
 
@@ -37,8 +37,8 @@ struct TMarkovLess {
 using MarkovSequence = std::vector<MarkovIterator>;
 using MarkovSequenceView = std::span<const MarkovIterator>;
 /// The probability, or another weight, of each symbol. Filled in order, then asked.
-using MarkovProbabilities = boost::container::flat_map<MarkovIterator, double, TMarkovLess>;
-using MarkovSymbolSet = boost::container::flat_set<MarkovIterator, TMarkovLess>;
+using MarkovProbabilities = boost::container::flat_map<MarkovIterator, double, CMarkovLess>;
+using MarkovSymbolSet = boost::container::flat_set<MarkovIterator, CMarkovLess>;
 
 /// The store of symbols: a list without repetitions, in the order in which the symbols came.
 ///
@@ -80,10 +80,10 @@ public:
     friend bool operator==(const CMarkovObjects& a, const CMarkovObjects& b);
 
 private:
-    std::list<TMarkovStoredObject> mList;
+    std::list<CMarkovStoredObject> mList;
     std::vector<MarkovIterator> mByPlace;
     std::unordered_multimap<std::size_t, MarkovIterator> mByHash;
-    std::map<MarkovIterator, std::uint32_t, TMarkovLess> mOrderClasses;
+    std::map<MarkovIterator, std::uint32_t, CMarkovLess> mOrderClasses;
 };
 
 }  // namespace brindle

@@ -34,12 +34,12 @@ bool AreAlike(MarkovSequenceView a, MarkovSequenceView b) {
 /// need not look at the history itself.
 class CHistorySorter {
 public:
-    using TEntries = std::vector<const TMarkovTransitions*>;
+    using TEntries = std::vector<const CMarkovTransitions*>;
 
     explicit CHistorySorter(const TEntries& entries) {
         FindRanks(entries);
         mSorted.reserve(entries.size());
-        for (const TMarkovTransitions* const entry : entries) {
+        for (const CMarkovTransitions* const entry : entries) {
             mSorted.emplace_back(Packed(entry->mHistory), entry);
         }
         std::sort(mSorted.begin(), mSorted.end(), [this](const auto& a, const auto& b) {
@@ -58,12 +58,12 @@ private:
     // The place of each symbol's class in the order of symbols, counted from 1.
     void FindRanks(const TEntries& entries) {
         MarkovSequence symbols;
-        for (const TMarkovTransitions* const entry : entries) {
+        for (const CMarkovTransitions* const entry : entries) {
             for (const MarkovIterator symbol : entry->mHistory) {
                 if (IsNew(symbol->mOrderClass)) symbols.push_back(symbol);
             }
         }
-        std::sort(symbols.begin(), symbols.end(), TMarkovLess());
+        std::sort(symbols.begin(), symbols.end(), CMarkovLess());
         std::uint32_t rank = 0;
         for (const MarkovIterator symbol : symbols) mRanks[symbol->mOrderClass] = ++rank;
         mBitsOfRank = std::max(std::bit_width(rank), 1U);
@@ -81,7 +81,7 @@ private:
         }
         return packed;
     }
-    [[nodiscard]] bool ComesBefore(const TMarkovTransitions& a, const TMarkovTransitions& b) const {
+    [[nodiscard]] bool ComesBefore(const CMarkovTransitions& a, const CMarkovTransitions& b) const {
         return std::lexicographical_compare(
             a.mHistory.begin(), a.mHistory.end(), b.mHistory.begin(), b.mHistory.end(),
             [this](MarkovIterator x, MarkovIterator y) {
@@ -91,18 +91,18 @@ private:
 
     std::vector<std::uint32_t> mRanks;
     unsigned mBitsOfRank = 1;
-    std::vector<std::pair<std::uint64_t, const TMarkovTransitions*>> mSorted;
+    std::vector<std::pair<std::uint64_t, const CMarkovTransitions*>> mSorted;
 };
 
 }  // namespace
 
 // The slot that holds the wanted entry, or the free one where it would be put.
 template <class IsWanted>
-const CMarkovTransitionMap::TSlot& CMarkovTransitionMap::SlotOf(std::uint32_t hash,
+const CMarkovTransitionMap::CSlot& CMarkovTransitionMap::SlotOf(std::uint32_t hash,
                                                                 IsWanted isWanted) const {
     const std::size_t mask = mSlots.size() - 1;
     for (std::size_t place = hash & mask;; place = (place + 1) & mask) {
-        const TSlot& slot = mSlots[place];
+        const CSlot& slot = mSlots[place];
         if (slot.mEntry == kNoEntry) return slot;
         if (slot.mHash == hash && isWanted(At(slot.mEntry))) return slot;
     }
@@ -119,7 +119,7 @@ void CMarkovTransitionMap::ForAllLengths(MarkovSequenceView history, Change chan
         const std::uint32_t oldestClass = history[history.size() - length]->mOrderClass;
         const std::uint32_t shorter = entry;
         hash = Longer(hash, oldestClass);
-        const TSlot& slot = SlotOf(hash, [shorter, oldestClass](const TEntry& found) {
+        const CSlot& slot = SlotOf(hash, [shorter, oldestClass](const CEntry& found) {
             return found.mShorter == shorter && found.mOldestClass == oldestClass;
         });
         entry = slot.mEntry;
@@ -149,28 +149,28 @@ const MarkovCounts* CMarkovTransitionMap::Find(MarkovSequenceView history) const
     for (auto oldest = history.rbegin(); oldest != history.rend(); ++oldest) {
         hash = Longer(hash, (*oldest)->mOrderClass);
     }
-    const TSlot& slot =
-        SlotOf(hash, [history](const TEntry& entry) { return AreAlike(entry.mHistory, history); });
+    const CSlot& slot =
+        SlotOf(hash, [history](const CEntry& entry) { return AreAlike(entry.mHistory, history); });
     return slot.mEntry == kNoEntry ? nullptr : &At(slot.mEntry).mCounts;
 }
 
-std::vector<const TMarkovTransitions*> CMarkovTransitionMap::InOrder() const {
-    std::vector<const TMarkovTransitions*> entries;
+std::vector<const CMarkovTransitions*> CMarkovTransitionMap::InOrder() const {
+    std::vector<const CMarkovTransitions*> entries;
     entries.reserve(size());
     for (const auto& piece : mEntries) {
-        for (const TEntry& entry : piece) entries.push_back(&entry);
+        for (const CEntry& entry : piece) entries.push_back(&entry);
     }
     return CHistorySorter(entries).Sorted();
 }
 
-std::vector<const TMarkovTransitions*> CMarkovTransitionMap::InOrder(std::size_t length) const {
+std::vector<const CMarkovTransitions*> CMarkovTransitionMap::InOrder(std::size_t length) const {
     return CHistorySorter(OfLength(length)).Sorted();
 }
 
-std::vector<const TMarkovTransitions*> CMarkovTransitionMap::OfLength(std::size_t length) const {
-    std::vector<const TMarkovTransitions*> entries;
+std::vector<const CMarkovTransitions*> CMarkovTransitionMap::OfLength(std::size_t length) const {
+    std::vector<const CMarkovTransitions*> entries;
     for (const auto& piece : mEntries) {
-        for (const TEntry& entry : piece) {
+        for (const CEntry& entry : piece) {
             if (entry.mHistory.size() == length) entries.push_back(&entry);
         }
     }
@@ -194,18 +194,18 @@ void CMarkovTransitionMap::Clear() {
     *this = CMarkovTransitionMap();
 }
 
-const CMarkovTransitionMap::TEntry& CMarkovTransitionMap::At(std::uint32_t number) const {
+const CMarkovTransitionMap::CEntry& CMarkovTransitionMap::At(std::uint32_t number) const {
     return mEntries[number / kEntriesInPiece][number % kEntriesInPiece];
 }
 
-CMarkovTransitionMap::TEntry& CMarkovTransitionMap::At(std::uint32_t number) {
+CMarkovTransitionMap::CEntry& CMarkovTransitionMap::At(std::uint32_t number) {
     return mEntries[number / kEntriesInPiece][number % kEntriesInPiece];
 }
 
 std::uint32_t CMarkovTransitionMap::AddEntry(std::uint32_t shorter, MarkovSequenceView history) {
     if (size() % kEntriesInPiece == 0) mEntries.emplace_back().reserve(kEntriesInPiece);
     const auto number = static_cast<std::uint32_t>(mSize++);
-    TEntry& entry = mEntries.back().emplace_back();
+    CEntry& entry = mEntries.back().emplace_back();
     entry.mHistory = history;
     entry.mShorter = shorter;
     entry.mOldestClass = history.front()->mOrderClass;
@@ -235,10 +235,10 @@ void CMarkovTransitionMap::Fetch(MarkovSequenceView history) const {
 }
 
 void CMarkovTransitionMap::GrowSlots() {
-    const std::vector<TSlot> old = std::move(mSlots);
+    const std::vector<CSlot> old = std::move(mSlots);
     mSlots.assign(std::max(kFirstSlots, 2 * old.size()), {0, kNoEntry});
     const std::size_t mask = mSlots.size() - 1;
-    for (const TSlot& slot : old) {
+    for (const CSlot& slot : old) {
         if (slot.mEntry == kNoEntry) continue;
         std::size_t place = slot.mHash & mask;
         while (mSlots[place].mEntry != kNoEntry) place = (place + 1) & mask;

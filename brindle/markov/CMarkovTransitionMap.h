@@ -10,7 +10,7 @@
 namespace brindle {
 
 /// A history and how often each symbol followed it.
-struct TMarkovTransitions {
+struct CMarkovTransitions {
     /// Oldest symbol first. Lives as long as the map.
     MarkovSequenceView mHistory;
     MarkovCounts mCounts;
@@ -47,31 +47,31 @@ public:
 
     /// All entries, their histories in lexicographic order, a shorter one before its continuations;
     /// or those of one length.
-    [[nodiscard]] std::vector<const TMarkovTransitions*> InOrder() const;
-    [[nodiscard]] std::vector<const TMarkovTransitions*> InOrder(std::size_t length) const;
+    [[nodiscard]] std::vector<const CMarkovTransitions*> InOrder() const;
+    [[nodiscard]] std::vector<const CMarkovTransitions*> InOrder(std::size_t length) const;
     /// The same without order.
-    [[nodiscard]] std::vector<const TMarkovTransitions*> OfLength(std::size_t length) const;
+    [[nodiscard]] std::vector<const CMarkovTransitions*> OfLength(std::size_t length) const;
 
     void Clear();
 
 private:
     /// As large as a line of the usual processor's cache.
-    struct alignas(64) TEntry : TMarkovTransitions {
+    struct alignas(64) CEntry : CMarkovTransitions {
         /// The entry of the history without its oldest symbol, and the class of that symbol.
         std::uint32_t mShorter = 0;
         std::uint32_t mOldestClass = 0;
     };
     /// A free place in the table has the entry kNoEntry.
-    struct TSlot {
+    struct CSlot {
         std::uint32_t mHash = 0;
         std::uint32_t mEntry = 0;
     };
 
     void Swap(CMarkovTransitionMap& other) noexcept;
-    [[nodiscard]] const TEntry& At(std::uint32_t number) const;
-    [[nodiscard]] TEntry& At(std::uint32_t number);
+    [[nodiscard]] const CEntry& At(std::uint32_t number) const;
+    [[nodiscard]] CEntry& At(std::uint32_t number);
     template <class IsWanted>
-    [[nodiscard]] const TSlot& SlotOf(std::uint32_t hash, IsWanted isWanted) const;
+    [[nodiscard]] const CSlot& SlotOf(std::uint32_t hash, IsWanted isWanted) const;
     /// Calls `change` with the counts of the history and of each of its ends, the shortest first.
     template <class Change>
     void ForAllLengths(MarkovSequenceView history, Change change);
@@ -81,10 +81,10 @@ private:
     [[nodiscard]] MarkovSequenceView Keep(MarkovSequenceView history);
 
     /// In pieces that never move.
-    std::vector<std::vector<TEntry>> mEntries;
+    std::vector<std::vector<CEntry>> mEntries;
     std::size_t mSize = 0;
     /// Open addressing by the hash of the history.
-    std::vector<TSlot> mSlots;
+    std::vector<CSlot> mSlots;
     /// The symbols of the histories, in pieces that never move.
     std::vector<std::vector<MarkovIterator>> mKeptSymbols;
 };

@@ -56,7 +56,7 @@ std::ostream& operator<<(std::ostream& stream, const TMarkovSampledObject& objec
 std::ostream& operator<<(std::ostream& stream, const TMarkovSampledSequence& sequence);
 
 /// A sequence in the list from which one is chosen.
-struct TMarkovWeightedSequence {
+struct CMarkovWeightedSequence {
     TMarkovSampledSequence mSequence;
     /// A natural logarithm until NormalizeLogProbabilities, then 0 to 1.
     double mWeight = 0.0;

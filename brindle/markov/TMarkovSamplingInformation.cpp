@@ -16,9 +16,9 @@ bool EndsIn(MarkovSequenceView history, MarkovSequenceView end) {
 
 }  // namespace
 
-bool TMarkovSamplingInformation::TFromNewest::operator()(MarkovSequenceView a,
+bool TMarkovSamplingInformation::CFromNewest::operator()(MarkovSequenceView a,
                                                          MarkovSequenceView b) const {
-    return std::lexicographical_compare(a.rbegin(), a.rend(), b.rbegin(), b.rend(), TMarkovLess());
+    return std::lexicographical_compare(a.rbegin(), a.rend(), b.rbegin(), b.rend(), CMarkovLess());
 }
 
 void TMarkovSamplingInformation::Clear(bool blocklistToo) {

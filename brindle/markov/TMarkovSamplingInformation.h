@@ -41,11 +41,11 @@ public:
 
 private:
     /// Compares from the newest symbol back, so that histories of one end stand side by side.
-    struct TFromNewest {
+    struct CFromNewest {
         using is_transparent = void;
         bool operator()(MarkovSequenceView a, MarkovSequenceView b) const;
     };
-    using THistories = std::set<MarkovSequence, TFromNewest>;
+    using THistories = std::set<MarkovSequence, CFromNewest>;
 
     [[nodiscard]] static THistories::const_iterator EndOf(const THistories& histories,
                                                           MarkovSequenceView history);

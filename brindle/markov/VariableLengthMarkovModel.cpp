@@ -18,7 +18,7 @@ bool AreEqual(MarkovSequenceView a, MarkovSequenceView b) {
                       [](MarkovIterator x, MarkovIterator y) { return AreEqual(x, y); });
 }
 
-bool AreEqual(const TMarkovTransitions* a, const TMarkovTransitions* b) {
+bool AreEqual(const CMarkovTransitions* a, const CMarkovTransitions* b) {
     return AreEqual(a->mHistory, b->mHistory) &&
            std::equal(a->mCounts.begin(), a->mCounts.end(), b->mCounts.begin(), b->mCounts.end(),
                       [](const auto& x, const auto& y) {
@@ -167,7 +167,7 @@ void VariableLengthMarkovModel::CalculateAllEntropies(
     std::vector<std::pair<double, double>>& out) const {
     out.clear();
     MarkovProbabilities table;
-    for (const TMarkovTransitions* const entry : mTransitionMap.InOrder(mMaxHistoryLength)) {
+    for (const CMarkovTransitions* const entry : mTransitionMap.InOrder(mMaxHistoryLength)) {
         table.clear();
         CountsToProbabilities(entry->mCounts, table);
         out.emplace_back(CalculateEntropy(table), std::log(static_cast<double>(table.size())));
@@ -201,7 +201,7 @@ bool VariableLengthMarkovModel::CompareMaps(const VariableLengthMarkovModel& oth
     const auto others = other.mTransitionMap.InOrder();
     return std::equal(
         entries.begin(), entries.end(), others.begin(),
-        [](const TMarkovTransitions* a, const TMarkovTransitions* b) { return AreEqual(a, b); });
+        [](const CMarkovTransitions* a, const CMarkovTransitions* b) { return AreEqual(a, b); });
 }
 
 bool operator==(const VariableLengthMarkovModel& a, const VariableLengthMarkovModel& b) {

@@ -26,7 +26,7 @@ inline constexpr std::size_t kMarkovMaxFreeSymbols = 4096;
 inline constexpr std::size_t kMarkovMaxTemplateSymbols = 250'000;
 
 /// When the search for a sequence is given up.
-struct TMarkovSearchLimits {
+struct CMarkovSearchLimits {
     /// Attempts of one call of SampleSequenceWithLength.
     std::uint64_t mAttempts = 10'000'000;
     /// Symbols tried in one attempt to fill a template; a search that reaches it ends the call.
@@ -60,8 +60,8 @@ public:
     explicit VariableLengthMarkovModel(std::uint64_t maxHistoryLength = 0);
     /// Where random numbers come from, 32 bits each; an empty one is the operating system.
     void SetRandomSource(RandomSource source);
-    void SetSearchLimits(const TMarkovSearchLimits& limits) { mSearchLimits = limits; }
-    [[nodiscard]] const TMarkovSearchLimits& SearchLimits() const { return mSearchLimits; }
+    void SetSearchLimits(const CMarkovSearchLimits& limits) { mSearchLimits = limits; }
+    [[nodiscard]] const CMarkovSearchLimits& SearchLimits() const { return mSearchLimits; }
 
     // Learning. A sequence is StartSequence, LearnAddSymbol for each symbol, EndSequence.
 
@@ -113,10 +113,10 @@ public:
     /// none.
     [[nodiscard]] MarkovIterator ChooseFromProbabilities(const MarkovProbabilities& map) const;
     /// `out` stays as it is if there are no sequences.
-    void ChooseFromWeightedSequences(const std::vector<TMarkovWeightedSequence>& sequences,
+    void ChooseFromWeightedSequences(const std::vector<CMarkovWeightedSequence>& sequences,
                                      TMarkovSampledSequence& out) const;
     /// Turns logarithms into weights of which the largest is 1.
-    static void NormalizeLogProbabilities(std::vector<TMarkovWeightedSequence>& sequences);
+    static void NormalizeLogProbabilities(std::vector<CMarkovWeightedSequence>& sequences);
     static void RemoveItemsFromProbabilities(MarkovProbabilities& map,
                                              const MarkovSymbolSet& symbols);
     /// Takes out the end symbol and the chords that are longer than `remaining` beats.
@@ -210,7 +210,7 @@ private:
                            const TMarkovGenerateOptions& options);
 
     RandomSource mRandomSource;
-    TMarkovSearchLimits mSearchLimits;
+    CMarkovSearchLimits mSearchLimits;
 };
 
 }  // namespace brindle

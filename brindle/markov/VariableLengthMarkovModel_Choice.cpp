@@ -38,17 +38,17 @@ MarkovIterator VariableLengthMarkovModel::ChooseFromProbabilities(
 }
 
 void VariableLengthMarkovModel::ChooseFromWeightedSequences(
-    const std::vector<TMarkovWeightedSequence>& sequences, TMarkovSampledSequence& out) const {
+    const std::vector<CMarkovWeightedSequence>& sequences, TMarkovSampledSequence& out) const {
     double sum = 0.0;
-    for (const TMarkovWeightedSequence& sequence : sequences) sum += sequence.mWeight;
+    for (const CMarkovWeightedSequence& sequence : sequences) sum += sequence.mWeight;
     const auto chosen =
         FirstAbove(sequences, RandomFraction() * sum,
-                   [](const TMarkovWeightedSequence& sequence) { return sequence.mWeight; });
+                   [](const CMarkovWeightedSequence& sequence) { return sequence.mWeight; });
     if (chosen != sequences.end()) out = chosen->mSequence;
 }
 
 void VariableLengthMarkovModel::NormalizeLogProbabilities(
-    std::vector<TMarkovWeightedSequence>& sequences) {
+    std::vector<CMarkovWeightedSequence>& sequences) {
     double largest = kLowestLogProbability;
     for (const auto& sequence : sequences) largest = std::max(largest, sequence.mWeight);
     if (!(largest > kLowestLogProbability)) return;

@@ -49,7 +49,7 @@ MarkovIterator VariableLengthMarkovModel::FillGapInSequence(const MarkovSequence
     const MarkovSequenceView window = Slice(filled, begin, begin + n);
     const MarkovSequenceView fed = Slice(filled, begin + n, gap + n);
     const MarkovSequenceView followers = Slice(filled, begin + n + 1, gap + n + 1);
-    std::map<MarkovIterator, double, TMarkovLess> sums;
+    std::map<MarkovIterator, double, CMarkovLess> sums;
     MarkovProbabilities table;
     for (auto candidate = mObjects.begin(); candidate != mObjects.end(); ++candidate) {
         if (!IsCandidate(*candidate)) continue;

@@ -29,7 +29,7 @@ void WriteJoined(std::ostream& stream, const List& list, std::string_view separa
     }
 }
 
-void WriteTransitions(std::ostream& stream, const TMarkovTransitions& entry,
+void WriteTransitions(std::ostream& stream, const CMarkovTransitions& entry,
                       CIteratorIndexConverter& converter) {
     const auto writeIndex = [&](MarkovIterator symbol) {
         WriteInteger(stream, converter.InsertIfUniqueAndReturnIndex(symbol), 4);
@@ -102,7 +102,7 @@ void VariableLengthMarkovModel::TransitionMapAppendToJSON(
     Write(stream, "[\n");
     WriteJoined(
         stream, mTransitionMap.InOrder(mMaxHistoryLength), ",\n",
-        [&](const TMarkovTransitions* entry) { WriteTransitions(stream, *entry, converter); });
+        [&](const CMarkovTransitions* entry) { WriteTransitions(stream, *entry, converter); });
     Write(stream, "\n]");
 }
 

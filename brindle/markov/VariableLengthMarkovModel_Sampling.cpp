@@ -59,7 +59,7 @@ void VariableLengthMarkovModel::SampleSequenceWithLength(
     out = {};
     TMarkovSamplingInformation info;
     CDistinctSequences distinct(sequences);
-    std::vector<TMarkovWeightedSequence> accepted;
+    std::vector<CMarkovWeightedSequence> accepted;
     MarkovSequence start;
     Subvector(options.mMaxHistoryLength, {}, start);
     std::uint64_t attempts = 0;

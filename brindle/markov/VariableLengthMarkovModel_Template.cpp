@@ -76,7 +76,7 @@ void VariableLengthMarkovModel::NextGivenObjectAndDistance(MarkovIterator& objec
                                                            double beats) {
     const CMarkovTemplate wanted(options.mTemplate,
                                  mObjects.insertObjectIfUnique(CMarkovObject_End));
-    const CMarkovTemplate::TNext next = wanted.NextAt(beats);
+    const CMarkovTemplate::CNext next = wanted.NextAt(beats);
     object = next.mObject;
     distance = next.mDistance;
 }

@@ -20,7 +20,7 @@ namespace {
 constexpr int kNoAlteredTone = -1;
 
 /// What a degree adds: tones that come with it, and the tone that its alteration moves.
-struct TDegreeRow {
+struct CDegreeRow {
     std::string_view mWord;
     std::size_t mCount;
     std::array<int, 3> mPlain;
@@ -30,7 +30,7 @@ struct TDegreeRow {
 // Word, number of plain semitones, these semitones, semitone to which the alteration is added.
 // A plain extension brings the lower ones with it: a 13 is a full thirteenth.
 // clang-format off
-constexpr auto kDegreeRows = std::to_array<TDegreeRow>({
+constexpr auto kDegreeRows = std::to_array<CDegreeRow>({
     {"7",      0, {},           10},
     {"ma7",    1, {11}},
     {"j7",     1, {11}},
@@ -64,7 +64,7 @@ int AlteredTone(int tone, std::int32_t alter) {
 }
 
 void Add(const TMusicXMLDegree& degree, std::set<int>& intvls) {
-    for (const TDegreeRow& row : kDegreeRows) {
+    for (const CDegreeRow& row : kDegreeRows) {
         if (row.mWord != degree.mValue) continue;
         intvls.insert(row.mPlain.data(), row.mPlain.data() + row.mCount);
         if (row.mAltered != kNoAlteredTone) {

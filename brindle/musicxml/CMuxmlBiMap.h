@@ -10,7 +10,7 @@ namespace brindle {
 
 /// A word of a score and the value that it stands for.
 template <class Value>
-struct TMuxmlWord {
+struct CMuxmlWord {
     Value mValue;
     std::string_view mWord;
 };
@@ -19,11 +19,11 @@ struct TMuxmlWord {
 /// table has to be filled before the first import.
 template <class Value, std::size_t Count>
 struct CMuxmlBiMap {
-    std::array<TMuxmlWord<Value>, Count> mRows;
+    std::array<CMuxmlWord<Value>, Count> mRows;
 
     /// Words are compared exactly; nothing for a word that the list does not hold.
     [[nodiscard]] constexpr std::optional<Value> ValueOf(std::string_view word) const {
-        for (const TMuxmlWord<Value>& row : mRows) {
+        for (const CMuxmlWord<Value>& row : mRows) {
             if (row.mWord == word) return row.mValue;
         }
         return std::nullopt;
@@ -31,7 +31,7 @@ struct CMuxmlBiMap {
 
     /// Nothing for a value without a word.
     [[nodiscard]] constexpr std::optional<std::string_view> WordOf(Value value) const {
-        for (const TMuxmlWord<Value>& row : mRows) {
+        for (const CMuxmlWord<Value>& row : mRows) {
             if (row.mValue == value) return row.mWord;
         }
         return std::nullopt;
@@ -39,7 +39,7 @@ struct CMuxmlBiMap {
 
     /// Whether no value and no word occurs twice.
     [[nodiscard]] constexpr bool IsOneToOne() const {
-        for (const TMuxmlWord<Value>& row : mRows) {
+        for (const CMuxmlWord<Value>& row : mRows) {
             if (ValueOf(row.mWord) != row.mValue || WordOf(row.mValue) != row.mWord) return false;
         }
         return true;
@@ -49,7 +49,7 @@ struct CMuxmlBiMap {
 /// Makes the list from its rows.
 template <class Value, std::size_t Count>
 [[nodiscard]] constexpr CMuxmlBiMap<Value, Count> MuxmlBiMap(
-    const TMuxmlWord<Value> (&rows)[Count]) {
+    const CMuxmlWord<Value> (&rows)[Count]) {
     return {std::to_array(rows)};
 }
 

@@ -48,7 +48,7 @@ void CTiePendingInfo::TransferRelevantObjectsToLastNote(CMuxmlNote& note, std::s
     }
 }
 
-CTiePendingInfos::TKey CTiePendingInfos::KeyOf(const CMuxmlNote& note) {
+CTiePendingInfos::CKey CTiePendingInfos::KeyOf(const CMuxmlNote& note) {
     return {note.mStaff, note.mVoice, note.mPitch.mStep, note.mPitch.mAlteration,
             note.mPitch.mOctave};
 }

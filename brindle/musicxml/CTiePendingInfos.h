@@ -53,19 +53,19 @@ public:
     [[nodiscard]] bool empty() const { return mCount == 0; }
 
 private:
-    struct TKey {
+    struct CKey {
         std::int32_t mStaff;
         std::int32_t mVoice;
         TMuxmlEnum_Step mStep;
         float mAlteration;
         std::int32_t mOctave;
 
-        friend auto operator<=>(const TKey&, const TKey&) = default;
+        friend auto operator<=>(const CKey&, const CKey&) = default;
     };
 
-    static TKey KeyOf(const CMuxmlNote& note);
+    static CKey KeyOf(const CMuxmlNote& note);
 
-    std::map<TKey, std::list<CTiePendingInfo>> mInfos;  ///< no list is empty
+    std::map<CKey, std::list<CTiePendingInfo>> mInfos;  ///< no list is empty
     std::size_t mCount = 0;
     std::size_t mNoteCount = 0;  ///< of all chains together
 };

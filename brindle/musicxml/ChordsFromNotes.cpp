@@ -16,23 +16,23 @@ constexpr std::size_t kNeighboursChords = 4;
 /// Chords last: a new one needs a reason.
 constexpr int kChange = 20;
 
-using TChoices = std::vector<std::vector<TWindowChord>>;
+using TChoices = std::vector<std::vector<CWindowChord>>;
 
-void AddChords(const TNoteWindow& window, const CSignKeyLite& key,
-               const std::vector<TWindowChord>& chords, std::vector<TWindowChord>& choices) {
+void AddChords(const CNoteWindow& window, const CSignKeyLite& key,
+               const std::vector<CWindowChord>& chords, std::vector<CWindowChord>& choices) {
     for (std::size_t ix = 0; ix < std::min(chords.size(), kNeighboursChords); ++ix) {
-        const auto isSame = [&](const TWindowChord& own) { return own.IsSameChord(chords[ix]); };
+        const auto isSame = [&](const CWindowChord& own) { return own.IsSameChord(chords[ix]); };
         if (std::any_of(choices.begin(), choices.end(), isSame)) continue;
-        TWindowChord& added = choices.emplace_back(chords[ix]);
+        CWindowChord& added = choices.emplace_back(chords[ix]);
         added.mCost = CostOfWindowChord(window, added.mRoot, added.mType, key);
     }
 }
 
 /// The likeliest chords of each window, and those of its neighbours, which may last.
-TChoices ChoicesOf(const std::vector<TNoteWindow>& windows, const CSignKeyLite& key) {
+TChoices ChoicesOf(const std::vector<CNoteWindow>& windows, const CSignKeyLite& key) {
     TChoices own;
-    for (const TNoteWindow& window : windows) {
-        own.push_back(window.IsSilent() ? std::vector<TWindowChord>()
+    for (const CNoteWindow& window : windows) {
+        own.push_back(window.IsSilent() ? std::vector<CWindowChord>()
                                         : LikeliestChords(window, key, kOwnChords));
     }
     TChoices all = own;
@@ -46,7 +46,7 @@ TChoices ChoicesOf(const std::vector<TNoteWindow>& windows, const CSignKeyLite& 
     return all;
 }
 
-int CostOfStep(const TWindowChord& chord, const TWindowChord& next) {
+int CostOfStep(const CWindowChord& chord, const CWindowChord& next) {
     if (chord.IsSameChord(next)) return 0;
     const auto up = static_cast<std::size_t>(FoldIntoOctave(next.mRoot - chord.mRoot));
     const auto from = NamingFamilyOf(kNamingTypes[chord.mType].mTones);
@@ -55,20 +55,20 @@ int CostOfStep(const TWindowChord& chord, const TWindowChord& next) {
 }
 
 /// The chord of each window; those of silent windows mean nothing.
-std::vector<TWindowChord> ChordsOf(const std::vector<TNoteWindow>& windows,
+std::vector<CWindowChord> ChordsOf(const std::vector<CNoteWindow>& windows,
                                    const CSignKeyLite& key) {
     const TChoices choices = ChoicesOf(windows, key);
-    const auto costOf = [](const TWindowChord& chord) { return chord.mCost; };
+    const auto costOf = [](const CWindowChord& chord) { return chord.mCost; };
     const auto path = CheapestPath(choices, costOf, CostOfStep);
-    std::vector<TWindowChord> chords;
+    std::vector<CWindowChord> chords;
     for (std::size_t ix = 0; ix < choices.size(); ++ix) {
-        chords.push_back(choices[ix].empty() ? TWindowChord() : choices[ix][path[ix]]);
+        chords.push_back(choices[ix].empty() ? CWindowChord() : choices[ix][path[ix]]);
     }
     return chords;
 }
 
 /// The tones of a chord over the bass of its window, spelled as the score has them.
-std::vector<CNote> NotesOf(const TNamingCandidate& candidate, const TNoteWindow& window) {
+std::vector<CNote> NotesOf(const CNamingCandidate& candidate, const CNoteWindow& window) {
     std::vector<CNote> notes{
         {window.mBass, window.mSpellings[static_cast<std::size_t>(window.mBass % 12)]}};
     for (int tone = 0; tone < 12; ++tone) {
@@ -83,15 +83,15 @@ std::vector<CNote> NotesOf(const TNamingCandidate& candidate, const TNoteWindow&
     return notes;
 }
 
-CNamedChord Named(const TWindowChord& chord, const TNoteWindow& window, const CSignKeyLite& key) {
-    const TNamingCandidate candidate = CandidateOf(chord, window);
+CNamedChord Named(const CWindowChord& chord, const CNoteWindow& window, const CSignKeyLite& key) {
+    const CNamingCandidate candidate = CandidateOf(chord, window);
     CNamingOptions options;
     options.mKey = key;
     return NamedChords({&candidate, 1}, NotesOf(candidate, window), options).front();
 }
 
-CSignKeyLite KeyOf(const std::vector<TNoteWindow>& windows,
-                   const std::vector<TWindowChord>& chords) {
+CSignKeyLite KeyOf(const std::vector<CNoteWindow>& windows,
+                   const std::vector<CWindowChord>& chords) {
     CHarmAnlsChords song;
     for (std::size_t ix = 0; ix < windows.size(); ++ix) {
         const CChordLite chord =
@@ -110,9 +110,9 @@ CChordsFromNotes ChordsFromNotes(const CScoreNotes& score, const CChordsFromNote
     result.mKey = options.mKey;
     if (result.mKey.IsUndef()) result.mKey = KeyOf(windows, ChordsOf(windows, {}));
     const auto chords = ChordsOf(windows, result.mKey);
-    const TWindowChord* before = nullptr;
+    const CWindowChord* before = nullptr;
     for (std::size_t ix = 0; ix < windows.size(); ++ix) {
-        const TNoteWindow& window = windows[ix];
+        const CNoteWindow& window = windows[ix];
         const bool mayLast = options.mEvery == TChordEvery::Change && before != nullptr;
         const bool lasts = mayLast && (window.IsSilent() || before->IsSameChord(chords[ix]));
         if (lasts) {

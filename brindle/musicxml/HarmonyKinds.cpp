@@ -16,20 +16,20 @@ constexpr std::string_view kNoKind = "none";
 
 CIntvlSet XMLHarmonyKindToIntvlSetExceptRoot(std::string_view kind) {
     CIntvlSet intvls;
-    if (const TKindRow* row = KindRowOf(kind)) {
+    if (const CKindRow* row = KindRowOf(kind)) {
         intvls.insert(row->mIntvls.data(), row->mIntvls.data() + row->mCount);
     }
     return intvls;
 }
 
 CSemitones XMLHarmonyKindToSemitones(std::string_view kind) {
-    const TKindRow* row = KindRowOf(kind);
+    const CKindRow* row = KindRowOf(kind);
     return CSemitones(row == nullptr ? 1 : row->Mask() | 1);
 }
 
 std::string_view SemitonesToXMLHarmonyKind(CSemitones semitones) {
     const std::uint64_t octave = semitones.Mask() & 0xFFF;
-    for (const TKindRow& row : kKindRows) {
+    for (const CKindRow& row : kKindRows) {
         if (row.mIsTested && row.Mask() == octave) return row.mWord;
     }
     return kNoKind;

@@ -14,7 +14,7 @@ namespace brindle {
 namespace {
 
 // The description has the place in front.
-Error ErrorOf(TScoreFault fault) {
+Error ErrorOf(CScoreFault fault) {
     if (fault.mLine > 0) {
         fault.mError.description =
             fmt::format("{}:{}: {}", fault.mLine, fault.mColumn, fault.mError.description);
@@ -35,7 +35,7 @@ bool TMusicXMLDoc::LoadAsPlayed(const std::string& path, Error* error) {
 }
 
 bool TMusicXMLDoc::LoadAsPlayedFromBytes(std::string_view bytes, Error* error) {
-    TPlayedScore played = PlayScoreBytes(bytes);
+    CPlayedScore played = PlayScoreBytes(bytes);
     *this = std::move(played.mDoc);
     if (played.mFault && error != nullptr) *error = ErrorOf(std::move(*played.mFault));
     return !played.mFault;

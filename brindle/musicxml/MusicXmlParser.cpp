@@ -61,7 +61,7 @@ std::optional<std::filesystem::path> TemporaryFile() {
 }
 
 // A container and the name of the score in it.
-struct TPacked {
+struct CPacked {
     FileNode mContainer;
     std::string mFullPath;
 
@@ -99,7 +99,7 @@ std::optional<std::string> FullPath(const FileNode& container) {
     return std::nullopt;
 }
 
-std::optional<Error> Unpack(std::string_view bytes, TPacked& packed) {
+std::optional<Error> Unpack(std::string_view bytes, CPacked& packed) {
     auto container = UnpackZip(bytes);
     if (!container) return LocalError(kNotDecompressed);
     auto fullPath = FullPath(*container);
@@ -157,7 +157,7 @@ bool MusicXmlParser::parseBytes(
 
 std::optional<Error> MusicXmlParser::unpackCompressedMusicXML(std::string_view bytes,
                                                               std::string& score) {
-    TPacked packed;
+    CPacked packed;
     if (auto failure = Unpack(bytes, packed)) return failure;
     if (packed.Score() == nullptr) return LocalError(kNoTemporaryFile);
     score = *packed.Score();
@@ -168,7 +168,7 @@ std::optional<Error> MusicXmlParser::wrapCompressedMusicXMLFile(std::filesystem:
     if (url == nullptr || url->extension() != std::string(".") + kMusicXMLFileExtCompressed_mxl) {
         return std::nullopt;
     }
-    TPacked packed;
+    CPacked packed;
     const auto bytes = ReadWholeFile(*url, kMuxmlMaxFileSize);
     if (auto failure = Unpack(bytes.value_or(std::string()), packed)) return failure;
     const auto temporaryFile = TemporaryFile();

@@ -16,7 +16,7 @@ namespace {
 /// jumps to the coda that belongs to it.
 class CWalk {
 public:
-    CWalk(const TWrittenMeasures& written, TMusicXMLDoc& doc) : mWritten(written), mDoc(doc) {}
+    CWalk(const CWrittenMeasures& written, TMusicXMLDoc& doc) : mWritten(written), mDoc(doc) {}
 
     bool Run() {
         std::size_t count = 0;
@@ -158,7 +158,7 @@ private:
                                    .mLengthBars = static_cast<std::uint64_t>(bars)});
     }
 
-    const TWrittenMeasures& mWritten;
+    const CWrittenMeasures& mWritten;
     TMusicXMLDoc& mDoc;
     const TMusicXMLMeasure* mMeasure = nullptr;
     std::int64_t mIx = 0;
@@ -172,7 +172,7 @@ private:
     std::size_t mSegnoPairIx = 0;
     double mDistance = 0.0;
     std::size_t mBytes = 0;
-    TPlayLimits mLimits;
+    CPlayLimits mLimits;
     bool mFirstSection = true;
 };
 
@@ -188,7 +188,7 @@ std::size_t BytesOf(const TMusicXMLHarmony& harmony) {
     return bytes;
 }
 
-TPlayLimits PlayLimitsOf(std::size_t writtenMeasures, std::size_t writtenBytes) {
+CPlayLimits PlayLimitsOf(std::size_t writtenMeasures, std::size_t writtenBytes) {
     const auto limit = [](std::size_t written, std::size_t least, std::size_t most) {
         return std::max(written, std::clamp(kMaxTimesPlayed * written, least, most));
     };
@@ -196,7 +196,7 @@ TPlayLimits PlayLimitsOf(std::size_t writtenMeasures, std::size_t writtenBytes) 
             limit(writtenBytes, kMinPlayedBytes, kMaxPlayedBytes)};
 }
 
-bool PlayMeasures(const TWrittenMeasures& written, TMusicXMLDoc& doc) {
+bool PlayMeasures(const CWrittenMeasures& written, TMusicXMLDoc& doc) {
     return CWalk(written, doc).Run();
 }
 

@@ -15,23 +15,23 @@ struct TMusicXMLDoc;
 struct TMusicXMLHarmony;
 
 /// The written measures of a lead sheet and the jumps between them.
-struct TWrittenMeasures {
+struct CWrittenMeasures {
     std::span<const TMusicXMLMeasure> mMeasures;
     std::span<const std::pair<std::int32_t, std::int32_t>> mCodaPairs;
     std::span<const std::pair<std::int32_t, std::int32_t>> mSegnoPairs;
 };
 
 /// How far repeats and jumps may lead, from what is written; see kMaxTimesPlayed.
-struct TPlayLimits {
+struct CPlayLimits {
     std::size_t mMeasures = 0;
     std::size_t mBytes = 0;
 };
 
-[[nodiscard]] TPlayLimits PlayLimitsOf(std::size_t writtenMeasures, std::size_t writtenBytes);
+[[nodiscard]] CPlayLimits PlayLimitsOf(std::size_t writtenMeasures, std::size_t writtenBytes);
 
 /// Walks the measures in playing order and appends what they hold to `doc`. False when the walk was
 /// cut at its limits.
-bool PlayMeasures(const TWrittenMeasures& written, TMusicXMLDoc& doc);
+bool PlayMeasures(const CWrittenMeasures& written, TMusicXMLDoc& doc);
 
 /// The room in bytes that a harmony takes, about.
 [[nodiscard]] std::size_t BytesOf(const TMusicXMLHarmony& harmony);

@@ -31,7 +31,7 @@ void Begin(TMeasure& measure, TParser, TText) {
     (measure.*Record).ReadFromAttributes(measure.currentAttributes);
 }
 
-struct TAttributesRow {
+struct CAttributesRow {
     std::string_view mElement;
     /// The element around it; "" for any.
     std::string_view mInside;
@@ -41,14 +41,14 @@ struct TAttributesRow {
 // Each is done with the empty text at the start of the element, and once more if there is a text.
 // clang-format off
 // These count inside `time`, too, where every other element belongs to the time signature.
-constexpr muxml::CElementTable kElementsEverywhere(std::to_array<TAttributesRow>({
+constexpr muxml::CElementTable kElementsEverywhere(std::to_array<CAttributesRow>({
     {"divisions", "",    [](TMeasure& m, TParser p, TText t) { m.FoundDivisions(p, t); }},
     {"key",       "",    Begin<&TMeasure::EncounteredSignKey>},
     {"fifths",    "key", [](TMeasure& m, TParser, TText t) { m.EncounteredSignKey.mFifths = ReadInteger(t); }},
     {"mode",      "key", [](TMeasure& m, TParser, TText t) { m.EncounteredSignKey.mMode = MuxmlValueOf(t, TMuxmlEnum_SignKeyMode_Major); }},
     {"time",      "",    Begin<&TMeasure::EncounteredSignTime>},
 }));
-constexpr muxml::CElementTable kElementsOutsideTime(std::to_array<TAttributesRow>({
+constexpr muxml::CElementTable kElementsOutsideTime(std::to_array<CAttributesRow>({
     {"staves",             "",          [](TMeasure& m, TParser, TText t) { m.EncounteredMeasure.mStaves = UnsignedOrZero(t); }},
     {"instruments",        "",          [](TMeasure& m, TParser, TText t) { m.EncounteredMeasure.mInstruments = UnsignedOrZero(t); }},
     {"clef",               "",          Begin<&TMeasure::EncounteredClef>},
@@ -67,7 +67,7 @@ static_assert(kElementsEverywhere.HasNoNameTwice() && kElementsOutsideTime.HasNo
 }  // namespace
 
 void TMeasure::FoundInAttributes(XmlStreamParser& parser, std::string_view text) {
-    const auto read = [&](const TAttributesRow* row) {
+    const auto read = [&](const CAttributesRow* row) {
         if (row == nullptr || (!row->mInside.empty() && !IsInside(row->mInside))) return false;
         row->mRead(*this, parser, text);
         return true;

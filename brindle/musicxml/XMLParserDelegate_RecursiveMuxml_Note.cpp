@@ -14,7 +14,7 @@ namespace {
 using TNote = XMLParserDelegate_RecursiveMuxml_Note;
 using Text = std::string_view;
 
-struct TNoteRow {
+struct CNoteRow {
     std::string_view mElement;
     void (*mRead)(TNote& self, CMuxmlNote& note, const CMuxmlAttributes& attributes, Text text);
 };
@@ -23,7 +23,7 @@ using A = const CMuxmlAttributes&;
 // Element, what is done with its text. Each is done with the empty text at the start of the
 // element, and once more if there is a text: counters and lists then grow twice.
 // clang-format off
-constexpr muxml::CElementTable kElements(std::to_array<TNoteRow>({
+constexpr muxml::CElementTable kElements(std::to_array<CNoteRow>({
     {"accent",          [](TNote&, CMuxmlNote& n, A a, Text) { n.mAccent.ReadFromAttributes(a); }},
     {"breath-mark",     [](TNote&, CMuxmlNote& n, A a, Text) { n.mBreathMark.ReadFromAttributes(a); }},
     {"caesura",         [](TNote&, CMuxmlNote& n, A a, Text) { n.mCaesura.ReadFromAttributes(a); }},
@@ -71,11 +71,11 @@ constexpr muxml::CElementTable kElements(std::to_array<TNoteRow>({
 }));
 
 // The same inside the two sides of the ratio of a tuplet.
-struct TTupletRow {
+struct CTupletRow {
     std::string_view mElement;
     void (*mRead)(CMuxmlTupletPortion& portion, const CMuxmlAttributes& attributes, Text text);
 };
-constexpr muxml::CElementTable kTupletElements(std::to_array<TTupletRow>({
+constexpr muxml::CElementTable kTupletElements(std::to_array<CTupletRow>({
     {"tuplet-number", [](CMuxmlTupletPortion& p, A a, Text t) { p.mTupletNumber.ReadFromFoundCharactersAndAttributes(t, a); }},
     {"tuplet-type",   [](CMuxmlTupletPortion& p, A a, Text t) { p.mTupletType.ReadFromFoundCharactersAndAttributes(t, a); }},
     {"tuplet-dot",    [](CMuxmlTupletPortion& p, A a, Text t) { p.mTupletDot.ReadFromFoundCharactersAndAttributes(t, a); }},
@@ -97,7 +97,7 @@ void TNote::didStartMyElement(XmlStreamParser&, std::string_view, const XmlAttri
 }
 
 void TNote::foundTrimmedCharacters(XmlStreamParser& parser, std::string_view text) {
-    if (const TNoteRow* row = kElements.Find(currentElementName)) {
+    if (const CNoteRow* row = kElements.Find(currentElementName)) {
         row->mRead(*this, EncounteredNote, currentAttributes, text);
         return;
     }
@@ -106,7 +106,7 @@ void TNote::foundTrimmedCharacters(XmlStreamParser& parser, std::string_view tex
         return;
     }
     CMuxmlTupletPortion* const portion = OpenTupletPortion();
-    const TTupletRow* const row = kTupletElements.Find(currentElementName);
+    const CTupletRow* const row = kTupletElements.Find(currentElementName);
     if (portion != nullptr && row != nullptr) row->mRead(*portion, currentAttributes, text);
 }
 

@@ -46,7 +46,7 @@ const TPoints& PointsFor(std::size_t intvlCount) {
 }
 
 /// A chord of exactly these intervals, in which one key has a fixed score.
-struct TExactShape {
+struct CExactShape {
     std::array<int, 4> mIntvls;
     std::size_t mIntvlCount;
     int mRootAboveBass;  ///< semitones from the bass key up to that key
@@ -55,7 +55,7 @@ struct TExactShape {
 };
 
 // clang-format off
-constexpr TExactShape kExactShapes[] = {
+constexpr CExactShape kExactShapes[] = {
     // intervals    count  above bass  score  notes
     {{0, 6, 11},        3,          2,    33,     0},
     {{0, 4, 9, 10},     4,          0,    45,     0},
@@ -65,8 +65,8 @@ constexpr TExactShape kExactShapes[] = {
 };
 // clang-format on
 
-const TExactShape* ExactShapeOf(const CChordHeavy& chord) {
-    for (const TExactShape& shape : kExactShapes) {
+const CExactShape* ExactShapeOf(const CChordHeavy& chord) {
+    for (const CExactShape& shape : kExactShapes) {
         const std::span<const int> intvls(shape.mIntvls.data(), shape.mIntvlCount);
         if (!chord.IntvlSet().HasExactTheseIntvls(intvls)) continue;
         const bool fits = shape.mNoteCount == 0 || shape.mNoteCount == chord.Notes().size();
@@ -104,7 +104,7 @@ public:
 
 private:
     boost::container::small_vector<int, 24> mKeyNrs;  ///< of the note at each interval
-    const TExactShape* mExactShape;
+    const CExactShape* mExactShape;
     int mBassKeyNr;
 };
 

@@ -20,7 +20,7 @@ namespace brindle {
 namespace {
 
 // clang-format off
-constexpr auto kChordShapes = std::to_array<TChordShape>({
+constexpr auto kChordShapes = std::to_array<CChordShape>({
     //  name          tones                   catalogue second reading
     // Triads and fewer.
     {"major",         CSemitones{0, 4, 7},            true,  false},
@@ -109,8 +109,8 @@ std::vector<int> UpperTones(const CSemitones& tones, int lowest) {
 
 /// Adds the pattern in every voicing: each upper tone from `tone` on in the first octave, the
 /// second or both.
-void AddVoicings(std::span<const int> upperTones, TChordRootPattern pattern,
-                 std::vector<TChordRootPattern>& result) {
+void AddVoicings(std::span<const int> upperTones, CChordRootPattern pattern,
+                 std::vector<CChordRootPattern>& result) {
     if (upperTones.empty()) {
         result.push_back(pattern);
         pattern.mInputs |= 1U << 12U;
@@ -127,7 +127,7 @@ void AddVoicings(std::span<const int> upperTones, TChordRootPattern pattern,
 }
 
 void AddReadings(std::size_t shape, const CSemitones& tones, TOmission omission,
-                 std::vector<TChordRootPattern>& result) {
+                 std::vector<CChordRootPattern>& result) {
     const bool isOfCatalogue = kChordShapes[shape].mIsOfCatalogue && omission == TOmission_None;
     for (int lowest = 0; lowest < 12; ++lowest) {
         if (!tones.HasIntvl(lowest)) continue;
@@ -136,8 +136,8 @@ void AddReadings(std::size_t shape, const CSemitones& tones, TOmission omission,
     }
 }
 
-std::vector<TChordRootPattern> AllReadings() {
-    std::vector<TChordRootPattern> result;
+std::vector<CChordRootPattern> AllReadings() {
+    std::vector<CChordRootPattern> result;
     for (std::size_t shape = 0; shape < kChordShapes.size(); ++shape) {
         const CSemitones& tones = kChordShapes[shape].mTones;
         AddReadings(shape, tones, TOmission_None, result);
@@ -154,8 +154,8 @@ std::vector<TChordRootPattern> AllReadings() {
 }
 
 /// Orders readings of the same inputs, the one that counts first.
-auto Rank(const TChordRootPattern& reading) {
-    const TChordShape& shape = kChordShapes[reading.mShape];
+auto Rank(const CChordRootPattern& reading) {
+    const CChordShape& shape = kChordShapes[reading.mShape];
     return std::tuple(reading.mInputs, reading.mOmission, shape.mTones == kMinorB13,
                       reading.mRootIntvl != 0, shape.mIsSecondReading, reading.mRootIntvl,
                       reading.mShape);
@@ -163,16 +163,16 @@ auto Rank(const TChordRootPattern& reading) {
 
 }  // namespace
 
-std::span<const TChordShape> ChordShapes() {
+std::span<const CChordShape> ChordShapes() {
     return kChordShapes;
 }
 
-std::vector<TChordRootPattern> ChordRootPatterns() {
-    std::vector<TChordRootPattern> readings = AllReadings();
+std::vector<CChordRootPattern> ChordRootPatterns() {
+    std::vector<CChordRootPattern> readings = AllReadings();
     std::sort(readings.begin(), readings.end(),
               [](const auto& a, const auto& b) { return Rank(a) < Rank(b); });
-    std::vector<TChordRootPattern> result;
-    for (const TChordRootPattern& reading : readings) {
+    std::vector<CChordRootPattern> result;
+    for (const CChordRootPattern& reading : readings) {
         if (result.empty() || result.back().mInputs != reading.mInputs) {
             result.push_back(reading);
         } else {

@@ -11,7 +11,7 @@
 namespace brindle {
 
 /// A chord shape that the net learns to hear the root of.
-struct TChordShape {
+struct CChordShape {
     std::string_view mName;
     CSemitones mTones;      ///< above the root, folded into one octave
     bool mIsOfCatalogue;    ///< of the usual shapes, not one of the further ones
@@ -19,7 +19,7 @@ struct TChordShape {
 };
 
 /// All shapes: the usual ones in the order of the chord catalogue, then the further ones.
-[[nodiscard]] std::span<const TChordShape> ChordShapes();
+[[nodiscard]] std::span<const CChordShape> ChordShapes();
 
 /// Which tone of a chord is left out.
 enum TOmission : std::uint8_t {
@@ -30,14 +30,14 @@ enum TOmission : std::uint8_t {
 };
 
 /// What the net hears of a chord, and where the root is.
-struct TChordRootPattern {
+struct CChordRootPattern {
     std::uint32_t mInputs = 0;  ///< bit i: a note i semitones above the lowest, modulo 24
     int mRootIntvl = 0;         ///< 0 to 11 semitones from the lowest note up to the root
     std::size_t mShape = 0;     ///< index in ChordShapes() of the shape that it counts as
     TOmission mOmission = TOmission_None;
     bool mIsOfCatalogue = false;  ///< whether it is a voicing of a usual shape, nothing left out
 
-    friend constexpr bool operator==(const TChordRootPattern&, const TChordRootPattern&) = default;
+    friend constexpr bool operator==(const CChordRootPattern&, const CChordRootPattern&) = default;
 };
 
 /// Inputs of the net: two octaves above the lowest note.
@@ -47,6 +47,6 @@ inline constexpr int kChordRootInputCount = 24;
 /// as the lowest note, every other tone in the first octave, the second or both, with and without
 /// the octave above the lowest note; the same with the fifth, the third or the root left out of
 /// chords of four and more notes. Where several chords have the same notes, one root counts.
-[[nodiscard]] std::vector<TChordRootPattern> ChordRootPatterns();
+[[nodiscard]] std::vector<CChordRootPattern> ChordRootPatterns();
 
 }  // namespace brindle

@@ -45,42 +45,42 @@ std::string_view Trimmed(std::string_view text) {
 }
 
 template <class Type, std::size_t size>
-void ReadType(std::string_view value, const std::array<TNetTypeWords, size>& table, Type& type) {
+void ReadType(std::string_view value, const std::array<CNetTypeWords, size>& table, Type& type) {
     for (std::size_t i = 0; i < size; ++i) {
         if (table[i].mSource == value) type = static_cast<Type>(i);
     }
 }
 
 /// The properties that a file changes.
-struct TLoadedProperties {
+struct CLoadedProperties {
     TFixedNetProp& mFixed;
     TDynNetProp& mDyn;
     TNeuronProp& mNeuron = mDyn.mNeuronProp;
 };
 
 /// How one label of the property form is read.
-struct TLabel {
+struct CLabel {
     std::string_view mLabel;
     std::string_view mMessage;  ///< without " erkannt!"
-    void (*mRead)(std::string_view value, TLoadedProperties& properties);
+    void (*mRead)(std::string_view value, CLoadedProperties& properties);
 };
 
 template <std::size_t layer>
-void ReadLayerSize(std::string_view value, TLoadedProperties& properties) {
+void ReadLayerSize(std::string_view value, CLoadedProperties& properties) {
     properties.mDyn.mHiddenLayerSizes[layer] = ReadInteger(value);
 }
 
-constexpr TLabel kLabels[] = {
+constexpr CLabel kLabels[] = {
     {"Number Input Neurons", "Number Input Neurons",
-     [](std::string_view value, TLoadedProperties& properties) {
+     [](std::string_view value, CLoadedProperties& properties) {
          properties.mFixed.mInputNeuronCount = ReadInteger(value);
      }},
     {"Number Output Neurons", "Number Output Neurons",
-     [](std::string_view value, TLoadedProperties& properties) {
+     [](std::string_view value, CLoadedProperties& properties) {
          properties.mFixed.mOutputNeuronCount = ReadInteger(value);
      }},
     {"Number Hidden Layers", "Number Hidden Layers",
-     [](std::string_view value, TLoadedProperties& properties) {
+     [](std::string_view value, CLoadedProperties& properties) {
          properties.mDyn.mHiddenLayerCount = ReadInteger(value);
      }},
     // Kept: the size of a fifth hidden layer is written but not read.
@@ -89,36 +89,36 @@ constexpr TLabel kLabels[] = {
     {"Number Neurons in Hidden Layer 2", "Number Neurons Hidden Layers", ReadLayerSize<2>},
     {"Number Neurons in Hidden Layer 3", "Number Neurons Hidden Layers", ReadLayerSize<3>},
     {"Type of Input Function", "Type of Input Function",
-     [](std::string_view value, TLoadedProperties& properties) {
+     [](std::string_view value, CLoadedProperties& properties) {
          ReadType(value, kInputTypeWords, properties.mNeuron.mInputType);
      }},
     {"Type of Activation Function", "Type of Activation Function",
-     [](std::string_view value, TLoadedProperties& properties) {
+     [](std::string_view value, CLoadedProperties& properties) {
          ReadType(value, kActTypeWords, properties.mNeuron.mActType);
      }},
     {"Activation Threshold", "Activation Threshold",
-     [](std::string_view value, TLoadedProperties& properties) {
+     [](std::string_view value, CLoadedProperties& properties) {
          properties.mNeuron.mActivationThreshold = ReadDouble(std::string(value));
      }},
     {"Activation Slope", "Activation Slope",
-     [](std::string_view value, TLoadedProperties& properties) {
+     [](std::string_view value, CLoadedProperties& properties) {
          properties.mNeuron.mActivationSlope = ReadDouble(std::string(value));
      }},
     {"Type of Output Function", "Type of Output Function",
-     [](std::string_view value, TLoadedProperties& properties) {
+     [](std::string_view value, CLoadedProperties& properties) {
          ReadType(value, kOutputTypeWords, properties.mNeuron.mOutputType);
      }},
     {"Output Threshold", "Output Threshold",
-     [](std::string_view value, TLoadedProperties& properties) {
+     [](std::string_view value, CLoadedProperties& properties) {
          properties.mNeuron.mOutputThreshold = ReadDouble(std::string(value));
      }},
 };
 
-void ReadPropertyLine(std::string_view line, TLoadedProperties& properties) {
+void ReadPropertyLine(std::string_view line, CLoadedProperties& properties) {
     const std::size_t split = line.find("//");
     if (split == std::string_view::npos) return;
     const std::string_view label = Trimmed(line.substr(split + 2));
-    for (const TLabel& known : kLabels) {
+    for (const CLabel& known : kLabels) {
         if (known.mLabel != label) continue;
         known.mRead(Trimmed(line.substr(0, split)), properties);
         std::cout << known.mMessage << " erkannt!\n";
@@ -157,7 +157,7 @@ bool NeuronalNet::load_net_properties_from_file(const char* path) {
 bool NeuronalNet::load_net_properties(std::istream& stream) {
     TFixedNetProp fixedProp = mFixedNetProp;
     TDynNetProp dynProp = mDynNetProp;
-    TLoadedProperties properties{fixedProp, dynProp};
+    CLoadedProperties properties{fixedProp, dynProp};
     while (const auto line = ReadLine(stream)) ReadPropertyLine(*line, properties);
     if (!IsBuildable(fixedProp, dynProp)) return false;
     BuildNet(fixedProp, dynProp);

@@ -13,8 +13,8 @@ namespace brindle {
 namespace {
 
 template <std::size_t size>
-TNetTypeWords WordsOf(const std::array<TNetTypeWords, size>& table, std::size_t type) {
-    return type < size ? table[type] : TNetTypeWords{};
+CNetTypeWords WordsOf(const std::array<CNetTypeWords, size>& table, std::size_t type) {
+    return type < size ? table[type] : CNetTypeWords{};
 }
 
 /// A text that grows by formatted pieces.

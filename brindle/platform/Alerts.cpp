@@ -9,32 +9,32 @@ namespace brindle {
 
 namespace {
 
-struct THandlerInUse {
+struct CHandlerInUse {
     std::mutex mMutex;
     TAlertHandler mHandler;
 };
 
-THandlerInUse& HandlerInUse() {
-    static THandlerInUse handler;
+CHandlerInUse& HandlerInUse() {
+    static CHandlerInUse handler;
     return handler;
 }
 
-void WriteToStandardError(const TAlert& alert) {
+void WriteToStandardError(const CAlert& alert) {
     std::cerr << alert.messageText + ": " + alert.informativeText + '\n';
 }
 
 }  // namespace
 
 void SetAlertHandler(TAlertHandler handler) {
-    THandlerInUse& inUse = HandlerInUse();
+    CHandlerInUse& inUse = HandlerInUse();
     const std::lock_guard lock(inUse.mMutex);
     inUse.mHandler = std::move(handler);
 }
 
-void ShowAlert(const TAlert& alert) {
+void ShowAlert(const CAlert& alert) {
     TAlertHandler handler;
     {
-        THandlerInUse& inUse = HandlerInUse();
+        CHandlerInUse& inUse = HandlerInUse();
         const std::lock_guard lock(inUse.mMutex);
         handler = inUse.mHandler;
     }

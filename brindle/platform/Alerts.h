@@ -7,19 +7,19 @@
 namespace brindle {
 
 /// What is shown to the user when something goes wrong and the caller is not the one to be told.
-struct TAlert {
+struct CAlert {
     std::string messageText;      ///< the heading
     std::string informativeText;  ///< one sentence
     std::string button;           ///< the word that closes the panel
 };
 
-using TAlertHandler = std::function<void(const TAlert&)>;
+using TAlertHandler = std::function<void(const CAlert&)>;
 
 /// Lets a host show alerts by its own means; an empty handler brings the default back, which writes
 /// one line to standard error. Safe to call from any thread.
 void SetAlertHandler(TAlertHandler handler);
 
 /// Hands the alert to the handler, on the caller's thread.
-void ShowAlert(const TAlert& alert);
+void ShowAlert(const CAlert& alert);
 
 }  // namespace brindle

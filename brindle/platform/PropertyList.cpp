@@ -11,11 +11,11 @@ namespace brindle {
 
 namespace {
 
-struct TListCloser {
+struct CListCloser {
     void operator()(void* list) const { plist_free(list); }
 };
 
-struct TTextCloser {
+struct CTextCloser {
     void operator()(char* text) const { plist_to_xml_free(text); }
 };
 
@@ -54,11 +54,11 @@ plist_t ListOf(const nlohmann::json& value) {
 }  // namespace
 
 std::string PropertyListXml(const nlohmann::json& value) {
-    const std::unique_ptr<void, TListCloser> list(ListOf(value));
+    const std::unique_ptr<void, CListCloser> list(ListOf(value));
     char* bytes = nullptr;
     std::uint32_t size = 0;
     plist_to_xml(list.get(), &bytes, &size);
-    const std::unique_ptr<char, TTextCloser> closer(bytes);
+    const std::unique_ptr<char, CTextCloser> closer(bytes);
     return bytes == nullptr ? std::string() : std::string(bytes, size);
 }
 

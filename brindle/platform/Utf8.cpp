@@ -6,7 +6,7 @@
 namespace brindle {
 namespace {
 
-struct TLeadByte {
+struct CLeadByte {
     unsigned char mFirst;
     unsigned char mLast;
     std::size_t mLength;
@@ -16,7 +16,7 @@ struct TLeadByte {
 };
 
 // The well-formed byte sequences of the Unicode standard, table 3-7.
-constexpr auto kLeadBytes = std::to_array<TLeadByte>({
+constexpr auto kLeadBytes = std::to_array<CLeadByte>({
     {0x00, 0x7F, 1, 0x00, 0x00},
     {0xC2, 0xDF, 2, 0x80, 0xBF},
     {0xE0, 0xE0, 3, 0xA0, 0xBF},
@@ -28,7 +28,7 @@ constexpr auto kLeadBytes = std::to_array<TLeadByte>({
     {0xF4, 0xF4, 4, 0x80, 0x8F},
 });
 
-bool Fits(const TLeadByte& row, std::string_view text) {
+bool Fits(const CLeadByte& row, std::string_view text) {
     if (text.size() < row.mLength) return false;
     for (std::size_t i = 1; i < row.mLength; ++i) {
         const auto byte = static_cast<unsigned char>(text[i]);
@@ -44,7 +44,7 @@ bool Fits(const TLeadByte& row, std::string_view text) {
 std::size_t Utf8Length(std::string_view text) {
     if (text.empty()) return 0;
     const auto lead = static_cast<unsigned char>(text[0]);
-    for (const TLeadByte& row : kLeadBytes) {
+    for (const CLeadByte& row : kLeadBytes) {
         if (lead >= row.mFirst && lead <= row.mLast) return Fits(row, text) ? row.mLength : 0;
     }
     return 0;

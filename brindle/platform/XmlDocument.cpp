@@ -56,14 +56,14 @@ using XPathContext = std::unique_ptr<xmlXPathContext, decltype(&xmlXPathFreeCont
 using XPathResult = std::unique_ptr<xmlXPathObject, decltype(&xmlXPathFreeObject)>;
 
 // Short memory and a wrong path both have no result; only a wrong path is always told as an error.
-struct TPathErrors {
+struct CPathErrors {
     bool mWasMemoryShort = false;
     bool mIsWrong = false;
 
     static void Hear(void* self, xmlErrorPtr error) {
         const bool isShort = error->code == XML_ERR_NO_MEMORY ||
                              error->code == int{XML_XPATH_EXPRESSION_OK} + XPATH_MEMORY_ERROR;
-        auto& errors = *static_cast<TPathErrors*>(self);
+        auto& errors = *static_cast<CPathErrors*>(self);
         (isShort ? errors.mWasMemoryShort : errors.mIsWrong) = true;
     }
 };
@@ -72,10 +72,10 @@ struct TPathErrors {
 template <class Step>
 auto WithPathContext(xmlDocPtr document, Step step) {
     const xml::CMemoryWatch watch;
-    TPathErrors errors;
+    CPathErrors errors;
     const XPathContext context(xmlXPathNewContext(document), xmlXPathFreeContext);
     if (!context) throw std::bad_alloc();
-    context->error = TPathErrors::Hear;
+    context->error = CPathErrors::Hear;
     context->userData = &errors;
     auto result = step(context.get());
     if (errors.mWasMemoryShort || (!result && !errors.mIsWrong)) throw std::bad_alloc();

@@ -9,13 +9,13 @@ namespace {
 
 constexpr double kNarrowestBar = 22.0;
 
-struct TChordTimes {
+struct CChordTimes {
     double mShortest;
     std::size_t mCount = 0;
 };
 
-TChordTimes ChordTimes(const CShownSong& song) {
-    TChordTimes times{song.mEnd};
+CChordTimes ChordTimes(const CShownSong& song) {
+    CChordTimes times{song.mEnd};
     ForEachChord(song, [&](const CShownChord& chord) {
         const double length = chord.mRange.mEnd - chord.mRange.mBegin;
         if (length > 0.0) times.mShortest = std::min(times.mShortest, length);
@@ -32,7 +32,7 @@ double RoundedToBars(double beats, double beatsPerBar) {
 }
 
 double BeatsPerLine(const CShownSong& song, double lineWidth, double widestChord) {
-    const TChordTimes times = ChordTimes(song);
+    const CChordTimes times = ChordTimes(song);
     const double chordsPerLine = std::max(1.0, std::floor(lineWidth / widestChord));
     const double readable = RoundedToBars(times.mShortest * chordsPerLine, song.mBeatsPerBar);
     const double few = song.mEnd / static_cast<double>(times.mCount + 1);

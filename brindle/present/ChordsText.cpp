@@ -22,7 +22,7 @@ std::string NonChordName(const CChordLite& chord) {
     return chord.IsNoChordForce() ? "no chord, force" : "undefined";
 }
 
-Json ChordToJson(const TReadChord& read) {
+Json ChordToJson(const CReadChord& read) {
     const CChordLite& chord = read.mChord;
     return {{"Symbol", read.mSymbol},
             {"RootKeyEnh", KeyEnhToJson(chord.mRootKeyEnh)},
@@ -36,13 +36,13 @@ Json ChordToJson(const TReadChord& read) {
 
 }  // namespace
 
-std::string ChordsJson(const std::vector<TReadChord>& chords) {
+std::string ChordsJson(const std::vector<CReadChord>& chords) {
     Json list = Json::array();
-    for (const TReadChord& chord : chords) list.push_back(ChordToJson(chord));
+    for (const CReadChord& chord : chords) list.push_back(ChordToJson(chord));
     return JsonText({{"Chords", list}});
 }
 
-std::string ChordsText(const std::vector<TReadChord>& chords, const CPaint& paint) {
+std::string ChordsText(const std::vector<CReadChord>& chords, const CPaint& paint) {
     CTable table({"chord", "root", "bass", "basic chord", "semitones", " mask", "hash code"});
     for (const auto& [symbol, chord] : chords) {
         table.AddRow({symbol, chord.IsUndef() ? NonChordName(chord) : KeyName(chord.mRootKeyEnh),

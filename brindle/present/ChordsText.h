@@ -10,13 +10,13 @@
 namespace brindle {
 
 /// A chord and the symbol that it was read from.
-struct TReadChord {
+struct CReadChord {
     std::string mSymbol;
     CChordLite mChord;
 };
 
 /// Root, bass, tones and hash code of chords, as a table and as JSON, see docs/json.md.
-[[nodiscard]] std::string ChordsText(const std::vector<TReadChord>& chords, const CPaint& paint);
-[[nodiscard]] std::string ChordsJson(const std::vector<TReadChord>& chords);
+[[nodiscard]] std::string ChordsText(const std::vector<CReadChord>& chords, const CPaint& paint);
+[[nodiscard]] std::string ChordsJson(const std::vector<CReadChord>& chords);
 
 }  // namespace brindle

@@ -37,10 +37,10 @@ std::string OrDash(const std::string& text) {
 
 }  // namespace
 
-TChordFunction FunctionOf(const std::string& symbol, const CChordLite& chord,
+CChordFunction FunctionOf(const std::string& symbol, const CChordLite& chord,
                           const CSignKeyHeavy& key) {
     const CChordHeavy heavy = chord.ToChordHeavy(CChordHeavy::DefaultWrapIntvl);
-    TChordFunction function;
+    CChordFunction function;
     function.mSymbol = Printable(symbol);
     function.mFunction = heavy.HarmFuncIn(key);
     CChordNamePrefs letters = NamePrefs();
@@ -54,9 +54,9 @@ TChordFunction FunctionOf(const std::string& symbol, const CChordLite& chord,
     return function;
 }
 
-std::string FunctionsJson(const CSignKeyLite& key, const std::vector<TChordFunction>& functions) {
+std::string FunctionsJson(const CSignKeyLite& key, const std::vector<CChordFunction>& functions) {
     Json list = Json::array();
-    for (const TChordFunction& function : functions) {
+    for (const CChordFunction& function : functions) {
         list.push_back({{"Symbol", function.mSymbol},
                         {"HarmFunc", NumberOrNull(function.mFunction)},
                         {"Numeral", TextOrNull(function.mNumeral)},
@@ -67,9 +67,9 @@ std::string FunctionsJson(const CSignKeyLite& key, const std::vector<TChordFunct
     return JsonText({{"Key", key.NameLong(NamePrefs())}, {"Chords", list}});
 }
 
-std::string FunctionsText(const std::vector<TChordFunction>& functions, const CPaint& paint) {
+std::string FunctionsText(const std::vector<CChordFunction>& functions, const CPaint& paint) {
     CTable table({"chord", "numeral", "letters", " root degree", " bass degree"});
-    for (const TChordFunction& function : functions) {
+    for (const CChordFunction& function : functions) {
         table.AddRow({function.mSymbol, OrDash(function.mNumeral), OrDash(function.mLetters),
                       DegreeText(function.mRootDegree), DegreeText(function.mBassDegree)});
     }

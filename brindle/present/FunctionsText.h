@@ -13,7 +13,7 @@ class CChordLite;
 class CSignKeyHeavy;
 
 /// The function of a chord in a key, as it is shown.
-struct TChordFunction {
+struct CChordFunction {
     std::string mSymbol;
     int mFunction = -1;    // none
     std::string mNumeral;  // empty without a function, as the letters
@@ -23,14 +23,14 @@ struct TChordFunction {
 };
 
 /// `symbol` is the chord as somebody wrote it.
-[[nodiscard]] TChordFunction FunctionOf(const std::string& symbol, const CChordLite& chord,
+[[nodiscard]] CChordFunction FunctionOf(const std::string& symbol, const CChordLite& chord,
                                         const CSignKeyHeavy& key);
 
 /// A table, in which degrees are counted from 1.
-[[nodiscard]] std::string FunctionsText(const std::vector<TChordFunction>& functions,
+[[nodiscard]] std::string FunctionsText(const std::vector<CChordFunction>& functions,
                                         const CPaint& paint);
 /// JSON, in which degrees are counted from 0, see docs/json.md.
 [[nodiscard]] std::string FunctionsJson(const CSignKeyLite& key,
-                                        const std::vector<TChordFunction>& functions);
+                                        const std::vector<CChordFunction>& functions);
 
 }  // namespace brindle

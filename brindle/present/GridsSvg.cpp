@@ -111,13 +111,13 @@ private:
 };
 
 /// The room of one diagram on a sheet: that of the largest.
-struct TCell {
+struct CCell {
     double mWidth = 0.0;
     double mHeight = 0.0;
 };
 
-TCell CellFor(const std::vector<CChordGrid>& grids) {
-    TCell cell;
+CCell CellFor(const std::vector<CChordGrid>& grids) {
+    CCell cell;
     for (const CChordGrid& grid : grids) {
         const double neck = kGridStringGap * static_cast<double>(grid.mFrets.size() - 1);
         const double name = TextWidth(NamesText(grid), kNameSize);
@@ -134,7 +134,7 @@ void DrawGrid(CSvg& svg, const CChordGrid& grid, double left, double top, double
 }
 
 std::string GridsSvg(const std::vector<CChordGrid>& grids, std::string_view title) {
-    const TCell cell = CellFor(grids);
+    const CCell cell = CellFor(grids);
     CSvg svg;
     for (std::size_t i = 0; i < grids.size(); ++i) {
         const double left = kMargin + cell.mWidth * static_cast<double>(i % kGridsPerLine);

@@ -20,12 +20,12 @@ namespace brindle {
 namespace {
 
 // Field of a note, the word for it in the column of marks.
-struct TMark {
+struct CMark {
     bool (*mHas)(const CMuxmlNote& note);
     std::string_view mWord;
 };
 
-constexpr auto kMarks = std::to_array<TMark>({
+constexpr auto kMarks = std::to_array<CMark>({
     {[](const CMuxmlNote& n) { return n.mIsChordNote; }, "chord"},
     {[](const CMuxmlNote& n) { return n.mIsGraceNote; }, "grace"},
     {[](const CMuxmlNote& n) { return n.mIsCueNote; }, "cue"},
@@ -47,7 +47,7 @@ constexpr auto kMarks = std::to_array<TMark>({
 
 std::string MarksOf(const CMuxmlNote& note) {
     std::string marks;
-    for (const TMark& mark : kMarks) {
+    for (const CMark& mark : kMarks) {
         if (mark.mHas(note)) fmt::format_to(std::back_inserter(marks), " {}", mark.mWord);
     }
     return marks.empty() ? marks : marks.substr(1);

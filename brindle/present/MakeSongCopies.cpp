@@ -21,7 +21,7 @@ std::vector<CShownCopy> MakeSongCopies(const CHarmonicAnalyse& analyse,
                                        const CChordSymbols& symbols) {
     const CHarmAnlsChords& chords = analyse.mChords;
     std::vector<CShownCopy> copies;
-    for (const TCopiedPassage& passage : FindCopiedPassages(analyse)) {
+    for (const CCopiedPassage& passage : FindCopiedPassages(analyse)) {
         CShownCopy& shown = copies.emplace_back();
         shown.mCopy = passage.mCopy;
         shown.mSource = RangeOf(chords, passage.mSource, passage.mCount);

@@ -7,7 +7,7 @@
 namespace brindle {
 
 CShownKeys MakeSongKeys(const CHarmAnlsChords& chords, const CChordSymbols& symbols,
-                        const CKeyOptions& options, const TNumeralOptions& numeralOptions) {
+                        const CKeyOptions& options, const CNumeralOptions& numeralOptions) {
     const CKeyOfSong found = FindKeys(chords, options);
     const std::vector<std::string> numerals = NumeralsOf(chords, found, numeralOptions);
     CShownKeys keys;

@@ -11,6 +11,6 @@ namespace brindle {
 /// Finds the keys of a song and prepares them for the eye, with the numeral of each chord.
 [[nodiscard]] CShownKeys MakeSongKeys(const CHarmAnlsChords& chords, const CChordSymbols& symbols,
                                       const CKeyOptions& options,
-                                      const TNumeralOptions& numeralOptions = {});
+                                      const CNumeralOptions& numeralOptions = {});
 
 }  // namespace brindle

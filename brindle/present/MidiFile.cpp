@@ -17,12 +17,12 @@ constexpr std::size_t kMostTracks = 0xFFFE;
 // and an instrument must be there before its notes.
 enum class TRank : std::uint8_t { NoteOff, Setting, NoteOn };
 
-struct TEvent {
+struct CEvent {
     std::int64_t mTick;
     TRank mRank;
     std::string mBytes;
 
-    friend bool operator<(const TEvent& a, const TEvent& b) {
+    friend bool operator<(const CEvent& a, const CEvent& b) {
         return a.mTick != b.mTick ? a.mTick < b.mTick : a.mRank < b.mRank;
     }
 };
@@ -71,18 +71,18 @@ std::string Chunk(std::string_view kind, std::string_view content) {
            std::string(content);
 }
 
-TEvent Setting(std::int64_t tick, std::string bytes) {
+CEvent Setting(std::int64_t tick, std::string bytes) {
     return {Tick(tick), TRank::Setting, std::move(bytes)};
 }
 
-TEvent TempoEvent(const CMidiTempo& tempo) {
+CEvent TempoEvent(const CMidiTempo& tempo) {
     const double microseconds = 60e6 / tempo.mQuartersPerMinute;
     const bool isReal = microseconds >= 1.0;
     const double limited = isReal ? std::min(std::round(microseconds), 16777215.0) : 500000.0;
     return Setting(tempo.mTick, Meta(0x51, BigEndian(static_cast<std::uint32_t>(limited), 3)));
 }
 
-TEvent TimeSignatureEvent(const CMidiTimeSignature& signature) {
+CEvent TimeSignatureEvent(const CMidiTimeSignature& signature) {
     const auto denominator = static_cast<unsigned>(std::clamp(signature.mDenominator, 1, 128));
     // A click for each quarter note, and eight 32nd notes to a quarter.
     const std::string content{Byte(std::clamp(signature.mNumerator, 1, 255)),
@@ -91,13 +91,13 @@ TEvent TimeSignatureEvent(const CMidiTimeSignature& signature) {
     return Setting(signature.mTick, Meta(0x58, content));
 }
 
-TEvent KeySignatureEvent(const CMidiKeySignature& signature) {
+CEvent KeySignatureEvent(const CMidiKeySignature& signature) {
     const std::string content{Byte(std::clamp(signature.mSharps, -7, 7)),
                               Byte(signature.mIsMinor ? 1 : 0)};
     return Setting(signature.mTick, Meta(0x59, content));
 }
 
-void AppendNote(const CMidiNote& note, std::vector<TEvent>& events) {
+void AppendNote(const CMidiNote& note, std::vector<CEvent>& events) {
     if (note.mNoteNr < 0 || note.mNoteNr > 127) return;
     const std::int64_t begin = std::min(Tick(note.mTick), kLastTick - 1);
     const std::int64_t length = std::clamp<std::int64_t>(note.mDuration, 1, kLastTick - begin);
@@ -109,11 +109,11 @@ void AppendNote(const CMidiNote& note, std::vector<TEvent>& events) {
         {begin + length, TRank::NoteOff, {ChannelByte(0x80, note.mChannel), key, Byte(64)}});
 }
 
-std::string TrackChunk(std::vector<TEvent> events) {
+std::string TrackChunk(std::vector<CEvent> events) {
     std::stable_sort(events.begin(), events.end());
     std::string content;
     std::int64_t now = 0;
-    for (const TEvent& event : events) {
+    for (const CEvent& event : events) {
         content += VariableLength(static_cast<std::uint32_t>(event.mTick - now)) + event.mBytes;
         now = event.mTick;
     }
@@ -122,7 +122,7 @@ std::string TrackChunk(std::vector<TEvent> events) {
 }
 
 std::string ConductorChunk(const CMidiPiece& piece) {
-    std::vector<TEvent> events;
+    std::vector<CEvent> events;
     for (const auto& signature : piece.mTimeSignatures) {
         events.push_back(TimeSignatureEvent(signature));
     }
@@ -134,7 +134,7 @@ std::string ConductorChunk(const CMidiPiece& piece) {
 }
 
 std::string NotesChunk(const CMidiTrack& track) {
-    std::vector<TEvent> events;
+    std::vector<CEvent> events;
     if (!track.mName.empty()) events.push_back(Setting(0, Meta(0x03, track.mName)));
     for (const auto& program : track.mPrograms) {
         events.push_back(Setting(

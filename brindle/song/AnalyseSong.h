@@ -28,7 +28,7 @@ struct CSongAnalysis {
     CHarmonicAnalyse mAnalyse;
     /// Empty if they were not asked for.
     CHarmAnlsCenters mReadings;
-    std::vector<TCopiedPassage> mCopies;
+    std::vector<CCopiedPassage> mCopies;
     CKeyOfSong mKeys;
     /// Of each chord in the key of its region; empty for one that has none.
     std::vector<std::string> mNumerals;

@@ -28,7 +28,7 @@ std::vector<CSong> OneSong(CSong song) {
     return songs;
 }
 
-CSong ReadOneSong(std::string_view bytes, TSongFormat format, const CSongPrefs& prefs) {
+CSong ReadOneSong(std::string_view bytes, TSongFormat format, const CSongOptions& prefs) {
     switch (format) {
         case TSongFormat_MusicXml:
         case TSongFormat_CompressedMusicXml:
@@ -74,7 +74,7 @@ bool CSong::HasFault() const {
                        [](const CSongFault& fault) { return !fault.mIsNote; });
 }
 
-std::vector<CSong> ReadSongs(std::string_view bytes, const CSongPrefs& prefs) {
+std::vector<CSong> ReadSongs(std::string_view bytes, const CSongOptions& prefs) {
     const TSongFormat format =
         prefs.mFormat == TSongFormat_Auto ? SongFormatOf(bytes) : prefs.mFormat;
     if (format != TSongFormat_ChartLink && format != TSongFormat_ChartPage) {
@@ -83,7 +83,7 @@ std::vector<CSong> ReadSongs(std::string_view bytes, const CSongPrefs& prefs) {
     return SongReaders::ReadChartLinks(bytes, format, prefs);
 }
 
-CSong ReadSong(std::string_view bytes, const CSongPrefs& prefs) {
+CSong ReadSong(std::string_view bytes, const CSongOptions& prefs) {
     std::vector<CSong> songs = ReadSongs(bytes, prefs);
     CSong song = std::move(songs.front());
     if (const std::size_t others = songs.size() - 1; others > 0) {
@@ -92,13 +92,13 @@ CSong ReadSong(std::string_view bytes, const CSongPrefs& prefs) {
     return song;
 }
 
-std::vector<CSong> ReadSongsFile(const std::string& path, const CSongPrefs& prefs) {
+std::vector<CSong> ReadSongsFile(const std::string& path, const CSongOptions& prefs) {
     std::string reason;
     const auto bytes = BytesOf(path, reason);
     return bytes ? ReadSongs(*bytes, prefs) : OneSong(FailedSong(prefs.mFormat, reason));
 }
 
-CSong ReadSongFile(const std::string& path, const CSongPrefs& prefs) {
+CSong ReadSongFile(const std::string& path, const CSongOptions& prefs) {
     std::string reason;
     const auto bytes = BytesOf(path, reason);
     return bytes ? ReadSong(*bytes, prefs) : FailedSong(prefs.mFormat, reason);

@@ -11,7 +11,7 @@
 namespace brindle {
 
 /// How a song is read.
-struct CSongPrefs {
+struct CSongOptions {
     TSongFormat mFormat = TSongFormat_Auto;
     /// Length of a bar, and how far a chord or a hold moves on, in a text that does not tell. Beats
     /// above 0.
@@ -23,7 +23,7 @@ struct CSongPrefs {
     /// What is not understood becomes a "No Chord Yield", and all faults are told.
     bool mLenient = false;
     /// `mBIsBFlat` is set by any H in the song.
-    CChordTextPrefs mChordTextPrefs{};
+    CChordTextOptions mChordTextPrefs{};
 };
 
 /// Reads a song in any form.
@@ -32,16 +32,16 @@ struct CSongPrefs {
 /// with many songs this is the first. Repeats and jumps may play 64 times what is written, 10,000
 /// bars and chords in any case and 100,000 at most; a song that goes on is at fault. Time is n log
 /// n in what is read and played.
-[[nodiscard]] CSong ReadSong(std::string_view bytes, const CSongPrefs& prefs = {});
+[[nodiscard]] CSong ReadSong(std::string_view bytes, const CSongOptions& prefs = {});
 
 /// All songs of a source: those of a link or of a page; of any other form there is one.
-[[nodiscard]] std::vector<CSong> ReadSongs(std::string_view bytes, const CSongPrefs& prefs = {});
+[[nodiscard]] std::vector<CSong> ReadSongs(std::string_view bytes, const CSongOptions& prefs = {});
 
 /// The same for a file; that it is missing, unreadable or larger than 256 MiB is a fault. A song
 /// without a title has none: the name of the file is not one.
-[[nodiscard]] CSong ReadSongFile(const std::string& path, const CSongPrefs& prefs = {});
+[[nodiscard]] CSong ReadSongFile(const std::string& path, const CSongOptions& prefs = {});
 [[nodiscard]] std::vector<CSong> ReadSongsFile(const std::string& path,
-                                               const CSongPrefs& prefs = {});
+                                               const CSongOptions& prefs = {});
 
 /// What a source looks like: any form but TSongFormat_Auto and TSongFormat_EvenText.
 [[nodiscard]] TSongFormat SongFormatOf(std::string_view bytes);

@@ -49,10 +49,10 @@ bool BeginsWithChordString(std::string_view text) {
 
 /// Lines of chords, and between them lyrics or names of parts.
 bool HasChordsAboveLyrics(std::string_view text) {
-    const std::vector<TSheetLine> lines = LinesOf(text);
+    const std::vector<CTextLine> lines = LinesOf(text);
     const auto has = [&](TLineKind kind) {
         return std::any_of(lines.begin(), lines.end(),
-                           [&](const TSheetLine& line) { return line.mKind == kind; });
+                           [&](const CTextLine& line) { return line.mKind == kind; });
     };
     return has(TLineKind::Chords) && (has(TLineKind::Lyrics) || has(TLineKind::Section));
 }

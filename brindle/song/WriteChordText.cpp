@@ -33,7 +33,7 @@ public:
         mResult.mBeatsPerChord = Step();
     }
 
-    [[nodiscard]] std::optional<TChordText> Write() {
+    [[nodiscard]] std::optional<CChordText> Write() {
         mEnd = StepOf(EndOf(mSheet));
         if (!(static_cast<double>(mEnd) < kMostSteps)) return std::nullopt;
         for (std::size_t i = 0; i < mSheet.Harmonies.size(); ++i) {
@@ -101,7 +101,7 @@ private:
     }
 
     const TMusicXMLDoc& mSheet;
-    TChordText mResult;
+    CChordText mResult;
     double mUpbeat = 0.0;
     std::int64_t mStep = 0;
     std::int64_t mEnd = 0;
@@ -110,7 +110,7 @@ private:
 
 }  // namespace
 
-std::optional<TChordText> WriteChordText(const TMusicXMLDoc& sheet) {
+std::optional<CChordText> WriteChordText(const TMusicXMLDoc& sheet) {
     return CWriter(sheet).Write();
 }
 

@@ -9,7 +9,7 @@ namespace brindle {
 struct TMusicXMLDoc;
 
 /// The chords of a score as a chord text, and with which lengths `analyse` reads it back.
-struct TChordText {
+struct CChordText {
     std::string mText;
     double mBeatsPerBar = 4.0;
     double mBeatsPerChord = 1.0;
@@ -17,6 +17,6 @@ struct TChordText {
 
 /// Writes four bars a line. An upbeat is filled up to a bar in front. A bar line stands only where
 /// a reader with bars of one length sees one, too. Nothing for a song that is too long.
-[[nodiscard]] std::optional<TChordText> WriteChordText(const TMusicXMLDoc& sheet);
+[[nodiscard]] std::optional<CChordText> WriteChordText(const TMusicXMLDoc& sheet);
 
 }  // namespace brindle

@@ -14,12 +14,12 @@ namespace brindle {
 
 namespace {
 
-struct TModeName {
+struct CModeName {
     CSemitones mSemitones;
     std::string_view mSuffix;
 };
 
-constexpr auto kModeNames = std::to_array<TModeName>({
+constexpr auto kModeNames = std::to_array<CModeName>({
     {CSemitones(2741), " Major"},
     {CSemitones(1453), " Minor"},
     {CSemitones(1709), " Dorian"},
@@ -32,7 +32,7 @@ constexpr auto kModeNames = std::to_array<TModeName>({
 std::string_view ModeSuffix(CSemitones semitones) {
     const auto row =
         std::find_if(kModeNames.begin(), kModeNames.end(),
-                     [semitones](const TModeName& mode) { return mode.mSemitones == semitones; });
+                     [semitones](const CModeName& mode) { return mode.mSemitones == semitones; });
     return row == kModeNames.end() ? std::string_view() : row->mSuffix;
 }
 

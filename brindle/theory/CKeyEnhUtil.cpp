@@ -10,12 +10,12 @@ namespace brindle {
 namespace {
 
 /// How far the related major root lies from the root of a mode, in semitones.
-struct TRelation {
+struct CRelation {
     TScaleType mScaleType;
     int mIntvl;
 };
 
-constexpr auto kRelations = std::to_array<TRelation>({
+constexpr auto kRelations = std::to_array<CRelation>({
     {st_maj, 0},
     {st_min, -9},
     {st_lydian, -5},
@@ -28,7 +28,7 @@ constexpr auto kRelations = std::to_array<TRelation>({
 }  // namespace
 
 CKeyEnh CKeyEnhUtil::RelatedIonianScaleRootKeyEnh(const CKeyEnh& root, TScaleType scaleType) {
-    for (const TRelation& row : kRelations) {
+    for (const CRelation& row : kRelations) {
         if (row.mScaleType == scaleType) return root.Add(row.mIntvl);
     }
     return CKeyEnh_Undef;

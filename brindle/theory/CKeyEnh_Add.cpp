@@ -17,7 +17,7 @@ namespace brindle {
 namespace {
 
 /// A key and the key that lies the table's interval above it.
-struct TMove {
+struct CMove {
     CKeyEnh mFrom;
     CKeyEnh mTo;
 };
@@ -25,36 +25,36 @@ struct TMove {
 // Some rows do not keep the interval exact: G triple sharp to B sharp and C double flat to G flat.
 // They are meant.
 // clang-format off
-constexpr auto kMovesUp3 = std::to_array<TMove>({
+constexpr auto kMovesUp3 = std::to_array<CMove>({
     {CKeyEnh_C, CKeyEnh_Eb},      {CKeyEnh_Db, CKeyEnh_Fb},     {CKeyEnh_Fb, CKeyEnh_Abb},
     {CKeyEnh_F, CKeyEnh_Ab},      {CKeyEnh_Gb, CKeyEnh_Bbb},    {CKeyEnh_G, CKeyEnh_Bb},
     {CKeyEnh_Ab, CKeyEnh_Cb},     {CKeyEnh_Cb, CKeyEnh_Ebb},
 });
-constexpr auto kMovesUp4 = std::to_array<TMove>({
+constexpr auto kMovesUp4 = std::to_array<CMove>({
     {CKeyEnh_Bis, CKeyEnh_Dx},    {CKeyEnh_Cis, CKeyEnh_Eis},   {CKeyEnh_Dis, CKeyEnh_Fx},
     {CKeyEnh_Eis, CKeyEnh_Gx},    {CKeyEnh_Gis, CKeyEnh_Bis},   {CKeyEnh_Ais, CKeyEnh_Cx},
     {CKeyEnh_Cx, CKeyEnh_Ex},     {CKeyEnh_Dx, CKeyEnh_Fxs},    {CKeyEnh_Ex, CKeyEnh_Gxs},
     {CKeyEnh_Gx, CKeyEnh_Bx},     {CKeyEnh_Ax, CKeyEnh_Cxs},    {CKeyEnh_Cbb, CKeyEnh_Ebb},
     {CKeyEnh_Dbb, CKeyEnh_Fb},    {CKeyEnh_Fbb, CKeyEnh_Abb},   {CKeyEnh_Abb, CKeyEnh_Cb},
 });
-constexpr auto kMovesUp7 = std::to_array<TMove>({
+constexpr auto kMovesUp7 = std::to_array<CMove>({
     {CKeyEnh_Ais, CKeyEnh_Eis},   {CKeyEnh_Bis, CKeyEnh_Fx},    {CKeyEnh_Ax, CKeyEnh_Ex},
     {CKeyEnh_Ex, CKeyEnh_Bx},     {CKeyEnh_Bx, CKeyEnh_Fxs},    {CKeyEnh_Fxs, CKeyEnh_Cxs},
     {CKeyEnh_Cxs, CKeyEnh_Gxs},   {CKeyEnh_Gxs, CKeyEnh_Dxs},
 });
-constexpr auto kMovesDown2 = std::to_array<TMove>({
+constexpr auto kMovesDown2 = std::to_array<CMove>({
     {CKeyEnh_C, CKeyEnh_Bb},      {CKeyEnh_Db, CKeyEnh_Cb},     {CKeyEnh_Fb, CKeyEnh_Ebb},
     {CKeyEnh_F, CKeyEnh_Eb},      {CKeyEnh_Gb, CKeyEnh_Fb},     {CKeyEnh_Cb, CKeyEnh_Bbb},
     {CKeyEnh_Cx, CKeyEnh_Bis},    {CKeyEnh_Ex, CKeyEnh_Dx},     {CKeyEnh_Fx, CKeyEnh_Eis},
     {CKeyEnh_Cbb, CKeyEnh_Bbbb},  {CKeyEnh_Dbb, CKeyEnh_Cbb},   {CKeyEnh_Fbb, CKeyEnh_Ebbb},
     {CKeyEnh_Gbb, CKeyEnh_Fbb},
 });
-constexpr auto kMovesDown3 = std::to_array<TMove>({
+constexpr auto kMovesDown3 = std::to_array<CMove>({
     {CKeyEnh_Bis, CKeyEnh_Gx},    {CKeyEnh_Dis, CKeyEnh_Bis},   {CKeyEnh_Eis, CKeyEnh_Cx},
     {CKeyEnh_Gis, CKeyEnh_Eis},   {CKeyEnh_Ais, CKeyEnh_Fx},    {CKeyEnh_Abb, CKeyEnh_Fb},
     {CKeyEnh_Cbb, CKeyEnh_Abb},
 });
-constexpr auto kMovesDown4 = std::to_array<TMove>({
+constexpr auto kMovesDown4 = std::to_array<CMove>({
     {CKeyEnh_Db, CKeyEnh_Bbb},    {CKeyEnh_Eb, CKeyEnh_Cb},     {CKeyEnh_Fb, CKeyEnh_Dbb},
     {CKeyEnh_Gb, CKeyEnh_Ebb},    {CKeyEnh_Ab, CKeyEnh_Fb},     {CKeyEnh_Cb, CKeyEnh_Abb},
     {CKeyEnh_Ex, CKeyEnh_Cx},     {CKeyEnh_Dx, CKeyEnh_Bis},    {CKeyEnh_Gx, CKeyEnh_Eis},
@@ -62,25 +62,25 @@ constexpr auto kMovesDown4 = std::to_array<TMove>({
     {CKeyEnh_Ebb, CKeyEnh_Cbb},   {CKeyEnh_Fbb, CKeyEnh_Dbbb},  {CKeyEnh_Gbb, CKeyEnh_Ebbb},
     {CKeyEnh_Abb, CKeyEnh_Fbb},
 });
-constexpr auto kMovesDown5 = std::to_array<TMove>({
+constexpr auto kMovesDown5 = std::to_array<CMove>({
     {CKeyEnh_Bis, CKeyEnh_Fx},    {CKeyEnh_Ais, CKeyEnh_Eis},   {CKeyEnh_Ex, CKeyEnh_Bx},
     {CKeyEnh_Ax, CKeyEnh_Ex},     {CKeyEnh_Bx, CKeyEnh_Fxs},    {CKeyEnh_Cbb, CKeyEnh_Gbb},
     {CKeyEnh_Fbb, CKeyEnh_Cbb},   {CKeyEnh_Bbb, CKeyEnh_Fb},
 });
-constexpr auto kMovesDown7 = std::to_array<TMove>({
+constexpr auto kMovesDown7 = std::to_array<CMove>({
     {CKeyEnh_Fb, CKeyEnh_Bbb},    {CKeyEnh_F, CKeyEnh_Bb},      {CKeyEnh_Gb, CKeyEnh_Cb},
     {CKeyEnh_Gbb, CKeyEnh_Cbb},   {CKeyEnh_Cbb, CKeyEnh_Fbb},   {CKeyEnh_Ex, CKeyEnh_Ax},
     {CKeyEnh_Fx, CKeyEnh_Bis},    {CKeyEnh_Fbb, CKeyEnh_Bbbb},  {CKeyEnh_Bbbb, CKeyEnh_Ebbb},
     {CKeyEnh_Ebbb, CKeyEnh_Abbb}, {CKeyEnh_Abbb, CKeyEnh_Dbbb},
 });
-constexpr auto kMovesDown9 = std::to_array<TMove>({
+constexpr auto kMovesDown9 = std::to_array<CMove>({
     {CKeyEnh_Db, CKeyEnh_Fb},     {CKeyEnh_Eb, CKeyEnh_Gb},     {CKeyEnh_Fb, CKeyEnh_Abb},
     {CKeyEnh_Gb, CKeyEnh_Bbb},    {CKeyEnh_Ab, CKeyEnh_Cb},     {CKeyEnh_Cb, CKeyEnh_Ebb},
     {CKeyEnh_Cx, CKeyEnh_Eis},    {CKeyEnh_Ex, CKeyEnh_Gx},     {CKeyEnh_Gx, CKeyEnh_Bis},
     {CKeyEnh_Gxs, CKeyEnh_Bis},   {CKeyEnh_Cbb, CKeyEnh_Ebbb},  {CKeyEnh_Dbb, CKeyEnh_Fbb},
     {CKeyEnh_Fbb, CKeyEnh_Abbb},  {CKeyEnh_Gbb, CKeyEnh_Bbbb},  {CKeyEnh_Abb, CKeyEnh_Cbb},
 });
-constexpr auto kMovesDown11 = std::to_array<TMove>({
+constexpr auto kMovesDown11 = std::to_array<CMove>({
     {CKeyEnh_Db, CKeyEnh_Ebb},    {CKeyEnh_Eb, CKeyEnh_Fb},     {CKeyEnh_Fb, CKeyEnh_Gbb},
     {CKeyEnh_Gb, CKeyEnh_Abb},    {CKeyEnh_Ab, CKeyEnh_Bbb},    {CKeyEnh_Bb, CKeyEnh_Cb},
     {CKeyEnh_Cb, CKeyEnh_Dbb},    {CKeyEnh_Bx, CKeyEnh_Cx},     {CKeyEnh_Dx, CKeyEnh_Eis},
@@ -90,7 +90,7 @@ constexpr auto kMovesDown11 = std::to_array<TMove>({
 });
 // clang-format on
 
-constexpr std::span<const TMove> MovesBy(int r) {
+constexpr std::span<const CMove> MovesBy(int r) {
     switch (r) {
         case 3:
             return kMovesUp3;
@@ -157,7 +157,7 @@ constexpr CKeyEnh MovedByRules(const CKeyEnh& source, int r) {
     const int target = FoldIntoOctave(std::int64_t{source.mKeyNr} + r);
     const bool targetIsBlack = IsBlackKey(target);
     if (const auto enh = CandidateEnh(source, r, targetIsBlack)) return {target, *enh};
-    for (const TMove& move : MovesBy(r)) {
+    for (const CMove& move : MovesBy(r)) {
         if (move.mFrom == source) return move.mTo;
     }
     return {target, PlainEnh(source, targetIsBlack)};
@@ -167,13 +167,13 @@ constexpr int kEnhCount = TEnh_Undef - TEnh_bbb + 1;
 constexpr int kRange = 11;
 
 /// Two bytes instead of eight, so that all moves lie in 5 KiB.
-struct TMovedKey {
+struct CMovedKey {
     std::int8_t mKeyNr;
     TEnh mEnh;
 };
 
 // For r = -11 to 11, key 0 to 11 and each spelling, -1 to 7.
-using TMovedKeys = std::array<std::array<std::array<TMovedKey, kEnhCount>, 12>, 2 * kRange + 1>;
+using TMovedKeys = std::array<std::array<std::array<CMovedKey, kEnhCount>, 12>, 2 * kRange + 1>;
 
 constexpr TMovedKeys kMovedKeys = [] {
     TMovedKeys moved{};
@@ -205,7 +205,7 @@ void CKeyEnh::AddToThis(int intvl) {
         *this = MovedByRules(*this, r);
         return;
     }
-    const TMovedKey& target =
+    const CMovedKey& target =
         kMovedKeys[static_cast<std::size_t>(r + kRange)][static_cast<std::size_t>(mKeyNr)]
                   [static_cast<std::size_t>(mEnh - TEnh_bbb)];
     mKeyNr = target.mKeyNr;

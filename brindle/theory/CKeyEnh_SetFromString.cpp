@@ -48,22 +48,22 @@ CKeyEnh KeyOfLetter(char letter, const CChordNamePrefs& prefs) {
 }
 
 /// An accidental behind a letter and the count of characters it takes.
-struct TAccidental {
+struct CAccidental {
     TEnh mEnh = TEnh_n;
     std::size_t mLength = 0;
 };
 
-TAccidental AccidentalOf(char first, char second) {
+CAccidental AccidentalOf(char first, char second) {
     switch (first) {
         case '#':
             return {TEnh_s, 1};
         case 'i':
         case 'I':
-            return second == 's' || second == 'S' ? TAccidental{TEnh_s, 2} : TAccidental{};
+            return second == 's' || second == 'S' ? CAccidental{TEnh_s, 2} : CAccidental{};
         case 'x':
             return {TEnh_ss, 1};
         case 'b':
-            return second == 'b' ? TAccidental{TEnh_bb, 2} : TAccidental{TEnh_b, 1};
+            return second == 'b' ? CAccidental{TEnh_bb, 2} : CAccidental{TEnh_b, 1};
         default:
             return {};
     }
@@ -79,7 +79,7 @@ void CKeyEnh::SetFromString(std::string_view text, int* consumed, const CChordNa
     const CKeyEnh letter = KeyOfLetter(first, prefs);
     if (letter.IsUndef()) return;
     *this = letter;
-    const TAccidental accidental = AccidentalOf(second, third);
+    const CAccidental accidental = AccidentalOf(second, third);
     if (accidental.mLength > 0) {
         // Kept: counted from the letter's key, which may be B flat already: then "Bb" is key 9.
         *this = {FoldIntoOctave(letter.mKeyNr + EnhToSemitone(accidental.mEnh)), accidental.mEnh};

@@ -133,8 +133,8 @@ void CScaleHeavy::AppendJSONString(std::ostream& stream) const {
 bool operator==(const CScaleHeavy& a, const CScaleHeavy& b) {
     if (a.mRootNote != b.mRootNote || a.mScaleType != b.mScaleType) return false;
     if (a.mScaleType != st_custom) return true;
-    const TScaleRow& rowA = a.ScaleRow();
-    const TScaleRow& rowB = b.ScaleRow();
+    const CScaleRow& rowA = a.ScaleRow();
+    const CScaleRow& rowB = b.ScaleRow();
     return rowA.mDegreesPerOctave == rowB.mDegreesPerOctave &&
            rowA.mDegreeToRootOffsetIntvl == rowB.mDegreeToRootOffsetIntvl;
 }

@@ -33,7 +33,7 @@ public:
     // The table of scales, in its own order
 
     /// All named scales and, last, the empty row of the undefined scale.
-    static constexpr const std::array<TScaleRow, 30>& mScaleData = kScaleCatalogue;
+    static constexpr const std::array<CScaleRow, 30>& mScaleData = kScaleCatalogue;
 
     /// 30: the named scales and the empty row.
     [[nodiscard]] static constexpr int NumAvailableScales() {
@@ -119,11 +119,11 @@ public:
     [[nodiscard]] constexpr TScaleType ScaleType() const { return mScaleType; }
     [[nodiscard]] constexpr bool IsUndef() const { return mRootNote.IsUndef(); }
     /// The row in use: of the table of scales, or the scale's own.
-    [[nodiscard]] constexpr const TScaleRow& ScaleRow() const {
+    [[nodiscard]] constexpr const CScaleRow& ScaleRow() const {
         return mScaleRow < 0 ? mCustomScaleData : mScaleData[static_cast<std::size_t>(mScaleRow)];
     }
     /// The row of a type; for `st_custom` the scale's own, for other types without a row major.
-    [[nodiscard]] const TScaleRow& ScaleDataFromType(TScaleType type) const;
+    [[nodiscard]] const CScaleRow& ScaleDataFromType(TScaleType type) const;
     /// The first type of the table whose steps are those of the own row; `st_custom` if none is.
     [[nodiscard]] TScaleType FindScaleTypeForCustomScale() const;
 
@@ -239,7 +239,7 @@ private:
     std::array<TEnh, 12> mEnhOfKeyNr{};
     /// Index of the row in use in mScaleData, or kOwnRow.
     std::int8_t mScaleRow = kEmptyRow;
-    TScaleRow mCustomScaleData = kCustomScaleRow;
+    CScaleRow mCustomScaleData = kCustomScaleRow;
 };
 
 static_assert(std::is_trivially_copyable_v<CScaleHeavy>);

@@ -24,17 +24,17 @@ constexpr auto kRowOfType = [] {
     return rows;
 }();
 
-const TScaleRow& RowOfType(TScaleType type) {
+const CScaleRow& RowOfType(TScaleType type) {
     return kScaleCatalogue[static_cast<std::size_t>(CScaleHeavy::ScaleIndexFromType(type))];
 }
 
-struct TLocalizationKey {
+struct CLocalizationKey {
     TScaleType mType;
     const char* mKey;
 };
 
 // clang-format off
-constexpr auto kLocalizationKeys = std::to_array<TLocalizationKey>({
+constexpr auto kLocalizationKeys = std::to_array<CLocalizationKey>({
     {st_maj,              "Major (Ionian)"},
     {st_min,              "Natural Minor (Aeolian)"},
     {st_chrom,            "Chromatic"},
@@ -111,12 +111,12 @@ std::optional<std::string> CScaleHeavy::LocalizedNameForScaleType(TScaleType typ
     return LocalizedString(row->mKey);
 }
 
-const TScaleRow& CScaleHeavy::ScaleDataFromType(TScaleType type) const {
+const CScaleRow& CScaleHeavy::ScaleDataFromType(TScaleType type) const {
     return type == st_custom ? mCustomScaleData : RowOfType(type);
 }
 
 TScaleType CScaleHeavy::FindScaleTypeForCustomScale() const {
-    const auto hasOwnSteps = [&own = mCustomScaleData](const TScaleRow& row) {
+    const auto hasOwnSteps = [&own = mCustomScaleData](const CScaleRow& row) {
         return row.mDegreesPerOctave == own.mDegreesPerOctave &&
                row.mDegreeToRootOffsetIntvl == own.mDegreeToRootOffsetIntvl;
     };

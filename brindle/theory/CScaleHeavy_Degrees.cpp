@@ -7,7 +7,7 @@
 namespace brindle {
 
 int CScaleHeavy::IntvlToDegreeNr(int intvl) const {
-    const TScaleRow& row = ScaleRow();
+    const CScaleRow& row = ScaleRow();
     for (int degree = 0; degree < row.StoredDegreeCount(); ++degree) {
         if (row.OffsetIntvl(degree) == intvl) return degree;
     }
@@ -16,7 +16,7 @@ int CScaleHeavy::IntvlToDegreeNr(int intvl) const {
 
 int CScaleHeavy::KeyNrToDegreeNr(int keyNr) const {
     if (IsUndef() || mScaleType == st_Undef) return -1;
-    const TScaleRow& row = ScaleRow();
+    const CScaleRow& row = ScaleRow();
     const int rootKeyNr = RootKeyNr();
     for (int degree = 0; degree < row.StoredDegreeCount(); ++degree) {
         if (FoldIntoOctave(std::int64_t{rootKeyNr} + row.OffsetIntvl(degree)) == keyNr) {
@@ -36,7 +36,7 @@ int CScaleHeavy::NoteToDegreeNr(const CNote& note) const {
 
 int CScaleHeavy::DegreeNrToKeyNr(int degree) const {
     const int rootKeyNr = RootKeyNr();
-    const TScaleRow& row = ScaleRow();
+    const CScaleRow& row = ScaleRow();
     if (IsUndef() || degree < 0 || row.mDegreesPerOctave <= 0) return rootKeyNr;
     return FoldIntoOctave(std::int64_t{rootKeyNr} +
                           row.OffsetIntvl(degree % row.mDegreesPerOctave));
@@ -61,7 +61,7 @@ CNote CScaleHeavy::DegreeNrToNote(int degree, int oct) const {
 }
 
 CIntvlSet CScaleHeavy::ToIntvlSet() const {
-    const TScaleRow& row = ScaleRow();
+    const CScaleRow& row = ScaleRow();
     const auto offsets = row.mDegreeToRootOffsetIntvl.begin();
     const CMySet<int> intvls(offsets, offsets + row.StoredDegreeCount());
     return CIntvlSet(intvls, 12);

@@ -21,9 +21,9 @@ std::int64_t FoldIntoKeyboard(std::int64_t noteNr) {
 }
 
 /// Walks semitone by semitone over the keys of a scale. At least one key must be in it.
-class TScaleWalk {
+class CScaleWalk {
 public:
-    TScaleWalk(CSemitones keys, int startKeyNr) : mKeys(keys), mStartKeyNr(startKeyNr) {}
+    CScaleWalk(CSemitones keys, int startKeyNr) : mKeys(keys), mStartKeyNr(startKeyNr) {}
 
     /// Semitones from the start, negative for down.
     [[nodiscard]] std::int64_t Walked() const { return mWalked; }
@@ -50,14 +50,14 @@ private:
 };
 
 /// A key beside the one that is quantized.
-struct TNeighbour {
+struct CNeighbour {
     int mKeyNr;
     int mDegree = -1;
     int mOctave = 0;
 };
 
 /// The nearer one; `isAboveAtTie` decides between equals.
-const TNeighbour& Nearer(const TNeighbour& below, const TNeighbour& above, int keyNr,
+const CNeighbour& Nearer(const CNeighbour& below, const CNeighbour& above, int keyNr,
                          bool isAboveAtTie) {
     if (below.mDegree < 0) return above;
     if (above.mDegree < 0) return below;
@@ -77,7 +77,7 @@ std::int64_t CScaleHeavy::MoveInScale(std::int64_t noteNr, int steps, bool fold)
 
     CSemitones keys = ToSemitones();
     keys.RotateRootToIx(-RootKeyNr());
-    TScaleWalk walk(keys, FoldIntoOctave(noteNr));
+    CScaleWalk walk(keys, FoldIntoOctave(noteNr));
     if (steps != 0) walk.GoIntoScale(steps > 0 ? -1 : 1);
     walk.GoDegrees(std::abs(steps % degrees), steps > 0 ? 1 : -1);
 
@@ -99,8 +99,8 @@ int CScaleHeavy::QuantizeToScaleDegreeNr(int keyNr, TQuantizeToScaleDirection di
                                          int& octave) const {
     octave = 0;
     if (IsUndef() || keyNr == kKeyNrUndef) return -1;
-    TNeighbour below{-1000};
-    TNeighbour above{1000};
+    CNeighbour below{-1000};
+    CNeighbour above{1000};
     for (int degree = 0; degree < ScaleRow().StoredDegreeCount(); ++degree) {
         const int degreeKeyNr = DegreeNrToKeyNr(degree);
         if (degreeKeyNr == keyNr) return degree;
@@ -111,7 +111,7 @@ int CScaleHeavy::QuantizeToScaleDegreeNr(int keyNr, TQuantizeToScaleDirection di
         }
     }
     const bool isAboveAtTie = direction == TQuantizeToScaleDirection_ClosestTieRight;
-    const TNeighbour& nearer = Nearer(below, above, keyNr, isAboveAtTie);
+    const CNeighbour& nearer = Nearer(below, above, keyNr, isAboveAtTie);
     octave = nearer.mOctave;
     return nearer.mDegree;
 }

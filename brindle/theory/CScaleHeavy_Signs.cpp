@@ -53,9 +53,9 @@ int CountSigns(const CKeyEnh& root, TScaleType type) {
 }
 
 /// The signs of every named scale on every root, spelled `TEnh_bbb` to `TEnh_Undef`.
-class TSignsOfScales {
+class CSignsOfScales {
 public:
-    TSignsOfScales() {
+    CSignsOfScales() {
         for (int type = 0; type < st_Count; ++type) {
             for (int root = 0; root < kRoots; ++root) {
                 mSigns[static_cast<std::size_t>(type * kRoots + root)] =
@@ -88,10 +88,10 @@ private:
 
 int CScaleHeavy::SignsCount() const {
     if (IsUndef()) return 0;
-    static const TSignsOfScales signs;
+    static const CSignsOfScales signs;
     const CKeyEnh root = RootKeyEnh();
     const TScaleType type = _SignsCount_NamedType();
-    return TSignsOfScales::Holds(root, type) ? signs.Of(root, type) : CountSigns(root, type);
+    return CSignsOfScales::Holds(root, type) ? signs.Of(root, type) : CountSigns(root, type);
 }
 
 int CScaleHeavy::SignsCountAbs() const {

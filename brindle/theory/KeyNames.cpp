@@ -20,7 +20,7 @@ namespace {
 using TStems = std::array<std::string_view, 12>;
 
 /// The stems of one way to name keys.
-struct TStemRows {
+struct CStemRows {
     TStems mFlatSide;
     TStems mSharpSide;
     TStems mPlain;
@@ -43,10 +43,10 @@ constexpr TStems RomanString2 = {
 constexpr TStems RomanString3 = {
     "Do", "Do", "Re", "Mi", "Mi", "Fa", "Fa", "Sol", "Sol", "La", "Ti", "Ti"};
 
-constexpr TStemRows kLetters = {OneEach("DDEEFGGAABBC"),
+constexpr CStemRows kLetters = {OneEach("DDEEFGGAABBC"),
                                 OneEach("BCCDDEFFGGAA"),
                                 OneEach("CCDEEFFGGABB")};
-constexpr TStemRows kSyllables = {RomanString1, RomanString2, RomanString3};
+constexpr CStemRows kSyllables = {RomanString1, RomanString2, RomanString3};
 
 // The flat side has one "b" on every key, and this is the second.
 constexpr std::string_view kSecondFlatSigns = "b b  b b b  ";
@@ -73,7 +73,7 @@ constexpr bool HasDoubleSharpOfItsOwn(std::size_t key) {
     return key == 6 || key == 1;  // Ex, Bx
 }
 
-std::string_view Stem(const TStemRows& rows, std::size_t key, TEnh enh) {
+std::string_view Stem(const CStemRows& rows, std::size_t key, TEnh enh) {
     switch (enh) {
         case TEnh_bb:
             return HasDoubleFlatOfItsOwn(key) ? rows.mPlain[(key + 2) % 12] : rows.mFlatSide[key];

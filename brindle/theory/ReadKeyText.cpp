@@ -11,14 +11,14 @@ namespace brindle {
 namespace {
 
 // The key at the start of a text, and where the word behind it begins.
-struct TTypedRoot {
+struct CTypedRoot {
     CKeyEnh mRoot;
     int mConsumed = 0;
     std::size_t mWord = 0;
 };
 
-TTypedRoot ReadRoot(const std::string& text) {
-    TTypedRoot root;
+CTypedRoot ReadRoot(const std::string& text) {
+    CTypedRoot root;
     root.mRoot.SetFromString(text, &root.mConsumed, ChordNamePrefsNonUTF8);
     root.mWord = std::min(text.find_first_not_of(' ', static_cast<std::size_t>(root.mConsumed)),
                           text.size());
@@ -34,7 +34,7 @@ bool IsReadToItsEnd(std::string_view text, int position) {
 
 CKeyText ReadKeyText(std::string_view typed) {
     const std::string text(typed);
-    const TTypedRoot root = ReadRoot(text);
+    const CTypedRoot root = ReadRoot(text);
     if (root.mRoot.IsUndef()) return {{}, "a key begins with a letter A to H, as in \"Bb minor\""};
     int position = root.mConsumed;
     const TSignKeyType type = _SignKeyTypeFromString(text, position);
@@ -46,7 +46,7 @@ CKeyText ReadKeyText(std::string_view typed) {
 
 CScaleText ReadScaleText(std::string_view typed) {
     const std::string text(typed);
-    const TTypedRoot root = ReadRoot(text);
+    const CTypedRoot root = ReadRoot(text);
     if (root.mRoot.IsUndef()) {
         return {{}, "a scale begins with a letter A to H, as in \"D dorian\""};
     }

@@ -23,7 +23,7 @@ enum TScaleMode : std::int32_t {
 };
 
 /// A scale without a root: which steps it has and how it is called.
-struct TScaleRow {
+struct CScaleRow {
     /// The key of the row.
     TScaleType mType = st_Undef;
     std::string_view mName;
@@ -55,7 +55,7 @@ struct TScaleRow {
 };
 
 /// One spelling in the table of scales that is not natural.
-struct TStepSpelling {
+struct CStepSpelling {
     std::size_t mStep;
     TEnh mEnh;
 };
@@ -64,14 +64,14 @@ struct TStepSpelling {
 void RowOfScaleTableIsWrong();
 
 /// A row of the table of scales. The degree count and the mask must be those of the offsets.
-consteval TScaleRow MakeScaleRow(TScaleType type, std::string_view name, int degrees,
+consteval CScaleRow MakeScaleRow(TScaleType type, std::string_view name, int degrees,
                                  TScaleMode mode, std::initializer_list<int> offsets,
                                  std::uint64_t mask,
-                                 std::initializer_list<TStepSpelling> spellings) {
-    TScaleRow row{type, name, degrees, {}, {}, mode};
+                                 std::initializer_list<CStepSpelling> spellings) {
+    CScaleRow row{type, name, degrees, {}, {}, mode};
     std::copy(offsets.begin(), offsets.end(), row.mDegreeToRootOffsetIntvl.begin());
     row.mDegreeEnh.fill(TEnh_n);
-    for (const TStepSpelling& spelling : spellings) row.mDegreeEnh[spelling.mStep] = spelling.mEnh;
+    for (const CStepSpelling& spelling : spellings) row.mDegreeEnh[spelling.mStep] = spelling.mEnh;
 
     const bool ascending = std::is_sorted(offsets.begin(), offsets.end());
     if (!ascending || row.Semitones() != CSemitones(mask) || CSemitones(mask).size() != degrees) {
@@ -83,7 +83,7 @@ consteval TScaleRow MakeScaleRow(TScaleType type, std::string_view name, int deg
 /// All named scales; the last row is the empty one of the undefined scale. The index of a row is
 /// its place here and not its type. Major + b7 and Bebop Dominant have the same tones.
 // clang-format off
-inline constexpr std::array<TScaleRow, 30> kScaleCatalogue{{
+inline constexpr std::array<CScaleRow, 30> kScaleCatalogue{{
     //            type                 name                  degrees  mode              offsets                                  mask  spellings
     MakeScaleRow(st_maj,              "Major",                     7, TScaleMode_Major, {0, 2, 4, 5, 7, 9, 11},                  2741, {}),
     MakeScaleRow(st_min,              "Natural Minor",             7, TScaleMode_Minor, {0, 2, 3, 5, 7, 8, 10},                  1453, {}),
@@ -114,12 +114,12 @@ inline constexpr std::array<TScaleRow, 30> kScaleCatalogue{{
     MakeScaleRow(BebopMelodicMinor,   "Bebop Melodic Minor",       8, TScaleMode_Minor, {0, 2, 3, 5, 7, 8, 9, 11},               2989, {{6, TEnh_s}, {7, TEnh_s}}),
     MakeScaleRow(BebopHarmonicMinor,  "Bebop Harmonic Minor",      8, TScaleMode_Minor, {0, 2, 3, 5, 7, 8, 10, 11},              3501, {{7, TEnh_s}}),
     MakeScaleRow(DoubleHarmonic,      "Double Harmonic/Byzantine", 7, TScaleMode_None,  {0, 1, 4, 5, 7, 8, 11},                  2483, {{1, TEnh_b}, {5, TEnh_b}}),
-    TScaleRow{},
+    CScaleRow{},
 }};
 // clang-format on
 
 /// What a custom scale starts from.
-inline constexpr TScaleRow kCustomScaleRow = MakeScaleRow(
+inline constexpr CScaleRow kCustomScaleRow = MakeScaleRow(
     st_custom, "Custom", 12, TScaleMode_Custom, {0, 1, 2, 3, 4, 5, 6, 7, 8, 9, 10, 11}, 4095, {});
 
 }  // namespace brindle

@@ -9,14 +9,14 @@ namespace brindle {
 
 namespace {
 
-struct TScaleMask {
+struct CScaleMask {
     TScaleType mType;
     CSemitones mSemitones;
 };
 
 // The mask of each scale type, 1 to 30.
 // clang-format off
-constexpr auto kScaleMasks = std::to_array<TScaleMask>({
+constexpr auto kScaleMasks = std::to_array<CScaleMask>({
     {st_maj,              CSemitones(2741)},  // 0 2 4 5 7 9 11
     {st_min,              CSemitones(1453)},  // 0 2 3 5 7 8 10
     {st_chrom,            CSemitones(4095)},  // all twelve
@@ -69,7 +69,7 @@ TScaleType ScaleTypeFromSemitones(CSemitones semitones) {
     if (semitones.IsEmpty()) return st_Undef;
     const auto row = std::find_if(
         kScaleMasks.begin(), kScaleMasks.end(),
-        [semitones](const TScaleMask& entry) { return entry.mSemitones == semitones; });
+        [semitones](const CScaleMask& entry) { return entry.mSemitones == semitones; });
     return row == kScaleMasks.end() ? st_custom : row->mType;
 }
 

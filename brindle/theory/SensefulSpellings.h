@@ -10,7 +10,7 @@
 namespace brindle {
 
 /// The spellings by which some keys can be written down, each with a letter of its own.
-struct TSensefulSpellings {
+struct CSensefulSpellings {
     std::uint32_t mKeyNrs;  ///< bit k: key k
     std::uint32_t mEnhs;    ///< bit n: the spelling of value n - 1
 };
@@ -19,13 +19,13 @@ template <class... TKeyNr>
 consteval std::uint32_t KeyNrBits(TKeyNr... keyNrs) {
     return ((1U << keyNrs) | ...);
 }
-template <class... TSpelling>
-consteval std::uint32_t EnhBits(TSpelling... enhs) {
+template <class... CSpelling>
+consteval std::uint32_t EnhBits(CSpelling... enhs) {
     return ((1U << (enhs - TEnh_bbb)) | ...);
 }
 
 // clang-format off
-inline constexpr auto kSensefulSpellings = std::to_array<TSensefulSpellings>({
+inline constexpr auto kSensefulSpellings = std::to_array<CSensefulSpellings>({
     {KeyNrBits(0, 5),  EnhBits(TEnh_bb, TEnh_n, TEnh_s, TEnh_sss)},
     {KeyNrBits(1, 6),  EnhBits(TEnh_bbb, TEnh_b, TEnh_s, TEnh_ss)},
     {KeyNrBits(2),     EnhBits(TEnh_bbb, TEnh_bb, TEnh_n, TEnh_ss, TEnh_sss)},
@@ -41,7 +41,7 @@ inline constexpr auto kSensefulSpellings = std::to_array<TSensefulSpellings>({
 inline constexpr std::array<std::uint32_t, 12> kSensefulEnhsOfKeyNr = [] {
     std::array<std::uint32_t, 12> enhs{};
     for (std::size_t keyNr = 0; keyNr < enhs.size(); ++keyNr) {
-        for (const TSensefulSpellings& row : kSensefulSpellings) {
+        for (const CSensefulSpellings& row : kSensefulSpellings) {
             if ((row.mKeyNrs >> keyNr & 1U) != 0) enhs[keyNr] |= row.mEnhs;
         }
     }

@@ -50,8 +50,8 @@ void SkipLeadingBlanks(std::string_view text, int& pos);
                                                         std::string_view text, int pos);
 
 /// Whether the keywords keep the three rules of a list.
-template <class TKeywords>
-[[nodiscard]] constexpr bool AreNotEmptyAndSortedBySizeAndLowerCase(const TKeywords& keywords) {
+template <class CKeywords>
+[[nodiscard]] constexpr bool AreNotEmptyAndSortedBySizeAndLowerCase(const CKeywords& keywords) {
     for (auto later = keywords.begin(); later != keywords.end(); ++later) {
         const std::string_view keyword = *later;
         if (keyword.empty()) return false;
@@ -66,17 +66,17 @@ template <class TKeywords>
 }
 
 /// Stops a debug build when the keywords break a rule; does nothing in a release build.
-template <class TKeywords>
+template <class CKeywords>
 constexpr void _AssertStringsAreNotEmptyAndSortedBySizeAndLowerCase(
-    [[maybe_unused]] const TKeywords& keywords) {
+    [[maybe_unused]] const CKeywords& keywords) {
     assert(AreNotEmptyAndSortedBySizeAndLowerCase(keywords));
 }
 
 /// The first keyword that matches the lower-case `text` at `pos`: whether there is one, and its
 /// length. Blanks within a keyword are matched literally. A position outside the text matches
 /// nothing.
-template <class TKeywords>
-[[nodiscard]] std::pair<bool, int> CompareLowercaseStrs(TSpaces spaces, const TKeywords& keywords,
+template <class CKeywords>
+[[nodiscard]] std::pair<bool, int> CompareLowercaseStrs(TSpaces spaces, const CKeywords& keywords,
                                                         std::string_view text, int pos) {
     const std::string_view remainder = RemainderFrom(text, pos);
     for (const std::string_view keyword : keywords) {
@@ -91,8 +91,8 @@ template <class TKeywords>
 }
 
 /// The same; on a match moves `pos` behind the keyword.
-template <class TKeywords>
-bool CompareLowercaseStrsAndOnMatchAdvanceStringPos(TSpaces spaces, const TKeywords& keywords,
+template <class CKeywords>
+bool CompareLowercaseStrsAndOnMatchAdvanceStringPos(TSpaces spaces, const CKeywords& keywords,
                                                     std::string_view text, int& pos) {
     const auto [matches, length] = CompareLowercaseStrs(spaces, keywords, text, pos);
     pos += length;
@@ -100,8 +100,8 @@ bool CompareLowercaseStrsAndOnMatchAdvanceStringPos(TSpaces spaces, const TKeywo
 }
 
 /// Whether a keyword matches a lower-case copy of `text` from its start.
-template <class TKeywords>
-[[nodiscard]] bool CompareStrs(TSpaces spaces, const TKeywords& keywords, std::string_view text) {
+template <class CKeywords>
+[[nodiscard]] bool CompareStrs(TSpaces spaces, const CKeywords& keywords, std::string_view text) {
     return CompareLowercaseStrs(spaces, keywords, ToLowercase(text), 0).first;
 }
 

@@ -8,14 +8,14 @@ namespace brindle {
 
 namespace {
 
-struct TWord {
+struct CWord {
     TEnh mEnh;
     std::string_view mWord;
     std::string_view mEnumerator;
 };
 
 // clang-format off
-constexpr auto kWords = std::to_array<TWord>({
+constexpr auto kWords = std::to_array<CWord>({
     {TEnh_bbb,   "triple flat",  "TEnh_bbb"},
     {TEnh_bb,    "double flat",  "TEnh_bb"},
     {TEnh_b,     "flat",         "TEnh_b"},
@@ -30,7 +30,7 @@ constexpr auto kWords = std::to_array<TWord>({
 }  // namespace
 
 TEnh EnhFromStdString(std::string_view word) {
-    for (const TWord& row : kWords) {
+    for (const CWord& row : kWords) {
         if (row.mWord == word) return row.mEnh;
     }
     return TEnh_Undef;
@@ -41,14 +41,14 @@ TEnh EnhFromString(const char* word) {
 }
 
 std::string StringForInitializerList(TEnh enh) {
-    for (const TWord& row : kWords) {
+    for (const CWord& row : kWords) {
         if (row.mEnh == enh) return std::string(row.mEnumerator);
     }
     return "TEnh(" + std::to_string(static_cast<int>(enh)) + ")";
 }
 
 std::ostream& operator<<(std::ostream& stream, TEnh enh) {
-    for (const TWord& row : kWords) {
+    for (const CWord& row : kWords) {
         if (row.mEnh == enh) return stream << row.mWord;
     }
     return stream << "unknown TEnh " + std::to_string(static_cast<int>(enh));

@@ -8,14 +8,14 @@ namespace brindle {
 
 namespace {
 
-struct TWords {
+struct CWords {
     TScaleType mType;
     std::string_view mTraceWord;
     std::string_view mJSONWord;
 };
 
 // clang-format off
-constexpr auto kWords = std::to_array<TWords>({
+constexpr auto kWords = std::to_array<CWords>({
     // type              trace word             JSON word
     {st_Undef,            "st_Undef",            "Undef"},
     {st_maj,              "st_maj",              "maj"},
@@ -61,7 +61,7 @@ constexpr bool EachRowIsAtItsType() {
 }
 static_assert(EachRowIsAtItsType());
 
-const TWords* WordsOf(TScaleType type) {
+const CWords* WordsOf(TScaleType type) {
     const auto ix = static_cast<std::uint32_t>(type);
     return ix < kWords.size() ? &kWords[ix] : nullptr;
 }
@@ -74,12 +74,12 @@ TScaleType Stepped(TScaleType type, std::uint32_t step) {
 }  // namespace
 
 std::string_view ToJSONString(TScaleType type) {
-    const TWords* words = WordsOf(type);
+    const CWords* words = WordsOf(type);
     return words == nullptr ? "undef" : words->mJSONWord;
 }
 
 TScaleType ScaleTypeFromJSONString(std::string_view word) {
-    for (const TWords& words : kWords) {
+    for (const CWords& words : kWords) {
         if (words.mType > st_custom) break;
         if (words.mJSONWord == word) return words.mType;
     }
@@ -107,7 +107,7 @@ TScaleType operator--(TScaleType& type, int) {
 }
 
 std::ostream& operator<<(std::ostream& stream, TScaleType type) {
-    const TWords* words = WordsOf(type);
+    const CWords* words = WordsOf(type);
     return stream << (words == nullptr ? "undef" : words->mTraceWord);
 }
 

@@ -11,14 +11,14 @@ namespace brindle {
 
 namespace {
 
-struct TScaleColour {
+struct CScaleColour {
     TScaleType mScaleType;
     TSignKeyType mSignKeyType;
 };
 
 // The key signature under which a scale is written.
 // clang-format off
-constexpr auto kScaleColours = std::to_array<TScaleColour>({
+constexpr auto kScaleColours = std::to_array<CScaleColour>({
     {st_min,             TSignKeyType_Minor},
     {st_chrom,           TSignKeyType_Major},
     {st_majmin,          TSignKeyType_Major},

@@ -27,19 +27,19 @@ TEST_CASE("A vector is read from digits, from a JSON list and from the JSON text
     for (char& c : lines) c = c == ' ' ? '\n' : c;
     for (const std::string& text : {kCOverE, lines, " ,\t" + list + "]", json.str()}) {
         CAPTURE(text);
-        const TChordVectorText read = ReadChordVector(text);
+        const CChordVectorText read = ReadChordVector(text);
         CHECK(read.mError.empty());
         CHECK(read.mVector == vector);
     }
 }
 
 TEST_CASE("A text that is no vector tells what is wrong, and where") {
-    struct TCase {
+    struct CCase {
         std::string mText;
         const char* mError;
         std::size_t mColumn;
     };
-    const TCase cases[] = {
+    const CCase cases[] = {
         {"", "a vector has 46 places, here are 0", 0},
         {kCOverE + "1", "a vector has 46 places, here are 47", 0},
         {"000 12", "a place of a vector is 0 or 1", 5},
@@ -51,7 +51,7 @@ TEST_CASE("A text that is no vector tells what is wrong, and where") {
     };
     for (const auto& [text, error, column] : cases) {
         CAPTURE(text);
-        const TChordVectorText read = ReadChordVector(text);
+        const CChordVectorText read = ReadChordVector(text);
         CHECK(read.mVector.empty());
         CHECK(read.mError == error);
         CHECK(read.mColumn == column);

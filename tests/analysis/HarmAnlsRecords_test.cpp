@@ -115,13 +115,13 @@ TEST_CASE("The function of a chord is its distance above the center, and nothing
 }
 
 TEST_CASE("An undefined center takes key and mode from its sign key, and the other way round") {
-    struct TCase {
+    struct CCase {
         TSignKeyType mType;
         CSemitones mMask;
     };
     for (const auto& [type, mask] :
-         {TCase{TSignKeyType_Major, kSemitonesMajor},
-          TCase{TSignKeyType_Minor, kSemitonesNaturalMinor}, TCase{TSignKeyType_Undef, {}}}) {
+         {CCase{TSignKeyType_Major, kSemitonesMajor},
+          CCase{TSignKeyType_Minor, kSemitonesNaturalMinor}, CCase{TSignKeyType_Undef, {}}}) {
         CHarmAnlsSignKey signKey;
         signKey.mSignKey = {kDFlat, type};
         signKey.mPosition = 2.0;

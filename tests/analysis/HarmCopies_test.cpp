@@ -88,12 +88,12 @@ TEST_CASE("Repeated passages of a chord text are found with their places") {
 }
 
 TEST_CASE("A passage is repeated when chords, bass, spelling and lengths agree") {
-    struct TCase {
+    struct CCase {
         const char* mText;
         double mBeatsPerChord;
         json mCopies;
     };
-    const TCase cases[] = {
+    const CCase cases[] = {
         {"C F C", 4.0, json::array()},
         {"C F C F", 2.0, {{4.0, -1, 1, 0}}},
         {"C F C . F", 2.0, json::array()},

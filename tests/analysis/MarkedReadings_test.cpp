@@ -16,7 +16,7 @@ namespace {
 
 /// A chord as the teacher reads it: "V7/ii|V7/II~dominant>5", behind "C:" or "c:" where the key
 /// changes. What is left out does not matter.
-struct TMark {
+struct CMark {
     std::string mKey;
     std::vector<std::string> mNumerals;
     std::string mRelation;
@@ -33,8 +33,8 @@ std::string CutBehind(std::string& word, char sign) {
     return behind;
 }
 
-std::vector<TMark> MarksOf(const std::string& text) {
-    std::vector<TMark> marks;
+std::vector<CMark> MarksOf(const std::string& text) {
+    std::vector<CMark> marks;
     std::istringstream words(text);
     std::string key;
     for (std::string word; words >> word;) {
@@ -42,7 +42,7 @@ std::vector<TMark> MarksOf(const std::string& text) {
             key = word.substr(0, word.size() - 1);
             continue;
         }
-        TMark mark;
+        CMark mark;
         mark.mKey = key;
         mark.mResolvesTo = CutBehind(word, '>');
         mark.mIsDeceptive = word.back() == '!';
@@ -58,12 +58,12 @@ std::vector<TMark> MarksOf(const std::string& text) {
 }
 
 /// What the reading says of one chord, its resolution counted in chords that differ.
-struct TRead {
+struct CRead {
     const CChordReading& mChord;
     std::string mResolvesTo;
 };
 
-std::vector<TRead> DifferentChords(const CHarmAnlsChords& chords, const CSongReading& reading) {
+std::vector<CRead> DifferentChords(const CHarmAnlsChords& chords, const CSongReading& reading) {
     std::vector<std::size_t> numbers(chords.size());
     std::vector<std::size_t> places;
     for (std::size_t i = 0; i + 1 < chords.size(); ++i) {
@@ -71,7 +71,7 @@ std::vector<TRead> DifferentChords(const CHarmAnlsChords& chords, const CSongRea
         numbers[i] = places.size();
         if (!isSame) places.push_back(i);
     }
-    std::vector<TRead> read;
+    std::vector<CRead> read;
     for (const std::size_t place : places) {
         const CChordReading& chord = reading.mChords[place];
         std::string to;
@@ -84,7 +84,7 @@ std::vector<TRead> DifferentChords(const CHarmAnlsChords& chords, const CSongRea
 }
 
 /// Counts marks that agree, and tells the others.
-struct TScore {
+struct CScore {
     int mAgreed = 0;
     int mMarks = 0;
     std::string mMisses;
@@ -96,7 +96,7 @@ struct TScore {
     }
 };
 
-void Compare(const TMark& mark, const TRead& read, std::size_t ix, TScore& score) {
+void Compare(const CMark& mark, const CRead& read, std::size_t ix, CScore& score) {
     const CChordReading& chord = read.mChord;
     score.Add(ShortKey(chord.mKey) == mark.mKey, ix, ShortKey(chord.mKey));
     const auto& numerals = mark.mNumerals;
@@ -110,7 +110,7 @@ void Compare(const TMark& mark, const TRead& read, std::size_t ix, TScore& score
     if (mark.mIsDeceptive) score.Add(chord.mDeceptive, ix, "not deceptive");
 }
 
-struct TShare {
+struct CShare {
     std::string_view mName;
     int mAgreed;
     int mMarks;
@@ -119,7 +119,7 @@ struct TShare {
 };
 
 // clang-format off
-constexpr auto kShares = std::to_array<TShare>({
+constexpr auto kShares = std::to_array<CShare>({
     {"basic blues",            29, 29, ""},
     {"jazz blues",             53, 53, ""},
     {"minor blues",            28, 28, ""},
@@ -167,10 +167,10 @@ TEST_CASE("Well-known progressions are read as a teacher marks them") {
         INFO(name);
         const CHarmAnlsChords chords = BarsOf(text);
         const CSongReading reading = ReadHarmony(chords);
-        const std::vector<TMark> wanted = MarksOf(marked);
-        const std::vector<TRead> read = DifferentChords(chords, reading);
+        const std::vector<CMark> wanted = MarksOf(marked);
+        const std::vector<CRead> read = DifferentChords(chords, reading);
         REQUIRE(read.size() == wanted.size());
-        TScore score;
+        CScore score;
         for (std::size_t i = 0; i < read.size(); ++i) Compare(wanted[i], read[i], i, score);
         REQUIRE(row < kShares.size());
         CHECK(name == kShares[row].mName);

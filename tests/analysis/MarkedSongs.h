@@ -7,7 +7,7 @@
 namespace brindle::test {
 
 /// A progression whose keys a musician marked by ear and score.
-struct TMarkedSong {
+struct CMarkedSong {
     std::string_view mName;
     /// The key of the whole.
     std::string_view mKey;
@@ -23,7 +23,7 @@ struct TMarkedSong {
 // a key of its own belongs to the key around it, and a minor second degree before the dominant of a
 // new key belongs to the new key.
 // clang-format off
-inline constexpr auto kMarkedSongs = std::to_array<TMarkedSong>({
+inline constexpr auto kMarkedSongs = std::to_array<CMarkedSong>({
     // Blues
     {"Twelve-bar blues", "C Major",
      "[C Major] C7 | F7 | C7 | C7 | F7 | F7 | C7 | C7 | G7 | F7 | C7 | G7 ."},

@@ -13,9 +13,9 @@
 namespace brindle::test {
 namespace {
 
-constexpr TNumeralOptions kSigns{};
-constexpr TNumeralOptions kFigures{.mFigures = true};
-constexpr TNumeralOptions kByKey{.mFigures = true, .mByKey = true};
+constexpr CNumeralOptions kSigns{};
+constexpr CNumeralOptions kFigures{.mFigures = true};
+constexpr CNumeralOptions kByKey{.mFigures = true, .mByKey = true};
 
 CSignKeyLite Key(std::string_view name) {
     return CSignKeyLite(name);
@@ -28,15 +28,15 @@ CChordLite Chord(std::string_view symbol) {
     return reading.mChord;
 }
 
-struct TFormCase {
+struct CFormCase {
     std::string_view mKey;
     std::string_view mNumeral;
     std::string_view mChord;
-    TNumeralOptions mOptions = kFigures;
+    CNumeralOptions mOptions = kFigures;
 };
 
 // clang-format off
-constexpr auto kForms = std::to_array<TFormCase>({
+constexpr auto kForms = std::to_array<CFormCase>({
     // Figures, together and with slashes
     {"C major", "I6",         "C/E"},
     {"C major", "I6",         "C6",       kSigns},
@@ -165,7 +165,7 @@ constexpr auto kForms = std::to_array<TFormCase>({
 // clang-format on
 
 TEST_CASE("Numerals are read in all the ways that people write them") {
-    for (const TFormCase& row : kForms) {
+    for (const CFormCase& row : kForms) {
         INFO(std::string(row.mKey) << ": " << std::string(row.mNumeral));
         const CNumeralReading reading = ReadNumeral(row.mNumeral, Key(row.mKey), row.mOptions);
         CHECK(reading.mFault == "");
@@ -177,7 +177,7 @@ TEST_CASE("Numerals are read in all the ways that people write them") {
     }
 }
 
-struct TSignCase {
+struct CSignCase {
     std::string_view mSign;
     CSemitones mLarge;  ///< empty where only small numerals have the sign
     CSemitones mSmall;
@@ -185,7 +185,7 @@ struct TSignCase {
 
 // The signs of an analysis that takes chords for a few kinds.
 // clang-format off
-constexpr auto kSignsOfKinds = std::to_array<TSignCase>({
+constexpr auto kSignsOfKinds = std::to_array<CSignCase>({
     {"",     {0, 4, 7},     {0, 3, 7}},
     {"6",    {0, 4, 7, 9},  {0, 3, 7, 9}},
     {"7",    {0, 4, 7, 10}, {0, 3, 7, 10}},
@@ -232,7 +232,7 @@ TEST_CASE("Each sign on each degree is read as that kind of chord") {
         for (int root = 0; root < 12; ++root) {
             const auto ix = static_cast<std::size_t>(root);
             const std::string degree(isMinor ? kMinorNames[ix] : kMajorNames[ix]);
-            for (const TSignCase& sign : kSignsOfKinds) {
+            for (const CSignCase& sign : kSignsOfKinds) {
                 const std::string text(sign.mSign);
                 CheckRead(degree + text, key, root, sign.mLarge);
                 // The leading tone needs no sharp where the chord tells it.
@@ -243,14 +243,14 @@ TEST_CASE("Each sign on each degree is read as that kind of chord") {
     }
 }
 
-struct TAppliedCase {
+struct CAppliedCase {
     std::string_view mNumeral;
     int mRoot;  ///< in semitones above the target
     CSemitones mTones;
 };
 
 TEST_CASE("What is applied to a degree counts from it") {
-    constexpr auto cases = std::to_array<TAppliedCase>({
+    constexpr auto cases = std::to_array<CAppliedCase>({
         {"V", 7, {0, 4, 7}},
         {"V7", 7, {0, 4, 7, 10}},
         {"V+7", 7, {0, 4, 8, 10}},
@@ -268,7 +268,7 @@ TEST_CASE("What is applied to a degree counts from it") {
         for (int target = 0; target < 12; ++target) {
             const auto ix = static_cast<std::size_t>(target);
             const std::string degree(isMinor ? kMinorNames[ix] : kMajorNames[ix]);
-            for (const TAppliedCase& row : cases) {
+            for (const CAppliedCase& row : cases) {
                 const std::string numeral = std::string(row.mNumeral) + "/";
                 CheckRead(numeral + degree, key, (row.mRoot + target) % 12, row.mTones);
                 CheckRead(numeral + Small(degree), key, (row.mRoot + target) % 12, row.mTones);
@@ -278,12 +278,12 @@ TEST_CASE("What is applied to a degree counts from it") {
 }
 
 TEST_CASE("A suspension with its resolution is the suspension above the root") {
-    struct TCase {
+    struct CCase {
         std::string_view mKey;
         std::string_view mNumeral;
         CSemitones mTones;
     };
-    constexpr auto cases = std::to_array<TCase>({
+    constexpr auto cases = std::to_array<CCase>({
         {"C major", "V6-5", {0, 4, 9}},
         {"C major", "V64-53", {0, 5, 9}},
         {"A minor", "V64-53", {0, 5, 8}},
@@ -293,8 +293,8 @@ TEST_CASE("A suspension with its resolution is the suspension above the root") {
         {"C major", "V54-3", {0, 5, 7}},
         {"C major", "V74-3", {0, 5, 7, 10}},
     });
-    for (const TCase& row : cases) {
-        for (const TNumeralOptions& options : {kSigns, kFigures, kByKey}) {
+    for (const CCase& row : cases) {
+        for (const CNumeralOptions& options : {kSigns, kFigures, kByKey}) {
             INFO(std::string(row.mNumeral));
             const CNumeralReading reading = ReadNumeral(row.mNumeral, Key(row.mKey), options);
             CHECK(reading.mChord.mSemitones == row.mTones);
@@ -303,7 +303,7 @@ TEST_CASE("A suspension with its resolution is the suspension above the root") {
     }
 }
 
-struct TFaultCase {
+struct CFaultCase {
     std::string_view mText;
     std::string_view mFault;
     std::size_t mOffset;
@@ -314,7 +314,7 @@ TEST_CASE("A fault tells what is wrong and where") {
     constexpr std::string_view noSign = "this sign behind the degree is not understood";
     constexpr std::string_view noTarget = "a degree or a bass is expected behind the slash";
     constexpr std::string_view noGroup = "what stands in brackets is not understood";
-    constexpr auto cases = std::to_array<TFaultCase>({
+    constexpr auto cases = std::to_array<CFaultCase>({
         {"X7", noDegree, 0},
         {"", noDegree, 0},
         {"V77", noSign, 1},
@@ -326,7 +326,7 @@ TEST_CASE("A fault tells what is wrong and where") {
         {"V[no3", noGroup, 1},
         {"I[no1no3no5]", "nothing is left of the chord", 0},
     });
-    for (const TFaultCase& row : cases) {
+    for (const CFaultCase& row : cases) {
         INFO(std::string(row.mText));
         const CNumeralReading reading = ReadNumeral(row.mText, Key("C major"));
         CHECK(reading.mChord.IsUndef());

@@ -22,7 +22,7 @@ bool LessByFunctionLengthAndRoot(const CHarmAnlsChordWithLength& a,
     return key(a) < key(b);
 }
 
-struct TLessByChords {
+struct CLessByChords {
     bool operator()(const CHarmAnlsChordsWithLength& a, const CHarmAnlsChordsWithLength& b) const {
         return std::lexicographical_compare(a.begin(), a.end(), b.begin(), b.end(),
                                             LessByFunctionLengthAndRoot);
@@ -109,7 +109,7 @@ CHarmAnlsChordsWithLength PlainChordsWithLength(const CHarmAnlsChords& chords) {
 }
 
 TPlainSequences PlainSequences(const CHarmAnlsChordsWithLength& chords) {
-    std::map<CHarmAnlsChordsWithLength, TIndices, TLessByChords> map;
+    std::map<CHarmAnlsChordsWithLength, TIndices, CLessByChords> map;
     for (std::size_t s = 0; s < chords.size(); ++s) {
         for (const std::uint64_t j : RecurringIndices(chords, s)) {
             const CHarmAnlsChordsWithLength sequence = Grown(chords, s, j);

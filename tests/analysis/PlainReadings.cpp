@@ -9,7 +9,7 @@ namespace brindle::test {
 namespace {
 
 /// A reading of one center over the chords from `begin` to before `end`.
-struct TReading {
+struct CReading {
     double probability;
     CHarmCenterLite center;
     std::size_t begin;
@@ -17,18 +17,18 @@ struct TReading {
 
     std::size_t Count() const { return end - begin; }
     bool HasInside(std::size_t place) const { return begin <= place && place <= end; }
-    bool IsLongerAndContains(const TReading& other) const {
+    bool IsLongerAndContains(const CReading& other) const {
         return Count() > other.Count() && HasInside(other.begin) && HasInside(other.end);
     }
-    bool IsSimultaneousWith(const TReading& other) const {
+    bool IsSimultaneousWith(const CReading& other) const {
         return begin == other.begin && end == other.end;
     }
-    bool IsEqualTo(const TReading& other) const {
+    bool IsEqualTo(const CReading& other) const {
         return IsSimultaneousWith(other) && center == other.center;
     }
 };
 
-using TReadings = std::vector<TReading>;
+using TReadings = std::vector<CReading>;
 
 void Erase(TReadings& readings, std::size_t place) {
     readings.erase(readings.begin() + static_cast<std::ptrdiff_t>(place));
@@ -49,7 +49,7 @@ TReadings ReadSeveralChords(const CHarmAnlsChords& chords) {
         const auto best =
             table.FindAndSortForwardMatchingProgressions(it, chords).GetBestMatchingProgressions();
         for (const auto& row : best) {
-            TReading reading{
+            CReading reading{
                 1.0 / static_cast<double>(best.size()),
                 row.HarmCenterCalculatedFromFoundProgressionNthChord(row.size() - 1, it, chords), n,
                 n + row.size()};
@@ -69,13 +69,13 @@ TReadings ReadSeveralChords(const CHarmAnlsChords& chords) {
 
 void RecalculateProbabilities(TReadings& readings) {
     for (std::size_t a = 0; a < readings.size(); ++a) {
-        std::vector<TReading*> partners;
+        std::vector<CReading*> partners;
         for (std::size_t b = 0; b < readings.size(); ++b) {
             if (a != b && readings[b].IsSimultaneousWith(readings[a])) {
                 partners.push_back(&readings[b]);
             }
         }
-        for (TReading* partner : partners) {
+        for (CReading* partner : partners) {
             partner->probability = 1.0 / (static_cast<double>(partners.size()) + 1.0);
         }
     }
@@ -125,7 +125,7 @@ void RemoveNonSure(TReadings& readings) {
     }
 }
 
-CHarmAnlsCenter CenterOf(const TReading& reading, const CHarmAnlsChords& chords) {
+CHarmAnlsCenter CenterOf(const CReading& reading, const CHarmAnlsChords& chords) {
     CHarmAnlsCenter center;
     center.mProbability = reading.probability;
     if (reading.center.mRootKeyEnh.mKeyNr == 15) return center;
@@ -144,7 +144,7 @@ CHarmAnlsCenters PlainBestResults(const CHarmAnlsChords& chords) {
     Deduplicate(readings);
     RemoveNonSure(readings);
     CHarmAnlsCenters centers;
-    for (const TReading& reading : readings) centers.push_back(CenterOf(reading, chords));
+    for (const CReading& reading : readings) centers.push_back(CenterOf(reading, chords));
     return centers;
 }
 

@@ -23,17 +23,17 @@ constexpr std::array kQualities = {
 constexpr std::array kNoChords = {"?"sv,    "nochord"sv, "nochordforce"sv, "undef"sv,
                                   "maj7"sv, "X"sv,       "X7"sv,           "/E"sv};
 
-struct TDegree {
+struct CDegree {
     std::size_t mIntvl;
     std::string_view mQuality;
 };
-constexpr std::array kMajorDegrees = {TDegree{0, ""},  TDegree{2, "m7"},    TDegree{4, "m"},
-                                      TDegree{5, ""},  TDegree{7, "7"},     TDegree{7, ""},
-                                      TDegree{9, "m"}, TDegree{11, "m7b5"}, TDegree{3, ""},
-                                      TDegree{10, ""}, TDegree{5, "m"}};
-constexpr std::array kMinorDegrees = {TDegree{0, "m"}, TDegree{2, "m7b5"}, TDegree{3, ""},
-                                      TDegree{5, "m"}, TDegree{7, "7"},    TDegree{7, "m"},
-                                      TDegree{8, ""},  TDegree{10, "7"}};
+constexpr std::array kMajorDegrees = {CDegree{0, ""},  CDegree{2, "m7"},    CDegree{4, "m"},
+                                      CDegree{5, ""},  CDegree{7, "7"},     CDegree{7, ""},
+                                      CDegree{9, "m"}, CDegree{11, "m7b5"}, CDegree{3, ""},
+                                      CDegree{10, ""}, CDegree{5, "m"}};
+constexpr std::array kMinorDegrees = {CDegree{0, "m"}, CDegree{2, "m7b5"}, CDegree{3, ""},
+                                      CDegree{5, "m"}, CDegree{7, "7"},    CDegree{7, "m"},
+                                      CDegree{8, ""},  CDegree{10, "7"}};
 
 std::string Symbol(CChance& chance, std::size_t keyNr, std::string_view quality) {
     const auto& roots = chance.OneIn(12) ? kOtherRoots : kRoots;
@@ -51,8 +51,8 @@ void AddDiatonicChords(CChance& chance, std::vector<std::string>& symbols) {
     const std::size_t key = chance.Below(12);
     const bool isMinor = chance.OneIn(3);
     for (std::size_t count = 1 + chance.Below(10); count > 0; --count) {
-        const TDegree& degree =
-            isMinor ? chance.Of<TDegree>(kMinorDegrees) : chance.Of<TDegree>(kMajorDegrees);
+        const CDegree& degree =
+            isMinor ? chance.Of<CDegree>(kMinorDegrees) : chance.Of<CDegree>(kMajorDegrees);
         symbols.push_back(Symbol(chance, key + degree.mIntvl, degree.mQuality));
     }
 }

@@ -60,12 +60,12 @@ CChordReading Moved(CChordReading reading, int up) {
 
 // docs/reading.md has these.
 TEST_CASE("Each relation is told from its neighbours") {
-    struct TCase {
+    struct CCase {
         const char* mText;
         std::size_t mIx;
         const char* mRead;
     };
-    constexpr auto cases = std::to_array<TCase>({
+    constexpr auto cases = std::to_array<CCase>({
         {"C | F | G7 | C", 2, "V7 D dominant 3"},
         {"C | A7 | Dm7 G7 | C", 1, "V7/ii D dominant 2"},
         {"C | F | C/G G7 | C", 2, "I D dominant 3"},
@@ -88,7 +88,7 @@ TEST_CASE("Each relation is told from its neighbours") {
         {"Am | Am^7 | Am7 | Am6 | Dm | E7 | Am", 1, "i^7 T line cliche -1"},
         {"C | F | G7 | Am | F | G7 | C", 2, "V7 D dominant! 3"},
     });
-    for (const TCase& row : cases) {
+    for (const CCase& row : cases) {
         INFO(row.mText);
         const CSongReading song = ReadHarmony(BarsOf(row.mText));
         const CChordReading& chord = song.mChords[row.mIx];
@@ -218,12 +218,12 @@ TEST_CASE("Of two keys with equal scores the lower one is that of the song") {
 }
 
 TEST_CASE("The letters of a seventh tell an augmented sixth") {
-    struct TCase {
+    struct CCase {
         CKeyEnh mRoot;
         CKeyEnh mSeventh;
         TSeventhSpelling mSpelling;
     };
-    constexpr auto cases = std::to_array<TCase>({
+    constexpr auto cases = std::to_array<CCase>({
         {{0, TEnh_n}, {10, TEnh_b}, TSeventhSpelling_MinorSeventh},    // C Bb
         {{0, TEnh_n}, {10, TEnh_s}, TSeventhSpelling_AugmentedSixth},  // C A#
         {{8, TEnh_b}, {6, TEnh_b}, TSeventhSpelling_MinorSeventh},     // Ab Gb
@@ -234,7 +234,7 @@ TEST_CASE("The letters of a seventh tell an augmented sixth") {
         {{0, TEnh_n}, {9, TEnh_n}, TSeventhSpelling_Undef},            // C A
         {{0, TEnh_n}, {10, TEnh_Undef}, TSeventhSpelling_Undef},
     });
-    for (const TCase& row : cases) {
+    for (const CCase& row : cases) {
         CAPTURE(row.mRoot.mKeyNr);
         CAPTURE(row.mSeventh.mKeyNr);
         CHECK(SeventhSpellingOf(row.mRoot, row.mSeventh) == row.mSpelling);

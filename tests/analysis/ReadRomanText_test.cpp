@@ -93,22 +93,22 @@ TEST_CASE("Measures are copied in the key of their new place, and in their own k
           "20+4 G vi; 24+2 C I; 26+2 C V; 28+4 C vi");
 }
 
-struct TBeatCase {
+struct CBeatCase {
     const char* mTime;
     const char* mBeats;
     const char* mChords;
 };
 
 TEST_CASE("Beats are those of the time signature") {
-    for (const TBeatCase& row : {
-             TBeatCase{"6/8", "I b1.33 V b2 I", "0+0.5 C I; 0.5+1 C V; 1.5+1.5 C I"},
-             TBeatCase{"slow 6/8", "I b2 V b6 I", "0+0.5 C I; 0.5+2 C V; 2.5+0.5 C I"},
-             TBeatCase{"3/8", "I b1.67 V", "0+1 C I; 1+0.5 C V"},
-             TBeatCase{"Cut", "I b2 V", "0+2 C I; 2+2 C V"},
-             TBeatCase{"9/8", "I b2 V b3.66 I", "0+1.5 C I; 1.5+2.5 C V; 4+0.5 C I"},
-             TBeatCase{"3/2", "I b3 V", "0+4 C I; 4+2 C V"},
-             TBeatCase{"C", "I b1.25 V b4.75 I", "0+0.25 C I; 0.25+3.5 C V; 3.75+0.25 C I"},
-             TBeatCase{"5/8", "I b4 V", "0+1.5 C I; 1.5+1 C V"},
+    for (const CBeatCase& row : {
+             CBeatCase{"6/8", "I b1.33 V b2 I", "0+0.5 C I; 0.5+1 C V; 1.5+1.5 C I"},
+             CBeatCase{"slow 6/8", "I b2 V b6 I", "0+0.5 C I; 0.5+2 C V; 2.5+0.5 C I"},
+             CBeatCase{"3/8", "I b1.67 V", "0+1 C I; 1+0.5 C V"},
+             CBeatCase{"Cut", "I b2 V", "0+2 C I; 2+2 C V"},
+             CBeatCase{"9/8", "I b2 V b3.66 I", "0+1.5 C I; 1.5+2.5 C V; 4+0.5 C I"},
+             CBeatCase{"3/2", "I b3 V", "0+4 C I; 4+2 C V"},
+             CBeatCase{"C", "I b1.25 V b4.75 I", "0+0.25 C I; 0.25+3.5 C V; 3.75+0.25 C I"},
+             CBeatCase{"5/8", "I b4 V", "0+1.5 C I; 1.5+1 C V"},
          }) {
         INFO(std::string(row.mTime));
         const CRomanTextReading reading =

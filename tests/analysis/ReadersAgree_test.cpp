@@ -19,7 +19,7 @@ TEST_CASE("Where both readers understand a text they agree") {
         // or how often a repeat is played.
         if (text.find(" /") != text.npos || text.find("X7") != text.npos) continue;
         const TChordStringParse parse = test::RandomBeats(chance);
-        CSongPrefs prefs;
+        CSongOptions prefs;
         prefs.mFormat = TSongFormat_ChordText;
         prefs.mBeatsPerBar = parse.mBeatsPerBar;
         prefs.mBeatsPerChord = parse.mBeatsPerChord;

@@ -21,7 +21,7 @@ CSignKeyLite Key(std::string_view name) {
     return CSignKeyLite(name);
 }
 
-struct TNumeralCase {
+struct CNumeralCase {
     std::string_view mKey;
     std::string_view mChord;
     std::string_view mNext;  ///< empty for the last chord
@@ -31,7 +31,7 @@ struct TNumeralCase {
 };
 
 // clang-format off
-constexpr auto kCases = std::to_array<TNumeralCase>({
+constexpr auto kCases = std::to_array<CNumeralCase>({
     // key      chord      next   Roman          figured      Nashville
     // The degrees of both modes
     {"C major", "C",       "",    "I",           "I",         "1"},
@@ -95,7 +95,7 @@ constexpr auto kCases = std::to_array<TNumeralCase>({
 // clang-format on
 
 TEST_CASE("Chords are written as numerals, and numerals are read as chords") {
-    for (const TNumeralCase& row : kCases) {
+    for (const CNumeralCase& row : kCases) {
         INFO(row.mKey << ": " << row.mChord << " before " << row.mNext);
         const CSignKeyLite key = Key(row.mKey);
         const CChordLite chord = Chord(row.mChord);
@@ -112,7 +112,7 @@ TEST_CASE("Chords are written as numerals, and numerals are read as chords") {
           "vii\u00B0");
 }
 
-constexpr auto kWays = std::to_array<TNumeralOptions>({
+constexpr auto kWays = std::to_array<CNumeralOptions>({
     {},
     {.mFigures = true},
     {.mPrintedSigns = true},
@@ -147,7 +147,7 @@ int FaultsOfLaw(CSemitones tones, int step, CSemitones nextTones) {
             const CChordLite chord{{root, TEnh_Undef}, {(root + bass) % 12, TEnh_Undef}, tones};
             const CChordLite next{
                 {(root + 5 + 8 * (bass % 3)) % 12, TEnh_Undef}, CKeyEnh_Undef, nextTones};
-            for (const TNumeralOptions& way : kWays) {
+            for (const CNumeralOptions& way : kWays) {
                 const std::string numeral = RomanNumeral(chord, key, &next, way);
                 const auto read = ChordFromNumeral(numeral, key, way);
                 if (read && IsSameSound(*read, chord)) continue;
@@ -181,7 +181,7 @@ TEST_CASE("Every set of tones is read as it was written") {
     int faults = 0;
     for (std::uint64_t mask = 1; mask < 4096; ++mask) {
         const CSignKeyLite key = KeyNumber(static_cast<int>(mask % 24));
-        for (const TNumeralOptions& way : kWays) {
+        for (const CNumeralOptions& way : kWays) {
             const CChordLite chord{
                 {static_cast<int>(mask % 11), TEnh_Undef}, CKeyEnh_Undef, CSemitones(mask)};
             const std::string numeral = RomanNumeral(chord, key, nullptr, way);
@@ -213,14 +213,14 @@ TEST_CASE("The bass is spelled as it was wherever the key spells the root as it 
     CHECK(same > 200);
 }
 
-struct TReadCase {
+struct CReadCase {
     std::string_view mKey;
     std::string_view mNumeral;
     std::string_view mChord;
 };
 
 // clang-format off
-constexpr auto kReadCases = std::to_array<TReadCase>({
+constexpr auto kReadCases = std::to_array<CReadCase>({
     // Spelled by the degree
     {"Eb major", "ii7",     "Fm7"},
     {"Eb major", "bVI",     "Cb"},
@@ -255,7 +255,7 @@ constexpr auto kReadCases = std::to_array<TReadCase>({
 // clang-format on
 
 TEST_CASE("Numerals are read as musicians write them, and spelled by their degree") {
-    for (const TReadCase& row : kReadCases) {
+    for (const CReadCase& row : kReadCases) {
         INFO(row.mKey << ": " << row.mNumeral);
         const auto chord = ChordFromNumeral(row.mNumeral, Key(row.mKey));
         REQUIRE(chord);

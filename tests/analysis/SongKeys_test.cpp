@@ -68,13 +68,13 @@ TEST_CASE("Three cadences in a row are three regions, and the first is the key o
 }
 
 /// A text with the keys of its regions in brackets, taken apart.
-struct TMarks {
+struct CMarkedText {
     std::string mChords;
     std::vector<std::string> mKeyOfChord;
 };
 
-TMarks MarksOf(std::string_view marked) {
-    TMarks marks;
+CMarkedText MarksOf(std::string_view marked) {
+    CMarkedText marks;
     std::istringstream words{std::string(marked)};
     std::string key;
     for (std::string word; words >> word;) {
@@ -99,7 +99,7 @@ std::vector<std::string> KeyOfChord(const CKeyOfSong& keys) {
 }
 
 // The text with the keys that were found, in the form of the marks.
-std::string Marked(const TMarks& marks, const std::vector<std::string>& keys) {
+std::string Marked(const CMarkedText& marks, const std::vector<std::string>& keys) {
     std::istringstream words(marks.mChords);
     std::string text;
     std::string key;
@@ -119,9 +119,9 @@ TEST_CASE("Well-known songs pass through the keys that musicians hear in them") 
     std::size_t songs = 0;
     std::size_t chords = 0;
     std::size_t agreed = 0;
-    for (const TMarkedSong& song : kMarkedSongs) {
+    for (const CMarkedSong& song : kMarkedSongs) {
         INFO(song.mName);
-        const TMarks marks = MarksOf(song.mMarked);
+        const CMarkedText marks = MarksOf(song.mMarked);
         const CKeyOfSong keys = KeysOf(marks.mChords);
         const std::vector<std::string> found = KeyOfChord(keys);
         CHECK(NameOf(keys.mKey) == (song.mFoundKey.empty() ? song.mKey : song.mFoundKey));
@@ -237,11 +237,11 @@ TEST_CASE("What is written twice, or as no chord, makes the chord before longer"
 }
 
 // The best path, word for word and slowly. Pivots apart.
-std::vector<std::uint8_t> PlainPath(const std::vector<TKeyChord>& chords,
+std::vector<std::uint8_t> PlainPath(const std::vector<CKeyChord>& chords,
                                     const std::vector<TKeyChordKind>& kinds,
-                                    const TSongTraits& traits, const CKeyOptions& options) {
+                                    const CSongTraits& traits, const CKeyOptions& options) {
     const auto gain = [&](std::size_t i, int k) {
-        const TKeyChord& chord = chords[i];
+        const CKeyChord& chord = chords[i];
         const double bars = std::clamp(chord.mBeats / options.mBeatsPerBar, 1.0 / 16, 4.0);
         const auto dist = static_cast<std::size_t>((chord.mRoot - k % 12 + 12) % 12);
         double points = kKeyLocalTable[static_cast<std::size_t>(k / 12)][kinds[i]][dist];
@@ -296,15 +296,15 @@ TEST_CASE(
             for (std::size_t i = 0; i < song.size(); ++i)
                 song[i].mPosition = static_cast<double>(i);
         }
-        std::vector<TKeyChord> chords = KeyChordsOf(song);
+        std::vector<CKeyChord> chords = KeyChordsOf(song);
         // No seventh on a second degree is left, so that there is no pivot.
-        for (TKeyChord& chord : chords) {
+        for (CKeyChord& chord : chords) {
             if (chord.mClass == TKeyChordClass_Min7) chord.mClass = TKeyChordClass_Min;
             if (chord.mClass == TKeyChordClass_HDim) chord.mClass = TKeyChordClass_Dim;
         }
         if (chords.empty()) continue;
         const auto kinds = KeyChordKindsOf(chords);
-        TSongTraits traits;
+        CSongTraits traits;
         traits.mHome = static_cast<int>(chance.Below(24));
         traits.mIsBlues = chance.OneIn(2);
         for (const double change : {4.0, 0.0, -3.0, 1.5, 50.0}) {

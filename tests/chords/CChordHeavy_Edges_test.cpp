@@ -46,19 +46,19 @@ using TNumbers = std::vector<int>;
 }  // namespace
 
 TEST_CASE("Tones keep their interval above the root, root or bass stand in the lowest octave") {
-    struct TRow {
+    struct CRow {
         const char* mSymbol;
         CChordHeavy mChord;
         TNumbers mNoteNrs;
         TNumbers mIntvls;
     };
-    const TRow rows[] = {
+    const CRow rows[] = {
         {"C7", {kC, CSemitones{0, 4, 7, 10}, {}}, {0, 55, 58, 72, 76}, {0, 4, 7, 10}},
         {"D/F#", {kD, CSemitones{0, 4, 7}, kFSharp}, {6, 54, 57, 74}, {0, 4, 7}},
         {"D/C", {kD, CSemitones{0, 4, 7}, kC}, {0, 54, 57, 74}, {0, 4, 7, 22}},
         {"D9", {kD, CIntvlSet(0, 4, 7, 10, 14), {}}, {2, 54, 57, 60, 64, 74}, {0, 4, 7, 10, 14}},
     };
-    for (const TRow& row : rows) {
+    for (const CRow& row : rows) {
         CAPTURE(row.mSymbol);
         CHECK(NoteNrs(row.mChord) == row.mNoteNrs);
         CHECK(Intvls(row.mChord) == row.mIntvls);
@@ -66,13 +66,13 @@ TEST_CASE("Tones keep their interval above the root, root or bass stand in the l
 }
 
 TEST_CASE("The skeleton is heard without a bass that stands on a tone of its own") {
-    struct TRow {
+    struct CRow {
         const char* mWhat;
         CChordHeavy mChord;
         TBasicChord mBasicChord;
         int mXGChordIx;
     };
-    const TRow rows[] = {
+    const CRow rows[] = {
         {"half-diminished", Of({60, 63, 66, 70}), TBasicChord::Minor, 11},
         {"diminished seventh", Of({60, 63, 66, 69}), TBasicChord::Diminished, 18},
         {"minor over its major third", Over(60, {4, 60, 63, 67}), TBasicChord::Minor, 8},
@@ -83,7 +83,7 @@ TEST_CASE("The skeleton is heard without a bass that stands on a tone of its own
         {"a single note", Of({60}), TBasicChord::None, 30},
         {"a ninth at 14 is not the second", Of({60, 64, 67, 74}), TBasicChord::Major, 0},
     };
-    for (const TRow& row : rows) {
+    for (const CRow& row : rows) {
         CAPTURE(row.mWhat);
         CHECK(row.mChord.BasicChord() == row.mBasicChord);
         CHECK(row.mChord.XGChordIx() == row.mXGChordIx);
@@ -191,13 +191,13 @@ TEST_CASE("Keys are asked for in lists") {
 TEST_CASE("The spelling with the fewest signs is chosen for root and bass") {
     const CSemitones major(2741);
     const CSemitones minor(1453);
-    struct TRow {
+    struct CRow {
         CSemitones mScale;
         int mKeyNr;
         TEnh mGiven;
         TEnh mChosen;
     };
-    const TRow rows[] = {
+    const CRow rows[] = {
         {major, 1, TEnh_Undef, TEnh_b},
         {major, 3, TEnh_Undef, TEnh_b},
         {major, 6, TEnh_Undef, TEnh_s},
@@ -214,7 +214,7 @@ TEST_CASE("The spelling with the fewest signs is chosen for root and bass") {
         {major, 8, TEnh_s, TEnh_b},
         {major, 0, TEnh_s, TEnh_n},
     };
-    for (const TRow& row : rows) {
+    for (const CRow& row : rows) {
         CAPTURE(row.mScale);
         CAPTURE(row.mKeyNr);
         CChordHeavy chord(CKeyEnh{row.mKeyNr, row.mGiven}, row.mScale, {});

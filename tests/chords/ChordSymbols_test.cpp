@@ -32,11 +32,11 @@ TEST_CASE("A chord symbol gives root, bass and tones") {
 }
 
 TEST_CASE("Options of a symbol build on what stands before them") {
-    struct TRow {
+    struct CRow {
         const char* mSymbol;
         CSemitones mSemitones;
     };
-    const TRow rows[] = {
+    const CRow rows[] = {
         {"", {0, 4, 7}},
         {"C", {0, 4, 7}},
         {"Cmin7", {0, 3, 7, 10}},
@@ -64,7 +64,7 @@ TEST_CASE("Options of a symbol build on what stands before them") {
         // The bass is scanned for options too.
         {"C/b5", {0, 4, 6}},
     };
-    for (const TRow& row : rows) {
+    for (const CRow& row : rows) {
         CAPTURE(row.mSymbol);
         CHECK(Read(row.mSymbol).mSemitones == row.mSemitones);
     }

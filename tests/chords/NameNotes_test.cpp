@@ -30,11 +30,11 @@ std::string DegreesText(const std::vector<CChordDegree>& degrees) {
 }
 
 TEST_CASE("Players' names of chords that a root alone does not tell") {
-    struct TRow {
+    struct CRow {
         std::vector<int> mNotes;
         const char* mSymbol;
     };
-    for (const TRow& row : std::vector<TRow>{
+    for (const CRow& row : std::vector<CRow>{
              {{48, 62, 64, 66, 67, 70}, "C9#11"},
              {{45, 52, 55, 60, 64}, "Am7"},
              {{48, 52, 55, 57}, "C6"},

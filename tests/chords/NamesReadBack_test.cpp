@@ -106,7 +106,7 @@ bool HasLetterOfAnotherKey(const CChordNamePrefs& prefs, const CKeyEnh& root) {
     return prefs.mBForBFlat && !prefs.mHForB && isB && !(root == CKeyEnh{10, TEnh_b});
 }
 
-struct TNotReadBack {
+struct CNotReadBack {
     const char* mReason;
     TFits mFits;
     std::vector<std::string_view> mTypes;  // names of the catalogue; empty for all
@@ -124,7 +124,7 @@ const std::vector<std::string_view> kWithWordForTheTriad{
     "minor",        "minor 7",   "minor 7 b5", "minor maj7", "minor add9", "minor 6",
     "minor 6 add9", "minor b13", "dim",        "dim 7",      "aug",        "aug 7"};
 
-const std::vector<TNotReadBack> kNotReadBack{
+const std::vector<CNotReadBack> kNotReadBack{
     {"a sign of more than one byte on the root hides the word for the triad: G♭m is read as G♭",
      HasSignOfMoreBytes, kWithWordForTheTriad},
     {"a flat option behind a slash is read as a bass: C7/b9 is C7 over B flat",

@@ -18,7 +18,7 @@ using namespace brindle;
 
 namespace {
 
-struct TSpelling {
+struct CSpelling {
     std::string mText;
     std::string mTones;
     std::string mBassKey;
@@ -26,14 +26,14 @@ struct TSpelling {
     std::string mExact;
 };
 
-std::vector<TSpelling> Spellings() {
+std::vector<CSpelling> Spellings() {
     std::ifstream file(BRINDLE_TEST_DATA "/chord-spellings.tsv");
     std::string line;
     std::getline(file, line);
-    std::vector<TSpelling> spellings;
+    std::vector<CSpelling> spellings;
     while (std::getline(file, line)) {
         std::istringstream cells(line);
-        TSpelling row;
+        CSpelling row;
         for (std::string* cell :
              {&row.mText, &row.mTones, &row.mBassKey, &row.mParserText, &row.mExact}) {
             std::getline(cells, *cell, '\t');
@@ -51,7 +51,7 @@ std::string TonesText(CSemitones semitones) {
     return text;
 }
 
-CChordLite ChordOf(std::string_view text, const CChordTextPrefs& prefs = {}) {
+CChordLite ChordOf(std::string_view text, const CChordTextOptions& prefs = {}) {
     const CChordTextReading reading = ReadChordText(text, prefs);
     CHECK_MESSAGE(reading.mKind == TChordText_Chord, text, ": ", reading.mFault);
     return reading.mChord;
@@ -86,9 +86,9 @@ private:
 }  // namespace
 
 TEST_CASE("Chord symbols are read as people write them") {
-    const std::vector<TSpelling> spellings = Spellings();
+    const std::vector<CSpelling> spellings = Spellings();
     CHECK(spellings.size() == 342);
-    for (const TSpelling& row : spellings) {
+    for (const CSpelling& row : spellings) {
         CAPTURE(row.mText);
         const CChordTextReading reading = ReadChordText(row.mText);
         CHECK(reading.mFault == "");
@@ -104,11 +104,11 @@ TEST_CASE("Chord symbols are read as people write them") {
 }
 
 TEST_CASE("Contested spellings and rare marks have one reading") {
-    struct TRow {
+    struct CRow {
         const char* mText;
         const char* mTones;
     };
-    const TRow rows[] = {
+    const CRow rows[] = {
         {"CmM", "0,3,7,11"},
         {"Co7M", "0,3,6,9,11"},
         {"C9maj7", "0,2,4,7,11"},
@@ -148,21 +148,21 @@ TEST_CASE("Contested spellings and rare marks have one reading") {
         {"Cm7b11", "0,3,4,7,10"},
         {"C11b11", "0,2,4,7,10"},
     };
-    for (const TRow& row : rows) {
+    for (const CRow& row : rows) {
         CAPTURE(row.mText);
         CHECK(TonesText(ChordOf(row.mText).mSemitones) == row.mTones);
     }
 }
 
 TEST_CASE("Roots and basses are spelled as they are written") {
-    struct TRow {
+    struct CRow {
         const char* mText;
         CKeyEnh mRoot;
         CKeyEnh mBass;
-        CChordTextPrefs mPrefs;
+        CChordTextOptions mPrefs;
     };
     const CKeyEnh none = CKeyEnh_Undef;
-    const TRow rows[] = {
+    const CRow rows[] = {
         {"Bbb7", CKeyEnh_Bbb, none, {}},
         {"Bbb9", CKeyEnh_Bb, none, {}},
         {"Cb9", CKeyEnh_Cb, none, {}},
@@ -188,7 +188,7 @@ TEST_CASE("Roots and basses are spelled as they are written") {
         {"Do7", CKeyEnh_D, none, {}},
         {"Fadd9", CKeyEnh_F, none, {.mSolfege = true}},
     };
-    for (const TRow& row : rows) {
+    for (const CRow& row : rows) {
         CAPTURE(row.mText);
         const CChordLite chord = ChordOf(row.mText, row.mPrefs);
         CHECK(chord.mRootKeyEnh == row.mRoot);
@@ -218,12 +218,12 @@ TEST_CASE("Some texts stand for no chord or for the one before") {
 }
 
 TEST_CASE("What is not understood is told with its place") {
-    struct TRow {
+    struct CRow {
         const char* mText;
         int mPos;
         const char* mFault;
     };
-    const TRow rows[] = {
+    const CRow rows[] = {
         {"Cm7x9", 4, R"("x" at 4 is not understood)"},
         {"Hello", 2, R"("ello" at 2 is not understood)"},
         {"Csos4", 2, R"("sos" at 2 is not understood)"},
@@ -255,7 +255,7 @@ TEST_CASE("What is not understood is told with its place") {
         {"C7add8", 6, R"("8" at 6 is no degree of a chord (2 3 4 5 6 7 9 11 13))"},
         {"Cbb:min/b3", 9, R"("b" at 9 is one accidental too many)"},
     };
-    for (const TRow& row : rows) {
+    for (const CRow& row : rows) {
         CAPTURE(row.mText);
         const CChordTextReading reading = ReadChordText(row.mText);
         CHECK(reading.mKind == TChordText_NotUnderstood);
@@ -296,12 +296,12 @@ TEST_CASE("Every chord that a symbol can say is written and read back the same")
 
 TEST_CASE("A normalised symbol stays as it is") {
     CSymbolMaker maker(20);
-    const CChordTextPrefs styles[] = {
+    const CChordTextOptions styles[] = {
         {}, {.mBIsBFlat = true}, {.mSolfege = true}, {.mLowerCaseIsMinor = true}};
     int understood = 0;
     for (int i = 0; i < 100'000; ++i) {
         const std::string text = maker.Make();
-        const CChordTextPrefs& prefs = styles[static_cast<std::size_t>(i) % 4];
+        const CChordTextOptions& prefs = styles[static_cast<std::size_t>(i) % 4];
         const auto once = NormaliseChordSymbol(text, prefs);
         if (!once) continue;
         ++understood;
@@ -333,7 +333,7 @@ TEST_CASE("Every printed name reads back") {
     constexpr std::size_t kKeyCount = CKeyEnh_AllUpToOneAccidental.size();
     std::size_t key = 0;
     for (const CChordNamePrefs& style : styles) {
-        const CChordTextPrefs prefs{
+        const CChordTextOptions prefs{
             .mBIsBFlat = style.mHForB, .mSolfege = style.mSolfege, .mOwnName = true};
         // Each style has its share of the sets, and each set comes in eight of them.
         const std::uint64_t first = 1 + 2 * (static_cast<std::uint64_t>(&style - &styles[0]) % 32);

@@ -46,17 +46,17 @@ TEST_CASE("The steps of a scale make chords on a root in the comping range") {
 }
 
 TEST_CASE("A chord is in a scale with all its keys, or with its skeleton and bass") {
-    struct TRow {
+    struct CRow {
         const char* mSymbol;
         bool mAllKeys;
         bool mSkeletonAndBass;
     };
-    const TRow rows[] = {
+    const CRow rows[] = {
         {"G7", true, true},    {"E7", false, false}, {"G7 b9", false, true},
         {"F#m", false, false}, {"Dm/G", true, true}, {"Dm/G#", false, false},
         {"", true, true},
     };
-    for (const TRow& row : rows) {
+    for (const CRow& row : rows) {
         CAPTURE(row.mSymbol);
         const CChordHeavy chord = *row.mSymbol != 0 ? Chord(row.mSymbol) : CChordHeavy_Undef();
         CHECK(CMajor().ChordIsDiatonicInScaleDisregardingEnh(chord) == row.mAllKeys);
@@ -67,13 +67,13 @@ TEST_CASE("A chord is in a scale with all its keys, or with its skeleton and bas
 
 TEST_CASE("A chord takes the degrees that it leaves open from the scale around it") {
     const CScaleHeavy gMajor(kG, st_maj);
-    struct TRow {
+    struct CRow {
         const char* mSymbol;
         CScaleHeavy mIn;
         CSemitones mScale;
         TScaleType mType;
     };
-    const TRow rows[] = {
+    const CRow rows[] = {
         {"C", CScaleHeavy_Undef, {0, 2, 4, 5, 7, 9, 11}, st_maj},
         {"C7", CScaleHeavy_Undef, {0, 2, 4, 5, 7, 9, 10}, st_mixolydian},
         {"Cm", CScaleHeavy_Undef, {0, 2, 3, 5, 7, 8, 10}, st_min},
@@ -83,7 +83,7 @@ TEST_CASE("A chord takes the degrees that it leaves open from the scale around i
         {"Caug", CScaleHeavy_Undef, {0, 2, 4, 5, 8, 9, 11}, st_custom},
         {"Dm/B", CMajor(), {0, 2, 3, 5, 7, 9, 10}, st_dorian},
     };
-    for (const TRow& row : rows) {
+    for (const CRow& row : rows) {
         CAPTURE(row.mSymbol);
         const CScaleHeavy scale = row.mIn.ConstructScaleForChord(Chord(row.mSymbol));
         CHECK(scale.ToSemitones() == row.mScale);

@@ -43,7 +43,7 @@ std::string Lost(const CChordLite& chord, const CChordSymbolStyle& style) {
 }
 
 TEST_CASE("Chords are written as people type them") {
-    struct TCase {
+    struct CCase {
         CKeyEnh mRoot;
         CSemitones mTones;
         const char* mText;
@@ -52,7 +52,7 @@ TEST_CASE("Chords are written as people type them") {
     const CKeyEnh e{4, TEnh_n};
     const CKeyEnh g{7, TEnh_n};
     const CKeyEnh b{11, TEnh_n};
-    const TCase cases[] = {
+    const CCase cases[] = {
         {c, {0, 4, 7}, "C"},
         {c, {0, 3, 7}, "Cm"},
         {c, {0, 3, 6}, "Cdim"},

@@ -21,14 +21,14 @@ const std::string kRoot = BRINDLE_SOURCE_DIR;
 const std::string kFence = "```";
 
 // A document cut at its fences: text and blocks in turn, each with the fence line before it.
-struct TPiece {
+struct CPiece {
     std::string mLanguage;  // of a block; empty for text
     bool mIsBlock = false;
     std::string mText;
 };
 
-std::vector<TPiece> Cut(const std::string& document) {
-    std::vector<TPiece> pieces(1);
+std::vector<CPiece> Cut(const std::string& document) {
+    std::vector<CPiece> pieces(1);
     std::istringstream lines(document);
     for (std::string line; std::getline(lines, line);) {
         if (line.compare(0, kFence.size(), kFence) != 0) {
@@ -42,9 +42,9 @@ std::vector<TPiece> Cut(const std::string& document) {
     return pieces;
 }
 
-std::string Join(const std::vector<TPiece>& pieces) {
+std::string Join(const std::vector<CPiece>& pieces) {
     std::string document;
-    for (const TPiece& piece : pieces) {
+    for (const CPiece& piece : pieces) {
         document += piece.mIsBlock ? kFence + piece.mLanguage + '\n' + piece.mText + kFence + '\n'
                                    : piece.mText;
     }
@@ -70,9 +70,9 @@ std::string Examples() {
 }
 
 std::string RunAgain(const std::string& console) {
-    TTranscript transcript = ReadTranscript(console);
+    CTranscript transcript = ReadTranscript(console);
     CHECK(transcript.mPreamble.empty());
-    for (TConsoleRun& run : transcript.mRuns) run = RunCommand(run.mCommand);
+    for (CConsoleRun& run : transcript.mRuns) run = RunCommand(run.mCommand);
     return WriteTranscript(transcript);
 }
 
@@ -94,8 +94,8 @@ TEST_CASE("The documents show what the program does and code that is built") {
     for (const std::string& path : Documents()) {
         INFO(path);
         const std::string document = ReadFile(path);
-        std::vector<TPiece> pieces = Cut(document);
-        for (TPiece& piece : pieces) {
+        std::vector<CPiece> pieces = Cut(document);
+        for (CPiece& piece : pieces) {
             if (!piece.mIsBlock || piece.mLanguage == "text") continue;
             INFO(piece.mText);
             if (piece.mLanguage == "console") {

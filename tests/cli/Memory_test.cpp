@@ -16,7 +16,7 @@ namespace brindle::test {
 namespace {
 
 // The standard output, status and whether a request failed; standard error only if it is empty.
-TConsoleRun RunShort(const std::string& command, long failing, const char* andAllBehind) {
+CConsoleRun RunShort(const std::string& command, long failing, const char* andAllBehind) {
     return RunCommand(fmt::format(
         "export BRINDLE_FAILED_MARK=$PWD/mark; "
         "LD_PRELOAD='{}' BRINDLE_FAILING_MALLOC={}{} '{}' {} 2>errors; status=$?; "

@@ -34,10 +34,10 @@ TEST_CASE("The program shows what the golden files hold") {
     REQUIRE_FALSE(files.empty());
     for (const std::string& file : files) {
         const std::string expected = ReadFile(file);
-        TTranscript transcript = ReadTranscript(expected);
+        CTranscript transcript = ReadTranscript(expected);
         CHECK_MESSAGE(!transcript.mRuns.empty(), file);
-        for (TConsoleRun& run : transcript.mRuns) {
-            const TConsoleRun now = RunCommand(run.mCommand);
+        for (CConsoleRun& run : transcript.mRuns) {
+            const CConsoleRun now = RunCommand(run.mCommand);
             if (!renew) {
                 INFO(file << ": $ " << run.mCommand);
                 CHECK(now.mShown == run.mShown);
@@ -52,7 +52,7 @@ TEST_CASE("A transcript is read and written without a change, and a difference i
     const std::string text =
         "Two commands.\n$ brindle --version\n$ echo a; echo b >&2; exit 3\na\n";
     CHECK(WriteTranscript(ReadTranscript(text)) == text);
-    const TConsoleRun run = RunCommand("printf a; echo b >&2; exit 3");
+    const CConsoleRun run = RunCommand("printf a; echo b >&2; exit 3");
     CHECK(run.mShown == "a\n[no end of line]\n[stderr]\nb\n[status 3]\n");
 }
 

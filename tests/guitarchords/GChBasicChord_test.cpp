@@ -256,11 +256,11 @@ TEST_CASE("A fingering prints its property list") {
 }
 
 TEST_CASE("Any change of a fingering is seen, that of its bass, too") {
-    struct TChange {
+    struct CChange {
         const char* mWhat;
         void (*mChange)(GChBasicChord& chord);
     };
-    const TChange changes[] = {
+    const CChange changes[] = {
         {"root", [](GChBasicChord& chord) { chord.setRootNote(2); }},
         {"bass", [](GChBasicChord& chord) { chord.setBassNote(7); }},
         {"type", [](GChBasicChord& chord) { chord.setChordType(3); }},
@@ -272,7 +272,7 @@ TEST_CASE("Any change of a fingering is seen, that of its bass, too") {
     original->setRootNote(0);
     original->setBassNote(4);
     CHECK(GChBasicChord(*original).isEqualToChordRange(*original, true));
-    for (const TChange& change : changes) {
+    for (const CChange& change : changes) {
         CAPTURE(change.mWhat);
         GChBasicChord changed(*original);
         change.mChange(changed);

@@ -24,11 +24,11 @@ std::string NameOf(const std::vector<int>& frets, const GChShortTuning& tuning) 
 
 TEST_CASE("Fingerings of a guitar are named over the root that guitarists hear") {
     constexpr int x = -1;
-    struct TRow {
+    struct CRow {
         std::vector<int> mFrets;
         const char* mSymbol;
     };
-    for (const TRow& row : std::vector<TRow>{
+    for (const CRow& row : std::vector<CRow>{
              {{x, 0, 2, 0, 1, 0}, "Am7"},
              {{x, 2, 0, 2, 0, 2}, "Bm7"},
              {{0, 2, 2, 0, 3, 0}, "Em7"},

@@ -12,7 +12,7 @@ namespace {
 
 namespace fs = std::filesystem;
 
-struct TFile {
+struct CFile {
     std::string mPath;  // relative to the source tree
     std::string mText;
 };
@@ -23,9 +23,9 @@ std::string ReadFile(const fs::path& path) {
 }
 
 // All headers and sources of the library and the program.
-std::vector<TFile> SourceFiles() {
+std::vector<CFile> SourceFiles() {
     const fs::path root = BRINDLE_SOURCE_DIR;
-    std::vector<TFile> files;
+    std::vector<CFile> files;
     for (const char* folder : {"brindle", "cli"}) {
         for (const auto& entry : fs::recursive_directory_iterator(root / folder)) {
             const auto extension = entry.path().extension();
@@ -58,12 +58,12 @@ TEST_CASE("A source includes its own header first, so that the header stands on 
 }
 
 TEST_CASE("The checker finds what is planted") {
-    struct TCase {
+    struct CCase {
         const char* mPath;
         const char* mText;
         bool mIsFault;
     };
-    const TCase cases[] = {
+    const CCase cases[] = {
         {"brindle/theory/A.h", "#include \"brindle/theory/CKeyEnh.h\"", false},
         {"brindle/theory/A.cpp", "#include \"brindle/platform/Localization.h\"", false},
         {"brindle/musicxml/A.cpp", "#include \"brindle/analysis/CHarmonicAnalyse.h\"", false},

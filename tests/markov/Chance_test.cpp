@@ -149,13 +149,13 @@ TEST_CASE("A template of 10,000 beats is filled") {
 }
 
 TEST_CASE("What cannot be made ends without a result") {
-    struct TRow {
+    struct CRow {
         const char* mWhy;
         std::string mLearned;
         std::string mTemplate;
         bool mRecursive;
     };
-    const std::vector<TRow> rows{
+    const std::vector<CRow> rows{
         {"chords of two beats do not fill three", "(2,C);(2,G);(2,C)", "(3,U)", true},
         {"the same, freely", "(2,C);(2,G);(2,C)", "(3,U)", false},
         {"E was never learned", "(4,C);(4,G);(4,C)", "(4,C);(4,U);(4,E)", true},
@@ -167,7 +167,7 @@ TEST_CASE("What cannot be made ends without a result") {
         {"a template without length", "(4,C);(4,G)", "(4,U);(-4,U)", true},
         {"no template", "(4,C);(4,G)", "", true},
     };
-    for (const TRow& row : rows) {
+    for (const CRow& row : rows) {
         INFO(row.mWhy << ": " << row.mTemplate << " from " << row.mLearned);
         auto model = SeededModel(2, {row.mLearned});
         model.SetSearchLimits({20, 20000});

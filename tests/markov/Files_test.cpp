@@ -98,7 +98,7 @@ TEST_CASE("Entries that name no symbol are left out, and the order of members do
     CHECK(model.mMaxHistoryLength == 2);
     CHECK(test::FormOf(model.mHistory) == json{1, 0});
     auto transitions = json::array();
-    for (const TMarkovTransitions* const entry : model.mTransitionMap.InOrder()) {
+    for (const CMarkovTransitions* const entry : model.mTransitionMap.InOrder()) {
         transitions.push_back({test::FormOf(entry->mHistory), TableForm(entry->mCounts)});
     }
     // Counts of 32 bits: 2 + 4294967295 is 1.
@@ -122,7 +122,7 @@ TEST_CASE("A history without a valid successor keeps its empty table") {
                 entry + "]}}",
             model);
         auto histories = json::array();
-        for (const TMarkovTransitions* const known : model.mTransitionMap.InOrder()) {
+        for (const CMarkovTransitions* const known : model.mTransitionMap.InOrder()) {
             CHECK(known->mCounts.empty());
             histories.push_back(test::FormOf(known->mHistory));
         }

@@ -40,13 +40,13 @@ TMarkovGenerateOptions OptionsOf(VariableLengthMarkovModel& model, const json& w
 }
 
 /// [N, sequences, template, options, random numbers]
-struct TRun {
+struct CRun {
     VariableLengthMarkovModel mModel;
     TMarkovGenerateOptions mOptions;
     TMarkovSampledSequence mSequence;
     std::vector<TMarkovSampledSequence> mSequences;
 
-    explicit TRun(const json& in)
+    explicit CRun(const json& in)
         : mModel(ModelOf(in)), mOptions(OptionsOf(mModel, in.at(2), in.at(3))) {
         mModel.SetRandomSource(NumbersOf(in.at(4)));
     }
@@ -63,7 +63,7 @@ json FormOfSampled(const TMarkovSampledSequence& sequence) {
 }
 
 json Filled(const json& in) {
-    TRun run(in);
+    CRun run(in);
     TMarkovSamplingInformation info;
     const bool result = run.mModel.RecursiveGenerateSequence(run.mSequence, run.mOptions, info);
     if (!result) return {{"result", false}};
@@ -71,14 +71,14 @@ json Filled(const json& in) {
 }
 
 json Free(const json& in) {
-    TRun run(in);
+    CRun run(in);
     run.mModel.GenerateSequenceWithFixedLength(run.mOptions.mMaxHistoryLength, run.mSequence,
                                                run.mOptions);
     return {{"mSampledObjects", FormOfSampled(run.mSequence)}};
 }
 
 json Sampled(const json& in, bool recursive) {
-    TRun run(in);
+    CRun run(in);
     run.mModel.SampleSequenceWithLength(run.mSequence, run.mSequences, recursive, run.mOptions);
     std::vector<json> sequences;
     for (const TMarkovSampledSequence& sequence : run.mSequences) {
@@ -97,7 +97,7 @@ json Chosen(const json& in) {
 }
 
 json Normalized(const json& in) {
-    std::vector<TMarkovWeightedSequence> sequences;
+    std::vector<CMarkovWeightedSequence> sequences;
     for (const json& weight : in.at(0)) sequences.push_back({{}, weight.get<double>()});
     VariableLengthMarkovModel::NormalizeLogProbabilities(sequences);
     auto form = json::array();

@@ -96,7 +96,7 @@ TEST_CASE("Symbols in any order, some of them alike, are counted as in a map") {
     CMarkovObjects symbols;
     CMarkovObject chord = SymbolsOf("(1,C)").at(0);
     MarkovCounts counts;
-    std::map<MarkovIterator, std::uint32_t, TMarkovLess> wanted;
+    std::map<MarkovIterator, std::uint32_t, CMarkovLess> wanted;
     std::uint32_t number = 1;
     for (int step = 0; step < 5000; ++step) {
         number = number * 1664525 + 1013904223;

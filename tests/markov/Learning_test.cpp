@@ -23,7 +23,7 @@ json ObjectsOf(const VariableLengthMarkovModel& model) {
 
 json TransitionsOf(const VariableLengthMarkovModel& model) {
     auto form = json::array();
-    for (const TMarkovTransitions* const entry : model.mTransitionMap.InOrder()) {
+    for (const CMarkovTransitions* const entry : model.mTransitionMap.InOrder()) {
         form.push_back({test::FormOf(entry->mHistory), TableForm(entry->mCounts)});
     }
     return form;

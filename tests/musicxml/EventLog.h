@@ -12,7 +12,7 @@
 namespace brindle::test {
 
 /// All calls of an import in their order, enumerations by number.
-struct TEventLog {
+struct CEventLog {
     std::vector<nlohmann::json> mCalls;
     bool mOk = false;
     Error mError;
@@ -28,20 +28,20 @@ struct TEventLog {
 };
 
 /// A host that writes all calls to a log.
-inline std::shared_ptr<MusicXmlParserDelegate> HostFor(TEventLog& log) {
+inline std::shared_ptr<MusicXmlParserDelegate> HostFor(CEventLog& log) {
     return std::make_shared<MusicXmlParserDelegate>(MuxmlJsonLines(
         TMuxmlEnumForm_Number,
         [&log](const std::string& line) { log.mCalls.push_back(nlohmann::json::parse(line)); }));
 }
 
-inline TEventLog ImportFile(const std::string& path) {
-    TEventLog log;
+inline CEventLog ImportFile(const std::string& path) {
+    CEventLog log;
     log.mOk = MusicXmlParser().parseURL(path, HostFor(log), &log.mError);
     return log;
 }
 
-inline TEventLog ImportText(const std::string& text) {
-    TEventLog log;
+inline CEventLog ImportText(const std::string& text) {
+    CEventLog log;
     log.mOk = MusicXmlParser().parseBytes(text, HostFor(log), &log.mError);
     return log;
 }

@@ -101,11 +101,11 @@ std::string Shown(const TMusicXMLDoc& doc) {
 }  // namespace
 
 TEST_CASE("Repeats, endings and jumps are played as musicians play them") {
-    struct TRow {
+    struct CRow {
         std::string mBars;
         const char* mPlayed;
     };
-    const TRow rows[] = {
+    const CRow rows[] = {
         // Repeats go back to their sign, to the start, or behind the repeat before.
         {"A; B |:; C :|; D", "ABCBCD"},
         {"A; B :|; C; D :|; E", "ABABCDCDE"},
@@ -154,7 +154,7 @@ TEST_CASE("Repeats, endings and jumps are played as musicians play them") {
         {"A; B =Second coda=; C =rapid changes=; D", "ABCD"},
         {"A |:; B =x=; C =4th x: tacet= :|", "ABCABC"},
     };
-    for (const TRow& row : rows) {
+    for (const CRow& row : rows) {
         INFO(row.mBars);
         CHECK(Roots(Loaded(Bars(row.mBars))) == row.mPlayed);
     }
@@ -221,11 +221,11 @@ TEST_CASE("Times and keys stand where they begin to hold") {
 }
 
 TEST_CASE("Kinds in other words are put into the words of the library") {
-    struct TRow {
+    struct CRow {
         const char* mXml;
         const char* mKind;
     };
-    const TRow rows[] = {
+    const CRow rows[] = {
         {"<kind/>", "major"},
         {"<kind text='m7'/>", "minor-seventh"},
         {"<kind> minor </kind>", "minor"},
@@ -247,7 +247,7 @@ TEST_CASE("Kinds in other words are put into the words of the library") {
         {"<kind text='9+'>augmented-ninth</kind>", "augmented-seventh +add 9"},
         {"<kind text='9+'>other</kind>", "augmented-seventh +add 9"},
     };
-    for (const TRow& row : rows) {
+    for (const CRow& row : rows) {
         INFO(row.mXml);
         const TMusicXMLDoc doc = Loaded(Score(fmt::format(
             "<measure><harmony><root><root-step>C</root-step></root>{}</harmony></measure>",
@@ -374,11 +374,11 @@ TEST_CASE("Scores in any encoding are read, and what is no score is told") {
     }
     CHECK(Loaded(utf16).Title == "A");
 
-    struct TRow {
+    struct CRow {
         std::string mBytes;
         const char* mFault;
     };
-    const TRow rows[] = {
+    const CRow rows[] = {
         {"", "1:1: Document is empty"},
         {"<html/>", "1:1: no MusicXML score"},
         {"<part><measure><note/></measure></part>", "1:1: no MusicXML score"},
@@ -387,7 +387,7 @@ TEST_CASE("Scores in any encoding are read, and what is no score is told") {
          "and measure"},
         {"PK\x03\x04", "no score in the container"},
     };
-    for (const TRow& row : rows) {
+    for (const CRow& row : rows) {
         TMusicXMLDoc doc;
         Error error;
         CHECK_FALSE(doc.LoadAsPlayedFromBytes(row.mBytes, &error));

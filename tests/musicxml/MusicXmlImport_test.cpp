@@ -48,7 +48,7 @@ std::string Tie(const char* type) {
 }
 
 /// Position, length and number of each note that is told; "?" for what is undefined.
-std::string Notes(const test::TEventLog& log) {
+std::string Notes(const test::CEventLog& log) {
     std::string text;
     for (const json& note : log.Of("didEncounterNote")) {
         const auto field = [&note](const char* name) {
@@ -61,29 +61,29 @@ std::string Notes(const test::TEventLog& log) {
 }
 
 /// The alerts that are shown while it lives.
-struct TAlerts {
-    std::vector<TAlert> mAlerts;
+struct CAlerts {
+    std::vector<CAlert> mAlerts;
 
-    TAlerts() {
-        SetAlertHandler([this](const TAlert& alert) { mAlerts.push_back(alert); });
+    CAlerts() {
+        SetAlertHandler([this](const CAlert& alert) { mAlerts.push_back(alert); });
     }
-    TAlerts(const TAlerts&) = delete;
-    TAlerts& operator=(const TAlerts&) = delete;
-    ~TAlerts() { SetAlertHandler({}); }
+    CAlerts(const CAlerts&) = delete;
+    CAlerts& operator=(const CAlerts&) = delete;
+    ~CAlerts() { SetAlertHandler({}); }
 };
 
 /// A folder for temporary files of this test alone.
-struct TTemporaryFolder {
+struct CTemporaryFolder {
     fs::path mPath = fs::temp_directory_path() / ("brindle-import-" + std::to_string(getpid()));
     fs::path mFile = mPath / "ThornbankMusicXMLImport.xml";
 
-    TTemporaryFolder() {
+    CTemporaryFolder() {
         fs::create_directories(mPath);
         setenv("TMPDIR", mPath.c_str(), 1);
     }
-    TTemporaryFolder(const TTemporaryFolder&) = delete;
-    TTemporaryFolder& operator=(const TTemporaryFolder&) = delete;
-    ~TTemporaryFolder() {
+    CTemporaryFolder(const CTemporaryFolder&) = delete;
+    CTemporaryFolder& operator=(const CTemporaryFolder&) = delete;
+    ~CTemporaryFolder() {
         unsetenv("TMPDIR");
         fs::remove_all(mPath);
     }
@@ -107,7 +107,7 @@ std::string Repeated(int count, const std::function<std::string(int)>& piece) {
 }  // namespace
 
 TEST_CASE("Notes stand where chords, ties, grace notes, cues, backups and bars put them") {
-    struct TCase {
+    struct CCase {
         std::string mWhat;
         std::string mContent;
         std::string mNotes;
@@ -115,7 +115,7 @@ TEST_CASE("Notes stand where chords, ties, grace notes, cues, backups and bars p
     const std::string chord = "<chord/>";
     const std::string start = Tie("start");
     const std::string stop = Tie("stop");
-    const std::vector<TCase> cases{
+    const std::vector<CCase> cases{
         {"a chord moves on once", Note("C") + Note("E", chord) + Note("G", chord) + Note("A"),
          "0:960:60 0:960:64 0:960:67 960:960:69"},
         {"a chain of ties is told once, where it begins",
@@ -161,9 +161,9 @@ TEST_CASE("Notes stand where chords, ties, grace notes, cues, backups and bars p
          "0:960:62"},
         {"an unknown letter is no pitch", Note("H") + Note("D"), "0:960:? 960:960:62"},
     };
-    for (const TCase& entry : cases) {
+    for (const CCase& entry : cases) {
         INFO(entry.mWhat);
-        const test::TEventLog log = test::ImportText(Measure(entry.mContent));
+        const test::CEventLog log = test::ImportText(Measure(entry.mContent));
         CHECK(log.mOk);
         CHECK(Notes(log) == entry.mNotes);
     }
@@ -188,18 +188,18 @@ TEST_CASE("A closed chain carries the first note, the longer type and all lyrics
 }
 
 TEST_CASE("Bars end by their time signature, whatever they hold") {
-    struct TCase {
+    struct CCase {
         const char* mTime;
         int mEnd;
     };
-    for (const TCase& entry : {TCase{"<beats>4</beats><beat-type>4</beat-type>", 3840},
-                               TCase{"<beats>3+2</beats><beat-type>8</beat-type>", 2400},
-                               TCase{"<beats>2</beats><beat-type>3</beat-type>", 2560},
-                               TCase{"<beats>2</beats><beat-type>7</beat-type>", 1096},
-                               TCase{"<beats>4</beats><beat-type>0</beat-type>", 0},
-                               TCase{"<beats/><beat-type>4</beat-type>", 0}}) {
+    for (const CCase& entry : {CCase{"<beats>4</beats><beat-type>4</beat-type>", 3840},
+                               CCase{"<beats>3+2</beats><beat-type>8</beat-type>", 2400},
+                               CCase{"<beats>2</beats><beat-type>3</beat-type>", 2560},
+                               CCase{"<beats>2</beats><beat-type>7</beat-type>", 1096},
+                               CCase{"<beats>4</beats><beat-type>0</beat-type>", 0},
+                               CCase{"<beats/><beat-type>4</beat-type>", 0}}) {
         INFO(entry.mTime);
-        const test::TEventLog log = test::ImportText(
+        const test::CEventLog log = test::ImportText(
             Part("<measure number=\"7\"><attributes><divisions>2</divisions><time>" +
                  std::string(entry.mTime) + "</time></attributes>" + Note("C") + "</measure>"));
         const json end = log.Of("didEncounterMeasureEnd").at(0);
@@ -225,7 +225,7 @@ TEST_CASE("A host hears only the methods that it has, and clefs only beside keys
 
 TEST_CASE(
     "Scores in time order, without a list of parts or identifiers are told as far as they go") {
-    test::TEventLog log = test::ImportText(
+    test::CEventLog log = test::ImportText(
         "<score-timewise><part-list><score-part id=\"P1\"/></part-list>"
         "<measure><part id=\"P1\">" +
         Note("C") + "</part></measure></score-timewise>");
@@ -248,31 +248,31 @@ TEST_CASE(
 }
 
 TEST_CASE("Files that are no scores fail with an error and without a call") {
-    struct TCase {
+    struct CCase {
         const char* mText;
         const char* mDescription;
     };
-    for (const TCase& entry :
-         {TCase{"", "Line"}, TCase{"<score-partwise>", "Line 1"},
-          TCase{"<score-partwise><part id='1'></score-partwise>", "Line 1, column"},
-          TCase{"<opus/>", "File is not a MusicXML File"},
-          TCase{"<!DOCTYPE score-partwise SYSTEM 'file:///etc/passwd' [<!ENTITY e SYSTEM "
+    for (const CCase& entry :
+         {CCase{"", "Line"}, CCase{"<score-partwise>", "Line 1"},
+          CCase{"<score-partwise><part id='1'></score-partwise>", "Line 1, column"},
+          CCase{"<opus/>", "File is not a MusicXML File"},
+          CCase{"<!DOCTYPE score-partwise SYSTEM 'file:///etc/passwd' [<!ENTITY e SYSTEM "
                 "'file:///etc/passwd'>]><opus>&e;</opus>",
                 ""}}) {
         INFO(entry.mText);
-        const test::TEventLog log = test::ImportText(entry.mText);
+        const test::CEventLog log = test::ImportText(entry.mText);
         CHECK_FALSE(log.mOk);
         CHECK(log.mCalls.empty());
         CHECK(log.mError.description.starts_with(entry.mDescription));
     }
-    const test::TEventLog log = test::ImportText("<score-partwise-and-more/>");
+    const test::CEventLog log = test::ImportText("<score-partwise-and-more/>");
     CHECK(log.mOk);
     CHECK(log.mCalls.size() == 2);
     CHECK(test::ImportFile(kScores + "no-such-file.xml").mError.domain == "NSCocoaErrorDomain");
 }
 
 TEST_CASE("A compressed score is unpacked to a file of its owner, and no link is followed") {
-    const TTemporaryFolder folder;
+    const CTemporaryFolder folder;
     const fs::path victim = folder.mPath / "victim";
     REQUIRE(WriteFileAtomically(victim, "precious"));
     fs::create_symlink(victim, folder.mFile);
@@ -293,10 +293,10 @@ TEST_CASE("A compressed score is unpacked to a file of its owner, and no link is
 }
 
 TEST_CASE("Compressed files without a score have errors of their own") {
-    const TTemporaryFolder folder;
+    const CTemporaryFolder folder;
     const fs::path bad = folder.mPath / "bad.mxl";
     REQUIRE(WriteFileAtomically(bad, "PK no archive"));
-    test::TEventLog log = test::ImportFile(bad);
+    test::CEventLog log = test::ImportFile(bad);
     CHECK(log.mError ==
           Error{"org.thornbank.host10", 259, "Could not decompress (compressed MusicXML file)"});
 
@@ -318,12 +318,12 @@ TEST_CASE("Compressed files without a score have errors of their own") {
 }
 
 TEST_CASE("Divisions of zero are an alert, and the next note has no place in the bar") {
-    const TAlerts alerts;
+    const CAlerts alerts;
     const std::string zero = "<attributes><divisions>0</divisions></attributes>";
     const std::string fives =
         "<time-modification><actual-notes>5</actual-notes><normal-notes>4</normal-notes>"
         "</time-modification>";
-    const test::TEventLog log = test::ImportText(Measure(zero + Note("C", fives)));
+    const test::CEventLog log = test::ImportText(Measure(zero + Note("C", fives)));
     CHECK(Notes(log) == "0:0:60");
     REQUIRE(alerts.mAlerts.size() == 1);
     CHECK(alerts.mAlerts[0].messageText == "MusicXML Parsing Error");
@@ -332,7 +332,7 @@ TEST_CASE("Divisions of zero are an alert, and the next note has no place in the
         "“divisions”, Line: 1, Column: "));
     CHECK(alerts.mAlerts[0].button == "OK");
 
-    test::TEventLog broken;
+    test::CEventLog broken;
     const auto host = test::HostFor(broken);
     CHECK_THROWS_AS(MusicXmlParser().parseBytes(Measure(zero + Note("C")), host),
                     boost::bad_rational);
@@ -351,7 +351,7 @@ TEST_CASE("What a host throws ends the import and reaches the caller") {
 }
 
 TEST_CASE("Instruments belong to all parts whose identifiers theirs hold") {
-    const test::TEventLog log = test::ImportText(
+    const test::CEventLog log = test::ImportText(
         "<score-partwise><part-list>"
         "<score-part id=\"P1\"><score-instrument id=\"P1-I1\"><instrument-name>Violin"
         "</instrument-name><instrument-sound>Strings.Violin</instrument-sound></score-instrument>"

@@ -43,7 +43,7 @@ json NoteForm(const json& note) {
 }
 
 json LeadSheetForm(const std::string& file) {
-    const test::TEventLog log = test::ImportFile(BRINDLE_TEST_DATA "/leadsheets/" + file);
+    const test::CEventLog log = test::ImportFile(BRINDLE_TEST_DATA "/leadsheets/" + file);
     json calls = json::object();
     json notes = json::array();
     for (const json& entry : log.mCalls) {
@@ -55,11 +55,11 @@ json LeadSheetForm(const std::string& file) {
 }
 
 // What the expected files say besides the fields of records, worked out by the library.
-struct TExtras {
+struct CExtras {
     std::vector<json> mByCall;
     std::shared_ptr<MusicXmlParserDelegate> mHost = std::make_shared<MusicXmlParserDelegate>();
 
-    TExtras() {
+    CExtras() {
         mHost->didEncounterPartStart = [this](const CMuxmlPart& part) {
             mByCall.push_back({{"FindBestPartName", part.FindBestPartName()}});
         };
@@ -104,8 +104,8 @@ json AlwaysWritten(const std::string& call) {
 
 // Our calls in the form of the expected files.
 std::vector<json> CallsOf(const std::string& path) {
-    test::TEventLog log = test::ImportFile(path);
-    TExtras extras;
+    test::CEventLog log = test::ImportFile(path);
+    CExtras extras;
     CHECK(MusicXmlParser().parseURL(path, extras.mHost));
     auto extra = extras.mByCall.begin();
     for (json& call : log.mCalls) {
@@ -204,7 +204,7 @@ TEST_CASE("A host is told all of a score in its order") {
 }
 
 TEST_CASE("A quartet with a bit of everything is told as it sounds") {
-    const test::TEventLog log = test::ImportFile(BRINDLE_TEST_DATA "/scores/everything.musicxml");
+    const test::CEventLog log = test::ImportFile(BRINDLE_TEST_DATA "/scores/everything.musicxml");
     REQUIRE(log.mOk);
     // Position, length, note, velocity and voice of each note, part after part.
     const json parts = json::parse(R"([

@@ -83,11 +83,11 @@ TEST_CASE("A bar of 3/8 and 2/4 has three and a half quarters") {
 TEST_CASE("Signs of repeats and endings are obeyed where they stand") {
     const std::string backAtLeft = Line("left", "<repeat direction=\"backward\"/>");
     const std::string three = Line("right", "<repeat direction=\"backward\" times=\"3\"/>");
-    struct TRow {
+    struct CRow {
         std::vector<std::string> mMeasures;
         const char* mRoots;
     };
-    const TRow rows[] = {
+    const CRow rows[] = {
         // A sign to go back in front of a measure belongs to the one before.
         {{"", "", backAtLeft}, "ABABC"},
         {{backAtLeft, ""}, "AAB"},
@@ -104,7 +104,7 @@ TEST_CASE("Signs of repeats and endings are obeyed where they stand") {
         // The second of two repeats is no ending of the first.
         {{"", Ending("1", kBack), kForward, kBack, ""}, "ABACDCDE"},
     };
-    for (const TRow& row : rows) {
+    for (const CRow& row : rows) {
         CAPTURE(row.mRoots);
         CHECK(Roots(Played(row.mMeasures)) == row.mRoots);
     }

@@ -17,7 +17,7 @@ using namespace brindle;
 namespace {
 
 // The measures counted from 1, "1-16 1-9 17-23".
-std::string Shown(const TPlayingOrder& order) {
+std::string Shown(const CPlayingOrder& order) {
     std::string text;
     const auto& measures = order.mMeasures;
     for (std::size_t i = 0; i < measures.size();) {
@@ -34,12 +34,12 @@ std::string Shown(const TPlayingOrder& order) {
 }  // namespace
 
 TEST_CASE("Lead sheets are played through as their signs and words say") {
-    struct TRow {
+    struct CRow {
         const char* mFile;
         const char* mOrder;
         double mQuarters;
     };
-    const TRow rows[] = {
+    const CRow rows[] = {
         // An upbeat of an eighth, a repeat with a second ending that is numbered 3.
         {"what_child_is_this.musicxml", "1-19 4-18 20", 102.5},
         // First and second ending; D.C. al Coda runs into the coda, whose sign stands alone.
@@ -66,7 +66,7 @@ TEST_CASE("Lead sheets are played through as their signs and words say") {
         {"coventry_carol.xml", "1-16", 48},
         {"what_shall_we_do_with_a_drunken_sailor.xml", "1-8", 32},
     };
-    for (const TRow& row : rows) {
+    for (const CRow& row : rows) {
         INFO(std::string(row.mFile));
         const std::string path = std::string(BRINDLE_TEST_DATA) + "/leadsheets/" + row.mFile;
         std::string bytes = ReadWholeFile(path).value();

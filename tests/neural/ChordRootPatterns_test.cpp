@@ -31,13 +31,13 @@ int HeardRoot(NeuronalNet& net, std::uint32_t inputs, std::vector<double>& buffe
 }  // namespace
 
 TEST_CASE("Each set of notes has one root") {
-    struct TCase {
+    struct CCase {
         const char* mChord;
         std::initializer_list<unsigned> mIntvls;
         int mRootIntvl;
         TOmission mOmission = TOmission_None;
     };
-    const TCase cases[] = {
+    const CCase cases[] = {
         {"C E G", {0, 4, 7}, 0},
         {"C C E G, C E G", {0, 4, 7, 12, 16, 19}, 0},
         {"E G C", {0, 3, 8}, 8},
@@ -61,12 +61,12 @@ TEST_CASE("Each set of notes has one root") {
         {"E F G B flat, C7 11", {0, 1, 3, 6}, 8, TOmission_Root},
         {"E G B flat, a full triad before C7 without root", {0, 3, 6}, 0},
     };
-    const std::vector<TChordRootPattern> patterns = ChordRootPatterns();
-    for (const TCase& test : cases) {
+    const std::vector<CChordRootPattern> patterns = ChordRootPatterns();
+    for (const CCase& test : cases) {
         CAPTURE(test.mChord);
         const auto found =
             std::lower_bound(patterns.begin(), patterns.end(), InputsOf(test.mIntvls),
-                             [](const TChordRootPattern& pattern, std::uint32_t inputs) {
+                             [](const CChordRootPattern& pattern, std::uint32_t inputs) {
                                  return pattern.mInputs < inputs;
                              });
         REQUIRE(found != patterns.end());
@@ -77,10 +77,10 @@ TEST_CASE("Each set of notes has one root") {
 }
 
 TEST_CASE("The patterns are each voicing of each shape, once, with and without the upper octave") {
-    const std::vector<TChordRootPattern> patterns = ChordRootPatterns();
+    const std::vector<CChordRootPattern> patterns = ChordRootPatterns();
     CHECK(ChordShapes().size() == 42);
     CHECK(patterns.size() == 27084);
-    const auto isUnordered = [](const TChordRootPattern& a, const TChordRootPattern& b) {
+    const auto isUnordered = [](const CChordRootPattern& a, const CChordRootPattern& b) {
         return a.mInputs >= b.mInputs;
     };
     CHECK(std::adjacent_find(patterns.begin(), patterns.end(), isUnordered) == patterns.end());
@@ -88,7 +88,7 @@ TEST_CASE("The patterns are each voicing of each shape, once, with and without t
     std::vector<std::pair<std::uint32_t, int>> without;
     std::vector<std::pair<std::uint32_t, int>> with;
     constexpr std::uint32_t kOctave = 1U << 12U;
-    for (const TChordRootPattern& pattern : patterns) {
+    for (const CChordRootPattern& pattern : patterns) {
         auto& half = (pattern.mInputs & kOctave) == 0 ? without : with;
         half.emplace_back(pattern.mInputs & ~kOctave, pattern.mRootIntvl);
     }
@@ -107,7 +107,7 @@ TEST_CASE("The net hears the root of every voicing of every shape") {
     int wrongOfCatalogue = 0;
     int others = 0;
     int wrongOthers = 0;
-    for (const TChordRootPattern& pattern : ChordRootPatterns()) {
+    for (const CChordRootPattern& pattern : ChordRootPatterns()) {
         const bool isWrong = HeardRoot(net, pattern.mInputs, buffer) != pattern.mRootIntvl;
         if (pattern.mIsOfCatalogue) {
             wrongOfCatalogue += isWrong;

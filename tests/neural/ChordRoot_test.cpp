@@ -87,7 +87,7 @@ TEST_CASE("Both methods hear the root of plain chords in every key and inversion
 
 TEST_CASE("The net hears the same root in every octave and key") {
     CalculateAsRootNet();
-    for (const TChordRootPattern& pattern : ChordRootPatterns()) {
+    for (const CChordRootPattern& pattern : ChordRootPatterns()) {
         if (pattern.mOmission != TOmission_None || (pattern.mInputs & (1U << 12U)) != 0) continue;
         const int lowest = static_cast<int>(pattern.mInputs % 67U) + 12;
         CMySet<unsigned char> noteNrs;

@@ -203,11 +203,11 @@ TEST_CASE("Files that ask for too much are refused, impossible counts are mended
 }
 
 TEST_CASE("Weights are read behind their heading, a short file leaves the others") {
-    struct TCase {
+    struct CCase {
         std::string mText;
         std::vector<double> mWeights;
     };
-    const TCase cases[] = {
+    const CCase cases[] = {
         {"1\n2\n3\n", kWeights},
         {"weight definitions:\n1\n", kWeights},
         {"1\nweight definitions\n9\n-8.5e0 and a remark",
@@ -217,7 +217,7 @@ TEST_CASE("Weights are read behind their heading, a short file leaves the others
         {"weight definitions\n" + std::string(499, ' ') + "71\n",
          {7.0, 1.0, 1e-7, 12.8459, 3.0, 1234567.0}},
     };
-    for (const TCase& test : cases) {
+    for (const CCase& test : cases) {
         CAPTURE(test.mText);
         CHECK(LoadedWeights(test.mText) == test.mWeights);
     }

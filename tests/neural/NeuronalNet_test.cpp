@@ -36,7 +36,7 @@ TEST_CASE("A net of any type gives its outputs for its inputs") {
 }
 
 TEST_CASE("A net takes the weights of a record only if the whole shape is its own") {
-    struct TCase {
+    struct CCase {
         const char* mProperty;
         std::function<void(TPredefinedWeights&)> mChange;
         bool mIsAcquired;
@@ -44,7 +44,7 @@ TEST_CASE("A net takes the weights of a record only if the whole shape is its ow
     const auto neuron = [](TPredefinedWeights& record) -> TNeuronProp& {
         return record.mDynNetProp.mNeuronProp;
     };
-    const TCase cases[] = {
+    const CCase cases[] = {
         {"none", [](auto&) {}, true},
         {"a size of no layer", [](auto& r) { r.mDynNetProp.mHiddenLayerSizes[3] = 7; }, true},
         {"inputs", [](auto& r) { r.mFixedNetProp.mInputNeuronCount = 3; }, false},
@@ -58,7 +58,7 @@ TEST_CASE("A net takes the weights of a record only if the whole shape is its ow
         {"output type", [&](auto& r) { neuron(r).mOutputType = OUTPUT_BIN; }, false},
         {"output threshold", [&](auto& r) { neuron(r).mOutputThreshold = 1.0; }, false},
     };
-    for (const TCase& test : cases) {
+    for (const CCase& test : cases) {
         CAPTURE(test.mProperty);
         NeuronalNet net(SmallRecord().mFixedNetProp, SmallRecord().mDynNetProp);
         const std::vector<double> before = net.get_weights();

@@ -16,14 +16,14 @@ using brindle::test::CScratchFolder;
 
 namespace {
 
-struct TZipEntry {
+struct CZipEntry {
     const char* mName;
     std::string mContents;
 };
 
-std::string ZipOf(const std::string& path, const std::vector<TZipEntry>& entries) {
+std::string ZipOf(const std::string& path, const std::vector<CZipEntry>& entries) {
     zip_t* archive = zip_open(path.c_str(), ZIP_CREATE | ZIP_TRUNCATE, nullptr);
-    for (const TZipEntry& entry : entries) {
+    for (const CZipEntry& entry : entries) {
         zip_source_t* source =
             zip_source_buffer(archive, entry.mContents.data(), entry.mContents.size(), 0);
         zip_file_add(archive, entry.mName, source, ZIP_FL_ENC_UTF_8);

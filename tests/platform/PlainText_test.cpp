@@ -10,12 +10,12 @@
 using namespace brindle;
 
 TEST_CASE("Numbers stand right-aligned in their field whatever the stream was told") {
-    struct TRow {
+    struct CRow {
         double mValue;
         const char* mText;
     };
     constexpr double kInfinity = std::numeric_limits<double>::infinity();
-    const TRow rows[] = {
+    const CRow rows[] = {
         {1.0, "  1.00"},
         {-0.125, " -0.12"},
         {128.0, "128.00"},
@@ -24,7 +24,7 @@ TEST_CASE("Numbers stand right-aligned in their field whatever the stream was to
         {-kInfinity, "  -inf"},
         {std::numeric_limits<double>::quiet_NaN(), "   nan"},
     };
-    for (const TRow& row : rows) {
+    for (const CRow& row : rows) {
         std::ostringstream stream;
         stream << std::left << std::setfill('*') << std::scientific << std::setw(12);
         PlainText::WriteFixed(stream, row.mValue);

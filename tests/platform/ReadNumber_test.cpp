@@ -6,12 +6,12 @@
 using namespace brindle;
 
 TEST_CASE("Numbers at the front of a text are read free of the locale and within limits") {
-    struct TRow {
+    struct CRow {
         const char* mText;
         std::int32_t mInteger;
         double mDouble;
     };
-    const TRow rows[] = {
+    const CRow rows[] = {
         {"12", 12, 12.0},
         {" \n-7.5x", -7, -7.5},
         {"+3e2", 3, 300.0},
@@ -26,7 +26,7 @@ TEST_CASE("Numbers at the front of a text are read free of the locale and within
         {"-99999999999", -2147483647 - 1, -99999999999.0},
         {"1,5", 1, 1.0},
     };
-    for (const TRow& row : rows) {
+    for (const CRow& row : rows) {
         CAPTURE(row.mText);
         CHECK(ReadInteger(row.mText) == row.mInteger);
         CHECK(ReadDecimal(row.mText) == row.mDouble);

@@ -21,12 +21,12 @@ CChordGrid GridOf(const std::string& frets) {
 }
 
 TEST_CASE("A grid shows four frets from the nut, or from its lowest fret where it lies higher") {
-    struct TCase {
+    struct CCase {
         const char* mFrets;
         int mFirst;
         int mCount;
     };
-    const TCase cases[] = {
+    const CCase cases[] = {
         {"x32010", 0, 4},  // C
         {"022444", 0, 4},  // reaches the fourth fret
         {"x35553", 2, 4},  // beyond it: from its lowest
@@ -43,11 +43,11 @@ TEST_CASE("A grid shows four frets from the nut, or from its lowest fret where i
 }
 
 TEST_CASE("A letter a tritone away from the usual string is tuned down to") {
-    struct TCase {
+    struct CCase {
         const char* mText;
         const char* mTuning;
     };
-    const TCase cases[] = {
+    const CCase cases[] = {
         {"EADGBE", "E2 A2 D3 G3 B3 E4"},        {"DADGAD", "D2 A2 D3 G3 A3 D4"},
         {"BbADGBE", "Bb1 A2 D3 G3 B3 E4"},      {"EEbDGBE", "E2 D#2 D3 G3 B3 E4"},
         {"E\u266DADGBE", "D#2 A2 D3 G3 B3 E4"}, {"GDAE", "G2 D3 A3 E4"},

@@ -43,14 +43,14 @@ std::string Sentence(std::string_view text, std::size_t ix, CSignKeyLite key = {
     return Explain(song, ReadSongHarmony(song, options)).at(ix);
 }
 
-struct TExplained {
+struct CExplained {
     std::string_view mSong;
     std::size_t mChord;
     std::string_view mSentence;
 };
 
 // clang-format off
-constexpr auto kExplained = std::to_array<TExplained>({
+constexpr auto kExplained = std::to_array<CExplained>({
     {"C F G7 C", 3, "C is the tonic of C major."},
     {"C Am F G7 C", 1, "Am is vi in C major, with the function of a tonic."},
     {"C Am Dm F C", 2, "Dm is ii in C major, with the function of a subdominant."},
@@ -79,14 +79,14 @@ constexpr auto kExplained = std::to_array<TExplained>({
     {"Am Ammaj7 Am7 Am6 Dm E7 Am", 2, "Am7 keeps the root of Ammaj7 while one voice moves."},
 });
 
-struct TTranslated {
+struct CTranslated {
     std::string_view mLanguage;
     std::string_view mSong;
     std::size_t mChord;
     std::string_view mSentence;
 };
 
-constexpr auto kTranslated = std::to_array<TTranslated>({
+constexpr auto kTranslated = std::to_array<CTranslated>({
     {"de", "C E7 Am F G7 C", 1, "E7 ist die Dominante von a-Moll, das folgt."},
     {"fr", "C E7 Am F G7 C", 1, "E7 est la dominante de la mineur, qui suit."},
     {"es", "C E7 Am F G7 C", 1, "E7 es la dominante de la menor, que le sigue."},
@@ -111,14 +111,14 @@ std::set<std::string> PlacesIn(std::string_view text) {
 
 TEST_CASE("Each relation has a sentence that is true of it") {
     const CSpeaking english("en");
-    for (const TExplained& row : kExplained) {
+    for (const CExplained& row : kExplained) {
         CAPTURE(row.mSong);
         CHECK(Sentence(row.mSong, row.mChord) == row.mSentence);
     }
 }
 
 TEST_CASE("Sentences come in the words of a language, with its names of keys") {
-    for (const TTranslated& row : kTranslated) {
+    for (const CTranslated& row : kTranslated) {
         const CSpeaking speaking{std::string(row.mLanguage)};
         CAPTURE(row.mSong);
         CHECK(Sentence(row.mSong, row.mChord) == row.mSentence);

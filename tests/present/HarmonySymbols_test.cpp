@@ -27,11 +27,11 @@ TMusicXMLHarmony HarmonyOf(const std::string& kind) {
 }
 
 TEST_CASE("Harmonies of scores are written as people type them, and read back") {
-    struct TCase {
+    struct CCase {
         const char* mKind;
         const char* mSymbol;
     };
-    const TCase cases[] = {
+    const CCase cases[] = {
         {"<kind>major</kind>", "Ab"},
         {"<kind>half-diminished</kind>", "Abm7b5"},
         {"<kind>major-minor</kind>", "Abm(maj7)"},

@@ -26,7 +26,7 @@ namespace fs = std::filesystem;
 using namespace LeadSheet;
 
 CSong EvenSong(std::string_view text) {
-    CSongPrefs prefs;
+    CSongOptions prefs;
     prefs.mEven = true;
     return ReadSong(text, prefs);
 }
@@ -159,12 +159,12 @@ CSong SongOfBars(std::string_view chords, const std::vector<std::array<std::size
 }
 
 TEST_CASE("Endings, several times, jumps and nonsense") {
-    struct TRow {
+    struct CRow {
         const char* mBars;
         std::vector<std::array<std::size_t, 3>> mRepeats;  // source, again, count
         const char* mShown;
     };
-    const TRow rows[] = {
+    const CRow rows[] = {
         {"CFGCFA", {{0, 3, 2}}, "|: C | F | [1. G :| [2. A "},
         {"CFCFCF", {{0, 2, 2}, {0, 4, 2}}, "|: C | F :x3 "},
         {"CFCFCF", {{0, 2, 2}, {2, 4, 2}}, "|: C | F :x3 "},
@@ -179,7 +179,7 @@ TEST_CASE("Endings, several times, jumps and nonsense") {
         {"CFCF", {{2, 2, 2}, {3, 2, 1}}, "| C | F | C | F "},
         {"CFCF", {{0, 2, 1'000'000}}, "|: C | F :"},
     };
-    for (const TRow& row : rows) {
+    for (const CRow& row : rows) {
         INFO(row.mBars);
         CHECK(Shown(SongOfBars(row.mBars, row.mRepeats)) == row.mShown);
     }
@@ -189,7 +189,7 @@ TEST_CASE("Endings, several times, jumps and nonsense") {
 }
 
 TEST_CASE("A long rest is one bar, and bars are counted where a song has none") {
-    CSongPrefs prefs;
+    CSongOptions prefs;
     prefs.mBeatsPerChord = 2.0;
     CHECK(Shown(ReadSong("C F G", prefs)) == "| C F | G ");
     CHECK(Shown(ReadSong("(48,C);(4,F)")) == "| C | (11) | F ");

@@ -49,14 +49,14 @@ TEST_CASE("Of several chords at one place the last one sounds and the others las
 }
 
 TEST_CASE("A length of bars that no music has is four beats") {
-    struct TRow {
+    struct CRow {
         int mNumerator;
         int mDenominator;
         double mBeats;
     };
-    const TRow rows[] = {{3, 4, 3.0},       {6, 8, 3.0},    {1, 256, 1.0 / 64}, {1, 512, 4.0},
+    const CRow rows[] = {{3, 4, 3.0},       {6, 8, 3.0},    {1, 256, 1.0 / 64}, {1, 512, 4.0},
                          {1024, 4, 1024.0}, {1025, 4, 4.0}, {0, 4, 4.0},        {4, 0, 4.0}};
-    for (const TRow& row : rows) {
+    for (const CRow& row : rows) {
         CAPTURE(row.mNumerator);
         CAPTURE(row.mDenominator);
         TMusicXMLDoc sheet;

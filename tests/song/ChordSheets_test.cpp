@@ -23,7 +23,7 @@ std::string Shown(const CSong& reading) {
     return text;
 }
 
-std::string Shown(std::string_view text, const CSongPrefs& prefs = {}) {
+std::string Shown(std::string_view text, const CSongOptions& prefs = {}) {
     const CSong reading = ReadSong(text, prefs);
     for (const CSongFault& fault : reading.mFaults) {
         return fmt::format("{}:{}: {}", fault.mLine, fault.mColumn, fault.mText);
@@ -31,7 +31,7 @@ std::string Shown(std::string_view text, const CSongPrefs& prefs = {}) {
     return Shown(reading);
 }
 
-std::string Sections(std::string_view text, const CSongPrefs& prefs = {}) {
+std::string Sections(std::string_view text, const CSongOptions& prefs = {}) {
     std::string shown;
     for (const CSongSection& section : ReadSong(text, prefs).mSections) {
         shown +=
@@ -43,11 +43,11 @@ std::string Sections(std::string_view text, const CSongPrefs& prefs = {}) {
 }  // namespace
 
 TEST_CASE("A song is put in time by its bar lines, holds and repeats") {
-    struct TRow {
+    struct CRow {
         const char* mText;
         const char* mShown;
     };
-    const TRow rows[] = {
+    const CRow rows[] = {
         {"", ""},
         {"| . |", ""},
         {"C F | G7 . . . | C", "C@0 F@1 G7@4 C@8 end@12"},
@@ -70,7 +70,7 @@ TEST_CASE("A song is put in time by its bar lines, holds and repeats") {
         {"N.C. | C X", "N.C.@0 C@4 X@5 end@8"},
         {"{Verse} C | {Chorus 2} F", "C@0 F@4 end@8"},
     };
-    for (const TRow& row : rows) {
+    for (const CRow& row : rows) {
         CAPTURE(row.mText);
         CHECK(Shown(row.mText) == row.mShown);
     }
@@ -78,7 +78,7 @@ TEST_CASE("A song is put in time by its bar lines, holds and repeats") {
 }
 
 TEST_CASE("The chords of a bar share it evenly when asked") {
-    const CSongPrefs even{.mEven = true};
+    const CSongOptions even{.mEven = true};
     CHECK(Shown("C F G | Am . F | C", even) == "C@0 F@1.333 G@2.667 Am@4 F@6 C@8 end@12");
     CHECK(Shown("C F G", even) == "C@0 F@1 G@2 end@3");
 }
@@ -105,11 +105,11 @@ TEST_CASE("A song with any H is German as a whole") {
 }
 
 TEST_CASE("The first fault of a song is told with its line and column") {
-    struct TRow {
+    struct CRow {
         const char* mText;
         const char* mShown;
     };
-    const TRow rows[] = {
+    const CRow rows[] = {
         {"C F\n| G♭7 Cm7x9 | Hello", R"(2:10: Cm7x9: "x" at 4 is not understood)"},
         {"C | {Verse", R"(1:5: "{" has no "}" behind it)"},
         {"% | C", "1:1: there is no bar before this one to repeat"},
@@ -117,7 +117,7 @@ TEST_CASE("The first fault of a song is told with its line and column") {
         {"C [64 F", "1:3: an ending has a number from 1 to 63"},
         {"|: C :| Zzz", R"(1:9: Zzz: a chord begins with a note A to H, "Zzz" at 1 is none)"},
     };
-    for (const TRow& row : rows) {
+    for (const CRow& row : rows) {
         CAPTURE(row.mText);
         CHECK(Shown(row.mText) == row.mShown);
         CHECK(ReadSong(row.mText).mChords.empty());
@@ -148,7 +148,7 @@ TEST_CASE("Lyrics with chords in brackets are read") {
 }
 
 TEST_CASE("Packed charts are read") {
-    const CSongPrefs chart{.mFormat = TSongFormat_Chart};
+    const CSongOptions chart{.mFormat = TSongFormat_Chart};
     CHECK(Shown("[T44C^7 |A-7 D7 |G7sus,p,B7alt,p|Eh7/Bb W/A Z", chart) ==
           "C^7@0 A-7@4 D7@6 G7sus@8 B7alt@10 Eh7/Bb@12 W/A@14 end@16");
     const std::string song =
@@ -161,7 +161,7 @@ TEST_CASE("Packed charts are read") {
     CHECK(reading.mStatedKey == CSignKeyLite("Eb major"));
     const CChordLite sameWithBass = ReadSong("C^7W/G", chart).mChords[1];
     CHECK(sameWithBass == CChordLite(CKeyEnh_C, CKeyEnh_G, CSemitones{0, 4, 7, 11}));
-    const CSongPrefs german{.mFormat = TSongFormat_Chart, .mChordTextPrefs{.mBIsBFlat = true}};
+    const CSongOptions german{.mFormat = TSongFormat_Chart, .mChordTextPrefs{.mBIsBFlat = true}};
     CHECK(ReadSong("C^7W/B", german).mChords[1].mBassKeyEnh == CKeyEnh(10, TEnh_b));
     CHECK(Shown("C^7 |?", chart) == R"(1:6: "?" is not understood)");
 }

@@ -41,11 +41,11 @@ const char* const kBlues =
 }  // namespace
 
 TEST_CASE("A source is read as what it looks like") {
-    struct TRow {
+    struct CRow {
         TSongFormat mFormat;
         const char* mSource;
     };
-    const TRow rows[] = {
+    const CRow rows[] = {
         {TSongFormat_ChordText, "Dm7 G7 | C . . . |"},
         {TSongFormat_ChordText, "C F Hello"},
         {TSongFormat_ChordText, "Hello | C"},
@@ -73,7 +73,7 @@ TEST_CASE("A source is read as what it looks like") {
         {TSongFormat_ChordsAboveLyrics, "Am\nGo Down\nAm   E\nAm I blue\n"},
         {TSongFormat_ChordsAboveLyrics, "e|--3--5--|\nB|--0--0--|\n\nC\nDown by the river"},
     };
-    for (const TRow& row : rows) {
+    for (const CRow& row : rows) {
         CAPTURE(row.mSource);
         CHECK(SongFormatOf(row.mSource) == row.mFormat);
     }
@@ -133,11 +133,11 @@ TEST_CASE("Directives of lyrics with chords are kept") {
 }
 
 TEST_CASE("Typed songs are played as scores are") {
-    struct TRow {
+    struct CRow {
         const char* mText;
         const char* mShown;
     };
-    const TRow rows[] = {
+    const CRow rows[] = {
         {"C | F Fine | G | D.C. al Fine", "C F G C F"},
         {"C | F Fine | G | D C al Fine", "C F G C F"},
         {"C | F Fine | G | D. C.", "C F G C F"},
@@ -153,7 +153,7 @@ TEST_CASE("Typed songs are played as scores are") {
         {"|: C [1 F :| [2 G Fine :| Am | D.C. al Fine", "C F C G Am C G"},
         {"Verse: C F To Coda G D.C. al Coda Coda: Am", "C F G C F Am"},
     };
-    for (const TRow& row : rows) {
+    for (const CRow& row : rows) {
         CAPTURE(row.mText);
         CHECK(Played(ReadSong(row.mText)) == row.mShown);
     }

@@ -46,8 +46,8 @@ std::string ReadFile(const std::string& path) {
     return {std::istreambuf_iterator<char>(file), {}};
 }
 
-TTranscript ReadTranscript(std::string_view text) {
-    TTranscript transcript;
+CTranscript ReadTranscript(std::string_view text) {
+    CTranscript transcript;
     std::istringstream lines{std::string(text)};
     for (std::string line; std::getline(lines, line);) {
         if (line.compare(0, kPrompt.size(), kPrompt) == 0) {
@@ -61,20 +61,20 @@ TTranscript ReadTranscript(std::string_view text) {
     return transcript;
 }
 
-std::string WriteTranscript(const TTranscript& transcript) {
+std::string WriteTranscript(const CTranscript& transcript) {
     std::string text = transcript.mPreamble;
-    for (const TConsoleRun& run : transcript.mRuns) {
+    for (const CConsoleRun& run : transcript.mRuns) {
         text += std::string(kPrompt) + run.mCommand + '\n' + run.mShown;
     }
     return text;
 }
 
-TConsoleRun RunCommand(const std::string& command) {
+CConsoleRun RunCommand(const std::string& command) {
     const CScratchFolder scratch;
     std::ofstream(scratch.File("script")) << Script(scratch, command);
     const int outcome = std::system(("bash '" + scratch.File("script") + "'").c_str());
 
-    TConsoleRun run{command, {}};
+    CConsoleRun run{command, {}};
     AppendLines(run.mShown, ReadFile(scratch.File("out")));
     const std::string errors = ReadFile(scratch.File("err"));
     if (!errors.empty()) {

@@ -8,7 +8,7 @@
 namespace brindle::test {
 
 /// A command line and all that it shows.
-struct TConsoleRun {
+struct CConsoleRun {
     std::string mCommand;
     /// The standard output; behind it, if there is any, the line "[stderr]" and the standard error;
     /// behind that the line "[status N]" unless N is 0. An output whose last line does not end is
@@ -17,18 +17,18 @@ struct TConsoleRun {
 };
 
 /// Commands with what they show, as a terminal would: each command on a line behind "$ ".
-struct TTranscript {
+struct CTranscript {
     /// What stands before the first command.
     std::string mPreamble;
-    std::vector<TConsoleRun> mRuns;
+    std::vector<CConsoleRun> mRuns;
 };
 
-[[nodiscard]] TTranscript ReadTranscript(std::string_view text);
-[[nodiscard]] std::string WriteTranscript(const TTranscript& transcript);
+[[nodiscard]] CTranscript ReadTranscript(std::string_view text);
+[[nodiscard]] std::string WriteTranscript(const CTranscript& transcript);
 
 /// Runs the command in a shell. `brindle` and `./run.sh` are the program of this build, and the
 /// folder that it runs in holds the examples and the lead sheets and else nothing.
-[[nodiscard]] TConsoleRun RunCommand(const std::string& command);
+[[nodiscard]] CConsoleRun RunCommand(const std::string& command);
 
 /// The whole file; fails the test if it is not there.
 [[nodiscard]] std::string ReadFile(const std::string& path);

@@ -62,11 +62,11 @@ TEST_CASE("A key of a dictionary tolerates what others have written into it") {
     const auto read = [](const char* text) {
         return CKeyEnh::JSONDeserializer_Helper::CKeyEnhFromJSONDictionary(json::parse(text));
     };
-    struct TCase {
+    struct CCase {
         const char* mDictionary;
         CKeyEnh mKeyEnh;
     };
-    const TCase cases[] = {
+    const CCase cases[] = {
         {R"({"KeyNr":" 3","Enh":"flat"})", CKeyEnh_Eb},
         {R"({"KeyNr":3,"Enh":"flat"})", CKeyEnh_Eb},
         {R"({"KeyNr":3.9,"Enh":"flat"})", CKeyEnh_Eb},
@@ -83,7 +83,7 @@ TEST_CASE("A key of a dictionary tolerates what others have written into it") {
         {"null", CKeyEnh_Undef},
         {"3", CKeyEnh_Undef},
     };
-    for (const TCase& test : cases) {
+    for (const CCase& test : cases) {
         CAPTURE(test.mDictionary);
         CHECK(read(test.mDictionary) == test.mKeyEnh);
     }

@@ -114,11 +114,11 @@ TEST_CASE("A note keeps its number and spelling through change, name and reading
 TEST_CASE("A note reads as it looks, signs in front of the octave included") {
     CChordNamePrefs prefs;
     prefs.mOctaveNaming = 1;
-    struct TCase {
+    struct CCase {
         const char* mText;
         CNote mNote;
     };
-    const TCase cases[] = {
+    const CCase cases[] = {
         {"C\u266F4", CNote(CKeyEnh_Cis, 4)},
         {" B\u266D\u266D3", CNote(CKeyEnh_Bbb, 3)},
         {"C 4", CNote(CKeyEnh_C, 4)},
@@ -127,7 +127,7 @@ TEST_CASE("A note reads as it looks, signs in front of the octave included") {
         {"X4", CNote_Undef},
         {"", CNote_Undef},
     };
-    for (const TCase& test : cases) {
+    for (const CCase& test : cases) {
         CAPTURE(test.mText);
         CNote note(60, TEnh_n);
         CHECK(note.SetFromString(test.mText, prefs) == !test.mNote.IsUndef());

@@ -98,7 +98,7 @@ TEST_CASE("Scales made from tones are the expected named or custom scales") {
 }
 
 TEST_CASE("A set of steps in the table of scales is never a custom scale") {
-    for (const TScaleRow& row : kScaleCatalogue) {
+    for (const CScaleRow& row : kScaleCatalogue) {
         const CScaleHeavy scale(CKeyEnh_D, row.Semitones());
         const bool isTwin = row.mType == BebopDominant;
         CHECK(scale.ScaleType() == (isTwin ? st_majaddb7 : row.mType));

@@ -101,13 +101,13 @@ TEST_CASE("Every key in one accidental's reach is read back from its name") {
 }
 
 TEST_CASE("A torn sign is no accidental, and a key name may end the text") {
-    struct TCase {
+    struct CCase {
         std::string_view mText;
         CKeyEnh mKeyEnh;
         int mConsumed;
     };
     using namespace std::string_view_literals;
-    const TCase cases[] = {
+    const CCase cases[] = {
         {"C\xE2\x99"sv, CKeyEnh_C, 1},
         {"C\xE2\x99\xAF"sv, CKeyEnh_Cis, 2},
         {"D\xE2\x99\xAD\xE2\x99\xAD"sv, CKeyEnh_Dbb, 3},
@@ -115,7 +115,7 @@ TEST_CASE("A torn sign is no accidental, and a key name may end the text") {
         {"E\0b"sv, CKeyEnh_E, 1},
         {"\0E"sv, CKeyEnh_Undef, 0},
     };
-    for (const TCase& test : cases) {
+    for (const CCase& test : cases) {
         CAPTURE(test.mText);
         CKeyEnh keyEnh;
         int consumed = -1;

@@ -71,7 +71,7 @@ constexpr const char* kOtherTexts[] = {
 };
 
 TEST_CASE("Names of scales and syllables come in the language of the user") {
-    struct TCase {
+    struct CCase {
         const char* mLanguage;
         const char* mDorian;
         const char* mHarmonicMinor;
@@ -80,14 +80,14 @@ TEST_CASE("Names of scales and syllables come in the language of the user") {
         const char* mNotMusicXML;
     };
     // clang-format off
-    const TCase cases[] = {
+    const CCase cases[] = {
         {"de_DE", "Dorisch",  "Harmonisches Moll",  "Re", "Si♭", "Die Datei ist keine MusicXML-Datei"},
         {"fr_FR", "Dorienne", "Mineure harmonique", "Ré", "Si♭", "Le fichier n’est pas un fichier MusicXML"},
         {"es_ES", "Dórica",   "Menor armónica",     "Re", "Si♭", "El archivo no es un archivo MusicXML"},
         {"it_IT", "Dorian",   "Harmonic Minor",     "Re", "Ti♭", "File is not a MusicXML File"},
     };
     // clang-format on
-    for (const TCase& test : cases) {
+    for (const CCase& test : cases) {
         CAPTURE(test.mLanguage);
         const CLanguage language(test.mLanguage);
         CHECK(ScaleName(st_dorian) == test.mDorian);

@@ -28,7 +28,7 @@ Answer AboutType(Question question) {
 }
 
 json RowForm(const json& in) {
-    const TScaleRow& row = CScaleHeavy::mScaleData.at(in.at(0).get<std::size_t>());
+    const CScaleRow& row = CScaleHeavy::mScaleData.at(in.at(0).get<std::size_t>());
     return {{"mType", static_cast<int>(row.mType)},
             {"mName", row.mName},
             {"mDegreesPerOctave", row.mDegreesPerOctave},

@@ -107,7 +107,7 @@ TEST_CASE("A moved note is spelled by the scale, also where that is no usual spe
     int different = 0;
     for (int keyNr = 0; keyNr < 12; ++keyNr) {
         for (const TEnh enh : {TEnh_bb, TEnh_b, TEnh_n, TEnh_s, TEnh_ss}) {
-            for (const TScaleRow& row : kScaleCatalogue) {
+            for (const CScaleRow& row : kScaleCatalogue) {
                 const CScaleHeavy any(CKeyEnh{keyNr, enh}, row.mType);
                 for (int step = 0; step < any.DegreesPerOctave(); ++step) {
                     const CNote start = any.DegreeNrToNote(0, 4);

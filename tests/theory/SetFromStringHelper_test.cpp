@@ -13,14 +13,14 @@ const std::vector<std::string> kMinor{"minor", "mi n", "m"};
 }  // namespace
 
 TEST_CASE("A keyword matches as a prefix or as all that remains, blanks apart") {
-    struct TRow {
+    struct CRow {
         TSpaces mSpaces;
         const char* mText;
         int mPos;
         bool mMatches;
         int mLength;
     };
-    const TRow rows[] = {
+    const CRow rows[] = {
         {TSpaces_AnyRemainder, "a minor third", 2, true, 5},
         {TSpaces_AnyRemainder, "a minor third", 1, false, 0},
         {TSpaces_AnyRemainder, "amx", 1, true, 1},
@@ -36,7 +36,7 @@ TEST_CASE("A keyword matches as a prefix or as all that remains, blanks apart") 
         {TSpaces_WholeRemainder, "min", 0, false, 0},
         {TSpaces_WholeRemainder, "mi  n", 0, false, 0},
     };
-    for (const TRow& row : rows) {
+    for (const CRow& row : rows) {
         CAPTURE(row.mText);
         CAPTURE(row.mPos);
         CHECK(CompareLowercaseStrs(row.mSpaces, kMinor, row.mText, row.mPos) ==

@@ -284,12 +284,12 @@ TEST_CASE("A sign key knows its signature, its relative key and its name in all 
 }
 
 TEST_CASE("With as many sharps as flats a sign key keeps the spelling that it was given") {
-    struct TRow {
+    struct CRow {
         CKeyEnh mGiven;
         TSignKeyType mType;
         CKeyEnh mSpelled;
     };
-    const TRow rows[] = {
+    const CRow rows[] = {
         {CKeyEnh_Fis, TSignKeyType_Major, CKeyEnh_Fis},
         {CKeyEnh_Gb, TSignKeyType_Major, CKeyEnh_Gb},
         {CKeyEnh_Dis, TSignKeyType_Minor, CKeyEnh_Dis},
@@ -304,7 +304,7 @@ TEST_CASE("With as many sharps as flats a sign key keeps the spelling that it wa
         {CKeyEnh_Fbb, TSignKeyType_Major, CKeyEnh_Fbb},
         {CKeyEnh_Undef, TSignKeyType_Major, CKeyEnh_Undef},
     };
-    for (const TRow& row : rows) {
+    for (const CRow& row : rows) {
         CAPTURE(row.mGiven);
         CAPTURE(row.mType);
         CHECK(LeastSigns(row.mGiven, row.mType) == CSignKeyLite(row.mSpelled, row.mType));
@@ -333,11 +333,11 @@ TEST_CASE("Any number of signs ends on a key") {
 }
 
 TEST_CASE("A word that is no type means major, and a sign in UTF-8 reads as it looks") {
-    struct TRow {
+    struct CRow {
         const char* mText;
         CSignKeyLite mSignKey;
     };
-    const TRow rows[] = {
+    const CRow rows[] = {
         {"B♭m", {CKeyEnh_Bb, TSignKeyType_Minor}},
         {"F♯ Minor", {CKeyEnh_Fis, TSignKeyType_Minor}},
         {"C m ", {CKeyEnh_C, TSignKeyType_Minor}},
@@ -347,7 +347,7 @@ TEST_CASE("A word that is no type means major, and a sign in UTF-8 reads as it l
         {"minor", {CKeyEnh_Undef, TSignKeyType_Minor}},
         {"", {CKeyEnh_Undef, TSignKeyType_Major}},
     };
-    for (const TRow& row : rows) {
+    for (const CRow& row : rows) {
         CAPTURE(row.mText);
         CHECK(CSignKeyLite(row.mText) == row.mSignKey);
     }

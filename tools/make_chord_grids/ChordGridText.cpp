@@ -21,31 +21,31 @@ constexpr int kStrings = 6;
 constexpr int kMuted = -1;
 
 /// A finger that lies on several strings, these counted from 0.
-struct TBarre {
+struct CBarre {
     int mFinger = 0;
     int mMinString = 0;
     int mMaxString = 0;
 };
 
 /// A line of the text.
-struct TGridLine {
+struct CGridLine {
     std::string mName;
     std::array<int, kStrings> mFrets{};    // kMuted, 0 for open
     std::array<int, kStrings> mFingers{};  // 0 for none
-    std::vector<TBarre> mBarres;
+    std::vector<CBarre> mBarres;
 };
 
 /// What a chord symbol says, as a database keeps it.
-struct TChordFacts {
+struct CChordFacts {
     int mRoot = 0;
     int mType = 0;
 };
 
-std::optional<TChordFacts> FactsOf(const std::string& symbol) {
+std::optional<CChordFacts> FactsOf(const std::string& symbol) {
     const CChordLite chord(symbol, CChordNamePrefs());
     const CChordTypeId type = GChChordTypeIdForSemitones(chord.mSemitones);
     if (chord.IsUndef() || type == 0) return std::nullopt;
-    return TChordFacts{chord.mRootKeyEnh.mKeyNr, type};
+    return CChordFacts{chord.mRootKeyEnh.mKeyNr, type};
 }
 
 /// One digit or "x" for each string.
@@ -60,16 +60,16 @@ bool ReadStrings(const std::string& word, std::array<int, kStrings>& values) {
 }
 
 /// "1:6-1"
-std::optional<TBarre> ReadBarre(const std::string& word) {
+std::optional<CBarre> ReadBarre(const std::string& word) {
     if (word.size() != 5 || word[1] != ':' || word[3] != '-') return std::nullopt;
-    const TBarre barre{word[0] - '0', kStrings - (word[2] - '0'), kStrings - (word[4] - '0')};
+    const CBarre barre{word[0] - '0', kStrings - (word[2] - '0'), kStrings - (word[4] - '0')};
     const bool isFine = barre.mFinger >= 1 && barre.mFinger <= 4 && barre.mMinString >= 0 &&
                         barre.mMinString < barre.mMaxString && barre.mMaxString < kStrings;
     return isFine ? std::optional(barre) : std::nullopt;
 }
 
-std::optional<TGridLine> ReadGridLine(std::istringstream& words) {
-    TGridLine line;
+std::optional<CGridLine> ReadGridLine(std::istringstream& words) {
+    CGridLine line;
     std::string frets;
     std::string fingers;
     if (!(words >> line.mName >> frets >> fingers)) return std::nullopt;
@@ -84,12 +84,12 @@ std::optional<TGridLine> ReadGridLine(std::istringstream& words) {
     return line;
 }
 
-std::shared_ptr<GChBasicChord> ChordOf(const TGridLine& line, const TChordFacts& facts, int shift) {
+std::shared_ptr<GChBasicChord> ChordOf(const CGridLine& line, const CChordFacts& facts, int shift) {
     auto chord = std::make_shared<GChBasicChord>(kGChStandardGuitar);
     chord->setRootNote((facts.mRoot + shift) % 12);
     chord->setChordType(facts.mType);
     std::array<bool, kStrings> isHeld{};
-    for (const TBarre& barre : line.mBarres) {
+    for (const CBarre& barre : line.mBarres) {
         const auto at = static_cast<std::size_t>(barre.mMinString);
         const auto end = static_cast<std::size_t>(barre.mMaxString);
         const int fret = line.mFrets[at];

@@ -46,7 +46,7 @@ private:
     bool mIsTerminal = isatty(STDERR_FILENO) != 0;
 };
 
-std::vector<double> TrainedWeights(const std::vector<TChordRootPattern>& patterns,
+std::vector<double> TrainedWeights(const std::vector<CChordRootPattern>& patterns,
                                    std::uint64_t seed, int cycles) {
     RootNetTrainer trainer(patterns, seed);
     const ProgressBar bar(cycles);
@@ -101,9 +101,9 @@ int main(int argc, char** argv) {
     app.add_flag("--check", check, "Compare both with those in the source tree");
     CLI11_PARSE(app, argc, argv);
 
-    const std::vector<TChordRootPattern> patterns = ChordRootPatterns();
+    const std::vector<CChordRootPattern> patterns = ChordRootPatterns();
     const std::vector<double> weights = TrainedWeights(patterns, seed, cycles);
-    const THeardRoots heard[] = {HeardByNet(patterns, weights), FoundByScore(patterns)};
+    const CHeardRoots heard[] = {HeardByNet(patterns, weights), FoundByScore(patterns)};
     const std::string table = WeightTableText(weights);
     const std::string figures = fmt::format(
         "Trained with seed {}, {} cycles. The output of the right root stands at least {:.3f} "

@@ -17,18 +17,18 @@ namespace brindle::tools {
 namespace {
 
 /// How many patterns of a group there are, and how many each method gets right.
-struct TCounts {
+struct CCounts {
     std::size_t mPatterns = 0;
     std::vector<std::size_t> mRight;
 };
 
-std::vector<double> InputsOf(const TChordRootPattern& pattern) {
+std::vector<double> InputsOf(const CChordRootPattern& pattern) {
     std::vector<double> inputs(kChordRootInputCount);
     for (std::size_t i = 0; i < inputs.size(); ++i) inputs[i] = (pattern.mInputs >> i & 1U) != 0;
     return inputs;
 }
 
-std::string NameOf(const TChordRootPattern& pattern) {
+std::string NameOf(const CChordRootPattern& pattern) {
     const std::string_view shape = ChordShapes()[pattern.mShape].mName;
     switch (pattern.mOmission) {
         case TOmission_None:
@@ -43,7 +43,7 @@ std::string NameOf(const TChordRootPattern& pattern) {
     return std::string(shape);
 }
 
-std::string NotesOf(const TChordRootPattern& pattern) {
+std::string NotesOf(const CChordRootPattern& pattern) {
     std::string text;
     for (unsigned i = 0; i < kChordRootInputCount; ++i) {
         if ((pattern.mInputs >> i & 1U) != 0) text += fmt::format("{} ", i);
@@ -53,9 +53,9 @@ std::string NotesOf(const TChordRootPattern& pattern) {
 }
 
 template <class Condition>
-TCounts CountsOf(std::span<const TChordRootPattern> patterns, std::span<const THeardRoots> heard,
+CCounts CountsOf(std::span<const CChordRootPattern> patterns, std::span<const CHeardRoots> heard,
                  Condition isInGroup) {
-    TCounts counts;
+    CCounts counts;
     counts.mRight.resize(heard.size());
     for (std::size_t i = 0; i < patterns.size(); ++i) {
         if (!isInGroup(patterns[i])) continue;
@@ -67,17 +67,17 @@ TCounts CountsOf(std::span<const TChordRootPattern> patterns, std::span<const TH
     return counts;
 }
 
-std::string HeadingRows(std::string_view first, std::span<const THeardRoots> heard) {
+std::string HeadingRows(std::string_view first, std::span<const CHeardRoots> heard) {
     std::string names = fmt::format("| {} | patterns |", first);
     std::string lines = "|---|---:|";
-    for (const THeardRoots& method : heard) {
+    for (const CHeardRoots& method : heard) {
         names += fmt::format(" {} | |", method.mMethod);
         lines += "---:|---:|";
     }
     return names + "\n" + lines + "\n";
 }
 
-std::string Row(std::string_view name, const TCounts& counts) {
+std::string Row(std::string_view name, const CCounts& counts) {
     std::string row = fmt::format("| {} | {} |", name, counts.mPatterns);
     for (const std::size_t right : counts.mRight) {
         row += fmt::format(" {} | {:.2f} % |", right,
@@ -87,9 +87,9 @@ std::string Row(std::string_view name, const TCounts& counts) {
     return row + "\n";
 }
 
-std::string GroupTable(std::span<const TChordRootPattern> patterns,
-                       std::span<const THeardRoots> heard) {
-    using TPattern = TChordRootPattern;
+std::string GroupTable(std::span<const CChordRootPattern> patterns,
+                       std::span<const CHeardRoots> heard) {
+    using TPattern = CChordRootPattern;
     std::string text = HeadingRows("group", heard);
     const auto add = [&](std::string_view name, auto isInGroup) {
         text += Row(name, CountsOf(patterns, heard, isInGroup));
@@ -100,15 +100,15 @@ std::string GroupTable(std::span<const TChordRootPattern> patterns,
     return text;
 }
 
-std::string ShapeTable(std::span<const TChordRootPattern> patterns,
-                       std::span<const THeardRoots> heard) {
+std::string ShapeTable(std::span<const CChordRootPattern> patterns,
+                       std::span<const CHeardRoots> heard) {
     std::map<std::pair<TOmission, std::size_t>, std::string> names;
-    for (const TChordRootPattern& pattern : patterns) {
+    for (const CChordRootPattern& pattern : patterns) {
         names.try_emplace({pattern.mOmission, pattern.mShape}, NameOf(pattern));
     }
     std::string text = HeadingRows("shape", heard);
     for (const auto& group : names) {
-        const auto isInGroup = [&](const TChordRootPattern& pattern) {
+        const auto isInGroup = [&](const CChordRootPattern& pattern) {
             return std::pair(pattern.mOmission, pattern.mShape) == group.first;
         };
         text += Row(group.second, CountsOf(patterns, heard, isInGroup));
@@ -116,7 +116,7 @@ std::string ShapeTable(std::span<const TChordRootPattern> patterns,
     return text;
 }
 
-std::string Confusions(std::span<const TChordRootPattern> patterns, const THeardRoots& heard) {
+std::string Confusions(std::span<const CChordRootPattern> patterns, const CHeardRoots& heard) {
     std::string text;
     for (std::size_t i = 0; i < patterns.size(); ++i) {
         if (heard.mRootIntvls[i] == patterns[i].mRootIntvl) continue;
@@ -128,21 +128,21 @@ std::string Confusions(std::span<const TChordRootPattern> patterns, const THeard
 
 }  // namespace
 
-THeardRoots HeardByNet(std::span<const TChordRootPattern> patterns,
+CHeardRoots HeardByNet(std::span<const CChordRootPattern> patterns,
                        std::span<const double> weights) {
     NeuronalNet net(ChordAnalysisNeuronalNet, weights);
-    THeardRoots heard{"net", {}};
-    for (const TChordRootPattern& pattern : patterns) {
+    CHeardRoots heard{"net", {}};
+    for (const CChordRootPattern& pattern : patterns) {
         net.use(InputsOf(pattern));
         heard.mRootIntvls.push_back(static_cast<int>(net.winner()));
     }
     return heard;
 }
 
-THeardRoots FoundByScore(std::span<const TChordRootPattern> patterns) {
+CHeardRoots FoundByScore(std::span<const CChordRootPattern> patterns) {
     constexpr unsigned kLowestC = 48;
-    THeardRoots heard{"score", {}};
-    for (const TChordRootPattern& pattern : patterns) {
+    CHeardRoots heard{"score", {}};
+    for (const CChordRootPattern& pattern : patterns) {
         CMySet<unsigned char> noteNrs;
         for (unsigned i = 0; i < kChordRootInputCount; ++i) {
             if ((pattern.mInputs >> i & 1U) != 0) {
@@ -157,10 +157,10 @@ THeardRoots FoundByScore(std::span<const TChordRootPattern> patterns) {
     return heard;
 }
 
-double LeastMargin(std::span<const TChordRootPattern> patterns, std::span<const double> weights) {
+double LeastMargin(std::span<const CChordRootPattern> patterns, std::span<const double> weights) {
     NeuronalNet net(ChordAnalysisNeuronalNet, weights);
     double least = 1.0;
-    for (const TChordRootPattern& pattern : patterns) {
+    for (const CChordRootPattern& pattern : patterns) {
         net.use(InputsOf(pattern));
         std::vector<double> outputs = net.get_outputs();
         double& right = outputs[static_cast<std::size_t>(pattern.mRootIntvl)];
@@ -170,8 +170,8 @@ double LeastMargin(std::span<const TChordRootPattern> patterns, std::span<const 
     return least;
 }
 
-std::string FiguresText(std::span<const TChordRootPattern> patterns,
-                        std::span<const THeardRoots> heard) {
+std::string FiguresText(std::span<const CChordRootPattern> patterns,
+                        std::span<const CHeardRoots> heard) {
     return GroupTable(patterns, heard) + "\n### By shape\n\n" + ShapeTable(patterns, heard) +
            "\n### Confusions of the " + heard.front().mMethod + "\n\n" +
            Confusions(patterns, heard.front());

@@ -92,7 +92,7 @@ void AppendByNeuron(const TMatrix<inputs, neurons>& weights, std::vector<double>
 
 }  // namespace
 
-RootNetTrainer::RootNetTrainer(std::vector<TChordRootPattern> patterns, std::uint64_t seed)
+RootNetTrainer::RootNetTrainer(std::vector<CChordRootPattern> patterns, std::uint64_t seed)
     : mPatterns(std::move(patterns)), mRandom(seed) {
     Randomize(mWeights.mFirst, mRandom);
     Randomize(mWeights.mSecond, mRandom);
@@ -111,7 +111,7 @@ std::size_t RootNetTrainer::TrainCycle(double stepSize) {
     return mWrongCount;
 }
 
-void RootNetTrainer::_LearnFrom(const TChordRootPattern& pattern) {
+void RootNetTrainer::_LearnFrom(const CChordRootPattern& pattern) {
     std::array<double, kChordRootInputCount> inputs{};
     for (std::size_t i = 0; i < inputs.size(); ++i) inputs[i] = (pattern.mInputs >> i & 1U) != 0;
     const auto first = Forward(mWeights.mFirst, inputs, ScaledThreshold());
@@ -136,7 +136,7 @@ void RootNetTrainer::_Step(double stepSize) {
     mMeanFading *= kMeanMemory;
     mSquareFading *= kSquareMemory;
     const auto step = [&]<std::size_t inputs, std::size_t neurons>(
-                          TMatrix<inputs, neurons> TRootNetNumbers::*layer) {
+                          TMatrix<inputs, neurons> CRootNetNumbers::*layer) {
         for (std::size_t i = 0; i < inputs; ++i) {
             for (std::size_t n = 0; n < neurons; ++n) {
                 const double gradient = (mGradient.*layer)[i][n] / kBatchSize;
@@ -150,9 +150,9 @@ void RootNetTrainer::_Step(double stepSize) {
             }
         }
     };
-    step(&TRootNetNumbers::mFirst);
-    step(&TRootNetNumbers::mSecond);
-    step(&TRootNetNumbers::mOutput);
+    step(&CRootNetNumbers::mFirst);
+    step(&CRootNetNumbers::mSecond);
+    step(&CRootNetNumbers::mOutput);
 }
 
 std::vector<double> RootNetTrainer::Weights() const {

@@ -16,7 +16,7 @@ template <std::size_t inputs, std::size_t neurons>
 using TMatrix = std::array<std::array<double, neurons>, inputs>;
 
 /// One number for each weight of the net that hears roots.
-struct TRootNetNumbers {
+struct CRootNetNumbers {
     TMatrix<24, 15> mFirst{};
     TMatrix<15, 15> mSecond{};
     TMatrix<15, 12> mOutput{};
@@ -34,7 +34,7 @@ struct TRootNetNumbers {
 /// every machine with IEEE doubles, if the compiler neither reorders nor fuses operations.
 class RootNetTrainer {
 public:
-    RootNetTrainer(std::vector<TChordRootPattern> patterns, std::uint64_t seed);
+    RootNetTrainer(std::vector<CChordRootPattern> patterns, std::uint64_t seed);
 
     /// Learns from all patterns once, in a new random order. Returns how many it had wrong.
     std::size_t TrainCycle(double stepSize);
@@ -43,16 +43,16 @@ public:
     [[nodiscard]] std::vector<double> Weights() const;
 
 private:
-    void _LearnFrom(const TChordRootPattern& pattern);
+    void _LearnFrom(const CChordRootPattern& pattern);
     void _Step(double stepSize);
 
-    std::vector<TChordRootPattern> mPatterns;
+    std::vector<CChordRootPattern> mPatterns;
     SeededRandom mRandom;
     std::size_t mWrongCount = 0;
-    TRootNetNumbers mWeights;
-    TRootNetNumbers mGradient;  ///< summed over the batch
-    TRootNetNumbers mMeanGradient;
-    TRootNetNumbers mMeanSquare;
+    CRootNetNumbers mWeights;
+    CRootNetNumbers mGradient;  ///< summed over the batch
+    CRootNetNumbers mMeanGradient;
+    CRootNetNumbers mMeanSquare;
     double mMeanFading = 1.0;    ///< share that the start at 0 still has in the means
     double mSquareFading = 1.0;  ///< the same for the mean squares
 };

@@ -32,13 +32,13 @@ constexpr std::string_view kTail = R"(};
 }  // namespace brindle
 )";
 
-struct TLayer {
+struct CLayer {
     std::string_view mName;
     std::size_t mNeurons;
     std::size_t mInputs;
 };
 
-constexpr TLayer kLayers[] = {
+constexpr CLayer kLayers[] = {
     {"Hidden layer 0: from the notes of two octaves above the lowest.", 15, 24},
     {"Hidden layer 1.", 15, 15},
     {"Output neurons: how many semitones the root is above the lowest note.", 12, 15},
@@ -64,7 +64,7 @@ std::vector<double> RoundedToSixDigits(std::span<const double> weights) {
 
 std::string WeightTableText(std::span<const double> weights) {
     std::string text(kHead);
-    for (const TLayer& layer : kLayers) {
+    for (const CLayer& layer : kLayers) {
         text += fmt::format("\n    // {}\n", layer.mName);
         for (std::size_t neuron = 0; neuron < layer.mNeurons; ++neuron) {
             text += NeuronText(weights.first(layer.mInputs));

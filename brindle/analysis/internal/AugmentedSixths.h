@@ -11,15 +11,15 @@ namespace brindle {
 
 /// An augmented sixth chord. The French one is counted from its second degree, the others from the
 /// flat sixth, which is the bass of all of them.
-struct TAugmentedSixth {
+struct CAugmentedSixth {
     std::string_view mWord;
-    TNumeralDegree mRoot;
+    CNumeralDegree mRoot;
     CSemitones mSemitones;
     int mStepRoot;  ///< from which tones in brackets are counted, in semitones above the root
 };
 
 // clang-format off
-inline constexpr auto kAugmentedSixths = std::to_array<TAugmentedSixth>({
+inline constexpr auto kAugmentedSixths = std::to_array<CAugmentedSixth>({
     {"It",  {6, -1}, {0, 4, 10},   10},  // Ab C F#
     {"Ger", {6, -1}, {0, 4, 7, 10}, 10},  // Ab C Eb F#
     {"Gr",  {6, -1}, {0, 4, 7, 10}, 10},
@@ -30,7 +30,7 @@ inline constexpr auto kAugmentedSixths = std::to_array<TAugmentedSixth>({
 // clang-format on
 
 /// A figure of such a chord: the tone that it puts into the bass, in semitones above the root.
-struct TAugmentedSixthFigure {
+struct CAugmentedSixthFigure {
     std::string_view mText;
     int mBassInMost;
     int mBassInFrench;
@@ -39,7 +39,7 @@ struct TAugmentedSixthFigure {
 // A chord without a figure, and one with a bare 6, has the flat sixth in the bass. The others count
 // from the raised fourth in most chords, from the second degree in the French one.
 // clang-format off
-inline constexpr auto kAugmentedSixthFigures = std::to_array<TAugmentedSixthFigure>({
+inline constexpr auto kAugmentedSixthFigures = std::to_array<CAugmentedSixthFigure>({
     {"",      0,  6},
     {"6",     0,  6},
     {"63",    0,  6},

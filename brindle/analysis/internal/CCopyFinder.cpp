@@ -37,20 +37,20 @@ CCopyFinder::CCopyFinder(const CHarmAnlsChordsWithLength& chords,
         std::sort(mStarts.begin(), mStarts.end(), ComesFirst);
     }
     // Counted one place higher, so that filling leaves the begin of each place.
-    for (const TStart& at : mStarts) ++mFirstAtPlace[at.mPlace + 2];
+    for (const CStart& at : mStarts) ++mFirstAtPlace[at.mPlace + 2];
     std::partial_sum(mFirstAtPlace.begin(), mFirstAtPlace.end(), mFirstAtPlace.begin());
     mSequencesByPlace.resize(mStarts.size());
-    for (const TStart& at : mStarts) {
+    for (const CStart& at : mStarts) {
         mSequencesByPlace[mFirstAtPlace[at.mPlace + 1]++] = at.mSequence;
     }
 }
 
-void CCopyFinder::AppendCopies(std::int32_t position, std::vector<TCopiedPassage>& copies) {
+void CCopyFinder::AppendCopies(std::int32_t position, std::vector<CCopiedPassage>& copies) {
     Fill(0, static_cast<TPlace>(mChords.size()), position, mStarts, copies);
 }
 
 void CCopyFinder::Fill(TPlace first, TPlace end, std::int32_t position, const TStarts& starts,
-                       std::vector<TCopiedPassage>& copies) {
+                       std::vector<CCopiedPassage>& copies) {
     std::vector<std::int32_t> beatsTo;
     TStarts free;
     for (auto next = starts.begin(); next != starts.end();) {
@@ -67,10 +67,10 @@ void CCopyFinder::Fill(TPlace first, TPlace end, std::int32_t position, const TS
 
 void CCopyFinder::FillFromSequence(const TStarts& places, TPlace first,
                                    const std::vector<std::int32_t>& beatsTo, std::int32_t position,
-                                   std::vector<TCopiedPassage>& copies) {
+                                   std::vector<CCopiedPassage>& copies) {
     const TPlace source = places.front().mPlace;
     const TPlace length = LengthOf(places.front().mSequence);
-    for (const TStart& start : places) {
+    for (const CStart& start : places) {
         const TPlace place = start.mPlace;
         const std::int32_t target = AddLimited(position, beatsTo[place - first]);
         if (&start == &places.front()) {
@@ -86,7 +86,7 @@ void CCopyFinder::FillFromSequence(const TStarts& places, TPlace first,
 
 // The chords of the source are still free, and are covered as soon as this returns.
 void CCopyFinder::FillFromSource(TPlace source, TPlace length, std::int32_t position,
-                                 std::vector<TCopiedPassage>& copies) {
+                                 std::vector<CCopiedPassage>& copies) {
     TStarts starts;
     for (TPlace place = source; place < source + length; ++place) {
         for (std::size_t n = mFirstAtPlace[place]; n < mFirstAtPlace[place + 1]; ++n) {
@@ -105,13 +105,13 @@ TPlace CCopyFinder::LengthOf(TPlace sequence) const {
     return static_cast<TPlace>(mSequences[sequence].second);
 }
 
-bool CCopyFinder::IsFree(const TStart& start) const {
+bool CCopyFinder::IsFree(const CStart& start) const {
     const TPlace last = start.mPlace + LengthOf(start.mSequence) - 1;
     const TPlace covered = mCovered.LastUpTo(last);
     return covered == kNoPlace || covered < start.mPlace;
 }
 
-void CCopyFinder::Cover(const TStart& start) {
+void CCopyFinder::Cover(const CStart& start) {
     const TPlace end = start.mPlace + LengthOf(start.mSequence);
     for (TPlace place = start.mPlace; place < end; ++place) mCovered.Insert(place);
 }

@@ -27,29 +27,29 @@ public:
 
     /// Appends the copies; the passage begins at `position` in beats. Their chords are counted from
     /// the first of the passage.
-    void AppendCopies(std::int32_t position, std::vector<TCopiedPassage>& copies);
+    void AppendCopies(std::int32_t position, std::vector<CCopiedPassage>& copies);
 
 private:
-    struct TStart {
+    struct CStart {
         TPlace mSequence;
         TPlace mPlace;
     };
-    using TStarts = std::vector<TStart>;
+    using TStarts = std::vector<CStart>;
 
-    static bool ComesFirst(const TStart& a, const TStart& b) {
+    static bool ComesFirst(const CStart& a, const CStart& b) {
         return a.mSequence != b.mSequence ? a.mSequence < b.mSequence : a.mPlace < b.mPlace;
     }
 
     void Fill(TPlace first, TPlace end, std::int32_t position, const TStarts& starts,
-              std::vector<TCopiedPassage>& copies);
+              std::vector<CCopiedPassage>& copies);
     void FillFromSequence(const TStarts& places, TPlace first,
                           const std::vector<std::int32_t>& beatsTo, std::int32_t position,
-                          std::vector<TCopiedPassage>& copies);
+                          std::vector<CCopiedPassage>& copies);
     void FillFromSource(TPlace source, TPlace length, std::int32_t position,
-                        std::vector<TCopiedPassage>& copies);
+                        std::vector<CCopiedPassage>& copies);
     [[nodiscard]] TPlace LengthOf(TPlace sequence) const;
-    [[nodiscard]] bool IsFree(const TStart& start) const;
-    void Cover(const TStart& start);
+    [[nodiscard]] bool IsFree(const CStart& start) const;
+    void Cover(const CStart& start);
 
     const CHarmAnlsChordsWithLength& mChords;
     const THarmRepeatingSequences& mSequences;

@@ -6,13 +6,13 @@
 namespace brindle {
 namespace {
 
-struct TReplacement {
+struct CReplacement {
     std::string_view mWritten;
     std::string_view mRead;
 };
 
 // What people write for the signs of the tables; longer before shorter.
-constexpr auto kOtherSigns = std::to_array<TReplacement>({
+constexpr auto kOtherSigns = std::to_array<CReplacement>({
     {"maj", "^"},
     {"Maj", "^"},
     {"MAJ", "^"},
@@ -71,7 +71,7 @@ constexpr bool CanBeginSign(char c) {
            c == 'o' || c == '%';
 }
 
-const TReplacement* SignAt(std::string_view text) {
+const CReplacement* SignAt(std::string_view text) {
     if (!CanBeginSign(text.front())) return nullptr;
     const auto sign = std::find_if(kOtherSigns.begin(), kOtherSigns.end(), [&](const auto& row) {
         return row.mWritten.front() == text.front() && text.starts_with(row.mWritten);
@@ -90,7 +90,7 @@ CFoldedNumeral::CFoldedNumeral(std::string_view typed) {
 void CFoldedNumeral::Fold(std::string_view typed) {
     std::size_t at = 0;
     while (at < typed.size() && mFoldedSize < kLongest) {
-        const TReplacement* sign = SignAt(typed.substr(at));
+        const CReplacement* sign = SignAt(typed.substr(at));
         const std::string_view read = sign != nullptr ? sign->mRead : typed.substr(at, 1);
         for (const char c : read) {
             mChars[mFoldedSize] = c;

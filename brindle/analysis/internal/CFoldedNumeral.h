@@ -30,7 +30,7 @@ public:
     [[nodiscard]] bool IsWhole() const { return mIsWhole; }
 
 private:
-    struct TGroup {
+    struct CGroup {
         std::size_t mBegin = 0;
         std::size_t mEnd = 0;
     };
@@ -43,7 +43,7 @@ private:
     std::array<std::uint8_t, kLongest + 1> mOffsets;
     std::size_t mSize = 0;
     std::size_t mFoldedSize = 0;
-    std::array<TGroup, kMostGroups> mGroups{};
+    std::array<CGroup, kMostGroups> mGroups{};
     std::size_t mGroupCount = 0;
     bool mIsWhole = true;
 };

@@ -5,7 +5,7 @@
 
 namespace brindle {
 
-TPlace COccurrences::NextContinuedOtherwise(TPlace place, TRanks continuation) const {
+TPlace COccurrences::NextContinuedOtherwise(TPlace place, CRanks continuation) const {
     return std::min(mSuffixes->NextPlace({mRanks.mFirst, continuation.mFirst}, place),
                     mSuffixes->NextPlace({continuation.mEnd, mRanks.mEnd}, place));
 }

@@ -12,7 +12,7 @@ namespace brindle {
 class COccurrences {
 public:
     /// `ranks` are those of the suffixes that begin with the passage.
-    COccurrences(const CSuffixes& suffixes, TRanks ranks, TPlace length)
+    COccurrences(const CSuffixes& suffixes, CRanks ranks, TPlace length)
         : mSuffixes(&suffixes), mRanks(ranks), mLength(length) {}
 
     [[nodiscard]] TPlace Length() const { return mLength; }
@@ -20,7 +20,7 @@ public:
         return place < mSuffixes->Count() && mRanks.Has(mSuffixes->RankOf(place));
     }
     /// The ranks of the occurrences that go on as this one does.
-    [[nodiscard]] TRanks Continuation(TPlace place) const {
+    [[nodiscard]] CRanks Continuation(TPlace place) const {
         return mSuffixes->RanksOfPassage(place, mLength + 1);
     }
     /// Whether the occurrence has a partner behind it.
@@ -30,7 +30,7 @@ public:
 
     [[nodiscard]] TPlace Next(TPlace place) const { return mSuffixes->NextPlace(mRanks, place); }
     /// That goes on otherwise.
-    [[nodiscard]] TPlace NextContinuedOtherwise(TPlace place, TRanks continuation) const;
+    [[nodiscard]] TPlace NextContinuedOtherwise(TPlace place, CRanks continuation) const;
     /// That has a partner behind it.
     [[nodiscard]] TPlace NextWithPartner(TPlace place);
     /// That another occurrence follows at once. Remembers the last answer, so that places in
@@ -43,7 +43,7 @@ private:
     [[nodiscard]] TPlace PlaceBehindFailedTandem(TPlace place, TPlace follower) const;
 
     const CSuffixes* mSuffixes;
-    TRanks mRanks;
+    CRanks mRanks;
     TPlace mLength;
     // The next tandem from mAskedFrom on.
     TPlace mAskedFrom = kNoPlace;

@@ -5,18 +5,18 @@
 
 namespace brindle {
 
-std::vector<std::uint64_t> CPassageStarts::StartsOf(std::span<const TPassageForm> forms) {
+std::vector<std::uint64_t> CPassageStarts::StartsOf(std::span<const CPassageForm> forms) {
     mStarts.clear();
     mWalks.clear();
-    for (const TPassageForm& form : forms) {
-        TWalk walk{COccurrences(mSuffixes, form.mRanks, form.mLength)};
+    for (const CPassageForm& form : forms) {
+        CFormWalk walk{COccurrences(mSuffixes, form.mRanks, form.mLength)};
         walk.mNext = walk.mOccurrences.NextWithPartner(0);
         if (walk.mNext != kNoPlace) mWalks.push_back(walk);
     }
     std::make_heap(mWalks.begin(), mWalks.end(), ComesLater);
     while (!mWalks.empty()) {
         std::pop_heap(mWalks.begin(), mWalks.end(), ComesLater);
-        TWalk& walk = mWalks.back();
+        CFormWalk& walk = mWalks.back();
         const TPlace place = walk.mNext;
         // Another walk may have taken what this one was to take.
         if (walk.mStage != Stage_First && mWalks.size() > 1) FindNext(walk, place);
@@ -32,12 +32,12 @@ std::vector<std::uint64_t> CPassageStarts::StartsOf(std::span<const TPassageForm
     return {mStarts.begin(), mStarts.end()};
 }
 
-void CPassageStarts::Visit(TWalk& walk) {
+void CPassageStarts::Visit(CFormWalk& walk) {
     const COccurrences& occurrences = walk.mOccurrences;
     const TPlace place = walk.mNext;
     const TPlace length = occurrences.Length();
     if (walk.mStage == Stage_First) {
-        const TRanks continuation = occurrences.Continuation(place);
+        const CRanks continuation = occurrences.Continuation(place);
         TakePartners(occurrences, place, continuation);
         walk.mUnlike = occurrences.NextContinuedOtherwise(place + 1, continuation);
         walk.mStage = Stage_Tandems;
@@ -51,7 +51,7 @@ void CPassageStarts::Visit(TWalk& walk) {
     FindNext(walk, place + 1);
 }
 
-void CPassageStarts::FindNext(TWalk& walk, TPlace place) const {
+void CPassageStarts::FindNext(CFormWalk& walk, TPlace place) const {
     COccurrences& occurrences = walk.mOccurrences;
     walk.mNextAlone = NextToTakeItself(occurrences, std::max(place, walk.mNextAlone));
     walk.mNext = walk.mNextAlone;
@@ -85,7 +85,7 @@ TPlace CPassageStarts::NextToTakeTandem(COccurrences& occurrences, TPlace place)
 }
 
 void CPassageStarts::TakePartners(const COccurrences& occurrences, TPlace place,
-                                  TRanks continuation) {
+                                  CRanks continuation) {
     const TPlace length = occurrences.Length();
     if (occurrences.Has(place + length)) TakeIfFree(place + length, length);
     TPlace next = occurrences.NextContinuedOtherwise(place + length, continuation);

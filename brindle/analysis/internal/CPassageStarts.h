@@ -33,13 +33,13 @@ public:
         : mSuffixes(suffixes), mTaken(suffixes.Count()) {}
 
     /// The starts of a group of forms in ascending order; none if no form has partners.
-    [[nodiscard]] std::vector<std::uint64_t> StartsOf(std::span<const TPassageForm> forms);
+    [[nodiscard]] std::vector<std::uint64_t> StartsOf(std::span<const CPassageForm> forms);
 
 private:
     enum TStage { Stage_First, Stage_Tandems, Stage_Alone };
 
     /// The way over the occurrences of one form.
-    struct TWalk {
+    struct CFormWalk {
         COccurrences mOccurrences;
         TStage mStage = Stage_First;
         TPlace mNext = kNoPlace;
@@ -50,13 +50,13 @@ private:
         TPlace mUnlike = kNoPlace;
     };
 
-    static bool ComesLater(const TWalk& a, const TWalk& b) { return a.mNext > b.mNext; }
+    static bool ComesLater(const CFormWalk& a, const CFormWalk& b) { return a.mNext > b.mNext; }
 
-    void Visit(TWalk& walk);
-    void FindNext(TWalk& walk, TPlace place) const;
+    void Visit(CFormWalk& walk);
+    void FindNext(CFormWalk& walk, TPlace place) const;
     [[nodiscard]] TPlace NextToTakeItself(COccurrences& occurrences, TPlace place) const;
     [[nodiscard]] TPlace NextToTakeTandem(COccurrences& occurrences, TPlace place) const;
-    void TakePartners(const COccurrences& occurrences, TPlace place, TRanks continuation);
+    void TakePartners(const COccurrences& occurrences, TPlace place, CRanks continuation);
     void TakeIfFree(TPlace place, TPlace length);
     /// The end of the passage that was taken over a place; the place itself if it is free.
     [[nodiscard]] TPlace FreeFrom(TPlace place, TPlace length) const;
@@ -64,7 +64,7 @@ private:
     const CSuffixes& mSuffixes;
     CPlaceSet mTaken;
     std::vector<TPlace> mStarts;
-    std::vector<TWalk> mWalks;  // a heap, the next to visit on top
+    std::vector<CFormWalk> mWalks;  // a heap, the next to visit on top
 };
 
 }  // namespace brindle

@@ -128,8 +128,8 @@ TPlace CSuffixes::EqualCount(TPlace a, TPlace b) const {
     return std::min(minima[low + 1], minima[high + 1 - (TPlace{1} << level)]);
 }
 
-TRanks CSuffixes::RanksOfPassage(TPlace place, TPlace count) const {
-    TRanks ranks{mRankOfPlace[place], mRankOfPlace[place] + 1};
+CRanks CSuffixes::RanksOfPassage(TPlace place, TPlace count) const {
+    CRanks ranks{mRankOfPlace[place], mRankOfPlace[place] + 1};
     for (std::size_t level = mShared.size(); level-- > 0;) {
         const TPlace step = TPlace{1} << level;
         // The entry of a rank compares it with the rank before, and nothing is before rank 0.
@@ -143,28 +143,28 @@ TRanks CSuffixes::RanksOfPassage(TPlace place, TPlace count) const {
     return ranks;
 }
 
-TRanks CSuffixes::Zeros(std::size_t level, TRanks ranks) const {
+CRanks CSuffixes::Zeros(std::size_t level, CRanks ranks) const {
     return {mZerosBefore[level][ranks.mFirst], mZerosBefore[level][ranks.mEnd]};
 }
 
-TRanks CSuffixes::Ones(std::size_t level, TRanks ranks) const {
-    const TRanks zeros = Zeros(level, ranks);
+CRanks CSuffixes::Ones(std::size_t level, CRanks ranks) const {
+    const CRanks zeros = Zeros(level, ranks);
     const TPlace allZeros = mZerosBefore[level].back();
     return {allZeros + ranks.mFirst - zeros.mFirst, allZeros + ranks.mEnd - zeros.mEnd};
 }
 
 /// The smallest of the places that are left at a level, whose higher bits are equal.
-TPlace CSuffixes::SmallestPlace(std::size_t level, TRanks ranks) const {
+TPlace CSuffixes::SmallestPlace(std::size_t level, CRanks ranks) const {
     TPlace lowBits = 0;
     while (level-- > 0) {
-        const TRanks zeros = Zeros(level, ranks);
+        const CRanks zeros = Zeros(level, ranks);
         if (zeros.size() == 0) lowBits |= TPlace{1} << level;
         ranks = zeros.size() == 0 ? Ones(level, ranks) : zeros;
     }
     return lowBits;
 }
 
-TPlace CSuffixes::NextPlace(TRanks ranks, TPlace place) const {
+TPlace CSuffixes::NextPlace(CRanks ranks, TPlace place) const {
     if (ranks.size() <= kFew) {
         TPlace next = kNoPlace;
         for (TPlace rank = ranks.mFirst; rank < ranks.mEnd; ++rank) {
@@ -175,9 +175,9 @@ TPlace CSuffixes::NextPlace(TRanks ranks, TPlace place) const {
     if (place >= Count()) return kNoPlace;
     // Follows the bits of `place`, and remembers the last turn to greater places.
     std::size_t turn = 0;
-    TRanks greater;
+    CRanks greater;
     for (std::size_t level = mZerosBefore.size(); level-- > 0;) {
-        const TRanks ones = Ones(level, ranks);
+        const CRanks ones = Ones(level, ranks);
         if (HasBit(place, level)) {
             ranks = ones;
         } else {

@@ -9,7 +9,7 @@
 namespace brindle {
 
 /// A range of ranks in a sorted list, the end not included.
-struct TRanks {
+struct CRanks {
     TPlace mFirst = 0;
     TPlace mEnd = 0;
 
@@ -39,9 +39,9 @@ public:
     /// How many symbols are equal from two places on.
     [[nodiscard]] TPlace EqualCount(TPlace a, TPlace b) const;
     /// The suffixes that share their first `count` symbols with the one at a place.
-    [[nodiscard]] TRanks RanksOfPassage(TPlace place, TPlace count) const;
+    [[nodiscard]] CRanks RanksOfPassage(TPlace place, TPlace count) const;
     /// The first place from `place` on whose suffix has one of the ranks; `kNoPlace` without one.
-    [[nodiscard]] TPlace NextPlace(TRanks ranks, TPlace place) const;
+    [[nodiscard]] TPlace NextPlace(CRanks ranks, TPlace place) const;
 
 private:
     /// By prefix doubling.
@@ -50,9 +50,9 @@ private:
     void CompareNeighbours(const std::vector<TPlace>& symbols);
     void MakeMinima();
     void SplitByBits();
-    [[nodiscard]] TPlace SmallestPlace(std::size_t level, TRanks ranks) const;
-    [[nodiscard]] TRanks Zeros(std::size_t level, TRanks ranks) const;
-    [[nodiscard]] TRanks Ones(std::size_t level, TRanks ranks) const;
+    [[nodiscard]] TPlace SmallestPlace(std::size_t level, CRanks ranks) const;
+    [[nodiscard]] CRanks Zeros(std::size_t level, CRanks ranks) const;
+    [[nodiscard]] CRanks Ones(std::size_t level, CRanks ranks) const;
 
     std::vector<TPlace> mPlaceOfRank;
     std::vector<TPlace> mRankOfPlace;

@@ -6,13 +6,13 @@ namespace {
 
 constexpr int kDominantDegree = 7;
 
-bool IsMinorSeventh(const TKeyChord& chord) {
+bool IsMinorSeventh(const CKeyChord& chord) {
     return chord.mClass == TKeyChordClass_Min7 || chord.mClass == TKeyChordClass_HDim;
 }
 
 }  // namespace
 
-CChordInSong::CChordInSong(const TSongToName& song, std::size_t ix)
+CChordInSong::CChordInSong(const CSongToName& song, std::size_t ix)
     : mSong(song),
       mIx(static_cast<std::ptrdiff_t>(ix)),
       mChord(song.mChords[ix]),
@@ -27,7 +27,7 @@ CChordInSong::CChordInSong(const TSongToName& song, std::size_t ix)
 }
 
 int CChordInSong::EffectiveDegree(std::ptrdiff_t ix) const {
-    const TKeyChord& chord = ChordAt(ix);
+    const CKeyChord& chord = ChordAt(ix);
     const int degree = DegreeInKey(chord.mRoot, mKey);
     const bool isTriad = chord.mClass == TKeyChordClass_Triad || chord.mClass == TKeyChordClass_Min;
     const bool isSixFour = degree == 0 && isTriad && DegreeInKey(chord.mBass, mKey) == 7;
@@ -47,7 +47,7 @@ std::ptrdiff_t CChordInSong::Goal(int up) const {
 bool CChordInSong::IsHeardThrough(std::ptrdiff_t goal) const {
     const int upFromNext = FoldIntoOctave(EffectiveDegree(goal) - mDegreeBehind);
     if (upFromNext == 0) return true;
-    const TKeyChord& next = ChordAt(mNext);
+    const CKeyChord& next = ChordAt(mNext);
     if (upFromNext == 5 && (IsMinorSeventh(next) || next.mClass == TKeyChordClass_Min)) return true;
     return mDegree == kDominantDegree && CSemitones{2, 5, 8}.HasIntvl(mDegreeBehind);
 }

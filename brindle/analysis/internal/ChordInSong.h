@@ -14,11 +14,11 @@ namespace brindle {
 inline constexpr std::ptrdiff_t kNoChord = -1;
 
 /// A song while its chords are named, from the last to the first.
-struct TSongToName {
-    std::span<const TKeyChord> mChords;
+struct CSongToName {
+    std::span<const CKeyChord> mChords;
     std::span<const std::uint8_t> mKeys;
     std::span<const TSeventhSpelling> mSevenths;
-    TSongTraits mTraits;
+    CSongTraits mTraits;
     /// By places in the list. Those of the later chords are done. `mResolvesTo` is the chord that
     /// the rules lead one to, and first the one that it stands under.
     std::span<CChordReading> mReadings;
@@ -37,16 +37,16 @@ struct TSongToName {
 /// key, also those of other chords; -1 where there is no chord.
 class CChordInSong {
 public:
-    CChordInSong(const TSongToName& song, std::size_t ix);
+    CChordInSong(const CSongToName& song, std::size_t ix);
 
-    [[nodiscard]] const TKeyChord& Chord() const { return mChord; }
+    [[nodiscard]] const CKeyChord& Chord() const { return mChord; }
     [[nodiscard]] TKeyChordClass Class() const { return mChord.mClass; }
     [[nodiscard]] bool Is(TKeyChordClass chordClass) const { return mChord.mClass == chordClass; }
     [[nodiscard]] bool Has(int intvl) const { return mChord.Has(intvl); }
     [[nodiscard]] int Key() const { return mKey; }
     [[nodiscard]] bool IsInMajor() const { return !IsMinorKey(mKey); }
     [[nodiscard]] bool IsAtHome() const { return mKey == mSong.mTraits.mHome; }
-    [[nodiscard]] const TSongTraits& Traits() const { return mSong.mTraits; }
+    [[nodiscard]] const CSongTraits& Traits() const { return mSong.mTraits; }
     [[nodiscard]] TSeventhSpelling Seventh() const { return mSong.mSevenths[Ix()]; }
 
     [[nodiscard]] int Degree() const { return mDegree; }
@@ -68,7 +68,7 @@ public:
     [[nodiscard]] bool HasNext() const { return mNext >= 0; }
     [[nodiscard]] bool HasPrevious() const { return mIx > 0; }
     [[nodiscard]] std::size_t Count() const { return mSong.mChords.size(); }
-    [[nodiscard]] const TKeyChord& ChordAt(std::ptrdiff_t ix) const {
+    [[nodiscard]] const CKeyChord& ChordAt(std::ptrdiff_t ix) const {
         return mSong.mChords[static_cast<std::size_t>(ix)];
     }
     [[nodiscard]] const CChordReading& ReadingAt(std::ptrdiff_t ix) const {
@@ -88,7 +88,7 @@ public:
     /// How far the effective root of the next chord lies above the root, -1 without a next one.
     [[nodiscard]] int UpToNext() const { return mUpToNext; }
     /// How far the root lies above another one.
-    [[nodiscard]] int UpFrom(const TKeyChord& other) const {
+    [[nodiscard]] int UpFrom(const CKeyChord& other) const {
         return DegreeInKey(mChord.mRoot, other.mRoot);
     }
 
@@ -102,9 +102,9 @@ private:
     [[nodiscard]] std::size_t Ix() const { return static_cast<std::size_t>(mIx); }
     [[nodiscard]] bool IsHeardThrough(std::ptrdiff_t goal) const;
 
-    const TSongToName& mSong;
+    const CSongToName& mSong;
     std::ptrdiff_t mIx;
-    const TKeyChord& mChord;
+    const CKeyChord& mChord;
     int mKey;
     int mDegree;
     std::ptrdiff_t mNext;

@@ -21,7 +21,7 @@ std::size_t Up(int from, int to) {
 
 class CChain {
 public:
-    CChain(std::span<const TKeyChord> chords, std::span<const TKeyChordKind> kinds, int home)
+    CChain(std::span<const CKeyChord> chords, std::span<const TKeyChordKind> kinds, int home)
         : mChords(chords), mKinds(kinds), mHome(home), mUnder(chords.size(), -1) {}
 
     std::vector<std::ptrdiff_t> Make() {
@@ -51,21 +51,21 @@ private:
 
     [[nodiscard]] int Points(std::size_t ix, std::size_t goal, std::size_t way) const {
         const TKeyChordKind kind = mKinds[ix];
-        const TKeyChord& to = mChords[goal];
+        const CKeyChord& to = mChords[goal];
         const std::size_t up = Up(mChords[ix].mRoot, to.mRoot);
         return kChainMotion[kind][up] + kChainGoal[kind][Degree(to)] + kChainTo[to.mClass][up] +
                kChainDepth[way][kind];
     }
 
-    [[nodiscard]] int PointsOfRest(const TKeyChord& chord) const {
+    [[nodiscard]] int PointsOfRest(const CKeyChord& chord) const {
         return kChainRest[chord.mClass][Degree(chord) + (IsMinorKey(mHome) ? 12U : 0U)];
     }
 
-    [[nodiscard]] std::size_t Degree(const TKeyChord& chord) const {
+    [[nodiscard]] std::size_t Degree(const CKeyChord& chord) const {
         return static_cast<std::size_t>(DegreeInKey(chord.mRoot, mHome));
     }
 
-    std::span<const TKeyChord> mChords;
+    std::span<const CKeyChord> mChords;
     std::span<const TKeyChordKind> mKinds;
     int mHome;
     std::vector<std::ptrdiff_t> mUnder;
@@ -73,7 +73,7 @@ private:
 
 }  // namespace
 
-std::vector<std::ptrdiff_t> HarmonyChain(std::span<const TKeyChord> chords,
+std::vector<std::ptrdiff_t> HarmonyChain(std::span<const CKeyChord> chords,
                                          std::span<const TKeyChordKind> kinds, int home) {
     return CChain(chords, kinds, home).Make();
 }

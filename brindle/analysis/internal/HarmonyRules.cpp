@@ -61,7 +61,7 @@ bool IsDeceptive(const CChordInSong& chord, const CChordReading& reading) {
            behind == TKeyChordClass_Min || behind == TKeyChordClass_Min7;
 }
 
-std::ptrdiff_t Resolution(const CChordInSong& chord, const TChordName& name) {
+std::ptrdiff_t Resolution(const CChordInSong& chord, const CChordName& name) {
     const CChordReading& reading = name.mReading;
     const std::ptrdiff_t target = reading.mResolvesTo;
     if (IsAtRest(reading)) return kNoChord;
@@ -92,7 +92,7 @@ void WriteServingNumeral(const CChordInSong& chord, std::string_view prefix,
 }
 
 void Apply(const CChordInSong& chord, std::string_view prefix, int target, std::ptrdiff_t goal,
-           TChordName& name) {
+           CChordName& name) {
     CChordReading& reading = name.mReading;
     name.LeadTo(goal);
     reading.mFunction = THarmFunction_Dominant;
@@ -104,7 +104,7 @@ void Apply(const CChordInSong& chord, std::string_view prefix, int target, std::
         return;
     }
     if (degree != 0) {
-        const TNumeralDegree& written = NumeralDegreeOf(degree, chord.Key());
+        const CNumeralDegree& written = NumeralDegreeOf(degree, chord.Key());
         reading.mServes = {
             static_cast<std::int8_t>(degree), static_cast<std::int8_t>(written.mNumber),
             static_cast<std::int8_t>(written.mAccidental), IsSmallTarget(chord, degree, goal)};
@@ -114,11 +114,11 @@ void Apply(const CChordInSong& chord, std::string_view prefix, int target, std::
 
 // A rule reads the targets of later chords as the rules have left them, so the resolutions, which
 // leave some of them out, come last.
-void NameHarmonies(const TSongToName& song) {
+void NameHarmonies(const CSongToName& song) {
     std::vector<bool> isLed(song.mChords.size());
     for (std::size_t i = song.mChords.size(); i-- > 0;) {
         const CChordInSong chord(song, i);
-        TChordName name{song.ReadingOf(i)};
+        CChordName name{song.ReadingOf(i)};
         name.Be(TChordRelation_None, FunctionOf(chord.Degree(), chord.IsInMajor()));
         WriteOwnNumeral(chord, name.mReading);
         const bool isNamed = NameChordAtRest(chord, name) || NamePredominant(chord, name) ||

@@ -8,7 +8,7 @@
 namespace brindle {
 
 /// The name that a rule gives to a chord.
-struct TChordName {
+struct CChordName {
     CChordReading& mReading;
     /// The rule tells the chord that it leads to.
     bool mIsLed = false;
@@ -33,20 +33,20 @@ void WriteServingNumeral(const CChordInSong& chord, std::string_view prefix,
 /// Makes the chord one that is applied to the degree `target`, such as V7/ii, and leads it to the
 /// chord `goal` on it, if there is one.
 void Apply(const CChordInSong& chord, std::string_view prefix, int target, std::ptrdiff_t goal,
-           TChordName& name);
+           CChordName& name);
 
 // The rules in the order in which they are tried. Each names the chord if it applies; the name
 // begins as the chord's own degree with the function of that.
-[[nodiscard]] bool NameChordAtRest(const CChordInSong& chord, TChordName& name);
-[[nodiscard]] bool NamePredominant(const CChordInSong& chord, TChordName& name);
-[[nodiscard]] bool NameDominant(const CChordInSong& chord, TChordName& name);
-[[nodiscard]] bool NameDiminished(const CChordInSong& chord, TChordName& name);
-[[nodiscard]] bool NameRelatedSecond(const CChordInSong& chord, TChordName& name);
+[[nodiscard]] bool NameChordAtRest(const CChordInSong& chord, CChordName& name);
+[[nodiscard]] bool NamePredominant(const CChordInSong& chord, CChordName& name);
+[[nodiscard]] bool NameDominant(const CChordInSong& chord, CChordName& name);
+[[nodiscard]] bool NameDiminished(const CChordInSong& chord, CChordName& name);
+[[nodiscard]] bool NameRelatedSecond(const CChordInSong& chord, CChordName& name);
 /// Names what no other rule does.
-void NameChordOfKey(const CChordInSong& chord, TChordName& name);
+void NameChordOfKey(const CChordInSong& chord, CChordName& name);
 
 /// Names all chords of a song. In the end `mResolvesTo` is the chord that each resolves to, and
 /// this and `mUnder` are places in the list.
-void NameHarmonies(const TSongToName& song);
+void NameHarmonies(const CSongToName& song);
 
 }  // namespace brindle

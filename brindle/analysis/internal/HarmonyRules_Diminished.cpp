@@ -24,7 +24,7 @@ bool IsBySteps(const CChordInSong& chord) {
 
 // A chord without a function of its own. On its way up it is written as the raised degree below:
 // #iio7 between ii and iii.
-void BePassing(const CChordInSong& chord, TChordRelation relation, TChordName& name) {
+void BePassing(const CChordInSong& chord, TChordRelation relation, CChordName& name) {
     name.Be(relation, THarmFunction_None);
     name.LeadTo(chord.Next());
     const bool isRaised =
@@ -36,7 +36,7 @@ void BePassing(const CChordInSong& chord, TChordRelation relation, TChordName& n
     numeral += NumeralSignOf(chord.Chord().mSemitones);
 }
 
-bool BeLeading(const CChordInSong& chord, int target, std::ptrdiff_t goal, TChordName& name) {
+bool BeLeading(const CChordInSong& chord, int target, std::ptrdiff_t goal, CChordName& name) {
     name.mReading.mRelation = TChordRelation_LeadingDiminished;
     Apply(chord, "vii", target, goal, name);
     return true;
@@ -44,7 +44,7 @@ bool BeLeading(const CChordInSong& chord, int target, std::ptrdiff_t goal, TChor
 
 // The tones of a diminished seventh chord lie three semitones apart, so each can be its root:
 // before Dm Bbo7 is C#o7.
-bool NameInverted(const CChordInSong& chord, TChordName& name) {
+bool NameInverted(const CChordInSong& chord, CChordName& name) {
     if (!chord.HasNext()) return false;
     const int target = chord.NextEffectiveDegree();
     const bool leads = chord.UpToNext() % 3 == 1 && chord.IsDegreeOfScale(target);
@@ -55,7 +55,7 @@ bool SharesTonesWithNext(const CChordInSong& chord) {
     return chord.HasNext() && FoldIntoOctave(chord.DegreeBehind() - chord.Degree()) % 3 == 0;
 }
 
-bool NameLeading(const CChordInSong& chord, bool leads, bool isBySteps, TChordName& name) {
+bool NameLeading(const CChordInSong& chord, bool leads, bool isBySteps, CChordName& name) {
     const int up = FoldIntoOctave(chord.Degree() + 1);
     if (leads) {
         BeLeading(chord, up, chord.Next(), name);
@@ -70,7 +70,7 @@ bool NameLeading(const CChordInSong& chord, bool leads, bool isBySteps, TChordNa
 
 }  // namespace
 
-bool NameDiminished(const CChordInSong& chord, TChordName& name) {
+bool NameDiminished(const CChordInSong& chord, CChordName& name) {
     const bool leads = chord.UpToNext() == 1;
     const bool isLeadingHalfDiminished =
         chord.Is(TKeyChordClass_HDim) && leads && chord.Degree() != 2;

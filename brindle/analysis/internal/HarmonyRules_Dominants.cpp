@@ -28,7 +28,7 @@ bool Resolves(const CChordInSong& chord) {
 }
 
 // G G7 C in C: the V of the key, whatever follows. It may be delayed by vi, or by iii on the way.
-bool NameDominantOfKey(const CChordInSong& chord, TChordName& name) {
+bool NameDominantOfKey(const CChordInSong& chord, CChordName& name) {
     const bool hasForm =
         IsDom(chord) || chord.Is(TKeyChordClass_Triad) || chord.Is(TKeyChordClass_Open);
     if (chord.Degree() != 7 || !hasForm) return false;
@@ -45,7 +45,7 @@ bool NameDominantOfKey(const CChordInSong& chord, TChordName& name) {
 }
 
 // Bb7 in C major, which comes to C by the back door, or to Em behind Fm.
-bool NameBackdoor(const CChordInSong& chord, TChordName& name) {
+bool NameBackdoor(const CChordInSong& chord, CChordName& name) {
     if (!IsDom(chord) || chord.Degree() != 10 || !chord.IsInMajor()) return false;
     const bool isBehindFour = chord.HasPrevious() && chord.DegreeOf(chord.Previous()) == 5;
     const int behind = chord.DegreeBehind();
@@ -65,7 +65,7 @@ std::ptrdiff_t SameDominantLater(const CChordInSong& chord) {
     return kNoChord;
 }
 
-bool NameFirstGo(const CChordInSong& chord, TChordName& name) {
+bool NameFirstGo(const CChordInSong& chord, CChordName& name) {
     if (!chord.HasNext() || !IsStrong(chord)) return false;
     const bool isDirect =
         chord.Goal(kFourthUp) == chord.Next() || chord.Goal(kSemitoneDown) == chord.Next();
@@ -83,7 +83,7 @@ bool NameFirstGo(const CChordInSong& chord, TChordName& name) {
 }
 
 // Db7 in C, unless Gb follows.
-bool NameSubstituteOfKey(const CChordInSong& chord, TChordName& name) {
+bool NameSubstituteOfKey(const CChordInSong& chord, CChordName& name) {
     if (!IsDom(chord) || chord.Degree() != 1) return false;
     if (chord.HasNext() && chord.Goal(kFourthUp) == chord.Next()) return false;
     name.mReading.mRelation = TChordRelation_SubstituteDominant;
@@ -93,7 +93,7 @@ bool NameSubstituteOfKey(const CChordInSong& chord, TChordName& name) {
 
 // A7 before Dm in C major is V7/ii. A seventh chord is one of whatever chord it leads to, a triad
 // only of a degree of the key.
-bool NameSecondaryDominant(const CChordInSong& chord, TChordName& name) {
+bool NameSecondaryDominant(const CChordInSong& chord, CChordName& name) {
     const std::ptrdiff_t fifth = chord.Goal(kFourthUp);
     if (fifth < 0 || !IsStrong(chord)) return false;
     const int target = chord.Degree() + kFourthUp;
@@ -105,7 +105,7 @@ bool NameSecondaryDominant(const CChordInSong& chord, TChordName& name) {
 }
 
 // Eb7 before Dm in C major is subV7/ii.
-bool NameTritoneSubstitute(const CChordInSong& chord, TChordName& name) {
+bool NameTritoneSubstitute(const CChordInSong& chord, CChordName& name) {
     const std::ptrdiff_t below = chord.Goal(kSemitoneDown);
     const int target = chord.Degree() + kSemitoneDown;
     if (!IsDom(chord) || below < 0 || !chord.IsDegreeOfScale(target)) return false;
@@ -115,7 +115,7 @@ bool NameTritoneSubstitute(const CChordInSong& chord, TChordName& name) {
 }
 
 // A7 in C major even if no D follows.
-bool NameUnresolvedDominant(const CChordInSong& chord, TChordName& name) {
+bool NameUnresolvedDominant(const CChordInSong& chord, CChordName& name) {
     const CSemitones degrees = chord.IsInMajor() ? CSemitones{0, 2, 4, 9, 11} : CSemitones{0, 2, 3};
     if (!IsDom(chord) || chord.IsDiatonic() || !degrees.HasIntvl(chord.Degree())) return false;
     name.mReading.mRelation = TChordRelation_Dominant;
@@ -125,11 +125,11 @@ bool NameUnresolvedDominant(const CChordInSong& chord, TChordName& name) {
 
 }  // namespace
 
-bool NameChordAtRest(const CChordInSong& chord, TChordName& name) {
+bool NameChordAtRest(const CChordInSong& chord, CChordName& name) {
     const int degree = chord.Degree();
     if (!IsDom(chord) || !chord.Has(7) || !chord.IsInMajor()) return false;
     if (degree != 0 && degree != 5) return false;
-    const TSongTraits& song = chord.Traits();
+    const CSongTraits& song = chord.Traits();
     const bool isOfBlues = song.mIsBlues && chord.IsAtHome() && !chord.IsPrepared();
     const bool mayRest = degree == 5 || song.mIsJazz;
     if (!isOfBlues && !(mayRest && !Resolves(chord))) return false;
@@ -141,7 +141,7 @@ bool NameChordAtRest(const CChordInSong& chord, TChordName& name) {
     return true;
 }
 
-bool NameDominant(const CChordInSong& chord, TChordName& name) {
+bool NameDominant(const CChordInSong& chord, CChordName& name) {
     return NameDominantOfKey(chord, name) || NameBackdoor(chord, name) ||
            NameFirstGo(chord, name) || NameSubstituteOfKey(chord, name) ||
            NameSecondaryDominant(chord, name) || NameTritoneSubstitute(chord, name) ||

@@ -14,7 +14,7 @@ bool IsPlainMinor(TKeyChordClass chordClass) {
 // A minor chord on the same root with other tones above it.
 bool IsAlike(const CChordInSong& chord, std::ptrdiff_t other) {
     if (other < 0 || other >= static_cast<std::ptrdiff_t>(chord.Count())) return false;
-    const TKeyChord& otherChord = chord.ChordAt(other);
+    const CKeyChord& otherChord = chord.ChordAt(other);
     return otherChord.mRoot == chord.Chord().mRoot && IsPlainMinor(otherChord.mClass) &&
            otherChord.mSemitones != chord.Chord().mSemitones;
 }
@@ -44,7 +44,7 @@ bool IsMediant(const CChordInSong& chord) {
 
 }  // namespace
 
-void NameChordOfKey(const CChordInSong& chord, TChordName& name) {
+void NameChordOfKey(const CChordInSong& chord, CChordName& name) {
     CChordReading& reading = name.mReading;
     const bool isSixFour = chord.EffectiveDegree(chord.Index()) != chord.Degree();
     if (isSixFour && chord.DegreeBehind() == 7) {

@@ -10,7 +10,7 @@ namespace {
 constexpr int kFourthUp = 5;
 constexpr int kSemitoneDown = 11;
 
-void BeAugmentedSixth(std::string_view numeral, std::ptrdiff_t goal, TChordName& name) {
+void BeAugmentedSixth(std::string_view numeral, std::ptrdiff_t goal, CChordName& name) {
     name.Be(TChordRelation_AugmentedSixth, THarmFunction_Subdominant);
     name.mReading.mNumeral = numeral;
     name.LeadTo(goal);
@@ -21,7 +21,7 @@ std::string_view SixthName(const CChordInSong& chord) {
 }
 
 // Ab7 before G in C, where the seventh wants to rise: F sharp. In jazz it is a substitute dominant.
-bool NameGermanSixth(const CChordInSong& chord, TChordName& name) {
+bool NameGermanSixth(const CChordInSong& chord, CChordName& name) {
     if (!chord.Is(TKeyChordClass_Dom) || chord.Degree() != 8 || chord.Traits().mIsJazz) {
         return false;
     }
@@ -32,7 +32,7 @@ bool NameGermanSixth(const CChordInSong& chord, TChordName& name) {
 
 // Ab7 written with F sharp falls to the dominant of something, wherever it stands: before D in C
 // major Eb7 is Ger6/V.
-bool NameWrittenSixth(const CChordInSong& chord, TChordName& name) {
+bool NameWrittenSixth(const CChordInSong& chord, CChordName& name) {
     if (!chord.Is(TKeyChordClass_Dom) || !chord.Has(10)) return false;
     if (chord.UpToNext() != kSemitoneDown) return false;
     const int target = FoldIntoOctave(chord.Degree() - 8);
@@ -45,7 +45,7 @@ bool NameWrittenSixth(const CChordInSong& chord, TChordName& name) {
 }
 
 // Ab C D F#, as D7 with a lowered fifth in the bass.
-bool NameFrenchSixth(const CChordInSong& chord, TChordName& name) {
+bool NameFrenchSixth(const CChordInSong& chord, CChordName& name) {
     const bool hasFlatFifth = chord.Has(6) && !chord.Has(7);
     if (!chord.Is(TKeyChordClass_Dom) || chord.Degree() != 2 || chord.Traits().mIsJazz ||
         !hasFlatFifth || chord.BassDegree() != 8) {
@@ -55,7 +55,7 @@ bool NameFrenchSixth(const CChordInSong& chord, TChordName& name) {
     return true;
 }
 
-bool NameNeapolitan(const CChordInSong& chord, TChordName& name) {
+bool NameNeapolitan(const CChordInSong& chord, CChordName& name) {
     if (!chord.Is(TKeyChordClass_Triad) || chord.Degree() != 1) return false;
     name.Be(TChordRelation_Neapolitan, THarmFunction_Subdominant);
     const bool isSixth = chord.BassDegree() == 5;
@@ -71,7 +71,7 @@ bool IsMinorOrHalfDiminished(const CChordInSong& chord) {
 // ii of the dominant's target; in its own key's numeral where it is at home there, or where the
 // dominant is a substitute.
 bool NameSecondOfDominant(const CChordInSong& chord, const CChordReading& dominant,
-                          bool isSubstitute, TChordName& name) {
+                          bool isSubstitute, CChordName& name) {
     const TKeyChordClass next = chord.ChordAt(chord.Next()).mClass;
     const bool isHeldBack = next == TKeyChordClass_Triad && !chord.Is(TKeyChordClass_Min);
     if (next != TKeyChordClass_Dom && next != TKeyChordClass_Open && !isHeldBack) return false;
@@ -86,7 +86,7 @@ bool NameSecondOfDominant(const CChordInSong& chord, const CChordReading& domina
 
 }  // namespace
 
-bool NamePredominant(const CChordInSong& chord, TChordName& name) {
+bool NamePredominant(const CChordInSong& chord, CChordName& name) {
     if (chord.Seventh() == TSeventhSpelling_AugmentedSixth && NameWrittenSixth(chord, name)) {
         return true;
     }
@@ -95,7 +95,7 @@ bool NamePredominant(const CChordInSong& chord, TChordName& name) {
            NameNeapolitan(chord, name);
 }
 
-bool NameRelatedSecond(const CChordInSong& chord, TChordName& name) {
+bool NameRelatedSecond(const CChordInSong& chord, CChordName& name) {
     if (!IsMinorOrHalfDiminished(chord) || !chord.HasNext()) return false;
     const CChordReading& next = chord.ReadingAt(chord.Next());
     const int up = FoldIntoOctave(chord.DegreeBehind() - chord.Degree());

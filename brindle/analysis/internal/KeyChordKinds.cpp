@@ -10,7 +10,7 @@ TKeyChordKind KindOfClass(TKeyChordClass chordClass) {
     return static_cast<TKeyChordKind>(chordClass);
 }
 
-TKeyChordKind KindBefore(const TKeyChord& chord, const TKeyChord& next) {
+TKeyChordKind KindBefore(const CKeyChord& chord, const CKeyChord& next) {
     const int up = FoldIntoOctave(next.mRoot - chord.mRoot);
     const bool isNextDom = next.mClass == TKeyChordClass_Dom;
     if (chord.mClass == TKeyChordClass_Dom) {
@@ -25,7 +25,7 @@ TKeyChordKind KindBefore(const TKeyChord& chord, const TKeyChord& next) {
     return KindOfClass(chord.mClass);
 }
 
-TKeyChordKind KindBehind(const TKeyChord& before, const TKeyChord& chord) {
+TKeyChordKind KindBehind(const CKeyChord& before, const CKeyChord& chord) {
     const bool isResolved =
         before.mClass == TKeyChordClass_Dom && FoldIntoOctave(chord.mRoot - before.mRoot) == 5;
     if (isResolved && chord.mClass == TKeyChordClass_Triad) return TKeyChordKind_TriadResolved;
@@ -36,7 +36,7 @@ TKeyChordKind KindBehind(const TKeyChord& before, const TKeyChord& chord) {
 
 }  // namespace
 
-std::vector<TKeyChordKind> KeyChordKindsOf(std::span<const TKeyChord> chords) {
+std::vector<TKeyChordKind> KeyChordKindsOf(std::span<const CKeyChord> chords) {
     std::vector<TKeyChordKind> kinds(chords.size());
     for (std::size_t i = 0; i < chords.size(); ++i) {
         kinds[i] = KindOfClass(chords[i].mClass);

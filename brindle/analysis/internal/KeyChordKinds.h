@@ -23,6 +23,6 @@ enum TKeyChordKind : std::uint8_t {
 inline constexpr std::size_t kKeyChordKindCount = 16;
 
 /// The kind of each chord.
-[[nodiscard]] std::vector<TKeyChordKind> KeyChordKindsOf(std::span<const TKeyChord> chords);
+[[nodiscard]] std::vector<TKeyChordKind> KeyChordKindsOf(std::span<const CKeyChord> chords);
 
 }  // namespace brindle

@@ -17,7 +17,7 @@ double BeatsOf(const CHarmAnlsChords& chords, std::size_t ix) {
     return beats > 0.0 && beats <= kLongestInBeats ? beats : 0.0;
 }
 
-TKeyChord KeyChordOf(const CHarmAnlsChords& chords, std::size_t ix) {
+CKeyChord KeyChordOf(const CHarmAnlsChords& chords, std::size_t ix) {
     const CHarmAnlsChord& chord = chords[ix];
     const CKeyEnh& bass = chord.HasBassNote() ? chord.mBassKeyEnh : chord.mRootKeyEnh;
     return {KeyChordClassOf(chord.mSemitones),
@@ -29,15 +29,15 @@ TKeyChord KeyChordOf(const CHarmAnlsChords& chords, std::size_t ix) {
             BeatsOf(chords, ix)};
 }
 
-bool IsSameChord(const TKeyChord& a, const TKeyChord& b) {
+bool IsSameChord(const CKeyChord& a, const CKeyChord& b) {
     return a.mRoot == b.mRoot && a.mBass == b.mBass && a.mHasBass == b.mHasBass &&
            a.mSemitones == b.mSemitones;
 }
 
 }  // namespace
 
-std::vector<TKeyChord> KeyChordsOf(const CHarmAnlsChords& chords) {
-    std::vector<TKeyChord> heard;
+std::vector<CKeyChord> KeyChordsOf(const CHarmAnlsChords& chords) {
+    std::vector<CKeyChord> heard;
     heard.reserve(chords.size());
     double total = 0.0;
     for (std::size_t ix = 0; ix < chords.size(); ++ix) {
@@ -48,7 +48,7 @@ std::vector<TKeyChord> KeyChordsOf(const CHarmAnlsChords& chords) {
             total += beats;
             continue;
         }
-        const TKeyChord chord = KeyChordOf(chords, ix);
+        const CKeyChord chord = KeyChordOf(chords, ix);
         total += chord.mBeats;
         if (!heard.empty() && IsSameChord(heard.back(), chord)) {
             heard.back().mBeats += chord.mBeats;
@@ -57,7 +57,7 @@ std::vector<TKeyChord> KeyChordsOf(const CHarmAnlsChords& chords) {
         }
     }
     if (!(total > 0.0)) {
-        for (TKeyChord& chord : heard) chord.mBeats = 1.0;
+        for (CKeyChord& chord : heard) chord.mBeats = 1.0;
     }
     return heard;
 }

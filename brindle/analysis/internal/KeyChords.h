@@ -40,7 +40,7 @@ inline constexpr std::size_t kKeyChordClassCount = 8;
 }
 
 /// A chord of a song as long as it sounds, whatever the number of times that it is written.
-struct TKeyChord {
+struct CKeyChord {
     TKeyChordClass mClass;
     std::int8_t mRoot;  ///< pitch class, 0 to 11
     std::int8_t mBass;  ///< pitch class, that of the root without a bass
@@ -55,7 +55,7 @@ struct TKeyChord {
 };
 
 /// Whether the two are one kind of chord on one root.
-[[nodiscard]] constexpr bool IsSameKind(const TKeyChord& a, const TKeyChord& b) {
+[[nodiscard]] constexpr bool IsSameKind(const CKeyChord& a, const CKeyChord& b) {
     return a.mClass == b.mClass && a.mRoot == b.mRoot;
 }
 
@@ -65,6 +65,6 @@ struct TKeyChord {
 ///
 /// A length that is negative or no length at all is 0. When no chord has a length, all are equally
 /// long.
-[[nodiscard]] std::vector<TKeyChord> KeyChordsOf(const CHarmAnlsChords& chords);
+[[nodiscard]] std::vector<CKeyChord> KeyChordsOf(const CHarmAnlsChords& chords);
 
 }  // namespace brindle

@@ -4,7 +4,7 @@
 namespace brindle {
 namespace {
 
-CSemitones CoreTones(const TKeyChord& chord) {
+CSemitones CoreTones(const CKeyChord& chord) {
     switch (chord.mClass) {
         case TKeyChordClass_Triad:
             return {0, 4, 7};
@@ -28,7 +28,7 @@ CSemitones CoreTones(const TKeyChord& chord) {
 
 }  // namespace
 
-bool IsInScale(const TKeyChord& chord, int degree, CSemitones scale) {
+bool IsInScale(const CKeyChord& chord, int degree, CSemitones scale) {
     const std::uint64_t raised = CoreTones(chord).Mask() << degree;
     const std::uint64_t folded = (raised | raised >> 12) & 0xFFF;
     return (folded & ~scale.Mask()) == 0;

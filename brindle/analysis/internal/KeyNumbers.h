@@ -49,6 +49,6 @@ inline constexpr int kKeyCount = 24;
 }
 
 /// Whether the tones that make the chord what it is lie in a scale, the chord standing on `degree`.
-[[nodiscard]] bool IsInScale(const TKeyChord& chord, int degree, CSemitones scale);
+[[nodiscard]] bool IsInScale(const CKeyChord& chord, int degree, CSemitones scale);
 
 }  // namespace brindle

@@ -27,18 +27,18 @@ constexpr std::array<std::size_t, kKeyChordClassCount> kGroupOfClass{
 };
 
 // The parts add up to 1 for the time, the bass and the steps each.
-struct TSumsByRoot {
+struct CSumsByRoot {
     std::array<TByRoot, kKeyChordClassCount> mTime{};
     TByRoot mBass{};
     std::array<TByRoot, 36> mSteps{};
 };
 
-std::size_t StepRow(const TKeyChord& from, const TKeyChord& to) {
+std::size_t StepRow(const CKeyChord& from, const CKeyChord& to) {
     return kGroupOfClass[from.mClass] * 12 +
            static_cast<std::size_t>(FoldIntoOctave(to.mRoot - from.mRoot));
 }
 
-void AddSteps(std::span<const TKeyChord> chords, std::array<TByRoot, 36>& steps) {
+void AddSteps(std::span<const CKeyChord> chords, std::array<TByRoot, 36>& steps) {
     double count = 0.0;
     for (std::size_t i = 1; i < chords.size(); ++i) {
         if (IsSameKind(chords[i - 1], chords[i])) continue;
@@ -51,11 +51,11 @@ void AddSteps(std::span<const TKeyChord> chords, std::array<TByRoot, 36>& steps)
     }
 }
 
-TSumsByRoot SumsByRoot(std::span<const TKeyChord> chords) {
+CSumsByRoot SumsByRoot(std::span<const CKeyChord> chords) {
     double total = 0.0;
-    for (const TKeyChord& chord : chords) total += chord.mBeats;
-    TSumsByRoot sums;
-    for (const TKeyChord& chord : chords) {
+    for (const CKeyChord& chord : chords) total += chord.mBeats;
+    CSumsByRoot sums;
+    for (const CKeyChord& chord : chords) {
         const double part = chord.mBeats / total;
         sums.mTime[chord.mClass][static_cast<std::size_t>(chord.mRoot)] += part;
         sums.mBass[static_cast<std::size_t>(chord.mBass)] += part;
@@ -81,15 +81,15 @@ double Points(const std::array<TByRoot, Rows>& sums, const std::array<TByRoot, R
     return points;
 }
 
-double PointsOfChord(const TKeyChord& chord, const TKeyTable<8>& table, int key) {
+double PointsOfChord(const CKeyChord& chord, const TKeyTable<8>& table, int key) {
     return table[static_cast<std::size_t>(ModeOfKey(key))][chord.mClass]
                 [static_cast<std::size_t>(FoldIntoOctave(chord.mRoot - TonicOfKey(key)))];
 }
 
 }  // namespace
 
-std::array<double, kKeyCount> KeyScores(std::span<const TKeyChord> chords) {
-    const TSumsByRoot sums = SumsByRoot(chords);
+std::array<double, kKeyCount> KeyScores(std::span<const CKeyChord> chords) {
+    const CSumsByRoot sums = SumsByRoot(chords);
     std::array<double, kKeyCount> scores{};
     for (int key = 0; key < kKeyCount; ++key) {
         const auto mode = static_cast<std::size_t>(ModeOfKey(key));

@@ -9,6 +9,6 @@
 namespace brindle {
 
 /// How well the whole song fits each key. `chords` has at least one chord.
-[[nodiscard]] std::array<double, kKeyCount> KeyScores(std::span<const TKeyChord> chords);
+[[nodiscard]] std::array<double, kKeyCount> KeyScores(std::span<const CKeyChord> chords);
 
 }  // namespace brindle

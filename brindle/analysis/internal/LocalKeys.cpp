@@ -46,14 +46,14 @@ double ChangeCost(int from, int to, double base) {
 
 /// What the changes cost, [from][to], and the range of that. To stay costs nothing, so the most is
 /// not below that.
-struct TChangeCosts {
+struct CChangeCosts {
     std::array<TPointsOfKeys, kKeyCount> mCosts{};
     double mLeast = std::numeric_limits<double>::infinity();
     double mMost = 0.0;
 };
 
-TChangeCosts ChangeCosts(double base) {
-    TChangeCosts costs;
+CChangeCosts ChangeCosts(double base) {
+    CChangeCosts costs;
     for (int from = 0; from < kKeyCount; ++from) {
         for (int to = 0; to < kKeyCount; ++to) {
             if (from == to) continue;
@@ -67,16 +67,16 @@ TChangeCosts ChangeCosts(double base) {
 }
 
 // One root of the fourth and not two square ones: rounded once, it leaves equal sums equal.
-double Weight(const TKeyChord& chord, double beatsPerBar) {
+double Weight(const CKeyChord& chord, double beatsPerBar) {
     return std::pow(std::clamp(chord.mBeats / beatsPerBar, kShortestInBars, kLongestInBars), 0.25);
 }
 
-bool IsBluesChord(const TKeyChord& chord, int home) {
+bool IsBluesChord(const CKeyChord& chord, int home) {
     const int degree = DegreeInKey(chord.mRoot, home);
     return chord.mClass == TKeyChordClass_Dom && (degree == 0 || degree == 5);
 }
 
-TPointsOfKeys Gains(const TKeyChord& chord, TKeyChordKind kind, const TSongTraits& traits,
+TPointsOfKeys Gains(const CKeyChord& chord, TKeyChordKind kind, const CSongTraits& traits,
                     const CKeyOptions& options) {
     const double weight = Weight(chord, options.mBeatsPerBar);
     TPointsOfKeys gains;
@@ -108,7 +108,7 @@ void ChangeFrom(std::size_t from, double best, const TPointsOfKeys& costs, TPoin
 }
 
 // Moves `best` on by one chord, and tells from which key the best path into each key comes.
-TKeysBefore StepOn(TPointsOfKeys& best, const TPointsOfKeys& gains, const TChangeCosts& costs) {
+TKeysBefore StepOn(TPointsOfKeys& best, const TPointsOfKeys& gains, const CChangeCosts& costs) {
     TPointsOfKeys points = best;
     TPointsOfKeys before;
     for (std::size_t to = 0; to < kKeyCount; ++to) before[to] = static_cast<double>(to);
@@ -127,17 +127,17 @@ TKeysBefore StepOn(TPointsOfKeys& best, const TPointsOfKeys& gains, const TChang
     return keys;
 }
 
-bool IsSecondDegree(const TKeyChord& chord, int key) {
+bool IsSecondDegree(const CKeyChord& chord, int key) {
     return (chord.mClass == TKeyChordClass_Min7 || chord.mClass == TKeyChordClass_HDim) &&
            DegreeInKey(chord.mRoot, key) == 2;
 }
 
-bool IsDominant(const TKeyChord& chord, int key) {
+bool IsDominant(const CKeyChord& chord, int key) {
     return chord.mClass == TKeyChordClass_Dom && DegreeInKey(chord.mRoot, key) == 7;
 }
 
 // A II before the dominant of a new key already belongs to it: Fm7 in C Fm7 Bb7 Eb.
-void MovePivots(std::span<const TKeyChord> chords, std::vector<std::uint8_t>& keys) {
+void MovePivots(std::span<const CKeyChord> chords, std::vector<std::uint8_t>& keys) {
     for (std::size_t i = keys.size() - 1; i-- > 1;) {
         const std::uint8_t next = keys[i + 1];
         if (keys[i] != next && IsDominant(chords[i + 1], next) && IsSecondDegree(chords[i], next)) {
@@ -148,11 +148,11 @@ void MovePivots(std::span<const TKeyChord> chords, std::vector<std::uint8_t>& ke
 
 }  // namespace
 
-std::vector<std::uint8_t> LocalKeys(std::span<const TKeyChord> chords,
-                                    std::span<const TKeyChordKind> kinds, const TSongTraits& traits,
+std::vector<std::uint8_t> LocalKeys(std::span<const CKeyChord> chords,
+                                    std::span<const TKeyChordKind> kinds, const CSongTraits& traits,
                                     const CKeyOptions& options) {
     if (chords.empty()) return {};
-    const TChangeCosts costs = ChangeCosts(options.mChangeCost);
+    const CChangeCosts costs = ChangeCosts(options.mChangeCost);
     TPointsOfKeys best = Gains(chords.front(), kinds.front(), traits, options);
     std::vector<TKeysBefore> before(chords.size());
     for (std::size_t i = 1; i < chords.size(); ++i) {

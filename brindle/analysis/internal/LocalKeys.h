@@ -12,13 +12,13 @@
 namespace brindle {
 
 /// The key of each chord, on the best path through the keys.
-[[nodiscard]] std::vector<std::uint8_t> LocalKeys(std::span<const TKeyChord> chords,
+[[nodiscard]] std::vector<std::uint8_t> LocalKeys(std::span<const CKeyChord> chords,
                                                   std::span<const TKeyChordKind> kinds,
-                                                  const TSongTraits& traits,
+                                                  const CSongTraits& traits,
                                                   const CKeyOptions& options);
 
 /// Gives short passages and the ends of passages to the key around them, where their chords are at
 /// home there: a tonicization of the second degree, a borrowed chord behind a cadence.
-void TidyLocalKeys(std::span<const TKeyChord> chords, int home, std::vector<std::uint8_t>& keys);
+void TidyLocalKeys(std::span<const CKeyChord> chords, int home, std::vector<std::uint8_t>& keys);
 
 }  // namespace brindle

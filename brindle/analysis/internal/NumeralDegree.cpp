@@ -25,8 +25,8 @@ int TakeAccidentals(std::string_view& text) {
 }
 
 // The longest Roman number that the text begins with, in large or in small letters.
-TReadDegree ReadRomanNumber(std::string_view text) {
-    TReadDegree read;
+CReadDegree ReadRomanNumber(std::string_view text) {
+    CReadDegree read;
     std::size_t longest = 0;
     for (std::size_t i = 0; i < kRomanNumbers.size(); ++i) {
         const std::string_view number = kRomanNumbers[i];
@@ -53,13 +53,13 @@ int LetterOf(const CKeyEnh& keyEnh) {
 
 }  // namespace
 
-TReadDegree ReadDegree(std::string_view text) {
+CReadDegree ReadDegree(std::string_view text) {
     constexpr std::string_view substitute = "sub";
     const bool isSubstitute = text.starts_with(substitute);
     if (isSubstitute) text.remove_prefix(substitute.size());
     const int accidental = TakeAccidentals(text);
     if (text.empty() || accidental < -kMostAccidentals || accidental > kMostAccidentals) return {};
-    TReadDegree read;
+    CReadDegree read;
     if (text.front() >= '1' && text.front() <= '7') {
         read = {{text.front() - '0', 0}, false, true, text.substr(1)};
     } else {
@@ -75,7 +75,7 @@ TReadDegree ReadDegree(std::string_view text) {
     return read;
 }
 
-TNumeralDegree FoldMinorFlat(TNumeralDegree degree, TSignKeyType type) {
+CNumeralDegree FoldMinorFlat(CNumeralDegree degree, TSignKeyType type) {
     const bool isLowInMinor = degree.mNumber == 3 || degree.mNumber == 6 || degree.mNumber == 7;
     if (type == TSignKeyType_Minor && isLowInMinor && degree.mAccidental == -1) {
         degree.mAccidental = 0;
@@ -83,7 +83,7 @@ TNumeralDegree FoldMinorFlat(TNumeralDegree degree, TSignKeyType type) {
     return degree;
 }
 
-int SemitonesOfDegree(TNumeralDegree degree, TSignKeyType type) {
+int SemitonesOfDegree(CNumeralDegree degree, TSignKeyType type) {
     const auto& degrees = type == TSignKeyType_Minor ? kMinorDegrees : kMajorDegrees;
     return degrees[static_cast<std::size_t>(degree.mNumber - 1)] + degree.mAccidental;
 }
@@ -99,7 +99,7 @@ int LettersBetween(const CKeyEnh& from, const CKeyEnh& to) {
     return (LetterOf(to) - LetterOf(from) + 7) % 7;
 }
 
-CKeyEnh KeyOfDegree(TNumeralDegree degree, const CSignKeyLite& key) {
+CKeyEnh KeyOfDegree(CNumeralDegree degree, const CSignKeyLite& key) {
     return SpelledAbove(key.mRootKeyEnh, degree.mNumber - 1,
                         SemitonesOfDegree(degree, key.mSignKeyType));
 }

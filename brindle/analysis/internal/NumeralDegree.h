@@ -10,8 +10,8 @@
 namespace brindle {
 
 /// A degree as it is written, and what is left of the text behind it.
-struct TReadDegree {
-    TNumeralDegree mDegree{0, 0};
+struct CReadDegree {
+    CNumeralDegree mDegree{0, 0};
     bool mIsSmall = false;
     bool mIsDigit = false;
     std::string_view mRest;
@@ -20,16 +20,16 @@ struct TReadDegree {
 };
 
 /// `bVII`, `ii`, `#4`, `subV`; at most two accidentals. Reads on as far as the number goes.
-[[nodiscard]] TReadDegree ReadDegree(std::string_view text);
+[[nodiscard]] CReadDegree ReadDegree(std::string_view text);
 
 /// In minor bIII, bVI and bVII are III, VI and VII, as many write them.
-[[nodiscard]] TNumeralDegree FoldMinorFlat(TNumeralDegree degree, TSignKeyType type);
+[[nodiscard]] CNumeralDegree FoldMinorFlat(CNumeralDegree degree, TSignKeyType type);
 
 /// Semitones from the tonic to a degree, not folded: -1 for bI.
-[[nodiscard]] int SemitonesOfDegree(TNumeralDegree degree, TSignKeyType type);
+[[nodiscard]] int SemitonesOfDegree(CNumeralDegree degree, TSignKeyType type);
 
 /// The spelled key of a degree: the third degree of E flat is a G.
-[[nodiscard]] CKeyEnh KeyOfDegree(TNumeralDegree degree, const CSignKeyLite& key);
+[[nodiscard]] CKeyEnh KeyOfDegree(CNumeralDegree degree, const CSignKeyLite& key);
 
 /// The key so many letters and semitones above another; -1 letters is one below.
 [[nodiscard]] CKeyEnh SpelledAbove(const CKeyEnh& from, int letters, int semitones);

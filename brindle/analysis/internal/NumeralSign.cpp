@@ -22,13 +22,13 @@ bool IsDiminished(CSemitones semitones) {
     return chordClass == TKeyChordClass_HDim || chordClass == TKeyChordClass_Dim;
 }
 
-CSemitones TonesOf(const TNumeralSign& sign, bool isSmall) {
+CSemitones TonesOf(const CNumeralSign& sign, bool isSmall) {
     return isSmall ? sign.mMinor : sign.mMajor;
 }
 
-const TNumeralSign& RowOf(std::string_view sign) {
+const CNumeralSign& RowOf(std::string_view sign) {
     return *std::find_if(kNumeralSigns.begin(), kNumeralSigns.end(),
-                         [&](const TNumeralSign& row) { return row.mText == sign; });
+                         [&](const CNumeralSign& row) { return row.mText == sign; });
 }
 
 // How much has to be told behind a sign; what is left out is harder to read than what is added,
@@ -47,13 +47,13 @@ bool DependsOnKey(std::string_view sign) {
     return sign.ends_with('9') || sign == "11" || sign == "13";
 }
 
-const TNumeralSign& NearestSign(CSemitones semitones, bool isSmall, bool byKey) {
-    const TNumeralSign* nearest = &RowOf(NumeralSignOf(semitones));
+const CNumeralSign& NearestSign(CSemitones semitones, bool isSmall, bool byKey) {
+    const CNumeralSign* nearest = &RowOf(NumeralSignOf(semitones));
     // The sign says diminished; on a Nashville number nothing else does.
     if (IsDiminished(semitones)) return *nearest;
     if (byKey && DependsOnKey(nearest->mText)) nearest = &RowOf("7");
     int best = DistanceOf(TonesOf(*nearest, isSmall), semitones);
-    for (const TNumeralSign& row : kNumeralSigns) {
+    for (const CNumeralSign& row : kNumeralSigns) {
         if (best == 0) break;
         const CSemitones tones = TonesOf(row, isSmall);
         if (tones.IsEmpty() || (byKey && DependsOnKey(row.mText))) continue;
@@ -72,14 +72,14 @@ std::string_view NumberOf(CSemitones sign, int semitone) {
 }
 
 /// A tone that is told behind the sign, and the tone for which it would stand without `add`.
-struct TAddition {
+struct CAddition {
     std::string_view mText;
     int mPlain;
 };
 
 // By semitones above the root.
 // clang-format off
-constexpr std::array<TAddition, 12> kAdditions{{
+constexpr std::array<CAddition, 12> kAdditions{{
     {"", -1},      {"b9", 2},     {"add9", -1}, {"#9", 2},  {"add3", -1},  {"add11", -1},
     {"#11", 5},    {"add5", -1},  {"b13", 9},   {"add13", -1}, {"add7", -1}, {"add^7", -1},
 }};
@@ -103,7 +103,7 @@ std::string AlterationsOf(CSemitones sign, CSemitones semitones) {
     // The altered tones first, since they stand for plain ones that are told before them.
     for (const bool isPlain : {false, true}) {
         for (int i = 0; i < 12; ++i) {
-            const TAddition& addition = kAdditions[static_cast<std::size_t>(i)];
+            const CAddition& addition = kAdditions[static_cast<std::size_t>(i)];
             if (!extra.HasIntvl(i) || isPlain != (addition.mPlain < 0)) continue;
             if (sign.HasIntvl(addition.mPlain)) text += "add";
             text += addition.mText;
@@ -118,9 +118,9 @@ bool HasSmallNumeral(CSemitones semitones) {
     return IsSmallNumeral(KeyChordClassOf(semitones));
 }
 
-TChordSign SignOfChord(CSemitones semitones, const TNumeralOptions& options) {
+CChordSign SignOfChord(CSemitones semitones, const CNumeralOptions& options) {
     const bool isSmall = HasSmallNumeral(semitones);
-    const TNumeralSign& sign = NearestSign(semitones, isSmall, options.mByKey);
+    const CNumeralSign& sign = NearestSign(semitones, isSmall, options.mByKey);
     return {sign.mText, AlterationsOf(TonesOf(sign, isSmall), semitones)};
 }
 

@@ -8,10 +8,10 @@
 
 namespace brindle {
 
-struct TNumeralOptions;
+struct CNumeralOptions;
 
 /// What stands behind the degree of a chord: a sign of kNumeralSigns and what changes it.
-struct TChordSign {
+struct CChordSign {
     std::string_view mSign;
     /// `b9`, `add13`, `no5`.
     std::string mAlterations;
@@ -21,6 +21,6 @@ struct TChordSign {
 [[nodiscard]] bool HasSmallNumeral(CSemitones semitones);
 
 /// The sign that says all tones of a chord, from which TonesOfTail reads these again.
-[[nodiscard]] TChordSign SignOfChord(CSemitones semitones, const TNumeralOptions& options);
+[[nodiscard]] CChordSign SignOfChord(CSemitones semitones, const CNumeralOptions& options);
 
 }  // namespace brindle

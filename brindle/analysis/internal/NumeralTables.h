@@ -12,18 +12,18 @@
 namespace brindle {
 
 /// A degree of a key: its number from 1, and the accidental before it.
-struct TNumeralDegree {
+struct CNumeralDegree {
     int mNumber;
     int mAccidental;  ///< 1 for #, -1 for b
 };
 
 // The degree by semitones above the tonic, 0 to 11.
 // clang-format off
-inline constexpr auto kDegreesInMajor = std::to_array<TNumeralDegree>({
+inline constexpr auto kDegreesInMajor = std::to_array<CNumeralDegree>({
     {1, 0}, {2, -1}, {2, 0}, {3, -1}, {3, 0}, {4, 0}, {4, 1}, {5, 0}, {6, -1}, {6, 0}, {7, -1}, {7, 0},
 //  I       bII      II      bIII     III     IV      #IV     V       bVI      VI      bVII     VII
 });
-inline constexpr auto kDegreesInMinor = std::to_array<TNumeralDegree>({
+inline constexpr auto kDegreesInMinor = std::to_array<CNumeralDegree>({
     {1, 0}, {2, -1}, {2, 0}, {3, 0}, {3, 1}, {4, 0}, {4, 1}, {5, 0}, {6, 0}, {6, 1}, {7, 0}, {7, 1},
 //  I       bII      II      III     #III    IV      #IV     V       VI      #VI     VII     #VII
 });
@@ -37,7 +37,7 @@ inline constexpr auto kRomanNumbers =
     std::to_array<std::string_view>({"I", "II", "III", "IV", "V", "VI", "VII"});
 
 /// A sign behind a degree and what it makes of a major and of a minor chord on it.
-struct TNumeralSign {
+struct CNumeralSign {
     std::string_view mText;
     CSemitones mMajor;
     CSemitones mMinor;
@@ -46,7 +46,7 @@ struct TNumeralSign {
 // The whole text behind the number, or the beginning before alterations; h stands for ø, o for °,
 // ^ for maj. The first sign of a chord is the one that is written.
 // clang-format off
-inline constexpr auto kNumeralSigns = std::to_array<TNumeralSign>({
+inline constexpr auto kNumeralSigns = std::to_array<CNumeralSign>({
     // text   on a large numeral         on a small numeral
     {"",      {0, 4, 7},                 {0, 3, 7}},
     {"6",     {0, 4, 7, 9},              {0, 3, 7, 9}},
@@ -95,7 +95,7 @@ enum TFigureKind : std::uint8_t {
 };
 
 /// A figure as in a figured bass, its slashes left out.
-struct TNumeralFigure {
+struct CNumeralFigure {
     std::string_view mText;
     TFigureKind mKind;
     int mBassStep;  ///< the tone in the bass: 1, 3, 5 or 7
@@ -104,7 +104,7 @@ struct TNumeralFigure {
 
 // The first of each kind and bass is the one that is written.
 // clang-format off
-inline constexpr auto kNumeralFigures = std::to_array<TNumeralFigure>({
+inline constexpr auto kNumeralFigures = std::to_array<CNumeralFigure>({
     {"",     TFigure_Triad,         1, 0},
     {"3",    TFigure_Triad,         1, 0},
     {"53",   TFigure_Triad,         1, 0},

@@ -45,7 +45,7 @@ std::string_view NumeralSignOf(CSemitones semitones) {
     return "";
 }
 
-const TNumeralDegree& NumeralDegreeOf(int degree, int key) {
+const CNumeralDegree& NumeralDegreeOf(int degree, int key) {
     const TSignKeyType type = IsMinorKey(key) ? TSignKeyType_Minor : TSignKeyType_Major;
     return DegreesOf(type)[static_cast<std::size_t>(degree)];
 }
@@ -55,7 +55,7 @@ void AppendAccidentals(std::string& text, int accidental) {
     for (; accidental < 0; ++accidental) text += 'b';
 }
 
-void AppendDegree(std::string& text, const TNumeralDegree& degree, bool isSmall) {
+void AppendDegree(std::string& text, const CNumeralDegree& degree, bool isSmall) {
     AppendAccidentals(text, degree.mAccidental);
     for (const char c : kRomanNumbers[static_cast<std::size_t>(degree.mNumber - 1)]) {
         text += isSmall ? static_cast<char>(c - 'A' + 'a') : c;

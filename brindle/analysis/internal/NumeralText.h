@@ -20,12 +20,12 @@ namespace brindle {
 [[nodiscard]] std::string_view NumeralSignOf(CSemitones semitones);
 
 /// The degree so many semitones above the tonic of a key by its number.
-[[nodiscard]] const TNumeralDegree& NumeralDegreeOf(int degree, int key);
+[[nodiscard]] const CNumeralDegree& NumeralDegreeOf(int degree, int key);
 
 /// Appends so many sharps, or flats for a negative number.
 void AppendAccidentals(std::string& text, int accidental);
 
 /// Appends a degree of 1 to 7: "bVI", "ii".
-void AppendDegree(std::string& text, const TNumeralDegree& degree, bool isSmall);
+void AppendDegree(std::string& text, const CNumeralDegree& degree, bool isSmall);
 
 }  // namespace brindle

@@ -59,7 +59,7 @@ int StepOfNumber(int number) {
 }
 
 /// The signs between a degree and its figure.
-struct TQuality {
+struct CNumeralQuality {
     bool mDiminished = false;
     bool mHalfDiminished = false;
     bool mAugmented = false;
@@ -71,8 +71,8 @@ struct TQuality {
     }
 };
 
-TQuality TakeQuality(std::string_view& tail) {
-    TQuality quality;
+CNumeralQuality TakeQuality(std::string_view& tail) {
+    CNumeralQuality quality;
     for (; !tail.empty(); tail.remove_prefix(1)) {
         switch (tail.front()) {
             case 'o':
@@ -97,7 +97,7 @@ TQuality TakeQuality(std::string_view& tail) {
     return quality;
 }
 
-const TNumeralFigure* FigureOf(std::string_view text) {
+const CNumeralFigure* FigureOf(std::string_view text) {
     constexpr std::size_t longest = 8;
     std::array<char, longest> digits;
     std::size_t count = 0;
@@ -110,21 +110,21 @@ const TNumeralFigure* FigureOf(std::string_view text) {
     const std::string_view figure(digits.data(), count);
     const auto row =
         std::find_if(kNumeralFigures.begin(), kNumeralFigures.end(),
-                     [&](const TNumeralFigure& known) { return known.mText == figure; });
+                     [&](const CNumeralFigure& known) { return known.mText == figure; });
     return row == kNumeralFigures.end() ? nullptr : &*row;
 }
 
-int ThirdOf(const TNumeralRoot& root, const TQuality& quality) {
+int ThirdOf(const CNumeralRoot& root, const CNumeralQuality& quality) {
     if (quality.mDominant) return 4;
     return root.mIsSmall || quality.mDiminished || quality.mHalfDiminished ? 3 : 4;
 }
 
-int FifthOf(const TQuality& quality) {
+int FifthOf(const CNumeralQuality& quality) {
     if (quality.mDiminished || quality.mHalfDiminished) return 6;
     return quality.mAugmented ? 8 : 7;
 }
 
-int SeventhOf(const TNumeralRoot& root, const TQuality& quality, bool byKey) {
+int SeventhOf(const CNumeralRoot& root, const CNumeralQuality& quality, bool byKey) {
     if (quality.mMajorSeventh) return kMajorSeventh;
     if (quality.mDiminished) return 9;
     // The sevenths of small numerals are minor in every key.
@@ -147,7 +147,7 @@ bool HasFourthForThird(TFigureKind kind) {
 }
 
 // The tones of a figure in the root position.
-CSemitones TonesOfKind(TFigureKind kind, const TNumeralRoot& root, const TQuality& quality,
+CSemitones TonesOfKind(TFigureKind kind, const CNumeralRoot& root, const CNumeralQuality& quality,
                        bool byKey) {
     const auto tension = [&](int step, int usual) {
         return byKey ? IntvlInKey(root, step) : usual;
@@ -172,13 +172,13 @@ CSemitones TonesOfKind(TFigureKind kind, const TNumeralRoot& root, const TQualit
 }
 
 // Half diminished without a figure is a seventh chord.
-TReadTones TonesOfFigure(std::string_view tail, const TNumeralRoot& root, bool byKey) {
-    const TQuality quality = TakeQuality(tail);
-    const TNumeralFigure* figure = FigureOf(tail);
+CReadTones TonesOfFigure(std::string_view tail, const CNumeralRoot& root, bool byKey) {
+    const CNumeralQuality quality = TakeQuality(tail);
+    const CNumeralFigure* figure = FigureOf(tail);
     if (figure == nullptr || (tail.empty() && quality.mDominant)) return {};
     TFigureKind kind = figure->mKind;
     if (tail.empty() && (quality.mHalfDiminished || quality.mMajorSeventh)) kind = TFigure_Seventh;
-    TReadTones tones{TonesOfKind(kind, root, quality, byKey), figure->mBassStep};
+    CReadTones tones{TonesOfKind(kind, root, quality, byKey), figure->mBassStep};
     if (figure->mWithout != 0) {
         tones.mSemitones.EraseIntvl(SemitoneOfStep(tones.mSemitones, figure->mWithout));
     }
@@ -187,15 +187,15 @@ TReadTones TonesOfFigure(std::string_view tail, const TNumeralRoot& root, bool b
 
 CSemitones TonesOfSign(std::string_view text, bool isSmall) {
     const auto row = std::find_if(kNumeralSigns.begin(), kNumeralSigns.end(),
-                                  [&](const TNumeralSign& sign) { return sign.mText == text; });
+                                  [&](const CNumeralSign& sign) { return sign.mText == text; });
     if (row == kNumeralSigns.end()) return {};
     return isSmall ? row->mMinor : row->mMajor;
 }
 
 // The longest sign that the text begins with, taken from it.
 CSemitones TakeSign(std::string_view& text, bool isSmall) {
-    const TNumeralSign* longest = &kNumeralSigns.front();
-    for (const TNumeralSign& sign : kNumeralSigns) {
+    const CNumeralSign* longest = &kNumeralSigns.front();
+    for (const CNumeralSign& sign : kNumeralSigns) {
         const CSemitones tones = isSmall ? sign.mMinor : sign.mMajor;
         if (tones.IsEmpty() || sign.mText.size() <= longest->mText.size()) continue;
         if (text.starts_with(sign.mText)) longest = &sign;
@@ -284,8 +284,8 @@ int CountOf(CSemitones semitones, int from, int to) {
 
 }  // namespace
 
-int IntvlInKey(const TNumeralRoot& root, int step) {
-    const TNumeralDegree degree{(root.mDegree.mNumber - 1 + step - 1) % 7 + 1, 0};
+int IntvlInKey(const CNumeralRoot& root, int step) {
+    const CNumeralDegree degree{(root.mDegree.mNumber - 1 + step - 1) % 7 + 1, 0};
     return FoldIntoOctave(std::int64_t{SemitonesOfDegree(degree, root.mKeyType)} -
                           SemitonesOfDegree(root.mDegree, root.mKeyType));
 }
@@ -326,14 +326,14 @@ int SemitoneOfStep(CSemitones semitones, int step) {
     return -1;
 }
 
-TReadTones TonesOfTail(std::string_view tail, const TNumeralRoot& given,
-                       const TNumeralOptions& options) {
-    TNumeralRoot root = given;
+CReadTones TonesOfTail(std::string_view tail, const CNumeralRoot& given,
+                       const CNumeralOptions& options) {
+    CNumeralRoot root = given;
     if (IsMinorSign(tail)) {
         root.mIsSmall = true;
         tail.remove_prefix(1);
     }
-    const TReadTones figured = TonesOfFigure(tail, root, options.mByKey);
+    const CReadTones figured = TonesOfFigure(tail, root, options.mByKey);
     const bool isFigured = !figured.mSemitones.IsEmpty();
     if (isFigured && (options.mFigures || options.mByKey)) return figured;
     const CSemitones sign = TonesOfSign(tail, root.mIsSmall);
@@ -344,7 +344,7 @@ TReadTones TonesOfTail(std::string_view tail, const TNumeralRoot& given,
     return {TonesOfSymbol(tail, root.mIsSmall)};
 }
 
-bool ApplyGroup(std::string_view group, const TNumeralRoot& root, TReadTones& tones) {
+bool ApplyGroup(std::string_view group, const CNumeralRoot& root, CReadTones& tones) {
     while (!group.empty()) {
         const bool isOmitted = Take(group, "no");
         const bool isAdded = !isOmitted && Take(group, "add");

@@ -14,16 +14,16 @@ namespace brindle {
 
 namespace {
 
-using TForms = std::vector<TPassageForm>;
+using TForms = std::vector<CPassageForm>;
 
 constexpr TPlace kShortest = 2;
 
 void AddBranching(const CSuffixes& suffixes, TForms& forms) {
-    struct TOpen {
+    struct COpen {
         TPlace mLength;
         TPlace mFirst;
     };
-    std::vector<TOpen> open;
+    std::vector<COpen> open;
     const TPlace count = suffixes.Count();
     for (TPlace rank = 1; rank <= count; ++rank) {
         const TPlace shared = rank < count ? suffixes.SharedWithPrevious(rank) : 0;
@@ -52,7 +52,7 @@ public:
 
 private:
     /// Places where a tandem begins, from the first to the last.
-    struct TBegins {
+    struct CBegins {
         TPlace mFirst = 1;
         TPlace mLast = 0;
 
@@ -60,9 +60,9 @@ private:
     };
 
     void AddTo(TForms& forms, TPlace length) const {
-        TBegins begins;
+        CBegins begins;
         for (TPlace place = 0; place + length < mSuffixes.Count(); place += length) {
-            const TBegins more = BeginsOver(place, length);
+            const CBegins more = BeginsOver(place, length);
             if (more.IsEmpty()) continue;
             if (!begins.IsEmpty() && more.mFirst == begins.mLast + 1) {
                 begins.mLast = more.mLast;
@@ -75,13 +75,13 @@ private:
     }
 
     /// The tandems whose first half covers a place.
-    [[nodiscard]] TBegins BeginsOver(TPlace place, TPlace length) const {
+    [[nodiscard]] CBegins BeginsOver(TPlace place, TPlace length) const {
         if (mSymbols[place] != mSymbols[place + length]) return {};
         const TPlace equal = mSuffixes.EqualCount(place, place + length);
         const TPlace before = place == 0 ? 0 : EqualCountBefore(place, place + length);
         const TPlace first = place - std::min(before, length - 1);
         const TPlace end = place + std::min(equal, length);
-        return end < first + length ? TBegins{} : TBegins{first, end - length};
+        return end < first + length ? CBegins{} : CBegins{first, end - length};
     }
 
     [[nodiscard]] TPlace EqualCountBefore(TPlace a, TPlace b) const {
@@ -90,10 +90,10 @@ private:
     }
 
     // From one period on the tandems come again.
-    void Add(TForms& forms, TBegins begins, TPlace length) const {
+    void Add(TForms& forms, CBegins begins, TPlace length) const {
         if (begins.IsEmpty()) return;
-        const TRanks first = mSuffixes.RanksOfPassage(begins.mFirst, length);
-        TRanks ranks = first;
+        const CRanks first = mSuffixes.RanksOfPassage(begins.mFirst, length);
+        CRanks ranks = first;
         TPlace place = begins.mFirst;
         do {
             forms.push_back({length, 0, ranks});
@@ -108,19 +108,19 @@ private:
 };
 
 void SetGroups(TForms& forms, const CSuffixes& suffixes, const CSuffixes& groupSuffixes) {
-    for (TPassageForm& form : forms) {
+    for (CPassageForm& form : forms) {
         const TPlace place = suffixes.PlaceOf(form.mRanks.mFirst);
         form.mGroup = groupSuffixes.RanksOfPassage(place, form.mLength).mFirst;
     }
 }
 
-std::tuple<TPlace, TPlace, TPlace> Key(const TPassageForm& form) {
+std::tuple<TPlace, TPlace, TPlace> Key(const CPassageForm& form) {
     return {form.mLength, form.mGroup, form.mRanks.mFirst};
 }
 
 }  // namespace
 
-std::vector<TPassageForm> RepeatedPassages(const std::vector<TPlace>& symbols,
+std::vector<CPassageForm> RepeatedPassages(const std::vector<TPlace>& symbols,
                                            const CSuffixes& suffixes,
                                            const std::vector<TPlace>& groupSymbols) {
     TForms forms;

@@ -57,19 +57,19 @@ double FractionOf(std::string_view digits) {
     return fraction;
 }
 
-bool IsCompound(const TTimeSignature& time) {
+bool IsCompound(const CTimeSignature& time) {
     if (time.mIsSlow || time.mBeats % 3 != 0) return false;
     return time.mBeats > 3 || time.mBeatValue >= 8;
 }
 
 }  // namespace
 
-std::optional<TMeasureRange> TakeMeasures(std::string_view& text) {
+std::optional<CMeasureRange> TakeMeasures(std::string_view& text) {
     std::string_view rest = text;
     if (!Take(rest, "m")) return std::nullopt;
     const auto first = TakeWhole(rest, kMostMeasures);
     if (!first) return std::nullopt;
-    TMeasureRange range{*first, *first};
+    CMeasureRange range{*first, *first};
     if (Take(rest, "var")) {
         range.mIsVariant = true;
         while (!rest.empty() && IsDigit(rest.front())) rest.remove_prefix(1);
@@ -117,15 +117,15 @@ std::optional<CSignKeyLite> KeyOf(std::string_view word) {
     return CSignKeyLite(root, isMinor ? TSignKeyType_Minor : TSignKeyType_Major);
 }
 
-double TTimeSignature::BeatLength() const {
+double CTimeSignature::BeatLength() const {
     return (IsCompound(*this) ? 12.0 : 4.0) / mBeatValue;
 }
 
-std::optional<TTimeSignature> TimeSignatureOf(std::string_view text) {
-    TTimeSignature time;
+std::optional<CTimeSignature> TimeSignatureOf(std::string_view text) {
+    CTimeSignature time;
     text = Trimmed(text);
     if (text == "C") return time;
-    if (text == "Cut" || text == "cut" || text == "C|") return TTimeSignature{2, 2};
+    if (text == "Cut" || text == "cut" || text == "C|") return CTimeSignature{2, 2};
     time.mIsSlow = Take(text, "slow");
     if (!time.mIsSlow) (void)Take(text, "fast");
     text = Trimmed(text);

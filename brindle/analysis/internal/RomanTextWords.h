@@ -10,7 +10,7 @@
 namespace brindle {
 
 /// The measures that a line of RomanText speaks of: `m12`, `m12a`, `m12var1`, `m5-8`.
-struct TMeasureRange {
+struct CMeasureRange {
     int mFirst = 0;
     int mLast = 0;
     /// Another reading of a measure that is read already.
@@ -20,7 +20,7 @@ struct TMeasureRange {
 };
 
 /// Takes the measures that the text begins with; nothing, and nothing taken, if there are none.
-[[nodiscard]] std::optional<TMeasureRange> TakeMeasures(std::string_view& text);
+[[nodiscard]] std::optional<CMeasureRange> TakeMeasures(std::string_view& text);
 
 /// The beat of `b2.5`, from 1; nothing for another word. Thirds and sixths are exact, however many
 /// digits they are written with.
@@ -30,7 +30,7 @@ struct TMeasureRange {
 [[nodiscard]] std::optional<CSignKeyLite> KeyOf(std::string_view word);
 
 /// A time signature: `3/4`, `C`, `Cut`, `slow 6/8`.
-struct TTimeSignature {
+struct CTimeSignature {
     int mBeats = 4;
     int mBeatValue = 4;
     /// 6/8 in six beats instead of two.
@@ -41,7 +41,7 @@ struct TTimeSignature {
     [[nodiscard]] double BeatLength() const;
 };
 
-[[nodiscard]] std::optional<TTimeSignature> TimeSignatureOf(std::string_view text);
+[[nodiscard]] std::optional<CTimeSignature> TimeSignatureOf(std::string_view text);
 
 /// Takes the next word and the white space before it; empty at the end.
 [[nodiscard]] std::string_view TakeWord(std::string_view& text);

@@ -36,7 +36,7 @@ int LowestOfTheBest(const std::array<double, kKeyCount>& scores) {
     return static_cast<int>(winner - scores.begin());
 }
 
-int HomeOf(std::span<const TKeyChord> chords, int bestScored, int statedKey) {
+int HomeOf(std::span<const CKeyChord> chords, int bestScored, int statedKey) {
     if (statedKey >= 0) return statedKey;
     const int vamp = KeyOfVamp(chords);
     return vamp >= 0 ? vamp : bestScored;
@@ -44,9 +44,9 @@ int HomeOf(std::span<const TKeyChord> chords, int bestScored, int statedKey) {
 
 }  // namespace
 
-TSongKeys FindSongKeys(std::span<const TKeyChord> chords, const CKeyOptions& options,
+CSongKeys FindSongKeys(std::span<const CKeyChord> chords, const CKeyOptions& options,
                        int statedKey) {
-    TSongKeys found;
+    CSongKeys found;
     found.mScores = KeyScores(chords);
     found.mBestScored = LowestOfTheBest(found.mScores);
     found.mTraits = SongTraitsOf(chords, HomeOf(chords, found.mBestScored, statedKey));
@@ -89,7 +89,7 @@ CKeySpeller::CKeySpeller(const CHarmAnlsChords& chords, const CSignKeyLite& stat
 }
 
 std::vector<CKeyRegion> KeyRegionsOf(const CHarmAnlsChords& chords,
-                                     std::span<const TKeyChord> heard,
+                                     std::span<const CKeyChord> heard,
                                      std::span<const std::uint8_t> keys,
                                      const CKeySpeller& speller) {
     std::vector<CKeyRegion> regions;

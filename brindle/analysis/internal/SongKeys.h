@@ -14,11 +14,11 @@
 namespace brindle {
 
 /// The keys of a song as numbers.
-struct TSongKeys {
+struct CSongKeys {
     std::array<double, kKeyCount> mScores{};
     /// By the scores alone.
     int mBestScored = 0;
-    TSongTraits mTraits;
+    CSongTraits mTraits;
     std::vector<TKeyChordKind> mKinds;
     /// The key of each chord.
     std::vector<std::uint8_t> mKeys;
@@ -26,7 +26,7 @@ struct TSongKeys {
 
 /// `chords` has at least one chord. `statedKey` is the number of the key of the song, -1 to find
 /// it.
-[[nodiscard]] TSongKeys FindSongKeys(std::span<const TKeyChord> chords, const CKeyOptions& options,
+[[nodiscard]] CSongKeys FindSongKeys(std::span<const CKeyChord> chords, const CKeyOptions& options,
                                      int statedKey = -1);
 
 /// The share of a key in the points of all keys, 0 to 1.
@@ -48,7 +48,7 @@ private:
 
 /// The passages of one key. `heard` are the chords that `keys` are of.
 [[nodiscard]] std::vector<CKeyRegion> KeyRegionsOf(const CHarmAnlsChords& chords,
-                                                   std::span<const TKeyChord> heard,
+                                                   std::span<const CKeyChord> heard,
                                                    std::span<const std::uint8_t> keys,
                                                    const CKeySpeller& speller);
 

@@ -8,7 +8,7 @@
 namespace brindle {
 
 /// What the chords of a song together tell about each of them.
-struct TSongTraits {
+struct CSongTraits {
     int mHome = 0;         ///< number of the key of the song
     bool mIsVamp = false;  ///< a Dorian vamp: the one key is home, throughout
     bool mIsBlues = false;
@@ -16,9 +16,9 @@ struct TSongTraits {
 };
 
 /// The minor key of a vamp of i and IV, Dm7 G7 Dm7 G7; -1 if the song is none.
-[[nodiscard]] int KeyOfVamp(std::span<const TKeyChord> chords);
+[[nodiscard]] int KeyOfVamp(std::span<const CKeyChord> chords);
 
 /// The traits of a song in the key `home`.
-[[nodiscard]] TSongTraits SongTraitsOf(std::span<const TKeyChord> chords, int home);
+[[nodiscard]] CSongTraits SongTraitsOf(std::span<const CKeyChord> chords, int home);
 
 }  // namespace brindle

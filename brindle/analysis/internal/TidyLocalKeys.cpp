@@ -15,14 +15,14 @@ constexpr std::size_t kLongestTonicization = 5;
 constexpr CSemitones kCadenceDegrees{0, 2, 5, 7, 11};
 
 /// The chords [mBegin, mEnd) of one key.
-struct TRun {
+struct CRun {
     std::size_t mBegin;
     std::size_t mEnd;
     int mKey;
 };
 
-std::vector<TRun> RunsOf(const std::vector<std::uint8_t>& keys) {
-    std::vector<TRun> runs;
+std::vector<CRun> RunsOf(const std::vector<std::uint8_t>& keys) {
+    std::vector<CRun> runs;
     for (std::size_t i = 0; i < keys.size(); ++i) {
         if (runs.empty() || runs.back().mKey != keys[i]) runs.push_back({i, i, keys[i]});
         runs.back().mEnd = i + 1;
@@ -39,17 +39,17 @@ bool IsDegreeOf(int key, int around) {
     return IsSmallDegree(degree, around) == IsMinorKey(key);
 }
 
-bool OnlyCadences(std::span<const TKeyChord> chords, int key, bool mayRest) {
-    return std::all_of(chords.begin(), chords.end(), [&](const TKeyChord& chord) {
+bool OnlyCadences(std::span<const CKeyChord> chords, int key, bool mayRest) {
+    return std::all_of(chords.begin(), chords.end(), [&](const CKeyChord& chord) {
         const int degree = DegreeInKey(chord.mRoot, key);
         return kCadenceDegrees.HasIntvl(degree) && (degree != 0 || mayRest);
     });
 }
 
 // The key that the run `ix` is but an episode of, if any.
-std::optional<int> KeyAround(std::span<const TKeyChord> chords, const std::vector<TRun>& runs,
+std::optional<int> KeyAround(std::span<const CKeyChord> chords, const std::vector<CRun>& runs,
                              std::size_t ix) {
-    const TRun& run = runs[ix];
+    const CRun& run = runs[ix];
     const bool isFirst = ix == 0;
     const bool isLast = ix + 1 == runs.size();
     if ((isFirst && isLast) || run.mEnd - run.mBegin > kLongestTonicization) return std::nullopt;
@@ -63,8 +63,8 @@ std::optional<int> KeyAround(std::span<const TKeyChord> chords, const std::vecto
     return around;
 }
 
-void JoinTonicizations(std::span<const TKeyChord> chords, std::vector<std::uint8_t>& keys) {
-    const std::vector<TRun> runs = RunsOf(keys);
+void JoinTonicizations(std::span<const CKeyChord> chords, std::vector<std::uint8_t>& keys) {
+    const std::vector<CRun> runs = RunsOf(keys);
     for (std::size_t ix = 0; ix < runs.size(); ++ix) {
         const std::optional<int> around = KeyAround(chords, runs, ix);
         if (!around) continue;
@@ -75,7 +75,7 @@ void JoinTonicizations(std::span<const TKeyChord> chords, std::vector<std::uint8
 }
 
 // A chord that fits home and not the key that it was put into.
-bool IsForeign(const TKeyChord& chord, int key, int home) {
+bool IsForeign(const CKeyChord& chord, int key, int home) {
     const bool hasMode = chord.mClass == TKeyChordClass_Triad ||
                          chord.mClass == TKeyChordClass_Maj7 ||
                          chord.mClass == TKeyChordClass_Min ||
@@ -84,7 +84,7 @@ bool IsForeign(const TKeyChord& chord, int key, int home) {
            IsInScale(chord, DegreeInKey(chord.mRoot, home), ScaleOfKey(home));
 }
 
-void GiveBordersHome(std::span<const TKeyChord> chords, int home, std::vector<std::uint8_t>& keys) {
+void GiveBordersHome(std::span<const CKeyChord> chords, int home, std::vector<std::uint8_t>& keys) {
     const auto homeKey = static_cast<std::uint8_t>(home);
     for (auto [begin, end, key] : RunsOf(keys)) {
         if (key == home) continue;
@@ -99,7 +99,7 @@ void GiveBordersHome(std::span<const TKeyChord> chords, int home, std::vector<st
 
 }  // namespace
 
-void TidyLocalKeys(std::span<const TKeyChord> chords, int home, std::vector<std::uint8_t>& keys) {
+void TidyLocalKeys(std::span<const CKeyChord> chords, int home, std::vector<std::uint8_t>& keys) {
     JoinTonicizations(chords, keys);
     GiveBordersHome(chords, home, keys);
 }

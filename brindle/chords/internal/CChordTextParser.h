@@ -3,8 +3,8 @@
 
 #include "brindle/chords/ReadChordText.h"
 #include "brindle/chords/internal/CChordTextTones.h"
-#include "brindle/chords/internal/CFoldedText.h"
 #include "brindle/chords/internal/CTextScan.h"
+#include "brindle/chords/internal/CUnifiedText.h"
 #include "brindle/chords/internal/FaultsOfChordText.h"
 #include "brindle/chords/internal/NoteOfChordText.h"
 
@@ -17,12 +17,12 @@ namespace brindle::ChordText {
 /// told in docs/chord-symbols.md. A step that fails sets the fault and gives false.
 class CChordTextParser {
 public:
-    CChordTextParser(const CFoldedText& text, const CChordTextPrefs& prefs)
+    CChordTextParser(const CUnifiedText& text, const CChordTextOptions& prefs)
         : mPrefs(prefs), mScan(text.Text(), text.Lower()) {}
 
     /// False: Fault tells why.
     [[nodiscard]] bool Read();
-    [[nodiscard]] const TFaultAt& Fault() const { return mFault; }
+    [[nodiscard]] const CFaultAt& Fault() const { return mFault; }
     [[nodiscard]] CChordLite Chord() const;
     [[nodiscard]] bool HasH() const { return mRoot.mIsH || (mBass && mBass->mIsH); }
 
@@ -43,7 +43,7 @@ private:
     /// Finds the bass and cuts it off.
     void CutBass();
     void CutBassBehind(std::size_t separator, std::size_t name);
-    [[nodiscard]] std::optional<TWrittenNote> WholeNote(std::size_t pos) const;
+    [[nodiscard]] std::optional<CWrittenNote> WholeNote(std::size_t pos) const;
 
     void ReadQuality();
     [[nodiscard]] bool ReadTuneBookQuality();
@@ -51,8 +51,8 @@ private:
     bool ReadOptions();
     bool ReadOption();
     /// A word and what reads it.
-    struct TOptionRow;
-    [[nodiscard]] static const TOptionRow* FindOptionRow(const CTextScan& scan);
+    struct COptionRow;
+    [[nodiscard]] static const COptionRow* FindOptionRow(const CTextScan& scan);
     bool ReadDegreeOption();
     bool ReadDrone(std::size_t wordLength);
     bool ReadAltered(std::size_t wordLength);
@@ -72,12 +72,12 @@ private:
     bool FailAtOption();
     bool FailBehindSlash();
 
-    CChordTextPrefs mPrefs;
+    CChordTextOptions mPrefs;
     CTextScan mScan;
-    TFaultAt mFault;
+    CFaultAt mFault;
 
-    TWrittenNote mRoot;
-    std::optional<TWrittenNote> mBass;
+    CWrittenNote mRoot;
+    std::optional<CWrittenNote> mBass;
     CChordTextTones mTones;
     /// Set by the colon form, which has no use for the other steps.
     std::optional<CSemitones> mSemitones;

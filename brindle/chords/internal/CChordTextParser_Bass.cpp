@@ -7,15 +7,15 @@ namespace brindle::ChordText {
 namespace {
 
 /// Where a bass may begin: a slash or the word `on`, and the note behind it.
-struct TSeparator {
+struct CSeparator {
     std::size_t mBegin = 0;
     std::size_t mNote = 0;
 };
 
-std::optional<TSeparator> LastSlash(std::string_view text) {
+std::optional<CSeparator> LastSlash(std::string_view text) {
     const std::size_t slash = text.rfind('/');
     if (slash == text.npos) return std::nullopt;
-    return TSeparator{slash, slash + 1};
+    return CSeparator{slash, slash + 1};
 }
 
 // `F on G`, or directly before a capital, `FonG`.
@@ -26,10 +26,10 @@ bool IsOn(std::string_view text, std::size_t on) {
     return standsAlone || IsCapitalNote(text[behind]);
 }
 
-std::optional<TSeparator> LastOn(std::string_view text) {
+std::optional<CSeparator> LastOn(std::string_view text) {
     std::size_t on = text.rfind("on");
     while (on != text.npos) {
-        if (IsOn(text, on)) return TSeparator{on, on + 2};
+        if (IsOn(text, on)) return CSeparator{on, on + 2};
         on = text.substr(0, on).rfind("on");
     }
     return std::nullopt;
@@ -42,7 +42,7 @@ void CChordTextParser::CutBass() {
     const auto slash = LastSlash(rest);
     const auto on = LastOn(rest);
     if (!slash && !on) return;
-    const TSeparator last = !on || (slash && slash->mBegin > on->mBegin) ? *slash : *on;
+    const CSeparator last = !on || (slash && slash->mBegin > on->mBegin) ? *slash : *on;
     CutBassBehind(mScan.mPos + last.mBegin, mScan.mPos + last.mNote);
 }
 
@@ -57,7 +57,7 @@ void CChordTextParser::CutBassBehind(std::size_t separator, std::size_t name) {
     mScan.CutAt(hasOpenBracket ? mScan.mPos + last : separator);
 }
 
-std::optional<TWrittenNote> CChordTextParser::WholeNote(std::size_t pos) const {
+std::optional<CWrittenNote> CChordTextParser::WholeNote(std::size_t pos) const {
     CTextScan scan = mScan;
     scan.mPos = pos;
     scan.SkipBlanks();

@@ -10,7 +10,7 @@ namespace brindle::ChordText {
 namespace {
 
 /// A degree of the major scale with flats and sharps, as in `bb7`.
-struct TColonDegree {
+struct CColonDegree {
     /// 1 to 13.
     int mDegree = 0;
     /// Signs, reduced to within an octave.
@@ -23,8 +23,8 @@ struct TColonDegree {
 };
 
 /// Reads `b`s or `#`s and a number; degree 0 if there is none.
-constexpr TColonDegree TakeDegree(CTextScan& scan) {
-    TColonDegree degree;
+constexpr CColonDegree TakeDegree(CTextScan& scan) {
+    CColonDegree degree;
     while (scan.Peek() == 'b' || scan.Peek() == '#') {
         degree.mAccidental = (degree.mAccidental + (scan.Peek() == 'b' ? -1 : 1)) % 12;
         ++scan.mPos;
@@ -37,13 +37,13 @@ constexpr TColonDegree TakeDegree(CTextScan& scan) {
     return degree;
 }
 
-struct TColonRow {
+struct CColonRow {
     std::string_view mWord;
     std::string_view mDegrees;
 };
 
 // Here 7 is the major seventh, b7 the minor one.
-constexpr auto kColonRows = std::to_array<TColonRow>({
+constexpr auto kColonRows = std::to_array<CColonRow>({
     {"maj", "1 3 5"},
     {"min", "1 b3 5"},
     {"dim", "1 b3 b5"},
@@ -89,7 +89,7 @@ static_assert(TonesOf("1 b3 b5 bb7") == CSemitones{0, 3, 6, 9});
 std::optional<CSemitones> TonesOfWord(std::string_view word, bool hasDegrees) {
     if (word.empty() && hasDegrees) word = "1";
     const auto* const row = std::find_if(kColonRows.begin(), kColonRows.end(),
-                                         [&](const TColonRow& r) { return r.mWord == word; });
+                                         [&](const CColonRow& r) { return r.mWord == word; });
     if (row == kColonRows.end()) return std::nullopt;
     return TonesOf(row->mDegrees);
 }
@@ -116,7 +116,7 @@ bool CChordTextParser::ReadColonDegrees(CSemitones& tones) {
     do {
         mScan.SkipBlanks();
         const bool isLeftOut = mScan.Take('*');
-        const TColonDegree degree = TakeDegree(mScan);
+        const CColonDegree degree = TakeDegree(mScan);
         if (degree.mDegree == 0) return false;
         tones.SetSemitone(degree.Tone(), !isLeftOut);
         mScan.SkipBlanks();
@@ -130,7 +130,7 @@ bool CChordTextParser::ReadColonBass() {
     mBass = WholeNote(mScan.mPos);
     if (mBass) return true;
     const std::size_t degreePos = mScan.mPos;
-    const TColonDegree degree = TakeDegree(mScan);
+    const CColonDegree degree = TakeDegree(mScan);
     if (degree.mDegree == 0 || !mScan.AtEnd()) return false;
     // Spelled by its letter: the third of A flat is a C, and its flat third a C flat.
     const int letter = (mRoot.mLetter + degree.mDegree - 1) % 7;
@@ -141,7 +141,7 @@ bool CChordTextParser::ReadColonBass() {
         Fail(TFault::OneAccidentalTooMany, degreePos);
         return true;
     }
-    mBass = TWrittenNote{letter, accidental, false};
+    mBass = CWrittenNote{letter, accidental, false};
     return true;
 }
 

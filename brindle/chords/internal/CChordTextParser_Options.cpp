@@ -11,14 +11,14 @@ namespace {
 // The longer first.
 constexpr auto kSuspendedWords = std::to_array<std::string_view>({"suspended", "susp", "sus"});
 
-struct TSuspensionRow {
+struct CSuspensionRow {
     std::string_view mText;
     bool mHasSecond;
     bool mHasFourth;
 };
 
 // What may stand behind a word for suspended; without it the fourth is meant.
-constexpr auto kSuspensionRows = std::to_array<TSuspensionRow>({
+constexpr auto kSuspensionRows = std::to_array<CSuspensionRow>({
     {"2sus4", true, true},
     {"2/4", true, true},
     {"24", true, true},
@@ -29,8 +29,8 @@ constexpr auto kSuspensionRows = std::to_array<TSuspensionRow>({
     {"fourth", false, true},
 });
 
-template <class TWords>
-std::size_t LengthOfWord(const CTextScan& scan, const TWords& words) {
+template <class CWords>
+std::size_t LengthOfWord(const CTextScan& scan, const CWords& words) {
     const auto* const found = std::find_if(
         words.begin(), words.end(), [&](std::string_view word) { return scan.SeesWord(word); });
     return found == words.end() ? 0 : found->size();
@@ -49,16 +49,16 @@ bool CChordTextParser::ReadOptions() {
     return true;
 }
 
-struct CChordTextParser::TOptionRow {
+struct CChordTextParser::COptionRow {
     std::string_view mWord;
     bool (CChordTextParser::*mRead)(std::size_t wordLength);
 };
 
 /// The row of the word that the text goes on with; null without one.
-const CChordTextParser::TOptionRow* CChordTextParser::FindOptionRow(const CTextScan& scan) {
+const CChordTextParser::COptionRow* CChordTextParser::FindOptionRow(const CTextScan& scan) {
     using Parser = CChordTextParser;
     // A longer word before one that it begins with.
-    static constexpr auto kRows = std::to_array<TOptionRow>({
+    static constexpr auto kRows = std::to_array<COptionRow>({
         {"add", &Parser::ReadAddition},
         {"altered", &Parser::ReadAltered},
         {"alt", &Parser::ReadAltered},
@@ -67,7 +67,7 @@ const CChordTextParser::TOptionRow* CChordTextParser::FindOptionRow(const CTextS
         {"omit", &Parser::ReadOmission},
         {"without", &Parser::ReadOmission},
     });
-    const auto* const row = std::find_if(kRows.begin(), kRows.end(), [&](const TOptionRow& option) {
+    const auto* const row = std::find_if(kRows.begin(), kRows.end(), [&](const COptionRow& option) {
         return scan.SeesWord(option.mWord);
     });
     return row == kRows.end() ? nullptr : row;
@@ -80,7 +80,7 @@ bool CChordTextParser::ReadOption() {
         return true;
     }
     if (c == '(' || c == ')' || c == ',' || c == '/') return ReadPunctuation(c);
-    if (const TOptionRow* row = FindOptionRow(mScan)) return (this->*row->mRead)(row->mWord.size());
+    if (const COptionRow* row = FindOptionRow(mScan)) return (this->*row->mRead)(row->mWord.size());
     if (mScan.SeesWord("s") && ReadSuspension()) return true;
     return ReadDegreeOption();
 }
@@ -176,7 +176,7 @@ bool CChordTextParser::ReadSuspension() {
     const CTextScan behindWord = scan;
     scan.SkipBlanks();
     // Of the short form there are `s2` and `s4`.
-    const auto fits = [&](const TSuspensionRow& row) {
+    const auto fits = [&](const CSuspensionRow& row) {
         return scan.SeesWord(row.mText) && (wordLength > 0 || row.mText.size() == 1);
     };
     const auto* const row = std::find_if(kSuspensionRows.begin(), kSuspensionRows.end(), fits);

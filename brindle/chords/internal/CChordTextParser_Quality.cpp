@@ -10,7 +10,7 @@ namespace {
 
 enum class TQuality { Minor, Diminished, HalfDiminished, Augmented, Dominant };
 
-struct TQualityRow {
+struct CQualityRow {
     std::string_view mText;
     TQuality mQuality;
     /// A small letter only.
@@ -19,7 +19,7 @@ struct TQualityRow {
 
 // The words for major are those of DegreesOfChordText.h; they are tried before these, since `maj`
 // begins with the `m` of minor. Longer ones first.
-constexpr auto kQualityRows = std::to_array<TQualityRow>({
+constexpr auto kQualityRows = std::to_array<CQualityRow>({
     {"minor", TQuality::Minor},
     {"min", TQuality::Minor},
     {"mi", TQuality::Minor},
@@ -47,7 +47,7 @@ constexpr auto kQualityRows = std::to_array<TQualityRow>({
     {"dom", TQuality::Dominant},
 });
 
-bool Fits(const TQualityRow& row, CTextScan scan) {
+bool Fits(const CQualityRow& row, CTextScan scan) {
     if (row.mIsExact ? !scan.Sees(row.mText) : !scan.SeesWord(row.mText)) return false;
     scan.mPos += row.mText.size();
     // `C-5` has a flat five, `Comit3` leaves the third out, `ConX` has a bass that is none.
@@ -58,13 +58,13 @@ bool Fits(const TQualityRow& row, CTextScan scan) {
     return true;
 }
 
-struct TTuneBookRow {
+struct CTuneBookRow {
     std::string_view mText;
     TQuality mQuality;
 };
 
 // All that stands behind a capital root in tune books.
-constexpr auto kTuneBookRows = std::to_array<TTuneBookRow>({
+constexpr auto kTuneBookRows = std::to_array<CTuneBookRow>({
     {"d", TQuality::Diminished},
     {"a", TQuality::Augmented},
     {"d7", TQuality::Diminished},
@@ -101,7 +101,7 @@ void CChordTextParser::ReadQuality() {
     } else {
         const auto* const row =
             std::find_if(kQualityRows.begin(), kQualityRows.end(),
-                         [&](const TQualityRow& quality) { return Fits(quality, mScan); });
+                         [&](const CQualityRow& quality) { return Fits(quality, mScan); });
         if (row == kQualityRows.end()) {
             mScan = atRoot;
             if (mRootIsSmall && mPrefs.mLowerCaseIsMinor) mTones.MakeMinor();
@@ -118,7 +118,7 @@ void CChordTextParser::ReadQuality() {
 
 bool CChordTextParser::ReadTuneBookQuality() {
     if (mRootIsSmall) return false;
-    for (const TTuneBookRow& row : kTuneBookRows) {
+    for (const CTuneBookRow& row : kTuneBookRows) {
         if (mScan.Rest() != row.mText) continue;
         Make(row.mQuality, mTones);
         ++mScan.mPos;

@@ -7,7 +7,7 @@
 namespace brindle::ChordText {
 namespace {
 
-struct TAlterationRow {
+struct CAlterationRow {
     int mDegree;
     int mSign;
     int mTone;
@@ -17,7 +17,7 @@ struct TAlterationRow {
 
 // Fifths, thirds and sevenths have rules of their own. A flat thirteen is a tension and leaves the
 // fifth alone.
-constexpr auto kAlterationRows = std::to_array<TAlterationRow>({
+constexpr auto kAlterationRows = std::to_array<CAlterationRow>({
     {9, -1, 1, 2},
     {2, -1, 1, 2},
     {9, +1, 3, 2},
@@ -144,7 +144,7 @@ void CChordTextTones::Add(int number, int sign) {
     mTones |= Bit(number == 7 ? seventh : ToneOfDegree(number) + sign);
 }
 
-bool CChordTextTones::Alter(TAlteredDegree altered) {
+bool CChordTextTones::Alter(CAlteredDegree altered) {
     const auto [degree, sign] = altered;
     if (degree == 5) {
         mFifths = (mFifths & ~Bit(7)) | Bit(7 + sign);
@@ -164,7 +164,7 @@ bool CChordTextTones::Alter(TAlteredDegree altered) {
         return true;
     }
     const auto* const row = std::find_if(kAlterationRows.begin(), kAlterationRows.end(),
-                                         [degree = degree, sign = sign](const TAlterationRow& r) {
+                                         [degree = degree, sign = sign](const CAlterationRow& r) {
                                              return r.mDegree == degree && r.mSign == sign;
                                          });
     if (row == kAlterationRows.end()) return false;

@@ -8,7 +8,7 @@
 namespace brindle::ChordText {
 
 /// The degree of an altered tone: `b9` is the ninth with -1.
-struct TAlteredDegree {
+struct CAlteredDegree {
     int mDegree = 0;
     int mSign = 0;
 };
@@ -43,7 +43,7 @@ public:
     void Add(int number, int sign);
     void AddMajorSeventh() { mSevenths |= Bit(11); }
     /// False when the degree cannot be altered so.
-    [[nodiscard]] bool Alter(TAlteredDegree altered);
+    [[nodiscard]] bool Alter(CAlteredDegree altered);
 
     /// Suspended by tone 2, 5 or 6.
     void Suspend(int tone) { mSus |= Bit(tone); }

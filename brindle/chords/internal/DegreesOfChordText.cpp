@@ -8,7 +8,7 @@
 namespace brindle::ChordText {
 namespace {
 
-struct TNumberRow {
+struct CNumberRow {
     std::string_view mText;
     int mNumber;
     /// What may stand behind the digits.
@@ -16,19 +16,19 @@ struct TNumberRow {
 };
 
 // Longer ones first.
-constexpr auto kNumberRows = std::to_array<TNumberRow>({
+constexpr auto kNumberRows = std::to_array<CNumberRow>({
     {"13", 13, "th"}, {"11", 11, "th"}, {"10", 10, "th"}, {"2", 2, "nd"},   {"3", 3, "rd"},
     {"4", 4, "th"},   {"5", 5, "th"},   {"6", 6, "th"},   {"7", 7, "th"},   {"9", 9, "th"},
     {"second", 2},    {"third", 3},     {"fourth", 4},    {"fifth", 5},     {"sixth", 6},
     {"seventh", 7},   {"ninth", 9},     {"tenth", 10},    {"eleventh", 11}, {"thirteenth", 13},
 });
 
-struct TSignRow {
+struct CSignRow {
     std::string_view mText;
     int mSign;
 };
 
-constexpr auto kSignRows = std::to_array<TSignRow>({
+constexpr auto kSignRows = std::to_array<CSignRow>({
     {"#", +1},
     {"+", +1},
     {"-", -1},
@@ -38,13 +38,13 @@ constexpr auto kSignRows = std::to_array<TSignRow>({
     {"sharp", +1},
 });
 
-struct TMajorRow {
+struct CMajorRow {
     std::string_view mText;
     TMajorMark mMark;
 };
 
 // Longer ones first. `M` and `ma` are told apart from minor and from other words by hand.
-constexpr auto kMajorRows = std::to_array<TMajorRow>({
+constexpr auto kMajorRows = std::to_array<CMajorRow>({
     {"major", TMajorMark::Major},
     {"maj", TMajorMark::Major},
     {"ma", TMajorMark::Major},
@@ -57,7 +57,7 @@ constexpr auto kMajorRows = std::to_array<TMajorRow>({
 // `madd`, `maug` and `malt` are a minor chord with `add`, `aug` and `alt`.
 constexpr auto kNotBehindMa = std::to_array<std::string_view>({"dd", "ug", "lt"});
 
-bool FitsMajor(const TMajorRow& row, CTextScan scan) {
+bool FitsMajor(const CMajorRow& row, CTextScan scan) {
     if (!scan.TakeWord(row.mText)) return false;
     if (row.mText != "ma") return true;
     return std::none_of(kNotBehindMa.begin(), kNotBehindMa.end(),
@@ -67,7 +67,7 @@ bool FitsMajor(const TMajorRow& row, CTextScan scan) {
 }  // namespace
 
 int TakeNumber(CTextScan& scan) {
-    for (const TNumberRow& row : kNumberRows) {
+    for (const CNumberRow& row : kNumberRows) {
         if (!scan.TakeWord(row.mText)) continue;
         if (!row.mEnding.empty()) scan.TakeWord(row.mEnding);
         return row.mNumber;
@@ -77,7 +77,7 @@ int TakeNumber(CTextScan& scan) {
 
 int TakeSign(CTextScan& scan) {
     if (scan.Take('b')) return -1;
-    for (const TSignRow& row : kSignRows) {
+    for (const CSignRow& row : kSignRows) {
         if (!scan.TakeWord(row.mText)) continue;
         // Words stand apart: `flat 9`.
         if (IsLetter(row.mText.front())) scan.SkipBlanks();
@@ -87,7 +87,7 @@ int TakeSign(CTextScan& scan) {
 }
 
 std::optional<TMajorMark> TakeMajorMark(CTextScan& scan) {
-    for (const TMajorRow& row : kMajorRows) {
+    for (const CMajorRow& row : kMajorRows) {
         if (!FitsMajor(row, scan)) continue;
         scan.mPos += row.mText.size();
         scan.Take('.');

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/chords/internal/FaultsOfChordText.h"
 
-#include "brindle/chords/internal/CFoldedText.h"
 #include "brindle/chords/internal/CTextScan.h"
+#include "brindle/chords/internal/CUnifiedText.h"
 #include "brindle/platform/Utf8.h"
 
 #include <fmt/format.h>
@@ -14,7 +14,7 @@
 namespace brindle::ChordText {
 namespace {
 
-struct TFaultRow {
+struct CFaultRow {
     TFault mFault;
     /// {0} is what stands there, {1} its place.
     std::string_view mText;
@@ -23,7 +23,7 @@ struct TFaultRow {
 };
 
 // clang-format off
-constexpr auto kFaultRows = std::to_array<TFaultRow>({
+constexpr auto kFaultRows = std::to_array<CFaultRow>({
     {TFault::NotUnderstood,        R"("{0}" at {1} is not understood)"},
     {TFault::NoNote,               R"(a chord begins with a note A to H, "{0}" at {1} is none)", true},
     {TFault::Empty,                R"(the text is empty)"},
@@ -65,10 +65,10 @@ int CharacterPos(std::string_view input, std::size_t offset) {
     return static_cast<int>(std::min(CountUtf8Characters(input.substr(0, offset)), kLast)) + 1;
 }
 
-std::string FaultText(const TFaultAt& fault, const CFoldedText& text) {
+std::string FaultText(const CFaultAt& fault, const CUnifiedText& text) {
     const auto* const row =
         std::find_if(kFaultRows.begin(), kFaultRows.end(),
-                     [&](const TFaultRow& candidate) { return candidate.mFault == fault.mFault; });
+                     [&](const CFaultRow& candidate) { return candidate.mFault == fault.mFault; });
     if (row == kFaultRows.end()) return {};
     const std::size_t offset = text.InputOffset(fault.mPos);
     std::string_view shown = text.Input().substr(offset);

@@ -8,7 +8,7 @@
 
 namespace brindle::ChordText {
 
-class CFoldedText;
+class CUnifiedText;
 
 /// What can be wrong with a chord text.
 enum class TFault : std::uint8_t {
@@ -29,7 +29,7 @@ enum class TFault : std::uint8_t {
 };
 
 /// A fault and where it begins in the folded text.
-struct TFaultAt {
+struct CFaultAt {
     TFault mFault = TFault::None;
     std::size_t mPos = 0;
     /// Characters that are shown; 0: as many as belong together.
@@ -40,6 +40,6 @@ struct TFaultAt {
 [[nodiscard]] int CharacterPos(std::string_view input, std::size_t offset);
 
 /// The sentence for people, `"x" at 4 is not understood`.
-[[nodiscard]] std::string FaultText(const TFaultAt& fault, const CFoldedText& text);
+[[nodiscard]] std::string FaultText(const CFaultAt& fault, const CUnifiedText& text);
 
 }  // namespace brindle::ChordText

@@ -61,7 +61,7 @@ CKeyEnh RootInKey(int keyNr, int centre) {
     return toSharp < toFlat ? sharp : flat;
 }
 
-CKeyEnh RootOf(const TNamingCandidate& candidate, const TDegreesOfTones& degrees,
+CKeyEnh RootOf(const CNamingCandidate& candidate, const TDegreesOfTones& degrees,
                const TGivenSpellings& given, const CSignKeyLite& key) {
     const auto agrees = [&](const CKeyEnh& root) {
         return std::all_of(degrees.begin(), degrees.end(), [&](const CChordDegree& degree) {
@@ -110,7 +110,7 @@ TGivenSpellings GivenSpellings(std::span<const CNote> notes) {
     return given;
 }
 
-TDegreesOfTones DegreesOfTones(const TNamingCandidate& candidate) {
+TDegreesOfTones DegreesOfTones(const CNamingCandidate& candidate) {
     TDegreesOfTones degrees{};
     if (candidate.IsSpelledOut()) {
         const CSpelledOutChord chord(candidate.mTones);
@@ -127,7 +127,7 @@ TDegreesOfTones DegreesOfTones(const TNamingCandidate& candidate) {
     return degrees;
 }
 
-CNamedChordSpelling::CNamedChordSpelling(const TNamingCandidate& candidate,
+CNamedChordSpelling::CNamedChordSpelling(const CNamingCandidate& candidate,
                                          const TGivenSpellings& given, const CSignKeyLite& key)
     : mDegrees(DegreesOfTones(candidate)),
       mTones(candidate.mTones),

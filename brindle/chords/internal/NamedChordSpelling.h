@@ -18,12 +18,12 @@ using TGivenSpellings = std::array<CKeyEnh, 12>;
 /// are all of a type, also those that are left out.
 using TDegreesOfTones = std::array<CChordDegree, 12>;
 
-[[nodiscard]] TDegreesOfTones DegreesOfTones(const TNamingCandidate& candidate);
+[[nodiscard]] TDegreesOfTones DegreesOfTones(const CNamingCandidate& candidate);
 
 /// Spells a candidate: its root, its tones from the root and its bass.
 class CNamedChordSpelling {
 public:
-    CNamedChordSpelling(const TNamingCandidate& candidate, const TGivenSpellings& given,
+    CNamedChordSpelling(const CNamingCandidate& candidate, const TGivenSpellings& given,
                         const CSignKeyLite& key);
 
     [[nodiscard]] const CKeyEnh& Root() const { return mRoot; }

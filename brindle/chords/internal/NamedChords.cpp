@@ -29,7 +29,7 @@ void AddOption(std::string& suffix, const std::string& option) {
     suffix += ')';
 }
 
-void TellType(const TNamingCandidate& candidate, CNamedChord& chord) {
+void TellType(const CNamingCandidate& candidate, CNamedChord& chord) {
     const auto ix = static_cast<std::size_t>(candidate.mType);
     chord.mSuffix = kNamingTypeRows[ix].mSuffix;
     chord.mExactSuffix = chord.mSuffix;
@@ -43,7 +43,7 @@ void TellType(const TNamingCandidate& candidate, CNamedChord& chord) {
     }
 }
 
-void TellTones(const TNamingCandidate& candidate, CNamedChord& chord) {
+void TellTones(const CNamingCandidate& candidate, CNamedChord& chord) {
     const CSpelledOutChord tones(candidate.mTones);
     chord.mExactSuffix = tones.Head();
     const auto addOptions = [&](bool areFifths) {
@@ -87,7 +87,7 @@ std::string SymbolOf(const CNamedChord& chord, const std::string& suffix) {
     return symbol + '/' + WriteNoteName(chord.mBass);
 }
 
-CNamedChord NamedChord(const TNamingCandidate& candidate, std::span<const CNote> sorted,
+CNamedChord NamedChord(const CNamingCandidate& candidate, std::span<const CNote> sorted,
                        const TGivenSpellings& given, const CNamingOptions& options) {
     const CNamedChordSpelling spelling(candidate, given, options.mKey);
     CNamedChord chord;
@@ -119,13 +119,13 @@ std::vector<CNote> Sorted(std::span<const CNote> notes) {
 
 }  // namespace
 
-std::vector<CNamedChord> NamedChords(std::span<const TNamingCandidate> candidates,
+std::vector<CNamedChord> NamedChords(std::span<const CNamingCandidate> candidates,
                                      std::span<const CNote> notes, const CNamingOptions& options) {
     const TGivenSpellings given = GivenSpellings(notes);
     const std::vector<CNote> sorted = Sorted(notes);
     std::vector<CNamedChord> chords;
     chords.reserve(std::min(candidates.size(), options.mLimit));
-    for (const TNamingCandidate& candidate : candidates) {
+    for (const CNamingCandidate& candidate : candidates) {
         if (chords.size() == options.mLimit) break;
         chords.push_back(NamedChord(candidate, sorted, given, options));
     }

@@ -9,7 +9,7 @@
 namespace brindle {
 
 /// The first `options.mLimit` candidates with all their texts.
-[[nodiscard]] std::vector<CNamedChord> NamedChords(std::span<const TNamingCandidate> candidates,
+[[nodiscard]] std::vector<CNamedChord> NamedChords(std::span<const CNamingCandidate> candidates,
                                                    std::span<const CNote> notes,
                                                    const CNamingOptions& options);
 

@@ -32,11 +32,11 @@ constexpr int OfCommonness(int cost) {
 }
 
 /// A set of types: bit n of word w is type 64 w + n.
-struct TTypeSet {
+struct CTypeSet {
     std::array<std::uint64_t, 2> mWords{};
 
     constexpr void Insert(std::size_t type) { mWords[type / 64] |= std::uint64_t{1} << type % 64; }
-    friend constexpr TTypeSet operator&(const TTypeSet& a, const TTypeSet& b) {
+    friend constexpr CTypeSet operator&(const CTypeSet& a, const CTypeSet& b) {
         return {{a.mWords[0] & b.mWords[0], a.mWords[1] & b.mWords[1]}};
     }
 };
@@ -45,7 +45,7 @@ static_assert(kNamingTypes.size() <= 128);
 /// The types that fit six tones, for each set of the tones 0 to 5 and of the tones 6 to 11. What is
 /// in the sets of both halves fits them all, so that a search looks at few types.
 constexpr auto kTypesOfHalf = [] {
-    std::array<std::array<TTypeSet, 64>, 2> halves{};
+    std::array<std::array<CTypeSet, 64>, 2> halves{};
     for (std::size_t type = 0; type < kNamingTypes.size(); ++type) {
         const TToneMask mine = kNamingTypes[type].mTones;
         const TToneMask needed = NeededTones(kNamingTypes[type]);
@@ -61,7 +61,7 @@ constexpr auto kTypesOfHalf = [] {
     return halves;
 }();
 
-TTypeSet TypesThatFit(TToneMask tones) {
+CTypeSet TypesThatFit(TToneMask tones) {
     return kTypesOfHalf[0][tones & 63U] & kTypesOfHalf[1][tones >> 6];
 }
 
@@ -70,7 +70,7 @@ constexpr TToneMask TonesAbove(int root, TToneMask keys) {
 }
 
 /// What it costs that a type which fits does not sound as a whole. `sounding` tones do.
-int CostOfLeftOut(const TNamingType& type, TToneMask tones, int sounding) {
+int CostOfLeftOut(const CNamingType& type, TToneMask tones, int sounding) {
     TToneMask gone = type.mTones & ~tones;
     if (gone == 0) return 0;
     if (sounding < 2) return kImpossible;
@@ -89,7 +89,7 @@ int CostOfLeftOut(const TNamingType& type, TToneMask tones, int sounding) {
 
 class CScan {
 public:
-    CScan(const TNoteKeys& keys, const CNamingOptions& options)
+    CScan(const CNoteKeys& keys, const CNamingOptions& options)
         : mOptions(options),
           mHasContext(!options.mKey.IsUndef() || options.mPreviousRoot != kKeyNrUndef ||
                       options.mNextRoot != kKeyNrUndef),
@@ -109,7 +109,7 @@ public:
         if (!isOneSet) Look(withoutBass, true);
     }
 
-    [[nodiscard]] const std::array<TNamingCandidate, 12>& Best() const { return mBest; }
+    [[nodiscard]] const std::array<CNamingCandidate, 12>& Best() const { return mBest; }
 
 private:
     void Look(TToneMask keys, bool isForeign) {
@@ -118,16 +118,16 @@ private:
     }
 
     void LookOver(int root, TToneMask tones, bool isForeign) {
-        TNamingCandidate& best = mBest[static_cast<std::size_t>(root)];
+        CNamingCandidate& best = mBest[static_cast<std::size_t>(root)];
         const int bass = FoldIntoOctave(mBass - root);
         const int base =
             mOptions.mRootCosts[static_cast<std::size_t>(root)] + (isForeign ? kForeignBass : 0);
         const TToneMask shunned = isForeign ? TToneMask{1} << bass : 0;
-        const TTypeSet types = TypesThatFit(tones);
+        const CTypeSet types = TypesThatFit(tones);
         for (std::size_t word = 0; word < 2; ++word) {
             for (std::uint64_t left = types.mWords[word]; left != 0; left &= left - 1) {
                 const std::size_t ix = word * 64 + static_cast<std::size_t>(std::countr_zero(left));
-                const TNamingType& type = kNamingTypes[ix];
+                const CNamingType& type = kNamingTypes[ix];
                 if ((type.mTones & shunned) != 0) continue;
                 const int cost = base + Rarity(ix, bass) + CostOfLeftOut(type, tones, mSounding);
                 Offer(best, tones, static_cast<int>(ix), cost);
@@ -138,9 +138,9 @@ private:
     }
 
     /// `cost` is without that of the context.
-    void Offer(TNamingCandidate& best, TToneMask tones, int type, int cost) const {
+    void Offer(CNamingCandidate& best, TToneMask tones, int type, int cost) const {
         if (cost > best.mCost) return;
-        TNamingCandidate offer = best;
+        CNamingCandidate offer = best;
         offer.mType = type;
         offer.mTones = tones;
         offer.mCost = cost + (mHasContext ? CostOfContext(offer) : 0);
@@ -150,7 +150,7 @@ private:
     }
 
     [[nodiscard]] int Rarity(std::size_t type, int bass) const {
-        const TNamingTypeRow& row = kNamingTypeRows[type];
+        const CNamingTypeRow& row = kNamingTypeRows[type];
         if (mIsBassOpen) return OfCommonness(row.mCost);
         return OfCommonness(std::min<int>(row.mCostOverBass[static_cast<std::size_t>(bass)],
                                           row.mCost + kBassAtMost));
@@ -162,7 +162,7 @@ private:
                (isOverBass ? kSpelledOutOverBass : 0);
     }
 
-    [[nodiscard]] int CostOfContext(const TNamingCandidate& offer) const {
+    [[nodiscard]] int CostOfContext(const CNamingCandidate& offer) const {
         const bool hasNext = mOptions.mNextRoot != kKeyNrUndef;
         const bool hasPrevious = mOptions.mPreviousRoot != kKeyNrUndef;
         // One neighbour alone tells little.
@@ -174,7 +174,7 @@ private:
         return cost;
     }
 
-    [[nodiscard]] int CostInKey(const TNamingCandidate& offer) const {
+    [[nodiscard]] int CostInKey(const CNamingCandidate& offer) const {
         if (mOptions.mKey.IsUndef()) return 0;
         const bool isMinor = mOptions.mKey.mSignKeyType == TSignKeyType_Minor;
         const int degree = FoldIntoOctave(offer.mRoot - mOptions.mKey.mRootKeyEnh.mKeyNr);
@@ -187,13 +187,13 @@ private:
     int mBass;
     bool mIsBassOpen = false;
     int mSounding = 0;
-    std::array<TNamingCandidate, 12> mBest;
+    std::array<CNamingCandidate, 12> mBest;
 };
 
 }  // namespace
 
-TNoteKeys NoteKeysOf(std::span<const CNote> notes) {
-    TNoteKeys keys;
+CNoteKeys NoteKeysOf(std::span<const CNote> notes) {
+    CNoteKeys keys;
     std::int64_t lowest = -1;
     for (const CNote& note : notes) {
         if (note.IsUndef()) continue;
@@ -211,21 +211,21 @@ TNoteKeys NoteKeysOf(std::span<const CNote> notes) {
     return keys;
 }
 
-CNamingCandidates::CNamingCandidates(const TNoteKeys& keys, const CNamingOptions& options) {
+CNamingCandidates::CNamingCandidates(const CNoteKeys& keys, const CNamingOptions& options) {
     if (keys.mAll == 0) return;
     const CScan scan(keys, options);
-    for (const TNamingCandidate& candidate : scan.Best()) {
+    for (const CNamingCandidate& candidate : scan.Best()) {
         if (candidate.mCost < kImpossible) mCandidates[mCount++] = candidate;
     }
     std::sort(mCandidates.begin(), mCandidates.begin() + static_cast<std::ptrdiff_t>(mCount));
 }
 
-int NextRootCost(const TNamingCandidate& chord, int nextRoot) {
+int NextRootCost(const CNamingCandidate& chord, int nextRoot) {
     const int step = FoldIntoOctave(nextRoot - chord.mRoot);
     return kNextRootCosts[chord.Family()][static_cast<std::size_t>(step)];
 }
 
-int PreviousRootCost(const TNamingCandidate& chord, int previousRoot) {
+int PreviousRootCost(const CNamingCandidate& chord, int previousRoot) {
     const int step = FoldIntoOctave(chord.mRoot - previousRoot);
     return kPreviousRootCosts[chord.Family()][static_cast<std::size_t>(step)];
 }

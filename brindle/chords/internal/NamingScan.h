@@ -15,7 +15,7 @@ namespace brindle {
 inline constexpr int kSpelledOutType = static_cast<int>(kNamingTypes.size());
 
 /// Some notes as the search sees them. Bit n of a mask is key n.
-struct TNoteKeys {
+struct CNoteKeys {
     TToneMask mAll = 0;
     /// Of all notes but the lowest one.
     TToneMask mAbove = 0;
@@ -23,12 +23,12 @@ struct TNoteKeys {
     int mBass = 0;
 };
 
-[[nodiscard]] TNoteKeys NoteKeysOf(std::span<const CNote> notes);
+[[nodiscard]] CNoteKeys NoteKeysOf(std::span<const CNote> notes);
 
 /// A name that notes can have. The lowest cost is the best; then it is better if the root is the
 /// bass, if it is a type of the table, if that stands higher, and if the root is nearer above the
 /// bass.
-struct TNamingCandidate {
+struct CNamingCandidate {
     int mCost = 0;
     bool mIsInverted = false;
     int mType = kSpelledOutType;
@@ -46,26 +46,26 @@ struct TNamingCandidate {
     /// Semitones from the root up to the bass.
     [[nodiscard]] int BassAboveRoot() const { return (12 - mRootAboveBass) % 12; }
 
-    friend auto operator<=>(const TNamingCandidate&, const TNamingCandidate&) = default;
+    friend auto operator<=>(const CNamingCandidate&, const CNamingCandidate&) = default;
 };
 
 /// The best name over each root, the best one first.
 class CNamingCandidates {
 public:
     CNamingCandidates() = default;
-    CNamingCandidates(const TNoteKeys& keys, const CNamingOptions& options);
+    CNamingCandidates(const CNoteKeys& keys, const CNamingOptions& options);
 
-    [[nodiscard]] std::span<const TNamingCandidate> List() const {
+    [[nodiscard]] std::span<const CNamingCandidate> List() const {
         return {mCandidates.data(), mCount};
     }
 
 private:
-    std::array<TNamingCandidate, 12> mCandidates{};
+    std::array<CNamingCandidate, 12> mCandidates{};
     std::size_t mCount = 0;
 };
 
 /// What a step of the root from one chord to the next costs, as each of both sees it.
-[[nodiscard]] int NextRootCost(const TNamingCandidate& chord, int nextRoot);
-[[nodiscard]] int PreviousRootCost(const TNamingCandidate& chord, int previousRoot);
+[[nodiscard]] int NextRootCost(const CNamingCandidate& chord, int nextRoot);
+[[nodiscard]] int PreviousRootCost(const CNamingCandidate& chord, int previousRoot);
 
 }  // namespace brindle

@@ -12,7 +12,7 @@ namespace brindle {
 /// A row of the chord types: what is behind the root, the degrees from the root up (in brackets
 /// those that are usually left out), how rare the type is, and how rare it is over a bass so many
 /// semitones above its root.
-struct TNamingTypeRow {
+struct CNamingTypeRow {
     std::string_view mSuffix;
     std::string_view mDegrees;
     std::int16_t mCost;
@@ -25,7 +25,7 @@ using TNamingContextTable = std::array<std::array<std::int16_t, 12>, 5>;
 // clang-format off
 
 // At equal costs the upper row wins.
-inline constexpr std::array<TNamingTypeRow, 95> kNamingTypeRows{{
+inline constexpr std::array<CNamingTypeRow, 95> kNamingTypeRows{{
     {"",           "1 3 5",                    21, {{ 23, 132,  80, 149,  70,  91, 137,  66, 137, 112,  92, 102}}},
     {"m",          "1 b3 5",                   39, {{ 41, 260, 142,  94, 149, 102, 306,  96, 147, 107,  90, 128}}},
     {"5",          "1 5",                      72, {{ 73, 277, 169, 261, 231, 139, 277, 130, 277, 134, 169, 249}}},

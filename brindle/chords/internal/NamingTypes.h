@@ -19,7 +19,7 @@ using TToneMask = std::uint32_t;
 }
 
 /// A chord type made ready for the search.
-struct TNamingType {
+struct CNamingType {
     static constexpr std::size_t kMostDegrees = 7;
 
     std::array<CChordDegree, kMostDegrees> mDegrees{};
@@ -33,8 +33,8 @@ struct TNamingType {
 };
 
 /// A row of kNamingTypeRows, "1 b3 5 b7 (9)", made ready.
-[[nodiscard]] constexpr TNamingType MakeNamingType(const TNamingTypeRow& row) {
-    TNamingType type;
+[[nodiscard]] constexpr CNamingType MakeNamingType(const CNamingTypeRow& row) {
+    CNamingType type;
     std::size_t count = 0;
     CChordDegree degree;
     bool isOptional = false;
@@ -64,7 +64,7 @@ struct TNamingType {
 }
 
 inline constexpr auto kNamingTypes = [] {
-    std::array<TNamingType, kNamingTypeRows.size()> types{};
+    std::array<CNamingType, kNamingTypeRows.size()> types{};
     for (std::size_t ix = 0; ix < types.size(); ++ix)
         types[ix] = MakeNamingType(kNamingTypeRows[ix]);
     return types;
@@ -75,7 +75,7 @@ inline constexpr TToneMask kMinorTriadTones = 0x089;  // 0 3 7
 
 /// The tones without which a type is not itself. The root, the fifth and the third can be missing,
 /// but triads need their third, and plain sixths their fifth.
-[[nodiscard]] constexpr TToneMask NeededTones(const TNamingType& type) {
+[[nodiscard]] constexpr TToneMask NeededTones(const CNamingType& type) {
     TToneMask needed = type.mTones & ~type.mOptional & ~TToneMask{1};
     if (!type.mIsPlainSixth) needed &= ~(TToneMask{1} << 7);
     const bool isTriad = type.mTones == kMajorTriadTones || type.mTones == kMinorTriadTones;

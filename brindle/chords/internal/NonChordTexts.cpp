@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/chords/internal/NonChordTexts.h"
 
-#include "brindle/chords/internal/CFoldedText.h"
+#include "brindle/chords/internal/CUnifiedText.h"
 #include "brindle/theory/SetFromStringHelper.h"
 
 #include <algorithm>
@@ -10,7 +10,7 @@
 namespace brindle::ChordText {
 namespace {
 
-struct TNonChordRow {
+struct CNonChordRow {
     /// Without blanks, in lower case if any case will do.
     std::string_view mText;
     TChordTextKind mKind;
@@ -19,7 +19,7 @@ struct TNonChordRow {
 };
 
 // clang-format off
-constexpr auto kNonChordRows = std::to_array<TNonChordRow>({
+constexpr auto kNonChordRows = std::to_array<CNonChordRow>({
     {"n",            TChordText_NoChord, "NoChord"},
     {"nc",           TChordText_NoChord, "NoChord"},
     {"n.c.",         TChordText_NoChord, "NoChord"},
@@ -57,17 +57,17 @@ constexpr auto kNonChordRows = std::to_array<TNonChordRow>({
 // clang-format on
 
 constexpr std::size_t kLongestWord = 16;
-static_assert(std::all_of(kNonChordRows.begin(), kNonChordRows.end(), [](const TNonChordRow& row) {
+static_assert(std::all_of(kNonChordRows.begin(), kNonChordRows.end(), [](const CNonChordRow& row) {
     return row.mText.size() <= kLongestWord;
 }));
 
 /// A text without its blanks; empty if it is longer than any word.
-struct TWord {
+struct CWord {
     std::array<char, kLongestWord> mExact{};
     std::array<char, kLongestWord> mLower{};
     std::size_t mSize = 0;
 
-    explicit TWord(const CFoldedText& text) {
+    explicit CWord(const CUnifiedText& text) {
         const std::string_view folded = text.Text();
         for (std::size_t i = 0; i < folded.size(); ++i) {
             if (folded[i] == ' ') continue;
@@ -83,7 +83,7 @@ struct TWord {
         }
     }
 
-    [[nodiscard]] bool Is(const TNonChordRow& row) const {
+    [[nodiscard]] bool Is(const CNonChordRow& row) const {
         return row.mText == std::string_view((row.mIsExact ? mExact : mLower).data(), mSize);
     }
 };
@@ -95,10 +95,10 @@ CChordLite NonChordOf(std::string_view parserText) {
 
 }  // namespace
 
-std::optional<CChordTextReading> ReadNonChord(const CFoldedText& text) {
-    const TWord word(text);
+std::optional<CChordTextReading> ReadNonChord(const CUnifiedText& text) {
+    const CWord word(text);
     const auto* const row = std::find_if(kNonChordRows.begin(), kNonChordRows.end(),
-                                         [&](const TNonChordRow& r) { return word.Is(r); });
+                                         [&](const CNonChordRow& r) { return word.Is(r); });
     if (row == kNonChordRows.end()) return std::nullopt;
     CChordTextReading reading;
     reading.mKind = row->mKind;

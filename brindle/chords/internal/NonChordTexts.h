@@ -7,9 +7,9 @@
 
 namespace brindle::ChordText {
 
-class CFoldedText;
+class CUnifiedText;
 
 /// The reading of a text that stands for no chord or for a repeat; nothing for any other text.
-[[nodiscard]] std::optional<CChordTextReading> ReadNonChord(const CFoldedText& text);
+[[nodiscard]] std::optional<CChordTextReading> ReadNonChord(const CUnifiedText& text);
 
 }  // namespace brindle::ChordText

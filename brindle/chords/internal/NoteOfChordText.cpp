@@ -12,12 +12,12 @@ namespace {
 
 enum TLetter { C, D, E, F, G, A, B };
 
-struct TSyllableRow {
+struct CSyllableRow {
     std::string_view mSyllable;
     TLetter mLetter;
 };
 
-constexpr auto kSyllableRows = std::to_array<TSyllableRow>({
+constexpr auto kSyllableRows = std::to_array<CSyllableRow>({
     {"do", C},
     {"ut", C},
     {"re", D},
@@ -37,7 +37,7 @@ constexpr auto kLettersFromA = std::to_array<TLetter>({A, B, C, D, E, F, G, B});
 using TTexts = std::span<const std::string_view>;
 
 /// What may stand behind a letter. The first row that fits is taken.
-struct TAccidentalRow {
+struct CAccidentalRow {
     std::string_view mText;
     int mAccidental;
     /// The letters in lower case that can have it; all if empty. Endings belong to letters alone.
@@ -54,7 +54,7 @@ constexpr auto kSuspended = std::to_array<std::string_view>({"us", "p", "2", "4"
 constexpr auto kSharpDegrees = std::to_array<std::string_view>({"5", "9", "11"});
 constexpr auto kFlatDegrees = std::to_array<std::string_view>({"5", "6", "9", "13"});
 
-constexpr auto kAccidentalRows = std::to_array<TAccidentalRow>({
+constexpr auto kAccidentalRows = std::to_array<CAccidentalRow>({
     // Words.
     {"flat", -1, "", {}},
     {" flat", -1, "", {}},
@@ -83,7 +83,7 @@ bool SeesAny(const CTextScan& scan, TTexts texts) {
                        [&](std::string_view text) { return scan.SeesWord(text); });
 }
 
-bool Fits(const TAccidentalRow& row, CTextScan scan, char letter) {
+bool Fits(const CAccidentalRow& row, CTextScan scan, char letter) {
     if (!row.mLetters.empty() && row.mLetters.find(letter) == row.mLetters.npos) return false;
     if (row.mIsSign ? !scan.Sees(row.mText) : !scan.SeesWord(row.mText)) return false;
     scan.mPos += row.mText.size();
@@ -92,7 +92,7 @@ bool Fits(const TAccidentalRow& row, CTextScan scan, char letter) {
 
 /// The accidental behind a letter in lower case, or behind a syllable (0).
 std::optional<int> TakeAccidental(CTextScan& scan, char letter) {
-    for (const TAccidentalRow& row : kAccidentalRows) {
+    for (const CAccidentalRow& row : kAccidentalRows) {
         if (!Fits(row, scan, letter)) continue;
         scan.mPos += row.mText.size();
         return row.mAccidental;
@@ -101,7 +101,7 @@ std::optional<int> TakeAccidental(CTextScan& scan, char letter) {
 }
 
 std::optional<TLetter> TakeSyllable(CTextScan& scan) {
-    for (const TSyllableRow& row : kSyllableRows) {
+    for (const CSyllableRow& row : kSyllableRows) {
         if (!scan.TakeWord(row.mSyllable)) continue;
         // `Fadd9` and `Faug` begin with the letter F.
         if (row.mLetter == F &&
@@ -116,15 +116,15 @@ std::optional<TLetter> TakeSyllable(CTextScan& scan) {
 
 }  // namespace
 
-CKeyEnh TWrittenNote::KeyEnh() const {
+CKeyEnh CWrittenNote::KeyEnh() const {
     const int natural = kNaturalKeyNrs[static_cast<std::size_t>(mLetter)];
     return {FoldIntoOctave(natural + mAccidental), SemitoneToEnh(mAccidental)};
 }
 
-std::optional<TWrittenNote> TakeNote(CTextScan& scan, const CChordTextPrefs& prefs) {
+std::optional<CWrittenNote> TakeNote(CTextScan& scan, const CChordTextOptions& prefs) {
     if (prefs.mSolfege) {
         if (const auto letter = TakeSyllable(scan)) {
-            return TWrittenNote{*letter, TakeAccidental(scan, '\0').value_or(0), false};
+            return CWrittenNote{*letter, TakeAccidental(scan, '\0').value_or(0), false};
         }
     }
     const char typed = scan.Peek();
@@ -133,11 +133,11 @@ std::optional<TWrittenNote> TakeNote(CTextScan& scan, const CChordTextPrefs& pre
     ++scan.mPos;
     const auto accidental = TakeAccidental(scan, letter);
     const int withoutOne = prefs.mBIsBFlat && letter == 'b' ? -1 : 0;
-    return TWrittenNote{kLettersFromA[static_cast<std::size_t>(letter - 'a')],
+    return CWrittenNote{kLettersFromA[static_cast<std::size_t>(letter - 'a')],
                         accidental.value_or(withoutOne), letter == 'h'};
 }
 
-bool SeesOneAccidentalTooMany(const CTextScan& scan, const TWrittenNote& note) {
+bool SeesOneAccidentalTooMany(const CTextScan& scan, const CWrittenNote& note) {
     CTextScan behind = scan;
     if (behind.Take('x')) return true;
     if (behind.Take('#')) return !SeesAny(behind, kSharpDegrees);

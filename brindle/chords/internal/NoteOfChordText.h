@@ -10,7 +10,7 @@
 namespace brindle::ChordText {
 
 /// A note as it is written: a letter and an accidental.
-struct TWrittenNote {
+struct CWrittenNote {
     /// 0 (C) to 6 (B).
     int mLetter = 0;
     /// -2 to 2 from the notes that are read.
@@ -23,10 +23,10 @@ struct TWrittenNote {
 };
 
 /// Reads a note name with its accidental and moves behind it: `Eb`, `fis`, `C sharp`, `As`.
-[[nodiscard]] std::optional<TWrittenNote> TakeNote(CTextScan& scan, const CChordTextPrefs& prefs);
+[[nodiscard]] std::optional<CWrittenNote> TakeNote(CTextScan& scan, const CChordTextOptions& prefs);
 
 /// Whether the accidental behind a note that was just read is one too many, as in `C###`; a sign
 /// that alters a degree, as in `C##5`, is none.
-[[nodiscard]] bool SeesOneAccidentalTooMany(const CTextScan& scan, const TWrittenNote& note);
+[[nodiscard]] bool SeesOneAccidentalTooMany(const CTextScan& scan, const CWrittenNote& note);
 
 }  // namespace brindle::ChordText

@@ -45,26 +45,26 @@ constexpr TTones NearestThatCanBeSaid(TTones tones) {
     return tones;
 }
 
-struct TWholeChordRow {
+struct CWholeChordRow {
     TTones mTones;
     std::string_view mText;
 };
 
-constexpr auto kWholeChordRows = std::to_array<TWholeChordRow>({
+constexpr auto kWholeChordRows = std::to_array<CWholeChordRow>({
     {Tones(0, 3, 6), "dim"},
     {Tones(0, 3, 6, 9), "dim7"},
     {Tones(0, 4, 8), "aug"},
     {Tones(0, 7), "5"},
 });
 
-struct TFirstNumberRow {
+struct CFirstNumberRow {
     TTones mTones;
     std::string_view mText;
     bool mIsForSus4Alone = false;
 };
 
 // The first that is contained.
-constexpr auto kFirstNumberRows = std::to_array<TFirstNumberRow>({
+constexpr auto kFirstNumberRows = std::to_array<CFirstNumberRow>({
     {Tones(2, 9, 10), "13", true},
     {Tones(2, 5, 9, 10), "13"},
     {Tones(2, 5, 10), "11"},
@@ -75,7 +75,7 @@ constexpr auto kFirstNumberRows = std::to_array<TFirstNumberRow>({
     {Tones(9), "6"},
 });
 
-struct TOptionRow {
+struct COptionRow {
     int mTone;
     std::string_view mBehindNumber;
     std::string_view mWithoutNumber;
@@ -85,7 +85,7 @@ struct TOptionRow {
 // by the fifth.
 constexpr int kFlatFive = 12;
 constexpr int kSharpFive = 13;
-constexpr auto kOptionRows = std::to_array<TOptionRow>({
+constexpr auto kOptionRows = std::to_array<COptionRow>({
     {10, "7", "7"},
     {11, "maj7", "maj7"},
     {1, "b9", "b9"},
@@ -111,7 +111,7 @@ public:
     std::string Write() && {
         const auto* const whole =
             std::find_if(kWholeChordRows.begin(), kWholeChordRows.end(),
-                         [&](const TWholeChordRow& row) { return row.mTones == mTones; });
+                         [&](const CWholeChordRow& row) { return row.mTones == mTones; });
         if (whole != kWholeChordRows.end()) {
             Append(whole->mText);
             return std::move(mText);
@@ -148,7 +148,7 @@ private:
     void WriteFirstNumber() {
         const auto* const row =
             std::find_if(kFirstNumberRows.begin(), kFirstNumberRows.end(),
-                         [&](const TFirstNumberRow& number) { return IsFirstNumber(number); });
+                         [&](const CFirstNumberRow& number) { return IsFirstNumber(number); });
         if (row == kFirstNumberRows.end()) return;
         Append(row->mText);
         mRest &= ~row->mTones;
@@ -156,7 +156,7 @@ private:
     }
 
     /// A number that brings several tones brings none that is altered as well.
-    [[nodiscard]] bool IsFirstNumber(const TFirstNumberRow& row) const {
+    [[nodiscard]] bool IsFirstNumber(const CFirstNumberRow& row) const {
         if (!Has(mRest, row.mTones)) return false;
         if (row.mIsForSus4Alone && mTail != "sus4") return false;
         const bool isSingle = (row.mTones & (row.mTones - 1)) == 0;
@@ -175,7 +175,7 @@ private:
     }
 
     void WriteOptions() {
-        for (const TOptionRow& row : kOptionRows) {
+        for (const COptionRow& row : kOptionRows) {
             if (!Drop(row.mTone)) continue;
             Append(mHasNumber ? row.mBehindNumber : row.mWithoutNumber);
         }
@@ -219,9 +219,9 @@ bool IsExpressible(CSemitones semitones) {
     return CanBeSaid(static_cast<TTones>(semitones.Mask()));
 }
 
-TParserText WriteParserText(const CChordLite& chord, const CChordNamePrefs& prefs) {
+CParserText WriteParserText(const CChordLite& chord, const CChordNamePrefs& prefs) {
     const auto tones = static_cast<TTones>(chord.mSemitones.Mask());
-    TParserText written;
+    CParserText written;
     written.mIsExact = CanBeSaid(tones);
     CParserTextWriter writer(NoteText(chord.mRootKeyEnh, prefs), NearestThatCanBeSaid(tones));
     written.mText = std::move(writer).Write();

@@ -12,7 +12,7 @@ struct CChordNamePrefs;
 namespace brindle::ChordText {
 
 /// A text for CChordSetFromStringHelper.
-struct TParserText {
+struct CParserText {
     std::string mText;
     /// False: the text says the nearest chord, since none says this one.
     bool mIsExact = false;
@@ -23,6 +23,6 @@ struct TParserText {
 
 /// Writes a chord with a root, so that CChordSetFromStringHelper (with these preferences) and
 /// ReadChordText (with `mBIsBFlat` as `mBForBFlat`) both read it back.
-[[nodiscard]] TParserText WriteParserText(const CChordLite& chord, const CChordNamePrefs& prefs);
+[[nodiscard]] CParserText WriteParserText(const CChordLite& chord, const CChordNamePrefs& prefs);
 
 }  // namespace brindle::ChordText

@@ -66,7 +66,7 @@ void CWriter::Bytes(std::string_view bytes) {
     mWritten += bytes.size();
 }
 
-THeadFault LibraryFile::ReadHead(std::string_view bytes, TLibraryHead& head) {
+THeadFault LibraryFile::ReadHead(std::string_view bytes, CLibraryHead& head) {
     if (bytes.size() < kHeaderSize || bytes.substr(0, kMagic.size()) != kMagic) {
         return THeadFault::NoLibrary;
     }

@@ -90,7 +90,7 @@ private:
 [[nodiscard]] std::optional<std::string> TakeStringField(std::string_view& bytes);
 
 /// What the beginning of a file tells.
-struct TLibraryHead {
+struct CLibraryHead {
     bool mIsReadOnly = false;
     GChShortTuning mShortTuning{};
     std::string mTuningName;
@@ -103,7 +103,7 @@ struct TLibraryHead {
 enum class THeadFault { None, NoLibrary, NoTuningChunk, Damaged };
 
 /// Reads header and tuning chunk. The result refers to `bytes`.
-[[nodiscard]] THeadFault ReadHead(std::string_view bytes, TLibraryHead& head);
+[[nodiscard]] THeadFault ReadHead(std::string_view bytes, CLibraryHead& head);
 
 /// Reads a whole chord chunk without its name. False if the chunk ends before its fields do.
 [[nodiscard]] bool ReadChordBody(std::string_view chunk, GChBasicChord& chord);

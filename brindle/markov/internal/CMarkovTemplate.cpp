@@ -24,10 +24,10 @@ CMarkovTemplate::CMarkovTemplate(MarkovSequenceView symbols, MarkovIterator endS
     std::sort(mChordPositions.begin(), mChordPositions.end());
 }
 
-CMarkovTemplate::TNext CMarkovTemplate::NextAt(double beats) const {
+CMarkovTemplate::CNext CMarkovTemplate::NextAt(double beats) const {
     const auto next =
         std::lower_bound(mFixed.begin(), mFixed.end(), beats,
-                         [](const TFixed& fixed, double at) { return fixed.mReached < at; });
+                         [](const CFixed& fixed, double at) { return fixed.mReached < at; });
     if (next == mFixed.end()) return {mEndSymbol, mLength - beats};
     return {next->mObject, next->mPosition - beats};
 }

@@ -35,7 +35,7 @@ bool CTemplateSearch::Run() {
 /// A new level behind the symbols that are there.
 CTemplateSearch::TOutcome CTemplateSearch::Begin() {
     ++mSteps;
-    TLevel level;
+    CSearchLevel level;
     level.mDepth = mInfo.mDepths.empty() ? 1 : mInfo.mDepths.back() + 1;
     level.mBeats = BeatsAtEnd();
     level.mNext = mTemplate.NextAt(level.mBeats);
@@ -44,7 +44,7 @@ CTemplateSearch::TOutcome CTemplateSearch::Begin() {
     mLevels.push_back(std::move(level));
 
     mModel.Subvector(mLongest, mSequence.mSymbols, mHistory);
-    const TLevel& here = mLevels.back();
+    const CSearchLevel& here = mLevels.back();
     if (mInfo.IsBlocklisted(here.mBeats, mHistory)) return Fail();
     if (mLevels.size() > kMarkovMaxTemplateSymbols) return Fail();
     if (here.mNext.mDistance > 0.0) return FillGap();
@@ -59,7 +59,7 @@ CTemplateSearch::TOutcome CTemplateSearch::GoOn() {
 }
 
 CTemplateSearch::TOutcome CTemplateSearch::TryOtherSymbol() {
-    TLevel& level = mLevels.back();
+    CSearchLevel& level = mLevels.back();
     level.mExcluded.insert(mSequence.mSymbols.back());
     mSequence.RemoveLast();
     mInfo.mBeats.push_back(level.mBeats);
@@ -75,7 +75,7 @@ CTemplateSearch::TOutcome CTemplateSearch::TakeBackFixedSymbol() {
 }
 
 CTemplateSearch::TOutcome CTemplateSearch::FillGap() {
-    const TLevel& level = mLevels.back();
+    const CSearchLevel& level = mLevels.back();
     if (mModel.AppendNextFittingSymbol(mSequence, level.mNext.mDistance, level.mExcluded, mOptions,
                                        mInfo, kMarkovLongestHistory)) {
         return TOutcome::Deeper;

@@ -26,10 +26,10 @@ public:
 private:
     enum class TOutcome { Deeper, Failed, Found };
 
-    struct TLevel {
+    struct CSearchLevel {
         std::int32_t mDepth = 0;
         double mBeats = 0.0;
-        CMarkovTemplate::TNext mNext;
+        CMarkovTemplate::CNext mNext;
         /// Symbols that led nowhere in this gap.
         MarkovSymbolSet mExcluded;
     };
@@ -55,7 +55,7 @@ private:
     std::uint64_t mLongest;
     double mFirstBeats;
     std::uint64_t mSteps = 0;
-    std::vector<TLevel> mLevels;
+    std::vector<CSearchLevel> mLevels;
     MarkovSequence mHistory;
     MarkovProbabilities mTable;
 };

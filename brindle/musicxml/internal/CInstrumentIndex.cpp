@@ -20,14 +20,14 @@ CInstrumentIndex::CInstrumentIndex(std::vector<std::string> ids) : mIds(std::mov
         }
     }
     std::sort(mEnds.begin(), mEnds.end(),
-              [this](const TEnd& a, const TEnd& b) { return TextOf(a) < TextOf(b); });
+              [this](const CEnd& a, const CEnd& b) { return TextOf(a) < TextOf(b); });
 }
 
 std::vector<std::size_t> CInstrumentIndex::Holding(std::string_view text, std::size_t limit) const {
     std::vector<std::size_t> found;
     auto end = std::lower_bound(
         mEnds.begin(), mEnds.end(), text,
-        [this](const TEnd& entry, std::string_view sought) { return TextOf(entry) < sought; });
+        [this](const CEnd& entry, std::string_view sought) { return TextOf(entry) < sought; });
     for (; end != mEnds.end() && found.size() < limit && TextOf(*end).starts_with(text); ++end) {
         found.push_back(end->mId);
     }

@@ -28,17 +28,17 @@ public:
     [[nodiscard]] std::vector<std::size_t> Holding(std::string_view text, std::size_t limit) const;
 
 private:
-    struct TEnd {
+    struct CEnd {
         std::uint32_t mId;
         std::uint32_t mBegin;
     };
 
-    [[nodiscard]] std::string_view TextOf(const TEnd& end) const {
+    [[nodiscard]] std::string_view TextOf(const CEnd& end) const {
         return std::string_view(mIds[end.mId]).substr(end.mBegin);
     }
 
     std::vector<std::string> mIds;
-    std::vector<TEnd> mEnds;  ///< sorted by their texts
+    std::vector<CEnd> mEnds;  ///< sorted by their texts
 };
 
 }  // namespace brindle::muxml

@@ -55,7 +55,7 @@ void CScoreIndex::Visit(const XmlNode& node) {
     const std::string_view name = node.name();
     if (name == "part") {
         const std::string id = node.attribute("id").value_or(std::string());
-        if (!id.empty()) mParts.try_emplace(id, TPart{node});
+        if (!id.empty()) mParts.try_emplace(id, CIndexedPart{node});
     } else if (name == "part-list") {
         if (!mPartList) mPartList = node;
     } else if (name == "time") {
@@ -89,7 +89,7 @@ void CScoreIndex::ReadPartList(const XmlNode& root) {
 XmlNode CScoreIndex::TakePart(std::string_view id) {
     const auto it = mParts.find(id);
     if (it == mParts.end()) return {};
-    TPart& part = it->second;
+    CIndexedPart& part = it->second;
     if (!std::exchange(part.mIsTaken, true)) return part.mPart;
     mLyricRoom = 0;
     if (part.mWeight == 0) part.mWeight = WeightOf(part.mPart) + WeightOf(ScorePart(id));

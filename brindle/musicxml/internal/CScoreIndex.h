@@ -44,7 +44,7 @@ public:
     std::size_t mLyricRoom = kMuxmlMaxLyricCopies;
 
 private:
-    struct TPart {
+    struct CIndexedPart {
         XmlNode mPart;
         /// Of the part and of its entry in the list; weighed when the identifier is repeated.
         std::size_t mWeight = 0;
@@ -59,7 +59,7 @@ private:
     CMuxmlSignTime mFirstSignTime;
     bool mHasChord = false;
     std::int32_t mScorePartCount = 0;
-    std::map<std::string, TPart, std::less<>> mParts;
+    std::map<std::string, CIndexedPart, std::less<>> mParts;
     std::map<std::string, XmlNode, std::less<>> mScoreParts;
     CMuxmlScoreInstruments mInstruments;
     CInstrumentIndex mInstrumentIndex;

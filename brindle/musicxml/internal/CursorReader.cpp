@@ -49,7 +49,7 @@ void CCursorReader::Ended(TScoreElement element, TScoreElement parent, std::stri
 }
 
 void CCursorReader::Move(TTicks ticks) {
-    TScoreMeasure& measure = mPart.mMeasures.back();
+    CScoreMeasure& measure = mPart.mMeasures.back();
     mCursor = std::max(TTicks{0}, AddTicks(mCursor, ticks));
     measure.mLength = std::max(measure.mLength, mCursor);
 }
@@ -65,9 +65,9 @@ void CCursorReader::EndedDivisions(std::string_view text) {
         ticks = RoundedTicks(static_cast<double>(ticks) / divisions);
     };
     measureAnew(mCursor);
-    for (TScoreMeasure& measure : mPart.mMeasures) {
+    for (CScoreMeasure& measure : mPart.mMeasures) {
         measureAnew(measure.mLength);
-        for (TWrittenHarmony& harmony : measure.mHarmonies) measureAnew(harmony.mOffset);
+        for (CWrittenHarmony& harmony : measure.mHarmonies) measureAnew(harmony.mOffset);
     }
 }
 

@@ -12,7 +12,7 @@ namespace brindle {
 class CCursorReader {
 public:
     /// Reads into the last measure of the part, which is there already.
-    explicit CCursorReader(TScorePart& part) : mPart(part) {}
+    explicit CCursorReader(CScorePart& part) : mPart(part) {}
 
     void Started(TScoreElement element);
     void Ended(TScoreElement element, TScoreElement parent, std::string_view text);
@@ -24,7 +24,7 @@ private:
     void Move(TTicks ticks);
     void EndedDivisions(std::string_view text);
 
-    TScorePart& mPart;
+    CScorePart& mPart;
     TTicks mCursor = 0;
     double mDuration = 0.0;  // of the note or the move that is being read
     bool mTakesTime = true;

@@ -55,7 +55,7 @@ private:
 /// The ways of jumps.
 class CJumps {
 public:
-    CJumps(TMarksOfMeasures marks, TJumpPlan& plan) : mMarks(marks), mPlan(plan) {}
+    CJumps(TMarksOfMeasures marks, CJumpPlan& plan) : mMarks(marks), mPlan(plan) {}
 
     void Plan() {
         FindCodas();
@@ -80,7 +80,7 @@ private:
             SetCodaTarget(signs[i], signs[i + 1]);
         }
         for (std::size_t ix = 0; hasToCoda && ix < mMarks.size(); ++ix) {
-            const TJumpMark& toCoda = mMarks[ix].mToCoda;
+            const CJumpMark& toCoda = mMarks[ix].mToCoda;
             if (!toCoda.mIsSet) continue;
             SetCodaTarget(ix, codas.Behind(ix, toCoda.mName).value_or(codas.First()));
         }
@@ -90,7 +90,7 @@ private:
         mPlan.mMeasures[ix].mCodaTarget = coda;
         const std::size_t ending = mPlan.mMeasures[ix].mEnding;
         if (ending == kNoMeasure) return;
-        TEndingGroup& group = mPlan.mGroups[mPlan.mEndings[ending].mGroup];
+        CEndingGroup& group = mPlan.mGroups[mPlan.mEndings[ending].mGroup];
         group.mEndingWithToCoda = std::min(group.mEndingWithToCoda, ending);
     }
 
@@ -102,7 +102,7 @@ private:
         for (std::size_t ix = 0; ix < mMarks.size(); ++ix) {
             if (!mMarks[ix].Jumps()) continue;
             std::size_t target = 0;
-            if (const TJumpMark& dalSegno = mMarks[ix].mDalSegno; dalSegno.mIsSet) {
+            if (const CJumpMark& dalSegno = mMarks[ix].mDalSegno; dalSegno.mIsSet) {
                 const std::size_t first = segnos.First() == kNoMeasure ? 0 : segnos.First();
                 target = segnos.UpTo(ix, dalSegno.mName).value_or(first);
             }
@@ -111,13 +111,13 @@ private:
     }
 
     TMarksOfMeasures mMarks;
-    TJumpPlan& mPlan;
+    CJumpPlan& mPlan;
 };
 
 }  // namespace
 
-TJumpPlan MakeJumpPlan(TMarksOfMeasures marks) {
-    TJumpPlan plan;
+CJumpPlan MakeJumpPlan(TMarksOfMeasures marks) {
+    CJumpPlan plan;
     plan.mMeasures.resize(marks.size());
     PlanEndings(marks, plan);
     PlanRepeats(marks, plan);

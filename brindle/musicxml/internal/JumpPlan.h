@@ -15,10 +15,10 @@ namespace brindle {
 inline constexpr std::size_t kNoMeasure = std::numeric_limits<std::size_t>::max();
 
 /// The marks of each measure, in the order in which they are written.
-using TMarksOfMeasures = std::span<const TPlayMarks>;
+using TMarksOfMeasures = std::span<const CPlayMarks>;
 
 /// One ending of a repeat: the measures under one bracket, up to the sign that goes back.
-struct TEnding {
+struct CEnding {
     std::size_t mFirst = 0;
     std::size_t mLast = 0;
     std::vector<std::int32_t> mNumbers;
@@ -27,7 +27,7 @@ struct TEnding {
 };
 
 /// Endings side by side, of which each pass plays one.
-struct TEndingGroup {
+struct CEndingGroup {
     std::size_t mFirstEnding = 0;
     std::size_t mEndingCount = 0;
     /// Where the repeat goes back to.
@@ -47,7 +47,7 @@ struct TEndingGroup {
 };
 
 /// What a measure is for the player.
-struct TMeasurePlan {
+struct CMeasurePlan {
     /// Where its backward repeat goes, kNoMeasure without one.
     std::size_t mRepeatStart = kNoMeasure;
     /// The measure that ends the repeat around this one, itself included; kNoMeasure for none.
@@ -63,26 +63,26 @@ struct TMeasurePlan {
 };
 
 /// All ways through a song, told from its marks.
-struct TJumpPlan {
-    std::vector<TMeasurePlan> mMeasures;
-    std::vector<TEnding> mEndings;
-    std::vector<TEndingGroup> mGroups;
+struct CJumpPlan {
+    std::vector<CMeasurePlan> mMeasures;
+    std::vector<CEnding> mEndings;
+    std::vector<CEndingGroup> mGroups;
 
     /// Null for a measure in no ending.
-    [[nodiscard]] const TEnding* EndingAt(std::size_t ix) const {
+    [[nodiscard]] const CEnding* EndingAt(std::size_t ix) const {
         const std::size_t ending = mMeasures[ix].mEnding;
         return ending == kNoMeasure ? nullptr : &mEndings[ending];
     }
-    [[nodiscard]] const TEndingGroup& GroupOf(const TEnding& ending) const {
+    [[nodiscard]] const CEndingGroup& GroupOf(const CEnding& ending) const {
         return mGroups[ending.mGroup];
     }
 };
 
-[[nodiscard]] TJumpPlan MakeJumpPlan(TMarksOfMeasures marks);
+[[nodiscard]] CJumpPlan MakeJumpPlan(TMarksOfMeasures marks);
 
 /// The first steps of making a plan: its endings and their groups, then its repeats. The plan has
 /// its measures.
-void PlanEndings(TMarksOfMeasures marks, TJumpPlan& plan);
-void PlanRepeats(TMarksOfMeasures marks, TJumpPlan& plan);
+void PlanEndings(TMarksOfMeasures marks, CJumpPlan& plan);
+void PlanRepeats(TMarksOfMeasures marks, CJumpPlan& plan);
 
 }  // namespace brindle

@@ -9,7 +9,7 @@
 namespace brindle {
 
 /// A kind of chord in a lead sheet: its word, and the semitones above the root.
-struct TKindRow {
+struct CKindRow {
     std::string_view mWord;
     std::size_t mCount;
     std::array<int, 7> mIntvls;
@@ -24,7 +24,7 @@ struct TKindRow {
 
 // Word, number of semitones, semitones above the root.
 // clang-format off
-inline constexpr auto kKindRows = std::to_array<TKindRow>({
+inline constexpr auto kKindRows = std::to_array<CKindRow>({
     {"major",              3, {0, 4, 7}},
     {"minor",              3, {0, 3, 7}},
     {"augmented",          3, {0, 4, 8}},
@@ -58,8 +58,8 @@ inline constexpr auto kKindRows = std::to_array<TKindRow>({
 // clang-format on
 
 /// Null for a word that is no kind.
-[[nodiscard]] constexpr const TKindRow* KindRowOf(std::string_view kind) {
-    for (const TKindRow& row : kKindRows) {
+[[nodiscard]] constexpr const CKindRow* KindRowOf(std::string_view kind) {
+    for (const CKindRow& row : kKindRows) {
         if (row.mWord == kind) return &row;
     }
     return nullptr;

@@ -17,7 +17,7 @@ namespace brindle {
 
 namespace {
 
-struct TKindAlias {
+struct CKindAlias {
     std::string_view mAlias;
     std::string_view mKind;
     /// A tone that the alias has beside those of the kind, in semitones above the root; 0 for none.
@@ -26,7 +26,7 @@ struct TKindAlias {
 
 // Other names of kinds that scores use, or signs that they print, and the kind that has the same
 // tones. Capitals count only for the signs of major.
-constexpr auto kKindAliases = std::to_array<TKindAlias>({
+constexpr auto kKindAliases = std::to_array<CKindAlias>({
     {"M", "major"},
     {"M7", "major-seventh"},
     {"M9", "major-ninth"},
@@ -119,7 +119,7 @@ constexpr auto kKindsFromMostTones = std::to_array<std::string_view>({
 
 // By value: sanitized builds take no comparison of a row's address for a constant. -1 for no kind.
 constexpr int ToneCountOf(std::string_view kind) {
-    for (const TKindRow& row : kKindRows) {
+    for (const CKindRow& row : kKindRows) {
         if (row.mWord == kind) return static_cast<int>(row.mCount);
     }
     return -1;
@@ -141,7 +141,7 @@ static_assert(AreFromMostTones());
 static_assert(kKindsFromMostTones.size() + 4 == kKindRows.size());
 
 constexpr bool AllAliasesHaveAKind() {
-    for (const TKindAlias& alias : kKindAliases) {
+    for (const CKindAlias& alias : kKindAliases) {
         if (alias.mKind != kNoChord && ToneCountOf(alias.mKind) < 0) return false;
         if (ToneCountOf(alias.mAlias) >= 0) return false;
     }
@@ -181,7 +181,7 @@ bool SetKindOfAlias(TMusicXMLHarmony& harmony, std::string_view word) {
     for (const std::string_view name : {word, std::string_view(folded)}) {
         const auto* const row =
             std::find_if(kKindAliases.begin(), kKindAliases.end(),
-                         [name](const TKindAlias& alias) { return alias.mAlias == name; });
+                         [name](const CKindAlias& alias) { return alias.mAlias == name; });
         if (row == kKindAliases.end()) continue;
         harmony.mKind = row->mKind;
         if (row->mAddedTone > 0) AddTone(harmony, row->mAddedTone);

@@ -19,7 +19,7 @@ class XmlAttributes;
 class CMeasureReader {
 public:
     /// Reads into the last measure of the part, which is there already.
-    explicit CMeasureReader(TScorePart& part)
+    explicit CMeasureReader(CScorePart& part)
         : mPart(part), mCursor(part), mSignatures(part), mMarks(part) {}
 
     void Started(TScoreElement element, TScoreElement parent, const XmlAttributes& attributes);
@@ -32,7 +32,7 @@ private:
     void StartedHarmony(TScoreElement element, const XmlAttributes& attributes);
     void EndedHarmony(TScoreElement element, TScoreElement parent, std::string_view text);
 
-    TScorePart& mPart;
+    CScorePart& mPart;
     CCursorReader mCursor;
     CSignatureReader mSignatures;
     CPlayMarkReader mMarks;

@@ -10,7 +10,7 @@ namespace {
 constexpr double kMostBeatsOfBar = 64.0;
 constexpr double kTiny = 1e-6;
 
-void AddBeats(const CScoreBar& bar, std::vector<TNoteWindow>& windows) {
+void AddBeats(const CScoreBar& bar, std::vector<CNoteWindow>& windows) {
     const bool isWhole = bar.mEndPosition - bar.mPosition > kMostBeatsOfBar * bar.mBeat;
     const double beat = isWhole ? bar.mEndPosition - bar.mPosition : bar.mBeat;
     for (int count = 0; bar.mPosition + count * beat < bar.mEndPosition - kTiny; ++count) {
@@ -20,8 +20,8 @@ void AddBeats(const CScoreBar& bar, std::vector<TNoteWindow>& windows) {
     }
 }
 
-std::vector<TNoteWindow> EmptyWindows(const CScoreNotes& score, bool areBeats) {
-    std::vector<TNoteWindow> windows;
+std::vector<CNoteWindow> EmptyWindows(const CScoreNotes& score, bool areBeats) {
+    std::vector<CNoteWindow> windows;
     for (const CScoreBar& bar : score.mBars) {
         if (areBeats) {
             AddBeats(bar, windows);
@@ -44,7 +44,7 @@ public:
         mSpellings.fill(TEnh_Undef);
     }
 
-    void Fill(TNoteWindow& window) {
+    void Fill(CNoteWindow& window) {
         for (std::size_t nr = 0; nr < mEnds.size(); ++nr) {
             Take(window, nr, window.mPosition, mEnds[nr]);
         }
@@ -57,7 +57,7 @@ public:
     }
 
 private:
-    void Begin(TNoteWindow& window, const CTimedNote& note) {
+    void Begin(CNoteWindow& window, const CTimedNote& note) {
         const auto nr = static_cast<std::size_t>(note.mNote.mNoteNr);
         const double from = std::max(note.mPosition, window.mPosition);
         // What it doubles counts once.
@@ -67,7 +67,7 @@ private:
         mSpellings[static_cast<std::size_t>(note.mNote.KeyNr())] = note.mNote.mEnh;
     }
 
-    void Take(TNoteWindow& window, std::size_t nr, double from, double end) {
+    void Take(CNoteWindow& window, std::size_t nr, double from, double end) {
         const double length = std::min(end, window.mEndPosition) - from;
         if (length < kTiny) return;
         window.mShares[nr % 12] += length;
@@ -77,7 +77,7 @@ private:
         if (isAtBegin && (window.mBass < 0 || noteNr < window.mBass)) window.mBass = noteNr;
     }
 
-    void Finish(TNoteWindow& window) {
+    void Finish(CNoteWindow& window) {
         if (window.mBass < 0) window.mBass = mLowest;
         mLowest = -1;
         double sum = 0.0;
@@ -96,10 +96,10 @@ private:
 
 }  // namespace
 
-std::vector<TNoteWindow> NoteWindows(const CScoreNotes& score, bool areBeats) {
-    std::vector<TNoteWindow> windows = EmptyWindows(score, areBeats);
+std::vector<CNoteWindow> NoteWindows(const CScoreNotes& score, bool areBeats) {
+    std::vector<CNoteWindow> windows = EmptyWindows(score, areBeats);
     CSounding sounding(score.mNotes);
-    for (TNoteWindow& window : windows) sounding.Fill(window);
+    for (CNoteWindow& window : windows) sounding.Fill(window);
     return windows;
 }
 

@@ -9,7 +9,7 @@
 namespace brindle {
 
 /// What sounds in a stretch of time.
-struct TNoteWindow {
+struct CNoteWindow {
     double mPosition = 0.0;
     double mEndPosition = 0.0;
     /// The beat that begins it ends here; its lowest note is the bass.
@@ -25,6 +25,6 @@ struct TNoteWindow {
 };
 
 /// The bars or the beats of a score with what sounds in them.
-[[nodiscard]] std::vector<TNoteWindow> NoteWindows(const CScoreNotes& score, bool areBeats);
+[[nodiscard]] std::vector<CNoteWindow> NoteWindows(const CScoreNotes& score, bool areBeats);
 
 }  // namespace brindle

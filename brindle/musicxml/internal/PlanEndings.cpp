@@ -12,7 +12,7 @@ namespace {
 
 class CEndings {
 public:
-    CEndings(TMarksOfMeasures marks, TJumpPlan& plan) : mMarks(marks), mPlan(plan) {}
+    CEndings(TMarksOfMeasures marks, CJumpPlan& plan) : mMarks(marks), mPlan(plan) {}
 
     void Plan() {
         Find();
@@ -27,7 +27,7 @@ private:
     // repeat.
     void Find() {
         for (std::size_t ix = 0; ix < mMarks.size(); ++ix) {
-            const TPlayMarks& marks = mMarks[ix];
+            const CPlayMarks& marks = mMarks[ix];
             if (ix > 0 && (marks.mEndingStarts || marks.mRepeatForward)) Close(ix - 1);
             if (marks.mEndingStarts) {
                 mOpen.emplace();
@@ -50,8 +50,8 @@ private:
     // back in front of the next ending all the same.
     void ReachForRepeatSigns() {
         for (std::size_t i = 0; i + 1 < mPlan.mEndings.size(); ++i) {
-            TEnding& ending = mPlan.mEndings[i];
-            const TEnding& next = mPlan.mEndings[i + 1];
+            CEnding& ending = mPlan.mEndings[i];
+            const CEnding& next = mPlan.mEndings[i + 1];
             const bool goesOn = Continues(ending, next) || HaveOneNumber(ending, next);
             if (!goesOn || mMarks[ending.mLast].mRepeatBackward) continue;
             std::size_t ix = ending.mLast + 1;
@@ -67,8 +67,8 @@ private:
     void TellEqualNumbersApart() {
         std::int32_t before = 0;
         for (std::size_t i = 0; i + 1 < mPlan.mEndings.size(); ++i) {
-            TEnding& ending = mPlan.mEndings[i];
-            TEnding& next = mPlan.mEndings[i + 1];
+            CEnding& ending = mPlan.mEndings[i];
+            CEnding& next = mPlan.mEndings[i + 1];
             if (!AreSideBySide(ending, next)) {
                 before = 0;
                 continue;
@@ -84,23 +84,23 @@ private:
         }
     }
 
-    [[nodiscard]] bool AreSideBySide(const TEnding& ending, const TEnding& next) const {
+    [[nodiscard]] bool AreSideBySide(const CEnding& ending, const CEnding& next) const {
         return ending.mLast + 1 == next.mFirst && !mMarks[next.mFirst].mRepeatForward;
     }
-    static bool HaveOneNumber(const TEnding& ending, const TEnding& next) {
+    static bool HaveOneNumber(const CEnding& ending, const CEnding& next) {
         return ending.mNumbers.size() == 1 && ending.mNumbers == next.mNumbers;
     }
     // Whether the numbers of an ending go on where those of the one before end.
-    static bool Continues(const TEnding& ending, const TEnding& next) {
+    static bool Continues(const CEnding& ending, const CEnding& next) {
         if (ending.mNumbers.empty() || next.mNumbers.empty()) return true;
         return next.mNumbers.front() > ending.mNumbers.back();
     }
 
     void AddToGroup(std::size_t i) {
-        TEnding& ending = mPlan.mEndings[i];
+        CEnding& ending = mPlan.mEndings[i];
         if (!BelongsToLastGroup(i)) mPlan.mGroups.emplace_back().mFirstEnding = i;
         ending.mGroup = mPlan.mGroups.size() - 1;
-        TEndingGroup& group = mPlan.mGroups.back();
+        CEndingGroup& group = mPlan.mGroups.back();
         Describe(i, group);
         if (ending.mNumbers.empty()) ending.mNumbers = {group.HighestNumber() + 1};
         ++group.mEndingCount;
@@ -111,14 +111,14 @@ private:
 
     [[nodiscard]] bool BelongsToLastGroup(std::size_t i) const {
         if (i == 0) return false;
-        const TEnding& before = mPlan.mEndings[i - 1];
-        const TEnding& ending = mPlan.mEndings[i];
+        const CEnding& before = mPlan.mEndings[i - 1];
+        const CEnding& ending = mPlan.mEndings[i];
         return AreSideBySide(before, ending) && Continues(before, ending) &&
                mPlan.mGroups.back().HighestNumber() < kHighestEndingNumber;
     }
 
-    void Describe(std::size_t i, TEndingGroup& group) {
-        TEnding& ending = mPlan.mEndings[i];
+    void Describe(std::size_t i, CEndingGroup& group) {
+        CEnding& ending = mPlan.mEndings[i];
         ending.mGoesBack = mMarks[ending.mLast].mRepeatBackward;
         for (std::size_t ix = ending.mFirst; ix <= ending.mLast; ++ix) {
             mPlan.mMeasures[ix].mEnding = i;
@@ -129,20 +129,20 @@ private:
     // Even where the sign was forgotten.
     void LetAllButTheLastGoBack() {
         for (std::size_t i = 0; i + 1 < mPlan.mEndings.size(); ++i) {
-            TEnding& ending = mPlan.mEndings[i];
+            CEnding& ending = mPlan.mEndings[i];
             if (mPlan.mEndings[i + 1].mGroup != ending.mGroup) continue;
             if (!mMarks[ending.mLast].Jumps()) ending.mGoesBack = true;
         }
     }
 
     TMarksOfMeasures mMarks;
-    TJumpPlan& mPlan;
-    std::optional<TEnding> mOpen;
+    CJumpPlan& mPlan;
+    std::optional<CEnding> mOpen;
 };
 
 }  // namespace
 
-void PlanEndings(TMarksOfMeasures marks, TJumpPlan& plan) {
+void PlanEndings(TMarksOfMeasures marks, CJumpPlan& plan) {
     CEndings(marks, plan).Plan();
 }
 

@@ -15,7 +15,7 @@ bool IsYes(std::string_view text) {
     return text == "yes";
 }
 
-void SetMark(TJumpMark& mark, const XmlAttributes& attributes, std::string_view name) {
+void SetMark(CJumpMark& mark, const XmlAttributes& attributes, std::string_view name) {
     if (const auto value = attributes.Find(name)) mark.Set(*value);
 }
 
@@ -55,7 +55,7 @@ void CPlayMarkReader::Started(TScoreElement element, TScoreElement parent,
 // A sign to begin that stands behind a measure is meant for the next one, and a sign to go back
 // that stands in front of it is meant for the one before.
 void CPlayMarkReader::StartedRepeat(const XmlAttributes& attributes) {
-    TPlayMarks* marks = &Marks();
+    CPlayMarks* marks = &Marks();
     const std::string_view direction = attributes.Value("direction");
     if (direction == "forward") {
         if (mIsAtRight) {
@@ -75,7 +75,7 @@ void CPlayMarkReader::StartedRepeat(const XmlAttributes& attributes) {
 }
 
 void CPlayMarkReader::StartedEnding(const XmlAttributes& attributes) {
-    TPlayMarks& marks = Marks();
+    CPlayMarks& marks = Marks();
     if (attributes.Value("type") == "start") {
         marks.mEndingStarts = true;
         marks.mEndingNumbers = ReadEndingNumbers(attributes.Value("number"));
@@ -85,7 +85,7 @@ void CPlayMarkReader::StartedEnding(const XmlAttributes& attributes) {
 }
 
 void CPlayMarkReader::StartedSound(const XmlAttributes& attributes) {
-    TPlayMarks& marks = Marks();
+    CPlayMarks& marks = Marks();
     if (IsYes(attributes.Value("dacapo"))) marks.mDaCapo = true;
     if (IsYes(attributes.Value("forward-repeat"))) marks.mRepeatForward = true;
     SetMark(marks.mDalSegno, attributes, "dalsegno");
@@ -112,7 +112,7 @@ void CPlayMarkReader::Ended(TScoreElement element, std::string_view text) {
 }
 
 void CPlayMarkReader::EndedEnding(std::string_view text) {
-    TPlayMarks& marks = Marks();
+    CPlayMarks& marks = Marks();
     if (!marks.mEndingStarts || !marks.mEndingNumbers.empty()) return;
     marks.mEndingNumbers = ReadEndingNumbers(text);
 }
@@ -125,7 +125,7 @@ void CPlayMarkReader::EndedWords(std::string_view text) {
 
 // The words of one direction belong together: "D.S." and "al Coda" may be set apart.
 void CPlayMarkReader::EndedDirection() {
-    TPlayMarks found;
+    CPlayMarks found;
     ReadPlayWords(mWords, mHasCodaSign, found);
     if (mHasCodaSign && !found.mToCoda.mIsSet) found.mCoda.Set();
     Marks().Add(found);

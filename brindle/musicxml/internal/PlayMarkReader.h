@@ -15,7 +15,7 @@ class XmlAttributes;
 class CPlayMarkReader {
 public:
     /// Reads into the last measure of the part, which is there already.
-    explicit CPlayMarkReader(TScorePart& part) : mPart(part) {}
+    explicit CPlayMarkReader(CScorePart& part) : mPart(part) {}
 
     void Started(TScoreElement element, TScoreElement parent, const XmlAttributes& attributes);
     void Ended(TScoreElement element, std::string_view text);
@@ -23,8 +23,8 @@ public:
     void Finish();
 
 private:
-    [[nodiscard]] TScoreMeasure& Measure() { return mPart.mMeasures.back(); }
-    [[nodiscard]] TPlayMarks& Marks() { return mPart.mMarks.back(); }
+    [[nodiscard]] CScoreMeasure& Measure() { return mPart.mMeasures.back(); }
+    [[nodiscard]] CPlayMarks& Marks() { return mPart.mMarks.back(); }
 
     void StartedRepeat(const XmlAttributes& attributes);
     void StartedEnding(const XmlAttributes& attributes);
@@ -33,7 +33,7 @@ private:
     void EndedWords(std::string_view text);
     void EndedDirection();
 
-    TScorePart& mPart;
+    CScorePart& mPart;
     std::string mWords;  // of the direction that is being read
     bool mHasCodaSign = false;
     bool mIsAtLeft = false;  // of the bar line that is being read

@@ -3,7 +3,7 @@
 
 namespace brindle {
 
-void TPlayMarks::Add(const TPlayMarks& other) {
+void CPlayMarks::Add(const CPlayMarks& other) {
     mRepeatForward |= other.mRepeatForward;
     mRepeatBackward |= other.mRepeatBackward;
     mRepeatAfterJump |= other.mRepeatAfterJump;

@@ -9,7 +9,7 @@
 namespace brindle {
 
 /// A place that jumps lead to, with the name that the song gives it, if any.
-struct TJumpMark {
+struct CJumpMark {
     bool mIsSet = false;
     std::string mName;
 
@@ -17,14 +17,14 @@ struct TJumpMark {
         mIsSet = true;
         if (mName.empty()) mName = name;
     }
-    void Add(const TJumpMark& other) {
+    void Add(const CJumpMark& other) {
         if (other.mIsSet) Set(other.mName);
     }
 };
 
 /// What steers the playing of a bar, gathered from signs, words and sound instructions alike, in a
 /// score or in a text.
-struct TPlayMarks {
+struct CPlayMarks {
     bool mRepeatForward = false;
     bool mRepeatBackward = false;
     /// Whether the repeat is taken again after a jump back.
@@ -38,17 +38,17 @@ struct TPlayMarks {
     std::vector<std::int32_t> mEndingNumbers;
 
     bool mDaCapo = false;
-    TJumpMark mDalSegno;
+    CJumpMark mDalSegno;
     bool mAlFine = false;
     bool mAlCoda = false;
-    TJumpMark mSegno;
-    TJumpMark mCoda;
-    TJumpMark mToCoda;
+    CJumpMark mSegno;
+    CJumpMark mCoda;
+    CJumpMark mToCoda;
     bool mFine = false;
 
     [[nodiscard]] bool Jumps() const { return mDaCapo || mDalSegno.mIsSet; }
     /// Joins what another part of the score tells about the same bar.
-    void Add(const TPlayMarks& other);
+    void Add(const CPlayMarks& other);
 };
 
 }  // namespace brindle

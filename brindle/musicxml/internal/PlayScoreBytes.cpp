@@ -42,22 +42,22 @@ std::optional<std::string> FromLatin1(std::string_view bytes) {
 }
 
 // Some scores say UTF-8, or nothing, and are Latin-1.
-TScoreReading ReadScoreInAnyEncoding(std::string_view bytes) {
-    TScoreReading reading = ReadScore(WithoutLeadingWhite(bytes));
+CScoreReading ReadScoreInAnyEncoding(std::string_view bytes) {
+    CScoreReading reading = ReadScore(WithoutLeadingWhite(bytes));
     if (!reading.mError) return reading;
     if (const auto text = FromLatin1(WithoutLeadingWhite(bytes))) {
-        TScoreReading other = ReadScore(*text);
+        CScoreReading other = ReadScore(*text);
         if (!other.mError) return other;
     }
     return reading;
 }
 
-TScoreFault FaultOf(TLoadFault fault, std::string description) {
+CScoreFault FaultOf(TLoadFault fault, std::string description) {
     return {{std::string(kLoadFaultDomain), fault, std::move(description)}};
 }
 
-TScoreFault FaultOf(const XmlError& error) {
-    TScoreFault fault = FaultOf(LoadFault_Score, error.mDescription);
+CScoreFault FaultOf(const XmlError& error) {
+    CScoreFault fault = FaultOf(LoadFault_Score, error.mDescription);
     if (error.mLine <= 0) return fault;
     fault.mLine = static_cast<std::size_t>(error.mLine);
     fault.mColumn = static_cast<std::size_t>(error.mColumn);
@@ -66,8 +66,8 @@ TScoreFault FaultOf(const XmlError& error) {
 
 }  // namespace
 
-TPlayedScore PlayScoreBytes(std::string_view bytes) {
-    TPlayedScore played;
+CPlayedScore PlayScoreBytes(std::string_view bytes) {
+    CPlayedScore played;
     std::optional<std::string> unpacked;
     if (IsScoreContainer(bytes)) {
         unpacked = ScoreInContainer(bytes);
@@ -77,7 +77,7 @@ TPlayedScore PlayScoreBytes(std::string_view bytes) {
         }
         bytes = *unpacked;
     }
-    TScoreReading reading = ReadScoreInAnyEncoding(bytes);
+    CScoreReading reading = ReadScoreInAnyEncoding(bytes);
     if (reading.mError) {
         played.mFault = FaultOf(*reading.mError);
         return played;

@@ -12,7 +12,7 @@ namespace brindle {
 
 namespace {
 
-CSignKeyLite SignKeyOf(const TScoreKey& key) {
+CSignKeyLite SignKeyOf(const CScoreKey& key) {
     CSignKeyHeavy signKey;
     signKey.SetFromSignsCountAndType(key.mFifths, key.mType == TSignKeyType_Minor
                                                       ? TSignKeyTypeNoUndef_Minor
@@ -25,7 +25,7 @@ CSignKeyLite SignKeyOf(const TScoreKey& key) {
 /// Lays the measures out in playing order.
 class CLayout {
 public:
-    explicit CLayout(TPlayedScore& score)
+    explicit CLayout(CPlayedScore& score)
         : mScore(score.mWritten), mOrder(score.mOrder), mDoc(score.mDoc), mEnd(score.mEnd) {}
 
     /// False when the song was cut.
@@ -45,9 +45,9 @@ public:
 private:
     // The time and the key of a measure may be told in an earlier one.
     void FindWhatHolds() {
-        std::optional<TScoreTime> time;
-        std::optional<TScoreKey> key;
-        for (const TScoreMeasure& measure : mScore.mMeasures) {
+        std::optional<CScoreTime> time;
+        std::optional<CScoreKey> key;
+        for (const CScoreMeasure& measure : mScore.mMeasures) {
             if (measure.mTime) time = measure.mTime;
             if (measure.mKey) key = measure.mKey;
             mTimes.push_back(time);
@@ -58,9 +58,9 @@ private:
     // A long song takes much room; it is taken once. Gives how much it may be.
     std::size_t MakeRoom() {
         std::vector<std::size_t> bytes;
-        for (const TScoreMeasure& measure : mScore.mMeasures) {
+        for (const CScoreMeasure& measure : mScore.mMeasures) {
             std::size_t sum = 0;
-            for (const TWrittenHarmony& harmony : measure.mHarmonies) {
+            for (const CWrittenHarmony& harmony : measure.mHarmonies) {
                 sum += BytesOf(harmony.mHarmony);
             }
             bytes.push_back(sum);
@@ -80,7 +80,7 @@ private:
     }
 
     void Play(std::size_t ix) {
-        const TScoreMeasure& measure = mScore.mMeasures[ix];
+        const CScoreMeasure& measure = mScore.mMeasures[ix];
         mDoc.HarmBarlines.push_back({QuartersOf(mPosition)});
         if (measure.mHasRehearsal) {
             mDoc.HarmSections.push_back(
@@ -89,7 +89,7 @@ private:
         AppendTime(mTimes[ix]);
         AppendKey(mKeys[ix]);
         if (measure.mHasSlash) mDoc.ChordSequences.push_back(mDoc.Harmonies.size());
-        for (const TWrittenHarmony& written : measure.mHarmonies) {
+        for (const CWrittenHarmony& written : measure.mHarmonies) {
             mBytes += BytesOf(written.mHarmony);
             TMusicXMLHarmony& harmony = mDoc.Harmonies.emplace_back(written.mHarmony);
             harmony.mPosition =
@@ -98,14 +98,14 @@ private:
         mPosition = AddTicks(mPosition, measure.mLength);
     }
 
-    void AppendTime(const std::optional<TScoreTime>& time) {
+    void AppendTime(const std::optional<CScoreTime>& time) {
         if (!time || time == mTime) return;
         mTime = time;
         mDoc.TimeSignatures.push_back({QuartersOf(mPosition), time->mBeats, time->mBeatType});
     }
 
     // A key that begins later than the song leaves the beginning without one.
-    void AppendKey(const std::optional<TScoreKey>& key) {
+    void AppendKey(const std::optional<CScoreKey>& key) {
         if (!key || key == mKey) return;
         mKey = key;
         if (mDoc.HarmSignKeys.empty() && mPosition > 0) {
@@ -135,7 +135,7 @@ private:
 
     void AppendCopies() {
         const std::size_t count = mDoc.HarmBarlines.size();
-        for (const TJumpBack& jump : mOrder.mJumpsBack) {
+        for (const CJumpBack& jump : mOrder.mJumpsBack) {
             if (jump.mTo >= count) break;
             const auto back = static_cast<std::int32_t>(jump.mTo - jump.mFrom);
             mDoc.HarmCopies.push_back({.mTargetPos = mDoc.HarmBarlines[jump.mTo].mPosition,
@@ -144,21 +144,21 @@ private:
         }
     }
 
-    const TWrittenScore& mScore;
-    TPlayingOrder& mOrder;
+    const CWrittenScore& mScore;
+    CPlayingOrder& mOrder;
     TMusicXMLDoc& mDoc;
     double& mEnd;
-    std::vector<std::optional<TScoreTime>> mTimes;  // that hold in each measure
-    std::vector<std::optional<TScoreKey>> mKeys;
+    std::vector<std::optional<CScoreTime>> mTimes;  // that hold in each measure
+    std::vector<std::optional<CScoreKey>> mKeys;
     TTicks mPosition = 0;
-    std::optional<TScoreTime> mTime;
-    std::optional<TScoreKey> mKey;
+    std::optional<CScoreTime> mTime;
+    std::optional<CScoreKey> mKey;
     std::size_t mBytes = 0;
 };
 
 }  // namespace
 
-bool LayOutAsPlayed(TPlayedScore& score) {
+bool LayOutAsPlayed(CPlayedScore& score) {
     return CLayout(score).Run();
 }
 

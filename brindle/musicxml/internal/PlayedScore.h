@@ -22,7 +22,7 @@ enum TLoadFault : int {
 };
 
 /// Why there is no score, or not all of it.
-struct TScoreFault {
+struct CScoreFault {
     Error mError;
     /// From 1; 0 where the fault has no place in a text.
     std::size_t mLine = 0;
@@ -30,20 +30,20 @@ struct TScoreFault {
 };
 
 /// A score as it is written and as it is played.
-struct TPlayedScore {
-    TWrittenScore mWritten;
-    TPlayingOrder mOrder;
+struct CPlayedScore {
+    CWrittenScore mWritten;
+    CPlayingOrder mOrder;
     TMusicXMLDoc mDoc;
     /// In quarters.
     double mEnd = 0.0;
-    std::optional<TScoreFault> mFault;
+    std::optional<CScoreFault> mFault;
 };
 
 /// Reads a score, plain or in a container, and plays it.
-[[nodiscard]] TPlayedScore PlayScoreBytes(std::string_view bytes);
+[[nodiscard]] CPlayedScore PlayScoreBytes(std::string_view bytes);
 
 /// Plays `score.mWritten` into its other fields. False when the song was cut, as it is too long or
 /// its harmonies take more than kMaxPlayedBytes.
-bool LayOutAsPlayed(TPlayedScore& score);
+bool LayOutAsPlayed(CPlayedScore& score);
 
 }  // namespace brindle

@@ -32,7 +32,7 @@ class CLastJump {
 public:
     /// A jump that tells neither "al Fine" nor "al Coda" obeys both where it finds them. What
     /// stands up to `end` was played before.
-    void Jump(const TPlayMarks& marks, std::size_t end) {
+    void Jump(const CPlayMarks& marks, std::size_t end) {
         mIsPlayingAgain = true;
         mEnd = end;
         mToFine = marks.mAlFine || !marks.mAlCoda;
@@ -52,16 +52,16 @@ private:
     std::size_t mEnd = 0;
 };
 
-class CPlayer {
+class CScorePlayer {
 public:
-    explicit CPlayer(TMarksOfMeasures marks)
+    explicit CScorePlayer(TMarksOfMeasures marks)
         : mMarks(marks),
           mPlan(MakeJumpPlan(marks)),
           mMostPlayed(PlayLimitsOf(marks.size(), 0).mMeasures),
           mLastPlayed(marks.size(), kNoMeasure),
           mHasJumped(marks.size(), false) {}
 
-    [[nodiscard]] TPlayingOrder Play() {
+    [[nodiscard]] CPlayingOrder Play() {
         std::size_t ix = 0;
         while (ix < mMarks.size()) {
             if (const std::size_t other = ChooseEnding(ix); other != ix) {
@@ -76,7 +76,7 @@ public:
             mOrder.mMeasures.push_back(static_cast<std::uint32_t>(ix));
             ix = Next(ix);
         }
-        for (TJumpBack& jump : mOrder.mJumpsBack) Measure(jump);
+        for (CJumpBack& jump : mOrder.mJumpsBack) Measure(jump);
         return std::move(mOrder);
     }
 
@@ -88,7 +88,7 @@ private:
             mIsEndingChosen = false;
             return ix;
         }
-        const TEndingGroup& group = mPlan.GroupOf(mPlan.mEndings[at]);
+        const CEndingGroup& group = mPlan.GroupOf(mPlan.mEndings[at]);
         if (group.mFirstEnding != at) return ix;
         const std::size_t chosen = EndingOf(group, mPasses.PassOf(group.mRepeatStart));
         if (chosen == kNoMeasure) return group.mBehind;
@@ -96,7 +96,7 @@ private:
         return mPlan.mEndings[chosen].mFirst;
     }
 
-    [[nodiscard]] std::size_t EndingOf(const TEndingGroup& group, std::int32_t pass) const {
+    [[nodiscard]] std::size_t EndingOf(const CEndingGroup& group, std::int32_t pass) const {
         const std::size_t first = group.mFirstEnding;
         const std::size_t last = first + group.mEndingCount - 1;
         const std::size_t lastOrNone =
@@ -114,7 +114,7 @@ private:
     }
 
     [[nodiscard]] std::size_t Next(std::size_t ix) {
-        const TMeasurePlan& plan = mPlan.mMeasures[ix];
+        const CMeasurePlan& plan = mPlan.mMeasures[ix];
         if (mJump.StopsAtFine() && mMarks[ix].mFine) return mMarks.size();
         if (plan.mRepeatStart != kNoMeasure) {
             if (GoesBackAt(ix, ix)) return GoBack(plan.mRepeatStart);
@@ -130,7 +130,7 @@ private:
 
     // The next measure, or the one behind all endings.
     [[nodiscard]] std::size_t Behind(std::size_t ix) {
-        const TEnding* ending = mPlan.EndingAt(ix);
+        const CEnding* ending = mPlan.EndingAt(ix);
         if (ending == nullptr || ix != ending->mLast) return ix + 1;
         mPasses.Leave();
         return mPlan.GroupOf(*ending).mBehind;
@@ -138,12 +138,12 @@ private:
 
     // Whether this pass goes back at `end`, seen from the measure `ix` in front of it.
     [[nodiscard]] bool GoesBackAt(std::size_t end, std::size_t ix) const {
-        const TMeasurePlan& plan = mPlan.mMeasures[end];
+        const CMeasurePlan& plan = mPlan.mMeasures[end];
         if (mJump.IsPlayingAgain() && !mMarks[end].mRepeatAfterJump) return false;
         const std::int32_t pass = mPasses.PassOf(plan.mRepeatStart);
         if (plan.mEnding == kNoMeasure) return pass < plan.mRepeatTimes;
         std::size_t ending = plan.mEnding;
-        const TEndingGroup& group = mPlan.GroupOf(mPlan.mEndings[ending]);
+        const CEndingGroup& group = mPlan.GroupOf(mPlan.mEndings[ending]);
         if (mPlan.mMeasures[ix].mEnding == kNoMeasure) ending = EndingOf(group, pass);
         if (ending == kNoMeasure || !mPlan.mEndings[ending].mGoesBack) return false;
         const bool isLast = ending + 1 == group.mFirstEnding + group.mEndingCount;
@@ -164,7 +164,7 @@ private:
     }
 
     [[nodiscard]] bool JumpsAt(std::size_t ix) const {
-        const TMeasurePlan& plan = mPlan.mMeasures[ix];
+        const CMeasurePlan& plan = mPlan.mMeasures[ix];
         if (plan.mJumpTarget == kNoMeasure || mHasJumped[ix]) return false;
         const bool isInRepeat = plan.mRepeatEnd != kNoMeasure && plan.mRepeatEnd != ix;
         return !isInRepeat || !GoesBackAt(plan.mRepeatEnd, ix);
@@ -183,7 +183,7 @@ private:
     [[nodiscard]] std::size_t EndOfRepeatAround(std::size_t ix) const {
         const std::size_t repeatEnd = mPlan.mMeasures[ix].mRepeatEnd;
         const std::size_t end = repeatEnd == kNoMeasure ? ix : repeatEnd;
-        const TEnding* ending = mPlan.EndingAt(end);
+        const CEnding* ending = mPlan.EndingAt(end);
         return ending == nullptr ? end : mPlan.GroupOf(*ending).mBehind - 1;
     }
 
@@ -192,7 +192,7 @@ private:
         mOrder.mJumpsBack.push_back({mOrder.mMeasures.size(), mLastPlayed[target]});
     }
 
-    void Measure(TJumpBack& jump) const {
+    void Measure(CJumpBack& jump) const {
         const std::vector<std::uint32_t>& played = mOrder.mMeasures;
         while (jump.mTo + jump.mLength < played.size() && jump.mFrom + jump.mLength < jump.mTo &&
                played[jump.mFrom + jump.mLength] == played[jump.mTo + jump.mLength]) {
@@ -201,9 +201,9 @@ private:
     }
 
     TMarksOfMeasures mMarks;
-    TJumpPlan mPlan;
+    CJumpPlan mPlan;
     std::size_t mMostPlayed;
-    TPlayingOrder mOrder;
+    CPlayingOrder mOrder;
     std::vector<std::size_t> mLastPlayed;  // of each measure, an index into the order
     std::vector<bool> mHasJumped;
     CPasses mPasses;
@@ -213,8 +213,8 @@ private:
 
 }  // namespace
 
-TPlayingOrder PlayInOrder(TMarksOfMeasures marks) {
-    return CPlayer(marks).Play();
+CPlayingOrder PlayInOrder(TMarksOfMeasures marks) {
+    return CScorePlayer(marks).Play();
 }
 
 }  // namespace brindle

@@ -10,7 +10,7 @@
 namespace brindle {
 
 /// A place in the playing order that was reached by a jump back.
-struct TJumpBack {
+struct CJumpBack {
     /// Indexes into the played measures: the copy, and where the same measure was played before.
     std::size_t mTo = 0;
     std::size_t mFrom = 0;
@@ -19,9 +19,9 @@ struct TJumpBack {
 };
 
 /// The measures of a song in the order in which they are played.
-struct TPlayingOrder {
+struct CPlayingOrder {
     std::vector<std::uint32_t> mMeasures;
-    std::vector<TJumpBack> mJumpsBack;
+    std::vector<CJumpBack> mJumpsBack;
     /// Whether the song was cut, see kMaxTimesPlayed.
     bool mWasCut = false;
 };
@@ -29,6 +29,6 @@ struct TPlayingOrder {
 /// Follows repeats, endings and jumps. A jump is made once, at the end of its measure and after the
 /// last pass of a repeat around it. What was played before it is played again without repeats and
 /// with the last endings.
-[[nodiscard]] TPlayingOrder PlayInOrder(TMarksOfMeasures marks);
+[[nodiscard]] CPlayingOrder PlayInOrder(TMarksOfMeasures marks);
 
 }  // namespace brindle

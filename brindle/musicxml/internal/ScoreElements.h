@@ -55,12 +55,12 @@ enum class TScoreElement : std::uint8_t {
     WorkTitle,
 };
 
-struct TScoreElementName {
+struct CScoreElementName {
     std::string_view mName;
     TScoreElement mElement;
 };
 
-inline constexpr auto kScoreElementNames = std::to_array<TScoreElementName>({
+inline constexpr auto kScoreElementNames = std::to_array<CScoreElementName>({
     {"backup", TScoreElement::Backup},
     {"barline", TScoreElement::Barline},
     {"bass", TScoreElement::Bass},
@@ -105,14 +105,14 @@ inline constexpr auto kScoreElementNames = std::to_array<TScoreElementName>({
     {"work-title", TScoreElement::WorkTitle},
 });
 
-constexpr bool IsBefore(const TScoreElementName& a, const TScoreElementName& b) {
+constexpr bool IsBefore(const CScoreElementName& a, const CScoreElementName& b) {
     return a.mName < b.mName;
 }
 static_assert(std::is_sorted(kScoreElementNames.begin(), kScoreElementNames.end(), IsBefore));
 
 [[nodiscard]] constexpr TScoreElement ScoreElementOf(std::string_view name) {
     const auto it = std::lower_bound(kScoreElementNames.begin(), kScoreElementNames.end(),
-                                     TScoreElementName{name, TScoreElement::Other}, IsBefore);
+                                     CScoreElementName{name, TScoreElement::Other}, IsBefore);
     return it != kScoreElementNames.end() && it->mName == name ? it->mElement
                                                                : TScoreElement::Other;
 }

@@ -88,8 +88,8 @@ public:
     [[nodiscard]] bool IsScore() const { return mIsScore; }
     [[nodiscard]] bool WasCut() const { return mAllMeasures > kMaxWrittenMeasures; }
 
-    [[nodiscard]] TWrittenScore Take() {
-        TWrittenScore score;
+    [[nodiscard]] CWrittenScore Take() {
+        CWrittenScore score;
         score.mTitle = mMovementTitle.empty() ? mWorkTitle : mMovementTitle;
         score.mMakers = std::move(mMakers);
         score.mTempo = mTempo;
@@ -149,7 +149,7 @@ private:
     }
 
     // The harmonies, keys and times are those of one part, the marks those of all.
-    void JoinParts(TWrittenScore& score) {
+    void JoinParts(CWrittenScore& score) {
         if (mParts.empty()) return;
         std::size_t chosen = 0;
         while (chosen < mParts.size() && !mParts[chosen].mHasHarmonies) ++chosen;
@@ -161,13 +161,13 @@ private:
         }
     }
 
-    static void Join(const TScorePart& part, TWrittenScore& score) {
+    static void Join(const CScorePart& part, CWrittenScore& score) {
         TScoreMeasures& measures = score.mMeasures;
         if (measures.size() < part.mMeasures.size()) measures.resize(part.mMeasures.size());
         score.mMarks.resize(measures.size());
         for (std::size_t i = 0; i < part.mMeasures.size(); ++i) {
-            const TScoreMeasure& other = part.mMeasures[i];
-            TScoreMeasure& measure = measures[i];
+            const CScoreMeasure& other = part.mMeasures[i];
+            CScoreMeasure& measure = measures[i];
             score.mMarks[i].Add(part.mMarks[i]);
             if (measure.mNumber.empty()) measure.mNumber = other.mNumber;
             if (measure.mRehearsal.empty()) measure.mRehearsal = other.mRehearsal;
@@ -187,9 +187,9 @@ private:
     std::string mMakers;
     std::optional<double> mTempo;
     std::string mNumber;            // of the measure, where a score lists its parts
-    std::deque<TScorePart> mParts;  // a deque, since readers of measures point into it
+    std::deque<CScorePart> mParts;  // a deque, since readers of measures point into it
     std::map<std::string, std::size_t, std::less<>> mPartOfId;
-    TScorePart* mPart = nullptr;
+    CScorePart* mPart = nullptr;
     std::size_t mMeasureCount = 0;  // begun in a score that lists the parts of each measure
     std::size_t mAllMeasures = 0;   // of all parts
     std::optional<CMeasureReader> mReader;
@@ -197,8 +197,8 @@ private:
 
 // The length of a bar that no part fills is that of its time.
 void FillLengths(TScoreMeasures& measures) {
-    std::optional<TScoreTime> time;
-    for (TScoreMeasure& measure : measures) {
+    std::optional<CScoreTime> time;
+    for (CScoreMeasure& measure : measures) {
         if (measure.mTime) time = measure.mTime;
         if (measure.mLength <= 0) measure.mLength = measure.mOtherLength;
         if (measure.mLength <= 0 && time) measure.mLength = time->BarLength();
@@ -207,11 +207,11 @@ void FillLengths(TScoreMeasures& measures) {
 
 }  // namespace
 
-TScoreReading ReadScore(std::string_view bytes) {
+CScoreReading ReadScore(std::string_view bytes) {
     XmlStreamParser parser;
     CScoreReader reader;
     parser.setDelegate(&reader);
-    TScoreReading reading;
+    CScoreReading reading;
     if (!parser.parse(bytes)) {
         reading.mError = parser.parserError();
     } else if (!reader.IsScore()) {

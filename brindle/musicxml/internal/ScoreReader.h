@@ -10,8 +10,8 @@
 namespace brindle {
 
 /// A score as it is written, or why there is none.
-struct TScoreReading {
-    TWrittenScore mScore;
+struct CScoreReading {
+    CWrittenScore mScore;
     std::optional<XmlError> mError;
     /// Whether the score has more measures than can be played.
     bool mWasCut = false;
@@ -19,6 +19,6 @@ struct TScoreReading {
 
 /// Reads a plain MusicXML text in one pass, by parts or by measures. The harmonies are those of the
 /// first part that has any; the marks of all parts are joined.
-[[nodiscard]] TScoreReading ReadScore(std::string_view bytes);
+[[nodiscard]] CScoreReading ReadScore(std::string_view bytes);
 
 }  // namespace brindle

@@ -121,7 +121,7 @@ std::int32_t RepeatTimesOf(const std::vector<std::string>& tokens) {
 
 }  // namespace
 
-void ReadPlayWords(std::string_view words, bool hasCodaSign, TPlayMarks& marks) {
+void ReadPlayWords(std::string_view words, bool hasCodaSign, CPlayMarks& marks) {
     const CPhrases phrases(words);
     const bool isDaCapo = phrases.HasAny({{"d", "c"}, {"da", "capo"}, {"dal", "capo"}});
     const bool isDalSegno = phrases.HasAny({{"d", "s"}, {"dal", "segno"}, {"del", "segno"}});

@@ -7,11 +7,11 @@
 
 namespace brindle {
 
-struct TPlayMarks;
+struct CPlayMarks;
 
 /// Reads what a musician writes in words, "D.C. al Fine", "To Coda", "3x", in any case and
 /// punctuation. `hasCodaSign` tells that the sign of the coda stands beside the words.
-void ReadPlayWords(std::string_view words, bool hasCodaSign, TPlayMarks& marks);
+void ReadPlayWords(std::string_view words, bool hasCodaSign, CPlayMarks& marks);
 
 /// Greatest number of a pass that an ending can be for.
 inline constexpr std::int32_t kHighestEndingNumber = 9999;

@@ -45,7 +45,7 @@ void CSignatureReader::Started(TScoreElement element, const XmlAttributes& attri
 }
 
 void CSignatureReader::Ended(TScoreElement element, TScoreElement parent, std::string_view text) {
-    TScoreMeasure& measure = mPart.mMeasures.back();
+    CScoreMeasure& measure = mPart.mMeasures.back();
     if (element == Key) {
         if (mHasFifths && !mIsOtherStaffKey) measure.mKey = mKey;
     } else if (element == Time) {

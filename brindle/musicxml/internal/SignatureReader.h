@@ -15,7 +15,7 @@ class XmlAttributes;
 class CSignatureReader {
 public:
     /// Reads into the last measure of the part, which is there already.
-    explicit CSignatureReader(TScorePart& part) : mPart(part) {}
+    explicit CSignatureReader(CScorePart& part) : mPart(part) {}
 
     void Started(TScoreElement element, const XmlAttributes& attributes);
     void Ended(TScoreElement element, TScoreElement parent, std::string_view text);
@@ -25,12 +25,12 @@ private:
     void EndedInTime(TScoreElement element, std::string_view text);
     void AddTime(std::int32_t beatType);
 
-    TScorePart& mPart;
-    TScoreTime mTime;
+    CScorePart& mPart;
+    CScoreTime mTime;
     std::int32_t mBeats = 0;
     bool mHasFifths = false;
     bool mIsOtherStaffKey = false;
-    TScoreKey mKey;
+    CScoreKey mKey;
 };
 
 }  // namespace brindle

@@ -21,7 +21,7 @@ constexpr int kNoFifth = 12;
 constexpr int kNoExtension = 5;
 constexpr int kNoOther = 45;
 
-int CostOfMissing(const TNamingType& type, int tone) {
+int CostOfMissing(const CNamingType& type, int tone) {
     if (tone == 0) return kNoRoot;
     if (HasTone(type.mOptional, tone)) return kNoExtension;
     if (tone == type.mThird) return kNoThird;
@@ -37,10 +37,10 @@ int CostInKey(int root, TToneMask tones, const CSignKeyLite& key) {
 
 }  // namespace
 
-int CostOfWindowChord(const TNoteWindow& window, int root, std::size_t type,
+int CostOfWindowChord(const CNoteWindow& window, int root, std::size_t type,
                       const CSignKeyLite& key) {
-    const TNamingType& made = kNamingTypes[type];
-    const TNamingTypeRow& row = kNamingTypeRows[type];
+    const CNamingType& made = kNamingTypes[type];
+    const CNamingTypeRow& row = kNamingTypeRows[type];
     const int bass = FoldIntoOctave(window.mBass - root);
     const int overBass = row.mCostOverBass[static_cast<std::size_t>(bass)];
     int cost = std::min(overBass, row.mCost + kBassAtMost) * 4 / 10;
@@ -58,9 +58,9 @@ int CostOfWindowChord(const TNoteWindow& window, int root, std::size_t type,
            CostInKey(root, made.mTones, key);
 }
 
-std::vector<TWindowChord> LikeliestChords(const TNoteWindow& window, const CSignKeyLite& key,
+std::vector<CWindowChord> LikeliestChords(const CNoteWindow& window, const CSignKeyLite& key,
                                           std::size_t count) {
-    std::vector<TWindowChord> chords;
+    std::vector<CWindowChord> chords;
     chords.reserve(12 * kNamingTypes.size());
     for (int root = 0; root < 12; ++root) {
         for (std::size_t type = 0; type < kNamingTypes.size(); ++type) {
@@ -73,7 +73,7 @@ std::vector<TWindowChord> LikeliestChords(const TNoteWindow& window, const CSign
     return chords;
 }
 
-TNamingCandidate CandidateOf(const TWindowChord& chord, const TNoteWindow& window) {
+CNamingCandidate CandidateOf(const CWindowChord& chord, const CNoteWindow& window) {
     const int rootAboveBass = FoldIntoOctave(chord.mRoot - FoldIntoOctave(window.mBass));
     return {.mCost = chord.mCost,
             .mIsInverted = rootAboveBass != 0,

@@ -28,39 +28,39 @@ inline constexpr TTicks kMostTicks = TTicks{1} << 61;
     return static_cast<double>(ticks) / static_cast<double>(kTicksPerQuarter);
 }
 
-struct TScoreTime {
+struct CScoreTime {
     std::int32_t mBeats = 0;
     std::int32_t mBeatType = 0;
 
     [[nodiscard]] TTicks BarLength() const {
         return mBeatType <= 0 ? 0 : 4 * kTicksPerQuarter / mBeatType * mBeats;
     }
-    friend bool operator==(const TScoreTime&, const TScoreTime&) = default;
+    friend bool operator==(const CScoreTime&, const CScoreTime&) = default;
 };
 
-struct TScoreKey {
+struct CScoreKey {
     /// Number of sharps, negative for flats.
     std::int32_t mFifths = 0;
     /// Undefined where the score does not tell a mode, or tells neither major nor minor.
     TSignKeyType mType = TSignKeyType_Undef;
 
-    friend bool operator==(const TScoreKey&, const TScoreKey&) = default;
+    friend bool operator==(const CScoreKey&, const CScoreKey&) = default;
 };
 
-struct TWrittenHarmony {
+struct CWrittenHarmony {
     /// From the start of its measure; negative for one that is drawn forward out of it.
     TTicks mOffset = 0;
     TMusicXMLHarmony mHarmony;
 };
 
-struct TScoreMeasure {
-    std::vector<TWrittenHarmony> mHarmonies;
+struct CScoreMeasure {
+    std::vector<CWrittenHarmony> mHarmonies;
     /// What its notes and rests fill; 0 for an empty measure.
     TTicks mLength = 0;
     /// What the notes of other parts fill.
     TTicks mOtherLength = 0;
-    std::optional<TScoreTime> mTime;
-    std::optional<TScoreKey> mKey;
+    std::optional<CScoreTime> mTime;
+    std::optional<CScoreKey> mKey;
     /// As printed.
     std::string mNumber;
     std::string mRehearsal;
@@ -68,13 +68,13 @@ struct TScoreMeasure {
     bool mHasSlash = false;
 };
 
-using TScoreMeasures = std::vector<TScoreMeasure>;
+using TScoreMeasures = std::vector<CScoreMeasure>;
 
 /// One part of a score, while it is read.
-struct TScorePart {
+struct CScorePart {
     TScoreMeasures mMeasures;
     /// Of each measure.
-    std::vector<TPlayMarks> mMarks;
+    std::vector<CPlayMarks> mMarks;
     /// Units of duration in a quarter note; 0 until the score tells it.
     double mDivisions = 0.0;
     bool mHasHarmonies = false;
@@ -82,7 +82,7 @@ struct TScorePart {
     bool mRepeatBeginsNext = false;
 };
 
-struct TWrittenScore {
+struct CWrittenScore {
     std::string mTitle;
     /// Composers and writers, separated by ", ".
     std::string mMakers;
@@ -90,7 +90,7 @@ struct TWrittenScore {
     std::optional<double> mTempo;
     TScoreMeasures mMeasures;
     /// Of each measure.
-    std::vector<TPlayMarks> mMarks;
+    std::vector<CPlayMarks> mMarks;
 };
 
 }  // namespace brindle

@@ -9,12 +9,12 @@
 namespace brindle {
 
 /// The words for a net's types: in its report, and in its source and property forms.
-struct TNetTypeWords {
+struct CNetTypeWords {
     std::string_view mReport;
     std::string_view mSource;
 };
 
-inline constexpr std::array<TNetTypeWords, 5> kInputTypeWords = {{
+inline constexpr std::array<CNetTypeWords, 5> kInputTypeWords = {{
     {"Sum", "INPUT_SUM"},
     {"Minimum", "INPUT_MIN"},
     {"Maximum", "INPUT_MAX"},
@@ -22,14 +22,14 @@ inline constexpr std::array<TNetTypeWords, 5> kInputTypeWords = {{
     {"Product", "INPUT_PROD"},
 }};
 
-inline constexpr std::array<TNetTypeWords, 4> kActTypeWords = {{
+inline constexpr std::array<CNetTypeWords, 4> kActTypeWords = {{
     {"Sigmoid", "ACT_SIGM"},
     {"Linear", "ACT_LIN"},
     {"Tanhyp", "ACT_TANHYP"},
     {"Ident. Projection", "ACT_IDENT"},
 }};
 
-inline constexpr std::array<TNetTypeWords, 2> kOutputTypeWords = {{
+inline constexpr std::array<CNetTypeWords, 2> kOutputTypeWords = {{
     {"None", "OUTPUT_NONE"},
     {"Binary", "OUTPUT_BIN"},
 }};

@@ -37,19 +37,19 @@ std::string CChordsAround::Symbol(std::ptrdiff_t ix) const {
     return mSong->mSymbols[static_cast<std::size_t>(ix)];
 }
 
-const TKeyChord* CChordsAround::ChordAt(std::ptrdiff_t ix) const {
+const CKeyChord* CChordsAround::ChordAt(std::ptrdiff_t ix) const {
     if (ix < 0 || static_cast<std::size_t>(ix) >= mNumbers.size()) return nullptr;
     const std::ptrdiff_t number = mNumbers[static_cast<std::size_t>(ix)];
     return number < 0 ? nullptr : &mChords[static_cast<std::size_t>(number)];
 }
 
 int CChordsAround::Root(std::ptrdiff_t ix) const {
-    const TKeyChord* chord = ChordAt(ix);
+    const CKeyChord* chord = ChordAt(ix);
     return chord == nullptr ? kKeyNrUndef : chord->mRoot;
 }
 
 int CChordsAround::Bass(std::ptrdiff_t ix) const {
-    const TKeyChord* chord = ChordAt(ix);
+    const CKeyChord* chord = ChordAt(ix);
     return chord == nullptr ? kKeyNrUndef : chord->mBass;
 }
 

@@ -38,11 +38,11 @@ public:
 
 private:
     [[nodiscard]] std::ptrdiff_t Beside(std::size_t ix, std::ptrdiff_t step) const;
-    [[nodiscard]] const TKeyChord* ChordAt(std::ptrdiff_t ix) const;
+    [[nodiscard]] const CKeyChord* ChordAt(std::ptrdiff_t ix) const;
 
     const CSong* mSong;
     const CSongReading* mReading;
-    std::vector<TKeyChord> mChords;
+    std::vector<CKeyChord> mChords;
     // Of each place of the song the number in mChords; kNoneAround before the first.
     std::vector<std::ptrdiff_t> mNumbers;
 };

@@ -18,7 +18,7 @@ constexpr std::string_view kGap = "  ";
 constexpr std::string_view kHold = ".";
 
 /// A chord with what stands over and under it.
-struct TCell {
+struct CCell {
     std::string mKey;
     std::string mSymbol;
     std::string mNumeral;
@@ -28,16 +28,16 @@ struct TCell {
             {CountCharacters(mKey), CountCharacters(mSymbol), CountCharacters(mNumeral)});
     }
 };
-using TBarCells = std::vector<TCell>;
+using TBarCells = std::vector<CCell>;
 
 std::size_t WidthOf(const TBarCells& bar) {
     std::size_t width = bar.empty() ? 0 : kGap.size() * (bar.size() - 1);
-    for (const TCell& cell : bar) width += cell.Width();
+    for (const CCell& cell : bar) width += cell.Width();
     return width;
 }
 
 /// The bars [mBegin, mEnd) that stand on one line, and the name of the part that begins there.
-struct TLine {
+struct CReadingLine {
     std::size_t mBegin = 0;
     std::size_t mEnd = 0;
     std::string mName;
@@ -62,7 +62,7 @@ public:
             if (LineWidth() <= mLines.mWidth) break;
         }
         std::string text;
-        for (const TLine& line : mBroken) WriteLine(line, text);
+        for (const CReadingLine& line : mBroken) WriteLine(line, text);
         return text;
     }
 
@@ -126,7 +126,7 @@ private:
             mBroken.back().mEnd = bar + 1;
         }
         mWidths.assign(barsPerLine, 0);
-        for (const TLine& line : mBroken) {
+        for (const CReadingLine& line : mBroken) {
             for (std::size_t bar = line.mBegin; bar < line.mEnd; ++bar) {
                 std::size_t& width = mWidths[bar - line.mBegin];
                 width = std::max(width, WidthOf(mCells[bar]));
@@ -141,7 +141,7 @@ private:
         return width;
     }
 
-    void WriteLine(const TLine& line, std::string& text) const {
+    void WriteLine(const CReadingLine& line, std::string& text) const {
         if (line.mBegin > 0) text += '\n';
         if (!line.mName.empty()) text += mPaint.Strong(line.mName) + '\n';
         WriteKeys(line, text);
@@ -149,19 +149,19 @@ private:
             PadLeft(fmt::format("{}", mLines.mBars[line.mBegin].mNumber), mLabelWidth);
         text += mPaint.Faint(label + " |");
         for (std::size_t bar = line.mBegin; bar < line.mEnd; ++bar) {
-            text += ' ' + mPaint.Strong(Row(line, bar, &TCell::mSymbol)) + mPaint.Faint(" |");
+            text += ' ' + mPaint.Strong(Row(line, bar, &CCell::mSymbol)) + mPaint.Faint(" |");
         }
         text += '\n' + mPaint.Faint(std::string(mLabelWidth, ' ') + " |");
         for (std::size_t bar = line.mBegin; bar < line.mEnd; ++bar) {
-            text += ' ' + Row(line, bar, &TCell::mNumeral) + mPaint.Faint(" |");
+            text += ' ' + Row(line, bar, &CCell::mNumeral) + mPaint.Faint(" |");
         }
         text += '\n';
     }
 
-    void WriteKeys(const TLine& line, std::string& text) const {
+    void WriteKeys(const CReadingLine& line, std::string& text) const {
         std::string keys(mLabelWidth + 2, ' ');
         for (std::size_t bar = line.mBegin; bar < line.mEnd; ++bar) {
-            keys += ' ' + Row(line, bar, &TCell::mKey) + kGap.data();
+            keys += ' ' + Row(line, bar, &CCell::mKey) + kGap.data();
         }
         const std::size_t last = keys.find_last_not_of(' ');
         if (last == keys.npos) return;
@@ -169,10 +169,10 @@ private:
     }
 
     // One of the three texts of all chords of a bar.
-    [[nodiscard]] std::string Row(const TLine& line, std::size_t bar,
-                                  std::string TCell::*part) const {
+    [[nodiscard]] std::string Row(const CReadingLine& line, std::size_t bar,
+                                  std::string CCell::*part) const {
         std::string row;
-        for (const TCell& cell : mCells[bar]) {
+        for (const CCell& cell : mCells[bar]) {
             if (!row.empty()) row += kGap;
             row += PadRight(cell.*part, cell.Width());
         }
@@ -186,7 +186,7 @@ private:
     CBars mBars;
     std::vector<std::string> mKeys;
     std::vector<TBarCells> mCells;
-    std::vector<TLine> mBroken;
+    std::vector<CReadingLine> mBroken;
     std::vector<std::size_t> mWidths;
     std::size_t mLabelWidth = 1;
 };

@@ -20,7 +20,7 @@ constexpr std::size_t kMostPlaces = 6;
 constexpr std::size_t kShortestChain = 3;
 
 /// What was noted, and all its places.
-struct TNote {
+struct CTakenNote {
     std::string mText;
     std::vector<CTimeRange> mPlaces;
 };
@@ -47,7 +47,7 @@ public:
     CNoteTaker(const CSong& song, const CSongReading& reading)
         : mSong(song), mReading(reading), mAround(song, reading) {}
 
-    [[nodiscard]] std::vector<TNote> TakeNotes() {
+    [[nodiscard]] std::vector<CTakenNote> TakeNotes() {
         for (std::size_t ix = 0; ix < mReading.mChords.size(); ++ix) {
             if (!mAround.HasChord(ix) || mAround.IsRepeated(ix)) continue;
             NoteSecond(ix);
@@ -161,7 +161,7 @@ private:
     const CSong& mSong;
     const CSongReading& mReading;
     CChordsAround mAround;
-    std::vector<TNote> mNotes;
+    std::vector<CTakenNote> mNotes;
     std::map<std::string, std::size_t> mNumbers;
     std::size_t mChainEnd = 0;
 };
@@ -175,7 +175,7 @@ bool SoundsAlike(const CSignKeyLite& a, const CSignKeyLite& b) {
 std::vector<std::string> ReadingNotes(const CSong& song, const CSongReading& reading,
                                       const CBars& bars) {
     std::vector<std::string> lines;
-    for (const TNote& note : CNoteTaker(song, reading).TakeNotes()) {
+    for (const CTakenNote& note : CNoteTaker(song, reading).TakeNotes()) {
         lines.push_back(PlacesText(note.mPlaces, bars) + ": " + note.mText);
     }
     return lines;

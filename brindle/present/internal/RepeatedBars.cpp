@@ -90,17 +90,17 @@ std::vector<TPlace> LongestEarlier(const CSuffixes& suffixes) {
 }
 
 /// A passage that repeats an earlier one.
-struct TPassage {
+struct CRepeatedPassage {
     TPlace mPlace = 0;
     TPlace mCount = 0;
 
     /// The longest comes first, of those the earliest.
-    friend bool operator<(const TPassage& a, const TPassage& b) {
+    friend bool operator<(const CRepeatedPassage& a, const CRepeatedPassage& b) {
         return a.mCount != b.mCount ? a.mCount < b.mCount : a.mPlace > b.mPlace;
     }
 };
 
-bool AreAllEqual(const std::vector<TPlace>& numbers, const TPassage& passage) {
+bool AreAllEqual(const std::vector<TPlace>& numbers, const CRepeatedPassage& passage) {
     const auto first = numbers.begin() + static_cast<std::ptrdiff_t>(passage.mPlace);
     return std::all_of(first, first + static_cast<std::ptrdiff_t>(passage.mCount),
                        [&](TPlace number) { return number == *first; });
@@ -109,13 +109,13 @@ bool AreAllEqual(const std::vector<TPlace>& numbers, const TPassage& passage) {
 /// The longest passages that do not overlap, by place. What a longer one leaves of a passage is
 /// tried again; each place is in the queue once at a time.
 std::map<TPlace, TPlace> LongestPassages(const std::vector<TPlace>& longest, TPlace shortest) {
-    std::priority_queue<TPassage> queue;
+    std::priority_queue<CRepeatedPassage> queue;
     for (TPlace place = 0; place < longest.size(); ++place) {
         if (longest[place] >= shortest) queue.push({place, longest[place]});
     }
     std::map<TPlace, TPlace> taken;
     while (!queue.empty()) {
-        TPassage passage = queue.top();
+        CRepeatedPassage passage = queue.top();
         queue.pop();
         const auto behind = taken.upper_bound(passage.mPlace);
         const bool isCovered =

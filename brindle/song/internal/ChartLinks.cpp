@@ -23,14 +23,14 @@ constexpr std::string_view kMarkOfChart = "1r34LbKcu7";
 constexpr std::size_t kPlainFields = 6;
 constexpr std::size_t kBlock = 50;
 
-struct TShortForm {
+struct CShortForm {
     std::string_view mShort;
     std::string_view mMeant;
 };
 
 constexpr auto kShortForms =
-    std::to_array<TShortForm>({{"XyQ", "   "}, {"LZ", " |"}, {"Kcl", "| x"}});
-constexpr auto kEntities = std::to_array<TShortForm>({{"&quot;", "\""},
+    std::to_array<CShortForm>({{"XyQ", "   "}, {"LZ", " |"}, {"Kcl", "| x"}});
+constexpr auto kEntities = std::to_array<CShortForm>({{"&quot;", "\""},
                                                       {"&#39;", "'"},
                                                       {"&apos;", "'"},
                                                       {"&lt;", "<"},
@@ -39,10 +39,10 @@ constexpr auto kEntities = std::to_array<TShortForm>({{"&quot;", "\""},
 
 /// In one pass from left to right; the first form that fits counts.
 template <std::size_t N>
-std::string Replaced(std::string_view text, const std::array<TShortForm, N>& forms) {
+std::string Replaced(std::string_view text, const std::array<CShortForm, N>& forms) {
     std::string replaced;
     while (!text.empty()) {
-        const auto form = std::find_if(forms.begin(), forms.end(), [&](const TShortForm& f) {
+        const auto form = std::find_if(forms.begin(), forms.end(), [&](const CShortForm& f) {
             return text.starts_with(f.mShort);
         });
         const bool isForm = form != forms.end();
@@ -85,7 +85,7 @@ std::vector<std::string_view> Split(std::string_view text, std::string_view sepa
 }
 
 /// What stands between the composer and the chart: style, key, and numbers.
-void TakeStyleAndKey(std::string_view field, TChart& chart) {
+void TakeStyleAndKey(std::string_view field, CPackedChart& chart) {
     if (field.empty()) return;
     if (chart.mStyle.empty()) {
         chart.mStyle = field;
@@ -95,12 +95,12 @@ void TakeStyleAndKey(std::string_view field, TChart& chart) {
 }
 
 /// Without a mark of a chart there is none.
-TChart ScrambledChart(std::string_view song) {
+CPackedChart ScrambledChart(std::string_view song) {
     const std::vector<std::string_view> fields = Split(song, "=");
     const auto mark = std::find_if(fields.begin(), fields.end(), [](std::string_view field) {
         return field.starts_with(kMarkOfChart);
     });
-    TChart chart;
+    CPackedChart chart;
     chart.mTitle = Trimmed(fields[0]);
     if (mark == fields.end()) return chart;
     const auto index = static_cast<std::size_t>(mark - fields.begin());
@@ -112,26 +112,26 @@ TChart ScrambledChart(std::string_view song) {
     return chart;
 }
 
-std::vector<TChart> ScrambledCharts(std::string_view link) {
-    std::vector<TChart> charts;
+std::vector<CPackedChart> ScrambledCharts(std::string_view link) {
+    std::vector<CPackedChart> charts;
     std::string listName;
     for (const std::string_view song : Split(link, "===")) {
-        TChart chart = ScrambledChart(song);
+        CPackedChart chart = ScrambledChart(song);
         if (!chart.mChart.empty()) {
             charts.push_back(std::move(chart));
         } else {
             listName = chart.mTitle;
         }
     }
-    for (TChart& chart : charts) chart.mListName = listName;
+    for (CPackedChart& chart : charts) chart.mListName = listName;
     return charts;
 }
 
-std::vector<TChart> PlainCharts(std::string_view link) {
+std::vector<CPackedChart> PlainCharts(std::string_view link) {
     const std::vector<std::string_view> fields = Split(link, "=");
-    std::vector<TChart> charts;
+    std::vector<CPackedChart> charts;
     for (std::size_t i = 0; i + kPlainFields <= fields.size(); i += kPlainFields) {
-        TChart& chart = charts.emplace_back();
+        CPackedChart& chart = charts.emplace_back();
         chart.mTitle = Trimmed(fields[i]);
         chart.mMakers = Trimmed(fields[i + 1]);
         chart.mStyle = Trimmed(fields[i + 2]);
@@ -139,7 +139,7 @@ std::vector<TChart> PlainCharts(std::string_view link) {
         chart.mChart = fields[i + 5];
     }
     const bool hasName = fields.size() % kPlainFields == 1;
-    for (TChart& chart : charts) chart.mListName = hasName ? Trimmed(fields.back()) : "";
+    for (CPackedChart& chart : charts) chart.mListName = hasName ? Trimmed(fields.back()) : "";
     return charts;
 }
 
@@ -166,9 +166,9 @@ bool BeginsWithLink(std::string_view text) {
     return begin.starts_with(kScrambledLink) || begin.starts_with(kPlainLink);
 }
 
-std::vector<TChart> FindCharts(std::string_view text) {
+std::vector<CPackedChart> FindCharts(std::string_view text) {
     const std::string lower = Lower(text);
-    std::vector<TChart> charts;
+    std::vector<CPackedChart> charts;
     for (std::size_t begin = lower.find("ireal"); begin != lower.npos;
          begin = lower.find("ireal", begin + 1)) {
         const std::string_view rest = std::string_view(lower).substr(begin);
@@ -177,7 +177,7 @@ std::vector<TChart> FindCharts(std::string_view text) {
         const std::size_t from = begin + (isScrambled ? kScrambledLink : kPlainLink).size();
         const std::size_t end = std::min(text.find_first_of("\"'<>\r\n", from), text.size());
         const std::string link = Unescaped(Replaced(text.substr(from, end - from), kEntities));
-        for (TChart& chart : isScrambled ? ScrambledCharts(link) : PlainCharts(link)) {
+        for (CPackedChart& chart : isScrambled ? ScrambledCharts(link) : PlainCharts(link)) {
             chart.mOffset = begin;
             charts.push_back(std::move(chart));
         }

@@ -15,7 +15,7 @@
 namespace brindle::ChartLinks {
 
 /// One chart of a link, not scrambled.
-struct TChart {
+struct CPackedChart {
     std::string mTitle;
     std::string mMakers;
     std::string mStyle;
@@ -32,7 +32,7 @@ struct TChart {
 [[nodiscard]] bool BeginsWithLink(std::string_view text);
 
 /// The charts of all links in a text or a page, in their order.
-[[nodiscard]] std::vector<TChart> FindCharts(std::string_view text);
+[[nodiscard]] std::vector<CPackedChart> FindCharts(std::string_view text);
 
 /// Undoes the scrambling, which is its own opposite.
 [[nodiscard]] std::string Unscrambled(std::string_view chart);

@@ -10,12 +10,12 @@
 namespace brindle::SongText {
 namespace {
 
-struct TTimeRow {
+struct CTimeRow {
     std::string_view mText;
     CSongTime mTime;
 };
 
-constexpr auto kTimeRows = std::to_array<TTimeRow>({
+constexpr auto kTimeRows = std::to_array<CTimeRow>({
     {"T22", {2, 2}},
     {"T32", {3, 2}},
     {"T24", {2, 4}},
@@ -131,7 +131,7 @@ private:
     bool TakeTime() {
         const auto* const row =
             std::find_if(kTimeRows.begin(), kTimeRows.end(),
-                         [&](const TTimeRow& r) { return mRest.starts_with(r.mText); });
+                         [&](const CTimeRow& r) { return mRest.starts_with(r.mText); });
         if (row == kTimeRows.end()) return false;
         mList.Add(TTokenKind::Time, Take(row->mText.size())).mTime = row->mTime;
         return true;

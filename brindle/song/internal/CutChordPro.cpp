@@ -33,14 +33,14 @@ enum class TDirective {
     Nothing,
 };
 
-struct TDirectiveRow {
+struct CDirectiveRow {
     std::string_view mName;
     TDirective mDirective;
     /// The name of a section that has none of its own.
     std::string_view mSection = {};
 };
 
-constexpr auto kDirectiveRows = std::to_array<TDirectiveRow>({
+constexpr auto kDirectiveRows = std::to_array<CDirectiveRow>({
     {"title", TDirective::Title},
     {"t", TDirective::Title},
     {"subtitle", TDirective::Remark},
@@ -124,7 +124,7 @@ private:
     void Obey(std::string_view name, std::string_view value, std::string_view directive) {
         const auto* const row =
             std::find_if(kDirectiveRows.begin(), kDirectiveRows.end(),
-                         [&](const TDirectiveRow& r) { return r.mName == name; });
+                         [&](const CDirectiveRow& r) { return r.mName == name; });
         if (row != kDirectiveRows.end()) {
             Obey(*row, value);
         } else if (name.starts_with("start_of_")) {
@@ -133,7 +133,7 @@ private:
         }
     }
 
-    void Obey(const TDirectiveRow& row, std::string_view value) {
+    void Obey(const CDirectiveRow& row, std::string_view value) {
         CSong& song = mList.Song();
         switch (row.mDirective) {
             case TDirective::Title:
@@ -168,7 +168,7 @@ private:
     }
 
     /// What concerns the passages of the song.
-    void ObeyInTime(const TDirectiveRow& row, std::string_view value) {
+    void ObeyInTime(const CDirectiveRow& row, std::string_view value) {
         switch (row.mDirective) {
             case TDirective::BeginChorus:
                 mChorusBegin = mList.mTokens.size();
@@ -196,7 +196,7 @@ private:
         }
     }
 
-    static std::string_view NameOfRemark(const TDirectiveRow& row) {
+    static std::string_view NameOfRemark(const CDirectiveRow& row) {
         return row.mName == "st" ? "subtitle" : row.mName;
     }
 
@@ -213,7 +213,7 @@ private:
         if (name.empty() || name == "meta") return;
         const auto* const row =
             std::find_if(kDirectiveRows.begin(), kDirectiveRows.end(),
-                         [&](const TDirectiveRow& r) { return r.mName == name; });
+                         [&](const CDirectiveRow& r) { return r.mName == name; });
         if (row != kDirectiveRows.end()) return Obey(*row, value);
         mList.Song().mRemarks.push_back({name, std::string(value)});
     }

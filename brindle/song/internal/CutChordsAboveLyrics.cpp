@@ -35,7 +35,7 @@ public:
 
     void Cut() {
         TakeHead();
-        for (const TSheetLine& line : mLines) {
+        for (const CTextLine& line : mLines) {
             if (mList.IsGivenUp()) return;
             if (line.mKind == TLineKind::Field) TakeField(line.mText);
             if (line.mKind == TLineKind::Section) {
@@ -49,8 +49,8 @@ private:
     /// The first lines are the title and the maker if a blank line parts them from the song.
     void TakeHead() {
         CSong& song = mList.Song();
-        const auto isWord = [](const TSheetLine& line) { return line.mKind == TLineKind::Lyrics; };
-        auto begin = std::find_if(mLines.begin(), mLines.end(), [](const TSheetLine& line) {
+        const auto isWord = [](const CTextLine& line) { return line.mKind == TLineKind::Lyrics; };
+        auto begin = std::find_if(mLines.begin(), mLines.end(), [](const CTextLine& line) {
             return line.mKind != TLineKind::Blank;
         });
         const auto end = std::find_if_not(begin, mLines.end(), isWord);
@@ -117,7 +117,7 @@ private:
     }
 
     CTokenList& mList;
-    std::vector<TSheetLine> mLines;
+    std::vector<CTextLine> mLines;
 };
 
 }  // namespace

@@ -117,7 +117,7 @@ bool CouldBeLyrics(std::string_view line) {
 }
 
 /// "A" behind a line of chords, with no lyrics of its own, is a line of lyrics.
-void ResolveByNeighbours(std::vector<TSheetLine>& lines) {
+void ResolveByNeighbours(std::vector<CTextLine>& lines) {
     for (std::size_t i = 1; i < lines.size(); ++i) {
         if (lines[i].mKind != TLineKind::Chords || !CouldBeLyrics(lines[i].mText)) continue;
         const bool isBehindChords = lines[i - 1].mKind == TLineKind::Chords;
@@ -138,8 +138,8 @@ std::string_view NameOfSection(std::string_view line) {
     return line.find_first_of(":|[]{}") == line.npos ? Trimmed(line) : std::string_view();
 }
 
-std::vector<TSheetLine> LinesOf(std::string_view text) {
-    std::vector<TSheetLine> lines;
+std::vector<CTextLine> LinesOf(std::string_view text) {
+    std::vector<CTextLine> lines;
     while (!text.empty()) {
         const std::string_view line = Trimmed(TakeLine(text));
         lines.push_back({line, KindOf(line)});

@@ -20,14 +20,14 @@ enum class TLineKind : std::uint8_t {
     Lyrics,
 };
 
-struct TSheetLine {
+struct CTextLine {
     /// Without white space around it.
     std::string_view mText;
     TLineKind mKind = TLineKind::Blank;
 };
 
 /// The lines of a text. Lines such as "A" and "Go" are told from their neighbours.
-[[nodiscard]] std::vector<TSheetLine> LinesOf(std::string_view text);
+[[nodiscard]] std::vector<CTextLine> LinesOf(std::string_view text);
 
 /// `Verse 1` of `[Verse 1]` and of `Verse 1:`.
 [[nodiscard]] std::string_view NameOfSection(std::string_view line);

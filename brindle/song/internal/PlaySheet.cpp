@@ -31,7 +31,7 @@ public:
 
     void Play() {
         if (mList.IsGivenUp()) return;
-        const TPlayingOrder order = PlayInOrder(mWritten.mMarks);
+        const CPlayingOrder order = PlayInOrder(mWritten.mMarks);
         for (const std::uint32_t bar : order.mMeasures) {
             mStarts.push_back(mPosition);
             if (!PlayBar(mWritten.mBars[bar])) break;
@@ -46,19 +46,19 @@ public:
 private:
     /// Of a song without chords.
     void TellKeys() {
-        for (const TToken& token : mList.mTokens) {
+        for (const CToken& token : mList.mTokens) {
             if (token.mKind == TTokenKind::Key) AppendStatedKey(token.mText, 0.0, mSong);
         }
     }
 
-    void AppendRepeats(const TPlayingOrder& order) {
-        for (const TJumpBack& jump : order.mJumpsBack) {
+    void AppendRepeats(const CPlayingOrder& order) {
+        for (const CJumpBack& jump : order.mJumpsBack) {
             if (jump.mTo >= mStarts.size()) return;
             mSong.mRepeats.push_back({mStarts[jump.mTo], mStarts[jump.mFrom], jump.mLength});
         }
     }
 
-    [[nodiscard]] double BeatsOf(const TSheetBar& bar) const {
+    [[nodiscard]] double BeatsOf(const CWrittenBar& bar) const {
         return bar.mTime.IsUndef() ? mPrefs.mBeatsPerBar : bar.mTime.mNumerator;
     }
 
@@ -67,14 +67,14 @@ private:
                                mWritten.mBars[bar].mTime});
     }
 
-    bool PlayBar(const TSheetBar& bar) {
+    bool PlayBar(const CWrittenBar& bar) {
         const double begin = mPosition;
         const std::ptrdiff_t chords = mIsEven ? ChordsThatShare(bar) : 0;
         const double step =
             chords > 0 ? BeatsOf(bar) / static_cast<double>(chords) : mPrefs.mBeatsPerChord;
         int steps = 0;
         for (std::size_t i = bar.mBegin; i < bar.mEnd; ++i) {
-            const TToken& token = mList.mTokens[i];
+            const CToken& token = mList.mTokens[i];
             if (!PlayToken(token, bar.mIsCopy)) return false;
             const int count = StepsOf(token);
             steps += count;
@@ -89,19 +89,19 @@ private:
         return mPosition < kPosEnd || GiveUp("the song is too long");
     }
 
-    static int StepsOf(const TToken& token) {
+    static int StepsOf(const CToken& token) {
         if (token.mKind == TTokenKind::Hold) return token.mCount;
         return token.mKind == TTokenKind::Chord || token.mKind == TTokenKind::RepeatBars ? 1 : 0;
     }
 
     /// A bar line moves on to the next multiple of the bar.
-    void CloseBar(const TSheetBar& bar, double begin) {
+    void CloseBar(const CWrittenBar& bar, double begin) {
         const double beats = BeatsOf(bar);
         const double from = bar.mTime.IsUndef() ? 0.0 : begin;
         mPosition = from + std::ceil((mPosition - from) / beats) * beats;
     }
 
-    bool PlayToken(const TToken& token, bool isCopy) {
+    bool PlayToken(const CToken& token, bool isCopy) {
         if (token.mKind == TTokenKind::Section && !isCopy) {
             mSong.mSections.push_back({std::string(token.mText), mPosition});
         } else if (token.mKind == TTokenKind::Key && !isCopy) {
@@ -117,15 +117,15 @@ private:
     }
 
     /// The chords that share a bar evenly; 0 for a bar with holds.
-    [[nodiscard]] std::ptrdiff_t ChordsThatShare(const TSheetBar& bar) const {
+    [[nodiscard]] std::ptrdiff_t ChordsThatShare(const CWrittenBar& bar) const {
         const auto begin = mList.mTokens.begin() + static_cast<std::ptrdiff_t>(bar.mBegin);
         const auto end = mList.mTokens.begin() + static_cast<std::ptrdiff_t>(bar.mEnd);
-        const bool hasHolds = std::any_of(begin, end, [](const TToken& token) {
+        const bool hasHolds = std::any_of(begin, end, [](const CToken& token) {
             return token.mKind == TTokenKind::Hold || token.mKind == TTokenKind::RepeatBars;
         });
         if (hasHolds) return 0;
         return std::count_if(begin, end,
-                             [](const TToken& token) { return token.mKind == TTokenKind::Chord; });
+                             [](const CToken& token) { return token.mKind == TTokenKind::Chord; });
     }
 
     bool GiveUp(const char* reason) {
@@ -134,11 +134,11 @@ private:
     }
 
     CTokenList& mList;
-    const CSongPrefs& mPrefs;
+    const CSongOptions& mPrefs;
     CSong& mSong;
     bool mHasBarLines;
     bool mIsEven;
-    TSheetBars mWritten;
+    CSheetBars mWritten;
     std::size_t mBudget;
     std::vector<double> mStarts;  // of each bar that was played
     double mPosition = 0.0;

@@ -97,7 +97,7 @@ std::size_t LengthOfCodaSign(std::string_view text) {
     return text.starts_with(kCodaSign) ? kCodaSign.size() : 0;
 }
 
-void ReadPlayWordsOfText(std::string_view words, TPlayMarks& marks) {
+void ReadPlayWordsOfText(std::string_view words, CPlayMarks& marks) {
     if (words == kSegnoSign || words == "S") return marks.mSegno.Set();
     ReadPlayWords(words, false, marks);
 }

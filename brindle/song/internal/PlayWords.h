@@ -5,7 +5,7 @@
 #include <string_view>
 
 namespace brindle {
-struct TPlayMarks;
+struct CPlayMarks;
 }
 
 /// Words and signs in a text that steer its playing.
@@ -19,6 +19,6 @@ namespace brindle::SongText {
 [[nodiscard]] std::size_t LengthOfCodaSign(std::string_view text);
 
 /// What such words say; `S` is the sign of the segno in charts.
-void ReadPlayWordsOfText(std::string_view words, TPlayMarks& marks);
+void ReadPlayWordsOfText(std::string_view words, CPlayMarks& marks);
 
 }  // namespace brindle::SongText

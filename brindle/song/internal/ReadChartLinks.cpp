@@ -35,7 +35,8 @@ private:
     std::size_t mColumn = 1;
 };
 
-CSong ReadChart(const ChartLinks::TChart& chart, TSongFormat format, const CSongPrefs& prefs) {
+CSong ReadChart(const ChartLinks::CPackedChart& chart, TSongFormat format,
+                const CSongOptions& prefs) {
     CSong song = ReadSheet(chart.mChart, TSongFormat_Chart, prefs);
     song.mFormat = format;
     song.mTitle = chart.mTitle;
@@ -50,10 +51,10 @@ CSong ReadChart(const ChartLinks::TChart& chart, TSongFormat format, const CSong
 }  // namespace
 
 std::vector<CSong> ReadChartLinks(std::string_view text, TSongFormat format,
-                                  const CSongPrefs& prefs) {
+                                  const CSongOptions& prefs) {
     std::vector<CSong> songs;
     CPlaces places(text);
-    for (const ChartLinks::TChart& chart : ChartLinks::FindCharts(text)) {
+    for (const ChartLinks::CPackedChart& chart : ChartLinks::FindCharts(text)) {
         places.GoTo(chart.mOffset);
         CSong& song = songs.emplace_back(ReadChart(chart, format, prefs));
         // The text of a link is packed: a fault stands where the link does.

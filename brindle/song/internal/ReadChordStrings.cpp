@@ -78,7 +78,7 @@ private:
 
 }  // namespace
 
-CSong ReadChordStrings(std::string_view text, const CSongPrefs& prefs) {
+CSong ReadChordStrings(std::string_view text, const CSongOptions& prefs) {
     CSong song;
     song.mFormat = TSongFormat_ChordStrings;
     song.mBeatsPerBar = prefs.mBeatsPerBar;

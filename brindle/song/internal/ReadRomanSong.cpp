@@ -54,7 +54,7 @@ void AppendFaults(const CRomanTextReading& reading, CSong& song) {
 
 }  // namespace
 
-CSong ReadRomanSong(std::string_view text, const CSongPrefs& prefs) {
+CSong ReadRomanSong(std::string_view text, const CSongOptions& prefs) {
     const CRomanTextReading reading = ReadRomanText(text);
     CSong song;
     song.mFormat = TSongFormat_RomanText;

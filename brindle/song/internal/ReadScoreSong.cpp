@@ -33,7 +33,7 @@ double BeatsPerBarOf(const CSong& song) {
     return length >= 1.0 / 64 && length <= 1024.0 ? length : kUsual;
 }
 
-void AppendChords(const TPlayedScore& score, CSong& song) {
+void AppendChords(const CPlayedScore& score, CSong& song) {
     for (const TMusicXMLHarmony& harmony : score.mDoc.Harmonies) {
         song.mChords.emplace_back(ChordOfHarmony(harmony), harmony.mPosition);
         song.mSymbols.push_back(HarmonySymbol(harmony));
@@ -44,12 +44,12 @@ void AppendChords(const TPlayedScore& score, CSong& song) {
     song.mChords.emplace_back(CChordLite_Undef, end);
 }
 
-void AppendBars(const TPlayedScore& score, CSong& song) {
+void AppendBars(const CPlayedScore& score, CSong& song) {
     const auto& lines = score.mDoc.HarmBarlines;
     std::size_t time = 0;
     const auto& times = score.mDoc.TimeSignatures;
     for (std::size_t i = 0; i < lines.size(); ++i) {
-        const TScoreMeasure& measure = score.mWritten.mMeasures[score.mOrder.mMeasures[i]];
+        const CScoreMeasure& measure = score.mWritten.mMeasures[score.mOrder.mMeasures[i]];
         const double begin = lines[i].mPosition;
         const double end = i + 1 < lines.size() ? lines[i + 1].mPosition : score.mEnd;
         while (time < times.size() && times[time].mPosition <= begin) ++time;
@@ -62,9 +62,9 @@ void AppendBars(const TPlayedScore& score, CSong& song) {
     }
 }
 
-void AppendRepeats(const TPlayedScore& score, CSong& song) {
+void AppendRepeats(const CPlayedScore& score, CSong& song) {
     const auto& lines = score.mDoc.HarmBarlines;
-    for (const TJumpBack& jump : score.mOrder.mJumpsBack) {
+    for (const CJumpBack& jump : score.mOrder.mJumpsBack) {
         if (jump.mTo >= lines.size()) return;
         song.mRepeats.push_back(
             {lines[jump.mTo].mPosition, lines[jump.mFrom].mPosition, jump.mLength});
@@ -74,7 +74,7 @@ void AppendRepeats(const TPlayedScore& score, CSong& song) {
 }  // namespace
 
 CSong ReadScoreSong(std::string_view bytes, TSongFormat format) {
-    const TPlayedScore score = PlayScoreBytes(bytes);
+    const CPlayedScore score = PlayScoreBytes(bytes);
     CSong song;
     song.mFormat = format;
     song.mTitle = score.mWritten.mTitle;

@@ -17,7 +17,7 @@ public:
     explicit CLineCount(std::string_view text) : mText(text) {}
 
     /// Offsets must ascend.
-    CSongFault Place(const TTextFault& fault) {
+    CSongFault Place(const CTokenFault& fault) {
         for (; mOffset < fault.mOffset && mOffset < mText.size(); ++mOffset) {
             const char c = mText[mOffset];
             if (c == '\n') {
@@ -57,12 +57,12 @@ void Cut(TSongFormat format, CTokenList& list) {
 
 /// By their places; without a lenient reading the first one that is no note is the last.
 void TakeFaults(const CTokenList& list, CSong& song) {
-    std::vector<TTextFault> faults = list.Faults();
-    std::stable_sort(faults.begin(), faults.end(), [](const TTextFault& a, const TTextFault& b) {
+    std::vector<CTokenFault> faults = list.Faults();
+    std::stable_sort(faults.begin(), faults.end(), [](const CTokenFault& a, const CTokenFault& b) {
         return a.mOffset < b.mOffset;
     });
     CLineCount lines(list.Text());
-    for (const TTextFault& fault : faults) {
+    for (const CTokenFault& fault : faults) {
         song.mFaults.push_back(lines.Place(fault));
         if (!fault.mIsNote && !list.Prefs().mLenient) break;
     }
@@ -71,7 +71,7 @@ void TakeFaults(const CTokenList& list, CSong& song) {
 
 }  // namespace
 
-CSong ReadSheet(std::string_view text, TSongFormat format, const CSongPrefs& prefs) {
+CSong ReadSheet(std::string_view text, TSongFormat format, const CSongOptions& prefs) {
     constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
     if (text.starts_with(kByteOrderMark)) text.remove_prefix(kByteOrderMark.size());
     CSong song;
@@ -88,7 +88,7 @@ CSong ReadSheet(std::string_view text, TSongFormat format, const CSongPrefs& pre
     if (list.mHasH) list.MakeGerman();
     const auto time =
         std::find_if(list.mTokens.begin(), list.mTokens.end(),
-                     [](const TToken& token) { return token.mKind == TTokenKind::Time; });
+                     [](const CToken& token) { return token.mKind == TTokenKind::Time; });
     if (time != list.mTokens.end()) song.mBeatsPerBar = time->mTime.mNumerator;
     if (!list.IsGivenUp()) PlaySheet(list);
     TakeFaults(list, song);

@@ -13,13 +13,13 @@ class CBarMaker {
 public:
     explicit CBarMaker(CTokenList& list) : mList(list), mHasBarLines(list.HasBarLines()) {}
 
-    TSheetBars Make() {
+    CSheetBars Make() {
         for (std::size_t i = 0; i < mList.mTokens.size(); ++i) Take(i);
         // The last chord of a song with bars lasts to the end of its bar.
         Close(mList.mTokens.size(), mHasBarLines);
         if (!mMade.mMarks.empty()) mMade.mMarks.back().Add(mNextMarks);
         SetCodas();
-        for (TPlayMarks& marks : mMade.mMarks) {
+        for (CPlayMarks& marks : mMade.mMarks) {
             if (marks.mToCoda.mIsSet) marks.mCoda = {};
         }
         return std::move(mMade);
@@ -27,14 +27,14 @@ public:
 
 private:
     /// Where the sign of a coda stands.
-    struct TCodaSign {
+    struct CCodaSign {
         /// A bar, and whether the sign stands in front of its chords.
         std::size_t mBar = 0;
         bool mIsInFront = false;
     };
 
     void Take(std::size_t i) {
-        const TToken& token = mList.mTokens[i];
+        const CToken& token = mList.mTokens[i];
         switch (token.mKind) {
             case TTokenKind::Chord:
             case TTokenKind::Hold:
@@ -83,7 +83,7 @@ private:
     /// them; in charts they stand in front of it.
     void TakePlayWords(std::size_t i, std::string_view words) {
         BeginPassage(i);
-        TPlayMarks marks;
+        CPlayMarks marks;
         ReadPlayWordsOfText(words, marks);
         const bool isPlace = marks.mSegno.mIsSet || marks.mCoda.mIsSet;
         const bool isForNext =
@@ -98,7 +98,7 @@ private:
 
     void Close(std::size_t end, bool isClosed) {
         if (mStepCount == 0) return;
-        const TToken& last = mList.mTokens[mLastStep];
+        const CToken& last = mList.mTokens[mLastStep];
         if (mStepCount == 1 && last.mKind == TTokenKind::RepeatBars) {
             Repeat(last, end);
         } else {
@@ -120,7 +120,7 @@ private:
     }
 
     /// The last bar, or the last two, once more.
-    void Repeat(const TToken& token, std::size_t end) {
+    void Repeat(const CToken& token, std::size_t end) {
         const auto count = static_cast<std::size_t>(token.mCount);
         if (mMade.mBars.size() < count) {
             mList.AddFault(token.mText, count == 1 ? "there is no bar before this one to repeat"
@@ -129,10 +129,10 @@ private:
         }
         const std::size_t first = mMade.mBars.size() - count;
         for (std::size_t i = first; i < first + count; ++i) {
-            TSheetBar copy = mMade.mBars[i];
+            CWrittenBar copy = mMade.mBars[i];
             copy.mIsClosed = copy.mIsCopy = true;
             mMade.mBars.push_back(copy);
-            mMade.mMarks.push_back(i == first ? mNextMarks : TPlayMarks());
+            mMade.mMarks.push_back(i == first ? mNextMarks : CPlayMarks());
         }
     }
 
@@ -140,7 +140,7 @@ private:
     /// Where words tell the one, the signs are the other.
     void SetCodas() {
         bool hasWords = false;
-        for (const TPlayMarks& marks : mMade.mMarks) hasWords = hasWords || marks.mToCoda.mIsSet;
+        for (const CPlayMarks& marks : mMade.mMarks) hasWords = hasWords || marks.mToCoda.mIsSet;
         for (std::size_t i = 0; i < mCodaSigns.size(); ++i) {
             const bool isLeft = !hasWords && i % 2 == 0 && i + 1 < mCodaSigns.size();
             std::size_t bar = mCodaSigns[i].mBar;
@@ -152,17 +152,17 @@ private:
 
     CTokenList& mList;
     bool mHasBarLines;
-    TSheetBars mMade;
-    TSheetBar mNext;
-    TPlayMarks mNextMarks;
-    std::vector<TCodaSign> mCodaSigns;
+    CSheetBars mMade;
+    CWrittenBar mNext;
+    CPlayMarks mNextMarks;
+    std::vector<CCodaSign> mCodaSigns;
     std::size_t mStepCount = 0;
     std::size_t mLastStep = 0;
 };
 
 }  // namespace
 
-TSheetBars MakeSheetBars(CTokenList& list) {
+CSheetBars MakeSheetBars(CTokenList& list) {
     return CBarMaker(list).Make();
 }
 

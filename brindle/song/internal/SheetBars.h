@@ -10,7 +10,7 @@
 namespace brindle::SongText {
 
 /// A bar as it is written, or a passage of a text without bar lines. It has chords or holds.
-struct TSheetBar {
+struct CWrittenBar {
     /// Tokens, of which chords, holds, keys and sections count.
     std::size_t mBegin = 0;
     std::size_t mEnd = 0;
@@ -22,13 +22,13 @@ struct TSheetBar {
     CSongTime mTime;
 };
 
-struct TSheetBars {
-    std::vector<TSheetBar> mBars;
+struct CSheetBars {
+    std::vector<CWrittenBar> mBars;
     /// Of each bar.
-    std::vector<TPlayMarks> mMarks;
+    std::vector<CPlayMarks> mMarks;
 };
 
 /// Collects the tokens between bar lines. A repeat of bars that are not there is a fault of `list`.
-[[nodiscard]] TSheetBars MakeSheetBars(CTokenList& list);
+[[nodiscard]] CSheetBars MakeSheetBars(CTokenList& list);
 
 }  // namespace brindle::SongText

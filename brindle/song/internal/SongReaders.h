@@ -10,16 +10,16 @@
 namespace brindle::SongReaders {
 
 /// Chord text, plain or even, chords above lyrics, ChordPro, and packed charts.
-[[nodiscard]] CSong ReadSheet(std::string_view text, TSongFormat format, const CSongPrefs& prefs);
+[[nodiscard]] CSong ReadSheet(std::string_view text, TSongFormat format, const CSongOptions& prefs);
 
 /// Links, or a page with links; each link has one or more charts.
 [[nodiscard]] std::vector<CSong> ReadChartLinks(std::string_view text, TSongFormat format,
-                                                const CSongPrefs& prefs);
+                                                const CSongOptions& prefs);
 
-[[nodiscard]] CSong ReadChordStrings(std::string_view text, const CSongPrefs& prefs);
+[[nodiscard]] CSong ReadChordStrings(std::string_view text, const CSongOptions& prefs);
 
 /// An analysis in Roman numerals. Repeats are not played: what is written stands once.
-[[nodiscard]] CSong ReadRomanSong(std::string_view text, const CSongPrefs& prefs);
+[[nodiscard]] CSong ReadRomanSong(std::string_view text, const CSongOptions& prefs);
 
 /// A score, plain or in a container.
 [[nodiscard]] CSong ReadScoreSong(std::string_view bytes, TSongFormat format);

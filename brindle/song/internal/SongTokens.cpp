@@ -17,14 +17,14 @@ constexpr std::size_t kMostAddedAgain = 100'000;
 /// Characters of a chord that a fault repeats.
 constexpr int kLongestShown = 40;
 
-struct TRepeatRow {
+struct CRepeatRow {
     std::string_view mText;
     TTokenKind mKind;
     int mCount;
 };
 
 // What ReadChordText takes for a repeat; what is not here holds for one step.
-constexpr auto kRepeatRows = std::to_array<TRepeatRow>({
+constexpr auto kRepeatRows = std::to_array<CRepeatRow>({
     {"//", TTokenKind::Hold, 2},
     {"///", TTokenKind::Hold, 3},
     {"////", TTokenKind::Hold, 4},
@@ -52,15 +52,15 @@ std::size_t ByteOfCharacter(std::string_view text, int pos) {
 
 }  // namespace
 
-TToken& CTokenList::Add(TTokenKind kind, std::string_view text) {
-    TToken& token = mTokens.emplace_back();
+CToken& CTokenList::Add(TTokenKind kind, std::string_view text) {
+    CToken& token = mTokens.emplace_back();
     token.mKind = kind;
     token.mText = text;
     return token;
 }
 
 void CTokenList::AddBar(bool endsRepeat, bool startsRepeat) {
-    TToken& bar = Add(TTokenKind::Bar);
+    CToken& bar = Add(TTokenKind::Bar);
     bar.mEndsRepeat = endsRepeat;
     bar.mStartsRepeat = startsRepeat;
 }
@@ -78,7 +78,7 @@ void CTokenList::AddReading(std::string_view text, const CChordTextReading& read
         case TChordText_Repeat: {
             const auto* const row =
                 std::find_if(kRepeatRows.begin(), kRepeatRows.end(),
-                             [&](const TRepeatRow& r) { return r.mText == text; });
+                             [&](const CRepeatRow& r) { return r.mText == text; });
             const bool isHold = row == kRepeatRows.end();
             Add(isHold ? TTokenKind::Hold : row->mKind, text).mCount = isHold ? 1 : row->mCount;
             return;
@@ -93,7 +93,7 @@ void CTokenList::AddReading(std::string_view text, const CChordTextReading& read
 
 bool CTokenList::HasBarLines() const {
     return std::any_of(mTokens.begin(), mTokens.end(),
-                       [](const TToken& token) { return token.mKind == TTokenKind::Bar; });
+                       [](const CToken& token) { return token.mKind == TTokenKind::Bar; });
 }
 
 bool CTokenList::AddAgain(std::size_t begin, std::size_t end) {
@@ -126,9 +126,9 @@ void CTokenList::AddFault(std::string_view chord, const CChordTextReading& readi
 }
 
 void CTokenList::MakeGerman() {
-    CChordTextPrefs prefs = mPrefs.mChordTextPrefs;
+    CChordTextOptions prefs = mPrefs.mChordTextPrefs;
     prefs.mBIsBFlat = true;
-    for (TToken& token : mTokens) {
+    for (CToken& token : mTokens) {
         if (token.mKind != TTokenKind::Chord) continue;
         const CChordTextReading reading = ReadChordText(token.mText, prefs);
         if (reading.mKind == TChordText_Chord) token.mChord = reading.mChord;

@@ -27,7 +27,7 @@ enum class TTokenKind : std::uint8_t {
     CodaSign,
 };
 
-struct TToken {
+struct CToken {
     TTokenKind mKind = TTokenKind::Bar;
     /// A chord as it is written, the name of a section. Part of the song's text.
     std::string_view mText;
@@ -45,7 +45,7 @@ struct TToken {
 };
 
 /// A fault at a byte of the text.
-struct TTextFault {
+struct CTokenFault {
     std::size_t mOffset = 0;
     std::string mText;
     bool mIsNote = false;
@@ -55,21 +55,21 @@ struct TTextFault {
 class CTokenList {
 public:
     /// `song` takes what the text tells beside its chords.
-    CTokenList(std::string_view text, const CSongPrefs& prefs, CSong& song)
+    CTokenList(std::string_view text, const CSongOptions& prefs, CSong& song)
         : mText(text), mPrefs(prefs), mSong(song) {}
 
-    std::vector<TToken> mTokens;
+    std::vector<CToken> mTokens;
     bool mIsEven = false;
     bool mHasH = false;
     /// Words that steer the playing stand in front of the chords of their bar.
     bool mWordsStandInFront = false;
 
     [[nodiscard]] std::string_view Text() const { return mText; }
-    [[nodiscard]] const CSongPrefs& Prefs() const { return mPrefs; }
+    [[nodiscard]] const CSongOptions& Prefs() const { return mPrefs; }
     [[nodiscard]] CSong& Song() const { return mSong; }
     [[nodiscard]] bool HasBarLines() const;
 
-    TToken& Add(TTokenKind kind, std::string_view text = {});
+    CToken& Add(TTokenKind kind, std::string_view text = {});
     void AddBar(bool endsRepeat, bool startsRepeat);
     /// A chord, no-chord, hold or repeat that stands by itself; a fault becomes a no-chord.
     void AddChordText(std::string_view text);
@@ -84,7 +84,7 @@ public:
     void AddFault(std::string_view chord, const CChordTextReading& reading);
     /// Something was left out that is no chord.
     void AddNote(std::string_view where, std::string text);
-    [[nodiscard]] const std::vector<TTextFault>& Faults() const { return mFaults; }
+    [[nodiscard]] const std::vector<CTokenFault>& Faults() const { return mFaults; }
     /// After the first fault, unless the reading is lenient.
     [[nodiscard]] bool IsGivenUp() const { return mHasFault && !mPrefs.mLenient; }
 
@@ -95,9 +95,9 @@ private:
     void AddFaultOrNote(std::string_view where, std::string text, bool isNote);
 
     std::string_view mText;
-    const CSongPrefs& mPrefs;
+    const CSongOptions& mPrefs;
     CSong& mSong;
-    std::vector<TTextFault> mFaults;
+    std::vector<CTokenFault> mFaults;
     bool mHasFault = false;
     std::size_t mAddedAgain = 0;
 };

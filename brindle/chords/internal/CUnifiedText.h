@@ -10,9 +10,9 @@ namespace brindle::ChordText {
 /// A chord text in plain ASCII, as far as it can be: ♯ is "#", Δ is "^", superscript digits are
 /// digits. It is trimmed, and brackets around the whole are gone. Each character knows where it
 /// comes from.
-class CFoldedText {
+class CUnifiedText {
 public:
-    explicit CFoldedText(std::string_view input);
+    explicit CUnifiedText(std::string_view input);
 
     [[nodiscard]] bool IsEmpty() const { return mBegin == mEnd; }
     [[nodiscard]] std::string_view Text() const {

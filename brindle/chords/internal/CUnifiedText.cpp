@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "brindle/chords/internal/CFoldedText.h"
+#include "brindle/chords/internal/CUnifiedText.h"
 
 #include "brindle/theory/SetFromStringHelper.h"
 
@@ -9,13 +9,13 @@
 namespace brindle::ChordText {
 namespace {
 
-struct TFoldRow {
+struct CUnifyRow {
     std::string_view mCharacter;
-    std::string_view mFolded;
+    std::string_view mUnified;
 };
 
 // clang-format off
-constexpr auto kFoldRows = std::to_array<TFoldRow>({
+constexpr auto kUnifyRows = std::to_array<CUnifyRow>({
     {"♯", "#"}, {"＃", "#"},
     {"♭", "b"},
     {"♮", ""},
@@ -38,7 +38,7 @@ constexpr auto kFoldRows = std::to_array<TFoldRow>({
 constexpr std::string_view kDroppedInFront = " |";
 constexpr std::string_view kDroppedAtTheEnd = " ,;|";
 
-char FoldAscii(char c) {
+char UnifiedAscii(char c) {
     switch (c) {
         case '[':
             return '(';
@@ -59,10 +59,10 @@ bool IsAscii(char c) {
 
 }  // namespace
 
-CFoldedText::CFoldedText(std::string_view input) : mInput(input) {
+CUnifiedText::CUnifiedText(std::string_view input) : mInput(input) {
     for (std::size_t i = 0; i < input.size();) {
         if (IsAscii(input[i])) {
-            Append(FoldAscii(input[i]), i);
+            Append(UnifiedAscii(input[i]), i);
             ++i;
         } else {
             AppendNonAscii(i);
@@ -74,32 +74,32 @@ CFoldedText::CFoldedText(std::string_view input) : mInput(input) {
     TakeInsideOfBrackets();
 }
 
-void CFoldedText::Append(char folded, std::size_t offset) {
+void CUnifiedText::Append(char folded, std::size_t offset) {
     mText.push_back(folded);
     mLower.push_back(SetFromStringHelper::ToLower(folded));
     mOffsets.push_back(offset);
 }
 
-void CFoldedText::AppendNonAscii(std::size_t& offset) {
+void CUnifiedText::AppendNonAscii(std::size_t& offset) {
     const std::string_view rest = mInput.substr(offset);
     const auto* const row =
-        std::find_if(kFoldRows.begin(), kFoldRows.end(),
-                     [&](const TFoldRow& fold) { return rest.starts_with(fold.mCharacter); });
-    if (row == kFoldRows.end()) {
+        std::find_if(kUnifyRows.begin(), kUnifyRows.end(),
+                     [&](const CUnifyRow& fold) { return rest.starts_with(fold.mCharacter); });
+    if (row == kUnifyRows.end()) {
         Append(mInput[offset], offset);
         ++offset;
         return;
     }
-    for (const char folded : row->mFolded) Append(folded, offset);
+    for (const char folded : row->mUnified) Append(folded, offset);
     offset += row->mCharacter.size();
 }
 
-void CFoldedText::Trim() {
+void CUnifiedText::Trim() {
     while (mBegin < mEnd && kDroppedInFront.find(mText[mBegin]) != kDroppedInFront.npos) ++mBegin;
     while (mBegin < mEnd && kDroppedAtTheEnd.find(mText[mEnd - 1]) != kDroppedAtTheEnd.npos) --mEnd;
 }
 
-void CFoldedText::TakeInsideOfBrackets() {
+void CUnifiedText::TakeInsideOfBrackets() {
     if (IsEmpty() || mText[mBegin] != '(') return;
     std::size_t depth = 0;
     for (std::size_t i = mBegin; i < mEnd; ++i) {
