@@ -31,7 +31,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr CCommandHelp kHelp{
+constexpr CCommandHelp kAnalyseHelp{
     "analyse",
     "Read a song as a teacher does: keys, numerals, what each chord is and leads to",
     "  brindle analyse \"Dm7 G7 | C\"\n"
@@ -47,10 +47,6 @@ constexpr CCommandHelp kHelp{
     "and :| is played twice. A score in MusicXML (.musicxml, .xml, .mxl) is played\n"
     "through its repeats, endings and jumps.\n",
 };
-
-// A step or a bar this short or long is a slip of the finger.
-constexpr double kShortest = 1.0 / 1024;
-constexpr double kLongest = 1024.0;
 
 struct CAnalyseOptions {
     std::vector<std::string> mWords;
@@ -81,12 +77,9 @@ std::optional<std::string> Contradiction(const CAnalyseOptions& options) {
     if (options.mWords.empty() && options.mFile.empty()) {
         return "a song is needed: a TEXT, a score, --file PATH, or - for standard input";
     }
-    if (!options.mWords.empty() && !options.mFile.empty()) {
-        return "a TEXT and --file PATH are two songs, one is needed";
-    }
-    for (const double beats : {options.mBeatsPerBar, options.mBeatsPerChord}) {
-        if (beats >= kShortest && beats <= kLongest) continue;
-        return "--beats-per-bar and --beats-per-chord take 1/1024 to 1024 beats";
+    if (auto fault = FaultOfSource(options.mWords, options.mFile,
+                                   {options.mBeatsPerBar, options.mBeatsPerChord})) {
+        return fault;
     }
     const bool isText = options.mFormat.Format() == TFormat::Text;
     if ((options.mLong || options.mCenters) && !isText) {
@@ -280,7 +273,7 @@ TStatus Analyse(const CAnalyseOptions& options) {
 }  // namespace
 
 void AddAnalyse(CCommand& program) {
-    CCommand& command = program.AddCommand(kHelp);
+    CCommand& command = program.AddCommand(kAnalyseHelp);
     const auto options = std::make_shared<CAnalyseOptions>();
     AddSongSource(command, options->mWords, options->mFile);
     command.AddChoice("--route", options->mRoute, {"tonic", "cadence", "weights", "none"},

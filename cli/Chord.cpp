@@ -11,7 +11,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr CCommandHelp kHelp{
+constexpr CCommandHelp kChordHelp{
     "chord",
     "Read chord symbols: root, bass, semitones, basic chord and hash code",
     "  brindle chord F#m7/C# Bb13\n"
@@ -42,7 +42,7 @@ TStatus Chord(const CChordOptions& options) {
 }  // namespace
 
 void AddChord(CCommand& program) {
-    CCommand& command = program.AddCommand(kHelp);
+    CCommand& command = program.AddCommand(kChordHelp);
     const auto options = std::make_shared<CChordOptions>();
     command.AddArgument("SYMBOL", options->mSymbols, "Chord symbols; - reads standard input")
         .Required();

@@ -11,8 +11,8 @@ namespace brindle::cli {
 namespace {
 
 // A step or a bar this short or long is a slip of the finger.
-constexpr double kShortest = 1.0 / 1024;
-constexpr double kLongest = 1024.0;
+constexpr double kFewestBeats = 1.0 / 1024;
+constexpr double kMostBeats = 1024.0;
 
 }  // namespace
 
@@ -20,6 +20,22 @@ void AddSongSource(CCommand& command, std::vector<std::string>& words, std::stri
     command.AddArgument("TEXT", words,
                         "Chord text, or the name of a score; - reads standard input");
     command.AddOption("--file", "PATH", file, "Read the chord text or the score from a file");
+}
+
+std::optional<std::string> FaultOfSource(const std::vector<std::string>& words,
+                                         const std::string& file,
+                                         std::initializer_list<double> beats) {
+    if (words.empty() && file.empty()) {
+        return "a chord text is needed: a TEXT, --file PATH, or - for standard input";
+    }
+    if (!words.empty() && !file.empty()) {
+        return "a TEXT and --file PATH are two songs, one is needed";
+    }
+    for (const double count : beats) {
+        if (count >= kFewestBeats && count <= kMostBeats) continue;
+        return "--beats-per-bar and --beats-per-chord take 1/1024 to 1024 beats";
+    }
+    return std::nullopt;
 }
 
 void AddBeats(CCommand& command, double& beatsPerBar, double& beatsPerChord) {
@@ -37,17 +53,7 @@ void CChordReadingOptions::AddTo(CCommand& command) {
 }
 
 std::optional<std::string> CChordReadingOptions::Contradiction() const {
-    if (mWords.empty() && mFile.empty()) {
-        return "a chord text is needed: a TEXT, --file PATH, or - for standard input";
-    }
-    if (!mWords.empty() && !mFile.empty()) {
-        return "a TEXT and --file PATH are two songs, one is needed";
-    }
-    for (const double beats : {mBeatsPerBar, mBeatsPerChord}) {
-        if (beats >= kShortest && beats <= kLongest) continue;
-        return "--beats-per-bar and --beats-per-chord take 1/1024 to 1024 beats";
-    }
-    return std::nullopt;
+    return FaultOfSource(mWords, mFile, {mBeatsPerBar, mBeatsPerChord});
 }
 
 std::optional<CChordSong> CChordReadingOptions::ReadSong() const {

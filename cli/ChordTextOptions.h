@@ -3,6 +3,7 @@
 
 #include "cli/TypedChords.h"
 
+#include <initializer_list>
 #include <optional>
 #include <string>
 #include <vector>
@@ -13,6 +14,11 @@ class CCommand;
 
 /// Adds TEXT and --file of a command that reads a chord text or a score.
 void AddSongSource(CCommand& command, std::vector<std::string>& words, std::string& file);
+
+/// What is wrong with a source and the beats of its bars and chords, if anything is.
+[[nodiscard]] std::optional<std::string> FaultOfSource(const std::vector<std::string>& words,
+                                                       const std::string& file,
+                                                       std::initializer_list<double> beats);
 
 /// Adds --beats-per-bar and --beats-per-chord.
 void AddBeats(CCommand& command, double& beatsPerBar, double& beatsPerChord);

@@ -10,7 +10,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr CCommandHelp kHelp{
+constexpr CCommandHelp kCopiesHelp{
     "copies",
     "Find the passages of a song that repeat earlier ones, chord for chord",
     "  brindle copies --beats-per-chord 4 \"C Am F G C Am F G\"\n"
@@ -43,7 +43,7 @@ TStatus Copies(const CCopiesOptions& options) {
 }  // namespace
 
 void AddCopies(CCommand& program) {
-    CCommand& command = program.AddCommand(kHelp);
+    CCommand& command = program.AddCommand(kCopiesHelp);
     const auto options = std::make_shared<CCopiesOptions>();
     options->mText.AddTo(command);
     options->mFormat.AddTo(command, {"text", "json"});

@@ -13,7 +13,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr CCommandHelp kHelp{
+constexpr CCommandHelp kFunctionHelp{
     "function",
     "Tell the function of chords in a key: Roman numerals and function letters",
     "  brindle function Dm7 G7 C --key C\n"
@@ -48,7 +48,7 @@ TStatus Function(const CFunctionOptions& options) {
 }  // namespace
 
 void AddFunction(CCommand& program) {
-    CCommand& command = program.AddCommand(kHelp);
+    CCommand& command = program.AddCommand(kFunctionHelp);
     const auto options = std::make_shared<CFunctionOptions>();
     command.AddArgument("SYMBOL", options->mSymbols, "Chord symbols; - reads standard input")
         .Required();

@@ -17,7 +17,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr CCommandHelp kHelp{
+constexpr CCommandHelp kGridHelp{
     "grid",
     "Name the chord of a guitar fingering, or show the fingerings of a chord",
     "  brindle grid x32010\n"
@@ -118,7 +118,7 @@ TStatus Grid(const CGridOptions& options) {
 }  // namespace
 
 void AddGrid(CCommand& program) {
-    CCommand& command = program.AddCommand(kHelp);
+    CCommand& command = program.AddCommand(kGridHelp);
     const auto options = std::make_shared<CGridOptions>();
     command
         .AddArgument("GRID", options->mWords, "Fingerings or chord symbols; - reads standard input")

@@ -18,7 +18,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr CCommandHelp kHelp{
+constexpr CCommandHelp kGridPackagesHelp{
     "grids",
     "List, show, export and import packages of guitar fingerings",
     "  brindle grids list\n"
@@ -136,7 +136,7 @@ CCommand& AddAction(CCommand& grids, const char* name, const char* purpose, TAct
 }  // namespace
 
 void AddGrids(CCommand& program) {
-    CCommand& command = program.AddCommand(kHelp);
+    CCommand& command = program.AddCommand(kGridPackagesHelp);
     const auto options = [] { return std::make_shared<CPackageOptions>(); };
     AddAction(command, "list", "Show the libraries", List, {"text", "json"}, options());
     AddAction(command, "show", "Draw all fingerings", Show, {"text", "json", "svg"}, options());

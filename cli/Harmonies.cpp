@@ -16,7 +16,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr CCommandHelp kHelp{
+constexpr CCommandHelp kHarmoniesHelp{
     "harmonies",
     "List the chords of a score in the order in which they are played",
     "  brindle harmonies song.musicxml\n"
@@ -95,7 +95,7 @@ TStatus Harmonies(const CHarmoniesOptions& options) {
 }  // namespace
 
 void AddHarmonies(CCommand& program) {
-    CCommand& command = program.AddCommand(kHelp);
+    CCommand& command = program.AddCommand(kHarmoniesHelp);
     const auto options = std::make_shared<CHarmoniesOptions>();
     command.AddArgument("FILE", options->mFile, "A score in MusicXML; - reads standard input")
         .Required();

@@ -23,7 +23,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr CCommandHelp kHelp{
+constexpr CCommandHelp kImportHelp{
     "import",
     "Import a MusicXML score as timed notes",
     "  brindle import song.musicxml\n"
@@ -172,7 +172,7 @@ TStatus Import(const CImportOptions& options) {
 }  // namespace
 
 void AddImport(CCommand& program) {
-    CCommand& command = program.AddCommand(kHelp);
+    CCommand& command = program.AddCommand(kImportHelp);
     const auto options = std::make_shared<CImportOptions>();
     command
         .AddArgument("FILE", options->mFile,

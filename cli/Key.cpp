@@ -14,7 +14,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr CCommandHelp kHelp{
+constexpr CCommandHelp kKeyHelp{
     "key",
     "Read a key: its signs, notes, relative key and one-byte code",
     "  brindle key \"F# minor\"\n"
@@ -68,7 +68,7 @@ TStatus Key(const CLineOptions& options) {
 }  // namespace
 
 void AddKey(CCommand& program) {
-    CCommand& command = program.AddCommand(kHelp);
+    CCommand& command = program.AddCommand(kKeyHelp);
     const auto options = std::make_shared<CLineOptions>();
     command.AddArgument("KEY", options->mWords, "A key, major or minor; - reads one a line")
         .Required();

@@ -23,7 +23,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr CCommandHelp kHelp{
+constexpr CCommandHelp kKeysHelp{
     "keys",
     "Find the key of a song and the keys that it passes through, with Roman numerals",
     "  brindle keys \"Dm7 G7 | Cmaj7 . | Fm7 Bb7 | Ebmaj7 .\" --beats-per-chord 2\n"
@@ -36,9 +36,7 @@ constexpr CCommandHelp kHelp{
     "(.musicxml, .xml, .mxl) is played through its repeats, endings and jumps.\n",
 };
 
-// A step or a bar this short or long is a slip of the finger, and so are more points than this.
-constexpr double kShortest = 1.0 / 1024;
-constexpr double kLongest = 1024.0;
+// More points than this are a slip of the finger.
 constexpr double kMostPoints = 1000.0;
 
 struct CKeysOptions {
@@ -57,12 +55,9 @@ std::optional<std::string> Contradiction(const CKeysOptions& options) {
     if (options.mWords.empty() && options.mFile.empty()) {
         return "a song is needed: a TEXT, a score, --file PATH, or - for standard input";
     }
-    if (!options.mWords.empty() && !options.mFile.empty()) {
-        return "a TEXT and --file PATH are two songs, one is needed";
-    }
-    for (const double beats : {options.mKeys.mBeatsPerBar, options.mBeatsPerChord}) {
-        if (beats >= kShortest && beats <= kLongest) continue;
-        return "--beats-per-bar and --beats-per-chord take 1/1024 to 1024 beats";
+    if (auto fault = FaultOfSource(options.mWords, options.mFile,
+                                   {options.mKeys.mBeatsPerBar, options.mBeatsPerChord})) {
+        return fault;
     }
     for (const double points : {options.mKeys.mHomeBonus, options.mKeys.mChangeCost}) {
         if (points >= 0.0 && points <= kMostPoints) continue;
@@ -155,7 +150,7 @@ TStatus Keys(const CKeysOptions& options) {
 }  // namespace
 
 void AddKeys(CCommand& program) {
-    CCommand& command = program.AddCommand(kHelp);
+    CCommand& command = program.AddCommand(kKeysHelp);
     const auto options = std::make_shared<CKeysOptions>();
     AddSongSource(command, options->mWords, options->mFile);
     command.AddOption("--key", "KEY", options->mKey, "The stated key, as in \"A minor\" or Bb");

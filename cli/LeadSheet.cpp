@@ -51,8 +51,7 @@ std::string FaultOf(std::string_view bytes) {
 }  // namespace
 
 bool HasScoreBytes(std::string_view bytes) {
-    const TSongFormat format = SongFormatOf(bytes);
-    return format == TSongFormat_MusicXml || format == TSongFormat_CompressedMusicXml;
+    return IsScore(SongFormatOf(bytes));
 }
 
 std::optional<CTypedSong> ReadTypedSong(const std::vector<std::string>& words,

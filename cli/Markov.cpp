@@ -16,7 +16,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr CCommandHelp kHelp{
+constexpr CCommandHelp kMarkovHelp{
     "markov",
     "Learn chord sequences and make new ones in their manner",
     "  brindle markov learn --order 3 -o model.json songs/\n"
@@ -26,7 +26,7 @@ constexpr CCommandHelp kHelp{
 };
 
 // Longer texts are shown as chord strings.
-constexpr double kMostBeats = 1e6;
+constexpr double kMostBeatsOfChord = 1e6;
 
 /// A word that is neither a chord nor "U"; empty if there is none.
 std::string UnknownSymbol(const std::string& text) {
@@ -96,7 +96,7 @@ std::optional<std::vector<CMarkovObject>> ReadSymbols(const std::string& option,
     typed = WithPlainSymbols(typed);
     const CHarmAnlsChordsWithLength chords = HarmChordsFromChordString(typed);
     const bool areLengths = std::all_of(chords.begin(), chords.end(), [](const auto& chord) {
-        return chord.mLength > 0.0 && chord.mLength <= kMostBeats;
+        return chord.mLength > 0.0 && chord.mLength <= kMostBeatsOfChord;
     });
     if (chords.empty() || !areLengths) {
         Fail(TStatus::BadUsage, fmt::format("{}: chords with their lengths in beats are wanted, as "
@@ -128,7 +128,7 @@ Json SymbolToJson(const CMarkovObject& object, const CMarkovSpelling& spelling) 
 }
 
 void AddMarkov(CCommand& program) {
-    CCommand& markov = program.AddCommand(kHelp);
+    CCommand& markov = program.AddCommand(kMarkovHelp);
     AddMarkovLearn(markov);
     AddMarkovGenerate(markov);
     AddMarkovFill(markov);

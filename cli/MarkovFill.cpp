@@ -9,7 +9,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr CCommandHelp kHelp{
+constexpr CCommandHelp kMarkovFillHelp{
     "fill",
     "Put a chord into each gap of a sequence, by what the model knows of its neighbours",
     "  brindle markov fill model.json \"(4,C);(4,U);(4,G7);(4,C)\"\n"
@@ -88,7 +88,7 @@ TStatus MarkovFill(const CFillOptions& options) {
 }  // namespace
 
 void AddMarkovFill(CCommand& markov) {
-    CCommand& command = markov.AddCommand(kHelp);
+    CCommand& command = markov.AddCommand(kMarkovFillHelp);
     const auto options = std::make_shared<CFillOptions>();
     command.AddArgument("MODEL", options->mModel, "Model file; - reads standard input").Required();
     command.AddArgument("SEQUENCE", options->mSequence, "Chords with their lengths; U is a gap")

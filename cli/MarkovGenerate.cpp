@@ -13,7 +13,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr CCommandHelp kHelp{
+constexpr CCommandHelp kMarkovGenerateHelp{
     "generate",
     "Make a new chord sequence of a length, or one that fills the gaps of a template",
     "  brindle markov generate model.json --beats 32\n"
@@ -23,7 +23,7 @@ constexpr CCommandHelp kHelp{
     "In a template the U are gaps, to be filled with chords of their length together.\n",
 };
 
-constexpr double kMostBeats = 10000.0;
+constexpr double kMostBeatsOfSequence = 10000.0;
 // A second or two of search.
 constexpr std::uint64_t kMostSteps = 1'000'000;
 constexpr std::uint64_t kShortestOrder = 1;
@@ -215,11 +215,11 @@ void AddHistoryOptions(CCommand& command, CGenerateOptions& options) {
 }  // namespace
 
 void AddMarkovGenerate(CCommand& markov) {
-    CCommand& command = markov.AddCommand(kHelp);
+    CCommand& command = markov.AddCommand(kMarkovGenerateHelp);
     const auto options = std::make_shared<CGenerateOptions>();
     command.AddArgument("MODEL", options->mModel, "Model file; - reads standard input").Required();
     command.AddOption("--beats", "BEATS", options->mBeats, "Length of the sequence")
-        .InRange(1.0, kMostBeats);
+        .InRange(1.0, kMostBeatsOfSequence);
     command.AddOption("--template", "CHORDS", options->mTemplate,
                       "Chords that are fixed, and gaps");
     command.AddOption("--samples", "N", options->mSamples, "Sequences to choose from (default: 10)")

@@ -14,7 +14,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr CCommandHelp kHelp{
+constexpr CCommandHelp kMarkovLearnHelp{
     "learn",
     "Learn which chord follows which in lead sheets, chord strings and chord texts",
     "  brindle markov learn -o model.json song.musicxml songs/\n"
@@ -128,7 +128,7 @@ TStatus MarkovLearn(const CLearnOptions& options) {
 }  // namespace
 
 void AddMarkovLearn(CCommand& markov) {
-    CCommand& command = markov.AddCommand(kHelp);
+    CCommand& command = markov.AddCommand(kMarkovLearnHelp);
     const auto options = std::make_shared<CLearnOptions>();
     command.AddArgument("FILES", options->mFiles, "Files and folders").Required();
     command.AddOption("-o,--output", "MODEL", options->mModel, "The model file that is written")

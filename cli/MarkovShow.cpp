@@ -13,7 +13,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr CCommandHelp kHelp{
+constexpr CCommandHelp kMarkovShowHelp{
     "show",
     "Show what a model has learned: its size, how sure it is, and what follows a history",
     "  brindle markov show model.json\n"
@@ -175,7 +175,7 @@ TStatus MarkovShow(const CShowOptions& options) {
 }  // namespace
 
 void AddMarkovShow(CCommand& markov) {
-    CCommand& command = markov.AddCommand(kHelp);
+    CCommand& command = markov.AddCommand(kMarkovShowHelp);
     const auto options = std::make_shared<CShowOptions>();
     command.AddArgument("MODEL", options->mModel, "Model file; - reads standard input").Required();
     command.AddOption("--history", "CHORDS", options->mHistory,

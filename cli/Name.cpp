@@ -11,7 +11,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr CCommandHelp kHelp{
+constexpr CCommandHelp kNameHelp{
     "name",
     "Name the chord of some notes",
     "  brindle name E2 G3 C4\n"
@@ -122,7 +122,7 @@ TStatus Name(CNameOptions options) {
 }  // namespace
 
 void AddName(CCommand& program) {
-    CCommand& command = program.AddCommand(kHelp);
+    CCommand& command = program.AddCommand(kNameHelp);
     const auto options = std::make_shared<CNameOptions>();
     command.AddArgument("NOTE", options->mWords, "Notes of a chord; - reads one chord a line")
         .Required();

@@ -130,8 +130,8 @@ std::string NamesJson(const std::vector<CNamedNotes>& chords, const CNameOptions
     return JsonText({{"Chords", list}});
 }
 
-std::string NamesText(const std::vector<CNamedNotes>& chords, const CNameOptions& options,
-                      const CPaint& paint) {
+std::string NamesByRootText(const std::vector<CNamedNotes>& chords, const CNameOptions& options,
+                            const CPaint& paint) {
     const CChordNamePrefs prefs = options.mNaming.Prefs();
     const auto nameOf = [&](const CKeyEnh& key) {
         return key.IsUndef() ? "-" : KeyNrAndEnhToName(key.mKeyNr, key.mEnh, prefs);
@@ -149,8 +149,8 @@ std::string NamesText(const std::vector<CNamedNotes>& chords, const CNameOptions
     return table.Text(paint);
 }
 
-std::vector<CNamedNotes> AllNames(const std::vector<CNotesText>& sets,
-                                  const CNameOptions& options) {
+std::vector<CNamedNotes> AllNamesByRoot(const std::vector<CNotesText>& sets,
+                                        const CNameOptions& options) {
     std::vector<CNamedNotes> chords;
     for (const CNotesText& set : sets) chords.push_back(NamesOf(set.mNotes, options));
     return chords;
@@ -159,9 +159,9 @@ std::vector<CNamedNotes> AllNames(const std::vector<CNotesText>& sets,
 }  // namespace
 
 std::string NameByRoot(const std::vector<CNotesText>& sets, const CNameOptions& options) {
-    const auto chords = AllNames(sets, options);
+    const auto chords = AllNamesByRoot(sets, options);
     if (options.mFormat.Format() == TFormat::Json) return NamesJson(chords, options);
-    return NamesText(chords, options, PaintOfOutput());
+    return NamesByRootText(chords, options, PaintOfOutput());
 }
 
 }  // namespace brindle::cli

@@ -14,7 +14,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr CCommandHelp kHelp{
+constexpr CCommandHelp kNetHelp{
     "net",
     "Show the neural net that hears the roots of chords",
     "  brindle net trace\n"
@@ -120,7 +120,7 @@ void AddPrinter(CCommand& net, const CCommandHelp& help, TPrinter print) {
 }  // namespace
 
 void AddNet(CCommand& program) {
-    CCommand& command = program.AddCommand(kHelp);
+    CCommand& command = program.AddCommand(kNetHelp);
     AddPrinter(command, kTraceHelp, PrintTrace);
     AddPrinter(command, kWeightsHelp, PrintWeights);
 }

@@ -24,7 +24,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr CCommandHelp kHelp{
+constexpr CCommandHelp kNumeralsHelp{
     "numerals",
     "Turn Roman numerals or Nashville numbers into chords of a key, and chords into these",
     "  brindle numerals \"ii7 V7 | I^7\" --key \"Eb major\"\n"
@@ -174,7 +174,7 @@ void AddNumeralOptions(CCommand& command, CNumeralOptions& options) {
 }
 
 void AddNumerals(CCommand& program) {
-    CCommand& command = program.AddCommand(kHelp);
+    CCommand& command = program.AddCommand(kNumeralsHelp);
     const auto options = std::make_shared<CNumeralsOptions>();
     command
         .AddArgument("TEXT", options->mWords,

@@ -10,7 +10,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr CCommandHelp kHelp{
+constexpr CCommandHelp kProgramHelp{
     "brindle",
     "Music theory and harmony analysis",
     "  brindle analyse \"Dm7 G7 | C\"\n"
@@ -33,7 +33,7 @@ constexpr CCommandHelp kHelp{
 TStatus RunProgram(int argc, char** argv) {
     UseLanguageOfUser();
     UseDataOfProgram();
-    CCommand program(kHelp, BrindleVersionString);
+    CCommand program(kProgramHelp, BrindleVersionString);
     AddAnalyse(program);
     AddKeys(program);
     AddCopies(program);

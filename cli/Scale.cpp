@@ -14,7 +14,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr CCommandHelp kHelp{
+constexpr CCommandHelp kScaleHelp{
     "scale",
     "Read a scale: its notes as they are spelled, mask, type and signs",
     "  brindle scale \"D dorian\"\n"
@@ -77,7 +77,7 @@ TStatus Scale(const CLineOptions& options) {
 }  // namespace
 
 void AddScale(CCommand& program) {
-    CCommand& command = program.AddCommand(kHelp);
+    CCommand& command = program.AddCommand(kScaleHelp);
     const auto options = std::make_shared<CLineOptions>();
     command
         .AddArgument("SCALE", options->mWords, "A key and the name of a scale; - reads one a line")

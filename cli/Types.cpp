@@ -14,7 +14,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr CCommandHelp kHelp{
+constexpr CCommandHelp kTypesHelp{
     "types",
     "List the catalogue of chord types: id, name, intervals, and the name on C",
     "  brindle types\n"
@@ -56,7 +56,7 @@ TStatus Types(const CFormatOptions& format) {
 }  // namespace
 
 void AddTypes(CCommand& program) {
-    CCommand& command = program.AddCommand(kHelp);
+    CCommand& command = program.AddCommand(kTypesHelp);
     const auto format = std::make_shared<CFormatOptions>();
     format->AddTo(command, {"text", "json"});
     command.OnCall([format] { return Types(*format); });

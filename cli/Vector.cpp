@@ -17,7 +17,7 @@
 namespace brindle::cli {
 namespace {
 
-constexpr CCommandHelp kHelp{
+constexpr CCommandHelp kVectorHelp{
     "vector",
     "Write chords as vectors of 46 places for learning systems, and read vectors back",
     "  brindle vector C/E F#m7\n"
@@ -164,7 +164,7 @@ TStatus Vector(const CVectorOptions& options) {
 }  // namespace
 
 void AddVector(CCommand& program) {
-    CCommand& command = program.AddCommand(kHelp);
+    CCommand& command = program.AddCommand(kVectorHelp);
     const auto options = std::make_shared<CVectorOptions>();
     command
         .AddArgument("CHORD", options->mWords,

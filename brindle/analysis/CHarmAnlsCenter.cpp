@@ -2,7 +2,7 @@
 #include "brindle/analysis/CHarmAnlsCenter.h"
 
 #include "brindle/analysis/CHarmAnlsSignKey.h"
-#include "brindle/analysis/internal/JsonText.h"
+#include "brindle/analysis/internal/NativeText.h"
 #include "brindle/theory/KeyIntervals.h"
 
 namespace brindle {
@@ -40,7 +40,7 @@ void CHarmAnlsCenter::AnalyseHarmFunctionsOfChords() {
 
 void CHarmAnlsCenter::AppendJSONString(std::ostream& stream) const {
     PlainText::Write(stream, R"({"Probability":)");
-    JsonText::WriteProbability(stream, mProbability);
+    NativeText::WriteProbability(stream, mProbability);
     PlainText::Write(stream, R"(, "Position":)");
     PlainText::WriteFixed(stream, mPosition);
     PlainText::Write(stream, R"(, "HarmCenter":)");

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/analysis/CHarmAnlsCenters.h"
 
-#include "brindle/analysis/internal/JsonText.h"
 #include "brindle/analysis/internal/MergeAdjacent.h"
+#include "brindle/analysis/internal/NativeText.h"
 
 namespace brindle {
 
@@ -58,7 +58,7 @@ CHarmAnlsCenters::iterator CHarmAnlsCenters::_MergeHarmCentersAndEraseSecond(ite
 }
 
 void CHarmAnlsCenters::AppendJSONString(std::ostream& stream) const {
-    JsonText::WriteList(stream, *this);
+    NativeText::WriteList(stream, *this);
 }
 
 }  // namespace brindle

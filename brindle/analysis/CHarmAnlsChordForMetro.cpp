@@ -13,7 +13,7 @@ namespace brindle {
 
 namespace {
 
-constexpr std::uint64_t kAllSemitones = 4095;
+constexpr std::uint64_t kMaskOfAllSemitones = 4095;
 constexpr int kKeyC = 0;
 constexpr int kKeyE = 4;
 
@@ -21,7 +21,7 @@ constexpr int kKeyE = 4;
 constexpr std::array<std::string_view, 12> kKeyNames = {"C",  "C#", "D",  "D#", "E",  "F",
                                                         "F#", "G",  "G#", "A",  "A#", "B"};
 
-std::string_view NameOfKey(int keyNr) {
+std::string_view NameOfMetroKey(int keyNr) {
     return kKeyNames[static_cast<std::size_t>(FoldIntoOctave(keyNr))];
 }
 
@@ -55,11 +55,11 @@ bool Contains(const std::array<std::uint64_t, N>& vocabulary, CSemitones semiton
 }  // namespace
 
 bool CHarmAnlsChordForMetro::IsEADGBE() const {
-    return mRootKeyEnh.mKeyNr == kKeyE && mSemitones.Mask() == kAllSemitones;
+    return mRootKeyEnh.mKeyNr == kKeyE && mSemitones.Mask() == kMaskOfAllSemitones;
 }
 
 bool CHarmAnlsChordForMetro::IsWildcard() const {
-    return mRootKeyEnh.mKeyNr == kKeyC && mSemitones.Mask() == kAllSemitones;
+    return mRootKeyEnh.mKeyNr == kKeyC && mSemitones.Mask() == kMaskOfAllSemitones;
 }
 
 bool CHarmAnlsChordForMetro::IsSlashChord() const {
@@ -77,11 +77,11 @@ std::string CHarmAnlsChordForMetro::NameForMetroExport(bool flag) const {
     if (!flag) return chord.Name(CurrentChordNamePrefs);
 
     const CChordNamePrefs prefs;
-    std::string name(NameOfKey(mRootKeyEnh.mKeyNr));
+    std::string name(NameOfMetroKey(mRootKeyEnh.mKeyNr));
     name += NameOf(chord.BasicChord());
     name += chord.OptionsNameFromMap(chord.OptionsMap(prefs), prefs);
     if (HasBassNote() && mBassKeyEnh.mKeyNr != mRootKeyEnh.mKeyNr) {
-        name.append(" / ").append(NameOfKey(mBassKeyEnh.mKeyNr));
+        name.append(" / ").append(NameOfMetroKey(mBassKeyEnh.mKeyNr));
     }
     return name;
 }

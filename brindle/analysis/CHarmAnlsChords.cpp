@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/analysis/CHarmAnlsChords.h"
 
-#include "brindle/analysis/internal/JsonText.h"
+#include "brindle/analysis/internal/NativeText.h"
 
 #include <algorithm>
 #include <cmath>
@@ -60,7 +60,7 @@ void CHarmAnlsChords::SortByPosition() {
 }
 
 void CHarmAnlsChords::AppendJSONString(std::ostream& stream) const {
-    JsonText::WriteList(stream, *this);
+    NativeText::WriteList(stream, *this);
 }
 
 }  // namespace brindle

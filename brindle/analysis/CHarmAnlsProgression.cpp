@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/analysis/CHarmAnlsProgression.h"
 
-#include "brindle/analysis/internal/JsonText.h"
+#include "brindle/analysis/internal/NativeText.h"
 #include "brindle/theory/CScaleLite.h"
 #include "brindle/theory/KeyIntervals.h"
 
@@ -15,7 +15,7 @@ namespace brindle {
 
 namespace {
 
-std::int64_t Distance(std::int32_t from, std::int32_t to) {
+std::int64_t StepsBetween(std::int32_t from, std::int32_t to) {
     return std::int64_t{to} - std::int64_t{from};
 }
 
@@ -84,9 +84,9 @@ bool CHarmAnlsProgression::MatchesHarmChordsFrom(const CHarmAnlsChords& chords,
         if (!element->mSemitonesMatch.Matches(chord->mSemitones)) return false;
         if (element == begin() || chord == chords.begin()) continue;
         const auto wanted =
-            Distance(std::prev(element)->mRootDistToHarmCenter, element->mRootDistToHarmCenter);
+            StepsBetween(std::prev(element)->mRootDistToHarmCenter, element->mRootDistToHarmCenter);
         const auto played =
-            Distance(std::prev(chord)->mRootKeyEnh.mKeyNr, chord->mRootKeyEnh.mKeyNr);
+            StepsBetween(std::prev(chord)->mRootKeyEnh.mKeyNr, chord->mRootKeyEnh.mKeyNr);
         if (FoldIntoOctave(wanted) != FoldIntoOctave(played)) return false;
     }
     return true;
@@ -122,7 +122,7 @@ CHarmCenterLite CHarmAnlsProgression::HarmCenterCalculatedFromFoundProgressionNt
     }
     const auto chord = it + static_cast<std::ptrdiff_t>(n);
     const std::int32_t rootDist = (*this)[n].mRootDistToHarmCenter;
-    const int key = FoldIntoOctave(Distance(rootDist, chord->mRootKeyEnh.mKeyNr));
+    const int key = FoldIntoOctave(StepsBetween(rootDist, chord->mRootKeyEnh.mKeyNr));
     CHarmCenterLite center{{key, TEnh_n}, SemitonesFromSignKeyType(mSignKeyType)};
     _SetEnhForHarmCenter(center, it, chords, rootDist, chord);
     return center;
@@ -168,7 +168,7 @@ void CHarmAnlsProgression::_SetEnhForHarmCenter(CHarmCenterLite& center, chord_i
 }
 
 void CHarmAnlsProgression::AppendJSONString(std::ostream& stream) const {
-    JsonText::WriteList(stream, *this);
+    NativeText::WriteList(stream, *this);
 }
 
 std::ostream& operator<<(std::ostream& stream, const CHarmAnlsProgressionEl& element) {

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/analysis/CHarmAnlsProgressions.h"
 
-#include "brindle/analysis/internal/JsonText.h"
+#include "brindle/analysis/internal/NativeText.h"
 
 #include <algorithm>
 #include <ostream>
@@ -64,7 +64,7 @@ CHarmAnlsProgressions CHarmAnlsProgressions::SortAndGetBestMatchingProgressions(
 }
 
 void CHarmAnlsProgressions::AppendJSONString(std::ostream& stream) const {
-    JsonText::WriteList(stream, *this);
+    NativeText::WriteList(stream, *this);
 }
 
 std::ostream& operator<<(std::ostream& stream, const CHarmAnlsProgressions& progressions) {

@@ -34,51 +34,51 @@ CHarmAnlsProgressions TableOf(std::span<const CRow> rows) {
     return table;
 }
 
-constexpr const CSemitonesMatch* Major = &ChordPattern::Major;
-constexpr const CSemitonesMatch* Minor = &ChordPattern::Minor;
-constexpr const CSemitonesMatch* Diminished = &ChordPattern::Diminished;
-constexpr const CSemitonesMatch* HalfDiminished = &ChordPattern::HalfDiminished;
-constexpr const CSemitonesMatch* Dominant7 = &ChordPattern::Dominant7;
+constexpr const CSemitonesMatch* kMajor = &ChordPattern::Major;
+constexpr const CSemitonesMatch* kMinor = &ChordPattern::Minor;
+constexpr const CSemitonesMatch* kDiminished = &ChordPattern::Diminished;
+constexpr const CSemitonesMatch* kHalfDiminished = &ChordPattern::HalfDiminished;
+constexpr const CSemitonesMatch* kDominant7 = &ChordPattern::Dominant7;
 
-constexpr TSignKeyType kMajor = TSignKeyType_Major;
-constexpr TSignKeyType kMinor = TSignKeyType_Minor;
+constexpr TSignKeyType kMajorKey = TSignKeyType_Major;
+constexpr TSignKeyType kMinorKey = TSignKeyType_Minor;
 
 // Rows that are equal in length and priority are tried in the order of the table.
 // clang-format off
 
 CHarmAnlsProgressions MakeTonicProgressions() {
-    // elements: quality and distance from the tonic                            priority  mode
+    // elements: quality and distance from the tonic                    priority  mode
     const CRow rows[] = {
-        {{{Dominant7, 7}, {Major, 0}},                                               9, kMajor},
-        {{{Major, 7}, {Major, 0}},                                                   8, kMajor},
-        {{{Major, 0}, {Major, 5}},                                                   8, kMajor},  // ends on the subdominant
-        {{{Diminished, 11}, {Major, 0}},                                             8, kMajor},
-        {{{Dominant7, 1}, {Major, 0}},                                               8, kMajor},  // the tritone substitute of the dominant
-        {{{Minor, 2}, {Major, 7}, {Major, 0}},                                       8, kMajor},
-        {{{Minor, 5}, {Major, 7}, {Major, 0}},                                       6, kMajor},
-        {{{Major, 9}, {Minor, 2}, {Major, 7}, {Major, 0}},                           8, kMajor},  // a secondary dominant first, that of the second degree
-        {{{Major, 5}, {Minor, 5}, {Major, 0}},                                       4, kMajor},  // the minor subdominant is borrowed from the parallel key
-        {{{Major, 5}, {HalfDiminished, 2}, {Major, 0}},                             10, kMajor},
-        {{{Major, 5}, {Major, 7}, {Minor, 9}},                                       4, kMajor},  // deceptive: the tonic does not sound
-        {{{Major, 0}, {Major, 5}, {HalfDiminished, 2}, {Major, 0}},                  4, kMajor},
-        {{{Minor, 2}, {Major, 7}, {Minor, 0}},                                       8, kMinor},
-        {{{Diminished, 2}, {Major, 7}, {Minor, 0}},                                  8, kMinor},
-        {{{Major, 7}, {Minor, 0}},                                                   4, kMinor},
+        {{{kDominant7, 7}, {kMajor, 0}},                                  9, kMajorKey},
+        {{{kMajor, 7}, {kMajor, 0}},                                      8, kMajorKey},
+        {{{kMajor, 0}, {kMajor, 5}},                                      8, kMajorKey},  // ends on the subdominant
+        {{{kDiminished, 11}, {kMajor, 0}},                                8, kMajorKey},
+        {{{kDominant7, 1}, {kMajor, 0}},                                  8, kMajorKey},  // the tritone substitute of the dominant
+        {{{kMinor, 2}, {kMajor, 7}, {kMajor, 0}},                         8, kMajorKey},
+        {{{kMinor, 5}, {kMajor, 7}, {kMajor, 0}},                         6, kMajorKey},
+        {{{kMajor, 9}, {kMinor, 2}, {kMajor, 7}, {kMajor, 0}},            8, kMajorKey},  // a secondary dominant first, that of the second degree
+        {{{kMajor, 5}, {kMinor, 5}, {kMajor, 0}},                         4, kMajorKey},  // the minor subdominant is borrowed from the parallel key
+        {{{kMajor, 5}, {kHalfDiminished, 2}, {kMajor, 0}},               10, kMajorKey},
+        {{{kMajor, 5}, {kMajor, 7}, {kMinor, 9}},                         4, kMajorKey},  // deceptive: the tonic does not sound
+        {{{kMajor, 0}, {kMajor, 5}, {kHalfDiminished, 2}, {kMajor, 0}},   4, kMajorKey},
+        {{{kMinor, 2}, {kMajor, 7}, {kMinor, 0}},                         8, kMinorKey},
+        {{{kDiminished, 2}, {kMajor, 7}, {kMinor, 0}},                    8, kMinorKey},
+        {{{kMajor, 7}, {kMinor, 0}},                                      4, kMinorKey},
     };
     return TableOf(rows);
 }
 
 CHarmAnlsProgressions MakeCadenceProgressions() {
-    // elements: quality and distance from the tonic                            priority  mode
+    // elements: quality and distance from the tonic                    priority  mode
     const CRow rows[] = {
-        {{{Minor, 9}, {Minor, 2}, {Major, 7}, {Major, 0}},                           8, kMajor},
-        {{{Minor, 2}, {Major, 7}, {Major, 0}},                                       8, kMajor},
-        {{{Major, 7}, {Major, 0}},                                                   4, kMajor},
-        {{{Major, 7}, {Minor, 9}},                                                   4, kMajor},
-        {{{Minor, 2}, {Major, 7}},                                                   2, kMajor},
-        {{{Minor, 2}, {Major, 7}, {Minor, 0}},                                       8, kMinor},
-        {{{Diminished, 2}, {Major, 7}, {Minor, 0}},                                  8, kMinor},
-        {{{Major, 7}, {Minor, 0}},                                                   4, kMinor},
+        {{{kMinor, 9}, {kMinor, 2}, {kMajor, 7}, {kMajor, 0}},            8, kMajorKey},
+        {{{kMinor, 2}, {kMajor, 7}, {kMajor, 0}},                         8, kMajorKey},
+        {{{kMajor, 7}, {kMajor, 0}},                                      4, kMajorKey},
+        {{{kMajor, 7}, {kMinor, 9}},                                      4, kMajorKey},
+        {{{kMinor, 2}, {kMajor, 7}},                                      2, kMajorKey},
+        {{{kMinor, 2}, {kMajor, 7}, {kMinor, 0}},                         8, kMinorKey},
+        {{{kDiminished, 2}, {kMajor, 7}, {kMinor, 0}},                    8, kMinorKey},
+        {{{kMajor, 7}, {kMinor, 0}},                                      4, kMinorKey},
     };
     return TableOf(rows);
 }

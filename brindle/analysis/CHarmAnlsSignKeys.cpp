@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/analysis/CHarmAnlsSignKeys.h"
 
-#include "brindle/analysis/internal/JsonText.h"
 #include "brindle/analysis/internal/MergeAdjacent.h"
+#include "brindle/analysis/internal/NativeText.h"
 
 #include <iterator>
 
@@ -27,7 +27,7 @@ void CHarmAnlsSignKey::IfUndefFillWithHarmAnlsCenter(const CHarmAnlsCenter& cent
 
 void CHarmAnlsSignKey::AppendJSONString(std::ostream& stream) const {
     PlainText::Write(stream, R"({"Probability":)");
-    JsonText::WriteProbability(stream, mProbability);
+    NativeText::WriteProbability(stream, mProbability);
     PlainText::Write(stream, R"(, "Position":)");
     PlainText::WriteFixed(stream, mPosition);
     PlainText::Write(stream, R"(, "SignKey":)");
@@ -60,7 +60,7 @@ void CHarmAnlsSignKeys::MergeAdjacentSameHarmCenters() {
 }
 
 void CHarmAnlsSignKeys::AppendJSONString(std::ostream& stream) const {
-    JsonText::WriteList(stream, *this);
+    NativeText::WriteList(stream, *this);
 }
 
 }  // namespace brindle

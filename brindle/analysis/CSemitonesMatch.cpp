@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/analysis/CSemitonesMatch.h"
 
-#include "brindle/analysis/internal/JsonText.h"
+#include "brindle/analysis/internal/NativeText.h"
 #include "brindle/theory/CIntvlSet.h"
 
 #include <algorithm>
@@ -54,7 +54,7 @@ bool CSemitonesMatches::Matches(CSemitones semitones) const {
 }
 
 void CSemitonesMatches::AppendJSONString(std::ostream& stream) const {
-    JsonText::WriteList(stream, *this);
+    NativeText::WriteList(stream, *this);
 }
 
 }  // namespace brindle

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/analysis/CSeparatorPattern.h"
+#include "brindle/platform/Ascii.h"
 
 #include <cstddef>
 #include <utility>
@@ -9,7 +10,6 @@ namespace brindle {
 namespace {
 
 constexpr std::string_view kWhiteSpacePattern = "\\s+";
-constexpr std::string_view kWhiteSpace = " \t\n\v\f\r";
 
 // The matcher of the standard library may recurse once per character, and its time may grow with
 // the square of the text. It therefore sees one window at a time, and a match counts when it begins
@@ -74,10 +74,10 @@ std::vector<std::string> SplitAtWhiteSpace(std::string_view text) {
     std::vector<std::string> pieces;
     std::size_t begin = 0;
     while (true) {
-        const std::size_t end = text.find_first_of(kWhiteSpace, begin);
+        const std::size_t end = text.find_first_of(Ascii::kWhiteSpace, begin);
         if (end == text.npos) break;
         pieces.emplace_back(text.substr(begin, end - begin));
-        begin = text.find_first_not_of(kWhiteSpace, end);
+        begin = text.find_first_not_of(Ascii::kWhiteSpace, end);
         if (begin == text.npos) return pieces;
     }
     pieces.emplace_back(text.substr(begin));

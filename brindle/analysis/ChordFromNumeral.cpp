@@ -5,6 +5,7 @@
 #include "brindle/analysis/internal/NumeralDegree.h"
 #include "brindle/analysis/internal/NumeralTables.h"
 #include "brindle/analysis/internal/NumeralTones.h"
+#include "brindle/platform/Ascii.h"
 #include "brindle/theory/CChordNamePrefs.h"
 #include "brindle/theory/KeyIntervals.h"
 
@@ -24,8 +25,6 @@ constexpr std::string_view kNoTarget = "a degree or a bass is expected behind th
 constexpr std::string_view kNoTones = "nothing is left of the chord";
 constexpr std::string_view kTooLong = "this is too long for a numeral";
 constexpr std::string_view kNoKey = "there is no key";
-
-constexpr std::string_view kWhiteSpace = " \t\n\r\f\v";
 
 /// What the slashes cut. The views are pieces of the folded text.
 struct CNumeralPieces {
@@ -145,7 +144,7 @@ CNumeralPieces PiecesOf(std::string_view text) {
 }
 
 /// A chord before its root and bass are spelled.
-struct CReadChord {
+struct CChordOfNumeral {
     CNumeralDegree mDegree;
     CSemitones mSemitones;
     int mBass = 0;      ///< semitones above the root
@@ -154,15 +153,15 @@ struct CReadChord {
     std::string_view mFaultPiece;
 };
 
-CReadChord Failed(std::string_view fault, std::string_view piece) {
-    CReadChord chord;
+CChordOfNumeral Failed(std::string_view fault, std::string_view piece) {
+    CChordOfNumeral chord;
     chord.mFault = fault;
     chord.mFaultPiece = piece;
     return chord;
 }
 
 bool ApplyGroups(const CFoldedNumeral& text, const CNumeralRoot& root, CReadTones& tones,
-                 CReadChord& chord) {
+                 CChordOfNumeral& chord) {
     for (std::size_t i = 0; i < text.GroupCount(); ++i) {
         if (ApplyGroup(text.Group(i), root, tones)) continue;
         chord = Failed(kNoGroup, text.Group(i));
@@ -198,11 +197,11 @@ int StepInAugmentedSixth(int semitone, bool isFrench) {
     return 5;
 }
 
-CReadChord ReadAugmentedSixth(const CAugmentedSixth& sixth, std::string_view tail,
-                              const CFoldedNumeral& text, TSignKeyType type) {
+CChordOfNumeral ReadAugmentedSixth(const CAugmentedSixth& sixth, std::string_view tail,
+                                   const CFoldedNumeral& text, TSignKeyType type) {
     const CAugmentedSixthFigure* figure = FigureOfAugmentedSixth(tail);
     if (figure == nullptr) return Failed(kNoSign, tail);
-    CReadChord chord;
+    CChordOfNumeral chord;
     chord.mDegree = FoldMinorFlat(sixth.mRoot, type);
     const bool isFrench = sixth.mRoot.mNumber == 2;
     chord.mBass = isFrench ? figure->mBassInFrench : figure->mBassInMost;
@@ -226,8 +225,8 @@ int RaisedInMinor(const CReadDegree& degree, bool isDiminished, const CNumeralOp
     return options.mByKey || (isDiminished && options.mFigures) ? 1 : 0;
 }
 
-CNumeralDegree DegreeInKey(const CReadDegree& read, std::string_view tail, TSignKeyType type,
-                           const CNumeralOptions& options) {
+CNumeralDegree DegreeReadInKey(const CReadDegree& read, std::string_view tail, TSignKeyType type,
+                               const CNumeralOptions& options) {
     CNumeralDegree degree = FoldMinorFlat(read.mDegree, type);
     if (type != TSignKeyType_Minor) return degree;
     const bool isDiminished = tail.starts_with('o') || tail.starts_with('h');
@@ -269,8 +268,8 @@ CHead ReadHead(std::string_view text, TSignKeyType type) {
     return head;
 }
 
-CReadChord ReadChord(const CNumeralPieces& pieces, const CFoldedNumeral& text, TSignKeyType type,
-                     CNumeralOptions options) {
+CChordOfNumeral ReadChord(const CNumeralPieces& pieces, const CFoldedNumeral& text,
+                          TSignKeyType type, CNumeralOptions options) {
     std::string_view tail = pieces.mChord;
     if (const CAugmentedSixth* sixth = TakeAugmentedSixth(tail)) {
         return ReadAugmentedSixth(*sixth, tail, text, type);
@@ -283,8 +282,8 @@ CReadChord ReadChord(const CNumeralPieces& pieces, const CFoldedNumeral& text, T
         if (!head.mTail.empty() || tailOfSign.empty()) return Failed(kNoSign, pieces.mSlashedTail);
         head.mTail = tailOfSign;
     }
-    CReadChord chord;
-    chord.mDegree = DegreeInKey(head.mDegree, head.mTail, type, options);
+    CChordOfNumeral chord;
+    chord.mDegree = DegreeReadInKey(head.mDegree, head.mTail, type, options);
     const CNumeralRoot root{chord.mDegree, type, head.mDegree.mIsSmall};
     CReadTones tones = TonesOfTail(head.mTail, root, options);
     if (tones.mSemitones.IsEmpty()) return Failed(kNoSign, head.mTail);
@@ -319,7 +318,8 @@ CKeyEnh ReadBass(const CNumeralPieces& pieces, const CSignKeyLite& key) {
 std::optional<CSignKeyLite> KeyOfTarget(std::string_view target, const CSignKeyLite& key,
                                         const CNumeralOptions& options) {
     const CHead head = ReadHead(target, key.mSignKeyType);
-    const CNumeralDegree degree = DegreeInKey(head.mDegree, head.mTail, key.mSignKeyType, options);
+    const CNumeralDegree degree =
+        DegreeReadInKey(head.mDegree, head.mTail, key.mSignKeyType, options);
     const CNumeralRoot root{degree, key.mSignKeyType, head.mDegree.mIsSmall};
     if (TonesOfTail(head.mTail, root, options).mSemitones.IsEmpty()) return std::nullopt;
     const bool isMinor = head.mDegree.mIsSmall || head.mTail.starts_with('m');
@@ -331,7 +331,7 @@ CNumeralReading Fault(std::string_view fault, std::string_view piece, const CFol
     return {CChordLite_Undef, fault, text.OffsetOf(piece)};
 }
 
-CNumeralReading Finished(const CReadChord& chord, const CSignKeyLite& keyOfTarget,
+CNumeralReading Finished(const CChordOfNumeral& chord, const CSignKeyLite& keyOfTarget,
                          const CNumeralPieces& pieces, const CSignKeyLite& key,
                          const CFoldedNumeral& text) {
     const CKeyEnh root = KeyOfDegree(chord.mDegree, keyOfTarget);
@@ -349,7 +349,8 @@ CNumeralReading Finished(const CReadChord& chord, const CSignKeyLite& keyOfTarge
 CNumeralReading ReadNumeral(std::string_view typed, const CSignKeyLite& key,
                             const CNumeralOptions& options) {
     if (key.IsUndef()) return {CChordLite_Undef, kNoKey, 0};
-    if (typed.find_first_of(kWhiteSpace) != typed.npos) return {CChordLite_Undef, kNoDegree, 0};
+    if (typed.find_first_of(Ascii::kWhiteSpace) != typed.npos)
+        return {CChordLite_Undef, kNoDegree, 0};
     if (typed.size() > CFoldedNumeral::kLongest) return {CChordLite_Undef, kTooLong, 0};
     const CFoldedNumeral text(typed);
     if (!text.IsWhole())
@@ -362,7 +363,7 @@ CNumeralReading ReadNumeral(std::string_view typed, const CSignKeyLite& key,
         if (!target) return Fault(kNoSign, pieces.mTargets[i], text);
         keyOfTarget = *target;
     }
-    const CReadChord chord = ReadChord(pieces, text, keyOfTarget.mSignKeyType, options);
+    const CChordOfNumeral chord = ReadChord(pieces, text, keyOfTarget.mSignKeyType, options);
     if (!chord.mFault.empty()) return Fault(chord.mFault, chord.mFaultPiece, text);
     if (chord.mSemitones.IsEmpty()) return {CChordLite_Undef, kNoTones, 0};
     return Finished(chord, keyOfTarget, pieces, key, text);

@@ -15,7 +15,7 @@
 namespace brindle {
 namespace {
 
-constexpr int kMinorSeventh = 10;
+constexpr int kMinorSeventhUp = 10;
 constexpr int kLetterCount = 7;
 
 // A to G, 0 is C; -1 for a key that is no letter with its accidental.
@@ -83,7 +83,7 @@ TSeventhSpelling SeventhSpellingOf(const CKeyEnh& root, const CKeyEnh& seventh) 
     const int letter = LetterOfKey(seventh);
     if (rootLetter < 0 || letter < 0) return TSeventhSpelling_Undef;
     const int up = FoldIntoOctave(std::int64_t{seventh.mKeyNr} - root.mKeyNr);
-    if (up != kMinorSeventh) return TSeventhSpelling_Undef;
+    if (up != kMinorSeventhUp) return TSeventhSpelling_Undef;
     const int letters = (letter - rootLetter + kLetterCount) % kLetterCount;
     if (letters == 6) return TSeventhSpelling_MinorSeventh;
     return letters == 5 ? TSeventhSpelling_AugmentedSixth : TSeventhSpelling_Undef;

@@ -1,12 +1,11 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/analysis/ReadNumerals.h"
+#include "brindle/platform/Ascii.h"
 
 #include <algorithm>
 
 namespace brindle {
 namespace {
-
-constexpr std::string_view kBlanks = " \t\r\f\v";
 
 std::size_t CharactersOf(std::string_view text) {
     return static_cast<std::size_t>(std::count_if(text.begin(), text.end(), [](char c) {
@@ -22,13 +21,13 @@ std::vector<CNumeralWord> NumeralWords(std::string_view text) {
     std::size_t column = 1;
     while (!text.empty()) {
         const bool isBreak = text.front() == '\n';
-        if (isBreak || kBlanks.find(text.front()) != kBlanks.npos) {
+        if (Ascii::IsWhiteSpace(text.front())) {
             line += isBreak ? 1 : 0;
             column = isBreak ? 1 : column + 1;
             text.remove_prefix(1);
             continue;
         }
-        const std::string_view word = text.substr(0, text.find_first_of(" \t\r\f\v\n"));
+        const std::string_view word = text.substr(0, text.find_first_of(Ascii::kWhiteSpace));
         words.push_back({std::string(word), line, column, {}});
         column += CharactersOf(word);
         text.remove_prefix(word.size());

@@ -3,6 +3,7 @@
 
 #include "brindle/analysis/RomanNumeral.h"
 #include "brindle/analysis/internal/RomanTextWords.h"
+#include "brindle/platform/Ascii.h"
 
 #include <algorithm>
 #include <array>
@@ -12,7 +13,7 @@
 namespace brindle {
 namespace {
 
-constexpr std::size_t kMostMeasures = 1'000'000;
+constexpr std::size_t kMostBars = 1'000'000;
 constexpr std::size_t kMostCopiedWords = 1'000'000;
 constexpr std::size_t kMostFaults = 1'000;
 
@@ -37,7 +38,7 @@ bool IsDoubleBar(std::string_view word) {
     return word.find_first_not_of("|:") == word.npos && word.find('|') != word.npos;
 }
 
-bool IsNoChord(std::string_view word) {
+bool IsWordForNoChord(std::string_view word) {
     return word == "NC" || word == "N.C." || word == "NC.";
 }
 
@@ -104,7 +105,7 @@ CRomanTextReading CRomanTextReader::Read(std::string_view text) {
 }
 
 void CRomanTextReader::ReadLine() {
-    std::string_view line = Trimmed(mLine);
+    std::string_view line = Ascii::Trimmed(mLine);
     if (line.empty()) return;
     if (const auto range = TakeMeasures(line)) return ReadMeasureLine(line, *range);
     const std::size_t colon = mLine.find(':');
@@ -113,8 +114,8 @@ void CRomanTextReader::ReadLine() {
 }
 
 void CRomanTextReader::ReadHeader(std::size_t colon) {
-    const std::string_view name = Trimmed(mLine.substr(0, colon));
-    const std::string_view value = Trimmed(mLine.substr(colon + 1));
+    const std::string_view name = Ascii::Trimmed(mLine.substr(0, colon));
+    const std::string_view value = Ascii::Trimmed(mLine.substr(colon + 1));
     const auto set = [&](std::string& field) {
         if (field.empty()) field = value;
     };
@@ -137,9 +138,9 @@ void CRomanTextReader::ReadTime(std::string_view value) {
 }
 
 void CRomanTextReader::ReadMeasureLine(std::string_view rest, const CMeasureRange& range) {
-    rest = Trimmed(rest);
+    rest = Ascii::Trimmed(rest);
     if (range.mIsVariant) return Fail("another reading of the measure is left out", mLine, true);
-    if (rest.starts_with('=')) return CopyMeasures(range, Trimmed(rest.substr(1)));
+    if (rest.starts_with('=')) return CopyMeasures(range, Ascii::Trimmed(rest.substr(1)));
     if (range.mLast != range.mFirst) return Fail("more than one measure is a copy, with =", mLine);
     if (rest.starts_with(':')) rest.remove_prefix(1);
     const CMeasureText measure{rest, mLine, mLineNumber};
@@ -150,7 +151,8 @@ void CRomanTextReader::ReadMeasureLine(std::string_view rest, const CMeasureRang
 void CRomanTextReader::CopyMeasures(const CMeasureRange& range, std::string_view source) {
     const std::string_view typed = source;
     const auto from = TakeMeasures(source);
-    if (!from || !Trimmed(source).empty()) return Fail("measures are expected behind =", typed);
+    if (!from || !Ascii::Trimmed(source).empty())
+        return Fail("measures are expected behind =", typed);
     const int count = from->mLast - from->mFirst + 1;
     if (range.mLast - range.mFirst + 1 != count) {
         return Fail("the copy is not as long as what is copied", typed);
@@ -172,7 +174,7 @@ void CRomanTextReader::CopyMeasures(const CMeasureRange& range, std::string_view
 // Measures that are not written go on with the chord before them.
 void CRomanTextReader::FillTo(int number) {
     const double length = mTime.BarLength();
-    while (mLastNumber >= 0 && mLastNumber + 1 < number && mReading.mBars.size() < kMostMeasures) {
+    while (mLastNumber >= 0 && mLastNumber + 1 < number && mReading.mBars.size() < kMostBars) {
         mReading.mBars.push_back({++mLastNumber, mEnd, length});
         mEnd += length;
     }
@@ -183,7 +185,7 @@ void CRomanTextReader::AddMeasure(int number, const CMeasureText& measure, bool 
         Fail(kNotHigher, mLine);
     }
     FillTo(number);
-    if (mReading.mBars.size() >= kMostMeasures) return Fail("there are too many measures", mLine);
+    if (mReading.mBars.size() >= kMostBars) return Fail("there are too many measures", mLine);
     mLastNumber = number;
     CPlaceInText place{mEnd, mTime.BarLength(), mEnd};
     std::string_view rest = measure.mText;
@@ -228,7 +230,7 @@ void CRomanTextReader::ReadNumeralAt(std::string_view word, CPlaceInText& place)
     chord.mPosition = place.mPosition;
     chord.mChord = CChordLite_NoChordYield;
     if (mKey) chord.mKey = *mKey;
-    if (!IsNoChord(word)) {
+    if (!IsWordForNoChord(word)) {
         if (!mKey) return Fail("a numeral needs a key before it, as in C: I", word);
         const CNumeralReading reading =
             ReadNumeral(word, *mKey, {.mFigures = true, .mByKey = true});

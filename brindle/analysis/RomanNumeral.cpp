@@ -18,7 +18,7 @@
 namespace brindle {
 namespace {
 
-constexpr int kDominantDegree = 7;
+constexpr int kDistOfDominant = 7;
 
 int IntvlBetween(const CKeyEnh& from, const CKeyEnh& to) {
     return FoldIntoOctave(std::int64_t{to.mKeyNr} - from.mKeyNr);
@@ -66,7 +66,7 @@ const CApplied* AppliedBy(const CChordLite& chord, const CSignKeyLite& key, int 
     const int dist = DistToTonic(chord.mRootKeyEnh, key);
     const int up = FoldIntoOctave(target - dist);
     if (chordClass == TKeyChordClass_Dim) return up == 1 ? &kLeadingTone : nullptr;
-    if (chordClass != TKeyChordClass_Dom || dist == kDominantDegree) return nullptr;
+    if (chordClass != TKeyChordClass_Dom || dist == kDistOfDominant) return nullptr;
     if (up == 5) return &kDominant;
     return up == 11 ? &kSubstitute : nullptr;
 }

@@ -10,17 +10,17 @@ namespace {
 
 constexpr std::size_t kMostChoices = 5;
 
-int CostOfStep(const CNamingCandidate& chord, const CNamingCandidate& next) {
+int CostOfNextName(const CNamingCandidate& chord, const CNamingCandidate& next) {
     const bool isSame = chord.mRoot == next.mRoot && chord.TonesOfType() == next.TonesOfType();
     if (isSame) return 0;
     // The mean of what both chords say to the step, weighed as NameNotes weighs known neighbours.
     return (NextRootCost(chord, next.mRoot) + PreviousRootCost(next, chord.mRoot)) * 4 / 10;
 }
 
-using TChoices = std::vector<std::span<const CNamingCandidate>>;
+using TNameChoices = std::vector<std::span<const CNamingCandidate>>;
 
-TChoices ChoicesOf(const std::vector<CNamingCandidates>& candidates) {
-    TChoices choices;
+TNameChoices ChoicesOf(const std::vector<CNamingCandidates>& candidates) {
+    TNameChoices choices;
     choices.reserve(candidates.size());
     for (const CNamingCandidates& each : candidates) {
         choices.push_back(each.List().first(std::min(each.List().size(), kMostChoices)));
@@ -51,7 +51,7 @@ std::vector<std::vector<CNamedChord>> NameProgression(std::span<const std::vecto
         candidates.emplace_back(NoteKeysOf(sets[ix]), own);
     }
     const auto costOf = [](const CNamingCandidate& candidate) { return candidate.mCost; };
-    const auto path = CheapestPath(ChoicesOf(candidates), costOf, CostOfStep);
+    const auto path = CheapestPath(ChoicesOf(candidates), costOf, CostOfNextName);
     std::vector<std::vector<CNamedChord>> names;
     names.reserve(sets.size());
     for (std::size_t ix = 0; ix < sets.size(); ++ix) {

@@ -23,7 +23,7 @@ struct CPick {
 };
 
 constexpr CPick kThird{3, 4};
-constexpr CPick kFifth{7, 6};
+constexpr CPick kPickOfFifth{7, 6};
 constexpr auto kOtherDegrees = std::to_array<CPick>({{2, 1}, {5, 6}, {5, 7}, {9, 8}, {10, 11}});
 
 void FillDegree(CSemitones& scale, const CSemitones& base, CPick pick) {
@@ -104,7 +104,7 @@ CScaleHeavy CScaleHeavy::ConstructScaleForChord(const CChordHeavy& chord) const 
         scale.AddIntvl(8);
         scale.AddIntvl(9);
     } else {
-        FillDegree(scale, base, kFifth);
+        FillDegree(scale, base, kPickOfFifth);
     }
     for (const CPick pick : kOtherDegrees) FillDegree(scale, base, pick);
 

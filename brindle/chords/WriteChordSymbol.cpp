@@ -7,6 +7,7 @@
 #include "brindle/chords/WriteChordSymbol.h"
 
 #include "brindle/chords/internal/SignsOfRoot.h"
+#include "brindle/platform/Ascii.h"
 #include "brindle/theory/KeyIntervals.h"
 #include "brindle/theory/KeyNames.h"
 
@@ -69,10 +70,6 @@ constexpr auto kNumberRows = std::to_array<CNumberRow>({
     {Tones(2, 9), "69"},
     {Tones(9), "6"},
 });
-
-constexpr bool IsDigit(char c) {
-    return c >= '0' && c <= '9';
-}
 
 class CSuffixWriter {
 public:
@@ -153,7 +150,7 @@ private:
     }
 
     [[nodiscard]] std::string Alterations() const {
-        const bool isBehindNumber = !mNumber.empty() && IsDigit(mNumber.back());
+        const bool isBehindNumber = !mNumber.empty() && Ascii::IsDigit(mNumber.back());
         std::string text;
         for (const std::string_view alteration : mAlterations) {
             if (!text.empty() && !isBehindNumber) text += ',';
@@ -210,7 +207,7 @@ std::string WithUnicodeSigns(std::string_view text) {
 
 bool TakesSignOf(const CKeyEnh& root, std::string_view suffix) {
     const bool hasTwoSigns = std::abs(EnhToSemitone(WithTwoSignsAtMost(root).mEnh)) == 2;
-    return hasTwoSigns && !suffix.empty() && IsDigit(suffix.front());
+    return hasTwoSigns && !suffix.empty() && Ascii::IsDigit(suffix.front());
 }
 
 std::string ChordSymbolSuffix(CSemitones semitones) {

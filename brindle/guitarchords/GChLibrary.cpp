@@ -9,7 +9,7 @@ namespace brindle {
 
 namespace {
 
-std::int64_t NextRunTimeID() {
+std::int64_t NextRunTimeIDOfLibrary() {
     static constinit std::atomic<std::int64_t> last = 0;
     return ++last;
 }
@@ -17,7 +17,7 @@ std::int64_t NextRunTimeID() {
 }  // namespace
 
 GChLibrary::GChLibrary(const std::shared_ptr<GChTuning>& tuning, std::filesystem::path path)
-    : mGchTuning(tuning), mLibraryPath(std::move(path)), mRunTimeID(NextRunTimeID()) {}
+    : mGchTuning(tuning), mLibraryPath(std::move(path)), mRunTimeID(NextRunTimeIDOfLibrary()) {}
 
 void GChLibrary::addChordRangePriv(const std::shared_ptr<GChBasicChord>& chord) {
     if (chord == nullptr) return;

@@ -11,14 +11,14 @@ namespace brindle {
 
 namespace {
 
-std::int64_t NextRunTimeID() {
+std::int64_t NextRunTimeIDOfTuning() {
     static constinit std::atomic<std::int64_t> last = 0;
     return ++last;
 }
 
 }  // namespace
 
-GChTuning::GChTuning(const GChShortTuning& shortTuning) : mRunTimeID(NextRunTimeID()) {
+GChTuning::GChTuning(const GChShortTuning& shortTuning) : mRunTimeID(NextRunTimeIDOfTuning()) {
     if (GChIsValidShortTuning(shortTuning)) mShortTuning = shortTuning;
 }
 

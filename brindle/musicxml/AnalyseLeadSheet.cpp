@@ -14,10 +14,6 @@ namespace brindle {
 
 namespace {
 
-bool IsNoChord(const TMusicXMLHarmony& harmony) {
-    return harmony.mRoot.mStep == "N.C." || harmony.mKind == "none";
-}
-
 CHarmAnlsChordWithPos ChordOf(const TMusicXMLHarmony& harmony) {
     CChordLite chord;
     chord.SetFromChordHeavy(CChordSetFromMusicXml(harmony, 24, CurrentChordNamePrefs));
@@ -79,7 +75,7 @@ void CHarmonicAnalyse::AnalyseFromMusicXMLDoc(const TMusicXMLDoc& doc, TAnalyse 
     mSignKeys.insert(mSignKeys.end(), doc.HarmSignKeys.begin(), doc.HarmSignKeys.end());
     double end = kPosUndef;
     for (const TMusicXMLHarmony& harmony : doc.Harmonies) {
-        if (IsNoChord(harmony)) continue;
+        if (harmony.IsNoChord()) continue;
         mChords.push_back(ChordOf(harmony));
         end = harmony.mPosition + harmony.mDuration;
     }

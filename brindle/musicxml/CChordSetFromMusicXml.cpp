@@ -54,8 +54,8 @@ constexpr auto kDegreeRows = std::to_array<CDegreeRow>({
 });
 // clang-format on
 
-constexpr std::string_view kFifth = "5";
-static_assert(kDegreeRows[14].mWord == kFifth);
+constexpr std::string_view kDegreeOfFifth = "5";
+static_assert(kDegreeRows[14].mWord == kDegreeOfFifth);
 
 int AlteredTone(int tone, std::int32_t alter) {
     using Limits = std::numeric_limits<int>;
@@ -76,9 +76,9 @@ void Add(const TMusicXMLDegree& degree, std::set<int>& intvls) {
 void Apply(const TMusicXMLDegree& degree, std::set<int>& intvls) {
     if (degree.mType == "add") {
         Add(degree, intvls);
-    } else if (degree.mType == "subtract" && degree.mValue == kFifth) {
+    } else if (degree.mType == "subtract" && degree.mValue == kDegreeOfFifth) {
         intvls.erase(7);
-    } else if (degree.mType == "alter" && degree.mValue == kFifth) {
+    } else if (degree.mType == "alter" && degree.mValue == kDegreeOfFifth) {
         intvls.erase(7);
         intvls.insert(AlteredTone(7, degree.mAlter));
     }

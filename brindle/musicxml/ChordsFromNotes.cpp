@@ -16,10 +16,11 @@ constexpr std::size_t kNeighboursChords = 4;
 /// Chords last: a new one needs a reason.
 constexpr int kChange = 20;
 
-using TChoices = std::vector<std::vector<CWindowChord>>;
+using TWindowChoices = std::vector<std::vector<CWindowChord>>;
 
-void AddChords(const CNoteWindow& window, const CSignKeyLite& key,
-               const std::vector<CWindowChord>& chords, std::vector<CWindowChord>& choices) {
+void AddChordsOfWindow(const CNoteWindow& window, const CSignKeyLite& key,
+                       const std::vector<CWindowChord>& chords,
+                       std::vector<CWindowChord>& choices) {
     for (std::size_t ix = 0; ix < std::min(chords.size(), kNeighboursChords); ++ix) {
         const auto isSame = [&](const CWindowChord& own) { return own.IsSameChord(chords[ix]); };
         if (std::any_of(choices.begin(), choices.end(), isSame)) continue;
@@ -29,24 +30,25 @@ void AddChords(const CNoteWindow& window, const CSignKeyLite& key,
 }
 
 /// The likeliest chords of each window, and those of its neighbours, which may last.
-TChoices ChoicesOf(const std::vector<CNoteWindow>& windows, const CSignKeyLite& key) {
-    TChoices own;
+TWindowChoices ChoicesOfWindows(const std::vector<CNoteWindow>& windows, const CSignKeyLite& key) {
+    TWindowChoices own;
     for (const CNoteWindow& window : windows) {
         own.push_back(window.IsSilent() ? std::vector<CWindowChord>()
                                         : LikeliestChords(window, key, kOwnChords));
     }
-    TChoices all = own;
+    TWindowChoices all = own;
     for (std::size_t ix = 0; ix < all.size(); ++ix) {
         if (windows[ix].IsSilent()) continue;
         for (const std::size_t reach : {1U, 2U}) {
-            if (ix >= reach) AddChords(windows[ix], key, own[ix - reach], all[ix]);
-            if (ix + reach < own.size()) AddChords(windows[ix], key, own[ix + reach], all[ix]);
+            if (ix >= reach) AddChordsOfWindow(windows[ix], key, own[ix - reach], all[ix]);
+            if (ix + reach < own.size())
+                AddChordsOfWindow(windows[ix], key, own[ix + reach], all[ix]);
         }
     }
     return all;
 }
 
-int CostOfStep(const CWindowChord& chord, const CWindowChord& next) {
+int CostOfNextChord(const CWindowChord& chord, const CWindowChord& next) {
     if (chord.IsSameChord(next)) return 0;
     const auto up = static_cast<std::size_t>(FoldIntoOctave(next.mRoot - chord.mRoot));
     const auto from = NamingFamilyOf(kNamingTypes[chord.mType].mTones);
@@ -57,9 +59,9 @@ int CostOfStep(const CWindowChord& chord, const CWindowChord& next) {
 /// The chord of each window; those of silent windows mean nothing.
 std::vector<CWindowChord> ChordsOf(const std::vector<CNoteWindow>& windows,
                                    const CSignKeyLite& key) {
-    const TChoices choices = ChoicesOf(windows, key);
+    const TWindowChoices choices = ChoicesOfWindows(windows, key);
     const auto costOf = [](const CWindowChord& chord) { return chord.mCost; };
-    const auto path = CheapestPath(choices, costOf, CostOfStep);
+    const auto path = CheapestPath(choices, costOf, CostOfNextChord);
     std::vector<CWindowChord> chords;
     for (std::size_t ix = 0; ix < choices.size(); ++ix) {
         chords.push_back(choices[ix].empty() ? CWindowChord() : choices[ix][path[ix]]);

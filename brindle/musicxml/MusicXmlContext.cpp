@@ -11,7 +11,7 @@ namespace {
 
 // The percentages of dynamics are of this velocity, a forte.
 constexpr std::int64_t kForte = 90;
-constexpr std::uint8_t kNoVelocity = 255;
+constexpr std::uint8_t kVelocityNotTold = 255;
 
 XmlNode At(const std::vector<XmlNode>& nodes, std::int32_t index) {
     if (index < 0 || static_cast<std::size_t>(index) >= nodes.size()) return {};
@@ -49,12 +49,12 @@ std::int32_t MusicXmlContext::ConvertMuxmlDurationToMidiTicks(std::int32_t durat
 }
 
 std::uint8_t MusicXmlContext::ConvertMuxmlDynamicsToMidiVelocity(std::int32_t dynamics) {
-    if (dynamics < 0) return kNoVelocity;
+    if (dynamics < 0) return kVelocityNotTold;
     return static_cast<std::uint8_t>(std::clamp<std::int64_t>(dynamics * kForte / 100, 1, 127));
 }
 
 std::uint8_t MusicXmlContext::ConvertMuxmlDynamicsToMidiRelVelocity(std::int32_t dynamics) {
-    if (dynamics < 0) return kNoVelocity;
+    if (dynamics < 0) return kVelocityNotTold;
     return static_cast<std::uint8_t>(std::min<std::int64_t>(dynamics * kForte / 100, 129));
 }
 

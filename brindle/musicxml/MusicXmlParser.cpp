@@ -21,7 +21,7 @@ namespace brindle {
 
 namespace {
 
-constexpr const char* kDomain = "org.thornbank.host10";
+constexpr const char* kErrorDomain = "org.thornbank.host10";
 constexpr int kCode = 259;
 constexpr const char* kXmlDomain = "NSXMLParserErrorDomain";
 constexpr const char* kFileDomain = "NSCocoaErrorDomain";
@@ -36,7 +36,7 @@ constexpr const char* kNoTemporaryFile = "Could not create temporary conversion 
 constexpr const char* kTemporaryName = "ThornbankMusicXMLImport.xml";
 
 Error LocalError(const char* description) {
-    return {kDomain, kCode, LocalizedString(description)};
+    return {kErrorDomain, kCode, LocalizedString(description)};
 }
 
 Error ErrorFrom(const XmlError& error) {

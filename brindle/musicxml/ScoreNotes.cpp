@@ -13,10 +13,10 @@
 namespace brindle {
 namespace {
 
-constexpr std::int32_t kTicksPerQuarter = 960;
+constexpr std::int32_t kTicksPerQuarterOfNotes = 960;
 
 double Quarters(std::int32_t ticks) {
-    return static_cast<double>(ticks) / kTicksPerQuarter;
+    return static_cast<double>(ticks) / kTicksPerQuarterOfNotes;
 }
 
 /// Three short notes make a beat of 6/8, 9/8 or 12/8.
@@ -78,7 +78,7 @@ std::shared_ptr<const MusicXmlParserDelegate> HostFor(
 bool Import(std::string_view bytes, const std::shared_ptr<const MusicXmlParserDelegate>& host,
             Error& error) {
     MusicXmlParser parser;
-    parser.MidiTicksPerQuarter = kTicksPerQuarter;
+    parser.MidiTicksPerQuarter = kTicksPerQuarterOfNotes;
     std::optional<std::string> unpacked;
     if (IsScoreContainer(bytes)) {
         unpacked = ScoreInContainer(bytes);

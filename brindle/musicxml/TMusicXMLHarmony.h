@@ -6,6 +6,7 @@
 
 #include <cstdint>
 #include <string>
+#include <string_view>
 #include <vector>
 
 namespace brindle {
@@ -46,6 +47,9 @@ enum TComparePos : std::int32_t {
     TComparePos_No = 1,
 };
 
+/// The symbol of no chord.
+inline constexpr std::string_view kNoChordSymbol = "N.C.";
+
 /// One chord symbol of a lead sheet where it is played. Positions and lengths are quarter notes.
 struct TMusicXMLHarmony {
     double mPosition = kPosUndef;
@@ -57,6 +61,11 @@ struct TMusicXMLHarmony {
     TMusicXMLPitch mBass;
     std::vector<TMusicXMLDegree> mDegrees;
     std::string mExtraText2;
+
+    /// Whether this is the sign that no chord sounds.
+    [[nodiscard]] bool IsNoChord() const {
+        return mRoot.mStep == kNoChordSymbol || mKind == "none";
+    }
 
     /// Equality of position (if asked for), kind, root, bass, duration and first text. The degrees
     /// are not compared.

@@ -6,6 +6,7 @@
 #include "brindle/musicxml/XMLParserDelegate_RecursiveMuxml_PartList.h"
 #include "brindle/musicxml/internal/CScoreIndex.h"
 #include "brindle/platform/Alerts.h"
+#include "brindle/platform/Ascii.h"
 #include "brindle/platform/Localization.h"
 
 #include <algorithm>
@@ -14,14 +15,6 @@
 namespace brindle {
 
 namespace {
-
-constexpr std::string_view kWhiteSpace = " \t\n\v\f\r";
-
-std::string_view Trimmed(std::string_view text) {
-    const std::size_t begin = text.find_first_not_of(kWhiteSpace);
-    if (begin == text.npos) return {};
-    return text.substr(begin, text.find_last_not_of(kWhiteSpace) + 1 - begin);
-}
 
 // The format with its places "%zd" and "%@" filled in their order.
 std::string Filled(const std::string& format, const std::vector<std::string>& values) {
@@ -106,7 +99,7 @@ void XMLParserDelegate_RecursiveMuxml::didEndElement(XmlStreamParser& parser,
 
 void XMLParserDelegate_RecursiveMuxml::foundCharacters(XmlStreamParser& parser,
                                                        std::string_view text) {
-    if (!text.starts_with('\n')) foundTrimmedCharacters(parser, Trimmed(text));
+    if (!text.starts_with('\n')) foundTrimmedCharacters(parser, Ascii::Trimmed(text));
 }
 
 void XMLParserDelegate_RecursiveMuxml::foundTrimmedCharacters(XmlStreamParser& parser,

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/neural/NeuronalNet.h"
 #include "brindle/neural/internal/NetTexts.h"
+#include "brindle/platform/Ascii.h"
 #include "brindle/platform/ReadNumber.h"
 
 #include <fmt/core.h>
@@ -35,13 +36,6 @@ std::optional<std::string> ReadLine(std::istream& stream) {
     }
     if (line.empty()) return std::nullopt;
     return line;
-}
-
-std::string_view Trimmed(std::string_view text) {
-    constexpr std::string_view kWhiteSpace = " \t\r\n\v\f";
-    const std::size_t begin = text.find_first_not_of(kWhiteSpace);
-    if (begin == std::string_view::npos) return {};
-    return text.substr(begin, text.find_last_not_of(kWhiteSpace) - begin + 1);
 }
 
 template <class Type, std::size_t size>
@@ -117,10 +111,10 @@ constexpr CLabel kLabels[] = {
 void ReadPropertyLine(std::string_view line, CLoadedProperties& properties) {
     const std::size_t split = line.find("//");
     if (split == std::string_view::npos) return;
-    const std::string_view label = Trimmed(line.substr(split + 2));
+    const std::string_view label = Ascii::Trimmed(line.substr(split + 2));
     for (const CLabel& known : kLabels) {
         if (known.mLabel != label) continue;
-        known.mRead(Trimmed(line.substr(0, split)), properties);
+        known.mRead(Ascii::Trimmed(line.substr(0, split)), properties);
         std::cout << known.mMessage << " erkannt!\n";
     }
 }

@@ -18,7 +18,7 @@ CNetTypeWords WordsOf(const std::array<CNetTypeWords, size>& table, std::size_t 
 }
 
 /// A text that grows by formatted pieces.
-class Text {
+class CNetText {
 public:
     template <class... Args>
     void Add(fmt::format_string<const Args&...> format, const Args&... args) {
@@ -32,7 +32,7 @@ public:
     std::string mText;
 };
 
-void AddProperties(Text& text, const TFixedNetProp& fixedProp, const TDynNetProp& dynProp) {
+void AddProperties(CNetText& text, const TFixedNetProp& fixedProp, const TDynNetProp& dynProp) {
     text.Add("Network Properties\n------------------\n");
     text.Add("Number Input Neurons: {}\n", fixedProp.mInputNeuronCount);
     text.Add("Number Output Neurons: {}\n", fixedProp.mOutputNeuronCount);
@@ -51,7 +51,7 @@ void AddProperties(Text& text, const TFixedNetProp& fixedProp, const TDynNetProp
     text.Add("\n");
 }
 
-void AddFailures(Text& text, const std::vector<training_pattern>& patterns,
+void AddFailures(CNetText& text, const std::vector<training_pattern>& patterns,
                  const std::vector<std::size_t>& failures) {
     text.Add("The following {} patterns (out of {}) were not recognized correctly by the net: \n",
              failures.size(), patterns.size());
@@ -64,7 +64,7 @@ void AddFailures(Text& text, const std::vector<training_pattern>& patterns,
     }
 }
 
-void AddWeights(Text& text, const std::vector<std::vector<Neuron>>& layers) {
+void AddWeights(CNetText& text, const std::vector<std::vector<Neuron>>& layers) {
     text.Add("Neuron Connection Weights\n-------------------------\n");
     for (std::size_t layer = 0; layer < layers.size(); ++layer) {
         for (std::size_t neuron = 0; neuron < layers[layer].size(); ++neuron) {
@@ -78,7 +78,7 @@ void AddWeights(Text& text, const std::vector<std::vector<Neuron>>& layers) {
     }
 }
 
-void AddNeuronSourceForm(Text& text, const TNeuronProp& neuron) {
+void AddNeuronSourceForm(CNetText& text, const TNeuronProp& neuron) {
     text.Add("\t\t{{\n\t\t\t{},\n", WordsOf(kInputTypeWords, neuron.mInputType).mSource);
     text.Add("\t\t\t{}, {:g}, {:g},\t// Activation Function Parameters\n",
              WordsOf(kActTypeWords, neuron.mActType).mSource, neuron.mActivationSlope,
@@ -93,7 +93,7 @@ void AddNeuronSourceForm(Text& text, const TNeuronProp& neuron) {
     text.Add("\t\t}}\n");
 }
 
-void AddSourceForm(Text& text, const TPredefinedWeights& net) {
+void AddSourceForm(CNetText& text, const TPredefinedWeights& net) {
     text.Add("static double weight_definitions[] =\n{{\n");
     for (const double weight : net.mWeights) text.Add("\t{:g},\n", weight);
     text.Add("}};\n\nstatic TPredefinedWeights weights = \n{{\n");
@@ -111,7 +111,7 @@ void AddSourceForm(Text& text, const TPredefinedWeights& net) {
     text.Add("\t}},\n\t\t\tweight_definitions \n}};\n\n");
 }
 
-void AddPropertyForm(Text& text, const TPredefinedWeights& net) {
+void AddPropertyForm(CNetText& text, const TPredefinedWeights& net) {
     const TDynNetProp& dynProp = net.mDynNetProp;
     text.Add("{}\t// Number Input Neurons\n", net.mFixedNetProp.mInputNeuronCount);
     text.Add("{}\t// Number Output Neurons\n", net.mFixedNetProp.mOutputNeuronCount);
@@ -144,7 +144,7 @@ std::string NeuronalNet::weights_to_text(int cycles, double overallError,
     const std::vector<double> weights = get_weights();
     const TPredefinedWeights net{mFixedNetProp, mDynNetProp, weights};
 
-    Text text;
+    CNetText text;
     AddProperties(text, mFixedNetProp, mDynNetProp);
     text.Add("Overall Error generated: {:g}\nCycles: {}\n", overallError, cycles);
     AddFailures(text, patterns, failures);
@@ -160,7 +160,7 @@ void NeuronalNet::trace() const {
 
 std::ostream& operator<<(std::ostream& stream, const NeuronalNet& net) {
     const TNeuronProp& neuron = net.mDynNetProp.mNeuronProp;
-    Text text;
+    CNetText text;
     text.Add("Neuronal Net Trace\nFixed Network Properties:\n");
     text.Add("input count: {}\n", net.mFixedNetProp.mInputNeuronCount);
     text.Add("output count: {}\n", net.mFixedNetProp.mOutputNeuronCount);

@@ -12,14 +12,14 @@ namespace brindle {
 namespace {
 
 #if __has_include(<libintl.h>)
-constexpr const char* kDomain = "brindle";
+constexpr const char* kTextDomain = "brindle";
 
 /// From the catalogues of the system, by the locale that the host has set.
 std::string SystemLocalizedString(const std::string& key) {
     // Without this, translations come in the character set of the locale.
-    static const char* const codeset = bind_textdomain_codeset(kDomain, "UTF-8");
+    static const char* const codeset = bind_textdomain_codeset(kTextDomain, "UTF-8");
     if (codeset == nullptr || key.empty()) return key;  // the empty key is the catalogue's heading
-    const char* translation = dgettext(kDomain, key.c_str());
+    const char* translation = dgettext(kTextDomain, key.c_str());
     return translation == key.c_str() ? key : translation;
 }
 #else
@@ -43,7 +43,7 @@ void SetLocalizer(TLocalizer localizer) {
 
 void SetLocalizationFolder([[maybe_unused]] const std::string& folder) {
 #if __has_include(<libintl.h>)
-    bindtextdomain(kDomain, folder.c_str());
+    bindtextdomain(kTextDomain, folder.c_str());
 #endif
 }
 

@@ -15,13 +15,6 @@ namespace brindle {
 
 namespace {
 
-constexpr std::string_view kWhiteSpace = " \t\n\v\f\r";
-
-std::string_view WithoutWhiteSpace(std::string_view text) {
-    const std::size_t first = text.find_first_not_of(kWhiteSpace);
-    return first == std::string_view::npos ? std::string_view() : text.substr(first);
-}
-
 // Moves `pos` over decimal digits and tells whether there were any.
 bool SkipDigits(std::string_view text, std::size_t& pos) {
     const std::size_t first = pos;
@@ -56,17 +49,17 @@ std::string_view NumberAtFront(std::string_view text) {
 }  // namespace
 
 std::int32_t ReadInteger(std::string_view text) {
-    constexpr std::int64_t kMin = std::numeric_limits<std::int32_t>::min();
-    constexpr std::int64_t kMax = std::numeric_limits<std::int32_t>::max();
-    text = WithoutWhiteSpace(text);
+    constexpr std::int64_t kSmallest = std::numeric_limits<std::int32_t>::min();
+    constexpr std::int64_t kLargest = std::numeric_limits<std::int32_t>::max();
+    text = Ascii::TrimmedInFront(text);
     const bool isNegative = text.starts_with('-');
     if (isNegative || text.starts_with('+')) text.remove_prefix(1);
     std::int64_t magnitude = 0;
     for (const char c : text) {
         if (!Ascii::IsDigit(c)) break;
-        magnitude = std::min(magnitude * 10 + (c - '0'), -kMin);
+        magnitude = std::min(magnitude * 10 + (c - '0'), -kSmallest);
     }
-    return static_cast<std::int32_t>(isNegative ? -magnitude : std::min(magnitude, kMax));
+    return static_cast<std::int32_t>(isNegative ? -magnitude : std::min(magnitude, kLargest));
 }
 
 double ReadDouble(const std::string& text) {
@@ -75,7 +68,7 @@ double ReadDouble(const std::string& text) {
 }
 
 double ReadDecimal(std::string_view text) {
-    return ReadDouble(std::string(NumberAtFront(WithoutWhiteSpace(text))));
+    return ReadDouble(std::string(NumberAtFront(Ascii::TrimmedInFront(text))));
 }
 
 }  // namespace brindle

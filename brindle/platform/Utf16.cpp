@@ -17,15 +17,15 @@ constexpr std::uint32_t kLowSurrogates = 0xDC00;
 constexpr std::uint32_t kSurrogatesEnd = 0xE000;
 constexpr std::uint32_t kFirstPair = 0x10000;
 
-std::uint32_t ByteAt(std::string_view bytes, std::size_t index) {
+std::uint32_t CodeByteAt(std::string_view bytes, std::size_t index) {
     return static_cast<unsigned char>(bytes[index]);
 }
 
 /// `length` is what Utf8Length told, not 0.
 std::uint32_t CodePoint(std::string_view text, std::size_t length) {
-    std::uint32_t code = ByteAt(text, 0);
+    std::uint32_t code = CodeByteAt(text, 0);
     if (length > 1) code &= 0x7Fu >> length;
-    for (std::size_t i = 1; i < length; ++i) code = code << 6 | (ByteAt(text, i) & 0x3F);
+    for (std::size_t i = 1; i < length; ++i) code = code << 6 | (CodeByteAt(text, i) & 0x3F);
     return code;
 }
 
@@ -77,8 +77,8 @@ std::optional<std::string> Utf8FromUtf16(std::string_view bytes) {
     const bool isLittleEndian = mark == kLittleEndianMark;
     if (isLittleEndian || mark == kBigEndianMark) bytes.remove_prefix(2);
     const auto unitAt = [&](std::size_t index) {
-        const std::uint32_t first = ByteAt(bytes, index);
-        const std::uint32_t second = ByteAt(bytes, index + 1);
+        const std::uint32_t first = CodeByteAt(bytes, index);
+        const std::uint32_t second = CodeByteAt(bytes, index + 1);
         return isLittleEndian ? second << 8 | first : first << 8 | second;
     };
     std::string text;

@@ -15,7 +15,7 @@ namespace brindle {
 
 namespace {
 
-std::string_view TextOf(const xmlChar* text) {
+std::string_view TextInTree(const xmlChar* text) {
     return text == nullptr ? std::string_view() : reinterpret_cast<const char*>(text);
 }
 
@@ -23,7 +23,7 @@ std::string_view TextOf(const xmlChar* text) {
 std::string TakeText(xmlChar* text) {
     if (text == nullptr) throw std::bad_alloc();
     const std::unique_ptr<xmlChar, decltype(xmlFree)> owner(text, xmlFree);
-    return std::string(TextOf(text));
+    return std::string(TextInTree(text));
 }
 
 xmlNodePtr ElementFrom(xmlNodePtr node) {
@@ -35,13 +35,13 @@ xmlNodePtr ElementFrom(xmlNodePtr node) {
 std::size_t SizeOf(const xmlNode* node, std::size_t limit) {
     std::size_t size = 1;
     if (node->type != XML_ELEMENT_NODE && node->content != nullptr) {
-        size += TextOf(node->content).size();
+        size += TextInTree(node->content).size();
     }
     if (node->type == XML_ELEMENT_NODE) {
         for (const xmlAttr* attribute = node->properties; attribute != nullptr;
              attribute = attribute->next) {
             for (const xmlNode* text = attribute->children; text != nullptr; text = text->next) {
-                size += TextOf(text->content).size() + 1;
+                size += TextInTree(text->content).size() + 1;
             }
         }
     }
@@ -94,7 +94,7 @@ XPathResult Evaluate(xmlXPathCompExpr* compiled, xmlNodePtr node) {
 }  // namespace
 
 std::string_view XmlNode::name() const {
-    return mNode == nullptr ? std::string_view() : TextOf(mNode->name);
+    return mNode == nullptr ? std::string_view() : TextInTree(mNode->name);
 }
 
 std::string XmlNode::stringValue() const {
@@ -109,7 +109,7 @@ std::optional<std::string> XmlNode::attribute(std::string_view name) const {
     if (mNode == nullptr || mNode->type != XML_ELEMENT_NODE) return std::nullopt;
     for (xmlAttrPtr attribute = mNode->properties; attribute != nullptr;
          attribute = attribute->next) {
-        if (TextOf(attribute->name) != name) continue;
+        if (TextInTree(attribute->name) != name) continue;
         if (attribute->children == nullptr) return std::string();
         const xml::CMemoryWatch watch;
         std::string value = TakeText(xmlNodeListGetString(mNode->doc, attribute->children, 1));

@@ -15,7 +15,7 @@ namespace {
 
 constexpr int kFieldsPerAttribute = 5;  // local name, prefix, namespace, begin and end of the value
 
-std::string_view TextOf(const unsigned char* text) {
+std::string_view StreamedText(const unsigned char* text) {
     return text == nullptr ? std::string_view() : reinterpret_cast<const char*>(text);
 }
 
@@ -25,7 +25,7 @@ std::pair<std::string_view, std::string_view> XmlAttributes::At(int n) const {
     const unsigned char* const* fields = mFields + n * kFieldsPerAttribute;
     const auto* begin = reinterpret_cast<const char*>(fields[3]);
     const auto* end = reinterpret_cast<const char*>(fields[4]);
-    return {TextOf(fields[0]), {begin, static_cast<std::size_t>(end - begin)}};
+    return {StreamedText(fields[0]), {begin, static_cast<std::size_t>(end - begin)}};
 }
 
 std::optional<std::string_view> XmlAttributes::Find(std::string_view name) const {
@@ -47,13 +47,13 @@ struct XmlStreamParser::Callbacks {
         auto& self = *static_cast<XmlStreamParser*>(parse.mHost);
         self.Deliver();
         if (self.mDelegate == nullptr) return;
-        self.mDelegate->didStartElement(self, TextOf(name), {attributes, attributeCount});
+        self.mDelegate->didStartElement(self, StreamedText(name), {attributes, attributeCount});
     }
 
     static void EndElement(void* context, const xmlChar* name, const xmlChar*, const xmlChar*) {
         Guarded(xml::CParse::Of(context), [&](XmlStreamParser& self) {
             self.Deliver();
-            if (self.mDelegate != nullptr) self.mDelegate->didEndElement(self, TextOf(name));
+            if (self.mDelegate != nullptr) self.mDelegate->didEndElement(self, StreamedText(name));
         });
     }
 

@@ -19,17 +19,17 @@
 namespace brindle {
 namespace {
 
-constexpr std::size_t kLineWidth = 120;
+constexpr std::size_t kWidestJsonLine = 120;
 constexpr std::size_t kIndent = 2;
 // Whole numbers beyond have an exponent.
 constexpr double kLargestPlainNumber = 1e15;
 
-bool IsPlain(char c) {
+bool IsPlainInJson(char c) {
     return c >= 0x20 && c < 0x7F && c != '"' && c != '\\';
 }
 
 std::string Quoted(std::string_view text) {
-    if (std::all_of(text.begin(), text.end(), IsPlain)) return fmt::format("\"{}\"", text);
+    if (std::all_of(text.begin(), text.end(), IsPlainInJson)) return fmt::format("\"{}\"", text);
     return nlohmann::json(text).dump(-1, ' ', false, nlohmann::json::error_handler_t::replace);
 }
 
@@ -117,7 +117,7 @@ void CJsonWriter::Append(std::string_view text) {
 void CJsonWriter::BreakWhatIsTooLong() {
     while (IsPending() && mLevels[mBrokenLevels].mCount > 0) {
         const std::size_t closings = mLevels.size() - mBrokenLevels;
-        if (kIndent * mBrokenLevels + mPending.size() + closings <= kLineWidth) return;
+        if (kIndent * mBrokenLevels + mPending.size() + closings <= kWidestJsonLine) return;
         BreakOutermost();
     }
 }

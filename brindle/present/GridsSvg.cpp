@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/present/GridsSvg.h"
 
+#include "brindle/present/SongShapes.h"
+
 #include <fmt/format.h>
 
 #include <algorithm>
@@ -9,16 +11,14 @@
 namespace brindle {
 namespace {
 
-constexpr double kMargin = 16.0;
+constexpr double kMarginOfGrids = 16.0;
 constexpr std::size_t kGridsPerLine = 6;
 
 // A full diagram, from its top left corner.
 constexpr double kNameSize = 15.0;
-constexpr double kSmallSize = 10.0;
+constexpr double kSizeOfLabels = 10.0;
 constexpr double kLabelRoom = 26.0;  // left of the strings, for the number of the first fret
 
-constexpr std::string_view kInk = "#222222";
-constexpr std::string_view kFaintInk = "#666666";
 constexpr std::string_view kWire = "#999999";
 constexpr std::string_view kPaper = "#ffffff";
 
@@ -61,9 +61,9 @@ private:
         if (mWindow.mFirst == 0) {
             mSvg.Rect(mLeft - 1, mTop - 4, right - mLeft + 2, 4, kInk);
         } else {
-            mSvg.Text(mLeft - mStringGap * 0.8, FretY(0.5) + kSmallSize * 0.36,
+            mSvg.Text(mLeft - mStringGap * 0.8, FretY(0.5) + kSizeOfLabels * 0.36,
                       fmt::format("{}", mWindow.mFirst + 1),
-                      {.mSize = kSmallSize, .mColor = kFaintInk, .mAnchor = "end"});
+                      {.mSize = kSizeOfLabels, .mColor = kFaintInk, .mAnchor = "end"});
         }
     }
 
@@ -94,8 +94,8 @@ private:
             mSvg.Circle(StringX(string), y, r, elem.isReal() ? kInk : kPaper, kInk);
         }
         if (elem.fingerNumber() == 0 || mStringGap < kGridStringGap) return;
-        mSvg.Text(StringX(first), y + kSmallSize * 0.36, fmt::format("{}", elem.fingerNumber()),
-                  {.mSize = kSmallSize,
+        mSvg.Text(StringX(first), y + kSizeOfLabels * 0.36, fmt::format("{}", elem.fingerNumber()),
+                  {.mSize = kSizeOfLabels,
                    .mColor = elem.isReal() ? kPaper : kInk,
                    .mBold = true,
                    .mAnchor = "middle"});
@@ -111,13 +111,13 @@ private:
 };
 
 /// The room of one diagram on a sheet: that of the largest.
-struct CCell {
+struct CGridPlace {
     double mWidth = 0.0;
     double mHeight = 0.0;
 };
 
-CCell CellFor(const std::vector<CChordGrid>& grids) {
-    CCell cell;
+CGridPlace CellFor(const std::vector<CChordGrid>& grids) {
+    CGridPlace cell;
     for (const CChordGrid& grid : grids) {
         const double neck = kGridStringGap * static_cast<double>(grid.mFrets.size() - 1);
         const double name = TextWidth(NamesText(grid), kNameSize);
@@ -134,24 +134,25 @@ void DrawGrid(CSvg& svg, const CChordGrid& grid, double left, double top, double
 }
 
 std::string GridsSvg(const std::vector<CChordGrid>& grids, std::string_view title) {
-    const CCell cell = CellFor(grids);
+    const CGridPlace cell = CellFor(grids);
     CSvg svg;
     for (std::size_t i = 0; i < grids.size(); ++i) {
-        const double left = kMargin + cell.mWidth * static_cast<double>(i % kGridsPerLine);
-        const double top = kMargin + cell.mHeight * static_cast<double>(i / kGridsPerLine);
+        const double left = kMarginOfGrids + cell.mWidth * static_cast<double>(i % kGridsPerLine);
+        const double top = kMarginOfGrids + cell.mHeight * static_cast<double>(i / kGridsPerLine);
         const double neck = left + kLabelRoom;
         svg.Text(neck, top + kNameSize, NamesText(grids[i]),
                  {.mSize = kNameSize, .mColor = kInk, .mBold = true});
         const std::string capo =
             grids[i].mCapo > 0 ? fmt::format(", capo {}", grids[i].mCapo) : std::string();
         svg.Text(neck, top + kNameSize + 14, FretsText(grids[i]) + capo,
-                 {.mSize = kSmallSize, .mColor = kFaintInk});
+                 {.mSize = kSizeOfLabels, .mColor = kFaintInk});
         DrawGrid(svg, grids[i], neck, top + kNameSize + 36, 1.0);
     }
     const std::size_t count = std::max<std::size_t>(grids.size(), 1);
     const auto columns = static_cast<double>(std::min(count, kGridsPerLine));
     const auto rows = static_cast<double>((count + kGridsPerLine - 1) / kGridsPerLine);
-    return svg.File(cell.mWidth * columns + 2 * kMargin, cell.mHeight * rows + 2 * kMargin, title);
+    return svg.File(cell.mWidth * columns + 2 * kMarginOfGrids,
+                    cell.mHeight * rows + 2 * kMarginOfGrids, title);
 }
 
 }  // namespace brindle

@@ -12,8 +12,8 @@
 namespace brindle {
 namespace {
 
-constexpr std::size_t kLineWidth = 80;
-constexpr std::size_t kGap = 4;
+constexpr std::size_t kWidestGridLine = 80;
+constexpr std::size_t kGapOfGrids = 4;
 
 /// The lines of one diagram; the first is its name.
 using TBlock = std::vector<std::string>;
@@ -69,7 +69,7 @@ TBlock BlockOf(const CChordGrid& grid) {
     return block;
 }
 
-std::size_t WidthOf(const TBlock& block) {
+std::size_t WidthOfBlock(const TBlock& block) {
     std::size_t width = 0;
     for (const std::string& line : block) width = std::max(width, CountCharacters(line));
     return width;
@@ -83,7 +83,7 @@ std::string Row(const std::vector<TBlock>& blocks, const CPaint& paint) {
     for (std::size_t i = 0; i < height; ++i) {
         std::string line;
         for (const TBlock& block : blocks) {
-            line += PadRight(i < block.size() ? block[i] : "", WidthOf(block) + kGap);
+            line += PadRight(i < block.size() ? block[i] : "", WidthOfBlock(block) + kGapOfGrids);
         }
         line.erase(line.find_last_not_of(' ') + 1);
         text += (i == 0 ? paint.Strong(line) : line) + '\n';
@@ -105,8 +105,8 @@ std::string GridsText(const std::vector<CChordGrid>& grids, const CPaint& paint)
     };
     for (const CChordGrid& grid : grids) {
         TBlock block = BlockOf(grid);
-        const std::size_t added = WidthOf(block) + kGap;
-        if (width + added > kLineWidth + kGap) endRow();
+        const std::size_t added = WidthOfBlock(block) + kGapOfGrids;
+        if (width + added > kWidestGridLine + kGapOfGrids) endRow();
         width += added;
         row.push_back(std::move(block));
     }

@@ -11,7 +11,7 @@
 namespace brindle {
 namespace {
 
-std::string Quarters(std::int32_t ticks) {
+std::string QuartersOfTicks(std::int32_t ticks) {
     return ShortNumber(static_cast<double>(ticks) / kImportTicksPerQuarter);
 }
 
@@ -27,12 +27,12 @@ std::string BarAt(const CImportedPart& part, std::int32_t position) {
 
 void AddRow(CTable& table, const CImportedPart& part, const CImportedEvent& event) {
     const std::string bar = BarAt(part, event.mPosition);
-    const std::string position = Quarters(event.mPosition);
+    const std::string position = QuartersOfTicks(event.mPosition);
     if (!event.mIsNote) {
         table.AddRow({bar, position, "", event.mWhat, "", "", "", "", ""});
         return;
     }
-    table.AddRow({bar, position, event.mLength ? Quarters(*event.mLength) : "?", event.mWhat,
+    table.AddRow({bar, position, event.mLength ? QuartersOfTicks(*event.mLength) : "?", event.mWhat,
                   event.mNoteNr < 0 ? "-" : fmt::format("{}", event.mNoteNr),
                   fmt::format("{}", event.mVelocity), fmt::format("{}", event.mVoice),
                   event.mStaff == 0 ? "" : fmt::format("{}", event.mStaff), event.mMarks});
@@ -59,12 +59,12 @@ std::string PartText(CImportedPart part, const CPaint& paint) {
         fmt::format("{}: {} {}, {} {}, {} quarters\n\n",
                     paint.Strong(name.empty() ? "Part without name" : name), part.mMeasures.size(),
                     part.mMeasures.size() == 1 ? "bar" : "bars", notes,
-                    notes == 1 ? "note" : "notes", Quarters(part.mEnd));
+                    notes == 1 ? "note" : "notes", QuartersOfTicks(part.mEnd));
     text += table.Text(paint, "  ");
     for (const CImportedEvent& note : part.mNotesLeftOpen) {
         text += fmt::format("\n  The tie of {} at {} does not end; it is played for {} quarters\n",
-                            note.mWhat, Quarters(note.mPosition),
-                            note.mLength ? Quarters(*note.mLength) : "?");
+                            note.mWhat, QuartersOfTicks(note.mPosition),
+                            note.mLength ? QuartersOfTicks(*note.mLength) : "?");
     }
     return text;
 }

@@ -15,43 +15,44 @@
 namespace brindle {
 namespace {
 
-constexpr double kMargin = 20.0;
-constexpr double kLineWidth = 960.0;
-constexpr double kTitleHeight = 30.0;
+constexpr double kMarginOfKeys = 20.0;
+constexpr double kWidthOfKeys = 960.0;
+constexpr double kKeysTitleHeight = 30.0;
 
 // From above: what a line of the song is made of.
 constexpr double kRibbonTop = 18.0;
-constexpr double kChordTop = 44.0;
-constexpr double kNumeralTop = kChordTop + kCaptionBelowChord;
-constexpr double kLineHeight = 100.0;
-constexpr double kLineGap = 20.0;
+constexpr double kKeysChordTop = 44.0;
+constexpr double kNumeralTop = kKeysChordTop + kCaptionBelowChord;
+constexpr double kKeysLineHeight = 100.0;
+constexpr double kKeysLineGap = 20.0;
 
 constexpr double kRibbonHeight = 24.0;
 
-constexpr double kTitleSize = 16.0;
-constexpr double kNumeralSize = 13.0;
+constexpr double kKeysTitleSize = 16.0;
+constexpr double kKeysNumeralSize = 13.0;
 
 double WidestChord(const CShownKeys& keys) {
     double widest = 0.0;
     for (const CShownKeyRegion& region : keys.mRegions) {
         for (const CShownNumeral& chord : region.mChords) {
-            widest = std::max(widest, WidthOfChord(chord.mSymbol, chord.mNumeral, kNumeralSize));
+            widest =
+                std::max(widest, WidthOfChord(chord.mSymbol, chord.mNumeral, kKeysNumeralSize));
         }
     }
     // A monster among the symbols does not stretch the whole picture.
-    return std::min(widest, kLineWidth / 4);
+    return std::min(widest, kWidthOfKeys / 4);
 }
 
 class CKeysPicture {
 public:
     explicit CKeysPicture(const CShownSong& song)
-        : mKeys(song.mKeys), mAxis(song, kLineWidth, WidestChord(song.mKeys)) {
+        : mKeys(song.mKeys), mAxis(song, kWidthOfKeys, WidestChord(song.mKeys)) {
         for (std::size_t line = 0; line < mAxis.LineCount(); ++line) {
-            mPlaces.mTops.push_back(kMargin + kTitleHeight +
-                                    static_cast<double>(line) * (kLineHeight + kLineGap));
+            mPlaces.mTops.push_back(kMarginOfKeys + kKeysTitleHeight +
+                                    static_cast<double>(line) * (kKeysLineHeight + kKeysLineGap));
         }
-        mSvg.Text(kMargin, kMargin + kTitleSize, Title(),
-                  {.mSize = kTitleSize, .mColor = kInk, .mBold = true});
+        mSvg.Text(kMarginOfKeys, kMarginOfKeys + kKeysTitleSize, Title(),
+                  {.mSize = kKeysTitleSize, .mColor = kInk, .mBold = true});
         if (mKeys.mRegions.empty()) return;
         DrawBarLines(mSvg, mAxis, mPlaces, kNumeralTop);
         DrawKeyRegions(mSvg, mAxis, mPlaces, mKeys, kRibbonTop, kRibbonHeight);
@@ -59,8 +60,8 @@ public:
     }
 
     [[nodiscard]] std::string File() const {
-        return mSvg.File(kLineWidth + 2 * kMargin, mPlaces.mTops.back() + kLineHeight + kMargin,
-                         Title());
+        return mSvg.File(kWidthOfKeys + 2 * kMarginOfKeys,
+                         mPlaces.mTops.back() + kKeysLineHeight + kMarginOfKeys, Title());
     }
 
 private:
@@ -72,15 +73,16 @@ private:
     void Draw(const CShownKeyRegion& region) {
         const std::string color = ColorOf(region.mKey, Shade_Chord);
         for (const CShownNumeral& chord : region.mChords) {
-            DrawChord(mSvg, mAxis, mPlaces, chord.mRange,
-                      {kChordTop, color, chord.mSymbol, chord.mNumeral, {.mSize = kNumeralSize}});
+            DrawChord(
+                mSvg, mAxis, mPlaces, chord.mRange,
+                {kKeysChordTop, color, chord.mSymbol, chord.mNumeral, {.mSize = kKeysNumeralSize}});
         }
     }
 
     const CShownKeys& mKeys;
     CTimeAxis mAxis;
     CSvg mSvg;
-    CLinePlaces mPlaces{kMargin, {}};
+    CLinePlaces mPlaces{kMarginOfKeys, {}};
 };
 
 }  // namespace

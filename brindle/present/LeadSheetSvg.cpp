@@ -28,7 +28,7 @@ constexpr double kFooter = 34.0;
 // Of the margins of a printed page.
 constexpr double kPrintMargin = 18.0;
 
-constexpr double kTitleSize = 25.0;
+constexpr double kSheetTitleSize = 25.0;
 constexpr double kSmallestTitleSize = 16.0;
 constexpr double kMakersSize = 13.0;
 
@@ -105,7 +105,7 @@ private:
 
     [[nodiscard]] double HeadHeight() const {
         double height = 0.0;
-        if (!mSong.mTitle.empty()) height += kTitleSize + 8;
+        if (!mSong.mTitle.empty()) height += kSheetTitleSize + 8;
         if (HasSubtitle()) height += kMakersSize + 4;
         return height > 0.0 ? height + 6 : 0.0;
     }
@@ -143,10 +143,10 @@ private:
         double y = Top();
         if (!mSong.mTitle.empty()) {
             const double fitting = InnerWidth() / std::max(1.0, WidthOf(mSong.mTitle));
-            const double size = std::clamp(fitting, kSmallestTitleSize, kTitleSize);
-            pen.Text(mWidth / 2, y + kTitleSize - 4, size,
+            const double size = std::clamp(fitting, kSmallestTitleSize, kSheetTitleSize);
+            pen.Text(mWidth / 2, y + kSheetTitleSize - 4, size,
                      CutToWidth(mSong.mTitle, InnerWidth() / size), "ttl ink", "middle");
-            y += kTitleSize + 8;
+            y += kSheetTitleSize + 8;
         }
         const bool sharesLine = !Style().empty() && !mSong.mMakers.empty();
         const double half = InnerWidth() / kMakersSize / (sharesLine ? 2.0 : 1.0) - 1.0;

@@ -9,7 +9,7 @@
 namespace brindle {
 namespace {
 
-constexpr int kTicksPerQuarter = 480;
+constexpr int kMarkovTicksPerQuarter = 480;
 constexpr int kBassChannel = 1;
 constexpr int kPianoProgram = 0;
 constexpr int kBassProgram = 32;
@@ -17,14 +17,14 @@ constexpr int kBassProgram = 32;
 constexpr int kTopVoiceCenter = 67;
 
 std::int64_t TickAt(double beats) {
-    return static_cast<std::int64_t>(std::min(std::round(beats * kTicksPerQuarter), 1e9));
+    return static_cast<std::int64_t>(std::min(std::round(beats * kMarkovTicksPerQuarter), 1e9));
 }
 
 }  // namespace
 
 CMidiPiece MidiPieceOf(MarkovSequenceView sequence, double tempo, int beatsPerBar) {
     CMidiPiece piece;
-    piece.mTicksPerQuarter = kTicksPerQuarter;
+    piece.mTicksPerQuarter = kMarkovTicksPerQuarter;
     piece.mTempos = {{0, tempo}};
     piece.mTimeSignatures = {{0, beatsPerBar, 4}};
     piece.mTracks = {{"Chords", {{0, 0, kPianoProgram}}, {}},

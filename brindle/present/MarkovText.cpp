@@ -16,7 +16,7 @@ namespace brindle {
 namespace {
 
 // Longer texts are shown as chord strings.
-constexpr double kMostBeats = 1e6;
+constexpr double kMostBeatsOfText = 1e6;
 
 // Steps on the line of fifths from C, F is -1 and Bb is -2.
 int FifthsOf(const CKeyEnh& note) {
@@ -45,7 +45,7 @@ CHarmAnlsChords ChordsOf(MarkovSequenceView sequence) {
 }
 
 bool IsWholeBeats(double length) {
-    return length >= 1.0 && length <= kMostBeats && std::floor(length) == length;
+    return length >= 1.0 && length <= kMostBeatsOfText && std::floor(length) == length;
 }
 
 /// Puts one word for each beat into bars.
@@ -139,7 +139,7 @@ std::string BarsText(MarkovSequenceView sequence, const CMarkovSpelling& spellin
         return symbol->HasBeats() && IsWholeBeats(symbol->mChord.mLength);
     };
     if (!std::all_of(sequence.begin(), sequence.end(), fits) ||
-        TMarkovSequenceLengthInBeats(sequence) > kMostBeats) {
+        TMarkovSequenceLengthInBeats(sequence) > kMostBeatsOfText) {
         return ChordString(sequence, spelling);
     }
     CBarsWriter bars(beatsPerBar, barsPerLine);

@@ -10,16 +10,16 @@
 namespace brindle {
 namespace {
 
-constexpr double kPadding = 5.0;
-constexpr double kGap = 1.0;
+constexpr double kPaddingOfChords = 5.0;
+constexpr double kGapOfChords = 1.0;
 constexpr double kChordHeight = 34.0;
 constexpr double kNarrowestChord = 40.0;
 // From the middle of a line of text to its base, in parts of the font's size.
 constexpr double kBaseLine = 0.36;
-constexpr std::string_view kBarLine = "#c8c8c8";
+constexpr std::string_view kInkOfBarLines = "#c8c8c8";
 
 double WidthInside(const CTimeSegment& segment) {
-    return std::max(0.5, segment.Width() - 2 * kGap);
+    return std::max(0.5, segment.Width() - 2 * kGapOfChords);
 }
 
 }  // namespace
@@ -29,23 +29,23 @@ void DrawBarLines(CSvg& svg, const CTimeAxis& axis, const CLinePlaces& places, d
         const double top = places.mTops[line];
         for (const auto& [barX, bar] : axis.BarLines(line)) {
             const double x = places.mLeft + barX;
-            svg.Line(x, top + 4, x, top + bottom, kBarLine);
+            svg.Line(x, top + 4, x, top + bottom, kInkOfBarLines);
             svg.Text(x + 3, top + 13, fmt::format("{}", bar),
                      {.mSize = kSmallSize, .mColor = kFaintInk});
         }
         const double right = places.mLeft + axis.Line(line).mRight;
-        svg.Line(right, top + 4, right, top + bottom, kBarLine);
+        svg.Line(right, top + 4, right, top + bottom, kInkOfBarLines);
     }
 }
 
 void DrawBand(CSvg& svg, const CTimeAxis& axis, const CLinePlaces& places, const CTimeRange& range,
               const CBand& band) {
     for (const CTimeSegment& segment : axis.SegmentsOf(range)) {
-        const double x = places.mLeft + segment.mLeft + kGap;
+        const double x = places.mLeft + segment.mLeft + kGapOfChords;
         const double y = places.mTops[segment.mLine] + band.mTop;
         svg.Rect(x, y, WidthInside(segment), band.mHeight, band.mColor, band.mLabel);
-        svg.TextCut(x + kPadding, y + band.mHeight / 2 + band.mFont.mSize * kBaseLine,
-                    segment.Width() - kPadding, band.mLabel, band.mFont);
+        svg.TextCut(x + kPaddingOfChords, y + band.mHeight / 2 + band.mFont.mSize * kBaseLine,
+                    segment.Width() - kPaddingOfChords, band.mLabel, band.mFont);
     }
 }
 
@@ -65,13 +65,14 @@ void DrawChord(CSvg& svg, const CTimeAxis& axis, const CLinePlaces& places, cons
                const CChordBox& box) {
     const std::vector<CTimeSegment> segments = axis.SegmentsOf(range);
     for (const CTimeSegment& segment : segments) {
-        svg.Rect(places.mLeft + segment.mLeft + kGap, places.mTops[segment.mLine] + box.mTop,
-                 WidthInside(segment), kChordHeight, box.mColor, box.mSymbol);
+        svg.Rect(places.mLeft + segment.mLeft + kGapOfChords,
+                 places.mTops[segment.mLine] + box.mTop, WidthInside(segment), kChordHeight,
+                 box.mColor, box.mSymbol);
     }
     if (segments.empty()) return;
     const CTimeSegment& first = segments.front();
-    const double x = places.mLeft + first.mLeft + kPadding;
-    const double room = first.Width() - kPadding - kGap;
+    const double x = places.mLeft + first.mLeft + kPaddingOfChords;
+    const double room = first.Width() - kPaddingOfChords - kGapOfChords;
     const double top = places.mTops[first.mLine] + box.mTop;
     svg.TextCut(x, top + 22, room, box.mSymbol,
                 {.mSize = kSymbolSize, .mColor = kInk, .mBold = true});
@@ -81,7 +82,7 @@ void DrawChord(CSvg& svg, const CTimeAxis& axis, const CLinePlaces& places, cons
 
 double WidthOfChord(std::string_view symbol, std::string_view caption, double captionSize) {
     const double widest = std::max(TextWidth(symbol, kSymbolSize), TextWidth(caption, captionSize));
-    return std::max(kNarrowestChord, widest + 2 * kPadding);
+    return std::max(kNarrowestChord, widest + 2 * kPaddingOfChords);
 }
 
 }  // namespace brindle

@@ -9,8 +9,8 @@
 namespace brindle {
 namespace {
 
-constexpr std::string_view kMajor = " major";
-constexpr std::string_view kMinor = " minor";
+constexpr std::string_view kWordMajor = " major";
+constexpr std::string_view kWordMinor = " minor";
 
 bool HasAtMostOneSign(const CKeyEnh& root) {
     return root.mEnh == TEnh_b || root.mEnh == TEnh_n || root.mEnh == TEnh_s;
@@ -23,7 +23,7 @@ std::string TonalityName(const CSignKeyLite& key) {
     CSignKeyLite named = key;
     if (!HasAtMostOneSign(named.mRootKeyEnh)) named.SetRootNoteEnhWithLeastSigns();
     std::string name = KeyName(named.mRootKeyEnh);
-    name += key.mSignKeyType == TSignKeyType_Minor ? kMinor : kMajor;
+    name += key.mSignKeyType == TSignKeyType_Minor ? kWordMinor : kWordMajor;
     return LocalizedString(name);
 }
 
@@ -31,7 +31,7 @@ std::vector<std::string> EnglishTonalityNames() {
     std::vector<std::string> names;
     for (const char letter : std::string_view("CDEFGAB")) {
         for (const std::string_view sign : {"b", "", "#"}) {
-            for (const std::string_view type : {kMajor, kMinor}) {
+            for (const std::string_view type : {kWordMajor, kWordMinor}) {
                 names.push_back(letter + std::string(sign) + std::string(type));
             }
         }

@@ -11,10 +11,6 @@ namespace brindle {
 
 namespace {
 
-bool IsScore(const CSong& song) {
-    return song.mFormat == TSongFormat_MusicXml || song.mFormat == TSongFormat_CompressedMusicXml;
-}
-
 /// The rests of a score are none to its analysis.
 void AnalyseScore(const CSong& song, TAnalyse route, CHarmonicAnalyse& analyse) {
     double end = kPosUndef;
@@ -34,7 +30,7 @@ CSongAnalysis AnalyseSong(const CSong& song, const CAnalyseSongOptions& options)
     CSongAnalysis found;
     const bool isGiven = !options.mSignKeys.empty();
     const CHarmAnlsSignKeys& signKeys = isGiven ? options.mSignKeys : song.mStatedKeys;
-    if (IsScore(song)) {
+    if (IsScore(song.mFormat)) {
         found.mAnalyse.mSignKeys = signKeys;
         AnalyseScore(song, options.mRoute, found.mAnalyse);
     } else {

@@ -9,19 +9,15 @@
 
 namespace brindle {
 
-bool IsNoChord(const TMusicXMLHarmony& harmony) {
-    return harmony.mRoot.mStep == kNoChordSymbol || harmony.mKind == "none";
-}
-
 CChordLite ChordOfHarmony(const TMusicXMLHarmony& harmony) {
     CChordLite chord;
-    if (IsNoChord(harmony)) return chord;
+    if (harmony.IsNoChord()) return chord;
     chord.SetFromChordHeavy(CChordSetFromMusicXml(harmony, 24, CurrentChordNamePrefs));
     return chord;
 }
 
 std::string HarmonySymbol(const TMusicXMLHarmony& harmony) {
-    if (IsNoChord(harmony)) return std::string(kNoChordSymbol);
+    if (harmony.IsNoChord()) return std::string(kNoChordSymbol);
     const CChordHeavy heavy = CChordSetFromMusicXml(harmony, 24, ChordNamePrefsNonUTF8);
     if (heavy.RootKeyEnh().IsUndef()) return "?";
     CChordLite chord;

@@ -2,19 +2,11 @@
 #pragma once
 
 #include "brindle/chords/CChordLite.h"
+#include "brindle/musicxml/TMusicXMLHarmony.h"
 
 #include <string>
-#include <string_view>
 
 namespace brindle {
-
-struct TMusicXMLHarmony;
-
-/// The symbol of no chord.
-inline constexpr std::string_view kNoChordSymbol = "N.C.";
-
-/// Whether a harmony is the sign that no chord sounds.
-[[nodiscard]] bool IsNoChord(const TMusicXMLHarmony& harmony);
 
 /// The chord of a harmony; undefined where it has no root.
 [[nodiscard]] CChordLite ChordOfHarmony(const TMusicXMLHarmony& harmony);

@@ -4,13 +4,9 @@
 namespace brindle {
 namespace {
 
-bool IsScore(const CSong& song) {
-    return song.mFormat == TSongFormat_MusicXml || song.mFormat == TSongFormat_CompressedMusicXml;
-}
-
 bool IsTrusted(const CSong& song, const CKeyOptions& options) {
     return song.mStatedKey &&
-           (!IsScore(song) || FindKeys(song.mChords, options).mKey == *song.mStatedKey);
+           (!IsScore(song.mFormat) || FindKeys(song.mChords, options).mKey == *song.mStatedKey);
 }
 
 }  // namespace

@@ -48,7 +48,7 @@ CHarmAnlsChords WithRests(const CHarmAnlsChords& chords, const TMusicXMLDoc& she
     CHarmAnlsChords all;
     auto chord = chords.begin();
     for (const TMusicXMLHarmony& harmony : sheet.Harmonies) {
-        if (IsNoChord(harmony)) {
+        if (harmony.IsNoChord()) {
             all.push_back(CHarmAnlsChordWithPos(CHarmAnlsChord(), harmony.mPosition));
         } else if (chord != chords.end()) {
             all.push_back(*chord++);

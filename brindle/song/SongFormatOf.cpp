@@ -22,7 +22,7 @@ constexpr auto kDirectives = std::to_array<std::string_view>(
 
 bool HasDirective(std::string_view text) {
     while (!text.empty()) {
-        const std::string line = Lower(WithoutBlanksInFront(TakeLine(text)).substr(0, 12));
+        const std::string line = Lower(TrimmedInFront(TakeLine(text)).substr(0, 12));
         const bool found = std::any_of(kDirectives.begin(), kDirectives.end(),
                                        [&](std::string_view d) { return line.starts_with(d); });
         if (found) return true;
@@ -70,7 +70,7 @@ bool IsKeyMark(std::string_view word) {
 }
 
 std::string_view TakeWord(std::string_view& line) {
-    line = WithoutBlanksInFront(line);
+    line = TrimmedInFront(line);
     const std::string_view word = line.substr(0, line.find_first_of(" \t\r"));
     line.remove_prefix(word.size());
     return word;

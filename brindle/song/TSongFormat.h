@@ -32,4 +32,9 @@ enum TSongFormat : std::uint8_t {
     TSongFormat_RomanText,
 };
 
+/// Whether a song in this form is engraved music.
+[[nodiscard]] constexpr bool IsScore(TSongFormat format) {
+    return format == TSongFormat_MusicXml || format == TSongFormat_CompressedMusicXml;
+}
+
 }  // namespace brindle

@@ -25,9 +25,9 @@ bool IsWhole(double number) {
     return std::abs(number - std::round(number)) < 1e-6;
 }
 
-class CWriter {
+class CChordTextWriter {
 public:
-    explicit CWriter(const TMusicXMLDoc& sheet) : mSheet(sheet) {
+    explicit CChordTextWriter(const TMusicXMLDoc& sheet) : mSheet(sheet) {
         mResult.mBeatsPerBar = BeatsPerBarOf(mSheet);
         mUpbeat = Upbeat();
         mResult.mBeatsPerChord = Step();
@@ -111,7 +111,7 @@ private:
 }  // namespace
 
 std::optional<CChordText> WriteChordText(const TMusicXMLDoc& sheet) {
-    return CWriter(sheet).Write();
+    return CChordTextWriter(sheet).Write();
 }
 
 }  // namespace brindle

@@ -14,7 +14,7 @@ namespace brindle {
 
 namespace {
 
-constexpr int kFifth = 7;
+constexpr int kFifthUp = 7;
 constexpr int kFifthsToSearch = 24;
 constexpr int kMinorToMajor = -9;  // from A down to C
 
@@ -36,7 +36,7 @@ int FifthsFromC(const CKeyEnh& majorKey) {
     const int direction = majorKey.mEnh >= TEnh_n && majorKey != CKeyEnh_F ? 1 : -1;
     CKeyEnh key = CKeyEnh_C;
     for (int count = 1; count <= kFifthsToSearch; ++count) {
-        key.AddToThis(direction * kFifth);
+        key.AddToThis(direction * kFifthUp);
         if (key == majorKey) return direction * count;
     }
     return direction * (kFifthsToSearch + 1);

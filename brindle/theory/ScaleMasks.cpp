@@ -50,13 +50,13 @@ constexpr auto kScaleMasks = std::to_array<CScaleMask>({
 });
 // clang-format on
 
-constexpr bool RowsStandInOrderOfTheirType() {
+constexpr bool ScaleRowsStandInOrder() {
     for (std::size_t i = 0; i < kScaleMasks.size(); ++i) {
         if (kScaleMasks[i].mType != static_cast<TScaleType>(i + 1)) return false;
     }
     return kScaleMasks.size() + 1 == st_Count;
 }
-static_assert(RowsStandInOrderOfTheirType());
+static_assert(ScaleRowsStandInOrder());
 
 }  // namespace
 

@@ -8,14 +8,14 @@ namespace brindle {
 
 namespace {
 
-struct CWord {
+struct CEnhWord {
     TEnh mEnh;
     std::string_view mWord;
     std::string_view mEnumerator;
 };
 
 // clang-format off
-constexpr auto kWords = std::to_array<CWord>({
+constexpr auto kEnhWords = std::to_array<CEnhWord>({
     {TEnh_bbb,   "triple flat",  "TEnh_bbb"},
     {TEnh_bb,    "double flat",  "TEnh_bb"},
     {TEnh_b,     "flat",         "TEnh_b"},
@@ -30,7 +30,7 @@ constexpr auto kWords = std::to_array<CWord>({
 }  // namespace
 
 TEnh EnhFromStdString(std::string_view word) {
-    for (const CWord& row : kWords) {
+    for (const CEnhWord& row : kEnhWords) {
         if (row.mWord == word) return row.mEnh;
     }
     return TEnh_Undef;
@@ -41,14 +41,14 @@ TEnh EnhFromString(const char* word) {
 }
 
 std::string StringForInitializerList(TEnh enh) {
-    for (const CWord& row : kWords) {
+    for (const CEnhWord& row : kEnhWords) {
         if (row.mEnh == enh) return std::string(row.mEnumerator);
     }
     return "TEnh(" + std::to_string(static_cast<int>(enh)) + ")";
 }
 
 std::ostream& operator<<(std::ostream& stream, TEnh enh) {
-    for (const CWord& row : kWords) {
+    for (const CEnhWord& row : kEnhWords) {
         if (row.mEnh == enh) return stream << row.mWord;
     }
     return stream << "unknown TEnh " + std::to_string(static_cast<int>(enh));

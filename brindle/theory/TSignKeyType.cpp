@@ -40,13 +40,13 @@ constexpr auto kScaleColours = std::to_array<CScaleColour>({
 });
 // clang-format on
 
-constexpr bool RowsStandInOrderOfTheirType() {
+constexpr bool SignKeyRowsStandInOrder() {
     for (std::size_t i = 0; i < kScaleColours.size(); ++i) {
         if (kScaleColours[i].mScaleType != static_cast<TScaleType>(i + st_min)) return false;
     }
     return true;
 }
-static_assert(RowsStandInOrderOfTheirType());
+static_assert(SignKeyRowsStandInOrder());
 
 }  // namespace
 

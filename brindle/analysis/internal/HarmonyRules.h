@@ -7,6 +7,10 @@
 
 namespace brindle {
 
+/// How roots fall, in semitones upwards: of a dominant, and of its tritone substitute.
+inline constexpr int kFourthUp = 5;
+inline constexpr int kSemitoneDown = 11;
+
 /// The name that a rule gives to a chord.
 struct CChordName {
     CChordReading& mReading;

@@ -9,7 +9,7 @@ namespace brindle {
 namespace {
 
 // How far the bass moves on to the next chord, 0 at the end.
-int BassStep(const CChordInSong& chord) {
+int StepOfNextBass(const CChordInSong& chord) {
     if (!chord.HasNext()) return 0;
     return DegreeInKey(chord.ChordAt(chord.Next()).mBass, chord.Chord().mRoot);
 }
@@ -17,7 +17,7 @@ int BassStep(const CChordInSong& chord) {
 // The bass comes by a semitone and goes on by one in the same direction.
 bool IsBySteps(const CChordInSong& chord) {
     if (!chord.Is(TKeyChordClass_Dim) || !chord.HasPrevious()) return false;
-    const int step = BassStep(chord);
+    const int step = StepOfNextBass(chord);
     const int stepBefore = DegreeInKey(chord.Chord().mRoot, chord.ChordAt(chord.Previous()).mBass);
     return (step == 1 || step == 11) && stepBefore == step;
 }
@@ -27,8 +27,8 @@ bool IsBySteps(const CChordInSong& chord) {
 void BePassing(const CChordInSong& chord, TChordRelation relation, CChordName& name) {
     name.Be(relation, THarmFunction_None);
     name.LeadTo(chord.Next());
-    const bool isRaised =
-        chord.IsInMajor() && BassStep(chord) == 1 && CSemitones{1, 3, 8}.HasIntvl(chord.Degree());
+    const bool isRaised = chord.IsInMajor() && StepOfNextBass(chord) == 1 &&
+                          CSemitones{1, 3, 8}.HasIntvl(chord.Degree());
     if (!isRaised) return;
     std::string& numeral = name.mReading.mNumeral;
     numeral = '#';
@@ -76,7 +76,7 @@ bool NameDiminished(const CChordInSong& chord, CChordName& name) {
         chord.Is(TKeyChordClass_HDim) && leads && chord.Degree() != 2;
     if (!chord.Is(TKeyChordClass_Dim) && !isLeadingHalfDiminished) return false;
     const bool isBySteps = IsBySteps(chord);
-    const bool isOnlyPassing = chord.Traits().mIsJazz || BassStep(chord) == 11 || !leads;
+    const bool isOnlyPassing = chord.Traits().mIsJazz || StepOfNextBass(chord) == 11 || !leads;
     if (isBySteps && isOnlyPassing) {
         BePassing(chord, TChordRelation_PassingDiminished, name);
         return true;

@@ -7,9 +7,6 @@
 namespace brindle {
 namespace {
 
-constexpr int kFourthUp = 5;
-constexpr int kSemitoneDown = 11;
-
 bool IsDom(const CChordInSong& chord) {
     return chord.Is(TKeyChordClass_Dom);
 }

@@ -7,9 +7,6 @@
 namespace brindle {
 namespace {
 
-constexpr int kFourthUp = 5;
-constexpr int kSemitoneDown = 11;
-
 void BeAugmentedSixth(std::string_view numeral, std::ptrdiff_t goal, CChordName& name) {
     name.Be(TChordRelation_AugmentedSixth, THarmFunction_Subdominant);
     name.mReading.mNumeral = numeral;

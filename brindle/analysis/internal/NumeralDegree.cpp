@@ -15,7 +15,7 @@ constexpr std::array<int, 7> kMajorDegrees{0, 2, 4, 5, 7, 9, 11};
 constexpr std::array<int, 7> kMinorDegrees{0, 2, 3, 5, 7, 8, 10};
 
 // Sharps before the degree, flats as a negative number. A minus is a flat.
-int TakeAccidentals(std::string_view& text) {
+int TakeSignsOfDegree(std::string_view& text) {
     int accidental = 0;
     while (!text.empty() && (text.front() == '#' || text.front() == 'b' || text.front() == '-')) {
         accidental += text.front() == '#' ? 1 : -1;
@@ -44,7 +44,7 @@ CReadDegree ReadRomanNumber(std::string_view text) {
 }
 
 // The index of the letter, 0 for C.
-int LetterOf(const CKeyEnh& keyEnh) {
+int LetterWrittenFor(const CKeyEnh& keyEnh) {
     const TEnh enh = MakeSensefulEnhForKeyNrAssumingCMajor(keyEnh.mKeyNr, keyEnh.mEnh);
     const int natural = FoldIntoOctave(std::int64_t{keyEnh.mKeyNr} - EnhToSemitone(enh));
     const auto letter = std::find(kMajorDegrees.begin(), kMajorDegrees.end(), natural);
@@ -57,7 +57,7 @@ CReadDegree ReadDegree(std::string_view text) {
     constexpr std::string_view substitute = "sub";
     const bool isSubstitute = text.starts_with(substitute);
     if (isSubstitute) text.remove_prefix(substitute.size());
-    const int accidental = TakeAccidentals(text);
+    const int accidental = TakeSignsOfDegree(text);
     if (text.empty() || accidental < -kMostAccidentals || accidental > kMostAccidentals) return {};
     CReadDegree read;
     if (text.front() >= '1' && text.front() <= '7') {
@@ -90,13 +90,13 @@ int SemitonesOfDegree(CNumeralDegree degree, TSignKeyType type) {
 
 CKeyEnh SpelledAbove(const CKeyEnh& from, int letters, int semitones) {
     const int keyNr = FoldIntoOctave(std::int64_t{from.mKeyNr} + semitones);
-    const auto letter = static_cast<std::size_t>(LetterOf(from) + letters + 7) % 7;
+    const auto letter = static_cast<std::size_t>(LetterWrittenFor(from) + letters + 7) % 7;
     const TEnh spelling = SemitoneToEnh(SmallestKeyIntvlBetween(kMajorDegrees[letter], keyNr));
     return {keyNr, MakeSensefulEnhForKeyNrAssumingCMajor(keyNr, spelling)};
 }
 
 int LettersBetween(const CKeyEnh& from, const CKeyEnh& to) {
-    return (LetterOf(to) - LetterOf(from) + 7) % 7;
+    return (LetterWrittenFor(to) - LetterWrittenFor(from) + 7) % 7;
 }
 
 CKeyEnh KeyOfDegree(CNumeralDegree degree, const CSignKeyLite& key) {

@@ -4,6 +4,7 @@
 #include "brindle/analysis/RomanNumeral.h"
 #include "brindle/analysis/internal/NumeralDegree.h"
 #include "brindle/chords/ReadChordText.h"
+#include "brindle/platform/Ascii.h"
 #include "brindle/theory/KeyIntervals.h"
 
 #include <algorithm>
@@ -19,12 +20,6 @@ constexpr int kMajorSeventh = 11;
 // What is added as a number counts as in chord symbols: 7 is a minor seventh.
 constexpr std::array<int, 14> kSemitonesOfNumber{-1, 0, 2, 4, 5, 7, 9, 10, 0, 2, 4, 5, 7, 9};
 //                                    number:         1  2  3  4  5  6  7   8  9 10 11 12 13
-
-bool Take(std::string_view& text, std::string_view word) {
-    if (!text.starts_with(word)) return false;
-    text.remove_prefix(word.size());
-    return true;
-}
 
 int TakeAccidentals(std::string_view& text) {
     int accidental = 0;
@@ -212,7 +207,7 @@ bool TakeOmission(std::string_view& text, CSemitones& tones) {
 }
 
 bool TakeAddition(std::string_view& text, CSemitones& tones) {
-    const bool isMajorSeventh = Take(text, "^");
+    const bool isMajorSeventh = Ascii::TakePrefix(text, "^");
     const int accidental = TakeAccidentals(text);
     const int number = TakeNumber(text);
     if (number < 2 || number > 13) return false;
@@ -249,10 +244,12 @@ bool TakeAlteration(std::string_view& text, CSemitones& tones) {
 CSemitones TonesOfAlterations(std::string_view text, bool isSmall) {
     CSemitones tones = TakeSign(text, isSmall);
     while (!text.empty()) {
-        if (Take(text, "(") || Take(text, ")") || Take(text, ",")) continue;
-        const bool isTaken = Take(text, "no")    ? TakeOmission(text, tones)
-                             : Take(text, "add") ? TakeAddition(text, tones)
-                                                 : TakeAlteration(text, tones);
+        if (Ascii::TakePrefix(text, "(") || Ascii::TakePrefix(text, ")") ||
+            Ascii::TakePrefix(text, ","))
+            continue;
+        const bool isTaken = Ascii::TakePrefix(text, "no")    ? TakeOmission(text, tones)
+                             : Ascii::TakePrefix(text, "add") ? TakeAddition(text, tones)
+                                                              : TakeAlteration(text, tones);
         if (!isTaken) return {};
     }
     return tones;
@@ -346,8 +343,8 @@ CReadTones TonesOfTail(std::string_view tail, const CNumeralRoot& given,
 
 bool ApplyGroup(std::string_view group, const CNumeralRoot& root, CReadTones& tones) {
     while (!group.empty()) {
-        const bool isOmitted = Take(group, "no");
-        const bool isAdded = !isOmitted && Take(group, "add");
+        const bool isOmitted = Ascii::TakePrefix(group, "no");
+        const bool isAdded = !isOmitted && Ascii::TakePrefix(group, "add");
         const int accidental = TakeAccidentals(group);
         const int number = TakeNumber(group);
         if (number == 0 || (isOmitted && accidental != 0)) return false;
@@ -364,7 +361,7 @@ bool ApplyGroup(std::string_view group, const CNumeralRoot& root, CReadTones& to
             if (number > 13) return false;
             tones.mSemitones.AddIntvl(SemitonesOfNumber(number, accidental));
         }
-        while (Take(group, ",") || Take(group, " ")) {
+        while (Ascii::TakePrefix(group, ",") || Ascii::TakePrefix(group, " ")) {
         }
     }
     return true;

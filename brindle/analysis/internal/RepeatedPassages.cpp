@@ -114,7 +114,7 @@ void SetGroups(TForms& forms, const CSuffixes& suffixes, const CSuffixes& groupS
     }
 }
 
-std::tuple<TPlace, TPlace, TPlace> Key(const CPassageForm& form) {
+std::tuple<TPlace, TPlace, TPlace> SortKeyOf(const CPassageForm& form) {
     return {form.mLength, form.mGroup, form.mRanks.mFirst};
 }
 
@@ -133,10 +133,11 @@ std::vector<CPassageForm> RepeatedPassages(const std::vector<TPlace>& symbols,
         SetGroups(forms, suffixes, CSuffixes(groupSymbols));
     }
     std::sort(forms.begin(), forms.end(),
-              [](const auto& a, const auto& b) { return Key(a) < Key(b); });
-    forms.erase(std::unique(forms.begin(), forms.end(),
-                            [](const auto& a, const auto& b) { return Key(a) == Key(b); }),
-                forms.end());
+              [](const auto& a, const auto& b) { return SortKeyOf(a) < SortKeyOf(b); });
+    forms.erase(
+        std::unique(forms.begin(), forms.end(),
+                    [](const auto& a, const auto& b) { return SortKeyOf(a) == SortKeyOf(b); }),
+        forms.end());
     return forms;
 }
 

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/analysis/internal/RomanTextWords.h"
 
+#include "brindle/platform/Ascii.h"
 #include "brindle/theory/CChordNamePrefs.h"
 
 #include <algorithm>
@@ -11,31 +12,19 @@
 namespace brindle {
 namespace {
 
-constexpr std::string_view kBlanks = " \t\r\f\v";
-
 // No music is longer, no bar has more beats.
-constexpr int kMostMeasures = 999'999;
-constexpr int kMostBeats = 99;
-
-bool IsDigit(char c) {
-    return c >= '0' && c <= '9';
-}
+constexpr int kLastMeasureNr = 999'999;
+constexpr int kLastBeatNr = 99;
 
 // A whole number up to a limit; nothing, and nothing taken, otherwise.
 std::optional<int> TakeWhole(std::string_view& text, int most) {
     int number = 0;
     const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), number);
-    if (text.empty() || !IsDigit(text.front()) || error != std::errc() || number > most) {
+    if (text.empty() || !Ascii::IsDigit(text.front()) || error != std::errc() || number > most) {
         return std::nullopt;
     }
     text.remove_prefix(static_cast<std::size_t>(end - text.data()));
     return number;
-}
-
-bool Take(std::string_view& text, std::string_view word) {
-    if (!text.starts_with(word)) return false;
-    text.remove_prefix(word.size());
-    return true;
 }
 
 // The fraction that was meant: .33 is a third. One digit is exact but for thirds.
@@ -66,37 +55,37 @@ bool IsCompound(const CTimeSignature& time) {
 
 std::optional<CMeasureRange> TakeMeasures(std::string_view& text) {
     std::string_view rest = text;
-    if (!Take(rest, "m")) return std::nullopt;
-    const auto first = TakeWhole(rest, kMostMeasures);
+    if (!Ascii::TakePrefix(rest, "m")) return std::nullopt;
+    const auto first = TakeWhole(rest, kLastMeasureNr);
     if (!first) return std::nullopt;
     CMeasureRange range{*first, *first};
-    if (Take(rest, "var")) {
+    if (Ascii::TakePrefix(rest, "var")) {
         range.mIsVariant = true;
-        while (!rest.empty() && IsDigit(rest.front())) rest.remove_prefix(1);
+        while (!rest.empty() && Ascii::IsDigit(rest.front())) rest.remove_prefix(1);
     } else if (!rest.empty() && rest.front() >= 'a' && rest.front() <= 'z') {
         range.mHasLetter = true;
         rest.remove_prefix(1);
     }
-    if (Take(rest, "-")) {
-        Take(rest, "m");
-        const auto last = TakeWhole(rest, kMostMeasures);
+    if (Ascii::TakePrefix(rest, "-")) {
+        Ascii::TakePrefix(rest, "m");
+        const auto last = TakeWhole(rest, kLastMeasureNr);
         if (!last || *last < *first) return std::nullopt;
         range.mLast = *last;
     }
     const bool isWhole = rest.empty() || rest.front() == '=' || rest.front() == ':' ||
-                         kBlanks.find(rest.front()) != kBlanks.npos;
+                         Ascii::IsWhiteSpace(rest.front());
     if (!isWhole) return std::nullopt;
     text = rest;
     return range;
 }
 
 std::optional<double> BeatOf(std::string_view word) {
-    if (!Take(word, "b")) return std::nullopt;
-    const auto beat = TakeWhole(word, kMostBeats);
+    if (!Ascii::TakePrefix(word, "b")) return std::nullopt;
+    const auto beat = TakeWhole(word, kLastBeatNr);
     if (!beat || *beat < 1) return std::nullopt;
     if (word.empty()) return *beat;
-    if (!Take(word, ".") || word.empty() || word.size() > 9) return std::nullopt;
-    if (!std::all_of(word.begin(), word.end(), IsDigit)) return std::nullopt;
+    if (!Ascii::TakePrefix(word, ".") || word.empty() || word.size() > 9) return std::nullopt;
+    if (!std::all_of(word.begin(), word.end(), Ascii::IsDigit)) return std::nullopt;
     return *beat + FractionOf(word);
 }
 
@@ -123,14 +112,14 @@ double CTimeSignature::BeatLength() const {
 
 std::optional<CTimeSignature> TimeSignatureOf(std::string_view text) {
     CTimeSignature time;
-    text = Trimmed(text);
+    text = Ascii::Trimmed(text);
     if (text == "C") return time;
     if (text == "Cut" || text == "cut" || text == "C|") return CTimeSignature{2, 2};
-    time.mIsSlow = Take(text, "slow");
-    if (!time.mIsSlow) (void)Take(text, "fast");
-    text = Trimmed(text);
-    const auto beats = TakeWhole(text, kMostBeats);
-    if (!beats || *beats < 1 || !Take(text, "/")) return std::nullopt;
+    time.mIsSlow = Ascii::TakePrefix(text, "slow");
+    if (!time.mIsSlow) (void)Ascii::TakePrefix(text, "fast");
+    text = Ascii::Trimmed(text);
+    const auto beats = TakeWhole(text, kLastBeatNr);
+    if (!beats || *beats < 1 || !Ascii::TakePrefix(text, "/")) return std::nullopt;
     const auto value = TakeWhole(text, 64);
     constexpr std::array<int, 7> values{1, 2, 4, 8, 16, 32, 64};
     if (!value || !text.empty()) return std::nullopt;
@@ -141,17 +130,10 @@ std::optional<CTimeSignature> TimeSignatureOf(std::string_view text) {
 }
 
 std::string_view TakeWord(std::string_view& text) {
-    const std::size_t begin = std::min(text.find_first_not_of(kBlanks), text.size());
-    text.remove_prefix(begin);
-    const std::string_view word = text.substr(0, text.find_first_of(kBlanks));
+    text = Ascii::TrimmedInFront(text);
+    const std::string_view word = text.substr(0, text.find_first_of(Ascii::kWhiteSpace));
     text.remove_prefix(word.size());
     return word;
-}
-
-std::string_view Trimmed(std::string_view text) {
-    const std::size_t begin = text.find_first_not_of(kBlanks);
-    if (begin == text.npos) return {};
-    return text.substr(begin, text.find_last_not_of(kBlanks) + 1 - begin);
 }
 
 }  // namespace brindle

@@ -46,7 +46,4 @@ struct CTimeSignature {
 /// Takes the next word and the white space before it; empty at the end.
 [[nodiscard]] std::string_view TakeWord(std::string_view& text);
 
-/// Without the white space around it.
-[[nodiscard]] std::string_view Trimmed(std::string_view text);
-
 }  // namespace brindle

@@ -24,7 +24,7 @@ constexpr int kOption = 20;
 constexpr int kSpelledOutOverBass = 20;
 constexpr int kImpossible = 1'000'000;
 constexpr TToneMask kRoot = 0x001;
-constexpr TToneMask kFifth = 0x080;
+constexpr TToneMask kTonesOfFifth = 0x080;
 constexpr TToneMask kOctave = 0xFFF;
 
 constexpr int OfCommonness(int cost) {
@@ -80,7 +80,7 @@ int CostOfLeftOut(const CNamingType& type, TToneMask tones, int sounding) {
     const bool hasRoot = (gone & kRoot) == 0;
     if (!hasRoot) cost += sounding < 3 ? kImpossible : kNoRoot;
     if (HasTone(gone, type.mThird)) cost += hasRoot ? kNoThird : kImpossible;
-    if ((gone & kFifth) != 0) {
+    if ((gone & kTonesOfFifth) != 0) {
         const bool isTooLittle = sounding == 2 && type.mThird < 0;
         cost += isTooLittle ? kImpossible : kNoFifth;
     }

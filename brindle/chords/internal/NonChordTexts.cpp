@@ -62,12 +62,12 @@ static_assert(std::all_of(kNonChordRows.begin(), kNonChordRows.end(), [](const C
 }));
 
 /// A text without its blanks; empty if it is longer than any word.
-struct CWord {
+struct CSingleWord {
     std::array<char, kLongestWord> mExact{};
     std::array<char, kLongestWord> mLower{};
     std::size_t mSize = 0;
 
-    explicit CWord(const CUnifiedText& text) {
+    explicit CSingleWord(const CUnifiedText& text) {
         const std::string_view folded = text.Text();
         for (std::size_t i = 0; i < folded.size(); ++i) {
             if (folded[i] == ' ') continue;
@@ -96,7 +96,7 @@ CChordLite NonChordOf(std::string_view parserText) {
 }  // namespace
 
 std::optional<CChordTextReading> ReadNonChord(const CUnifiedText& text) {
-    const CWord word(text);
+    const CSingleWord word(text);
     const auto* const row = std::find_if(kNonChordRows.begin(), kNonChordRows.end(),
                                          [&](const CNonChordRow& r) { return word.Is(r); });
     if (row == kNonChordRows.end()) return std::nullopt;

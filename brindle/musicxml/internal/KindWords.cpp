@@ -153,7 +153,7 @@ bool IsKind(std::string_view word) {
     return word == kNoChord || !XMLHarmonyKindToIntvlSetExceptRoot(word).empty();
 }
 
-std::string Folded(std::string_view word) {
+std::string FoldedKindWord(std::string_view word) {
     std::string folded(word);
     std::transform(folded.begin(), folded.end(), folded.begin(), [](char c) {
         if (c == ' ' || c == '_') return '-';
@@ -173,7 +173,7 @@ void AddTone(TMusicXMLHarmony& harmony, std::size_t intvl) {
 
 // Takes the kind that another word for it means. False for a word without meaning.
 bool SetKindOfAlias(TMusicXMLHarmony& harmony, std::string_view word) {
-    std::string folded = Folded(word);
+    std::string folded = FoldedKindWord(word);
     if (IsKind(folded)) {
         harmony.mKind = std::move(folded);
         return true;

@@ -4,6 +4,7 @@
 #include "brindle/musicxml/TMusicXMLDoc.h"
 #include "brindle/musicxml/internal/MeasureReader.h"
 #include "brindle/musicxml/internal/ScoreElements.h"
+#include "brindle/platform/Ascii.h"
 #include "brindle/platform/ReadNumber.h"
 #include "brindle/platform/XmlStreamParser.h"
 
@@ -18,13 +19,6 @@ namespace brindle {
 namespace {
 
 using enum TScoreElement;
-
-std::string_view Trimmed(std::string_view text) {
-    constexpr std::string_view white = " \t\r\n";
-    const std::size_t begin = text.find_first_not_of(white);
-    if (begin == text.npos) return {};
-    return text.substr(begin, text.find_last_not_of(white) + 1 - begin);
-}
 
 /// Finds its way through the parts and measures of a score and hands each measure to the reader of
 /// measures. A score lists the measures of each part, or the parts of each measure.
@@ -64,7 +58,7 @@ public:
         const TScoreElement element = mOpen.back();
         mOpen.pop_back();
         const TScoreElement parent = Parent();
-        const std::string_view text = Trimmed(mText);
+        const std::string_view text = Ascii::Trimmed(mText);
         if (element == MovementTitle) {
             mMovementTitle = text;
         } else if (element == WorkTitle) {

@@ -18,7 +18,7 @@ constexpr std::size_t kMostEndingNumbers = 64;
 constexpr std::size_t kMostWords = 64;
 
 // Lower case, and the sign of multiplication as the "x" that it is meant for.
-std::string Folded(std::string_view words) {
+std::string FoldedScoreWords(std::string_view words) {
     constexpr std::string_view times = "\u00D7";
     std::string folded;
     for (std::size_t i = 0; i < words.size(); ++i) {
@@ -35,7 +35,7 @@ std::string Folded(std::string_view words) {
 
 // Runs of letters and runs of digits: "D.C.alfine" is d, c, alfine and "3x" is 3, x.
 std::vector<std::string> TokensOf(std::string_view words) {
-    const std::string text = Folded(words);
+    const std::string text = FoldedScoreWords(words);
     std::vector<std::string> tokens;
     for (std::size_t i = 0; i < text.size() && tokens.size() < kMostWords;) {
         std::size_t end = i;

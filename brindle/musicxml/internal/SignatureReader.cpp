@@ -12,15 +12,15 @@ namespace {
 
 using enum TScoreElement;
 
-constexpr std::int32_t kMostBeats = 10'000;
+constexpr std::int32_t kMostBeatsRead = 10'000;
 
 // "3+2" is five beats.
 std::int32_t SumOfBeats(std::string_view text) {
     std::int32_t sum = 0;
     while (true) {
-        sum += std::clamp(ReadInteger(text), 0, kMostBeats);
+        sum += std::clamp(ReadInteger(text), 0, kMostBeatsRead);
         const std::size_t plus = text.find('+');
-        if (plus == text.npos || sum >= kMostBeats) return std::min(sum, kMostBeats);
+        if (plus == text.npos || sum >= kMostBeatsRead) return std::min(sum, kMostBeatsRead);
         text.remove_prefix(plus + 1);
     }
 }
@@ -76,7 +76,7 @@ void CSignatureReader::EndedInTime(TScoreElement element, std::string_view text)
 
 // Several pairs of numbers stand for times that are added, "3/8 + 2/4".
 void CSignatureReader::AddTime(std::int32_t beatType) {
-    if (beatType <= 0 || beatType > kMostBeats || mBeats <= 0) return;
+    if (beatType <= 0 || beatType > kMostBeatsRead || mBeats <= 0) return;
     if (mTime.mBeatType == 0) {
         mTime = {mBeats, beatType};
     } else if (beatType % mTime.mBeatType == 0) {
@@ -84,7 +84,7 @@ void CSignatureReader::AddTime(std::int32_t beatType) {
     } else if (mTime.mBeatType % beatType == 0) {
         mTime.mBeats += mBeats * (mTime.mBeatType / beatType);
     }
-    mTime.mBeats = std::min(mTime.mBeats, kMostBeats);
+    mTime.mBeats = std::min(mTime.mBeats, kMostBeatsRead);
     mBeats = 0;
 }
 

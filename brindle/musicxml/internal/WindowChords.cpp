@@ -12,20 +12,20 @@ namespace brindle {
 namespace {
 
 constexpr double kForeignShare = 200.0;  // of all that sounds
-constexpr int kForeignNote = 6;
-constexpr int kForeignBass = 17;
-constexpr int kBassAtMost = 100;
-constexpr int kNoRoot = 45;
-constexpr int kNoThird = 50;
-constexpr int kNoFifth = 12;
-constexpr int kNoExtension = 5;
+constexpr int kCostOfForeignNote = 6;
+constexpr int kCostOfForeignBass = 17;
+constexpr int kCostOfBassAtMost = 100;
+constexpr int kCostOfNoRoot = 45;
+constexpr int kCostOfNoThird = 50;
+constexpr int kCostOfNoFifth = 12;
+constexpr int kCostOfNoExtension = 5;
 constexpr int kNoOther = 45;
 
 int CostOfMissing(const CNamingType& type, int tone) {
-    if (tone == 0) return kNoRoot;
-    if (HasTone(type.mOptional, tone)) return kNoExtension;
-    if (tone == type.mThird) return kNoThird;
-    return tone == 7 && !type.mIsPlainSixth ? kNoFifth : kNoOther;
+    if (tone == 0) return kCostOfNoRoot;
+    if (HasTone(type.mOptional, tone)) return kCostOfNoExtension;
+    if (tone == type.mThird) return kCostOfNoThird;
+    return tone == 7 && !type.mIsPlainSixth ? kCostOfNoFifth : kNoOther;
 }
 
 int CostInKey(int root, TToneMask tones, const CSignKeyLite& key) {
@@ -43,7 +43,7 @@ int CostOfWindowChord(const CNoteWindow& window, int root, std::size_t type,
     const CNamingTypeRow& row = kNamingTypeRows[type];
     const int bass = FoldIntoOctave(window.mBass - root);
     const int overBass = row.mCostOverBass[static_cast<std::size_t>(bass)];
-    int cost = std::min(overBass, row.mCost + kBassAtMost) * 4 / 10;
+    int cost = std::min(overBass, row.mCost + kCostOfBassAtMost) * 4 / 10;
     double foreign = 0.0;
     for (int tone = 0; tone < 12; ++tone) {
         const double share = window.mShares[static_cast<std::size_t>((root + tone) % 12)];
@@ -51,7 +51,7 @@ int CostOfWindowChord(const CNoteWindow& window, int root, std::size_t type,
             if (share <= 0.0) cost += CostOfMissing(made, tone);
         } else if (share > 0.0) {
             if (tone != bass) foreign += share;
-            cost += tone == bass ? kForeignBass : kForeignNote;
+            cost += tone == bass ? kCostOfForeignBass : kCostOfForeignNote;
         }
     }
     return cost + static_cast<int>(std::lround(foreign * kForeignShare)) +

@@ -12,13 +12,13 @@
 namespace brindle {
 namespace {
 
-constexpr std::array<std::size_t, 3> kBarsPerLine{4, 2, 1};
-constexpr std::string_view kGap = "  ";
+constexpr std::array<std::size_t, 3> kBarsPerLineTried{4, 2, 1};
+constexpr std::string_view kGapOfBars = "  ";
 /// A chord that was there before, as people type it.
-constexpr std::string_view kHold = ".";
+constexpr std::string_view kChordHeld = ".";
 
 /// A chord with what stands over and under it.
-struct CCell {
+struct CReadingCell {
     std::string mKey;
     std::string mSymbol;
     std::string mNumeral;
@@ -28,11 +28,11 @@ struct CCell {
             {CountCharacters(mKey), CountCharacters(mSymbol), CountCharacters(mNumeral)});
     }
 };
-using TBarCells = std::vector<CCell>;
+using TBarCells = std::vector<CReadingCell>;
 
-std::size_t WidthOf(const TBarCells& bar) {
-    std::size_t width = bar.empty() ? 0 : kGap.size() * (bar.size() - 1);
-    for (const CCell& cell : bar) width += cell.Width();
+std::size_t WidthOfBar(const TBarCells& bar) {
+    std::size_t width = bar.empty() ? 0 : kGapOfBars.size() * (bar.size() - 1);
+    for (const CReadingCell& cell : bar) width += cell.Width();
     return width;
 }
 
@@ -57,7 +57,7 @@ public:
     }
 
     [[nodiscard]] std::string Write() {
-        for (const std::size_t barsPerLine : kBarsPerLine) {
+        for (const std::size_t barsPerLine : kBarsPerLineTried) {
             Break(barsPerLine);
             if (LineWidth() <= mLines.mWidth) break;
         }
@@ -82,12 +82,12 @@ private:
     [[nodiscard]] TBarCells CellsOf(const CReadingBar& bar) const {
         TBarCells cells;
         if (!bar.HasChords()) {
-            cells.push_back({"", std::string(kHold), ""});
+            cells.push_back({"", std::string(kChordHeld), ""});
             if (bar.mCount > 1) cells.front().mSymbol += fmt::format(" x {}", bar.mCount);
             return cells;
         }
         const double begin = mSong.mChords[bar.mBegin].mPosition;
-        if (mBars.BeatOf(begin) > 1.0) cells.push_back({"", std::string(kHold), ""});
+        if (mBars.BeatOf(begin) > 1.0) cells.push_back({"", std::string(kChordHeld), ""});
         for (std::size_t ix = bar.mBegin; ix < bar.mEnd; ++ix) {
             std::string symbol = ix < mSong.mSymbols.size() ? Printable(mSong.mSymbols[ix]) : "";
             if (symbol.empty()) symbol = "-";
@@ -129,7 +129,7 @@ private:
         for (const CReadingLine& line : mBroken) {
             for (std::size_t bar = line.mBegin; bar < line.mEnd; ++bar) {
                 std::size_t& width = mWidths[bar - line.mBegin];
-                width = std::max(width, WidthOf(mCells[bar]));
+                width = std::max(width, WidthOfBar(mCells[bar]));
             }
         }
     }
@@ -149,11 +149,12 @@ private:
             PadLeft(fmt::format("{}", mLines.mBars[line.mBegin].mNumber), mLabelWidth);
         text += mPaint.Faint(label + " |");
         for (std::size_t bar = line.mBegin; bar < line.mEnd; ++bar) {
-            text += ' ' + mPaint.Strong(Row(line, bar, &CCell::mSymbol)) + mPaint.Faint(" |");
+            text +=
+                ' ' + mPaint.Strong(Row(line, bar, &CReadingCell::mSymbol)) + mPaint.Faint(" |");
         }
         text += '\n' + mPaint.Faint(std::string(mLabelWidth, ' ') + " |");
         for (std::size_t bar = line.mBegin; bar < line.mEnd; ++bar) {
-            text += ' ' + Row(line, bar, &CCell::mNumeral) + mPaint.Faint(" |");
+            text += ' ' + Row(line, bar, &CReadingCell::mNumeral) + mPaint.Faint(" |");
         }
         text += '\n';
     }
@@ -161,7 +162,7 @@ private:
     void WriteKeys(const CReadingLine& line, std::string& text) const {
         std::string keys(mLabelWidth + 2, ' ');
         for (std::size_t bar = line.mBegin; bar < line.mEnd; ++bar) {
-            keys += ' ' + Row(line, bar, &CCell::mKey) + kGap.data();
+            keys += ' ' + Row(line, bar, &CReadingCell::mKey) + kGapOfBars.data();
         }
         const std::size_t last = keys.find_last_not_of(' ');
         if (last == keys.npos) return;
@@ -170,10 +171,10 @@ private:
 
     // One of the three texts of all chords of a bar.
     [[nodiscard]] std::string Row(const CReadingLine& line, std::size_t bar,
-                                  std::string CCell::*part) const {
+                                  std::string CReadingCell::*part) const {
         std::string row;
-        for (const CCell& cell : mCells[bar]) {
-            if (!row.empty()) row += kGap;
+        for (const CReadingCell& cell : mCells[bar]) {
+            if (!row.empty()) row += kGapOfBars;
             row += PadRight(cell.*part, cell.Width());
         }
         return PadRight(row, mWidths[bar - line.mBegin]);

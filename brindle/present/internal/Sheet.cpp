@@ -15,9 +15,6 @@ namespace {
 // More bars than this without a chord are drawn as one rest.
 constexpr std::size_t kMostEmptyBars = 8;
 
-// Positions that differ by less are the same.
-constexpr double kTolerance = 1e-6;
-
 std::vector<double> TidyPositions(const CSong& song) {
     std::vector<double> positions(CountChords(song));
     double before = 0.0;

@@ -10,6 +10,9 @@
 /// What is written on a lead sheet, before it is laid out.
 namespace brindle::LeadSheet {
 
+/// Positions that differ by less are the same.
+inline constexpr double kTolerance = 1e-6;
+
 inline constexpr std::size_t kNone = static_cast<std::size_t>(-1);
 
 /// A bar that is drawn, or some bars without a chord that are drawn as one rest.

@@ -181,7 +181,7 @@ private:
     void DrawChord(const CPlacedChord& chord) {
         const CChordTexts& texts = mScore.mTexts[chord.mChord];
         const double baseLine = mTop + kBandPadding + Scale() * kSymbolRise;
-        mPen.Runs(mX + chord.mX, baseLine, Scale() * kSymbolSize, texts.mSymbol, "sym ink");
+        mPen.Runs(mX + chord.mX, baseLine, Scale() * kSheetSymbolSize, texts.mSymbol, "sym ink");
         if (texts.mNumeral.empty()) return;
         mPen.Runs(mX + chord.mX, baseLine + Scale() * kNumeralDrop, Scale() * kNumeralSize,
                   texts.mNumeral, "num ink");

@@ -254,7 +254,7 @@ std::vector<CChordTexts> MakeChordTexts(const CSong& song, const CSongReading& r
         CChordTexts& text = texts[i];
         text.mSymbol = SetSymbol(SymbolOf(song, i));
         if (i < reading.mChords.size()) text.mNumeral = SetNumeral(reading.mChords[i].mNumeral);
-        text.mSymbolWidth = kSymbolSize * LeadSheet::WidthOf(text.mSymbol);
+        text.mSymbolWidth = kSheetSymbolSize * LeadSheet::WidthOf(text.mSymbol);
         text.mNumeralWidth = kNumeralSize * LeadSheet::WidthOf(text.mNumeral);
     }
     return texts;

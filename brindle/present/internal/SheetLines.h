@@ -12,7 +12,7 @@
 /// line.
 namespace brindle::LeadSheet {
 
-inline constexpr double kSymbolSize = 21.0;
+inline constexpr double kSheetSymbolSize = 21.0;
 inline constexpr double kNumeralSize = 13.0;
 
 /// The texts of a chord; their widths are for full size.

@@ -10,8 +10,6 @@
 namespace brindle::LeadSheet {
 namespace {
 
-constexpr double kTolerance = 1e-6;
-
 // A first ending that is longer is no ending to the eye.
 constexpr std::size_t kLongestEnding = 8;
 

@@ -67,7 +67,7 @@ std::string_view TakeAccidental(std::string_view& text) {
     return {};
 }
 
-std::string TakeAccidentals(std::string_view& text) {
+std::string TakeSigns(std::string_view& text) {
     std::string signs;
     for (auto sign = TakeAccidental(text); !sign.empty(); sign = TakeAccidental(text))
         signs += sign;
@@ -127,7 +127,7 @@ void AddNote(CTextRuns& runs, std::string_view& text, double size) {
     const std::size_t length = LengthOfNote(text);
     Add(runs, std::string(text.substr(0, length)), size);
     text.remove_prefix(length);
-    Add(runs, TakeAccidentals(text), size * kAccidentalSize, kAccidentalRaise);
+    Add(runs, TakeSigns(text), size * kAccidentalSize, kAccidentalRaise);
 }
 
 // The small m of a minor chord, taken from the text.
@@ -173,7 +173,7 @@ std::string TakeDegree(std::string_view& text) {
 
 // One part of a numeral with slashes.
 void AddNumeralPart(CTextRuns& runs, std::string_view part) {
-    Add(runs, TakeAccidentals(part), kAccidentalSize, kAccidentalRaise / 2);
+    Add(runs, TakeSigns(part), kAccidentalSize, kAccidentalRaise / 2);
     const std::string degree = TakeDegree(part);
     Add(runs, degree);
     const bool isFigures = !degree.empty();

@@ -115,10 +115,10 @@ public:
 
 private:
     void CutDirective(std::string_view directive) {
-        directive = WithoutBlanksInFront(directive);
+        directive = TrimmedInFront(directive);
         const std::string name = Lower(directive.substr(0, directive.find_first_of(": \t")));
         const std::size_t begin = std::min(name.size() + 1, directive.size());
-        Obey(name, WithoutBlanksInFront(directive.substr(begin)), directive);
+        Obey(name, TrimmedInFront(directive.substr(begin)), directive);
     }
 
     void Obey(std::string_view name, std::string_view value, std::string_view directive) {

@@ -25,7 +25,7 @@ public:
     void Cut() {
         TakeSectionInFront();
         while (!mList.IsGivenUp()) {
-            mRest = WithoutBlanksInFront(mRest);
+            mRest = TrimmedInFront(mRest);
             if (mRest.empty()) return;
             if (TakeBar() || TakeSectionInBraces() || TakeEnding() || TakePlayWords()) continue;
             TakeWord();

@@ -18,7 +18,7 @@ constexpr int kMostTimes = 16;
 
 /// How often a line is played that ends in "x3"; the words are taken off.
 int TakeTimes(std::string_view& line) {
-    const std::size_t blank = line.find_last_of(kBlanks);
+    const std::size_t blank = line.find_last_of(Ascii::kWhiteSpace);
     if (blank == line.npos) return 1;
     const std::string_view word = line.substr(blank + 1);
     const std::size_t digits = word.find_first_of("0123456789");

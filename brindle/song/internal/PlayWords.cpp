@@ -41,7 +41,7 @@ constexpr auto kPhrases = std::to_array<std::string_view>({
 
 /// Letters and digits of a word in lower case; empty for a word with anything but points, commas
 /// and brackets beside them.
-std::string Folded(std::string_view word) {
+std::string FoldedPlayWord(std::string_view word) {
     constexpr std::string_view kLeftOut = ".,()";
     std::string folded;
     for (const char c : Lower(word)) {
@@ -78,7 +78,7 @@ std::size_t LengthOfPlayWords(std::string_view text) {
     std::size_t end = 0;
     for (int count = 0; count < kMostWords; ++count) {
         const std::string_view word = WordAt(text, end);
-        const std::string folded = Folded(word);
+        const std::string folded = FoldedPlayWord(word);
         if (folded.empty() || word.size() > 20) break;
         end += word.size();
         if (count == 0 && IsTimes(folded)) return end;

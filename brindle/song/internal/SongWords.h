@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "brindle/platform/Ascii.h"
+
 #include <algorithm>
 #include <string>
 #include <string_view>
@@ -8,38 +10,26 @@
 /// Cutting texts of songs at white space.
 namespace brindle::SongText {
 
-inline constexpr std::string_view kBlanks = " \t\r\v\f\n";
+using Ascii::IsDigit;
+using Ascii::Trimmed;
+using Ascii::TrimmedInFront;
 
 [[nodiscard]] constexpr bool IsBlank(char c) {
-    return kBlanks.find(c) != kBlanks.npos;
-}
-[[nodiscard]] constexpr bool IsDigit(char c) {
-    return c >= '0' && c <= '9';
-}
-
-[[nodiscard]] constexpr std::string_view WithoutBlanksInFront(std::string_view text) {
-    return text.substr(std::min(text.find_first_not_of(kBlanks), text.size()));
-}
-
-[[nodiscard]] constexpr std::string_view Trimmed(std::string_view text) {
-    text = WithoutBlanksInFront(text);
-    return text.substr(0, text.find_last_not_of(kBlanks) + 1);
+    return Ascii::IsWhiteSpace(c);
 }
 
 /// Letters of ASCII in lower case.
 [[nodiscard]] inline std::string Lower(std::string_view text) {
     std::string lower(text);
-    std::transform(lower.begin(), lower.end(), lower.begin(), [](char c) {
-        return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
-    });
+    std::transform(lower.begin(), lower.end(), lower.begin(), Ascii::ToLower);
     return lower;
 }
 
 /// The first word; `text` goes on behind it and the blanks that follow.
 constexpr std::string_view TakeWordOf(std::string_view& text) {
-    text = WithoutBlanksInFront(text);
-    const std::string_view word = text.substr(0, text.find_first_of(kBlanks));
-    text = WithoutBlanksInFront(text.substr(word.size()));
+    text = TrimmedInFront(text);
+    const std::string_view word = text.substr(0, text.find_first_of(Ascii::kWhiteSpace));
+    text = TrimmedInFront(text.substr(word.size()));
     return word;
 }
 

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
-#include "brindle/analysis/internal/JsonText.h"
+#include "brindle/analysis/internal/NativeText.h"
 
 #include "brindle/analysis/Positions.h"
 
-namespace brindle::JsonText {
+namespace brindle::NativeText {
 
 void WriteProbability(std::ostream& stream, double probability) {
     if (probability == kPosUndef) {
@@ -13,4 +13,4 @@ void WriteProbability(std::ostream& stream, double probability) {
     }
 }
 
-}  // namespace brindle::JsonText
+}  // namespace brindle::NativeText

@@ -6,7 +6,7 @@
 #include <iosfwd>
 
 /// The pieces of JSON text that the records of an analysis share.
-namespace brindle::JsonText {
+namespace brindle::NativeText {
 
 /// The bare word Undef for `kPosUndef`, else the number.
 void WriteProbability(std::ostream& stream, double probability);
@@ -25,4 +25,4 @@ void WriteList(std::ostream& stream, const TList& list) {
     PlainText::EndLine(stream);
 }
 
-}  // namespace brindle::JsonText
+}  // namespace brindle::NativeText
