@@ -59,6 +59,7 @@ private:
     bool ReadAugmented(std::size_t wordLength);
     bool ReadPunctuation(char c);
     bool ReadOmission(std::size_t wordLength);
+    bool ReadRaisedFourth();
     bool ReadSuspension();
     bool ReadAddition(std::size_t wordLength);
     bool ReadSignedDegree(int sign, std::size_t signLength);

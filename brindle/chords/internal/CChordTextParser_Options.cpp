@@ -168,6 +168,18 @@ bool CChordTextParser::ReadOmission(std::size_t wordLength) {
     }
 }
 
+/// Directly behind a word for suspended, `#4` or `(+4` is the tone that suspends.
+bool CChordTextParser::ReadRaisedFourth() {
+    CTextScan scan = mScan;
+    scan.SkipBlanks();
+    const bool isInBracket = scan.Take('(');
+    if (TakeSign(scan) != 1 || TakeNumber(scan) != 4) return false;
+    mScan = scan;
+    mTones.Suspend(6);
+    if (isInBracket) ++mDepth;
+    return true;
+}
+
 /// False when it is no suspension after all.
 bool CChordTextParser::ReadSuspension() {
     CTextScan scan = mScan;
@@ -180,15 +192,10 @@ bool CChordTextParser::ReadSuspension() {
         return scan.SeesWord(row.mText) && (wordLength > 0 || row.mText.size() == 1);
     };
     const auto* const row = std::find_if(kSuspensionRows.begin(), kSuspensionRows.end(), fits);
-    const bool isRaisedFourth =
-        wordLength > 0 && behindWord.SeesWord("#4") && !IsDigit(behindWord.Peek(2));
-    if (isRaisedFourth) {
-        mScan.mPos = behindWord.mPos + 2;
-        mTones.Suspend(6);
-    } else if (row == kSuspensionRows.end()) {
+    if (row == kSuspensionRows.end()) {
         if (wordLength == 0) return false;
         mScan = behindWord;
-        mTones.Suspend(5);
+        if (!ReadRaisedFourth()) mTones.Suspend(5);
     } else {
         scan.mPos += row->mText.size();
         mScan = scan;
