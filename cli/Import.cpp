@@ -97,10 +97,11 @@ bool ImportBytes(MusicXmlParser& parser, const std::string& bytes, bool isCompre
                  const std::shared_ptr<const MusicXmlParserDelegate>& host, Error& error) {
     if (!isCompressed) return parser.parseBytes(bytes, host, &error);
     if (const auto score = ScoreInContainer(bytes)) return parser.parseBytes(*score, host, &error);
+    // The library's reason may speak of a file that it does not make here.
     std::string unused;
-    const auto failure = MusicXmlParser::unpackCompressedMusicXML(bytes, unused);
-    return MusicXmlParser::assignLocalError(
-        failure.value_or(Error{"", 0, "no score in the container"}), &error);
+    error = MusicXmlParser::unpackCompressedMusicXML(bytes, unused).value_or(Error{});
+    error.description = ContainerFault(bytes);
+    return false;
 }
 
 // False with an error; nothing when standard input cannot be read.

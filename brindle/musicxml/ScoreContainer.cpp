@@ -84,4 +84,8 @@ std::optional<std::string> ScoreInContainer(std::string_view bytes) {
     return file->mContents;
 }
 
+const char* ContainerFault(std::string_view bytes) {
+    return UnpackZip(bytes) ? "no score in the container" : "the container cannot be unpacked";
+}
+
 }  // namespace brindle

@@ -15,4 +15,7 @@ namespace brindle {
 /// is none, or if the container is damaged.
 [[nodiscard]] std::optional<std::string> ScoreInContainer(std::string_view bytes);
 
+/// What is wrong with a container in which `ScoreInContainer` finds nothing.
+[[nodiscard]] const char* ContainerFault(std::string_view bytes);
+
 }  // namespace brindle

@@ -83,7 +83,7 @@ bool Import(std::string_view bytes, const std::shared_ptr<const MusicXmlParserDe
     if (IsScoreContainer(bytes)) {
         unpacked = ScoreInContainer(bytes);
         if (!unpacked) {
-            error = {"", 0, "no score in the container"};
+            error = {"", 0, ContainerFault(bytes)};
             return false;
         }
     }

@@ -36,5 +36,20 @@ TEST_CASE("The chord text of a score is read back as the same chords at the same
     CHECK(RunCommand(compare).mShown == "");
 }
 
+TEST_CASE("A container that holds no score, or cannot be unpacked, is told as what it is") {
+    const std::string empty = "printf 'PK\\005\\006'; head -c 18 /dev/zero";
+    const std::string broken = "printf 'PK\\003\\004'";
+    for (const std::string command : {"import", "harmonies", "analyse"}) {
+        INFO(command);
+        const auto told = [&](const std::string& bytes) {
+            return RunCommand("{ " + bytes + "; } | brindle " + command + " -").mShown;
+        };
+        CHECK(told(empty) ==
+              "[stderr]\nbrindle: standard input: no score in the container\n[status 1]\n");
+        CHECK(told(broken) ==
+              "[stderr]\nbrindle: standard input: the container cannot be unpacked\n[status 1]\n");
+    }
+}
+
 }  // namespace
 }  // namespace brindle::test

@@ -385,7 +385,8 @@ TEST_CASE("Scores in any encoding are read, and what is no score is told") {
         {"<score-partwise>\n<part></measure>",
          "2:17: Opening and ending tag mismatch: part line 2 "
          "and measure"},
-        {"PK\x03\x04", "no score in the container"},
+        {"PK\x03\x04", "the container cannot be unpacked"},
+        {"PK\x05\x06" + std::string(18, '\0'), "no score in the container"},
     };
     for (const CRow& row : rows) {
         TMusicXMLDoc doc;

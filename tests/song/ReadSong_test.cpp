@@ -264,7 +264,7 @@ TEST_CASE("What cannot be read is a fault and no song") {
     CHECK(Faults(ReadSong("<score-partwise>\n <part></parts>")).substr(0, 2) == "2:");
     std::string archive = "PK\x03\x04";
     archive.resize(100);
-    CHECK(Faults(ReadSong(archive)) == "0:0: no score in the container");
+    CHECK(Faults(ReadSong(archive)) == "0:0: the container cannot be unpacked");
 }
 
 TEST_CASE("Lead sheets become songs with the bars that are printed") {

@@ -72,7 +72,7 @@ CPlayedScore PlayScoreBytes(std::string_view bytes) {
     if (IsScoreContainer(bytes)) {
         unpacked = ScoreInContainer(bytes);
         if (!unpacked) {
-            played.mFault = FaultOf(LoadFault_Container, "no score in the container");
+            played.mFault = FaultOf(LoadFault_Container, ContainerFault(bytes));
             return played;
         }
         bytes = *unpacked;
