@@ -8,6 +8,8 @@ namespace {
 
 constexpr int kPercussionChannel = 9;
 constexpr int kChannels = 16;
+// The snare drum of General MIDI, for a note that neither instrument nor staff place gives a key.
+constexpr int kUsualDrum = 38;
 
 // Parts without a channel of their own share the channels that are not for percussion.
 int ChannelOfPart(const CImportedPart& part, std::size_t index) {
@@ -20,6 +22,12 @@ int ChannelOfPart(const CImportedPart& part, std::size_t index) {
 int ChannelOfNote(const CImportedPart& part, const CImportedEvent& note, int channel) {
     if (note.mMidiChannel) return std::min(*note.mMidiChannel, kChannels - 1);
     return note.mIsUnpitched && !part.mChannel ? kPercussionChannel : channel;
+}
+
+// Negative for a note without a known pitch.
+std::int64_t KeyOfNote(const CImportedEvent& note) {
+    if (note.mMidiKey) return *note.mMidiKey;
+    return note.mIsUnpitched && note.mNoteNr < 0 ? kUsualDrum : note.mNoteNr;
 }
 
 void AddPrograms(const CImportedPart& part, int channel, CMidiTrack& track) {
@@ -38,7 +46,7 @@ CMidiTrack TrackOf(const CImportedPart& part, int channel) {
     AddPrograms(part, channel, track);
     for (const auto* const events : {&part.mEvents, &part.mNotesLeftOpen}) {
         for (const CImportedEvent& event : *events) {
-            const std::int64_t key = event.mMidiKey ? *event.mMidiKey : event.mNoteNr;
+            const std::int64_t key = KeyOfNote(event);
             if (!event.mIsNote || !event.mLength || key < 0) continue;
             track.mNotes.push_back({event.mPosition, *event.mLength,
                                     ChannelOfNote(part, event, channel), static_cast<int>(key),

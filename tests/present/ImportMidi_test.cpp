@@ -74,6 +74,12 @@ TEST_CASE(
     const CMidiPiece untold = MidiPieceOf(Import("", Drum("")));
     CHECK(untold.mTracks[0].mNotes.at(0).mNoteNr == 65);
     CHECK(untold.mTracks[0].mNotes.at(0).mChannel == 9);
+    const CMidiPiece placeless =
+        MidiPieceOf(Import("", "<note><unpitched/><duration>2</duration></note>" + Drum("")));
+    REQUIRE(placeless.mTracks[0].mNotes.size() == 2);
+    CHECK(placeless.mTracks[0].mNotes[0].mNoteNr == 38);
+    CHECK(placeless.mTracks[0].mNotes[0].mChannel == 9);
+    CHECK(placeless.mTracks[0].mNotes[0].mDuration == 1920);
 }
 
 TEST_CASE(
