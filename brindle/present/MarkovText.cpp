@@ -25,9 +25,20 @@ int FifthsOf(const CKeyEnh& note) {
     return (natural * 7 + 1) % 12 - 1 + 7 * EnhToSemitone(note.mEnh);
 }
 
-// The note of a key number on the twelve steps of the line of fifths from `first` on.
-CKeyEnh NoteOnFifths(int keyNr, int first) {
-    const int fifths = first + FoldIntoOctave(keyNr * 7 - first);
+// The place of a root as people type it: no Fb, no B# and no double signs, and Cb and E# only in
+// keys that have them.
+int TypedFifths(int fifths, int firstOfKey) {
+    constexpr int kCFlat = -7;
+    constexpr int kESharp = 11;
+    const bool isOfKey = fifths >= firstOfKey && fifths < firstOfKey + 7;
+    if (fifths < kCFlat || (fifths == kCFlat && !isOfKey)) return fifths + 12;
+    if (fifths > kESharp || (fifths == kESharp && !isOfKey)) return fifths - 12;
+    return fifths;
+}
+
+// The root of a key number on the twelve steps of the line of fifths from `first` on.
+CKeyEnh RootInKey(int keyNr, int first, int firstOfKey) {
+    const int fifths = TypedFifths(first + FoldIntoOctave(keyNr * 7 - first), firstOfKey);
     const int natural = (fifths + 1 + 70) % 7 - 1;
     return {FoldIntoOctave(keyNr), static_cast<TEnh>(TEnh_n + (fifths - natural) / 7)};
 }
@@ -98,10 +109,11 @@ CMarkovSpelling::CMarkovSpelling(MarkovSequenceView sequence)
 CChordLite CMarkovSpelling::Spelled(const CChordLite& chord) const {
     if (mKey.IsUndef() || chord.mRootKeyEnh.IsUndef()) return chord;
     // A minor key has its leading tone, and a major key the leading tone of its fifth.
-    const int first =
-        FifthsOf(mKey.mRootKeyEnh) - (mKey.mSignKeyType == TSignKeyType_Minor ? 6 : 5);
+    const bool isMinor = mKey.mSignKeyType == TSignKeyType_Minor;
+    const int tonic = FifthsOf(mKey.mRootKeyEnh);
     CChordLite spelled = chord;
-    spelled.mRootKeyEnh = NoteOnFifths(chord.mRootKeyEnh.mKeyNr, first);
+    spelled.mRootKeyEnh =
+        RootInKey(chord.mRootKeyEnh.mKeyNr, tonic - (isMinor ? 6 : 5), tonic - (isMinor ? 4 : 1));
     if (!chord.HasBassNote()) return spelled;
     const int intvl = FoldIntoOctave(chord.mBassKeyEnh.mKeyNr - chord.mRootKeyEnh.mKeyNr);
     spelled.mBassKeyEnh = spelled.mRootKeyEnh + intvl;

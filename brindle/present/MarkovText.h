@@ -12,7 +12,8 @@ namespace brindle {
 /// goes to F#7. Learned chords keep the spelling of the songs that they come from, which differ.
 ///
 /// Roots are those of the line of fifths around the tonic: in C from Db to F#, in A minor from Eb
-/// to G#. A bass is spelled from its root, as in D/F#. Without a key chords stay as they are.
+/// to G#. But nobody types Fb, B# or double signs: in Ab it is E, and Cb and E# are for keys that
+/// have them. A bass is spelled from its root, as in D/F#. Without a key chords stay as they are.
 class CMarkovSpelling {
 public:
     explicit CMarkovSpelling(MarkovSequenceView sequence);

@@ -45,6 +45,29 @@ TEST_CASE("A sequence is spelled in its key, whatever songs its chords come from
           "(4,F);(2,Bb);(2,D/F#);(4,Gm);(4,C7);(8,F)");
 }
 
+TEST_CASE("Roots of keys with many signs are those that people type") {
+    const auto rootsIn = [](const char* key) {
+        const CMarkovSpelling spelling{CSignKeyLite(key)};
+        std::string roots;
+        for (int keyNr = 0; keyNr < 12; ++keyNr) {
+            CMarkovObject object;
+            object.mType = TMarkovObjectType_Chord;
+            object.mChord.mRootKeyEnh = CKeyEnh(keyNr);
+            object.mChord.mSemitones = {0, 4, 7};
+            roots += (roots.empty() ? "" : " ") + spelling.SymbolOf(object);
+        }
+        return roots;
+    };
+    CHECK(rootsIn("C major") == "C Db D Eb E F F# G Ab A Bb B");
+    CHECK(rootsIn("Eb major") == "C Db D Eb E F Gb G Ab A Bb B");
+    CHECK(rootsIn("Ab major") == "C Db D Eb E F Gb G Ab A Bb B");
+    CHECK(rootsIn("Gb major") == "C Db D Eb E F Gb G Ab A Bb Cb");
+    CHECK(rootsIn("Ab minor") == "C Db D Eb E F Gb G Ab A Bb Cb");
+    CHECK(rootsIn("E major") == "C C# D D# E F F# G G# A A# B");
+    CHECK(rootsIn("F# major") == "C C# D D# E E# F# G G# A A# B");
+    CHECK(rootsIn("D# minor") == "C C# D D# E E# F# G G# A A# B");
+}
+
 TEST_CASE("Chords are named as people type them, and gaps are U") {
     CHECK(Spelled("(4,Gmmaj7);(2.5,U);(4,D9sus4)") == "(4,Gm(maj7));(2.5,U);(4,D9sus4)");
 }
