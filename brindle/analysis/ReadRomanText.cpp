@@ -13,8 +13,8 @@
 namespace brindle {
 namespace {
 
-constexpr std::size_t kMostBars = 1'000'000;
-constexpr std::size_t kMostCopiedWords = 1'000'000;
+constexpr std::size_t kMostBars = 100'000;
+constexpr std::size_t kMostCopiedWords = 100'000;
 constexpr std::size_t kMostFaults = 1'000;
 
 constexpr std::string_view kNotHigher =

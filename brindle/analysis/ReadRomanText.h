@@ -74,7 +74,7 @@ struct CRomanTextReading {
 /// the second one. `m5-8 = m1-4` copies measures, in the key of the place. A chord sounds up to the
 /// next one or the end. A measure 0 begins with its first beat.
 ///
-/// Time is linear in the length of what is read and copied; more than a million measures or copied
+/// Time is linear in the length of what is read and copied; more than 100,000 measures or copied
 /// words are a fault.
 [[nodiscard]] CRomanTextReading ReadRomanText(std::string_view text);
 
