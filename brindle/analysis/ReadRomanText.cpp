@@ -88,7 +88,9 @@ private:
 void CRomanTextReader::Fail(std::string_view what, std::string_view where, bool isNote) {
     auto& list = isNote ? mReading.mNotes : mReading.mFaults;
     if (mIsCopy || list.size() >= kMostFaults) return;
-    list.push_back({mLineNumber, CharactersBefore(mLine, where.data()) + 1, std::string(what)});
+    // What is expected and not there has its place at the end of the line.
+    const char* const place = where.empty() ? mLine.data() + mLine.size() : where.data();
+    list.push_back({mLineNumber, CharactersBefore(mLine, place) + 1, std::string(what)});
 }
 
 CRomanTextReading CRomanTextReader::Read(std::string_view text) {

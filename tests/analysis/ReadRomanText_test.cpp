@@ -154,6 +154,8 @@ TEST_CASE("What is wrong is told with its line and column, and the rest is read"
 TEST_CASE("Hostile analyses end") {
     CHECK(ReadRomanText("").mChords.empty());
     CHECK(ReadRomanText(std::string(300000, 'm')).mFaults.size() == 1);
+    CHECK(FaultsText(ReadRomanText("m1 C: I\nm2 =\n").mFaults) ==
+          "2:5 measures are expected behind =");
     const CRomanTextReading gap = ReadRomanText("m1 C: I\nm999999 V\n");
     CHECK(gap.mBars.size() == 100'000);
     CHECK(FaultsText(gap.mFaults) == "2:1 there are too many measures");
