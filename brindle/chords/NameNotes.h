@@ -20,7 +20,8 @@ struct CChordNamePrefs;
 /// What the lowest of some notes means for their chord.
 enum class TBassUse {
     Usual,  ///< it is the bass, of the chord or foreign to it
-    Only,   ///< it is only the bass, the chord is above it, as a left hand plays it
+    Only,   ///< it is only the bass, the chord is above it, as a left hand plays it: a chord over
+            ///< its own root that nobody else plays is one without root, "C7b9(no1)"
     None,   ///< it says nothing, as on a ukulele, and no name has a slash
 };
 
