@@ -18,7 +18,7 @@ struct CKeyOptions {
     double mBeatsPerBar = 4.0;
     /// What a chord gains in the key of the song. More keeps passages at home.
     double mHomeBonus = 0.4;
-    /// What the nearest change of key costs. More makes longer regions.
+    /// What the nearest change of key costs, not less than 0. More makes longer regions.
     double mChangeCost = 4.0;
 };
 

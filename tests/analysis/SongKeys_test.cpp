@@ -307,7 +307,7 @@ TEST_CASE(
         CSongTraits traits;
         traits.mHome = static_cast<int>(chance.Below(24));
         traits.mIsBlues = chance.OneIn(2);
-        for (const double change : {4.0, 0.0, -3.0, 1.5, 50.0}) {
+        for (const double change : {4.0, 0.0, 0.5, 1.5, 50.0}) {
             CAPTURE(seed);
             CAPTURE(change);
             const CKeyOptions options{4.0, 0.3, change};
@@ -345,6 +345,10 @@ TEST_CASE("The home bonus and the cost of a change decide how many regions there
     CHECK(FindKeys(chords, {.mBeatsPerBar = 3.0, .mHomeBonus = 20.0}).mRegions.size() == 1);
     CHECK(FindKeys(chords, {.mBeatsPerBar = 3.0, .mChangeCost = 100.0}).mRegions.size() == 1);
     CHECK(FindKeys(chords, {.mBeatsPerBar = 3.0, .mChangeCost = 0.1}).mRegions.size() == 3);
+    const CHarmAnlsChords wander = Read("Cmaj7 F#m7 B7 Ebmaj7 Am7 D7", 4.0, 1.0);
+    CHECK(FindKeys(wander, {.mChangeCost = 0.0}).mRegions.size() > 1);
+    CHECK(FindKeys(wander, {.mChangeCost = -3.0}).mRegions.size() ==
+          FindKeys(wander).mRegions.size());
 }
 
 TEST_CASE("Broken positions, lengths, keys and options are survived") {

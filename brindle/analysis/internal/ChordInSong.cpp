@@ -19,7 +19,6 @@ CChordInSong::CChordInSong(const CSongToName& song, std::size_t ix)
       mKey(song.mKeys[ix]),
       mDegree(DegreeInKey(mChord.mRoot, mKey)),
       mNext(ix + 1 < song.mChords.size() ? mIx + 1 : kNoChord),
-      mIsDiatonic(IsInScale(mChord, mDegree, ScaleOfKey(mKey))),
       mDegreeBehind(DegreeOf(mNext)) {
     if (mNext < 0) return;
     mNextEffectiveDegree = EffectiveDegree(mNext);

@@ -54,7 +54,7 @@ public:
     [[nodiscard]] int DegreeOf(std::ptrdiff_t ix) const {
         return ix < 0 ? -1 : DegreeInKey(ChordAt(ix).mRoot, mKey);
     }
-    [[nodiscard]] bool IsDiatonic() const { return mIsDiatonic; }
+    [[nodiscard]] bool IsDiatonic() const { return IsInScale(mChord, mDegree, ScaleOfKey(mKey)); }
     [[nodiscard]] bool IsInParallelScale() const {
         return IsInScale(mChord, mDegree, ParallelScaleOfKey(mKey));
     }
@@ -108,7 +108,6 @@ private:
     int mKey;
     int mDegree;
     std::ptrdiff_t mNext;
-    bool mIsDiatonic;
     int mDegreeBehind;
     int mNextEffectiveDegree = -1;
     int mUpToNext = -1;

@@ -2,73 +2,185 @@
 // The keys that a song passes through: the path through the 24 keys with the most points. A chord
 // gives points to the keys that it fits, a change of key costs points, so a key changes where a few
 // chords together outweigh the change (Viterbi's algorithm).
+//
+// What a change costs depends on the steps between the signatures on the circle of fifths. So the
+// points stand in the order of that circle, and the best way into a key is a maximum over
+// neighbours, taken for several keys at once and without a branch. Only the way that is taken in
+// the end has to be known: the points are kept at every 32nd chord and made again between two of
+// those on the way back, which costs less than to note 24 ways a chord.
 
 #include "brindle/analysis/internal/LocalKeys.h"
 
 #include "brindle/analysis/internal/KeyTables.h"
 
 #include <algorithm>
+#include <array>
 #include <cmath>
-#include <limits>
+#include <utility>
 
 namespace brindle {
 namespace {
 
-using TPointsOfKeys = std::array<double, kKeyCount>;
-using TKeysBefore = std::array<std::uint8_t, kKeyCount>;
-
+constexpr std::size_t kFifths = 12;
+constexpr std::size_t kChordsPerBlock = 32;
 constexpr double kShortestInBars = 1.0 / 16;
 constexpr double kLongestInBars = 4.0;
 // What the seventh chords on I and IV gain at home in a blues, where they are at rest.
 constexpr double kBluesPoints = 2.7;
-// What a change costs more to the parallel key, or for each fifth between the signatures.
+// What a change costs more to the parallel key, or for each fifth between the signatures. Beyond
+// three fifths the signatures are far enough.
 constexpr double kParallelCost = 1.0;
 constexpr double kFifthCost = 0.5;
-// Beyond this far the signatures are far enough.
-constexpr int kMostFifths = 3;
+constexpr std::size_t kMostFifths = 3;
 
-// The tonic of the major key with the same signature.
-int SignatureOf(int key) {
-    return FoldIntoOctave(TonicOfKey(key) + 3 * ModeOfKey(key));
+using TFifths = std::array<double, kFifths>;
+using TTwiceFifths = std::array<double, 2 * kFifths>;
+
+/// Where a pitch class stands on the circle of fifths, counted from C.
+constexpr std::size_t PlaceOnCircle(int keyNr) {
+    return static_cast<std::size_t>(FoldIntoOctave(7 * keyNr));
 }
 
-// Steps on the circle of fifths between the signatures, 0 to 6.
-int FifthsBetween(int a, int b) {
-    const int up = FoldIntoOctave(7 * (SignatureOf(a) - SignatureOf(b)));
-    return std::min(up, 12 - up);
+/// The place of the signature of a key on the circle: C major and A minor are 0.
+constexpr std::size_t SignatureOf(int key) {
+    return PlaceOnCircle(TonicOfKey(key) + 3 * ModeOfKey(key));
 }
 
-double ChangeCost(int from, int to, double base) {
-    if (from == to) return 0.0;
-    if (TonicOfKey(from) == TonicOfKey(to)) return base + kParallelCost;
-    return base + kFifthCost * std::min(FifthsBetween(from, to), kMostFifths);
-}
+/// Points of the keys, by the places of their signatures on the circle.
+struct CPointsOfKeys {
+    TFifths mMajor;
+    TFifths mMinor;
 
-/// What the changes cost, [from][to], and the range of that. To stay costs nothing, so the most is
-/// not below that.
-struct CChangeCosts {
-    std::array<TPointsOfKeys, kKeyCount> mCosts{};
-    double mLeast = std::numeric_limits<double>::infinity();
-    double mMost = 0.0;
+    [[nodiscard]] double& Of(int key) {
+        return (IsMinorKey(key) ? mMinor : mMajor)[SignatureOf(key)];
+    }
+    [[nodiscard]] double Of(int key) const {
+        return (IsMinorKey(key) ? mMinor : mMajor)[SignatureOf(key)];
+    }
 };
 
-CChangeCosts ChangeCosts(double base) {
-    CChangeCosts costs;
-    for (int from = 0; from < kKeyCount; ++from) {
-        for (int to = 0; to < kKeyCount; ++to) {
-            if (from == to) continue;
-            const double cost = ChangeCost(from, to, base);
-            costs.mCosts[static_cast<std::size_t>(from)][static_cast<std::size_t>(to)] = cost;
-            costs.mLeast = std::min(costs.mLeast, cost);
-            costs.mMost = std::max(costs.mMost, cost);
+constexpr double LargerPoints(double a, double b) {
+    return a > b ? a : b;
+}
+
+/// The points of a chord for each key, to be weighed. In a row a key stands as far behind 12 as its
+/// signature behind the root on the circle.
+class CGainTable {
+public:
+    CGainTable() {
+        for (std::size_t kind = 0; kind < kKeyChordKindCount; ++kind) {
+            for (int i = 0; i < 2 * static_cast<int>(kFifths); ++i) {
+                const auto at = static_cast<std::size_t>(i);
+                mRows[0][kind][at] = kKeyLocalTable[0][kind][PlaceOnCircle(-i)];
+                mRows[1][kind][at] = kKeyLocalTable[1][kind][PlaceOnCircle(-i - 3)];
+            }
         }
     }
-    return costs;
+
+    [[nodiscard]] const double* RowOf(int mode, TKeyChordKind kind, int root) const {
+        return mRows[static_cast<std::size_t>(mode)][kind].data() + kFifths - PlaceOnCircle(root);
+    }
+
+private:
+    std::array<std::array<TTwiceFifths, kKeyChordKindCount>, 2> mRows;
+};
+
+/// The costs of a change, by the steps between the signatures, and to the parallel key.
+struct CChangeCosts {
+    explicit CChangeCosts(double base) : mParallel(base + kParallelCost) {
+        for (std::size_t steps = 0; steps <= kMostFifths; ++steps) {
+            mBySteps[steps] = base + kFifthCost * static_cast<double>(steps);
+        }
+    }
+
+    [[nodiscard]] double Between(int a, int b) const {
+        if (TonicOfKey(a) == TonicOfKey(b)) return mParallel;
+        const std::size_t up = (SignatureOf(a) + kFifths - SignatureOf(b)) % kFifths;
+        return mBySteps[std::min({up, kFifths - up, kMostFifths})];
+    }
+
+    std::array<double, kMostFifths + 1> mBySteps;
+    double mParallel;
+};
+
+double LargestPoints(const TFifths& points) {
+    double largest = points[0];
+    for (const double one : points) largest = LargerPoints(largest, one);
+    return largest;
+}
+
+/// The best that can be had by a change into a key with each signature from another signature. A
+/// signature counts as far away from itself, too: to stay is never worse than that.
+TFifths BestFromElsewhere(const CPointsOfKeys& best, const CChangeCosts& costs) {
+    TFifths better;
+    for (std::size_t i = 0; i < kFifths; ++i)
+        better[i] = LargerPoints(best.mMajor[i], best.mMinor[i]);
+    const double far = LargestPoints(better) - costs.mBySteps[3];
+    // Where the circle closes, it goes on: two more on both sides.
+    std::array<double, kFifths + 4> around;
+    for (std::size_t i = 0; i < kFifths; ++i) around[i + 2] = better[i];
+    for (std::size_t i = 0; i < 2; ++i) {
+        around[i] = better[i + kFifths - 2];
+        around[i + kFifths + 2] = better[i];
+    }
+    TFifths found;
+    for (std::size_t i = 0; i < kFifths; ++i) {
+        const double near = LargerPoints(around[i + 1], around[i + 3]) - costs.mBySteps[1];
+        const double apart = LargerPoints(around[i], around[i + 4]) - costs.mBySteps[2];
+        found[i] = LargerPoints(LargerPoints(near, apart), far);
+    }
+    return found;
+}
+
+/// The circle turned: what stands so many steps up comes to the begin.
+TFifths Turned(const TFifths& points, std::size_t steps) {
+    TFifths moved;
+    for (std::size_t i = 0; i + steps < kFifths; ++i) moved[i] = points[i + steps];
+    for (std::size_t i = 0; i < steps; ++i) moved[kFifths - steps + i] = points[i];
+    return moved;
+}
+
+/// The best that can be had by a change into each key.
+void ChangeKeys(const CPointsOfKeys& best, const CChangeCosts& costs, CPointsOfKeys& changed) {
+    const TFifths elsewhere = BestFromElsewhere(best, costs);
+    // The parallel minor key has three signs less, which is nine steps up.
+    const TFifths parallelMinor = Turned(best.mMinor, kFifths - 3);
+    const TFifths parallelMajor = Turned(best.mMajor, 3);
+    for (std::size_t i = 0; i < kFifths; ++i) {
+        const double change =
+            LargerPoints(best.mMinor[i] - costs.mBySteps[0], parallelMinor[i] - costs.mParallel);
+        changed.mMajor[i] = LargerPoints(elsewhere[i], change);
+    }
+    for (std::size_t i = 0; i < kFifths; ++i) {
+        const double change =
+            LargerPoints(best.mMajor[i] - costs.mBySteps[0], parallelMajor[i] - costs.mParallel);
+        changed.mMinor[i] = LargerPoints(elsewhere[i], change);
+    }
+}
+
+/// The points of the next chord: the better of staying in a key and of a change into it.
+void StepOn(const CPointsOfKeys& changed, const CPointsOfKeys& gains, CPointsOfKeys& best) {
+    for (std::size_t i = 0; i < kFifths; ++i) {
+        best.mMajor[i] = gains.mMajor[i] + LargerPoints(best.mMajor[i], changed.mMajor[i]);
+    }
+    for (std::size_t i = 0; i < kFifths; ++i) {
+        best.mMinor[i] = gains.mMinor[i] + LargerPoints(best.mMinor[i], changed.mMinor[i]);
+    }
 }
 
 // One root of the fourth and not two square ones: rounded once, it leaves equal sums equal.
-double Weight(const CKeyChord& chord, double beatsPerBar) {
-    return std::pow(std::clamp(chord.mBeats / beatsPerBar, kShortestInBars, kLongestInBars), 0.25);
+double Weight(double beats, double beatsPerBar) {
+    return std::pow(std::clamp(beats / beatsPerBar, kShortestInBars, kLongestInBars), 0.25);
+}
+
+std::vector<double> WeightsOf(std::span<const CKeyChord> chords, double beatsPerBar) {
+    std::vector<double> weights;
+    weights.reserve(chords.size());
+    for (std::size_t i = 0; i < chords.size(); ++i) {
+        const bool isSame = i > 0 && chords[i].mBeats == chords[i - 1].mBeats;
+        weights.push_back(isSame ? weights.back() : Weight(chords[i].mBeats, beatsPerBar));
+    }
+    return weights;
 }
 
 bool IsBluesChord(const CKeyChord& chord, int home) {
@@ -76,56 +188,118 @@ bool IsBluesChord(const CKeyChord& chord, int home) {
     return chord.mClass == TKeyChordClass_Dom && (degree == 0 || degree == 5);
 }
 
-TPointsOfKeys Gains(const CKeyChord& chord, TKeyChordKind kind, const CSongTraits& traits,
-                    const CKeyOptions& options) {
-    const double weight = Weight(chord, options.mBeatsPerBar);
-    TPointsOfKeys gains;
-    for (int key = 0; key < kKeyCount; ++key) {
-        gains[static_cast<std::size_t>(key)] =
-            weight * kKeyLocalTable[static_cast<std::size_t>(ModeOfKey(key))][kind]
-                                   [static_cast<std::size_t>(DegreeInKey(chord.mRoot, key))];
-    }
-    double& home = gains[static_cast<std::size_t>(traits.mHome)];
-    if (traits.mIsBlues && IsBluesChord(chord, traits.mHome)) {
-        home = std::max(home, weight * kBluesPoints);
-    }
-    home += weight * options.mHomeBonus;
-    return gains;
-}
+/// The path with the most points through the keys.
+class CKeyPath {
+public:
+    CKeyPath(std::span<const CKeyChord> chords, std::span<const TKeyChordKind> kinds,
+             const CSongTraits& traits, const CKeyOptions& options)
+        : mChords(chords),
+          mKinds(kinds),
+          mTraits(traits),
+          mHomeBonus(options.mHomeBonus),
+          mWeights(WeightsOf(chords, options.mBeatsPerBar)),
+          mCosts(options.mChangeCost) {}
 
-// Takes for each key the better way into it, from the key `from` or from where it comes now, and of
-// equal ones the latter: to stay, or a lower key. Free of branches, so that it runs on several keys
-// at once.
-void ChangeFrom(std::size_t from, double best, const TPointsOfKeys& costs, TPointsOfKeys& points,
-                TPointsOfKeys& before) {
-    const auto number = static_cast<double>(from);
-    for (std::size_t to = 0; to < kKeyCount; ++to) {
-        const double candidate = best - costs[to];
-        const bool isBetter = candidate > points[to];
-        points[to] = isBetter ? candidate : points[to];
-        before[to] = isBetter ? number : before[to];
+    std::vector<std::uint8_t> Find() {
+        const std::size_t last = mChords.size() - 1;
+        int key = BestKey(BestAtEnd());
+        std::vector<std::uint8_t> keys(mChords.size());
+        keys[last] = static_cast<std::uint8_t>(key);
+        for (std::size_t ix = last; ix-- > 0;) {
+            key = KeyBefore(key, WayAt(ix));
+            keys[ix] = static_cast<std::uint8_t>(key);
+        }
+        return keys;
     }
-}
 
-// Moves `best` on by one chord, and tells from which key the best path into each key comes.
-TKeysBefore StepOn(TPointsOfKeys& best, const TPointsOfKeys& gains, const CChangeCosts& costs) {
-    TPointsOfKeys points = best;
-    TPointsOfKeys before;
-    for (std::size_t to = 0; to < kKeyCount; ++to) before[to] = static_cast<double>(to);
-    // A key from which the nearest change is worse than the farthest from the leading key is never
-    // where a change comes from. That leaves few.
-    const double needed = *std::max_element(best.begin(), best.end()) - costs.mMost;
-    for (std::size_t from = 0; from < kKeyCount; ++from) {
-        if (best[from] - costs.mLeast < needed) continue;
-        ChangeFrom(from, best[from], costs.mCosts[from], points, before);
+private:
+    [[nodiscard]] CPointsOfKeys GainsAt(std::size_t ix) const {
+        const CKeyChord& chord = mChords[ix];
+        const double weight = mWeights[ix];
+        const double* major = mTable.RowOf(0, mKinds[ix], chord.mRoot);
+        const double* minor = mTable.RowOf(1, mKinds[ix], chord.mRoot);
+        CPointsOfKeys gains;
+        for (std::size_t i = 0; i < kFifths; ++i) gains.mMajor[i] = weight * major[i];
+        for (std::size_t i = 0; i < kFifths; ++i) gains.mMinor[i] = weight * minor[i];
+        double& home = gains.Of(mTraits.mHome);
+        if (mTraits.mIsBlues && IsBluesChord(chord, mTraits.mHome)) {
+            home = std::max(home, weight * kBluesPoints);
+        }
+        home += weight * mHomeBonus;
+        return gains;
     }
-    TKeysBefore keys;
-    for (std::size_t to = 0; to < kKeyCount; ++to) {
-        best[to] = gains[to] + points[to];
-        keys[to] = static_cast<std::uint8_t>(before[to]);
+
+    CPointsOfKeys BestAtEnd() {
+        mBlockStarts.reserve(mChords.size() / kChordsPerBlock + 1);
+        CPointsOfKeys best = GainsAt(0);
+        CPointsOfKeys changed;
+        for (std::size_t ix = 0; ix < mChords.size(); ++ix) {
+            if (ix > 0) {
+                ChangeKeys(best, mCosts, changed);
+                StepOn(changed, GainsAt(ix), best);
+            }
+            if (ix % kChordsPerBlock == 0) mBlockStarts.push_back(best);
+        }
+        return best;
     }
-    return keys;
-}
+
+    /// The points at a chord, and those that a change behind it would leave.
+    struct CWay {
+        CPointsOfKeys mBest;
+        CPointsOfKeys mChanged;
+    };
+
+    const CWay& WayAt(std::size_t ix) {
+        const std::size_t block = ix / kChordsPerBlock;
+        if (block != mBlock) MakeBlock(block);
+        return mWays[ix % kChordsPerBlock];
+    }
+
+    void MakeBlock(std::size_t block) {
+        mBlock = block;
+        const std::size_t begin = block * kChordsPerBlock;
+        const std::size_t count = std::min(kChordsPerBlock, mChords.size() - begin);
+        CPointsOfKeys best = mBlockStarts[block];
+        for (std::size_t i = 0; i < count; ++i) {
+            if (i > 0) StepOn(mWays[i - 1].mChanged, GainsAt(begin + i), best);
+            mWays[i].mBest = best;
+            ChangeKeys(best, mCosts, mWays[i].mChanged);
+        }
+    }
+
+    // Of equal keys the lowest.
+    [[nodiscard]] static int BestKey(const CPointsOfKeys& best) {
+        int found = 0;
+        for (int key = 1; key < kKeyCount; ++key) {
+            if (best.Of(key) > best.Of(found)) found = key;
+        }
+        return found;
+    }
+
+    // The key from which the best way leads into `key`, and of equal ones that itself, or the
+    // lowest.
+    [[nodiscard]] int KeyBefore(int key, const CWay& way) const {
+        const double changed = way.mChanged.Of(key);
+        if (!(changed > way.mBest.Of(key))) return key;
+        for (int from = 0; from < kKeyCount; ++from) {
+            if (from != key && way.mBest.Of(from) - mCosts.Between(from, key) == changed) {
+                return from;
+            }
+        }
+        return key;
+    }
+
+    std::span<const CKeyChord> mChords;
+    std::span<const TKeyChordKind> mKinds;
+    const CSongTraits& mTraits;
+    double mHomeBonus;
+    std::vector<double> mWeights;
+    CChangeCosts mCosts;
+    CGainTable mTable;
+    std::vector<CPointsOfKeys> mBlockStarts;
+    std::array<CWay, kChordsPerBlock> mWays;
+    std::size_t mBlock = static_cast<std::size_t>(-1);
+};
 
 bool IsSecondDegree(const CKeyChord& chord, int key) {
     return (chord.mClass == TKeyChordClass_Min7 || chord.mClass == TKeyChordClass_HDim) &&
@@ -152,16 +326,7 @@ std::vector<std::uint8_t> LocalKeys(std::span<const CKeyChord> chords,
                                     std::span<const TKeyChordKind> kinds, const CSongTraits& traits,
                                     const CKeyOptions& options) {
     if (chords.empty()) return {};
-    const CChangeCosts costs = ChangeCosts(options.mChangeCost);
-    TPointsOfKeys best = Gains(chords.front(), kinds.front(), traits, options);
-    std::vector<TKeysBefore> before(chords.size());
-    for (std::size_t i = 1; i < chords.size(); ++i) {
-        before[i] = StepOn(best, Gains(chords[i], kinds[i], traits, options), costs);
-    }
-    std::vector<std::uint8_t> keys(chords.size());
-    const auto end = std::max_element(best.begin(), best.end());
-    keys.back() = static_cast<std::uint8_t>(end - best.begin());
-    for (std::size_t i = chords.size() - 1; i > 0; --i) keys[i - 1] = before[i][keys[i]];
+    std::vector<std::uint8_t> keys = CKeyPath(chords, kinds, traits, options).Find();
     MovePivots(chords, keys);
     return keys;
 }

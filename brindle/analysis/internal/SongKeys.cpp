@@ -23,6 +23,7 @@ CKeyOptions Checked(CKeyOptions options) {
     if (!isBar) options.mBeatsPerBar = byDefault.mBeatsPerBar;
     options.mHomeBonus = PointsOrDefault(options.mHomeBonus, byDefault.mHomeBonus);
     options.mChangeCost = PointsOrDefault(options.mChangeCost, byDefault.mChangeCost);
+    if (options.mChangeCost < 0.0) options.mChangeCost = byDefault.mChangeCost;
     return options;
 }
 
