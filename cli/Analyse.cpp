@@ -27,6 +27,7 @@
 #include <memory>
 #include <optional>
 #include <sstream>
+#include <utility>
 
 namespace brindle::cli {
 namespace {
@@ -62,6 +63,7 @@ struct CAnalyseOptions {
     bool mLong = false;
     bool mExplain = false;
     bool mGrids = false;
+    CNumeralOptions mNumerals;
     CSheetPicture mSheetPicture;
     CFormatOptions mFormat;
 };
@@ -119,11 +121,11 @@ CShownSong SongOf(const CAnalysedSong& analysed, const CAnalyseOptions& options)
     return MakeSong(analysed.mAnalyse, readings, *analysed.mSymbols, analysed.mBeatsPerBar);
 }
 
-CShownKeys KeysOf(const CAnalysedSong& analysed) {
+CShownKeys KeysOf(const CAnalysedSong& analysed, const CNumeralOptions& numerals) {
     const double beatsPerBar =
         analysed.mSheet ? BeatsPerBarOf(*analysed.mSheet) : analysed.mBeatsPerBar;
     return MakeSongKeys(analysed.mAnalyse.mChords, *analysed.mSymbols,
-                        {.mBeatsPerBar = beatsPerBar});
+                        {.mBeatsPerBar = beatsPerBar}, numerals);
 }
 
 std::string Picture(const CShownSong& song, bool withGrids) {
@@ -146,9 +148,8 @@ bool WantsCenters(const CAnalyseOptions& options) {
 
 std::string Text(const CAnalysedSong& analysed, const CAnalyseOptions& options) {
     const CPaint paint = PaintOfOutput();
-    std::string text =
-        ReadingText(analysed.mSong, analysed.mReading,
-                    {.mWidth = WidthOfOutput(), .mIsLong = options.mLong, .mNumerals = {}}, paint);
+    std::string text = ReadingText(analysed.mSong, analysed.mReading,
+                                   {.mWidth = WidthOfOutput(), .mIsLong = options.mLong}, paint);
     text += ExplanationsText(analysed.mSong, analysed.mExplanations, paint);
     if (WantsCenters(options)) text += '\n' + CentersText(SongOf(analysed, options), paint);
     return text;
@@ -162,7 +163,7 @@ std::string AnalysedJson(const CAnalysedSong& analysed, const CAnalyseOptions& o
         [&](const CHarmAnlsChordWithPos& chord) -> const std::string& {
             return analysed.mSymbols->SymbolOf(chord);
         },
-        KeysOf(analysed), analysed.mSheet ? &*analysed.mSheet : nullptr,
+        KeysOf(analysed, options.mNumerals), analysed.mSheet ? &*analysed.mSheet : nullptr,
         isPlayed ? &read : nullptr);
 }
 
@@ -237,6 +238,10 @@ void ReadHarmonyOf(CAnalysedSong& analysed, const CHarmAnlsSignKeys& signKeys,
     }
     analysed.mReading = ReadSongHarmony(analysed.mSong, reading);
     if (options.mExplain) analysed.mExplanations = Explain(analysed.mSong, analysed.mReading);
+    // In JSON the keys have other numerals, and the reading stays as it is described.
+    if (options.mFormat.Format() == TFormat::Json) return;
+    analysed.mReading =
+        WithNumerals(std::move(analysed.mReading), analysed.mSong.mChords, options.mNumerals);
 }
 
 TStatus Analyse(const CAnalyseOptions& options) {
@@ -289,6 +294,7 @@ void AddAnalyse(CCommand& program) {
                     "Show the centers that stated progressions lead to, too");
     command.AddFlag("--readings", options->mReadings,
                     "Show all readings that progressions to a tonic allow");
+    AddNumeralOptions(command, options->mNumerals);
     options->mReading.AddTo(command, "In what form the chord text is written");
     command.AddFlag("--grids", options->mGrids,
                     "Draw a guitar fingering under each chord of the picture");

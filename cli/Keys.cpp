@@ -103,29 +103,15 @@ std::optional<CSongWithKeys> SongOfScore(const CTypedSong& typed, const CKeysOpt
     return CSongWithKeys{options.mReading.ReadSource(typed.mText, {}), std::move(song)};
 }
 
-// The numerals of a reading are those of theory text. Others are asked for by options.
-std::vector<std::string> OtherNumerals(const CSong& song, const CSongReading& reading,
-                                       const CNumeralOptions& options) {
-    if (!options.mNashville && !options.mFigures && !options.mPrintedSigns && !options.mByKey) {
-        return {};
-    }
-    CKeyOfSong keys;
-    keys.mKey = reading.mKey;
-    keys.mConfidence = reading.mConfidence;
-    keys.mRegions = reading.mRegions;
-    return NumeralsOf(song.mChords, keys, options);
-}
-
 std::string Present(const CSongWithKeys& song, const CSongReading& reading,
                     const CKeysOptions& options) {
     const TFormat format = options.mFormat.Format();
     if (format == TFormat::Svg) return KeysSvg(song.mShown);
     const CReadSong read{song.mSong, reading};
     if (format == TFormat::Json) return KeysJson(song.mShown.mKeys, &read);
-    const auto numerals = OtherNumerals(song.mSong, reading, options.mNumerals);
-    return RegionsText(song.mSong, reading,
-                       {.mWidth = WidthOfOutput(), .mIsLong = false, .mNumerals = numerals},
-                       PaintOfOutput());
+    // The numerals of a reading are those of theory text. Others are asked for by options.
+    return RegionsText(song.mSong, WithNumerals(reading, song.mSong.mChords, options.mNumerals),
+                       {.mWidth = WidthOfOutput()}, PaintOfOutput());
 }
 
 TStatus Keys(const CKeysOptions& options) {
@@ -156,7 +142,7 @@ void AddKeys(CCommand& program) {
     command.AddOption("--key", "KEY", options->mKey, "The stated key, as in \"A minor\" or Bb");
     AddBeats(command, options->mKeys.mBeatsPerBar, options->mBeatsPerChord);
     command.AddOption("--home-bonus", "POINTS", options->mKeys.mHomeBonus,
-                      "What a chord gains in the key of the song (default: 0.3)");
+                      "What a chord gains in the key of the song (default: 0.4)");
     command.AddOption("--change-cost", "POINTS", options->mKeys.mChangeCost,
                       "What the nearest change of key costs (default: 4)");
     AddNumeralOptions(command, options->mNumerals);

@@ -2,6 +2,7 @@
 #pragma once
 
 #include "brindle/analysis/CKeyOfSong.h"
+#include "brindle/analysis/RomanNumeral.h"
 #include "brindle/theory/CKeyEnh.h"
 #include "brindle/theory/CSignKeyLite.h"
 
@@ -131,6 +132,12 @@ struct CSongReading {
 /// count as no length; if no chord has a length, all count a beat.
 [[nodiscard]] CSongReading ReadHarmony(const CHarmAnlsChords& chords,
                                        const CReadingOptions& options = {});
+
+/// The same reading with its numerals written by other options, such as Nashville numbers: those of
+/// NumeralsOf, by the chord and the next one. The default options change nothing. `chords` are
+/// those of the reading.
+[[nodiscard]] CSongReading WithNumerals(CSongReading reading, const CHarmAnlsChords& chords,
+                                        const CNumeralOptions& options);
 
 /// "tonic", "subdominant", "dominant", "none"; empty if undefined.
 [[nodiscard]] std::string_view NameOf(THarmFunction function);

@@ -2,12 +2,29 @@
 #include "brindle/analysis/ReadHarmony.h"
 #include "brindle/analysis/internal/NumeralText.h"
 
+#include <algorithm>
+#include <utility>
+
 namespace brindle {
 
 std::string CServedDegree::Name() const {
     std::string name;
     if (mSemitones >= 0) AppendDegree(name, {mNumber, mAccidental}, mIsMinor);
     return name;
+}
+
+CSongReading WithNumerals(CSongReading reading, const CHarmAnlsChords& chords,
+                          const CNumeralOptions& options) {
+    if (options == CNumeralOptions{}) return reading;
+    CKeyOfSong keys;
+    keys.mKey = reading.mKey;
+    keys.mRegions = reading.mRegions;
+    std::vector<std::string> numerals = NumeralsOf(chords, keys, options);
+    const std::size_t count = std::min(numerals.size(), reading.mChords.size());
+    for (std::size_t ix = 0; ix < count; ++ix) {
+        reading.mChords[ix].mNumeral = std::move(numerals[ix]);
+    }
+    return reading;
 }
 
 std::string_view NameOf(THarmFunction function) {

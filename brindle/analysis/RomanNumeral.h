@@ -28,6 +28,8 @@ struct CNumeralOptions {
     /// minor has an F, I6 is an inversion, and vi and vii in minor are on the raised degrees.
     /// Otherwise the text says all, as in a chord symbol: IV7 is F7 and V9 has an F sharp.
     bool mByKey = false;
+
+    friend constexpr bool operator==(const CNumeralOptions&, const CNumeralOptions&) = default;
 };
 
 /// The degree of a chord in a key with signs for all its tones. Empty for an undefined chord or

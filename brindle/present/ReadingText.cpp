@@ -11,6 +11,8 @@
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <array>
+#include <utility>
 
 namespace brindle {
 namespace {
@@ -74,7 +76,7 @@ private:
 };
 
 std::string LongTable(const CSong& song, const CSongReading& reading, const CBars& bars,
-                      std::span<const std::string> numerals, const CPaint& paint) {
+                      const CPaint& paint) {
     CTable table(
         {" bar", " beat", "chord", "key", "numeral", "function", "relation", "resolves to"});
     CPlaceCells place(bars);
@@ -88,7 +90,7 @@ std::string LongTable(const CSong& song, const CSongReading& reading, const CBar
             {place.Bar(position), place.Beat(position),
              ix < song.mSymbols.size() ? Printable(song.mSymbols[ix]) : "",
              isChord ? chord.mKey.NameShort(NamePrefs()) : "-",
-             numerals[ix].empty() ? "-" : numerals[ix], std::string(NameOf(chord.mFunction)),
+             chord.mNumeral.empty() ? "-" : chord.mNumeral, std::string(NameOf(chord.mFunction)),
              chord.mRelation == TChordRelation_None ? "" : std::string(NameOf(chord.mRelation)),
              isLed ? Printable(song.mSymbols[target]) : ""});
     }
@@ -112,15 +114,26 @@ void AppendParagraph(std::string& text, std::string_view head,
     for (const std::string& line : lines) text += "  " + Printable(line) + '\n';
 }
 
-std::vector<std::string> NumeralsOf(const CSongReading& reading,
-                                    const CReadingTextOptions& options) {
-    std::vector<std::string> numerals(options.mNumerals.begin(), options.mNumerals.end());
-    numerals.resize(std::max(numerals.size(), reading.mChords.size()));
-    if (!options.mNumerals.empty()) return numerals;
-    for (std::size_t ix = 0; ix < reading.mChords.size(); ++ix) {
-        numerals[ix] = reading.mChords[ix].mNumeral;
+/// A region with its numerals, which take several lines where they have to.
+struct CRegionRow {
+    std::string mKey;
+    std::string mWhere;
+    std::vector<std::string> mNumerals;
+};
+
+std::vector<CRegionRow> RegionRows(const CSongReading& reading, const CBars& bars) {
+    std::vector<CRegionRow> rows;
+    for (const CKeyRegion& region : reading.mRegions) {
+        CRegionRow row{region.mKey.NameLong(NamePrefs()),
+                       BarsOf({region.mPosition, region.mEndPosition}, bars),
+                       {}};
+        for (std::size_t ix = region.mBegin; ix < region.mEnd; ++ix) {
+            const std::string& numeral = reading.mChords[ix].mNumeral;
+            if (!numeral.empty()) row.mNumerals.push_back(numeral);
+        }
+        rows.push_back(std::move(row));
     }
-    return numerals;
+    return rows;
 }
 
 }  // namespace
@@ -138,11 +151,9 @@ std::string ReadingText(const CSong& song, const CSongReading& reading,
     if (reading.mKey.IsUndef()) return text;
     const CBars bars = BarsOfSong(song);
     const std::vector<CReadingBar> readingBars = ReadingBarsOf(song, bars);
-    const std::vector<std::string> numerals = NumeralsOf(reading, options);
     text += '\n';
-    text += options.mIsLong
-                ? LongTable(song, reading, bars, numerals, paint)
-                : ReadingLines(song, reading, {readingBars, numerals, options.mWidth}, paint);
+    text += options.mIsLong ? LongTable(song, reading, bars, paint)
+                            : ReadingLines(song, reading, {readingBars, options.mWidth}, paint);
     std::vector<std::string> repeats;
     for (const CRepeatedBars& repeat : RepeatedBarsOf(song, bars, readingBars)) {
         repeats.push_back(RepeatText(repeat));
@@ -157,15 +168,22 @@ std::string RegionsText(const CSong& song, const CSongReading& reading,
     std::string text = Head(song, reading, paint);
     if (reading.mRegions.empty()) return text;
     const CBars bars = BarsOfSong(song);
-    const std::vector<std::string> numerals = NumeralsOf(reading, options);
+    const std::vector<CRegionRow> rows = RegionRows(reading, bars);
+    std::size_t key = 0;
+    std::size_t where = 0;
+    for (const CRegionRow& row : rows) {
+        key = std::max(key, CountCharacters(row.mKey));
+        where = std::max(where, CountCharacters(row.mWhere));
+    }
+    constexpr std::size_t least = 24;
+    const std::size_t before = key + where + 6;
+    const std::size_t width = std::max(options.mWidth, before + least) - before;
     CTable table({"key", "where", "numerals"});
-    for (const CKeyRegion& region : reading.mRegions) {
-        std::vector<std::string> words;
-        for (std::size_t ix = region.mBegin; ix < region.mEnd; ++ix) {
-            if (!numerals[ix].empty()) words.push_back(numerals[ix]);
+    for (const CRegionRow& row : rows) {
+        std::array<std::string, 2> cells{row.mKey, row.mWhere};
+        for (const std::string& line : InLines(row.mNumerals, width)) {
+            table.AddRow({std::exchange(cells[0], ""), std::exchange(cells[1], ""), line});
         }
-        table.AddRow({region.mKey.NameLong(NamePrefs()),
-                      BarsOf({region.mPosition, region.mEndPosition}, bars), FirstAndLast(words)});
     }
     return text + '\n' + table.Text(paint, "  ");
 }

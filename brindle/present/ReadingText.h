@@ -6,7 +6,6 @@
 #include "brindle/song/CSong.h"
 
 #include <cstddef>
-#include <span>
 #include <string>
 
 namespace brindle {
@@ -17,8 +16,6 @@ struct CReadingTextOptions {
     std::size_t mWidth = 80;
     /// Instead of the song by bars a table with a line for each chord.
     bool mIsLong = false;
-    /// One for each chord, instead of those of the reading; empty for those.
-    std::span<const std::string> mNumerals = {};
 };
 
 /// A reading as a teacher pencils it over a lead sheet: title, key, the chords by bars with their
@@ -29,7 +26,7 @@ struct CReadingTextOptions {
 [[nodiscard]] std::string ReadingText(const CSong& song, const CSongReading& reading,
                                       const CReadingTextOptions& options, const CPaint& paint);
 
-/// Title and key, and under them a line for each region with its numerals.
+/// Title and key, and under them each region with all its numerals.
 [[nodiscard]] std::string RegionsText(const CSong& song, const CSongReading& reading,
                                       const CReadingTextOptions& options, const CPaint& paint);
 

@@ -84,4 +84,21 @@ std::string FirstAndLast(const std::vector<std::string>& words) {
     return text;
 }
 
+std::vector<std::string> InLines(const std::vector<std::string>& words, std::size_t width) {
+    std::vector<std::string> lines;
+    std::size_t used = 0;
+    for (const std::string& word : words) {
+        const std::size_t length = CountCharacters(word);
+        const bool fits = !lines.empty() && used + 1 + length <= width;
+        if (fits) {
+            lines.back() += ' ' + word;
+            used += 1 + length;
+        } else {
+            lines.push_back(word);
+            used = length;
+        }
+    }
+    return lines;
+}
+
 }  // namespace brindle

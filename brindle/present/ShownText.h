@@ -30,4 +30,9 @@ namespace brindle {
 /// The words with blanks between; of more than eight only the first and the last four.
 [[nodiscard]] std::string FirstAndLast(const std::vector<std::string>& words);
 
+/// The words in lines of at most `width` characters, with blanks between. A longer word has a line
+/// for itself.
+[[nodiscard]] std::vector<std::string> InLines(const std::vector<std::string>& words,
+                                               std::size_t width);
+
 }  // namespace brindle

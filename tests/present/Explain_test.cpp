@@ -76,6 +76,12 @@ constexpr auto kExplained = std::to_array<CExplained>({
     {"Cm Ab7 G7 Cm", 1, "Ab7 is the German sixth of C minor and opens to G7."},
     {"C7 F7 C7 C7 F7 F7 C7 C7 G7 F7 C7 C7", 0, "C7 is the tonic of C major, with the seventh of the blues, which needs no resolution."},
     {"C7 F7 C7 C7 F7 F7 C7 C7 G7 F7 C7 C7", 1, "F7 is the subdominant of C major, with the seventh of the blues, which needs no resolution."},
+    {"G B C Cm G B C Cm G", 1, "B is a chromatic mediant of G major: its root lies a third from the tonic."},
+    {"C D F C D F C", 1, "D is II in C major, with the function of a subdominant."},
+    {"C B7 F G7 C", 1, "B7 is the dominant of E minor, which does not follow."},
+    {"Dm7 G7 Dm7 G7 Em7 A7 Em7 A7 Am7 D7 Abm7 Db7 Cmaj7", 10, "Abm7 is the related second of Db7, a fifth above it."},
+    {"Am B7b5/F E Am", 1, "B7b5/F is the French sixth of A minor and opens to E."},
+    {"C Dm7 G7 Em7 A7 Dm7 G7 C", 2, "G7 is the dominant of C major and goes on to Em7."},
     {"Am Ammaj7 Am7 Am6 Dm E7 Am", 2, "Am7 keeps the root of Ammaj7 while one voice moves."},
 });
 

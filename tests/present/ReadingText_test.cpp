@@ -49,7 +49,7 @@ TEST_CASE("A line has as many bars as its width holds, and no line is wider") {
     std::string text;
     for (int i = 0; i < 12; ++i) text += "Ebmaj7 Cm7b5 F7b9 Bbmaj7 | ";
     for (const std::size_t width : {200U, 80U, 40U}) {
-        const std::string shown = Shown(text, {.mWidth = width, .mIsLong = false, .mNumerals = {}});
+        const std::string shown = Shown(text, {.mWidth = width});
         std::istringstream lines(shown);
         std::size_t widest = 0;
         for (std::string line; std::getline(lines, line);) {
@@ -79,6 +79,21 @@ TEST_CASE("Bars that hold a chord show it, and a long row of them its number") {
 TEST_CASE("Notes tell ii V I with all its places") {
     const std::string shown = Shown("C | Dm7 G7 | C | F | Dm7 G7 | C |");
     CHECK(Has(shown, "  bars 2 to 3, bars 5 to 6: ii V I of C Major\n"));
+}
+
+TEST_CASE("Of seconds and dominants that lead to one tonic the last ones are noted") {
+    const std::string shown = Shown("Gm7 C7 | Gm7 C7 | Gm7 C7 | F | Dm7 | Db7 C7 Db7 C7 | F |");
+    CHECK(Has(shown, "  bars 3 to 4: ii V I of F Major\n"));
+    CHECK(Has(shown, "  bar 6: Db7 is a substitute dominant, subV7/V of F Major\n"));
+}
+
+TEST_CASE("Regions show all their numerals, on as many lines as these take") {
+    const CSong song = ReadSong("C | Am | Dm | G7 | C | Am | Dm | G7 | C | F | C |");
+    const std::string shown =
+        RegionsText(song, ReadSongHarmony(song), {.mWidth = 52}, CPaint(false));
+    CHECK(Has(shown,
+              "  C Major  bars 1 to 11  I vi ii V7 I vi ii V7 I IV\n"
+              "                         I\n"));
 }
 
 TEST_CASE("Keys that contradict are told") {

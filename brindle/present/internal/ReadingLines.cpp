@@ -91,7 +91,7 @@ private:
         for (std::size_t ix = bar.mBegin; ix < bar.mEnd; ++ix) {
             std::string symbol = ix < mSong.mSymbols.size() ? Printable(mSong.mSymbols[ix]) : "";
             if (symbol.empty()) symbol = "-";
-            cells.push_back({mKeys[ix], std::move(symbol), mLines.mNumerals[ix]});
+            cells.push_back({mKeys[ix], std::move(symbol), mReading.mChords[ix].mNumeral});
         }
         return cells;
     }

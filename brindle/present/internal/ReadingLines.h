@@ -13,8 +13,6 @@ namespace brindle {
 /// What lines of bars are made of.
 struct CReadingLines {
     std::span<const CReadingBar> mBars;
-    /// One for each chord.
-    std::span<const std::string> mNumerals;
     std::size_t mWidth = 80;
 };
 

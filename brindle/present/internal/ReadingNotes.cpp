@@ -25,15 +25,18 @@ struct CTakenNote {
     std::vector<CTimeRange> mPlaces;
 };
 
+// Two chords of a bar are one place.
 std::string PlacesText(const std::vector<CTimeRange>& places, const CBars& bars) {
     std::string text;
-    for (std::size_t i = 0; i < places.size() && i < kMostPlaces; ++i) {
-        if (i > 0) text += ", ";
-        text += BarsOf(places[i], bars);
+    std::string before;
+    std::size_t count = 0;
+    for (const CTimeRange& place : places) {
+        std::string words = BarsOf(place, bars);
+        if (words == before) continue;
+        if (++count <= kMostPlaces) text += (count > 1 ? ", " : "") + words;
+        before = std::move(words);
     }
-    if (places.size() > kMostPlaces) {
-        text += fmt::format(" and {} more", places.size() - kMostPlaces);
-    }
+    if (count > kMostPlaces) text += fmt::format(" and {} more", count - kMostPlaces);
     return text;
 }
 
@@ -72,7 +75,10 @@ private:
                                mSong.mChords[last].mPosition + barely};
         const auto [known, isNew] = mNumbers.try_emplace(text, mNotes.size());
         if (isNew) mNotes.push_back({std::move(text), {}});
-        mNotes[known->second].mPlaces.push_back(place);
+        // Of Dm7 G7 Dm7 G7 C, all of which lead to C, the last ones are told.
+        std::vector<CTimeRange>& places = mNotes[known->second].mPlaces;
+        if (!places.empty() && places.back().mEnd == place.mEnd) places.pop_back();
+        places.push_back(place);
     }
 
     // ii V I, of which the I may be missing.
