@@ -11,6 +11,7 @@
 #include <cmath>
 #include <deque>
 #include <map>
+#include <set>
 #include <string>
 #include <utility>
 
@@ -112,6 +113,8 @@ private:
 
     void AddMaker(std::string_view maker) {
         if (maker.empty() || mMakers.size() > kXmlMaxTextLength) return;
+        // Who wrote the music and the words is written twice.
+        if (!mMakerNames.emplace(maker).second) return;
         if (!mMakers.empty()) mMakers += ", ";
         mMakers += maker;
     }
@@ -179,6 +182,7 @@ private:
     std::string mMovementTitle;
     std::string mWorkTitle;
     std::string mMakers;
+    std::set<std::string> mMakerNames;
     std::optional<double> mTempo;
     std::string mNumber;            // of the measure, where a score lists its parts
     std::deque<CScorePart> mParts;  // a deque, since readers of measures point into it
