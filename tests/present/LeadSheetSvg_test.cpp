@@ -278,6 +278,9 @@ TEST_CASE("Seconds have brackets, dominants arrows, and what stands for them dot
     CHECK(Links("C | G7 | G7 | C") == "2>3 ");
     CHECK(Links("C | G7sus4 | G7 | C") == "2>3 ");
     CHECK(Links("C | E7 | Am | D7 | G7 | C") == "[2-3] 1>2 3>4 4>5 ");
+    CHECK(Links("C | F#dim7 | G7 | C") == "1>2 2>3 ");
+    CHECK(Links("Eb | Edim | Bb7 | Eb") == "2>3 ");
+    CHECK(Links("C | D7 | C/G | G7 | C") == "1>2 3>4 ");
     CHECK(Links("|: C | Dm7 G7 :|") == "[1-2] 2>back ");
     CHECK(Links("|: C | Dm7 G7 :| C") == "[1-2] 2>6 ");
 }

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/present/internal/SheetLinks.h"
 
+#include "brindle/theory/KeyIntervals.h"
+
 #include <algorithm>
 
 namespace brindle::LeadSheet {
@@ -13,7 +15,16 @@ bool StandsForDominant(TChordRelation relation) {
            relation == TChordRelation_AugmentedSixth || relation == TChordRelation_Backdoor;
 }
 
-TLink LinkOf(const CChordReading& chord, const CChordReading& target) {
+// Whether a chord is the one that a dominant serves, or the six-four chord that delays it.
+bool IsServedBy(const CChordReading& dominant, const CChordLite& chord) {
+    const int served =
+        FoldIntoOctave(dominant.mKey.mRootKeyEnh.mKeyNr + dominant.mServes.mSemitones);
+    return chord.mRootKeyEnh.mKeyNr == served ||
+           (chord.HasBassNote() && chord.mBassKeyEnh.mKeyNr == served);
+}
+
+TLink LinkOf(const CChordReading& chord, const CChordReading& target,
+             const CChordLite& targetChord) {
     if (chord.mDeceptive) return TLink::None;
     const bool targetStands = StandsForDominant(target.mRelation);
     if (chord.mRelation == TChordRelation_RelatedSecond) {
@@ -31,7 +42,7 @@ TLink LinkOf(const CChordReading& chord, const CChordReading& target) {
     if (StandsForDominant(chord.mRelation)) return TLink::DottedArrow;
     const bool isDominant = chord.mRelation == TChordRelation_Dominant ||
                             chord.mRelation == TChordRelation_LeadingDiminished;
-    return isDominant ? TLink::Arrow : TLink::None;
+    return isDominant && IsServedBy(chord, targetChord) ? TLink::Arrow : TLink::None;
 }
 
 // Whether the chord is written once more directly behind.
@@ -53,7 +64,7 @@ CSheetLinks MakeLinks(const CSong& song, const CSongReading& reading, const CShe
             chord.mResolvesTo >= 0 && static_cast<std::size_t>(chord.mResolvesTo) < count;
         if (!leads) continue;
         const auto target = static_cast<std::size_t>(chord.mResolvesTo);
-        const TLink kind = LinkOf(chord, reading.mChords[target]);
+        const TLink kind = LinkOf(chord, reading.mChords[target], song.mChords[target]);
         const bool isBracket = kind == TLink::Bracket || kind == TLink::DottedBracket;
         // A bracket begins with the first of equal chords, an arrow with the last.
         if (kind == TLink::None || (!isBracket && GoesOn(song, reading, i))) continue;
