@@ -96,6 +96,9 @@ public:
     void WriteAnalysisResultToFile(const std::string& path, unsigned openMode) const;
 
 private:
+    /// Looks at the steps one by one in a test.
+    friend struct CHarmonicAnalyseSteps;
+
     /// Whether a tonic progression begins at a chord, its center, and where it begins.
     struct CFoundHarmCenter {
         bool mFound = false;

@@ -79,7 +79,10 @@ TEST_CASE("The checker finds what is planted") {
         {"brindle/chords/A.cpp", "#include <nlohmann/json.hpp>", false},
         {"brindle/chords/A.h", "#include <nlohmann/json.hpp>", true},
         {"brindle/chords/A.h", "#include <nlohmann/json_fwd.hpp>", false},
-        {"cli/Main.cpp", "#include \"brindle/musicxml/Doc.h\"\n#include <CLI/CLI.hpp>", false},
+        {"cli/CCommand.cpp", "#include \"brindle/musicxml/Doc.h\"\n#include <CLI/CLI.hpp>", false},
+        {"cli/Analyse.cpp", "#include <CLI/CLI.hpp>", true},
+        {"cli/CCommand.h", "#include <CLI/App.hpp>", true},
+        {"brindle/present/A.cpp", "#include <CLI/CLI.hpp>", true},
     };
     for (const auto& [path, text, isFault] : cases) {
         INFO(path << " with " << text);

@@ -3,9 +3,8 @@
 
 #include "brindle/song/CSong.h"
 #include "brindle/song/internal/SongWords.h"
-#include "brindle/theory/CChordNamePrefs.h"
 #include "brindle/theory/KeyNames.h"
-#include "brindle/theory/SignKeyStrings.h"
+#include "brindle/theory/ReadKeyText.h"
 
 namespace brindle {
 
@@ -14,15 +13,9 @@ std::optional<CSignKeyLite> ReadStatedKey(std::string_view text) {
     ConvertUtf8SharpAndFlatToAscii(folded);
     // Charts write minor as a minus.
     if (folded.ends_with('-')) folded.back() = 'm';
-    CKeyEnh root;
-    int position = 0;
-    root.SetFromString(folded, &position, ChordNamePrefsNonUTF8);
-    if (root.IsUndef()) return std::nullopt;
-    const TSignKeyType type = _SignKeyTypeFromString(folded, position);
-    const bool isWhole =
-        folded.find_first_not_of(' ', static_cast<std::size_t>(position)) == folded.npos;
-    if (!isWhole) return std::nullopt;
-    return CSignKeyLite(root, type);
+    const CKeyText key = ReadKeyText(folded);
+    if (!key.mError.empty()) return std::nullopt;
+    return key.mSignKey;
 }
 
 void AppendStatedKey(std::string_view text, double position, CSong& song) {
