@@ -4,6 +4,7 @@
 #include "brindle/theory/CChordNamePrefs.h"
 #include "brindle/theory/ScaleStrings.h"
 #include "brindle/theory/SignKeyStrings.h"
+#include "brindle/theory/internal/GermanKeyText.h"
 
 #include <algorithm>
 
@@ -33,7 +34,7 @@ bool IsReadToItsEnd(std::string_view text, int position) {
 }  // namespace
 
 CKeyText ReadKeyText(std::string_view typed) {
-    const std::string text(typed);
+    const std::string text = EnglishKeyText(typed).value_or(std::string(typed));
     const CTypedRoot root = ReadRoot(text);
     if (root.mRoot.IsUndef()) return {{}, "a key begins with a letter A to H, as in \"Bb minor\""};
     int position = root.mConsumed;

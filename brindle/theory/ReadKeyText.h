@@ -20,7 +20,8 @@ struct CKeyText {
     std::size_t mColumn = 0;
 };
 
-/// Reads "F# minor", "Bb", "am" with accidentals in # and b.
+/// Reads "F# minor", "Bb", "am" with accidentals in # and b, and German names: "fis-Moll", "B-Dur"
+/// (B flat major), "h moll" (B minor), "Es".
 [[nodiscard]] CKeyText ReadKeyText(std::string_view text);
 
 /// A scale that was typed, or what is wrong with it and where.
