@@ -2,11 +2,11 @@
 #include "cli/ChordTextOptions.h"
 #include "cli/CommandLine.h"
 #include "cli/GridDatabase.h"
-#include "cli/Input.h"
 #include "cli/KeyText.h"
 #include "cli/LeadSheet.h"
 #include "cli/SheetPicture.h"
 #include "cli/TypedChords.h"
+#include "cli/TypedSongs.h"
 
 #include "brindle/analysis/CAnalyseHarmCenterAlternatives.h"
 #include "brindle/analysis/TChordStringParse.h"
@@ -38,9 +38,10 @@ constexpr CCommandHelp kAnalyseHelp{
     "  brindle analyse \"Dm7 G7 | C\"\n"
     "  brindle analyse --long --explain \"C E7 | Am D7 | G7 C\"\n"
     "  brindle analyse --key \"A minor\" --centers \"Am Dm | E7 Am\"\n"
-    "  brindle analyse --file song.txt --beats-per-bar 3 --format svg >song.svg\n"
+    "  brindle analyse song.txt --beats-per-bar 3 --format svg >song.svg\n"
     "  brindle analyse song.musicxml --format svg >song.svg\n"
-    "  brindle analyse --from chordpro --beats-per-chord 4 --file song.cho\n"
+    "  brindle analyse --beats-per-chord 4 song.cho\n"
+    "  brindle analyse songs/*.txt --json >songs.ndjson\n"
     "  cat song.txt | brindle analyse - --json\n"
     "\n"
     "A chord text has chord symbols between white space; | goes on to the next bar\n"
@@ -50,8 +51,7 @@ constexpr CCommandHelp kAnalyseHelp{
 };
 
 struct CAnalyseOptions {
-    std::vector<std::string> mWords;
-    std::string mFile;
+    CTypedSongs mSongs;
     std::string mRoute = "tonic";
     std::string mKey;
     std::string mTiming = "played";
@@ -76,13 +76,8 @@ TAnalyse RouteOf(const std::string& name) {
 
 // What is wrong with options that are fine one by one.
 std::optional<std::string> Contradiction(const CAnalyseOptions& options) {
-    if (options.mWords.empty() && options.mFile.empty()) {
-        return "a song is needed: a TEXT, a score, --file PATH, or - for standard input";
-    }
-    if (auto fault = FaultOfSource(options.mWords, options.mFile,
-                                   {options.mBeatsPerBar, options.mBeatsPerChord})) {
-        return fault;
-    }
+    if (auto songs = options.mSongs.Contradiction(options.mFormat.Format())) return songs;
+    if (auto beats = BeatsContradiction(options.mBeatsPerBar, options.mBeatsPerChord)) return beats;
     const bool isText = options.mFormat.Format() == TFormat::Text;
     if ((options.mLong || options.mCenters) && !isText) {
         return "--long and --centers are for text, --format text";
@@ -196,7 +191,7 @@ TStatus AnalyseText(const CTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
     parse.mChordNamePrefs = NamePrefs();
     CTypedChords reading = options.mReading;
     if (options.mFormat.Format() == TFormat::Native) reading.UseNative();
-    const auto song = reading.ReadSongOrFail(typed.mText, parse);
+    const auto song = reading.ReadSongOrFail(typed, parse);
     if (!song) return TStatus::BadInput;
     analysed.mAnalyse.AnalyseFromChords(
         song->mChords, signKeys.empty() ? song->mStatedKeys : signKeys, RouteOf(options.mRoute));
@@ -244,6 +239,23 @@ void ReadHarmonyOf(CAnalysedSong& analysed, const CHarmAnlsSignKeys& signKeys,
         WithNumerals(std::move(analysed.mReading), analysed.mSong.mChords, options.mNumerals);
 }
 
+TSongOutput AnalysisOf(const CTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
+                       const CAnalyseOptions& options) {
+    CAnalysedSong analysed;
+    const TStatus status = typed.mIsScore ? AnalyseScore(typed, signKeys, options, analysed)
+                                          : AnalyseText(typed, signKeys, options, analysed);
+    if (status != TStatus::Success) return status;
+    ReadHarmonyOf(analysed, signKeys, options);
+    if (IsLeadSheet(options)) {
+        return options.mSheetPicture.Draw(analysed.mSong, analysed.mReading);
+    }
+    if (options.mReadings) {
+        analysed.mReadings =
+            CAnalyseHarmCenterAlternatives(analysed.mAnalyse.mChords).BestResults();
+    }
+    return Present(analysed, options);
+}
+
 TStatus Analyse(const CAnalyseOptions& options) {
     if (const auto contradiction = Contradiction(options)) {
         return Fail(TStatus::BadUsage, *contradiction);
@@ -257,22 +269,9 @@ TStatus Analyse(const CAnalyseOptions& options) {
         given.mSignKey = *key;
         signKeys.push_back(given);
     }
-    const auto typed = ReadTypedSong(options.mWords, options.mFile);
-    if (!typed) return TStatus::BadInput;
-
-    CAnalysedSong analysed;
-    const TStatus status = typed->mIsScore ? AnalyseScore(*typed, signKeys, options, analysed)
-                                           : AnalyseText(*typed, signKeys, options, analysed);
-    if (status != TStatus::Success) return status;
-    ReadHarmonyOf(analysed, signKeys, options);
-    if (IsLeadSheet(options)) {
-        return Print(options.mSheetPicture.Draw(analysed.mSong, analysed.mReading));
-    }
-    if (options.mReadings) {
-        analysed.mReadings =
-            CAnalyseHarmCenterAlternatives(analysed.mAnalyse.mChords).BestResults();
-    }
-    return Print(Present(analysed, options));
+    return options.mSongs.Print(options.mFormat.Format(), [&](const CTypedSong& song) {
+        return AnalysisOf(song, signKeys, options);
+    });
 }
 
 }  // namespace
@@ -280,7 +279,8 @@ TStatus Analyse(const CAnalyseOptions& options) {
 void AddAnalyse(CCommand& program) {
     CCommand& command = program.AddCommand(kAnalyseHelp);
     const auto options = std::make_shared<CAnalyseOptions>();
-    AddSongSource(command, options->mWords, options->mFile);
+    command.AlsoCalled("analyze");
+    options->mSongs.AddTo(command);
     command.AddChoice("--route", options->mRoute, {"tonic", "cadence", "weights", "none"},
                       "How centers are searched");
     command.AddOption("--key", "KEY", options->mKey, "The stated key, as in \"A minor\" or Bb");

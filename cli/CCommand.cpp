@@ -1,11 +1,17 @@
 // SPDX-License-Identifier: MIT
 #include "cli/CCommand.h"
 
+#include "cli/DidYouMean.h"
+
 #include <fmt/format.h>
 
 #include <CLI/CLI.hpp>
+#include <algorithm>
+#include <filesystem>
 #include <optional>
 #include <sstream>
+#include <string_view>
+#include <system_error>
 #include <utility>
 
 namespace brindle::cli {
@@ -32,32 +38,141 @@ void ShowExamplesFirst(CLI::App& app, const char* examples) {
     if (examples != nullptr) app.formatter(std::make_shared<CExamplesFirst>(examples));
 }
 
-std::string SubcommandNames(const CLI::App& program) {
+std::vector<std::string> CommandNames(const CLI::App& app) {
     std::vector<std::string> names;
-    for (const CLI::App* const command : program.get_subcommands({})) {
+    for (const CLI::App* const command : app.get_subcommands({})) {
         names.push_back(command->get_name());
     }
-    return fmt::format("{}", fmt::join(names, ", "));
+    return names;
+}
+
+std::vector<std::string> OptionNames(const CLI::App& app) {
+    std::vector<std::string> names;
+    for (const CLI::Option* const option : app.get_options()) {
+        for (const std::string& name : option->get_lnames()) names.push_back("--" + name);
+    }
+    return names;
+}
+
+// The command that the words of the command line lead to, the last of those in one another.
+const CLI::App& AskedFor(const CLI::App& program) {
+    const CLI::App* app = &program;
+    while (!app->get_subcommands().empty()) app = app->get_subcommands().front();
+    return *app;
+}
+
+std::string CallOf(const CLI::App& app) {
+    const CLI::App* const above = app.get_parent();
+    return above == nullptr ? app.get_name() : CallOf(*above) + ' ' + app.get_name();
+}
+
+TStatus FailWithHelp(const CLI::App& app, std::string_view message) {
+    const char* const see = message.ends_with('?') ? " See" : "; see";
+    return Fail(TStatus::BadUsage,
+                fmt::format("{}{} {} --help", Printable(message), see, CallOf(app)));
+}
+
+/// The words of the command line behind the program's name.
+using TTypedWords = std::vector<std::string>;
+
+// The first option that the command does not have. What stands behind "=" is its value.
+std::string UnknownOption(const CLI::App& app, const TTypedWords& words) {
+    const auto names = OptionNames(app);
+    for (const std::string& word : words) {
+        if (!word.starts_with("--") || word == "--") continue;
+        const std::string name = word.substr(0, word.find('='));
+        if (std::find(names.begin(), names.end(), name) == names.end()) return name;
+    }
+    return {};
+}
+
+TStatus FailForUnknown(const CLI::App& app, const TTypedWords& words, const std::string& message) {
+    const std::string name = UnknownOption(app, words);
+    if (name.empty()) return FailWithHelp(app, message);
+    const std::string meant = DidYouMean(name, OptionNames(app));
+    return FailWithHelp(app, fmt::format("{} is no option of {}{}", name, CallOf(app), meant));
+}
+
+// A song in the place of a command is what somebody types who has not read the help.
+TStatus FailForCommand(const CLI::App& app, const std::string& typed) {
+    const auto names = CommandNames(app);
+    std::error_code error;
+    if (std::filesystem::is_regular_file(typed, error)) {
+        return Fail(TStatus::BadUsage, fmt::format("{} is a file and no subcommand; brindle "
+                                                   "analyse {} reads it as a song",
+                                                   Printable(typed), Printable(typed)));
+    }
+    const std::string nearest = NearestWord(typed, names);
+    if (!nearest.empty()) {
+        return FailWithHelp(app,
+                            fmt::format("{} is no subcommand, did you mean {}?", typed, nearest));
+    }
+    return Fail(TStatus::BadUsage, fmt::format("{} is no subcommand, there are: {}",
+                                               Printable(typed), fmt::join(names, ", ")));
+}
+
+// The first word behind those that lead to the command, if it is none of its options.
+std::string WordBehind(const CLI::App& app, const TTypedWords& words) {
+    std::size_t depth = 0;
+    for (const CLI::App* above = app.get_parent(); above != nullptr; above = above->get_parent()) {
+        ++depth;
+    }
+    return depth < words.size() && !words[depth].starts_with("-") ? words[depth] : std::string();
 }
 
 // CLI11 asks for help and version by exceptions, too; these end well.
-TStatus Report(const CLI::App& program, const CLI::ParseError& error, const char* firstWord) {
+TStatus Report(const CLI::App& program, const CLI::ParseError& error, const TTypedWords& words) {
     if (error.get_exit_code() == static_cast<int>(CLI::ExitCodes::Success)) {
         std::ostringstream shown;
         program.exit(error, shown, shown);
         return Print(shown.str());
     }
-    const std::vector<CLI::App*> commands = program.get_subcommands();
-    if (!commands.empty()) {
-        return Fail(TStatus::BadUsage,
-                    fmt::format("{}; see brindle {} --help", Printable(error.what()),
-                                commands.front()->get_name()));
+    const CLI::App& app = AskedFor(program);
+    if (!CommandNames(app).empty()) {
+        const std::string typed = WordBehind(app, words);
+        if (!typed.empty()) return FailForCommand(app, typed);
+        return FailForUnknown(app, words, error.what());
     }
-    if (firstWord == nullptr || *firstWord == '-') {
-        return Fail(TStatus::BadUsage, fmt::format("{}; see brindle --help", error.what()));
-    }
-    return Fail(TStatus::BadUsage, fmt::format("{} is no subcommand, there are: {}",
-                                               Printable(firstWord), SubcommandNames(program)));
+    const bool isUnknown = error.get_exit_code() == static_cast<int>(CLI::ExitCodes::ExtrasError);
+    return isUnknown ? FailForUnknown(app, words, error.what()) : FailWithHelp(app, error.what());
+}
+
+// One of some words, or the nearest of them in the message.
+CLI::Validator OneOf(const std::vector<std::string>& choices) {
+    CLI::Validator validator;
+    return validator.operation([choices](const std::string& typed) {
+        if (std::find(choices.begin(), choices.end(), typed) != choices.end()) {
+            return std::string();
+        }
+        return fmt::format("{} is none of {}{}", typed, fmt::join(choices, ", "),
+                           DidYouMean(typed, choices));
+    });
+}
+
+std::vector<std::string> NamesOf(const CLI::Option& option) {
+    if (!option.nonpositional()) return {option.get_name(true)};
+    std::vector<std::string> names;
+    for (const std::string& name : option.get_snames()) names.push_back('-' + name);
+    for (const std::string& name : option.get_lnames()) names.push_back("--" + name);
+    return names;
+}
+
+std::string ValueNameOf(const CLI::Option& option) {
+    if (option.get_items_expected_max() == 0) return {};
+    const std::string& text = option.get_option_text();
+    return text.find_first_not_of(' ') == text.npos ? "VALUE" : text;
+}
+
+COptionPage PageOf(const CLI::Option& option) {
+    COptionPage page;
+    page.mNames = NamesOf(option);
+    page.mIsArgument = !option.nonpositional();
+    if (!page.mIsArgument) page.mValueName = ValueNameOf(option);
+    page.mPurpose = option.get_description();
+    page.mGroup = option.get_group() == "Options" ? "" : option.get_group();
+    page.mIsRequired = option.get_required();
+    page.mIsMany = option.get_expected_max() > 1;
+    return page;
 }
 
 }  // namespace
@@ -95,6 +210,8 @@ COption& COption::InGroup(const std::string& heading) {
 
 CCommand::CCommand(const CCommandHelp& help, const std::string& version)
     : mApp(std::make_shared<CLI::App>(help.mPurpose, help.mName)),
+      mName(help.mName),
+      mExamples(help.mExamples == nullptr ? "" : help.mExamples),
       mStatus(std::make_shared<TStatus>(TStatus::Success)) {
     mApp->set_version_flag("--version", version);
     ShowExamplesFirst(*mApp, help.mExamples);
@@ -102,6 +219,8 @@ CCommand::CCommand(const CCommandHelp& help, const std::string& version)
 
 CCommand::CCommand(CCommand& above, const CCommandHelp& help)
     : mApp(above.mApp->get_subcommand_ptr(above.mApp->add_subcommand(help.mName, help.mPurpose))),
+      mName(above.mName + ' ' + help.mName),
+      mExamples(help.mExamples == nullptr ? "" : help.mExamples),
       mStatus(above.mStatus) {
     ShowExamplesFirst(*mApp, help.mExamples);
 }
@@ -112,6 +231,10 @@ CCommand& CCommand::AddCommand(const CCommandHelp& help) {
     return mCommands.back();
 }
 
+void CCommand::AlsoCalled(const std::string& name) {
+    mApp->alias(name);
+}
+
 COption CCommand::AddArgument(const std::string& name, std::string& word,
                               const std::string& purpose) {
     return AddOption(name, " ", word, purpose);
@@ -120,6 +243,12 @@ COption CCommand::AddArgument(const std::string& name, std::string& word,
 COption CCommand::AddArgument(const std::string& name, std::vector<std::string>& words,
                               const std::string& purpose) {
     return COption(*mApp->add_option(name, words, purpose)->option_text("..."));
+}
+
+COption CCommand::AddListOption(const std::string& names, const std::string& valueName,
+                                std::vector<std::string>& values, const std::string& purpose) {
+    CLI::Option* const option = mApp->add_option(names, values, purpose);
+    return COption(*option->allow_extra_args(false)->option_text(valueName));
 }
 
 template <typename TValue>
@@ -146,8 +275,19 @@ COption CCommand::AddChoice(const std::string& name, std::string& value,
     const std::string defaultValue = " (default: " + value + ")";
     const COption option =
         AddOption(name, fmt::format("{}", fmt::join(choices, "|")), value, purpose + defaultValue);
-    option.mOption->check(CLI::IsMember(choices));
+    option.mOption->check(OneOf(choices));
+    mChoices[option.mOption] = choices;
     return option;
+}
+
+COption CCommand::AddChoiceArgument(const std::string& name, std::string& word,
+                                    const std::vector<std::string>& choices,
+                                    const std::string& purpose) {
+    const COption argument =
+        AddOption(name, fmt::format("{}", fmt::join(choices, "|")), word, purpose);
+    argument.mOption->check(OneOf(choices))->required();
+    mChoices[argument.mOption] = choices;
+    return argument;
 }
 
 COption CCommand::AddFlag(const std::string& name, bool& value, const std::string& purpose) {
@@ -162,11 +302,22 @@ void CCommand::OnCall(std::function<TStatus()> call) {
     mApp->callback([call = std::move(call), status = mStatus] { *status = call(); });
 }
 
+CCommandPage CCommand::Page() const {
+    CCommandPage page{mName, mApp->get_description(), mExamples, {}, {}};
+    for (const CLI::Option* const option : mApp->get_options()) {
+        page.mOptions.push_back(PageOf(*option));
+        const auto choices = mChoices.find(option);
+        if (choices != mChoices.end()) page.mOptions.back().mChoices = choices->second;
+    }
+    for (const CCommand& command : mCommands) page.mCommands.push_back(command.Page());
+    return page;
+}
+
 TStatus CCommand::Run(int argc, const char* const* argv) {
     try {
         mApp->parse(argc, argv);
     } catch (const CLI::ParseError& error) {
-        return Report(*mApp, error, argc > 1 ? argv[1] : nullptr);
+        return Report(*mApp, error, TTypedWords(argv + std::min(argc, 1), argv + argc));
     }
     return *mStatus;
 }

@@ -1,11 +1,13 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "cli/CommandPage.h"
 #include "cli/Output.h"
 
 #include <cstdint>
 #include <functional>
 #include <list>
+#include <map>
 #include <memory>
 #include <string>
 #include <vector>
@@ -58,10 +60,18 @@ public:
     /// Adds a command, of which the command line then has to tell one.
     CCommand& AddCommand(const CCommandHelp& help);
 
+    /// Another name of this command, which the help tells beside its own.
+    void AlsoCalled(const std::string& name);
+
     /// What is told without a name: one word, or several.
     COption AddArgument(const std::string& name, std::string& word, const std::string& purpose);
     COption AddArgument(const std::string& name, std::vector<std::string>& words,
                         const std::string& purpose);
+
+    /// An option that can be told several times, with one value each. `names` and `valueName` are
+    /// those of AddOption.
+    COption AddListOption(const std::string& names, const std::string& valueName,
+                          std::vector<std::string>& values, const std::string& purpose);
 
     /// `names` are "--name" or "-n,--name", `valueName` stands for the value in the help. The types
     /// of values are those for which CCommand.cpp makes it.
@@ -74,6 +84,10 @@ public:
     COption AddChoice(const std::string& name, std::string& value,
                       const std::vector<std::string>& choices, const std::string& purpose);
 
+    /// An argument that has to be one of a few words.
+    COption AddChoiceArgument(const std::string& name, std::string& word,
+                              const std::vector<std::string>& choices, const std::string& purpose);
+
     COption AddFlag(const std::string& name, bool& value, const std::string& purpose);
 
     /// One that has been added.
@@ -81,6 +95,9 @@ public:
 
     /// What happens when the command line asks for this command.
     void OnCall(std::function<TStatus()> call);
+
+    /// What has been declared so far, of this command and those below it.
+    [[nodiscard]] CCommandPage Page() const;
 
     /// Of the program: reads the command line and calls the command that it asks for. Help is
     /// printed, what is wrong with the command line told. Whatever the command throws goes on.
@@ -90,6 +107,10 @@ private:
     CCommand(CCommand& above, const CCommandHelp& help);
 
     std::shared_ptr<CLI::App> mApp;
+    /// As it is called, with the names of the commands above.
+    std::string mName;
+    std::string mExamples;
+    std::map<const CLI::Option*, std::vector<std::string>> mChoices;
     /// How the command that is called ends; one for the program and all its commands.
     std::shared_ptr<TStatus> mStatus;
     std::list<CCommand> mCommands;

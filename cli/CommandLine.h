@@ -48,5 +48,7 @@ void AddKeys(CCommand& program);
 void AddNumerals(CCommand& program);
 void AddHarmonies(CCommand& program);
 void AddImport(CCommand& program);
+void AddCompletion(CCommand& program);
+void AddManual(CCommand& program);
 
 }  // namespace brindle::cli

@@ -1,9 +1,14 @@
 // SPDX-License-Identifier: MIT
 #include "cli/ChordTextOptions.h"
 #include "cli/CommandLine.h"
+#include "cli/TypedChords.h"
+#include "cli/TypedSongs.h"
 
+#include "brindle/analysis/TChordStringParse.h"
+#include "brindle/present/AnalysisSvg.h"
 #include "brindle/present/CopiesText.h"
 #include "brindle/present/MakeSongCopies.h"
+#include "brindle/present/ShownNames.h"
 
 #include <memory>
 
@@ -14,30 +19,50 @@ constexpr CCommandHelp kCopiesHelp{
     "copies",
     "Find the passages of a song that repeat earlier ones, chord for chord",
     "  brindle copies --beats-per-chord 4 \"C Am F G C Am F G\"\n"
-    "  brindle copies --file song.txt --beats-per-bar 3\n"
+    "  brindle copies song.txt --beats-per-bar 3\n"
+    "  brindle copies song.musicxml --format svg >copies.svg\n"
     "  cat song.txt | brindle copies - --json\n"
     "\n"
     "A chord text has chord symbols between white space; | goes on to the next bar\n"
-    "line, and . holds the chord before it for one more step.\n",
+    "line, and . holds the chord before it for one more step. The text shows the longest\n"
+    "passages of whole bars; JSON and the picture have the copies that the library finds,\n"
+    "which may begin and end within bars.\n",
 };
 
 struct CCopiesOptions {
-    CChordReadingOptions mText;
+    CTypedSongs mSongs;
+    double mBeatsPerBar = 4.0;
+    double mBeatsPerChord = 1.0;
+    CTypedChords mReading;
     CFormatOptions mFormat;
 };
 
-TStatus Copies(const CCopiesOptions& options) {
-    if (const auto contradiction = options.mText.Contradiction()) {
-        return Fail(TStatus::BadUsage, *contradiction);
-    }
-    auto song = options.mText.ReadSong();
+TSongOutput CopiesOf(const CTypedSong& typed, const CCopiesOptions& options) {
+    TChordStringParse parse;
+    parse.mBeatsPerBar = options.mBeatsPerBar;
+    parse.mBeatsPerChord = options.mBeatsPerChord;
+    parse.mChordNamePrefs = NamePrefs();
+    const auto song = options.mReading.ReadSongOrFail(typed, parse);
     if (!song) return TStatus::BadInput;
+    const TFormat format = options.mFormat.Format();
+    if (format == TFormat::Text) return RepeatsText(song->mSong, PaintOfOutput());
     CHarmonicAnalyse chordsOnly;
-    chordsOnly.mChords = std::move(song->mChords);
-    const std::vector<CShownCopy> copies = MakeSongCopies(chordsOnly, song->mSymbols);
-    return Print(options.mFormat.Format() == TFormat::Json
-                     ? CopiesJson(copies)
-                     : CopiesText(copies, song->mBeatsPerBar, PaintOfOutput()));
+    chordsOnly.mChords = song->mChords;
+    std::vector<CShownCopy> copies = MakeSongCopies(chordsOnly, song->mSymbols);
+    if (format == TFormat::Json) return CopiesJson(copies, song->mSong);
+    CShownSong shown = MakeSong(chordsOnly, nullptr, song->mSymbols, song->mBeatsPerBar);
+    shown.mCopies = std::move(copies);
+    return AnalysisSvg(shown);
+}
+
+TStatus Copies(const CCopiesOptions& options) {
+    auto contradiction = options.mSongs.Contradiction(options.mFormat.Format());
+    if (!contradiction) {
+        contradiction = BeatsContradiction(options.mBeatsPerBar, options.mBeatsPerChord);
+    }
+    if (contradiction) return Fail(TStatus::BadUsage, *contradiction);
+    return options.mSongs.Print(options.mFormat.Format(),
+                                [&](const CTypedSong& song) { return CopiesOf(song, options); });
 }
 
 }  // namespace
@@ -45,8 +70,10 @@ TStatus Copies(const CCopiesOptions& options) {
 void AddCopies(CCommand& program) {
     CCommand& command = program.AddCommand(kCopiesHelp);
     const auto options = std::make_shared<CCopiesOptions>();
-    options->mText.AddTo(command);
-    options->mFormat.AddTo(command, {"text", "json"});
+    options->mSongs.AddTo(command);
+    AddBeats(command, options->mBeatsPerBar, options->mBeatsPerChord);
+    options->mReading.AddTo(command, "In what form the chord text is written");
+    options->mFormat.AddTo(command, {"text", "json", "svg"});
     command.OnCall([options] { return Copies(*options); });
 }
 

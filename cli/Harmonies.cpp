@@ -3,6 +3,7 @@
 #include "cli/HarmoniesFromNotes.h"
 #include "cli/KeyText.h"
 #include "cli/LeadSheet.h"
+#include "cli/TypedSongs.h"
 
 #include "brindle/present/HarmoniesText.h"
 #include "brindle/song/SheetTimes.h"
@@ -12,6 +13,7 @@
 
 #include <iostream>
 #include <memory>
+#include <optional>
 
 namespace brindle::cli {
 namespace {
@@ -31,7 +33,7 @@ constexpr CCommandHelp kHarmoniesHelp{
 };
 
 struct CHarmoniesOptions {
-    std::string mFile;
+    CTypedSongs mScores;
     std::string mTiming = "played";
     bool mIsFromNotes = false;
     std::string mEvery = "change";
@@ -39,7 +41,7 @@ struct CHarmoniesOptions {
     CFormatOptions mFormat;
 };
 
-TStatus PrintChordText(const TMusicXMLDoc& sheet, const std::string& name) {
+TSongOutput ChordText(const TMusicXMLDoc& sheet, const std::string& name) {
     if (!HasTimes(sheet)) {
         return Fail(TStatus::BadInput,
                     fmt::format("{}: some chords have no length", Printable(name)));
@@ -53,7 +55,7 @@ TStatus PrintChordText(const TMusicXMLDoc& sheet, const std::string& name) {
         std::cerr << fmt::format("brindle: read it with --beats-per-bar {} --beats-per-chord {}\n",
                                  chords->mBeatsPerBar, chords->mBeatsPerChord);
     }
-    return Print(chords->mText);
+    return chords->mText;
 }
 
 TChordEvery EveryOf(const std::string& word) {
@@ -61,10 +63,28 @@ TChordEvery EveryOf(const std::string& word) {
     return word == "beat" ? TChordEvery::Beat : TChordEvery::Change;
 }
 
-TStatus FromNotes(const CTypedSong& song, const CHarmoniesOptions& options) {
-    const TFormat format = options.mFormat.Format();
-    if (format == TFormat::Chords) {
-        return Fail(TStatus::BadUsage, "--from-notes has no --format chords");
+TSongOutput HarmoniesOf(const CTypedSong& score, const CHarmoniesOptions& options) {
+    const TTiming timing = options.mTiming == "native" ? TTiming::Native : TTiming::Played;
+    const auto sheet = ReadLeadSheet(score, timing);
+    if (!sheet) return TStatus::BadInput;
+    if (options.mFormat.Format() == TFormat::Chords) return ChordText(*sheet, score.mName);
+    const bool isJson = options.mFormat.Format() == TFormat::Json;
+    return isJson ? HarmoniesJson(*sheet) : HarmoniesText(*sheet, PaintOfOutput());
+}
+
+// What is wrong with options that are fine one by one.
+std::optional<std::string> Contradiction(const CHarmoniesOptions& options) {
+    const bool isOfNotes = !options.mKey.empty() || options.mEvery != "change";
+    if (isOfNotes && !options.mIsFromNotes) return "--key and --every go with --from-notes";
+    if (options.mIsFromNotes && options.mFormat.Format() == TFormat::Chords) {
+        return "--from-notes has no --format chords";
+    }
+    return options.mScores.Contradiction(options.mFormat.Format());
+}
+
+TStatus Harmonies(const CHarmoniesOptions& options) {
+    if (const auto contradiction = Contradiction(options)) {
+        return Fail(TStatus::BadUsage, *contradiction);
     }
     CChordsFromNotesOptions how;
     how.mEvery = EveryOf(options.mEvery);
@@ -73,23 +93,11 @@ TStatus FromNotes(const CTypedSong& song, const CHarmoniesOptions& options) {
         if (!key) return TStatus::BadUsage;
         how.mKey = *key;
     }
-    return PrintChordsFromNotes(song, how, format == TFormat::Json);
-}
-
-TStatus Harmonies(const CHarmoniesOptions& options) {
-    const bool isOfNotes = !options.mKey.empty() || options.mEvery != "change";
-    if (isOfNotes && !options.mIsFromNotes) {
-        return Fail(TStatus::BadUsage, "--key and --every go with --from-notes");
-    }
-    const auto typed = ReadTypedSong({}, options.mFile);
-    if (!typed) return TStatus::BadInput;
-    if (options.mIsFromNotes) return FromNotes(*typed, options);
-    const TTiming timing = options.mTiming == "native" ? TTiming::Native : TTiming::Played;
-    const auto sheet = ReadLeadSheet(*typed, timing);
-    if (!sheet) return TStatus::BadInput;
-    if (options.mFormat.Format() == TFormat::Chords) return PrintChordText(*sheet, typed->mName);
-    const bool isJson = options.mFormat.Format() == TFormat::Json;
-    return Print(isJson ? HarmoniesJson(*sheet) : HarmoniesText(*sheet, PaintOfOutput()));
+    const TFormat format = options.mFormat.Format();
+    return options.mScores.Print(format, [&](const CTypedSong& score) {
+        return options.mIsFromNotes ? ShowChordsFromNotes(score, how, format == TFormat::Json)
+                                    : HarmoniesOf(score, options);
+    });
 }
 
 }  // namespace
@@ -97,8 +105,7 @@ TStatus Harmonies(const CHarmoniesOptions& options) {
 void AddHarmonies(CCommand& program) {
     CCommand& command = program.AddCommand(kHarmoniesHelp);
     const auto options = std::make_shared<CHarmoniesOptions>();
-    command.AddArgument("FILE", options->mFile, "A score in MusicXML; - reads standard input")
-        .Required();
+    options->mScores.AddFilesTo(command);
     command.AddChoice("--timing", options->mTiming, {"played", "native"},
                       "How the chords of a score follow each other");
     command.AddFlag("--from-notes", options->mIsFromNotes,

@@ -36,13 +36,13 @@ std::optional<CScoreNotes> ReadNotes(const CTypedSong& song) {
 
 }  // namespace
 
-TStatus PrintChordsFromNotes(const CTypedSong& song, const CChordsFromNotesOptions& options,
-                             bool isJson) {
+TSongOutput ShowChordsFromNotes(const CTypedSong& song, const CChordsFromNotesOptions& options,
+                                bool isJson) {
     const auto notes = ReadNotes(song);
     if (!notes) return TStatus::BadInput;
     const CChordsFromNotes chords = ChordsFromNotes(*notes, options);
-    return Print(isJson ? ChordsFromNotesJson(chords)
-                        : ChordsFromNotesText(*notes, chords, PaintOfOutput()));
+    return isJson ? ChordsFromNotesJson(chords)
+                  : ChordsFromNotesText(*notes, chords, PaintOfOutput());
 }
 
 }  // namespace brindle::cli

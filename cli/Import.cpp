@@ -155,7 +155,7 @@ TStatus Import(const CImportOptions& options) {
         Fail(TStatus::BadInput,
              fmt::format("{}: {}", Printable(name), Printable(error.description)));
     }
-    TStatus status = *isOk && alerts.Count() == 0 ? TStatus::Success : TStatus::BadInput;
+    const TStatus status = *isOk && alerts.Count() == 0 ? TStatus::Success : TStatus::BadInput;
     if (options.IsNdjson()) {
         output += ResultLine(*isOk, error);
     } else if (*isOk) {
@@ -164,8 +164,8 @@ TStatus Import(const CImportOptions& options) {
     // The file first: who reads the output may stop before its end.
     if (*isOk && options.mMidiFile &&
         !WriteFileAtomically(*options.mMidiFile, MidiFileBytes(MidiPieceOf(score)))) {
-        status = Fail(TStatus::BadInput,
-                      fmt::format("{} cannot be written", Printable(*options.mMidiFile)));
+        return Fail(TStatus::BadInput,
+                    fmt::format("{} cannot be written", Printable(*options.mMidiFile)));
     }
     return Print(output) == TStatus::Success ? status : TStatus::BadInput;
 }

@@ -1,15 +1,20 @@
 // SPDX-License-Identifier: MIT
 #include "cli/Input.h"
 
+#include "brindle/chords/ReadChordText.h"
+#include "brindle/platform/Ascii.h"
 #include "brindle/theory/KeyNames.h"
 
 #include <fmt/format.h>
 
+#include <algorithm>
 #include <array>
 #include <cerrno>
 #include <cstdio>
 #include <cstring>
+#include <filesystem>
 #include <memory>
+#include <system_error>
 
 namespace brindle::cli {
 namespace {
@@ -50,7 +55,42 @@ std::vector<std::string> Split(std::string_view text, std::string_view separator
     }
 }
 
+std::vector<std::string> TrimmedLines(std::string_view text) {
+    std::vector<std::string> lines;
+    for (const std::string& line : Split(text, "\n")) {
+        const std::size_t begin = line.find_first_not_of(kWhiteSpace);
+        if (begin == line.npos) continue;
+        lines.push_back(line.substr(begin, line.find_last_not_of(kWhiteSpace) + 1 - begin));
+    }
+    return lines;
+}
+
+// song.txt, My Song.TXT, songs/blues.musicxml, but no link and no "C.".
+bool HasFileEnding(std::string_view word) {
+    constexpr std::size_t shortest = 2;
+    constexpr std::size_t longest = 8;
+    const std::size_t dot = word.rfind('.');
+    if (dot == word.npos || dot == 0 || word.find("://") != word.npos) return false;
+    const std::string_view ending = word.substr(dot + 1);
+    return ending.size() >= shortest && ending.size() <= longest &&
+           std::all_of(ending.begin(), ending.end(), Ascii::IsLetter);
+}
+
+bool LooksLikeFileName(const std::string& word) {
+    if (word.find_first_of("|\n") != word.npos) return false;
+    for (const char* const start : {"/", "./", "../", "~/"}) {
+        if (word.starts_with(start)) return true;
+    }
+    return HasFileEnding(word);
+}
+
 }  // namespace
+
+bool IsFileName(const std::string& word) {
+    std::error_code error;
+    if (std::filesystem::is_regular_file(word, error)) return true;
+    return LooksLikeFileName(word) && !ReadChordText(word).mFault.empty();
+}
 
 bool IsStandardInput(const std::vector<std::string>& words) {
     return words.size() == 1 && words.front() == "-";
@@ -77,14 +117,14 @@ std::string FoldAccidentals(std::string_view text) {
 std::optional<std::vector<std::string>> TypedLines(const std::vector<std::string>& words) {
     const auto text = TextFromWords(words);
     if (!text) return std::nullopt;
-    if (!IsStandardInput(words)) return std::vector<std::string>{*text};
-    std::vector<std::string> lines;
-    for (const std::string& line : Split(*text, "\n")) {
-        const std::size_t begin = line.find_first_not_of(kWhiteSpace);
-        if (begin == line.npos) continue;
-        lines.push_back(line.substr(begin, line.find_last_not_of(kWhiteSpace) + 1 - begin));
-    }
-    return lines;
+    return IsStandardInput(words) ? TrimmedLines(*text) : std::vector<std::string>{*text};
+}
+
+std::optional<std::vector<std::string>> TypedSongLines(const std::vector<std::string>& words) {
+    if (words.size() != 1 || !IsFileName(words.front())) return TypedLines(words);
+    const auto text = ReadInput(words.front());
+    if (!text) return std::nullopt;
+    return TrimmedLines(*text);
 }
 
 std::vector<std::string> WordsOf(std::string_view text) {

@@ -17,6 +17,10 @@ namespace brindle::cli {
 /// error has been printed.
 [[nodiscard]] std::optional<std::string> ReadInput(const std::string& path);
 
+/// Whether a word of a command line is the name of a file: one that is there, or a word that looks
+/// as if it should be (song.txt, ./blues) and is no chord.
+[[nodiscard]] bool IsFileName(const std::string& word);
+
 /// The words of a command line as one text; "-" reads standard input.
 [[nodiscard]] std::optional<std::string> TextFromWords(const std::vector<std::string>& words);
 
@@ -26,6 +30,10 @@ namespace brindle::cli {
 /// The words of a command line as one line; the single word "-" reads the lines of standard input,
 /// without blank ones and without the white space around the others.
 [[nodiscard]] std::optional<std::vector<std::string>> TypedLines(
+    const std::vector<std::string>& words);
+
+/// The same, where a single word that names a file is read, too.
+[[nodiscard]] std::optional<std::vector<std::string>> TypedSongLines(
     const std::vector<std::string>& words);
 
 /// The pieces of a text between white space.

@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: MIT
 #include "cli/ChordTextOptions.h"
 #include "cli/CommandLine.h"
-#include "cli/Input.h"
 #include "cli/KeyText.h"
 #include "cli/LeadSheet.h"
 #include "cli/TypedChords.h"
+#include "cli/TypedSongs.h"
 
 #include "brindle/analysis/CHarmonicAnalyse.h"
 #include "brindle/analysis/TChordStringParse.h"
@@ -27,7 +27,7 @@ constexpr CCommandHelp kKeysHelp{
     "keys",
     "Find the key of a song and the keys that it passes through, with Roman numerals",
     "  brindle keys \"Dm7 G7 | Cmaj7 . | Fm7 Bb7 | Ebmaj7 .\" --beats-per-chord 2\n"
-    "  brindle keys --file song.txt --beats-per-bar 3 --format svg >keys.svg\n"
+    "  brindle keys song.txt --beats-per-bar 3 --format svg >keys.svg\n"
     "  brindle keys song.musicxml --nashville\n"
     "  cat song.txt | brindle keys - --json\n"
     "\n"
@@ -40,8 +40,7 @@ constexpr CCommandHelp kKeysHelp{
 constexpr double kMostPoints = 1000.0;
 
 struct CKeysOptions {
-    std::vector<std::string> mWords;
-    std::string mFile;
+    CTypedSongs mSongs;
     std::string mKey;
     double mBeatsPerChord = 1.0;
     CKeyOptions mKeys;
@@ -52,12 +51,9 @@ struct CKeysOptions {
 
 // What is wrong with options that are fine one by one.
 std::optional<std::string> Contradiction(const CKeysOptions& options) {
-    if (options.mWords.empty() && options.mFile.empty()) {
-        return "a song is needed: a TEXT, a score, --file PATH, or - for standard input";
-    }
-    if (auto fault = FaultOfSource(options.mWords, options.mFile,
-                                   {options.mKeys.mBeatsPerBar, options.mBeatsPerChord})) {
-        return fault;
+    if (auto songs = options.mSongs.Contradiction(options.mFormat.Format())) return songs;
+    if (auto beats = BeatsContradiction(options.mKeys.mBeatsPerBar, options.mBeatsPerChord)) {
+        return beats;
     }
     for (const double points : {options.mKeys.mHomeBonus, options.mKeys.mChangeCost}) {
         if (points >= 0.0 && points <= kMostPoints) continue;
@@ -78,7 +74,7 @@ std::optional<CSongWithKeys> SongOfText(const CTypedSong& typed, const CKeysOpti
     parse.mBeatsPerBar = options.mKeys.mBeatsPerBar;
     parse.mBeatsPerChord = options.mBeatsPerChord;
     parse.mChordNamePrefs = NamePrefs();
-    auto read = options.mReading.ReadSongOrFail(typed.mText, parse);
+    auto read = options.mReading.ReadSongOrFail(typed, parse);
     if (!read) return std::nullopt;
     CHarmonicAnalyse chordsOnly;
     chordsOnly.mChords = std::move(read->mChords);
@@ -114,6 +110,14 @@ std::string Present(const CSongWithKeys& song, const CSongReading& reading,
                        {.mWidth = WidthOfOutput()}, PaintOfOutput());
 }
 
+TSongOutput KeysOf(const CTypedSong& typed, const CReadingOptions& readingOptions,
+                   const CKeysOptions& options) {
+    auto song = typed.mIsScore ? SongOfScore(typed, options) : SongOfText(typed, options);
+    if (!song) return TStatus::BadInput;
+    if (!options.mKey.empty()) song->mSong.mStatedKey = readingOptions.mStatedKey;
+    return Present(*song, ReadSongHarmony(song->mSong, readingOptions), options);
+}
+
 TStatus Keys(const CKeysOptions& options) {
     if (const auto contradiction = Contradiction(options)) {
         return Fail(TStatus::BadUsage, *contradiction);
@@ -125,12 +129,9 @@ TStatus Keys(const CKeysOptions& options) {
         if (!key) return TStatus::BadUsage;
         readingOptions.mStatedKey = *key;
     }
-    const auto typed = ReadTypedSong(options.mWords, options.mFile);
-    if (!typed) return TStatus::BadInput;
-    auto song = typed->mIsScore ? SongOfScore(*typed, options) : SongOfText(*typed, options);
-    if (!song) return TStatus::BadInput;
-    if (!options.mKey.empty()) song->mSong.mStatedKey = readingOptions.mStatedKey;
-    return Print(Present(*song, ReadSongHarmony(song->mSong, readingOptions), options));
+    return options.mSongs.Print(options.mFormat.Format(), [&](const CTypedSong& song) {
+        return KeysOf(song, readingOptions, options);
+    });
 }
 
 }  // namespace
@@ -138,7 +139,7 @@ TStatus Keys(const CKeysOptions& options) {
 void AddKeys(CCommand& program) {
     CCommand& command = program.AddCommand(kKeysHelp);
     const auto options = std::make_shared<CKeysOptions>();
-    AddSongSource(command, options->mWords, options->mFile);
+    options->mSongs.AddTo(command);
     command.AddOption("--key", "KEY", options->mKey, "The stated key, as in \"A minor\" or Bb");
     AddBeats(command, options->mKeys.mBeatsPerBar, options->mBeatsPerChord);
     command.AddOption("--home-bonus", "POINTS", options->mKeys.mHomeBonus,

@@ -16,6 +16,10 @@
 namespace brindle::cli {
 namespace {
 
+bool IsBlank(std::string_view text) {
+    return text.find_first_not_of(" \t\r\n\v\f") == text.npos;
+}
+
 std::string_view LastDot(std::string_view name) {
     const std::size_t dot = name.rfind('.');
     return dot == name.npos ? std::string_view() : name.substr(dot);
@@ -54,18 +58,40 @@ bool HasScoreBytes(std::string_view bytes) {
     return IsScore(SongFormatOf(bytes));
 }
 
-std::optional<CTypedSong> ReadTypedSong(const std::vector<std::string>& words,
-                                        const std::string& file) {
-    CTypedSong song;
-    song.mName = file;
-    if (file.empty() && words.size() == 1 && (words[0] == "-" || HasScoreName(words[0]))) {
-        song.mName = words[0];
+std::vector<CSongSource> SongSources(const std::vector<std::string>& words) {
+    // Between chords "-" is one of their signs.
+    const bool hasInput = std::all_of(words.begin(), words.end(), [](const std::string& word) {
+        return word == "-" || IsFileName(word);
+    });
+    std::vector<CSongSource> sources;
+    bool isText = false;
+    for (const std::string& word : words) {
+        if (hasInput || IsFileName(word)) {
+            sources.push_back({word, {}});
+            isText = false;
+        } else if (isText) {
+            sources.back().mText += ' ' + word;
+        } else {
+            sources.push_back({{}, word});
+            isText = true;
+        }
     }
-    auto text = song.mName.empty() ? TextFromWords(words) : ReadInput(song.mName);
+    return sources;
+}
+
+std::optional<CTypedSong> ReadTypedSong(const CSongSource& source) {
+    CTypedSong song;
+    song.mName = source.mFile == "-" ? "standard input" : source.mFile;
+    auto text = source.mFile.empty() ? source.mText : ReadInput(source.mFile);
     if (!text) return std::nullopt;
     song.mText = std::move(*text);
-    song.mIsScore = !song.mName.empty() && (HasScoreName(song.mName) || HasScoreBytes(song.mText));
-    if (song.mName == "-") song.mName = "standard input";
+    song.mIsScore =
+        HasScoreName(source.mFile) || (!source.mFile.empty() && HasScoreBytes(song.mText));
+    if (IsBlank(song.mText)) {
+        Fail(TStatus::BadInput,
+             fmt::format("{} is empty", song.mName.empty() ? "the song" : Printable(song.mName)));
+        return std::nullopt;
+    }
     return song;
 }
 

@@ -24,11 +24,19 @@ struct CTypedSong {
     bool mIsScore = false;
 };
 
-/// The song in a file, or in the words of a command line: one word that ends like the name of a
-/// score (.musicxml, .xml, .mxl) is the name of a file, and "-" reads standard input. Nothing when
-/// it cannot be read; then the error has been printed.
-[[nodiscard]] std::optional<CTypedSong> ReadTypedSong(const std::vector<std::string>& words,
-                                                      const std::string& file);
+/// Where a song is: in a file, "-" for standard input, or typed.
+struct CSongSource {
+    std::string mFile;
+    std::string mText;
+};
+
+/// The songs in the words of a command line. A word that names a file or looks like the name of one
+/// (song.txt, songs/blues.musicxml) is a song; the words between two of these are the text of one.
+[[nodiscard]] std::vector<CSongSource> SongSources(const std::vector<std::string>& words);
+
+/// The song of a source. Nothing when it cannot be read or is empty; then the error has been
+/// printed.
+[[nodiscard]] std::optional<CTypedSong> ReadTypedSong(const CSongSource& source);
 
 /// Whether a file that begins so is a score and no chord text.
 [[nodiscard]] bool HasScoreBytes(std::string_view bytes);

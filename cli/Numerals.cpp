@@ -123,7 +123,7 @@ TStatus NumeralsOfWords(const CNumeralsOptions& options) {
     }
     const auto key = ReadKeyOption(options.mKey);
     if (!key) return TStatus::BadUsage;
-    const auto lines = TypedLines(options.mWords);
+    const auto lines = TypedSongLines(options.mWords);
     if (!lines) return TStatus::BadInput;
     const std::string text = fmt::format("{}", fmt::join(*lines, "\n"));
     const bool areNumerals = AreNumerals(text, *key, options);

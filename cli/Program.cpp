@@ -15,8 +15,8 @@ constexpr CCommandHelp kProgramHelp{
     "Music theory and harmony analysis",
     "  brindle analyse \"Dm7 G7 | C\"\n"
     "  brindle analyse song.musicxml\n"
-    "  brindle analyse --file song.txt --format svg >song.svg\n"
-    "  brindle keys --file song.txt\n"
+    "  brindle analyse song.txt --format svg >song.svg\n"
+    "  brindle keys song.txt\n"
     "  brindle import song.musicxml --midi song.mid\n"
     "  brindle chord F#m7/C# Bb13\n"
     "  brindle function Dm7 G7 --key C\n"
@@ -51,6 +51,8 @@ TStatus RunProgram(int argc, char** argv) {
     AddGrid(program);
     AddGrids(program);
     AddMarkov(program);
+    AddCompletion(program);
+    AddManual(program);
     return program.Run(argc, argv);
 }
 

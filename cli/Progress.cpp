@@ -13,19 +13,27 @@ namespace {
 
 constexpr std::size_t kBarWidth = 30;
 constexpr std::size_t kNameWidth = 40;
+/// What is done before needs no bar.
+constexpr std::chrono::milliseconds kUnshown{500};
 
 }  // namespace
 
 CProgress::CProgress(std::size_t steps)
-    : mSteps(steps), mIsShown(steps > 1 && isatty(STDERR_FILENO) == 1) {}
+    : mSteps(steps), mIsTerminal(steps > 1 && isatty(STDERR_FILENO) == 1) {}
 
 CProgress::~CProgress() {
+    Hide();
+}
+
+void CProgress::Hide() {
     if (mIsShown) fmt::print(stderr, "\r\x1B[K");
+    mIsShown = false;
 }
 
 void CProgress::Step(std::string_view name) {
-    if (!mIsShown) return;
     const std::size_t filled = kBarWidth * mBegun++ / mSteps;
+    if (!mIsTerminal || std::chrono::steady_clock::now() - mBegin < kUnshown) return;
+    mIsShown = true;
     fmt::print(stderr, "\r\x1B[K[{}{}] {}/{} {}", std::string(filled, '#'),
                std::string(kBarWidth - filled, '.'), mBegun, mSteps,
                FirstCharacters(Printable(name), kNameWidth));

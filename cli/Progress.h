@@ -1,14 +1,15 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include <chrono>
 #include <cstddef>
 #include <string>
 #include <string_view>
 
 namespace brindle::cli {
 
-/// A bar on standard error that tells how far a work of many steps is. Elsewhere than on a terminal
-/// nothing is shown. The bar is gone when the object is.
+/// A bar on standard error that tells how far a work of many steps is, when it takes about a second
+/// or longer. Elsewhere than on a terminal nothing is shown. The bar is gone when the object is.
 class CProgress {
 public:
     explicit CProgress(std::size_t steps);
@@ -18,11 +19,15 @@ public:
 
     /// The next step begins; `name` is what it works on.
     void Step(std::string_view name);
+    /// Until the next step, as before something is printed.
+    void Hide();
 
 private:
     std::size_t mSteps;
     std::size_t mBegun = 0;
-    bool mIsShown;
+    bool mIsTerminal;
+    bool mIsShown = false;
+    std::chrono::steady_clock::time_point mBegin = std::chrono::steady_clock::now();
 };
 
 }  // namespace brindle::cli

@@ -53,8 +53,10 @@ std::string_view Line(std::string_view text, std::size_t number) {
 }
 
 /// Prints a fault with its line and a caret under the place.
-void PrintFault(std::string_view text, const CSongFault& fault, bool isWarning) {
-    std::string message = isWarning || fault.mIsNote ? "warning: " : "";
+void PrintFault(std::string_view text, const CSongFault& fault, bool isWarning,
+                std::string_view name = {}) {
+    std::string message = name.empty() ? "" : Printable(name) + ": ";
+    if (isWarning || fault.mIsNote) message += "warning: ";
     if (fault.mLine == 0) {
         Fail(TStatus::BadInput, message + Printable(fault.mText));
         return;
@@ -66,10 +68,11 @@ void PrintFault(std::string_view text, const CSongFault& fault, bool isWarning) 
 
 }  // namespace
 
-void PrintFaults(std::string_view text, std::span<const CTextFault> faults, bool areWarnings) {
+void PrintFaults(std::string_view text, std::span<const CTextFault> faults, bool areWarnings,
+                 std::string_view name) {
     const std::size_t count = std::min(faults.size(), kMostWarnings);
     for (const CTextFault& fault : faults.first(count)) {
-        PrintFault(text, fault, areWarnings);
+        PrintFault(text, fault, areWarnings, name);
     }
     if (faults.size() > count) {
         Fail(TStatus::BadInput,
@@ -175,12 +178,15 @@ CSong CTypedChords::ReadSource(std::string_view bytes, const TChordStringParse& 
     return brindle::ReadSong(bytes, prefs);
 }
 
-std::optional<CChordSong> CTypedChords::ReadSongOrFail(std::string_view text,
+std::optional<CChordSong> CTypedChords::ReadSongOrFail(const CTypedSong& typed,
                                                        const TChordStringParse& parse) const {
-    CChordSong song = ReadSong(text, parse);
-    PrintFaults(text, song.mFaults, mIsLenient);
+    CChordSong song = ReadSong(typed.mText, parse);
+    PrintFaults(typed.mText, song.mFaults, mIsLenient, typed.mName);
     if (song.HasFault() && !mIsLenient) return std::nullopt;
-    return song;
+    if (song.mChords.size() > 1) return song;
+    Fail(TStatus::BadInput, fmt::format("{} has no chords",
+                                        typed.mName.empty() ? "the song" : Printable(typed.mName)));
+    return std::nullopt;
 }
 
 }  // namespace brindle::cli

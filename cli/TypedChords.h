@@ -18,6 +18,7 @@ struct TChordStringParse;
 namespace brindle::cli {
 
 class CCommand;
+struct CTypedSong;
 
 /// A song as somebody typed it.
 struct CChordSong {
@@ -37,8 +38,10 @@ struct CChordSong {
     [[nodiscard]] bool HasFault() const;
 };
 
-/// Prints faults with their lines and carets under the places, a score of them at most.
-void PrintFaults(std::string_view text, std::span<const CTextFault> faults, bool areWarnings);
+/// Prints faults with their lines and carets under the places, a score of them at most. `name` is
+/// that of the file, empty for what was typed.
+void PrintFaults(std::string_view text, std::span<const CTextFault> faults, bool areWarnings,
+                 std::string_view name = {});
 
 /// How chords and songs that people type are read, with the options for it: --symbols and
 /// --lenient, and for songs --from and --even. Every subcommand that takes chords reads them here.
@@ -61,7 +64,7 @@ public:
     [[nodiscard]] CChordSong ReadSong(std::string_view text, const TChordStringParse& parse) const;
     /// The same with the faults printed: as warnings with --lenient, else as an error, and then
     /// there is no song.
-    [[nodiscard]] std::optional<CChordSong> ReadSongOrFail(std::string_view text,
+    [[nodiscard]] std::optional<CChordSong> ReadSongOrFail(const CTypedSong& typed,
                                                            const TChordStringParse& parse) const;
 
     /// The song of a source of any form, a score or a text.

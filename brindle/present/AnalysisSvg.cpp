@@ -210,7 +210,7 @@ private:
             const CTimeRange range{signKey.mBegin,
                                    isLast ? mSong.mEnd : mSong.mSignKeys[i + 1].mBegin};
             Band(range, kSignKeyTop, kBandHeight, ColorOf(signKey.mSignKey, Shade_SignKey),
-                 "Sign key " + signKey.mName, {.mSize = kLabelSize, .mColor = kFaintInk});
+                 "Key signature " + signKey.mName, {.mSize = kLabelSize, .mColor = kFaintInk});
         }
     }
 

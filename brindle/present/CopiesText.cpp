@@ -2,9 +2,8 @@
 #include "brindle/present/CopiesText.h"
 
 #include "brindle/present/CBars.h"
-#include "brindle/present/CTable.h"
 #include "brindle/present/JsonValues.h"
-#include "brindle/present/ShownText.h"
+#include "brindle/present/internal/ReadingBars.h"
 
 #include <nlohmann/json.hpp>
 
@@ -12,17 +11,26 @@ namespace brindle {
 
 namespace {
 
-std::string LengthText(double bars) {
-    return ShortNumber(bars) + (bars == 1.0 ? " bar" : " bars");
-}
-
 Json RangeToJson(const CTimeRange& range) {
     return {{"Position", NumberToJson(range.mBegin)}, {"End", NumberToJson(range.mEnd)}};
 }
 
+std::vector<CRepeatedBars> RepeatsOf(const CSong& song) {
+    const CBars bars = BarsOfSong(song);
+    return RepeatedBarsOf(song, bars, ReadingBarsOf(song, bars), 1);
+}
+
 }  // namespace
 
-std::string CopiesJson(const std::vector<CShownCopy>& copies) {
+std::string RepeatsText(const CSong& song, const CPaint& paint) {
+    const auto repeats = RepeatsOf(song);
+    if (repeats.empty()) return "no whole bars are repeated\n";
+    std::string text = paint.Accent("Repeats") + '\n';
+    for (const CRepeatedBars& repeat : repeats) text += "  " + RepeatText(repeat) + '\n';
+    return text;
+}
+
+std::string CopiesJson(const std::vector<CShownCopy>& copies, const CSong& song) {
     Json list = Json::array();
     for (const CShownCopy& shown : copies) {
         list.push_back({{"TargetPos", NumberToJson(shown.mCopy.mTargetPos)},
@@ -32,20 +40,12 @@ std::string CopiesJson(const std::vector<CShownCopy>& copies) {
                         {"Target", RangeToJson(shown.mTarget)},
                         {"Symbols", shown.mSymbols}});
     }
-    return JsonText({{"HarmCopies", list}});
-}
-
-std::string CopiesText(const std::vector<CShownCopy>& copies, double beatsPerBar,
-                       const CPaint& paint) {
-    if (copies.empty()) return "no passage is repeated\n";
-    const CBars bars(beatsPerBar);
-    CTable table({"source", "target", "length", "chords"});
-    for (const CShownCopy& shown : copies) {
-        table.AddRow({BarsOf(shown.mSource, bars), BarsOf(shown.mTarget, bars),
-                      LengthText((shown.mTarget.mEnd - shown.mTarget.mBegin) / beatsPerBar),
-                      FirstAndLast(shown.mSymbols)});
+    Json repeats = Json::array();
+    for (const CRepeatedBars& repeat : RepeatsOf(song)) {
+        repeats.push_back(
+            {{"Bar", repeat.mFirst}, {"SourceBar", repeat.mSource}, {"BarCount", repeat.mCount}});
     }
-    return table.Text(paint);
+    return JsonText({{"HarmCopies", list}, {"Repeats", repeats}});
 }
 
 }  // namespace brindle

@@ -97,16 +97,6 @@ std::string LongTable(const CSong& song, const CSongReading& reading, const CBar
     return table.Text(paint);
 }
 
-/// "bars 13 to 21 repeat bars 1 to 9".
-std::string RepeatText(const CRepeatedBars& repeat) {
-    const auto bars = [&](long first) {
-        return repeat.mCount == 1 ? fmt::format("bar {}", first)
-                                  : fmt::format("bars {} to {}", first, first + repeat.mCount - 1);
-    };
-    return fmt::format("{} {} {}", bars(repeat.mFirst), repeat.mCount == 1 ? "repeats" : "repeat",
-                       bars(repeat.mSource));
-}
-
 void AppendParagraph(std::string& text, std::string_view head,
                      const std::vector<std::string>& lines, const CPaint& paint) {
     if (lines.empty()) return;

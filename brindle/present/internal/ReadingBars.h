@@ -5,6 +5,7 @@
 #include "brindle/song/CSong.h"
 
 #include <cstddef>
+#include <string>
 #include <vector>
 
 namespace brindle {
@@ -44,5 +45,13 @@ struct CRepeatedBars {
 /// under four bars, in a longer song under an eighth of it, up to eight. n log n.
 [[nodiscard]] std::vector<CRepeatedBars> RepeatedBarsOf(
     const CSong& song, const CBars& bars, const std::vector<CReadingBar>& readingBars);
+
+/// The same with passages from `shortest` bars on; a single bar is one if it has several chords.
+[[nodiscard]] std::vector<CRepeatedBars> RepeatedBarsOf(const CSong& song, const CBars& bars,
+                                                        const std::vector<CReadingBar>& readingBars,
+                                                        std::size_t shortest);
+
+/// "bars 13 to 21 repeat bars 1 to 9".
+[[nodiscard]] std::string RepeatText(const CRepeatedBars& repeat);
 
 }  // namespace brindle

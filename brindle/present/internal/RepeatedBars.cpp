@@ -2,6 +2,8 @@
 #include "brindle/analysis/internal/CSuffixes.h"
 #include "brindle/present/internal/ReadingBars.h"
 
+#include <fmt/format.h>
+
 #include <algorithm>
 #include <iterator>
 #include <map>
@@ -13,8 +15,8 @@ namespace {
 
 /// A passage is worth a word from an eighth of the song on, but not below four bars, and from eight
 /// on in any song.
-TPlace ShortestPassage(std::size_t barCount) {
-    return static_cast<TPlace>(std::clamp<std::size_t>(barCount / 8, 4, 8));
+std::size_t ShortestPassage(std::size_t barCount) {
+    return std::clamp<std::size_t>(barCount / 8, 4, 8);
 }
 
 /// What sounds from a beat of a bar on.
@@ -100,6 +102,7 @@ struct CRepeatedPassage {
     }
 };
 
+/// Whether all bars are the same, which says nothing of the song's form.
 bool AreAllEqual(const std::vector<TPlace>& numbers, const CRepeatedPassage& passage) {
     const auto first = numbers.begin() + static_cast<std::ptrdiff_t>(passage.mPlace);
     return std::all_of(first, first + static_cast<std::ptrdiff_t>(passage.mCount),
@@ -136,20 +139,36 @@ std::map<TPlace, TPlace> LongestPassages(const std::vector<TPlace>& longest, TPl
 
 std::vector<CRepeatedBars> RepeatedBarsOf(const CSong& song, const CBars& bars,
                                           const std::vector<CReadingBar>& readingBars) {
+    return RepeatedBarsOf(song, bars, readingBars, ShortestPassage(readingBars.size()));
+}
+
+std::vector<CRepeatedBars> RepeatedBarsOf(const CSong& song, const CBars& bars,
+                                          const std::vector<CReadingBar>& readingBars,
+                                          std::size_t shortest) {
     std::vector<CRepeatedBars> repeats;
     if (readingBars.size() < 2) return repeats;
     const std::vector<TPlace> numbers = CBarNumbers(song, bars).NumbersOf(readingBars);
     const CSuffixes suffixes(numbers);
-    const auto passages =
-        LongestPassages(LongestEarlier(suffixes), ShortestPassage(readingBars.size()));
+    const auto passages = LongestPassages(LongestEarlier(suffixes), static_cast<TPlace>(shortest));
     for (const auto& [place, count] : passages) {
-        if (AreAllEqual(numbers, {place, count})) continue;
+        const CReadingBar& first = readingBars[place];
+        const bool isFullBar = count == 1 && first.mEnd - first.mBegin > 1;
+        if (!isFullBar && AreAllEqual(numbers, {place, count})) continue;
         const TPlace source = suffixes.NextPlace(suffixes.RanksOfPassage(place, count), 0);
         const CReadingBar& last = readingBars[place + count - 1];
-        const long first = readingBars[place].mNumber;
-        repeats.push_back({first, readingBars[source].mNumber, last.mNumber + last.mCount - first});
+        repeats.push_back({first.mNumber, readingBars[source].mNumber,
+                           last.mNumber + last.mCount - first.mNumber});
     }
     return repeats;
+}
+
+std::string RepeatText(const CRepeatedBars& repeat) {
+    const auto bars = [&](long first) {
+        return repeat.mCount == 1 ? fmt::format("bar {}", first)
+                                  : fmt::format("bars {} to {}", first, first + repeat.mCount - 1);
+    };
+    return fmt::format("{} {} {}", bars(repeat.mFirst), repeat.mCount == 1 ? "repeats" : "repeat",
+                       bars(repeat.mSource));
 }
 
 }  // namespace brindle

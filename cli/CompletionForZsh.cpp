@@ -1,0 +1,100 @@
+// SPDX-License-Identifier: MIT
+#include "cli/Completions.h"
+
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <string_view>
+
+namespace brindle::cli {
+namespace {
+
+/// "_brindle_markov_learn"
+std::string FunctionOf(const CCommandPage& page) {
+    std::string name = '_' + page.mName;
+    std::replace(name.begin(), name.end(), ' ', '_');
+    return name;
+}
+
+/// A text within single quotes, with `special` characters behind a backslash.
+std::string ZshQuoted(std::string_view text, std::string_view special) {
+    std::string quoted;
+    for (const char c : text) {
+        if (special.find(c) != special.npos || c == '\\') quoted += '\\';
+        quoted += c == '\'' ? "'\\''" : std::string(1, c);
+    }
+    return quoted;
+}
+
+/// What completes a value: "(text json)", "_files", or nothing.
+std::string ActionOf(const COptionPage& option) {
+    if (!option.mChoices.empty()) return fmt::format("({})", fmt::join(option.mChoices, " "));
+    return option.TakesFile() ? "_files" : " ";
+}
+
+std::string Specification(const COptionPage& option, const std::string& name) {
+    const std::string many = option.mIsMany ? "*" : "";
+    if (option.mIsArgument) {
+        return fmt::format("'{}:{}:{}'", option.mIsMany ? "*" : "", ZshQuoted(name, ":"),
+                           ActionOf(option));
+    }
+    const std::string head = fmt::format("{}{}", many, name);
+    const std::string purpose = ZshQuoted(option.mPurpose, "[]:");
+    if (option.mValueName.empty()) return fmt::format("'{}[{}]'", head, purpose);
+    const char* const joined = name.starts_with("--") ? "=" : "";
+    const std::string value = option.mChoices.empty() ? option.mValueName : "choice";
+    return fmt::format("'{}{}[{}]:{}:{}'", head, joined, purpose, ZshQuoted(value, ":"),
+                       ActionOf(option));
+}
+
+std::string Arguments(const CCommandPage& page) {
+    std::string text;
+    for (const COptionPage& option : page.mOptions) {
+        for (const std::string& name : option.mNames) {
+            text += " \\\n        " + Specification(option, name);
+        }
+    }
+    return text;
+}
+
+std::string CommandList(const CCommandPage& page) {
+    std::string text;
+    for (const CCommandPage& command : page.mCommands) {
+        text += fmt::format("                '{}:{}'\n", command.LastName(),
+                            ZshQuoted(command.mPurpose, ":"));
+    }
+    return text;
+}
+
+std::string FunctionText(const CCommandPage& page) {
+    if (page.mCommands.empty()) {
+        return fmt::format("{}() {{\n    _arguments -s{}\n}}\n", FunctionOf(page), Arguments(page));
+    }
+    return fmt::format(R"({0}() {{
+    local state line
+    _arguments -C{1} \
+        '1: :->command' '*:: :->rest'
+    case $state in
+        command)
+            local -a commands=(
+{2}            )
+            _describe command commands ;;
+        rest) (( $+functions[{0}_$line[1]] )) && {0}_$line[1] ;;
+    esac
+}}
+)",
+                       FunctionOf(page), Arguments(page), CommandList(page));
+}
+
+}  // namespace
+
+std::string ZshCompletion(const CCommandPage& program) {
+    std::string text = "#compdef brindle\n";
+    for (const CCommandPage* const page : AllPages(program)) text += FunctionText(*page);
+    // As a file of the function path it is called at once, else it is told what it completes.
+    return text +
+           "if [ \"$funcstack[1]\" = _brindle ]; then\n    _brindle \"$@\"\nelse\n"
+           "    compdef _brindle brindle\nfi\n";
+}
+
+}  // namespace brindle::cli

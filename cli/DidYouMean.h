@@ -1,0 +1,19 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace brindle::cli {
+
+/// The word that somebody who typed `typed` most likely meant: one that it begins, or the one with
+/// the fewest letters wrong, missing, too many or exchanged, at most a third of them. Empty if none
+/// is near.
+[[nodiscard]] std::string NearestWord(std::string_view typed,
+                                      const std::vector<std::string>& words);
+
+/// ", did you mean WORD?", or nothing if no word is near.
+[[nodiscard]] std::string DidYouMean(std::string_view typed, const std::vector<std::string>& words);
+
+}  // namespace brindle::cli
