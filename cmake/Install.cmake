@@ -18,7 +18,8 @@ install(FILES ${PROJECT_BINARY_DIR}/BrindleConfig.cmake
         DESTINATION ${package_dir})
 
 # The data that the library finds by ResourceFolder().
-install(DIRECTORY "${PROJECT_SOURCE_DIR}/data/Chord Grids" DESTINATION ${CMAKE_INSTALL_DATADIR}/brindle)
+install(DIRECTORY "${PROJECT_SOURCE_DIR}/data/Chord Grids" DESTINATION ${CMAKE_INSTALL_DATADIR}/brindle
+        COMPONENT program)
 
 # A static library leaves its own libraries to the host's link line, a shared one brings them.
 get_target_property(library_type brindle TYPE)
