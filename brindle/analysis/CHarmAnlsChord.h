@@ -89,6 +89,7 @@ public:
     void AppendJSONClassSubstring(std::ostream& stream) const;
     void AppendJSONString(std::ostream& stream) const;
 
+    /// Reads a chord with length from a dictionary.
     struct JSONDeserializer_Helper {
         /// Reads what AppendJSONString wrote. A missing number reads as 0, not as undefined.
         [[nodiscard]] static CHarmAnlsChordWithLength CHarmAnlsChordWithLengthFromJSONDictionary(

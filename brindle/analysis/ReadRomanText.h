@@ -36,12 +36,14 @@ struct CRomanTextKey {
     double mPosition = 0.0;
 };
 
+/// A measure: its number in the text, and its place and length in quarter notes.
 struct CRomanTextBar {
     int mNumber = 0;
     double mPosition = 0.0;
     double mLength = 0.0;
 };
 
+/// A time signature that holds from a position on: 3 and 4 for 3/4.
 struct CRomanTextTime {
     int mBeats = 4;
     int mBeatValue = 4;

@@ -43,6 +43,7 @@ inline constexpr CKeywords kSus4Keywords("sus 4", "sus4", "sus", "s 4", "s4");
 inline constexpr CKeywords kMaj7Keywords("maj 7", "maj7", "ma 7", "ma7", "j 7", "j7");
 inline constexpr CKeywords kMaj9Keywords("maj 9", "maj9", "ma 9", "ma9", "j 9", "j9");
 
+/// The words of a basic chord.
 struct CBasicChordRow {
     CKeywords mKeywords;
     TBasicChord mBasicChord;
@@ -58,6 +59,7 @@ inline constexpr auto kBasicChordRows = std::to_array<CBasicChordRow>({
     {CKeywords("drone"), TBasicChord::Drone},
 });
 
+/// The words of an option and what it does to the tones of the chord, in semitones above the root.
 struct COptionRow {
     CKeywords mKeywords;
     TIntvls mAdd;

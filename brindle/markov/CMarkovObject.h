@@ -47,6 +47,7 @@ struct CMarkovObject {
 
     void AppendJSONString(std::ostream& stream) const;
 
+    /// Reads a symbol from a dictionary.
     struct JSONDeserialization_Helper {
         /// Reads what AppendJSONString wrote. Kept: gaps, and whatever is not known, become the
         /// undefined chord of length 1.0.

@@ -69,6 +69,7 @@ public:
     /// An array of the symbols in list order.
     void AppendJSONString(std::ostream& stream) const;
 
+    /// Reads the list from a dictionary.
     struct JSONDeserialization_Helper {
         /// Reads the array under "CMarkovObjects". Symbols that read as equal become one, so that
         /// the places behind them are one lower.

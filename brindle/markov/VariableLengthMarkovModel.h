@@ -180,6 +180,7 @@ public:
     void AppendJSONString(std::ostream& stream) const;
     void TransitionMapAppendToJSON(std::ostream& stream, CIteratorIndexConverter& converter) const;
 
+    /// Reads a model from a file.
     struct JSONDeserialization_Helper {
         /// False, and the model as it was, if the file cannot be read. What is no model file gives
         /// an empty model with N of 0.

@@ -9,6 +9,7 @@ namespace brindle {
 
 // How a tuplet is drawn: its bracket and the numbers and notes at it.
 
+/// A number at a tuplet, such as the 3 of a triplet.
 struct CMuxmlTupletNumber : CMuxmlFontAndColor {
     std::int32_t mTupletNumber = 0;
 
@@ -21,6 +22,7 @@ struct CMuxmlTupletNumber : CMuxmlFontAndColor {
     }
 };
 
+/// The note that is drawn at the number of a tuplet.
 struct CMuxmlTupletType : CMuxmlFontAndColor {
     TMuxmlEnum_NoteTypeValue mTupletType = TMuxmlEnum_NoteTypeValue_Quarter;
 
@@ -33,6 +35,7 @@ struct CMuxmlTupletType : CMuxmlFontAndColor {
     }
 };
 
+/// A dot behind that note.
 struct CMuxmlTupletDot : CMuxmlFontAndColor {
     void ReadFromFoundCharactersAndAttributes(std::string_view text,
                                               const CMuxmlAttributes& attributes);
@@ -55,15 +58,20 @@ struct CMuxmlTupletPortion {
     }
 };
 
+/// The sign over a tuplet: its bracket, its numbers and its notes.
 struct CMuxmlTuplet : CMuxmlXY {
+    /// Whether the sign starts or stops at this note.
     TMuxmlEnum_StartStop mType = TMuxmlEnum_StartStop_Undef;
+    /// Tells signs apart that overlap.
     std::int32_t mNumber = 0;
     TMuxmlEnum_YesNo mBracket = TMuxmlEnum_YesNo_No;
     TMuxmlEnum_ShowTuplet mShowNumber = TMuxmlEnum_ShowTuplet_Actual;
     TMuxmlEnum_ShowTuplet mShowTuplet = TMuxmlEnum_ShowTuplet_Actual;
     TMuxmlEnum_LineShape mLineShape = TMuxmlEnum_LineShape_Undef;
     TMuxmlEnum_AboveBelow mPlacement = TMuxmlEnum_AboveBelow_Above;
+    /// So many notes are played
     CMuxmlTupletPortion mTupletActual;
+    /// in the time of so many.
     CMuxmlTupletPortion mTupletNormal;
 
     void ReadFromAttributes(const CMuxmlAttributes& attributes);

@@ -16,7 +16,9 @@ enum class TChordEvery {
     Change,  ///< where the chord changes, at a beat
 };
 
+/// How the chords of a score are found in its notes.
 struct CChordsFromNotesOptions {
+    /// Where a chord may begin.
     TChordEvery mEvery = TChordEvery::Change;
     /// The key of the piece; it is found if it is undefined.
     CSignKeyLite mKey;

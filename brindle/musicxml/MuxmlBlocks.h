@@ -19,9 +19,13 @@ inline constexpr std::int32_t kMuxmlUndef = -2147483647;
 
 /// Where a sign is drawn, in tenths of the distance of staff lines.
 struct CMuxmlXY {
+    /// From the left of the measure.
     float mDefaultX = 0;
+    /// From the top line of the staff, up.
     float mDefaultY = 0;
+    /// From the default place to the right.
     float mRelativeX = 0;
+    /// From the default place up.
     float mRelativeY = 0;
 
     void ReadFromAttributes(const CMuxmlAttributes& attributes);
@@ -34,6 +38,7 @@ struct CMuxmlXY {
     }
 };
 
+/// A place and a colour.
 struct CMuxmlXYColor : CMuxmlXY {
     std::int32_t mColor = kMuxmlUndef;
 
@@ -45,9 +50,12 @@ struct CMuxmlXYColor : CMuxmlXY {
     }
 };
 
+/// The font of a text; a size of 0 is the usual one.
 struct CMuxmlFont {
+    /// Names of fonts, in the order of preference, between commas.
     std::string mFontFamily;
     TMuxmlEnum_FontStyle mFontStyle = TMuxmlEnum_FontStyle_Normal;
+    /// In points.
     float mFontSize = 0;
     TMuxmlEnum_FontWeight mFontWeight = TMuxmlEnum_FontWeight_Normal;
 
@@ -61,6 +69,7 @@ struct CMuxmlFont {
     }
 };
 
+/// A font and a colour.
 struct CMuxmlFontAndColor : CMuxmlFont {
     std::int32_t mColor = kMuxmlUndef;
 
@@ -72,6 +81,7 @@ struct CMuxmlFontAndColor : CMuxmlFont {
     }
 };
 
+/// The line of a sign: its shape, and how it is dashed, in tenths of the distance of staff lines.
 struct CMuxmlLine {
     TMuxmlEnum_LineShape mLineShape = TMuxmlEnum_LineShape_Undef;
     TMuxmlEnum_LineType mLineType = TMuxmlEnum_LineType_Solid;

@@ -9,6 +9,7 @@ namespace brindle {
 
 // What is drawn at a note besides its head. `mExists` tells whether the sign is there.
 
+/// The accidental that is printed before a note, whatever the note sounds.
 struct CMuxmlAccidental : CMuxmlXYColor, CMuxmlFont {
     bool mExists = false;
     TMuxmlEnum_Accidental mValue = TMuxmlEnum_Accidental_Undef;
@@ -73,6 +74,7 @@ struct CMuxmlTimeModification {
     }
 };
 
+/// A fermata: the note is held as long as the player likes.
 struct CMuxmlFermata : CMuxmlXYColor, CMuxmlFont {
     bool mExists = false;
     TMuxmlEnum_AboveBelow mPlacement = TMuxmlEnum_AboveBelow_Above;
@@ -93,6 +95,7 @@ struct CMuxmlFermata : CMuxmlXYColor, CMuxmlFont {
     }
 };
 
+/// The stem of a note and the way it points.
 struct CMuxmlStem : CMuxmlXYColor {
     bool mExists = false;
     TMuxmlEnum_Stem mValue = TMuxmlEnum_Stem_None;

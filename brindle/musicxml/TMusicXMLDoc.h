@@ -29,6 +29,7 @@ inline constexpr std::size_t kMaxPlayedMeasures = 100'000;
 inline constexpr std::size_t kMinPlayedBytes = std::size_t{16} << 20;
 inline constexpr std::size_t kMaxPlayedBytes = std::size_t{256} << 20;
 
+/// A time signature that holds from a position in quarter notes on.
 struct TMusicXMLTimeSignature {
     double mPosition = kPosUndef;
     std::int32_t mNumerator = 4;

@@ -33,6 +33,7 @@ struct CImportedEvent {
     std::optional<int> mMidiChannel;
 };
 
+/// Where a measure begins, and its number as it is printed.
 struct CImportedMeasure {
     std::int32_t mPosition = 0;
     std::string mNumber;
@@ -45,6 +46,8 @@ struct CImportedInstrument {
     std::optional<int> mUnpitchedKey;  ///< of all notes without a pitch
 };
 
+/// A part of a score: its name, how MIDI plays it, and all that happens in it, in the order of the
+/// file.
 struct CImportedPart {
     std::string mID;
     std::string mName;

@@ -22,12 +22,15 @@ enum TSheetPage : std::uint8_t {
     TSheetPage_A4,       ///< 210 by 297 mm
 };
 
+/// How a lead sheet is laid out and coloured.
 struct CLeadSheetOptions {
     /// 1 to 16. A line has fewer where they don't fit.
     int mBarsPerLine = 4;
     /// Of an endless page, 200 to 4000 pixels. A narrow page has fewer bars a line.
     double mWidth = 800.0;
+    /// An endless page, or paper.
     TSheetPage mPage = TSheetPage_Endless;
+    /// The colours of paper and ink.
     TSheetTheme mTheme = TSheetTheme_Auto;
 };
 

@@ -32,18 +32,21 @@ struct CMidiTempo {
     double mQuartersPerMinute = 120.0;
 };
 
+/// A time signature that holds from a tick on.
 struct CMidiTimeSignature {
     std::int64_t mTick = 0;
     int mNumerator = 4;    ///< 1 to 255
     int mDenominator = 4;  ///< rounded down to a power of two
 };
 
+/// A key signature that holds from a tick on.
 struct CMidiKeySignature {
     std::int64_t mTick = 0;
     int mSharps = 0;  ///< -7 (flats) to 7
     bool mIsMinor = false;
 };
 
+/// A track: its name, which instruments play it, and its notes.
 struct CMidiTrack {
     std::string mName;
     std::vector<CMidiProgram> mPrograms;

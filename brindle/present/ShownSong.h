@@ -51,6 +51,7 @@ struct CShownCenter {
     std::vector<CShownChord> mChords;
 };
 
+/// A key signature from its place on, with the centers that are heard under it.
 struct CShownSignKey {
     std::string mName;
     CSignKeyLite mSignKey;
@@ -85,6 +86,7 @@ struct CShownNumeral {
     std::string mNumeral;
 };
 
+/// A stretch of a song in one key, with its chords.
 struct CShownKeyRegion {
     CSignKeyLite mKey;
     std::string mName;

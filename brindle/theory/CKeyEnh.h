@@ -70,6 +70,7 @@ struct CKeyEnh {
     /// Writes `{"KeyNr":" 7","Enh":"neutral"}`, the number two places wide.
     void AppendJSONString(std::ostream& stream) const;
 
+    /// The names of its members in JSON, and the reader of them.
     struct JSONDeserializer_Helper {
         static constexpr const char* CKeyEnhJSONKey_CKeyEnh = "CKeyEnh";
         static constexpr const char* CKeyEnhJSONKey_KeyNr = "KeyNr";

@@ -20,6 +20,7 @@ enum TWrapAtOctave : std::int32_t {
     TWrapAtOctave_No = 1,
 };
 
+/// To which side semitones move, and whether they stay within the octave.
 struct TQuantizeSemitonesOptions {
     TQuantizeDirection mDirection = TQuantizeDirection_ClosestTieRight;
     TWrapAtOctave mWrapAtOctave = TWrapAtOctave_Yes;
