@@ -1,0 +1,199 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/guitarchords/internal/FingeringSearch.h"
+
+#include "brindle/guitarchords/internal/FingeringCost.h"
+#include "brindle/guitarchords/internal/HandOf.h"
+#include "brindle/theory/KeyIntervals.h"
+
+#include <algorithm>
+#include <array>
+#include <bit>
+#include <cstddef>
+
+namespace brindle {
+namespace {
+
+constexpr int kMostSpan = 7;
+constexpr int kUpTheNeck = 7;
+constexpr int kFewestSounding = 3;
+constexpr int kEffortOfStep = 60;
+constexpr int kHardest = 9;
+// A guitar needs some thousands in a position; 12 strings have millions of ways.
+constexpr int kMostStepsInPosition = 40'000;
+// Only the best of so many are kept, which bounds the memory.
+constexpr std::size_t kMostKept = 4096;
+
+/// What can be done with a string in a position: at most each fret under the hand, open, muted.
+struct CStringWays {
+    std::array<std::int8_t, kMostSpan + 2> mFrets{};
+    int mCount = 0;
+
+    void Add(int fret) {
+        mFrets[static_cast<std::size_t>(mCount++)] = static_cast<std::int8_t>(fret);
+    }
+};
+
+/// What is known of a shape on its way from string to string.
+struct CShapeState {
+    std::uint32_t mKeys = 0;
+    int mSounding = 0;
+    /// Muted strings since the last one that sounds, and of these those that lie inside.
+    int mMutes = 0;
+    int mInnerMutes = 0;
+    /// Fewest fingers that hold it.
+    int mFingers = 0;
+    int mLastFret = kMutedString;
+    bool mHasLowest = false;
+    /// A barre at the lowest fret may go on.
+    bool mBarreIsOpen = false;
+};
+
+class CFingeringSearch {
+public:
+    explicit CFingeringSearch(const CFingeringTask& task) : mTask(task) {
+        const int highest = std::clamp(task.mOptions.mHighestFret, 1, kFingeringMostFrets);
+        mHighestFret = std::max(1, highest - task.mCapo);
+        const int tones = std::popcount(task.mNeededKeys);
+        mFewestSounding = std::min(kFewestSounding, std::max(tones, 2));
+    }
+
+    std::vector<CFingering> Find() {
+        for (int position = 0; position <= mHighestFret; ++position) FindInPosition(position);
+        return std::move(mFound);
+    }
+
+private:
+    /// Position 0 has open strings only.
+    void FindInPosition(int position) {
+        mPosition = position;
+        mSteps = 0;
+        const CFingeringOptions& options = mTask.mOptions;
+        const int span = std::clamp(position >= kUpTheNeck ? options.mSpanUpTheNeck : options.mSpan,
+                                    2, kMostSpan);
+        const int last = std::min(mHighestFret, position + span - 1);
+        for (int string = 0; string < mTask.mStrings; ++string) {
+            CStringWays& ways = mWays[static_cast<std::size_t>(string)];
+            ways.mCount = 0;
+            for (int fret = position; fret <= last && position > 0; ++fret) {
+                if (mTask.Allows(string, fret)) ways.Add(fret);
+            }
+            if (mTask.Allows(string, 0)) ways.Add(0);
+            if ((options.mMutable >> string & 1U) != 0) ways.Add(kMutedString);
+        }
+        mLastLowest = LastStringAt(position);
+        if (position == 0 || mLastLowest >= 0) GoOn(0, {});
+    }
+
+    /// The last string that can be pressed at the fret; -1 for none.
+    [[nodiscard]] int LastStringAt(int fret) const {
+        int string = mTask.mStrings - 1;
+        while (string >= 0 && !mTask.Allows(string, fret)) --string;
+        return string;
+    }
+
+    void GoOn(int string, const CShapeState& state) {
+        if (++mSteps > kMostStepsInPosition) return;
+        if (string == mTask.mStrings) {
+            Keep(state);
+            return;
+        }
+        const CStringWays& ways = mWays[static_cast<std::size_t>(string)];
+        for (int i = 0; i < ways.mCount; ++i) {
+            const int fret = ways.mFrets[static_cast<std::size_t>(i)];
+            CShapeState next = state;
+            Take(string, fret, next);
+            if (mPosition > 0 && !next.mHasLowest && string >= mLastLowest) continue;
+            if (!CanBecomeChord(next, mTask.mStrings - string - 1)) continue;
+            mFrets[static_cast<std::size_t>(string)] = static_cast<std::int8_t>(fret);
+            GoOn(string + 1, next);
+        }
+    }
+
+    void Take(int string, int fret, CShapeState& state) const {
+        if (fret > 0 && IsNewFinger(fret, state)) ++state.mFingers;
+        if (fret == mPosition && fret > 0) state.mHasLowest = state.mBarreIsOpen = true;
+        if (fret <= 0) state.mBarreIsOpen = false;
+        state.mLastFret = fret;
+        if (fret == kMutedString) {
+            if (state.mSounding > 0) ++state.mMutes;
+            return;
+        }
+        state.mInnerMutes += state.mMutes;
+        state.mMutes = 0;
+        ++state.mSounding;
+        state.mKeys |= 1U << mTask.KeyAt(string, fret);
+    }
+
+    [[nodiscard]] bool IsNewFinger(int fret, const CShapeState& state) const {
+        return fret == mPosition ? !state.mBarreIsOpen : fret != state.mLastFret;
+    }
+
+    [[nodiscard]] bool CanBecomeChord(const CShapeState& state, int stringsLeft) const {
+        return state.mFingers <= kHandFingers &&
+               state.mInnerMutes <= mTask.mOptions.mMostInnerMutes &&
+               state.mSounding + stringsLeft >= mFewestSounding &&
+               std::popcount(mTask.mNeededKeys & ~state.mKeys) <= stringsLeft;
+    }
+
+    void Keep(const CShapeState& state) {
+        const std::span<const std::int8_t> frets(mFrets.data(),
+                                                 static_cast<std::size_t>(mTask.mStrings));
+        CFingering fingering;
+        fingering.mTuning = mTask.mTuning;
+        fingering.mCapo = mTask.mCapo;
+        fingering.mStringCount = mTask.mStrings;
+        std::copy(frets.begin(), frets.end(), fingering.mFrets.begin());
+        if (!SetSound(fingering, state.mKeys)) return;
+        const auto hand = HandOf(frets);
+        if (!hand) return;
+        fingering.mFingers = hand->mPlaces;
+        fingering.mFingerCount = hand->mCount;
+        fingering.mDifficulty = std::min(kHardest, hand->mEffort / kEffortOfStep);
+        fingering.mCost = CostOfFingering(fingering, mTask, hand->mEffort);
+        mFound.push_back(fingering);
+        if (mFound.size() == 2 * kMostKept) KeepBest();
+    }
+
+    /// False when the lowest note or a pitch is not what it has to be.
+    bool SetSound(CFingering& fingering, std::uint32_t keys) const {
+        int lowest = kHighestMidi + 1;
+        for (int string = 0; string < mTask.mStrings; ++string) {
+            const int pitch = fingering.Pitch(string);
+            if (pitch > kHighestMidi) return false;
+            if (pitch >= 0) lowest = std::min(lowest, pitch);
+        }
+        fingering.mBassIsLowest = lowest % 12 == mTask.mBass;
+        for (int tone = 0; tone < 12; ++tone) {
+            const bool isMissing = (keys >> (mTask.mRoot + tone) % 12 & 1U) == 0;
+            if (isMissing && mTask.mSemitones.HasIntvl(tone)) fingering.mOmitted.AddIntvl(tone);
+        }
+        return fingering.mBassIsLowest || !mTask.mBassIsRequired;
+    }
+
+    void KeepBest() {
+        const auto end = mFound.begin() + kMostKept;
+        std::nth_element(mFound.begin(), end, mFound.end(),
+                         [](const CFingering& a, const CFingering& b) {
+                             return a.mCost != b.mCost ? a.mCost < b.mCost : a.mFrets < b.mFrets;
+                         });
+        mFound.erase(end, mFound.end());
+    }
+
+    const CFingeringTask& mTask;
+    int mHighestFret = 0;
+    int mFewestSounding = 0;
+    int mPosition = 0;
+    int mLastLowest = 0;
+    int mSteps = 0;
+    std::array<CStringWays, kFingeringMostStrings> mWays{};
+    std::array<std::int8_t, kGChMaxStrings> mFrets{};
+    std::vector<CFingering> mFound;
+};
+
+}  // namespace
+
+std::vector<CFingering> SearchFingerings(const CFingeringTask& task) {
+    return CFingeringSearch(task).Find();
+}
+
+}  // namespace brindle

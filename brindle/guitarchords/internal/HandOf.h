@@ -1,0 +1,29 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/guitarchords/CFingering.h"
+
+#include <array>
+#include <cstdint>
+#include <optional>
+#include <span>
+
+namespace brindle {
+
+/// The fingers that hold some frets.
+struct CHand {
+    std::array<CFingerPlace, kHandFingers> mPlaces{};
+    int mCount = 0;
+    /// How hard it is to hold: about 60 make a step of difficulty.
+    int mEffort = 0;
+};
+
+/// The easiest way to hold frets (of each string: kMutedString, 0 open, from 1 pressed); nothing if
+/// four fingers cannot.
+///
+/// A barre of the index finger lies at the lowest fret, and other fingers may be put down on its
+/// strings further up; a barre of another finger covers neighbouring strings of one fret. Each such
+/// row of strings is tried as a barre and as single fingers.
+[[nodiscard]] std::optional<CHand> HandOf(std::span<const std::int8_t> frets);
+
+}  // namespace brindle
