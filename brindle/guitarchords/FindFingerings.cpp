@@ -3,6 +3,7 @@
 
 #include "brindle/guitarchords/NameFingering.h"
 #include "brindle/guitarchords/internal/FingeringSearch.h"
+#include "brindle/guitarchords/internal/HandOf.h"
 #include "brindle/theory/KeyIntervals.h"
 
 #include <algorithm>
@@ -79,6 +80,26 @@ std::vector<CFingering> FindFingerings(const CChordLite& chord, const GChShortTu
     std::sort(found.begin(), found.end(), IsBetter);
     found.resize(limit);
     return found;
+}
+
+std::optional<CFingering> FingeringOfFrets(std::span<const int> frets, const GChShortTuning& tuning,
+                                           int capo) {
+    const int strings = GChNumberOfStringsInShortTuning(tuning);
+    if (static_cast<int>(frets.size()) != strings || strings == 0) return std::nullopt;
+    CFingering fingering;
+    fingering.mTuning = tuning;
+    fingering.mCapo = capo;
+    fingering.mStringCount = strings;
+    for (std::size_t i = 0; i < frets.size(); ++i) {
+        const int fret = std::clamp(frets[i], kMutedString, kGChFrets);
+        fingering.mFrets[i] = static_cast<std::int8_t>(fret);
+    }
+    const auto hand = HandOf(fingering.Frets());
+    if (!hand) return std::nullopt;
+    fingering.mFingers = hand->mPlaces;
+    fingering.mFingerCount = hand->mCount;
+    fingering.mDifficulty = DifficultyOf(*hand);
+    return fingering;
 }
 
 }  // namespace brindle

@@ -6,6 +6,8 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <optional>
+#include <span>
 #include <vector>
 
 namespace brindle {
@@ -61,6 +63,12 @@ struct CFingeringOptions {
 [[nodiscard]] std::vector<CFingering> FindFingerings(const CChordLite& chord,
                                                      const GChShortTuning& tuning,
                                                      const CFingeringOptions& options = {});
+
+/// How one hand holds frets (of each string: kMutedString, 0 open, from 1 pressed), with its
+/// fingers and difficulty; nothing if it cannot, or if the tuning has another number of strings.
+[[nodiscard]] std::optional<CFingering> FingeringOfFrets(std::span<const int> frets,
+                                                         const GChShortTuning& tuning,
+                                                         int capo = 0);
 
 /// The tones of a chord that players leave out: the perfect fifth of a chord of four tones and
 /// more, the ninth and eleventh below a thirteenth, the eleventh above a major third, and of a

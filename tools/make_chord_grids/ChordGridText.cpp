@@ -1,10 +1,11 @@
 // SPDX-License-Identifier: MIT
 #include "tools/make_chord_grids/ChordGridText.h"
 
-#include "brindle/chords/CChordLite.h"
+#include "brindle/chords/ReadChordText.h"
+#include "brindle/chords/WriteChordSymbol.h"
+#include "brindle/guitarchords/FindFingerings.h"
 #include "brindle/guitarchords/GChChordTypes.h"
 #include "brindle/guitarchords/GChDatabase.h"
-#include "brindle/theory/CChordNamePrefs.h"
 
 #include <algorithm>
 #include <array>
@@ -19,6 +20,8 @@ namespace {
 
 constexpr int kStrings = 6;
 constexpr int kMuted = -1;
+constexpr int kLastFret = 12;
+constexpr int kMostDifficultyInFile = 7;
 
 /// A finger that lies on several strings, these counted from 0.
 struct CBarre {
@@ -39,13 +42,18 @@ struct CGridLine {
 struct CChordFacts {
     int mRoot = 0;
     int mType = 0;
+    int mBass = -1;  // none
+    std::string mUserName;
 };
 
 std::optional<CChordFacts> FactsOf(const std::string& symbol) {
-    const CChordLite chord(symbol, CChordNamePrefs());
+    const CChordLite chord = ReadChordText(symbol).mChord;
     const CChordTypeId type = GChChordTypeIdForSemitones(chord.mSemitones);
-    if (chord.IsUndef() || type == 0) return std::nullopt;
-    return CChordFacts{chord.mRootKeyEnh.mKeyNr, type};
+    if (chord.IsUndef()) return std::nullopt;
+    const int bass = chord.IsSlashChord() ? chord.mBassKeyEnh.mKeyNr : -1;
+    // A chord of none of the built-in types, as C5, is kept by its name.
+    const std::string name = type == 0 ? ChordSymbolSuffix(chord.mSemitones) : std::string();
+    return CChordFacts{chord.mRootKeyEnh.mKeyNr, type, bass, name};
 }
 
 /// One digit or "x" for each string.
@@ -84,10 +92,19 @@ std::optional<CGridLine> ReadGridLine(std::istringstream& words) {
     return line;
 }
 
+/// The frets of a line some frets up the neck.
+std::vector<int> FretsOf(const CGridLine& line, int shift) {
+    std::vector<int> frets(line.mFrets.begin(), line.mFrets.end());
+    for (int& fret : frets) fret += fret > 0 ? shift : 0;
+    return frets;
+}
+
 std::shared_ptr<GChBasicChord> ChordOf(const CGridLine& line, const CChordFacts& facts, int shift) {
     auto chord = std::make_shared<GChBasicChord>(kGChStandardGuitar);
     chord->setRootNote((facts.mRoot + shift) % 12);
     chord->setChordType(facts.mType);
+    chord->setUserName(facts.mUserName);
+    if (facts.mBass >= 0) chord->setBassNote((facts.mBass + shift) % 12);
     std::array<bool, kStrings> isHeld{};
     for (const CBarre& barre : line.mBarres) {
         const auto at = static_cast<std::size_t>(barre.mMinString);
@@ -105,7 +122,42 @@ std::shared_ptr<GChBasicChord> ChordOf(const CGridLine& line, const CChordFacts&
         if (line.mFrets[i] <= 0 || isHeld[i]) continue;
         chord->addChordElem(nullptr, line.mFingers[i], line.mFrets[i] + shift - 1, string);
     }
+    if (const auto hand = FingeringOfFrets(FretsOf(line, shift), kGChStandardGuitar)) {
+        chord->setDifficultyLevel(std::min(hand->mDifficulty, kMostDifficultyInFile));
+    }
     return chord;
+}
+
+int HighestFret(const GChBasicChord& chord) {
+    int highest = 0;
+    for (const GChChordElem& elem : chord.chordElems()) {
+        highest = std::max(highest, elem.absFretIndex() + 1);
+    }
+    return highest;
+}
+
+bool IsSameChord(const GChBasicChord& a, const GChBasicChord& b) {
+    return a.rootNote() == b.rootNote() && a.chordType() == b.chordType() &&
+           a.bassNote() == b.bassNote() && a.userName() == b.userName();
+}
+
+/// Takes out what lies above the last comfortable fret where the chord is there below it.
+void DropHighGrids(const GChTuning& tuning) {
+    std::vector<std::shared_ptr<GChBasicChord>> low;
+    for (const auto& library : tuning.tuningLibraries()) {
+        for (const auto& chord : library->basicChords()) {
+            if (HighestFret(*chord) <= kLastFret) low.push_back(chord);
+        }
+    }
+    for (const auto& library : tuning.tuningLibraries()) {
+        const auto chords = library->basicChords();
+        for (const auto& chord : chords) {
+            const bool isElsewhere = std::any_of(low.begin(), low.end(), [&](const auto& other) {
+                return IsSameChord(*chord, *other);
+            });
+            if (HighestFret(*chord) > kLastFret && isElsewhere) library->deleteChordRange(chord);
+        }
+    }
 }
 
 }  // namespace
@@ -138,6 +190,7 @@ std::shared_ptr<GChTuning> ReadChordGrids(std::string_view text, std::string& fa
         }
         for (int i = 0; i < places; ++i) library->addBasicChord(ChordOf(*grid, *facts, i));
     }
+    DropHighGrids(*tuning);
     return tuning;
 }
 

@@ -16,8 +16,6 @@ namespace {
 constexpr int kMostSpan = 7;
 constexpr int kUpTheNeck = 7;
 constexpr int kFewestSounding = 3;
-constexpr int kEffortOfStep = 60;
-constexpr int kHardest = 9;
 // A guitar needs some thousands in a position; 12 strings have millions of ways.
 constexpr int kMostStepsInPosition = 40'000;
 // Only the best of so many are kept, which bounds the memory.
@@ -148,7 +146,7 @@ private:
         if (!hand) return;
         fingering.mFingers = hand->mPlaces;
         fingering.mFingerCount = hand->mCount;
-        fingering.mDifficulty = std::min(kHardest, hand->mEffort / kEffortOfStep);
+        fingering.mDifficulty = DifficultyOf(*hand);
         fingering.mCost = CostOfFingering(fingering, mTask, hand->mEffort);
         mFound.push_back(fingering);
         if (mFound.size() == 2 * kMostKept) KeepBest();

@@ -167,7 +167,14 @@ int EffortOf(const CHand& hand, std::span<const std::int8_t> frets) {
     return effort;
 }
 
+constexpr int kEffortOfStep = 60;
+constexpr int kHardest = 9;
+
 }  // namespace
+
+int DifficultyOf(const CHand& hand) {
+    return std::min(kHardest, hand.mEffort / kEffortOfStep);
+}
 
 std::optional<CHand> HandOf(std::span<const std::int8_t> frets) {
     const int lowest = LowestFret(frets);

@@ -18,6 +18,9 @@ struct CHand {
     int mEffort = 0;
 };
 
+/// 0 to 9.
+[[nodiscard]] int DifficultyOf(const CHand& hand);
+
 /// The easiest way to hold frets (of each string: kMutedString, 0 open, from 1 pressed); nothing if
 /// four fingers cannot.
 ///
