@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "cli/ChordTextOptions.h"
 #include "cli/CommandLine.h"
-#include "cli/GridDatabase.h"
 #include "cli/KeyText.h"
 #include "cli/LeadSheet.h"
 #include "cli/SheetPicture.h"
@@ -19,6 +18,7 @@
 #include "brindle/present/MakeSongKeys.h"
 #include "brindle/present/ReadingText.h"
 #include "brindle/present/ShownNames.h"
+#include "brindle/present/SongGrids.h"
 #include "brindle/song/ReadSongHarmony.h"
 #include "brindle/song/SheetTimes.h"
 
@@ -123,10 +123,21 @@ CShownKeys KeysOf(const CAnalysedSong& analysed, const CNumeralOptions& numerals
                         {.mBeatsPerBar = beatsPerBar}, numerals);
 }
 
-std::string Picture(const CShownSong& song, bool withGrids) {
-    const auto database = withGrids ? ReadGrids("") : nullptr;
-    if (database == nullptr) return AnalysisSvg(song);
-    const TChordGrids grids = GridsOfSong(*database, song);
+/// The fingerings of a guitar that are near each other, for each symbol.
+TChordGrids GridsOf(const CAnalysedSong& analysed) {
+    std::vector<CChordLite> chords;
+    std::vector<std::string> symbols;
+    for (const CHarmAnlsChordWithPos& chord : analysed.mAnalyse.mChords) {
+        chords.push_back(chord);
+        symbols.push_back(analysed.mSymbols->SymbolOf(chord));
+    }
+    const CSongFingerings fingerings[] = {ChooseFingerings(chords, kGChStandardGuitar)};
+    return GridsBySymbol(MakeSongGrids(chords, symbols, fingerings));
+}
+
+std::string Picture(const CAnalysedSong& analysed, const CShownSong& song, bool withGrids) {
+    if (!withGrids) return AnalysisSvg(song);
+    const TChordGrids grids = GridsOf(analysed);
     return AnalysisSvg(song, &grids);
 }
 
@@ -174,7 +185,7 @@ std::string Present(const CAnalysedSong& analysed, const CAnalyseOptions& option
         case TFormat::Svg: {
             CShownSong song = SongOf(analysed, options);
             song.mCopies = MakeSongCopies(analysed.mAnalyse, *analysed.mSymbols);
-            return Picture(song, options.mGrids);
+            return Picture(analysed, song, options.mGrids);
         }
         case TFormat::Text:
         case TFormat::Chords:

@@ -1,13 +1,13 @@
 // SPDX-License-Identifier: MIT
 #include "cli/CommandLine.h"
 #include "cli/GridDatabase.h"
+#include "cli/GridOptions.h"
 #include "cli/Input.h"
 #include "cli/TypedChords.h"
 
 #include "brindle/present/GridsJson.h"
 #include "brindle/present/GridsSvg.h"
 #include "brindle/present/GridsText.h"
-#include "brindle/present/ShownNames.h"
 
 #include <fmt/format.h>
 
@@ -24,9 +24,15 @@ constexpr CCommandHelp kGridHelp{
     "  brindle grid x-10-12-12-11-10 --capo 2\n"
     "  brindle grid 000232 --tuning DADGAD\n"
     "  brindle grid Am7 F --format svg >grids.svg\n"
+    "  brindle grid C13 --find --most 3 --dots intervals\n"
+    "  brindle grid G7 --tuning ukulele --left\n"
     "\n"
     "A fingering has a fret for each string from the lowest one; x is a muted string,\n"
-    "0 an open one. Frets of two digits need a - between the strings.\n",
+    "0 an open one. Frets of two digits need a - between the strings. A chord is looked\n"
+    "up in the package; where that has none, and with --find, fingerings are searched.\n"
+    "Tunings are standard, drop-d, dadgad, open-g, open-d, half-step-down, 7-string,\n"
+    "bass, ukulele, ukulele-low-g, baritone-ukulele, mandolin, banjo, cavaquinho and\n"
+    "some more, or any list of notes.\n",
 };
 
 constexpr int kMostCapo = 24;
@@ -36,6 +42,8 @@ struct CGridOptions {
     std::string mTuning = "EADGBE";
     int mCapo = 0;
     std::string mPackage;
+    bool mIsFound = false;
+    CFingeringOptionsOfUser mFingering;
     CTypedChords mReading;
     CFormatOptions mFormat;
 };
@@ -63,8 +71,6 @@ public:
         : mOptions(options), mTuning(tuning) {}
 
     TGrids GridsOf(const std::string& word) {
-        if (mDatabase == nullptr) mDatabase = ReadGrids(mOptions.mPackage);
-        if (mDatabase == nullptr) return TStatus::BadInput;
         const std::string symbol = Printable(word);
         const bool beginsAsFrets = word.find_first_of("0123456789") == 0;
         const auto chord = beginsAsFrets ? CChordLite() : mOptions.mReading.ReadSymbol(word);
@@ -72,7 +78,15 @@ public:
         if (chord->IsUndef()) {
             return Fail(TStatus::BadInput, symbol + " is neither a fingering nor a chord symbol");
         }
-        auto grids = FindGrids(*mDatabase, symbol, *chord, mTuning, mOptions.mCapo);
+        CFingeringOptions fingering = mOptions.mFingering.Options();
+        fingering.mCapo = mOptions.mCapo;
+        if (!mOptions.mIsFound && mDatabase == nullptr) {
+            mDatabase = ReadGrids(mOptions.mPackage);
+            if (mDatabase == nullptr) return TStatus::BadInput;
+        }
+        auto grids = mOptions.mIsFound
+                         ? FoundGrids(symbol, *chord, mTuning, fingering)
+                         : GridsForChord(*mDatabase, symbol, *chord, mTuning, fingering);
         if (!grids.empty()) return grids;
         return Fail(TStatus::BadInput,
                     fmt::format("no fingering of {} for {}", symbol, TuningText(mTuning)));
@@ -85,18 +99,18 @@ private:
 };
 
 TStatus Present(const std::vector<CChordGrid>& grids, const CGridOptions& options) {
+    const CGridStyle style = options.mFingering.Style();
     if (options.mFormat.Format() == TFormat::Json) return Print(GridsJson(grids));
-    if (options.mFormat.Format() == TFormat::Text) return Print(GridsText(grids, PaintOfOutput()));
-    return Print(GridsSvg(grids, Printable(fmt::format("{}", fmt::join(options.mWords, " ")))));
+    if (options.mFormat.Format() == TFormat::Text) {
+        return Print(GridsText(grids, PaintOfOutput(), style));
+    }
+    return Print(
+        GridsSvg(grids, Printable(fmt::format("{}", fmt::join(options.mWords, " "))), style));
 }
 
 TStatus Grid(const CGridOptions& options) {
-    const auto tuning = ReadTuning(options.mTuning);
-    if (!tuning) {
-        return Fail(TStatus::BadUsage, Printable(options.mTuning) +
-                                           " is no tuning: letters from the lowest string, as in "
-                                           "DADGAD, or pitches, as in E2A2D3G3B3E4");
-    }
+    const auto tuning = ReadTuningOption(options.mTuning);
+    if (!tuning) return TStatus::BadUsage;
     auto words = options.mWords;
     if (IsStandardInput(words)) {
         const auto text = ReadInput("-");
@@ -105,14 +119,20 @@ TStatus Grid(const CGridOptions& options) {
     }
     CLookUp lookUp(options, *tuning);
     std::vector<CChordGrid> grids;
+    auto status = TStatus::Success;
     for (const std::string& word : words) {
         const auto frets = ReadFrets(word);
         TGrids found =
             frets ? GridsOfFrets(word, *frets, *tuning, options.mCapo) : lookUp.GridsOf(word);
-        if (found.index() == 0) return std::get<0>(found);
+        if (found.index() == 0) {
+            status = std::get<0>(found);
+            continue;
+        }
         for (CChordGrid& grid : std::get<1>(found)) grids.push_back(std::move(grid));
     }
-    return Present(grids, options);
+    if (grids.empty() && status != TStatus::Success) return status;
+    const TStatus shown = Present(grids, options);
+    return status == TStatus::Success ? shown : status;
 }
 
 }  // namespace
@@ -123,10 +143,13 @@ void AddGrid(CCommand& program) {
     command
         .AddArgument("GRID", options->mWords, "Fingerings or chord symbols; - reads standard input")
         .Required();
-    command.AddOption("--tuning", "TUNING", options->mTuning, "Open strings (default: EADGBE)");
+    command.AddOption("--tuning", "TUNING", options->mTuning,
+                      "Name or open strings (default: EADGBE)");
     command.AddOption("--capo", "N", options->mCapo, "Fret of the capodaster (default: 0)")
         .InRange(0, kMostCapo);
     command.AddOption("--package", "PATH", options->mPackage, "Package to look chords up in");
+    command.AddFlag("--find", options->mIsFound, "Search fingerings rather than look them up");
+    options->mFingering.AddTo(command);
     options->mReading.AddTo(command);
     options->mFormat.AddTo(command, {"text", "json", "svg"});
     command.OnCall([options] { return Grid(*options); });

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "cli/CommandLine.h"
 #include "cli/GridDatabase.h"
+#include "cli/GridsFor.h"
 #include "cli/Input.h"
 #include "cli/Json.h"
 
@@ -20,11 +21,12 @@ namespace {
 
 constexpr CCommandHelp kGridPackagesHelp{
     "grids",
-    "List, show, export and import packages of guitar fingerings",
+    "List, show, export and import packages of fingerings, or choose those of a song",
     "  brindle grids list\n"
     "  brindle grids show my.gchdb --format svg >grids.svg\n"
     "  brindle grids export my.gchdb >grids.json\n"
     "  brindle grids import my.gchdb <grids.json\n"
+    "  brindle grids for \"Bb F | Gm Eb\"\n"
     "\n"
     "A package is a folder with one file for each library. Without a PATH it is the\n"
     "package that comes with the program, together with the user's own.\n",
@@ -147,6 +149,7 @@ void AddGrids(CCommand& program) {
     importing.Option("PATH").Required();
     importing.AddOption("--from", "FILE", importOptions->mFile,
                         "The JSON (default: standard input)");
+    AddGridsFor(command);
 }
 
 }  // namespace brindle::cli

@@ -1,19 +1,25 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/present/ChordGrid.h"
 
+#include "brindle/chords/CChordTypes.h"
+#include "brindle/chords/WriteChordSymbol.h"
 #include "brindle/guitarchords/GChChordDescr.h"
 #include "brindle/guitarchords/GChHarmonyStrings.h"
 #include "brindle/guitarchords/GChLibrary.h"
 #include "brindle/guitarchords/GChPitches.h"
 #include "brindle/guitarchords/GChTuningDescr.h"
+#include "brindle/guitarchords/LookUpChord.h"
 #include "brindle/guitarchords/NameFingering.h"
+#include "brindle/guitarchords/Tunings.h"
 #include "brindle/present/ShownText.h"
 #include "brindle/theory/KeyIntervals.h"
 #include "brindle/theory/KeyNames.h"
+#include "brindle/theory/MakeSensefulEnh.h"
 
 #include <fmt/format.h>
 
 #include <algorithm>
+#include <array>
 
 namespace brindle {
 namespace {
@@ -76,12 +82,6 @@ std::vector<int> PitchesOfKeys(const std::vector<int>& keyNrs) {
     return pitches;
 }
 
-std::string AsciiName(std::optional<std::string> name) {
-    std::string text = std::move(name).value_or("");
-    ConvertUtf8SharpAndFlatToAscii(text);
-    return text;
-}
-
 /// Names what the strings sound. Other names are those of whole chords that are nearly as likely.
 void SetNames(CChordGrid& grid) {
     constexpr int kNearlyAsLikely = 12;
@@ -94,6 +94,37 @@ void SetNames(CChordGrid& grid) {
         const bool isNear = names[i].mCost <= names.front().mCost + kNearlyAsLikely;
         if (isWhole && isNear) grid.mOtherNames.push_back(names[i].mSymbol);
     }
+}
+
+/// What a library says that its fingering is, as people type it.
+std::string StoredName(const GChChord& chord, int root, int capo) {
+    const CKeyEnh rootKey{root, MakeSensefulEnhForKeyNrAssumingCMajor(root, TEnh_Undef)};
+    if (root < 0) return Printable(chord.chordName(capo));
+    if (!chord.userName().empty()) return WriteNoteName(rootKey) + Printable(chord.userName());
+    const CChordTypes& types = _s_chordTypes();
+    const auto type = types.ChordTypeBuiltInFromId(chord.chordType());
+    if (type == types.BuiltIn().end()) return Printable(chord.chordName(capo));
+    const int bass = chord.bassNote(capo);
+    CKeyEnh bassKey;
+    if (bass >= 0) bassKey = {bass, MakeSensefulEnhForKeyNrAssumingCMajor(bass, TEnh_Undef)};
+    return WriteChordSymbol({rootKey, bassKey, type->mIntvls.ToSemitones()});
+}
+
+/// The degree of a tone above a root as guitarists count it.
+std::string DegreeText(int tone) {
+    static constexpr auto kDegrees = std::to_array<std::string_view>(
+        {"1", "b2", "2", "b3", "3", "4", "b5", "5", "#5", "6", "b7", "7"});
+    return std::string(kDegrees[static_cast<std::size_t>(FoldIntoOctave(tone))]);
+}
+
+/// Degrees that a chord leaves out, by the numbers of its name.
+std::vector<std::string> OmittedDegrees(CSemitones omitted) {
+    std::vector<std::string> degrees;
+    for (int tone = 0; tone < 12; ++tone) {
+        if (!omitted.HasIntvl(tone)) continue;
+        degrees.push_back(tone == 2 ? "9" : tone == 5 ? "11" : DegreeText(tone));
+    }
+    return degrees;
 }
 
 }  // namespace
@@ -111,7 +142,8 @@ CFretWindow WindowOf(const CChordGrid& grid) {
 std::string NamesText(const CChordGrid& grid) {
     std::string text = grid.mName;
     for (const std::string& name : grid.mOtherNames) text += ", " + name;
-    return text;
+    if (grid.mOmitted.empty()) return text;
+    return text + fmt::format(" (no {})", fmt::join(grid.mOmitted, ", "));
 }
 
 std::string FretsText(const CChordGrid& grid) {
@@ -123,6 +155,19 @@ std::string FretsText(const CChordGrid& grid) {
         text += fret == kMuted ? "x" : std::to_string(fret);
     }
     return text;
+}
+
+std::string DotText(const CChordGrid& grid, std::size_t string, TGridDots dots) {
+    const int pitch = grid.mPitches[string];
+    if (pitch < 0 || dots == TGridDots::Fingers) return {};
+    if (dots == TGridDots::Notes) return std::string(GChOctPitchDefaultName(FoldIntoOctave(pitch)));
+    return grid.mRoot < 0 ? std::string() : DegreeText(pitch - grid.mRoot);
+}
+
+std::string TuningTitle(const CChordGrid& grid) {
+    if (grid.mTuning == kGChStandardGuitar) return {};
+    const std::string_view title = TitleOfTuning(grid.mTuning);
+    return title.empty() ? TuningText(grid.mTuning) : std::string(title);
 }
 
 std::optional<std::vector<int>> ReadFrets(std::string_view text) {
@@ -140,6 +185,7 @@ std::optional<std::vector<int>> ReadFrets(std::string_view text) {
 }
 
 std::optional<GChShortTuning> ReadTuning(std::string_view text) {
+    if (const auto named = TuningOfName(text)) return named;
     std::string folded(text);
     ConvertUtf8SharpAndFlatToAscii(folded);
     std::string_view rest = folded;
@@ -193,6 +239,9 @@ std::optional<CChordGrid> GridOfFrets(std::string_view symbol, const std::vector
         grid.mPitches.push_back(chord.pitchForStringIndex1(static_cast<int>(i), tuningDescr));
     }
     SetNames(grid);
+    if (const auto held = FingeringOfFrets(frets, tuning, capo)) {
+        grid.mDifficulty = held->mDifficulty;
+    }
     return grid;
 }
 
@@ -208,12 +257,49 @@ CChordGrid GridOfChord(std::string_view symbol, const GChChord& chord, int capo)
     }
     grid.mRoot = chord.rootNote(capo);
     if (grid.mRoot < 0) grid.mRoot = GChProposedRootNoteFromChord(&chord, capo);
-    grid.mName = chord.userName().empty()
-                     ? AsciiName(GChHarmonyStringFromChord(&chord, grid.mRoot, -1, capo))
-                     : Printable(chord.chordName(capo));
+    grid.mName = symbol.empty() ? StoredName(chord, grid.mRoot, capo) : std::string(symbol);
+    grid.mDifficulty = chord.difficultyLevel();
     const auto library = chord.gchLibrary();
     if (library != nullptr) grid.mLibrary = Printable(library->libraryName());
     return grid;
+}
+
+CChordGrid GridOfFingering(std::string_view symbol, const CFingering& fingering,
+                           const CChordLite& chord) {
+    CChordGrid grid;
+    grid.mSymbol = symbol;
+    grid.mName = symbol;
+    grid.mTuning = fingering.mTuning;
+    grid.mCapo = fingering.mCapo;
+    grid.mElems = fingering.Elems();
+    for (int i = 0; i < fingering.mStringCount; ++i) {
+        grid.mFrets.push_back(fingering.mFrets[static_cast<std::size_t>(i)]);
+        grid.mPitches.push_back(fingering.Pitch(i));
+    }
+    grid.mRoot = chord.mRootKeyEnh.mKeyNr;
+    grid.mOmitted = OmittedDegrees(fingering.mOmitted);
+    grid.mDifficulty = fingering.mDifficulty;
+    return grid;
+}
+
+std::vector<CChordGrid> FoundGrids(std::string_view symbol, const CChordLite& chord,
+                                   const GChShortTuning& tuning, const CFingeringOptions& options) {
+    std::vector<CChordGrid> grids;
+    for (const CFingering& fingering : FindFingerings(chord, tuning, options)) {
+        grids.push_back(GridOfFingering(symbol, fingering, chord));
+    }
+    return grids;
+}
+
+std::vector<CChordGrid> GridsForChord(const GChDatabase& database, std::string_view symbol,
+                                      const CChordLite& chord, const GChShortTuning& tuning,
+                                      const CFingeringOptions& options) {
+    std::vector<CChordGrid> grids;
+    for (const CFoundGrid& found : LookUpChord(database, chord, tuning, options.mCapo)) {
+        grids.push_back(GridOfChord(symbol, *GChChord::make(found.mGrid, 0), options.mCapo));
+        grids.back().mOmitted = OmittedDegrees(found.mOmitted);
+    }
+    return grids.empty() ? FoundGrids(symbol, chord, tuning, options) : grids;
 }
 
 }  // namespace brindle

@@ -1,9 +1,13 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "brindle/guitarchords/FindFingerings.h"
 #include "brindle/guitarchords/GChChord.h"
+#include "brindle/guitarchords/GChDatabase.h"
 #include "brindle/guitarchords/GChShortTuning.h"
+#include "brindle/present/CGridStyle.h"
 
+#include <cstddef>
 #include <functional>
 #include <map>
 #include <optional>
@@ -30,8 +34,12 @@ struct CChordGrid {
     std::vector<int> mPitches;
     /// The key that the name stands on, 0 to 11.
     int mRoot = -1;
-    /// Where it comes from; empty for typed frets.
+    /// Where it comes from; empty for typed frets and for what was searched.
     std::string mLibrary;
+    /// Degrees of the chord that was asked for and that do not sound, "5", "11".
+    std::vector<std::string> mOmitted;
+    /// How hard it is to hold, 0 to 9; -1 if one hand cannot.
+    int mDifficulty = -1;
 };
 
 /// The frets that are drawn.
@@ -42,7 +50,7 @@ struct CFretWindow {
 
 [[nodiscard]] CFretWindow WindowOf(const CChordGrid& grid);
 
-/// The name, and behind commas the other ones: "Am7, C6/A".
+/// The name, behind commas the other ones: "Am7, C6/A", and what is left out: "C13 (no 5, 11)".
 [[nodiscard]] std::string NamesText(const CChordGrid& grid);
 
 /// "x32010"; frets of two digits stand between dashes: "x-10-12-12-11-10".
@@ -51,9 +59,17 @@ struct CFretWindow {
 /// The frets of a text in one of these forms; nothing if it has another.
 [[nodiscard]] std::optional<std::vector<int>> ReadFrets(std::string_view text);
 
-/// A tuning as people write it: letters from the lowest string, "DADGAD", or pitches with octaves,
-/// "E2A2D3G3B3E4". Six letters lie as near to the standard guitar as they can; others ascend, the
-/// first in the octave of C2. Nothing for any other text and for less than three strings.
+/// What a string says at its fret: its note, "F#", or its degree above the root of the name, "b3".
+/// Empty for a muted string, for a finger, and for a degree without a root.
+[[nodiscard]] std::string DotText(const CChordGrid& grid, std::size_t string, TGridDots dots);
+
+/// The name of a tuning that is not the usual one, or its pitches; empty for the usual one.
+[[nodiscard]] std::string TuningTitle(const CChordGrid& grid);
+
+/// A tuning as people write it: its name (see TuningOfName), letters from the lowest string,
+/// "DADGAD", or pitches with octaves, "E2A2D3G3B3E4". Six letters lie as near to the standard
+/// guitar as they can; others ascend, the first in the octave of C2. Nothing for any other text and
+/// for less than three strings.
 [[nodiscard]] std::optional<GChShortTuning> ReadTuning(std::string_view text);
 
 /// "E2 A2 D3 G3 B3 E4"
@@ -65,8 +81,25 @@ struct CFretWindow {
                                                     const std::vector<int>& frets,
                                                     const GChShortTuning& tuning, int capo);
 
-/// A fingering of a library over its stored root.
+/// A fingering of a library over its stored root. It is named by the symbol, or if that is empty by
+/// what the library says it is.
 [[nodiscard]] CChordGrid GridOfChord(std::string_view symbol, const GChChord& chord, int capo);
+
+/// A fingering that was found for a chord.
+[[nodiscard]] CChordGrid GridOfFingering(std::string_view symbol, const CFingering& fingering,
+                                         const CChordLite& chord);
+
+/// The fingerings of a chord as people type it: those of the database, or if it has none the best
+/// ones that FindFingerings finds, as many as the options want.
+[[nodiscard]] std::vector<CChordGrid> GridsForChord(const GChDatabase& database,
+                                                    std::string_view symbol,
+                                                    const CChordLite& chord,
+                                                    const GChShortTuning& tuning,
+                                                    const CFingeringOptions& options);
+/// The found ones alone.
+[[nodiscard]] std::vector<CChordGrid> FoundGrids(std::string_view symbol, const CChordLite& chord,
+                                                 const GChShortTuning& tuning,
+                                                 const CFingeringOptions& options);
 
 /// Fingerings by the symbol of their chord.
 using TChordGrids = std::map<std::string, CChordGrid, std::less<>>;

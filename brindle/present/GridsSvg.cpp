@@ -17,7 +17,8 @@ constexpr std::size_t kGridsPerLine = 6;
 // A full diagram, from its top left corner.
 constexpr double kNameSize = 15.0;
 constexpr double kSizeOfLabels = 10.0;
-constexpr double kLabelRoom = 26.0;  // left of the strings, for the number of the first fret
+constexpr double kDotTextSize = 8.0;  // of two letters on a dot
+constexpr double kLabelRoom = 26.0;   // left of the strings, for the number of the first fret
 
 constexpr std::string_view kWire = "#999999";
 constexpr std::string_view kPaper = "#ffffff";
@@ -25,9 +26,11 @@ constexpr std::string_view kPaper = "#ffffff";
 /// Draws one diagram.
 class CGridPicture {
 public:
-    CGridPicture(CSvg& svg, const CChordGrid& grid, double left, double top, double scale)
+    CGridPicture(CSvg& svg, const CChordGrid& grid, double left, double top, double scale,
+                 const CGridStyle& style)
         : mSvg(svg),
           mGrid(grid),
+          mStyle(style),
           mWindow(WindowOf(grid)),
           mStringGap(kGridStringGap * scale),
           mFretGap(kGridFretGap * scale),
@@ -44,13 +47,14 @@ public:
 
 private:
     [[nodiscard]] double StringX(std::size_t string) const {
-        return mLeft + mStringGap * static_cast<double>(string);
+        const std::size_t place = mStyle.mLeftHanded ? mGrid.mFrets.size() - 1 - string : string;
+        return mLeft + mStringGap * static_cast<double>(place);
     }
     [[nodiscard]] double FretY(double fret) const { return mTop + mFretGap * fret; }
     [[nodiscard]] double DotRadius() const { return mStringGap * 0.42; }
 
     void DrawWires() {
-        const double right = StringX(mGrid.mFrets.size() - 1);
+        const double right = mLeft + mStringGap * static_cast<double>(mGrid.mFrets.size() - 1);
         const double bottom = FretY(mWindow.mCount);
         for (std::size_t i = 0; i < mGrid.mFrets.size(); ++i) {
             mSvg.Line(StringX(i), mTop, StringX(i), bottom, kWire);
@@ -67,7 +71,7 @@ private:
         }
     }
 
-    // A cross for a muted string, a ring for an open one.
+    // A cross for a muted string, a ring for an open one, or what it says.
     void DrawStringMark(std::size_t string, bool isMuted) {
         const double x = StringX(string);
         const double y = mTop - mStringGap * 0.7;
@@ -75,9 +79,17 @@ private:
         if (isMuted) {
             mSvg.Line(x - r, y - r, x + r, y + r, kInk);
             mSvg.Line(x - r, y + r, x + r, y - r, kInk);
+        } else if (SaysMore()) {
+            mSvg.Text(x, y + r, DotText(mGrid, string, mStyle.mDots),
+                      {.mSize = kSizeOfLabels, .mColor = kInk, .mAnchor = "middle"});
         } else {
             mSvg.Circle(x, y, r, kPaper, kInk);
         }
+    }
+
+    /// Notes or degrees stand on the dots.
+    [[nodiscard]] bool SaysMore() const {
+        return mStyle.mDots != TGridDots::Fingers && mStringGap >= kGridStringGap;
     }
 
     void DrawElem(const GChChordElem& elem) {
@@ -88,14 +100,27 @@ private:
         const double y = FretY(elem.absFretIndex() - mWindow.mFirst + 0.5);
         const double r = DotRadius();
         if (last > first) {
-            mSvg.Rect(StringX(first), y - r * 0.8, StringX(last) - StringX(first), r * 1.6, kInk);
+            const double left = std::min(StringX(first), StringX(last));
+            const double right = std::max(StringX(first), StringX(last));
+            mSvg.Rect(left, y - r * 0.8, right - left, r * 1.6, kInk);
         }
         for (const std::size_t string : {first, last}) {
             mSvg.Circle(StringX(string), y, r, elem.isReal() ? kInk : kPaper, kInk);
         }
-        if (elem.fingerNumber() == 0 || mStringGap < kGridStringGap) return;
-        mSvg.Text(StringX(first), y + kSizeOfLabels * 0.36, fmt::format("{}", elem.fingerNumber()),
-                  {.mSize = kSizeOfLabels,
+        if (SaysMore()) {
+            for (std::size_t i = first; i <= last; ++i) {
+                const bool sounds = mGrid.mFrets[i] == elem.absFretIndex() + 1;
+                if (sounds) Say(elem, i, y, DotText(mGrid, i, mStyle.mDots), kDotTextSize);
+            }
+        } else if (elem.fingerNumber() > 0 && mStringGap >= kGridStringGap) {
+            Say(elem, first, y, fmt::format("{}", elem.fingerNumber()), kSizeOfLabels);
+        }
+    }
+
+    void Say(const GChChordElem& elem, std::size_t string, double y, std::string_view text,
+             double size) {
+        mSvg.Text(StringX(string), y + size * 0.36, text,
+                  {.mSize = size,
                    .mColor = elem.isReal() ? kPaper : kInk,
                    .mBold = true,
                    .mAnchor = "middle"});
@@ -103,12 +128,21 @@ private:
 
     CSvg& mSvg;
     const CChordGrid& mGrid;
+    CGridStyle mStyle;
     CFretWindow mWindow;
     double mStringGap;
     double mFretGap;
     double mLeft;
     double mTop;
 };
+
+/// Frets, capodaster, and a tuning that is not the usual one.
+std::string SmallText(const CChordGrid& grid) {
+    std::string text = FretsText(grid);
+    if (grid.mCapo > 0) text += fmt::format(", capo {}", grid.mCapo);
+    const std::string tuning = TuningTitle(grid);
+    return tuning.empty() ? text : text + ", " + tuning;
+}
 
 /// The room of one diagram on a sheet: that of the largest.
 struct CGridPlace {
@@ -121,7 +155,8 @@ CGridPlace CellFor(const std::vector<CChordGrid>& grids) {
     for (const CChordGrid& grid : grids) {
         const double neck = kGridStringGap * static_cast<double>(grid.mFrets.size() - 1);
         const double name = TextWidth(NamesText(grid), kNameSize);
-        cell.mWidth = std::max(cell.mWidth, kLabelRoom + std::max(neck, name));
+        const double small = TextWidth(SmallText(grid), kSizeOfLabels);
+        cell.mWidth = std::max(cell.mWidth, kLabelRoom + std::max({neck, name, small}));
         cell.mHeight = std::max(cell.mHeight, kGridFretGap * WindowOf(grid).mCount);
     }
     return {cell.mWidth + 24.0, cell.mHeight + 72.0};
@@ -129,11 +164,13 @@ CGridPlace CellFor(const std::vector<CChordGrid>& grids) {
 
 }  // namespace
 
-void DrawGrid(CSvg& svg, const CChordGrid& grid, double left, double top, double scale) {
-    CGridPicture(svg, grid, left, top, scale).Draw();
+void DrawGrid(CSvg& svg, const CChordGrid& grid, double left, double top, double scale,
+              const CGridStyle& style) {
+    CGridPicture(svg, grid, left, top, scale, style).Draw();
 }
 
-std::string GridsSvg(const std::vector<CChordGrid>& grids, std::string_view title) {
+std::string GridsSvg(const std::vector<CChordGrid>& grids, std::string_view title,
+                     const CGridStyle& style) {
     const CGridPlace cell = CellFor(grids);
     CSvg svg;
     for (std::size_t i = 0; i < grids.size(); ++i) {
@@ -142,11 +179,9 @@ std::string GridsSvg(const std::vector<CChordGrid>& grids, std::string_view titl
         const double neck = left + kLabelRoom;
         svg.Text(neck, top + kNameSize, NamesText(grids[i]),
                  {.mSize = kNameSize, .mColor = kInk, .mBold = true});
-        const std::string capo =
-            grids[i].mCapo > 0 ? fmt::format(", capo {}", grids[i].mCapo) : std::string();
-        svg.Text(neck, top + kNameSize + 14, FretsText(grids[i]) + capo,
+        svg.Text(neck, top + kNameSize + 14, SmallText(grids[i]),
                  {.mSize = kSizeOfLabels, .mColor = kFaintInk});
-        DrawGrid(svg, grids[i], neck, top + kNameSize + 36, 1.0);
+        DrawGrid(svg, grids[i], neck, top + kNameSize + 36, 1.0, style);
     }
     const std::size_t count = std::max<std::size_t>(grids.size(), 1);
     const auto columns = static_cast<double>(std::min(count, kGridsPerLine));

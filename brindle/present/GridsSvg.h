@@ -14,12 +14,14 @@ namespace brindle {
 inline constexpr double kGridStringGap = 16.0;
 inline constexpr double kGridFretGap = 20.0;
 
-/// Draws a diagram without its name into a picture. `left` is the lowest string, `top` the upper
-/// end of the strings; open and muted strings are marked above that. A diagram smaller than full
-/// size shows no fingers.
-void DrawGrid(CSvg& svg, const CChordGrid& grid, double left, double top, double scale);
+/// Draws a diagram without its name into a picture. `left` is the string on the left, `top` the
+/// upper end of the strings; open and muted strings are marked above that. A diagram smaller than
+/// full size shows no fingers.
+void DrawGrid(CSvg& svg, const CChordGrid& grid, double left, double top, double scale,
+              const CGridStyle& style = {});
 
 /// A sheet of diagrams.
-[[nodiscard]] std::string GridsSvg(const std::vector<CChordGrid>& grids, std::string_view title);
+[[nodiscard]] std::string GridsSvg(const std::vector<CChordGrid>& grids, std::string_view title,
+                                   const CGridStyle& style = {});
 
 }  // namespace brindle

@@ -23,24 +23,65 @@ char MarkOf(const GChChordElem& elem) {
     return elem.fingerNumber() == 0 ? '*' : static_cast<char>('0' + elem.fingerNumber());
 }
 
-/// Strings stand two characters apart.
-void Draw(const GChChordElem& elem, std::size_t strings, std::string& row) {
-    const auto first = static_cast<std::size_t>(elem.coveredMinStr());
-    const auto last = std::min(static_cast<std::size_t>(elem.coveredMaxStr()), strings - 1);
-    if (first >= strings) return;
-    for (std::size_t at = 2 * first; at <= 2 * last; ++at) row[at] = '-';
-    row[2 * first] = MarkOf(elem);
-    row[2 * last] = MarkOf(elem);
-}
+/// Draws the frets of one diagram. The lowest string stands on the left, or on the right for the
+/// left hand; strings stand as far apart as what is written on them asks for.
+class CTextGrid {
+public:
+    CTextGrid(const CChordGrid& grid, const CGridStyle& style)
+        : mGrid(grid),
+          mStyle(style),
+          mStrings(grid.mFrets.size()),
+          mGap(style.mDots == TGridDots::Fingers ? 2 : 3) {}
 
-std::string StringMarks(const CChordGrid& grid) {
-    std::string marks;
-    for (const int fret : grid.mFrets) {
-        marks += fret < 0 ? 'x' : fret == 0 ? 'o' : ' ';
-        marks += ' ';
+    [[nodiscard]] std::size_t Width() const { return mGap * (mStrings - 1) + 1; }
+
+    [[nodiscard]] std::string StringMarks() const {
+        std::string marks(mGap * mStrings, ' ');
+        for (std::size_t i = 0; i < mStrings; ++i) {
+            const int fret = mGrid.mFrets[i];
+            const std::string said = fret == 0 ? DotText(mGrid, i, mStyle.mDots) : std::string();
+            if (fret <= 0) Write(marks, At(i), fret < 0 ? "x" : said.empty() ? "o" : said);
+        }
+        return marks;
     }
-    return marks;
-}
+
+    [[nodiscard]] std::string Fret(int fret) const {
+        std::string row(mGap * mStrings, ' ');
+        for (std::size_t i = 0; i < mStrings; ++i) row[At(i)] = '|';
+        for (const GChChordElem& elem : mGrid.mElems) {
+            if (elem.absFretIndex() == fret) Draw(elem, row);
+        }
+        return row.substr(0, row.find_last_not_of(' ') + 1);
+    }
+
+private:
+    [[nodiscard]] std::size_t At(std::size_t string) const {
+        return mGap * (mStyle.mLeftHanded ? mStrings - 1 - string : string);
+    }
+
+    static void Write(std::string& row, std::size_t at, std::string_view text) {
+        row.replace(at, text.size(), text);
+    }
+
+    void Draw(const GChChordElem& elem, std::string& row) const {
+        const auto first = static_cast<std::size_t>(elem.coveredMinStr());
+        const auto last = std::min(static_cast<std::size_t>(elem.coveredMaxStr()), mStrings - 1);
+        if (first >= mStrings) return;
+        const std::size_t left = std::min(At(first), At(last));
+        const std::size_t right = std::max(At(first), At(last));
+        for (std::size_t at = left; at <= right; ++at) row[at] = '-';
+        row[left] = row[right] = MarkOf(elem);
+        for (std::size_t i = first; i <= last; ++i) {
+            const std::string said = DotText(mGrid, i, mStyle.mDots);
+            if (mGrid.mFrets[i] == elem.absFretIndex() + 1) Write(row, At(i), said);
+        }
+    }
+
+    const CChordGrid& mGrid;
+    const CGridStyle& mStyle;
+    std::size_t mStrings;
+    std::size_t mGap;
+};
 
 std::string PitchesText(const CChordGrid& grid) {
     std::vector<std::string> names;
@@ -50,19 +91,23 @@ std::string PitchesText(const CChordGrid& grid) {
     return fmt::format("{}", fmt::join(names, " "));
 }
 
-TBlock BlockOf(const CChordGrid& grid) {
-    const std::size_t strings = grid.mFrets.size();
+/// Names, frets and pitches, and what is not as on every guitar.
+TBlock HeadOf(const CChordGrid& grid) {
+    TBlock head{NamesText(grid), FretsText(grid), PitchesText(grid)};
+    const std::string tuning = TuningTitle(grid);
+    if (!tuning.empty()) head.push_back(tuning);
+    if (grid.mCapo > 0) head.push_back(fmt::format("capo {}", grid.mCapo));
+    return head;
+}
+
+TBlock BlockOf(const CChordGrid& grid, const CGridStyle& style) {
     const CFretWindow window = WindowOf(grid);
-    TBlock block{NamesText(grid), FretsText(grid), PitchesText(grid)};
-    if (grid.mCapo > 0) block.push_back(fmt::format("capo {}", grid.mCapo));
-    block.push_back(StringMarks(grid));
-    block.emplace_back(2 * strings - 1, window.mFirst == 0 ? '=' : '-');
+    const CTextGrid drawing(grid, style);
+    TBlock block = HeadOf(grid);
+    block.push_back(drawing.StringMarks());
+    block.emplace_back(drawing.Width(), window.mFirst == 0 ? '=' : '-');
     for (int fret = window.mFirst; fret < window.mFirst + window.mCount; ++fret) {
-        std::string row;
-        for (std::size_t i = 0; i < strings; ++i) row += i == 0 ? "|" : " |";
-        for (const GChChordElem& elem : grid.mElems) {
-            if (elem.absFretIndex() == fret) Draw(elem, strings, row);
-        }
+        std::string row = drawing.Fret(fret);
         if (fret == window.mFirst && fret > 0) row += fmt::format(" {}fr", fret + 1);
         block.push_back(row);
     }
@@ -93,7 +138,8 @@ std::string Row(const std::vector<TBlock>& blocks, const CPaint& paint) {
 
 }  // namespace
 
-std::string GridsText(const std::vector<CChordGrid>& grids, const CPaint& paint) {
+std::string GridsText(const std::vector<CChordGrid>& grids, const CPaint& paint,
+                      const CGridStyle& style) {
     std::string text;
     std::vector<TBlock> row;
     std::size_t width = 0;
@@ -104,7 +150,7 @@ std::string GridsText(const std::vector<CChordGrid>& grids, const CPaint& paint)
         width = 0;
     };
     for (const CChordGrid& grid : grids) {
-        TBlock block = BlockOf(grid);
+        TBlock block = BlockOf(grid, style);
         const std::size_t added = WidthOfBlock(block) + kGapOfGrids;
         if (width + added > kWidestGridLine + kGapOfGrids) endRow();
         width += added;

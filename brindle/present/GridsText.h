@@ -10,6 +10,7 @@
 namespace brindle {
 
 /// Diagrams side by side, in lines of at most about 80 characters.
-[[nodiscard]] std::string GridsText(const std::vector<CChordGrid>& grids, const CPaint& paint);
+[[nodiscard]] std::string GridsText(const std::vector<CChordGrid>& grids, const CPaint& paint,
+                                    const CGridStyle& style = {});
 
 }  // namespace brindle

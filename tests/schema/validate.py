@@ -40,6 +40,7 @@ MORE_COMMANDS = [
     "grids list --json",
     "grids show --json",
     "grids export",
+    "grids for 'Bb F N.C. Gm' --json",
     "name E2 G3 C4 Bb4 --json",
     "name E2 G3 C4 Bb4 --json --all-roots --method net",
     "name 60 --json",

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/present/internal/GridValues.h"
 
+#include "brindle/guitarchords/GChPitches.h"
+
 #include <nlohmann/json.hpp>
 
 namespace brindle {
@@ -13,6 +15,20 @@ Json ElemToJson(const GChChordElem& elem) {
             {"Optional", !elem.isReal()}};
 }
 
+Json FretsToJson(const std::vector<int>& frets) {
+    Json list = Json::array();
+    for (const int fret : frets) list.push_back(fret < 0 ? Json(nullptr) : Json(fret));
+    return list;
+}
+
+Json PitchNamesToJson(const std::vector<int>& pitches) {
+    Json list = Json::array();
+    for (const int pitch : pitches) {
+        list.push_back(pitch < 0 ? Json(nullptr) : Json(GChMidiPitchDefaultName(pitch)));
+    }
+    return list;
+}
+
 }  // namespace
 
 Json KeyNrToJson(int keyNr) {
@@ -23,6 +39,22 @@ Json ElemsToJson(const std::vector<GChChordElem>& elems) {
     Json list = Json::array();
     for (const GChChordElem& elem : elems) list.push_back(ElemToJson(elem));
     return list;
+}
+
+Json GridToJson(const CChordGrid& grid) {
+    return {{"Symbol", grid.mSymbol},
+            {"Name", grid.mName},
+            {"OtherNames", grid.mOtherNames},
+            {"Omitted", grid.mOmitted},
+            {"RootKeyNr", KeyNrToJson(grid.mRoot)},
+            {"Frets", FretsToJson(grid.mFrets)},
+            {"Pitches", FretsToJson(grid.mPitches)},
+            {"PitchNames", PitchNamesToJson(grid.mPitches)},
+            {"Elements", ElemsToJson(grid.mElems)},
+            {"OpenStrings", GChPitchArrayFromShortTuning(grid.mTuning)},
+            {"Capo", grid.mCapo},
+            {"Difficulty", grid.mDifficulty < 0 ? Json(nullptr) : Json(grid.mDifficulty)},
+            {"Library", grid.mLibrary.empty() ? Json(nullptr) : Json(grid.mLibrary)}};
 }
 
 }  // namespace brindle

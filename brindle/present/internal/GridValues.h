@@ -2,6 +2,7 @@
 #pragma once
 
 #include "brindle/guitarchords/GChChordElem.h"
+#include "brindle/present/ChordGrid.h"
 #include "brindle/present/JsonValues.h"
 
 #include <vector>
@@ -15,5 +16,8 @@ namespace brindle {
 
 /// Frets count from 1, fingers too; finger 0 is none.
 [[nodiscard]] Json ElemsToJson(const std::vector<GChChordElem>& elems);
+
+/// A grid with all that is known of it.
+[[nodiscard]] Json GridToJson(const CChordGrid& grid);
 
 }  // namespace brindle

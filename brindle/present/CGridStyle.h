@@ -1,0 +1,22 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include <cstdint>
+
+namespace brindle {
+
+/// What stands on the dots of a chord grid.
+enum class TGridDots : std::uint8_t {
+    Fingers,    ///< 1 index to 4 little finger
+    Notes,      ///< "F#"
+    Intervals,  ///< degrees above the root of the name, "b3"
+};
+
+/// How chord grids are drawn.
+struct CGridStyle {
+    TGridDots mDots = TGridDots::Fingers;
+    /// The lowest string stands on the right.
+    bool mLeftHanded = false;
+};
+
+}  // namespace brindle

@@ -1,0 +1,119 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/present/SongGrids.h"
+
+#include "brindle/chords/WriteChordSymbol.h"
+#include "brindle/present/GridsText.h"
+#include "brindle/present/internal/GridValues.h"
+
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <map>
+#include <nlohmann/json.hpp>
+#include <set>
+
+namespace brindle {
+namespace {
+
+std::string ShapeName(const CChordLite& chord, std::string_view symbol, int capo) {
+    return capo == 0 ? std::string(symbol) : WriteChordSymbol(ShapeUnderCapo(chord, capo));
+}
+
+CShownCapo ShownCapo(std::span<const CChordLite> chords, std::span<const std::string> symbols,
+                     const CSongFingerings& song) {
+    CShownCapo shown{song.mCapo, song.mCost, song.mDifficulty, song.mHoles, {}};
+    std::set<std::string> seen;
+    for (std::size_t i = 0; i < chords.size(); ++i) {
+        if (chords[i].IsUndef()) continue;
+        const std::string name = ShapeName(chords[i], symbols[i], song.mCapo);
+        if (seen.insert(name).second) shown.mShapes.push_back(name);
+    }
+    return shown;
+}
+
+constexpr std::size_t kShownCapos = 3;
+
+std::string CapoText(const CShownCapo& capo) {
+    const std::string holes =
+        capo.mHoles == 0 ? "" : fmt::format(", {} chords cannot be held", capo.mHoles);
+    return fmt::format("{}: {} (difficulty {:.1f}{})",
+                       capo.mCapo == 0 ? "no capo" : fmt::format("capo {}", capo.mCapo),
+                       fmt::join(capo.mShapes, " "), capo.mDifficulty, holes);
+}
+
+Json CapoToJson(const CShownCapo& capo) {
+    return {{"Capo", capo.mCapo},
+            {"Cost", capo.mCost},
+            {"Difficulty", capo.mDifficulty},
+            {"Holes", capo.mHoles},
+            {"Shapes", capo.mShapes}};
+}
+
+}  // namespace
+
+CShownSongGrids MakeSongGrids(std::span<const CChordLite> chords,
+                              std::span<const std::string> symbols,
+                              std::span<const CSongFingerings> songs) {
+    CShownSongGrids shown;
+    shown.mSymbols.assign(symbols.begin(), symbols.end());
+    shown.mGridOfChord.resize(chords.size());
+    for (const CSongFingerings& song : songs) {
+        shown.mCapos.push_back(ShownCapo(chords, symbols, song));
+    }
+    if (songs.empty()) return shown;
+    std::map<std::pair<std::string, std::vector<int>>, std::size_t> gridOf;
+    for (std::size_t i = 0; i < chords.size(); ++i) {
+        const CFingering& fingering = songs.front().mFingerings[i];
+        if (fingering.mStringCount == 0) continue;
+        CChordGrid grid = GridOfFingering(symbols[i], fingering, chords[i]);
+        grid.mName = ShapeName(chords[i], symbols[i], songs.front().mCapo);
+        const auto [row, isNew] =
+            gridOf.try_emplace({symbols[i], grid.mFrets}, shown.mGrids.size());
+        if (isNew) shown.mGrids.push_back(std::move(grid));
+        shown.mGridOfChord[i] = row->second;
+    }
+    return shown;
+}
+
+TChordGrids GridsBySymbol(const CShownSongGrids& song) {
+    std::vector<std::size_t> uses(song.mGrids.size());
+    for (const auto& grid : song.mGridOfChord) {
+        if (grid) ++uses[*grid];
+    }
+    std::map<std::string, std::size_t> best;
+    for (std::size_t i = 0; i < song.mGrids.size(); ++i) {
+        const auto [row, isNew] = best.try_emplace(song.mGrids[i].mSymbol, i);
+        if (!isNew && uses[i] > uses[row->second]) row->second = i;
+    }
+    TChordGrids grids;
+    for (const auto& [symbol, at] : best) grids.emplace(symbol, song.mGrids[at]);
+    return grids;
+}
+
+std::string SongGridsText(const CShownSongGrids& song, const CPaint& paint,
+                          const CGridStyle& style) {
+    std::string text;
+    const std::size_t count = std::min(song.mCapos.size(), kShownCapos);
+    for (std::size_t i = 0; i < count; ++i) {
+        const std::string line = CapoText(song.mCapos[i]);
+        text += (i == 0 ? paint.Strong(line) : paint.Faint(line)) + '\n';
+    }
+    if (song.mGrids.empty()) return text;
+    return text + '\n' + GridsText(song.mGrids, paint, style);
+}
+
+std::string SongGridsJson(const CShownSongGrids& song) {
+    Json capos = Json::array();
+    for (const CShownCapo& capo : song.mCapos) capos.push_back(CapoToJson(capo));
+    Json chords = Json::array();
+    for (std::size_t i = 0; i < song.mSymbols.size(); ++i) {
+        const auto& grid = song.mGridOfChord[i];
+        chords.push_back(
+            {{"Symbol", song.mSymbols[i]}, {"Grid", grid ? Json(*grid) : Json(nullptr)}});
+    }
+    Json grids = Json::array();
+    for (const CChordGrid& grid : song.mGrids) grids.push_back(GridToJson(grid));
+    return JsonText({{"Capos", capos}, {"Chords", chords}, {"Grids", grids}});
+}
+
+}  // namespace brindle

@@ -1,0 +1,51 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/present/CPaint.h"
+#include "brindle/present/ChordGrid.h"
+#include "brindle/song/SongFingerings.h"
+
+#include <optional>
+#include <span>
+#include <string>
+#include <vector>
+
+namespace brindle {
+
+/// A place of the capodaster for a song, and what the hand then plays.
+struct CShownCapo {
+    int mCapo = 0;
+    /// Less is easier.
+    int mCost = 0;
+    double mDifficulty = 0.0;
+    std::size_t mHoles = 0;
+    /// Each different chord by the name of its shape, in the order of the song.
+    std::vector<std::string> mShapes;
+};
+
+/// The fingerings of a song made ready for the eye.
+struct CShownSongGrids {
+    /// Each different one, in the order of the song. The name is that of the shape under the
+    /// capodaster, the symbol that of the song.
+    std::vector<CChordGrid> mGrids;
+    /// Of each chord of the song: its symbol, and which grid it is; none for a rest and a hole.
+    std::vector<std::string> mSymbols;
+    std::vector<std::optional<std::size_t>> mGridOfChord;
+    /// The first one is drawn. The others were compared with it.
+    std::vector<CShownCapo> mCapos;
+};
+
+/// `songs` hold the fingerings of the same chords, the ones to be drawn first.
+[[nodiscard]] CShownSongGrids MakeSongGrids(std::span<const CChordLite> chords,
+                                            std::span<const std::string> symbols,
+                                            std::span<const CSongFingerings> songs);
+
+/// The grid that each symbol has most often.
+[[nodiscard]] TChordGrids GridsBySymbol(const CShownSongGrids& song);
+
+/// The capo and what it makes easier, the way of the chords, and the diagrams.
+[[nodiscard]] std::string SongGridsText(const CShownSongGrids& song, const CPaint& paint,
+                                        const CGridStyle& style);
+[[nodiscard]] std::string SongGridsJson(const CShownSongGrids& song);
+
+}  // namespace brindle
