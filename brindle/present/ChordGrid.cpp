@@ -119,8 +119,10 @@ std::string DegreeText(int tone) {
 
 /// Degrees that a chord leaves out, by the numbers of its name.
 std::vector<std::string> OmittedDegrees(CSemitones omitted) {
+    // Ninths and elevenths stand behind what lies within the octave.
+    static constexpr auto kOrder = std::to_array({0, 1, 3, 4, 6, 7, 8, 9, 10, 11, 2, 5});
     std::vector<std::string> degrees;
-    for (int tone = 0; tone < 12; ++tone) {
+    for (const int tone : kOrder) {
         if (!omitted.HasIntvl(tone)) continue;
         degrees.push_back(tone == 2 ? "9" : tone == 5 ? "11" : DegreeText(tone));
     }

@@ -16,8 +16,9 @@ namespace {
 constexpr int kCostOfWay = 20;     // each fret along the neck
 constexpr int kCostOfFinger = 12;  // a finger that is put down anew
 constexpr int kCostOfHole = 5000;
-constexpr int kCostOfCapo = 25;
-constexpr int kCostOfCapoFret = 12;
+constexpr int kCostOfDifficulty = 40;  // a song is played at speed
+constexpr int kCostOfCapo = 10;
+constexpr int kCostOfCapoFret = 6;
 constexpr std::size_t kMostCandidates = 32;
 constexpr int kMostCapo = 12;
 
@@ -69,7 +70,7 @@ CStage StageAfter(const CStage* before, const TCandidates& candidates, std::size
             best = cost;
             from = i;
         }
-        stage.mCosts.push_back(best + candidate.mCost);
+        stage.mCosts.push_back(best + candidate.mCost + kCostOfDifficulty * candidate.mDifficulty);
         stage.mFrom.push_back(from);
     }
     return stage;

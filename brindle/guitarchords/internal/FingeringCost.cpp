@@ -21,6 +21,8 @@ constexpr int kSavedByHand = 40;  // a hand without open strings lies over those
 constexpr int kCostOfSilentBass = 35;
 constexpr int kCostOfThinChord = 450;  // each bass string beyond two that is silent
 constexpr int kCostOfSilentInside = 150;
+constexpr int kCostOfSilentOfFew = 250;  // each, where there are few strings
+constexpr int kFewStrings = 5;
 constexpr int kCostOfNeedlessMute = 80;  // the open string is a tone of the chord
 constexpr int kCostOfUnison = 30;        // two strings at the same pitch
 
@@ -44,7 +46,9 @@ int CostOfSilence(const CFingering& fingering) {
     const auto treble = std::find_if(frets.rbegin(), frets.rend(), sounds) - frets.rbegin();
     const auto silent = std::count(frets.begin(), frets.end(), kMutedString);
     const int ofTreble = kCostOfSilentTreble - (HasOpen(frets) ? 0 : kSavedByHand);
-    return ofTreble * static_cast<int>(treble) + kCostOfSilentBass * static_cast<int>(first) +
+    const bool areFew = fingering.mStringCount <= kFewStrings;
+    return (areFew ? kCostOfSilentOfFew * static_cast<int>(silent) : 0) +
+           ofTreble * static_cast<int>(treble) + kCostOfSilentBass * static_cast<int>(first) +
            kCostOfThinChord * std::max(0, static_cast<int>(first) - 2) +
            kCostOfSilentInside * static_cast<int>(silent - first - treble);
 }
