@@ -3,6 +3,7 @@
 
 #include "brindle/analysis/CHarmAnlsChords.h"
 #include "brindle/platform/AtomicFile.h"
+#include "brindle/song/LearnSong.h"
 
 #include <fmt/format.h>
 
@@ -19,54 +20,23 @@ namespace fs = std::filesystem;
 
 constexpr std::size_t kMaxFileBytes = std::size_t{64} << 20;
 
-/// Gathers chords and cuts them at silence.
-class CSequences {
-public:
-    void Add(const CChordLite& chord, double length) {
-        // Model files hold two digits.
-        const double rounded = std::round(length * 100.0) / 100.0;
-        if (!std::isfinite(rounded)) mSource.mError = "a length is no number, or too large";
-        if (!(rounded > 0.0) || !std::isfinite(rounded)) return;
-        const int bass = chord.HasBassNote() ? chord.mBassKeyEnh.mKeyNr : -1;
-        mSource.mSequences.back().emplace_back(
-            CHarmAnlsChord(chord, chord.mRootKeyEnh.mKeyNr, bass), rounded);
-    }
-    void Cut() {
-        if (!mSource.mSequences.back().empty()) mSource.mSequences.emplace_back();
-    }
-    [[nodiscard]] CChordSource Finish() {
-        if (mSource.mSequences.back().empty()) mSource.mSequences.pop_back();
-        if (mSource.mSequences.empty() && mSource.mError.empty()) mSource.mError = "no chords";
-        return std::move(mSource);
-    }
-
-private:
-    CChordSource mSource{{{}}, {}};
-};
-
 CChordSource Failed(std::string error) {
     return {{}, std::move(error)};
 }
 
-CChordSource FromSong(const CSong& song) {
-    CSequences sequences;
-    // The lines of chord strings do not go on from each other.
-    auto section = song.mSections.begin();
-    const bool isCut = song.mFormat == TSongFormat_ChordStrings;
-    const CHarmAnlsChords& chords = song.mChords;
-    for (std::size_t ix = 0; ix + 1 < chords.size(); ++ix) {
-        while (isCut && section != song.mSections.end() &&
-               section->mPosition <= chords[ix].mPosition) {
-            sequences.Cut();
-            ++section;
-        }
-        if (chords[ix].IsUndef()) {
-            sequences.Cut();
-        } else {
-            sequences.Add(chords[ix], chords[ix + 1].mPosition - chords[ix].mPosition);
-        }
+bool HasEndlessChord(const CSong& song) {
+    for (std::size_t ix = 0; ix + 1 < song.mChords.size(); ++ix) {
+        const double length = song.mChords[ix + 1].mPosition - song.mChords[ix].mPosition;
+        if (!song.mChords[ix].IsUndef() && !std::isfinite(length)) return true;
     }
-    return sequences.Finish();
+    return false;
+}
+
+CChordSource FromSong(const CSong& song) {
+    CChordSource source{ChordSequencesOf(song), {}};
+    if (source.mSequences.empty()) source.mError = "no chords";
+    if (HasEndlessChord(song)) source.mError = "a length is no number, or too large";
+    return source;
 }
 
 std::string FaultText(const CSongFault& fault) {

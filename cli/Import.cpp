@@ -3,6 +3,7 @@
 #include "cli/Input.h"
 #include "cli/Json.h"
 
+#include "brindle/musicxml/ImportScore.h"
 #include "brindle/musicxml/MusicXmlParser.h"
 #include "brindle/musicxml/MuxmlJsonLines.h"
 #include "brindle/musicxml/MuxmlLimits.h"
@@ -17,7 +18,6 @@
 #include <functional>
 #include <memory>
 #include <optional>
-#include <stdexcept>
 #include <utility>
 
 namespace brindle::cli {
@@ -91,38 +91,18 @@ MusicXmlParserDelegate Both(const MusicXmlParserDelegate& lines,
     return both;
 }
 
-// In memory: the library would leave a compressed score in a file that all users share. A container
-// without a usable list of its files has a score nevertheless.
-bool ImportBytes(MusicXmlParser& parser, const std::string& bytes, bool isCompressed,
-                 const std::shared_ptr<const MusicXmlParserDelegate>& host, Error& error) {
-    if (!isCompressed) return parser.parseBytes(bytes, host, &error);
-    if (const auto score = ScoreInContainer(bytes)) return parser.parseBytes(*score, host, &error);
-    // The library's reason may speak of a file that it does not make here.
-    std::string unused;
-    error = MusicXmlParser::unpackCompressedMusicXML(bytes, unused).value_or(Error{});
-    error.description = ContainerFault(bytes);
-    return false;
-}
-
 // False with an error; nothing when standard input cannot be read.
-std::optional<bool> ImportFrom(const std::string& file,
-                               const std::shared_ptr<const MusicXmlParserDelegate>& host,
+std::optional<bool> ImportFrom(const std::string& file, const MusicXmlParserDelegate& host,
                                Error& error) {
-    MusicXmlParser parser;
-    parser.MidiTicksPerQuarter = kImportTicksPerQuarter;
-    try {
-        const bool isNamedFile = file != "-";
-        const auto bytes = isNamedFile ? ReadWholeFile(file, kMuxmlMaxFileSize) : ReadInput(file);
-        // The library tells why it cannot read a file.
-        if (!bytes && isNamedFile) return parser.parseURL(file, host, &error);
-        if (!bytes) return std::nullopt;
-        const bool isCompressed = IsScoreContainer(*bytes) || file.ends_with(".mxl");
-        return ImportBytes(parser, *bytes, isCompressed, host, error);
-    } catch (const std::domain_error& exception) {
-        // Divisions of 0 leave no unit in which places in the bar could be told.
-        error = {"", 0, exception.what()};
-        return false;
+    const bool isNamedFile = file != "-";
+    const auto bytes = isNamedFile ? ReadWholeFile(file, kMuxmlMaxFileSize) : ReadInput(file);
+    if (bytes) {
+        const bool isContainer = IsScoreContainer(*bytes) || file.ends_with(".mxl");
+        return ImportScore(*bytes, isContainer, kImportTicksPerQuarter, host, error);
     }
+    if (!isNamedFile) return std::nullopt;
+    // The library tells why it cannot read a file.
+    return MusicXmlParser().parseURL(file, std::make_shared<MusicXmlParserDelegate>(host), &error);
 }
 
 std::string ResultLine(bool isOk, const Error& error) {
@@ -148,8 +128,7 @@ TStatus Import(const CImportOptions& options) {
         methods = options.mMidiFile ? Both(lines, methods) : lines;
     }
     Error error;
-    const auto isOk =
-        ImportFrom(options.mFile, std::make_shared<MusicXmlParserDelegate>(methods), error);
+    const auto isOk = ImportFrom(options.mFile, methods, error);
     if (!isOk) return TStatus::BadInput;
     if (!*isOk) {
         Fail(TStatus::BadInput,

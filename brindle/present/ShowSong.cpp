@@ -5,6 +5,7 @@
 #include "brindle/present/CChordSymbols.h"
 #include "brindle/present/MakeSong.h"
 #include "brindle/present/MakeSongCopies.h"
+#include "brindle/present/MakeSongKeys.h"
 #include "brindle/present/ShownText.h"
 #include "brindle/song/AnalyseSong.h"
 
@@ -43,6 +44,18 @@ const CHarmAnlsCenters* ReadingsOf(const CSongAnalysis& found) {
     return found.mReadings.empty() ? nullptr : &found.mReadings;
 }
 
+std::string JsonOf(const CSong& song, const CSongAnalysis& found, const CReadSong* read) {
+    const CChordSymbols symbols(song.mSymbols, song.mChords);
+    const CShownKeys keys =
+        MakeSongKeys(song.mChords, symbols, {.mBeatsPerBar = song.mBeatsPerBar});
+    return AnalysisJson(
+        found.mAnalyse, ReadingsOf(found),
+        [&](const CHarmAnlsChordWithPos& chord) -> const std::string& {
+            return symbols.SymbolOf(chord);
+        },
+        keys, nullptr, read);
+}
+
 }  // namespace
 
 CShownSong ShowSong(const CSong& song, const CSongAnalysis& found) {
@@ -57,14 +70,13 @@ CShownSong ShowSong(const CSong& song, const CSongAnalysis& found) {
 }
 
 std::string AnalysisJson(const CSong& song, const CSongAnalysis& found) {
-    const CChordSymbols symbols(song.mSymbols, song.mChords);
-    const CShownSong shown = ShowSong(song, found);
-    return AnalysisJson(
-        found.mAnalyse, ReadingsOf(found),
-        [&](const CHarmAnlsChordWithPos& chord) -> const std::string& {
-            return symbols.SymbolOf(chord);
-        },
-        shown.mKeys);
+    return JsonOf(song, found, nullptr);
+}
+
+std::string AnalysisJson(const CSong& song, const CSongAnalysis& found, const CSongReading& reading,
+                         std::span<const std::string> explanations) {
+    const CReadSong read{song, reading, explanations};
+    return JsonOf(song, found, &read);
 }
 
 }  // namespace brindle

@@ -3,12 +3,14 @@
 
 #include "brindle/present/ShownSong.h"
 
+#include <span>
 #include <string>
 
 namespace brindle {
 
 struct CSong;
 struct CSongAnalysis;
+struct CSongReading;
 
 // What AnalyseSong found in a song, made ready for people and programs.
 
@@ -17,5 +19,9 @@ struct CSongAnalysis;
 
 /// As strict JSON, see docs/json.md.
 [[nodiscard]] std::string AnalysisJson(const CSong& song, const CSongAnalysis& found);
+/// The same with the reading of the song; `explanations` is a sentence for each chord, or empty.
+[[nodiscard]] std::string AnalysisJson(const CSong& song, const CSongAnalysis& found,
+                                       const CSongReading& reading,
+                                       std::span<const std::string> explanations = {});
 
 }  // namespace brindle

@@ -1,0 +1,36 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/chords/ChordTones.h"
+
+#include "brindle/chords/ChordDegree.h"
+#include "brindle/chords/internal/SpelledOutChord.h"
+
+namespace brindle {
+namespace {
+
+constexpr TToneMask kOctave = 0xFFF;
+
+// A sixth beside a diminished triad is its seventh, unless the chord has another.
+bool HasDiminishedSeventh(TToneMask tones) {
+    constexpr TToneMask kAsked = 0x249;    // 0 3 6 9
+    constexpr TToneMask kForeign = 0xC90;  // 4 7 10 11
+    return (tones & kAsked) == kAsked && (tones & kForeign) == 0;
+}
+
+}  // namespace
+
+std::vector<CKeyEnh> ChordTones(const CChordLite& chord) {
+    if (chord.IsUndef()) return {};
+    const auto tones = static_cast<TToneMask>(chord.mSemitones.Mask() & kOctave);
+    const CSpelledOutChord spelled(tones);
+    std::vector<CKeyEnh> keys;
+    for (int tone = 0; tone < 12; ++tone) {
+        if (!HasTone(tones, tone)) continue;
+        const bool isSeventh = tone == 9 && HasDiminishedSeventh(tones);
+        const CChordDegree degree = isSeventh ? CChordDegree{7, -2} : spelled.DegreeOf(tone);
+        const CKeyEnh key = degree.KeyOver(chord.mRootKeyEnh);
+        keys.push_back(key.IsUndef() ? chord.mRootKeyEnh + tone : key);
+    }
+    return keys;
+}
+
+}  // namespace brindle

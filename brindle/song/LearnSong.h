@@ -1,0 +1,22 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/markov/MarkovChords.h"
+#include "brindle/song/CSong.h"
+
+#include <cstddef>
+#include <vector>
+
+namespace brindle {
+
+class VariableLengthMarkovModel;
+
+/// The chords of a song with their lengths in beats, rounded to two digits as model files hold
+/// them, cut where no chord sounds and where a line of chord strings ends. Chords whose length is
+/// no number above 0 are left out.
+[[nodiscard]] std::vector<CHarmAnlsChordsWithLength> ChordSequencesOf(const CSong& song);
+
+/// Learns each of these sequences. The number of chords that were learned.
+std::size_t LearnSong(VariableLengthMarkovModel& model, const CSong& song);
+
+}  // namespace brindle
