@@ -1,13 +1,16 @@
-# The installed package: headers under include/brindle, the library, a CMake package `Brindle` and a
-# pkg-config file `brindle`.
+# The installed package: headers under include/brindle, the archive, the shared library of the C
+# interface, a CMake package `Brindle` with the targets brindle::brindle (C++) and brindle::c, and
+# the pkg-config files `brindle` and `brindle-c`.
 include(CMakePackageConfigHelpers)
 
 set(package_dir ${CMAKE_INSTALL_LIBDIR}/cmake/Brindle)
 
 install(TARGETS brindle EXPORT BrindleTargets)
+install(TARGETS brindle_c EXPORT BrindleCTargets)
 install(DIRECTORY ${PROJECT_SOURCE_DIR}/brindle DESTINATION ${CMAKE_INSTALL_INCLUDEDIR}
         FILES_MATCHING PATTERN "*.h" PATTERN internal EXCLUDE)
 install(EXPORT BrindleTargets NAMESPACE brindle:: DESTINATION ${package_dir})
+install(EXPORT BrindleCTargets NAMESPACE brindle:: DESTINATION ${package_dir})
 
 configure_package_config_file(${CMAKE_CURRENT_LIST_DIR}/BrindleConfig.cmake.in
     ${PROJECT_BINARY_DIR}/BrindleConfig.cmake INSTALL_DESTINATION ${package_dir})
@@ -21,15 +24,8 @@ install(FILES ${PROJECT_BINARY_DIR}/BrindleConfig.cmake
 install(DIRECTORY "${PROJECT_SOURCE_DIR}/data/Chord Grids" DESTINATION ${CMAKE_INSTALL_DATADIR}/brindle
         COMPONENT program)
 
-# A static library leaves its own libraries to the host's link line, a shared one brings them.
-get_target_property(library_type brindle TYPE)
-set(pc_requires "")
-set(pc_requires_private "")
-if(library_type STREQUAL SHARED_LIBRARY)
-    string(JOIN ", " pc_requires_private ${brindle_pc_libraries})
-else()
-    string(JOIN ", " pc_requires ${brindle_pc_libraries})
-endif()
+# The archive leaves its own libraries to the host's link line, the shared library brings them.
+string(JOIN ", " pc_requires ${brindle_pc_libraries})
 cmake_path(IS_ABSOLUTE CMAKE_INSTALL_INCLUDEDIR includedir_is_absolute)
 cmake_path(IS_ABSOLUTE CMAKE_INSTALL_LIBDIR libdir_is_absolute)
 if(includedir_is_absolute OR libdir_is_absolute)
@@ -44,5 +40,7 @@ else()
     set(pc_includedir "\${prefix}/${CMAKE_INSTALL_INCLUDEDIR}")
     set(pc_libdir "\${prefix}/${CMAKE_INSTALL_LIBDIR}")
 endif()
-configure_file(${CMAKE_CURRENT_LIST_DIR}/brindle.pc.in ${PROJECT_BINARY_DIR}/brindle.pc @ONLY)
-install(FILES ${PROJECT_BINARY_DIR}/brindle.pc DESTINATION ${CMAKE_INSTALL_LIBDIR}/pkgconfig)
+foreach(name brindle brindle-c)
+    configure_file(${CMAKE_CURRENT_LIST_DIR}/${name}.pc.in ${PROJECT_BINARY_DIR}/${name}.pc @ONLY)
+    install(FILES ${PROJECT_BINARY_DIR}/${name}.pc DESTINATION ${CMAKE_INSTALL_LIBDIR}/pkgconfig)
+endforeach()

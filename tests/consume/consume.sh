@@ -28,3 +28,19 @@ cmake --fresh -G Ninja -S "$project" -B "$work/host" "${options[@]}"
 cmake --build "$work/host" --target host
 (cd "$work" && "$work/host/host" && grep -q "^<svg\|^<?xml" song.svg && grep -q HarmSignKeys song.json) |
     diff "$source_dir/examples/host/expected.txt" -
+
+# The same for the host in C, which finds the shared library alone.
+case $way in
+    find_package)
+        cmake --fresh -G Ninja -S "$source_dir/examples/c" -B "$work/host_in_c" "${options[@]}"
+        cmake --build "$work/host_in_c" ;;
+    pkg_config)
+        mkdir -p "$work/host_in_c"
+        # The flags are words of their own.
+        # shellcheck disable=SC2046
+        cc -std=c11 -o "$work/host_in_c/host_in_c" "$source_dir/examples/c/main.c" \
+            $(pkg-config --cflags --libs brindle-c) -Wl,-rpath,"$(pkg-config --variable=libdir brindle-c)" ;;
+    *)
+        exit 0 ;;
+esac
+"$work/host_in_c/host_in_c" | diff "$source_dir/examples/c/expected.txt" -

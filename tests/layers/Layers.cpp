@@ -21,6 +21,7 @@ constexpr auto kFolders = std::to_array<std::string_view>({
     "musicxml",
     "song",
     "present",
+    "c",
 });
 constexpr std::size_t kProgram = kFolders.size();
 constexpr std::size_t kNowhere = kProgram + 1;
