@@ -7,7 +7,7 @@
 namespace brindle {
 namespace {
 
-constexpr TToneMask kOctave = 0xFFF;
+constexpr TToneMask kTonesOfOctave = 0xFFF;
 
 // A sixth beside a diminished triad is its seventh, unless the chord has another.
 bool HasDiminishedSeventh(TToneMask tones) {
@@ -20,7 +20,7 @@ bool HasDiminishedSeventh(TToneMask tones) {
 
 std::vector<CKeyEnh> ChordTones(const CChordLite& chord) {
     if (chord.IsUndef()) return {};
-    const auto tones = static_cast<TToneMask>(chord.mSemitones.Mask() & kOctave);
+    const auto tones = static_cast<TToneMask>(chord.mSemitones.Mask() & kTonesOfOctave);
     const CSpelledOutChord spelled(tones);
     std::vector<CKeyEnh> keys;
     for (int tone = 0; tone < 12; ++tone) {
