@@ -2,6 +2,7 @@
 #include "cli/Markov.h"
 
 #include "cli/Input.h"
+#include "cli/MarkovSongs.h"
 
 #include "brindle/chords/ReadChordText.h"
 #include "brindle/markov/MarkovChords.h"
@@ -18,11 +19,14 @@ namespace {
 
 constexpr CCommandHelp kMarkovHelp{
     "markov",
-    "Learn chord sequences and make new ones in their manner",
-    "  brindle markov learn --order 3 -o model.json songs/\n"
-    "  brindle markov generate model.json --beats 32\n"
-    "  brindle markov fill model.json \"(4,C);(4,U);(4,G7);(4,C)\"\n"
-    "  brindle markov show model.json\n",
+    "Learn songs and write new ones in their manner",
+    "  brindle markov generate --form AABA --key \"Eb major\"\n"
+    "  brindle markov learn -o model.json songs/\n"
+    "  brindle markov generate model.json --sheet \"C | _ | _ | G7 | C\"\n"
+    "  brindle markov next \"Dm7 G7\"\n"
+    "  brindle markov score model.json more-songs/\n"
+    "  brindle markov learn --plain --order 3 -o plain.json songs/\n"
+    "  brindle markov fill plain.json \"(4,C);(4,U);(4,G7);(4,C)\"\n",
 };
 
 // Longer texts are shown as chord strings.
@@ -133,6 +137,8 @@ void AddMarkov(CCommand& program) {
     AddMarkovGenerate(markov);
     AddMarkovFill(markov);
     AddMarkovShow(markov);
+    AddMarkovNext(markov);
+    AddMarkovScore(markov);
 }
 
 }  // namespace brindle::cli

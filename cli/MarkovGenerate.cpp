@@ -1,8 +1,10 @@
 // SPDX-License-Identifier: MIT
 #include "cli/Markov.h"
+#include "cli/MarkovSongs.h"
 
 #include "brindle/platform/AtomicFile.h"
 #include "brindle/present/MarkovMidi.h"
+#include "brindle/song/SongModelFile.h"
 
 #include <fmt/format.h>
 
@@ -15,10 +17,17 @@ namespace {
 
 constexpr CCommandHelp kMarkovGenerateHelp{
     "generate",
-    "Make a new chord sequence of a length, or one that fills the gaps of a template",
-    "  brindle markov generate model.json --beats 32\n"
-    "  brindle markov generate model.json --template \"(4,C);(8,U);(4,C)\" --seed 1\n"
-    "  brindle markov generate model.json --beats 64 --order 2 --midi song.mid\n"
+    "Write a song in the manner of others; with a plain model, make a chord sequence",
+    "  brindle markov generate\n"
+    "  brindle markov generate --style hymn --key \"Eb major\" --bars 16 --beats-per-bar 3\n"
+    "  brindle markov generate model.json --form blues --key F --show-quotes\n"
+    "  brindle markov generate --sheet \"C | _ | _ | G7 | _ | _ | G7 | C\" --format svg\n"
+    "  brindle markov generate --contains \"ii-V-I of F\" --never \"Bdim\" --ends Am\n"
+    "\n"
+    "With a plain model:\n"
+    "  brindle markov generate plain.json --beats 32\n"
+    "  brindle markov generate plain.json --template \"(4,C);(8,U);(4,C)\" --seed 1\n"
+    "  brindle markov generate plain.json --beats 64 --order 2 --midi song.mid\n"
     "\n"
     "In a template the U are gaps, to be filled with chords of their length together.\n",
 };
@@ -30,6 +39,7 @@ constexpr std::uint64_t kShortestOrder = 1;
 constexpr std::uint64_t kMostAttempts = 10'000'000;
 
 struct CGenerateOptions {
+    CWriteOptions mSong;
     std::string mModel;
     double mBeats = 0.0;
     std::string mTemplate;
@@ -46,6 +56,7 @@ struct CGenerateOptions {
     int mBeatsPerBar = 4;
     std::optional<std::string> mMidi;
     double mTempo = 100.0;
+    bool mIsPlain = false;
     CFormatOptions mFormat;
 };
 
@@ -160,7 +171,40 @@ std::string GeneratedText(const CGenerated& generated, const CGenerateOptions& o
            OthersText(generated, options, spelling, paint);
 }
 
+/// Whether the file is a plain model: what makes sequences and writes no songs.
+bool IsPlainModel(const std::string& path) {
+    if (path.empty() || path == kBuiltInName) return false;
+    const auto text = ReadWholeFile(path);
+    return text && !LooksLikeSongModel(*text);
+}
+
+bool ArePlainOptionsTold(const CGenerateOptions& options) {
+    const CGenerateOptions none;
+    return options.mBeats != none.mBeats || !options.mTemplate.empty() ||
+           options.mSamples != none.mSamples || options.mMinOrder != none.mMinOrder ||
+           options.mEvidence != none.mEvidence || options.mMinEntropy != none.mMinEntropy ||
+           options.mIsStrict || options.mAllEqualFactor != none.mAllEqualFactor ||
+           options.mAttempts != none.mAttempts || options.mOthers != none.mOthers;
+}
+
+TStatus WriteSongOf(const CGenerateOptions& options) {
+    if (ArePlainOptionsTold(options)) {
+        return Fail(TStatus::BadUsage,
+                    "these options are for a plain model; brindle markov learn --plain makes one");
+    }
+    if (options.mMidi == "") return Fail(TStatus::BadUsage, "--midi needs the name of a file");
+    CWriteOptions song = options.mSong;
+    song.mModel = options.mModel;
+    return MarkovWrite(song, {options.mOrder, options.mBeatsPerBar, options.mSeed, options.mMidi,
+                              options.mTempo, options.mFormat.Format()});
+}
+
 TStatus MarkovGenerate(const CGenerateOptions& options) {
+    if (!options.mIsPlain && !IsPlainModel(options.mModel)) return WriteSongOf(options);
+    if (options.mSong.AreTold() || options.mFormat.Format() == TFormat::Svg) {
+        return Fail(TStatus::BadUsage, "options for songs have no effect with a plain model");
+    }
+    if (options.mModel.empty()) return Fail(TStatus::BadUsage, "--plain needs a model file");
     if (const auto contradiction = Contradiction(options)) {
         return Fail(TStatus::BadUsage, *contradiction);
     }
@@ -217,7 +261,11 @@ void AddHistoryOptions(CCommand& command, CGenerateOptions& options) {
 void AddMarkovGenerate(CCommand& markov) {
     CCommand& command = markov.AddCommand(kMarkovGenerateHelp);
     const auto options = std::make_shared<CGenerateOptions>();
-    command.AddArgument("MODEL", options->mModel, "Model file; - reads standard input").Required();
+    command.AddArgument("MODEL", options->mModel,
+                        "Model file; - reads standard input (default: the built-in songs)");
+    options->mSong.AddTo(command);
+    command.AddFlag("--plain", options->mIsPlain,
+                    "Take the model for a plain one, which its file tells if it is no -");
     command.AddOption("--beats", "BEATS", options->mBeats, "Length of the sequence")
         .InRange(1.0, kMostBeatsOfSequence);
     command.AddOption("--template", "CHORDS", options->mTemplate,
@@ -237,7 +285,7 @@ void AddMarkovGenerate(CCommand& markov) {
     command.AddOption("--midi", "PATH", options->mMidi, "Write the sequence as a MIDI file");
     command.AddOption("--tempo", "BPM", options->mTempo, "Beats per minute of that (default: 100)")
         .InRange(10.0, 1000.0);
-    options->mFormat.AddTo(command, {"text", "json"});
+    options->mFormat.AddTo(command, {"text", "json", "svg"});
     command.OnCall([options] { return MarkovGenerate(*options); });
 }
 

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "cli/ChordSources.h"
 #include "cli/Markov.h"
+#include "cli/MarkovSongs.h"
 #include "cli/Progress.h"
 
 #include "brindle/present/ShownNames.h"
@@ -18,18 +19,25 @@ constexpr CCommandHelp kMarkovLearnHelp{
     "learn",
     "Learn which chord follows which in lead sheets, chord strings and chord texts",
     "  brindle markov learn -o model.json song.musicxml songs/\n"
-    "  brindle markov learn --order 2 --simplify -o model.json songs/\n"
+    "  brindle markov learn --with-built-in -o model.json songs/\n"
+    "  brindle markov learn --plain --order 2 --simplify -o plain.json songs/\n"
     "\n"
+    "A model of songs has its chords by key and bar. A plain one has chords with lengths in\n"
+    "beats, in the keys that they were written in, and is for generate, fill and show.\n"
     "Lead sheets are read as they are played. A chord string has lengths in beats,\n"
     "(4,C);(2,F);(2,G7); a chord text has a | before each bar and a . for a beat that a\n"
     "chord is held on. Folders are walked for .xml, .musicxml, .mxl and .txt.\n",
 };
 
+constexpr std::uint64_t kUsualOrder = 3;
+
 struct CLearnOptions {
     std::vector<std::string> mFiles;
     std::string mModel;
-    std::uint64_t mOrder = 3;
+    std::uint64_t mOrder = kUsualOrder;
     bool mSimplify = false;
+    bool mIsPlain = false;
+    bool mWithBuiltIn = false;
     double mBeatsPerBar = 4.0;
     CTypedChords mReading;
     CFormatOptions mFormat;
@@ -111,6 +119,14 @@ void ReportUnread(const CLearned& learned) {
 }
 
 TStatus MarkovLearn(const CLearnOptions& options) {
+    if (!options.mIsPlain) {
+        if (options.mSimplify || options.mOrder != kUsualOrder) {
+            return Fail(TStatus::BadUsage, "--order and --simplify are for --plain");
+        }
+        return MarkovLearnSongs({options.mFiles, options.mModel, options.mBeatsPerBar,
+                                 options.mWithBuiltIn, options.mFormat.Format() == TFormat::Json});
+    }
+    if (options.mWithBuiltIn) return Fail(TStatus::BadUsage, "--with-built-in is not for --plain");
     VariableLengthMarkovModel model(options.mOrder);
     const CLearned learned = LearnFiles(model, options);
     ReportUnread(learned);
@@ -133,10 +149,15 @@ void AddMarkovLearn(CCommand& markov) {
     command.AddArgument("FILES", options->mFiles, "Files and folders").Required();
     command.AddOption("-o,--output", "MODEL", options->mModel, "The model file that is written")
         .Required();
-    command.AddOption("--order", "N", options->mOrder, "Longest history, in chords (default: 3)")
+    command.AddFlag("--with-built-in", options->mWithBuiltIn, "Learn the built-in songs, too");
+    command.AddFlag("--plain", options->mIsPlain,
+                    "Make a plain model, of chords with lengths and without keys");
+    command
+        .AddOption("--order", "N", options->mOrder,
+                   "Longest history of a plain model, in chords (default: 3)")
         .InRange(std::uint64_t{1}, kLongestOrder);
     command.AddFlag("--simplify", options->mSimplify,
-                    "Make each chord a triad without bass that lasts 4 beats");
+                    "For a plain model, make each chord a triad without bass that lasts 4 beats");
     command
         .AddOption("--beats-per-bar", "BEATS", options->mBeatsPerBar,
                    "Length of a bar of chord texts in beats (default: 4)")

@@ -52,10 +52,14 @@ MORE_COMMANDS = [
     "vector Db7/B --json",
     "import examples/scores/frere-jacques.musicxml --json",
     "import examples/no-such-score.musicxml --json",
-    "markov learn --json -o {folder}/model.json examples/songs leadsheets",
+    "markov learn --plain --json -o {folder}/model.json examples/songs leadsheets",
     "markov generate {folder}/model.json --beats 16 --seed 1 --json",
     'markov fill {folder}/model.json "(4,C);(4,U);(4,G7)" --seed 1 --json',
     "markov show {folder}/model.json --json",
+    "markov learn --json -o {folder}/songs.json examples/songs leadsheets",
+    "markov generate --seed 1 --json",
+    'markov next "Dm7 G7" --json',
+    "markov score built-in --json",
 ]
 TWO_WORDS = {"grids", "net", "markov"}
 # What prints JSON without being asked, and what prints a line of it for each event.

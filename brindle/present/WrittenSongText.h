@@ -1,0 +1,26 @@
+// SPDX-License-Identifier: MIT
+#pragma once
+
+#include "brindle/present/MidiFile.h"
+#include "brindle/song/WriteSong.h"
+
+#include <cstdint>
+#include <string>
+
+namespace brindle {
+
+/// A song as a chord text, four bars a line, each part under its letter in brackets.
+[[nodiscard]] std::string WrittenSongText(const CSong& song);
+
+/// "the longest quote: 2.5 bars from bar 5 on are bars 1 to 3 of Amazing Grace"; empty for none.
+[[nodiscard]] std::string QuoteText(const CWrittenQuote& quote);
+
+/// The song with the reading of its chords as JSON; docs/json.md has the members.
+[[nodiscard]] std::string WrittenSongJson(const CWrittenSong& written, const std::string& form,
+                                          std::uint64_t seed);
+
+/// A song for two tracks, chords and bass. Each chord is laid so that its tones are near to those
+/// of the chord before, around the E above middle C. `tempo` is beats a minute.
+[[nodiscard]] CMidiPiece MidiPieceOfSong(const CSong& song, double tempo);
+
+}  // namespace brindle

@@ -1,0 +1,50 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/song/BuiltInSongs.h"
+
+#include "brindle/song/ReadSong.h"
+#include "brindle/song/internal/BuiltInSongs_Table.h"
+#include "brindle/theory/ReadKeyText.h"
+
+#include <set>
+
+namespace brindle {
+namespace {
+
+CSong BuiltInSong(const CBuiltInSongRow& row) {
+    CSongOptions options;
+    options.mBeatsPerBar = row.mBeatsPerBar;
+    options.mEven = row.mBeatsPerChord == 0.0;
+    if (!options.mEven) options.mBeatsPerChord = row.mBeatsPerChord;
+    options.mFormat = options.mEven ? TSongFormat_EvenText : TSongFormat_ChordText;
+    CSong song = ReadSong(row.mText, options);
+    song.mTitle = row.mTitle;
+    song.mMakers = row.mMakers;
+    song.mStyle = row.mStyle;
+    const CSignKeyLite key = ReadKeyText(row.mKey).mSignKey;
+    if (*row.mKey != '\0' && !key.IsUndef()) song.mStatedKey = key;
+    return song;
+}
+
+}  // namespace
+
+std::vector<CSong> BuiltInSongs() {
+    std::vector<CSong> songs;
+    for (const CBuiltInSongRow& row : BuiltInSongRows()) songs.push_back(BuiltInSong(row));
+    return songs;
+}
+
+std::vector<std::string> BuiltInStyles() {
+    std::set<std::string> styles;
+    for (const CBuiltInSongRow& row : BuiltInSongRows()) styles.insert(row.mStyle);
+    return {styles.begin(), styles.end()};
+}
+
+CSongModel BuiltInSongModel(std::string_view style) {
+    std::vector<CTaughtSong> songs;
+    for (const CBuiltInSongRow& row : BuiltInSongRows()) {
+        if (style.empty() || style == row.mStyle) songs.push_back(TeachSong(BuiltInSong(row)));
+    }
+    return CSongModel(std::move(songs));
+}
+
+}  // namespace brindle

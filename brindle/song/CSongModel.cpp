@@ -1,0 +1,189 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/song/CSongModel.h"
+
+#include <algorithm>
+#include <cmath>
+#include <numeric>
+
+namespace brindle {
+namespace {
+
+std::int32_t TickInBar(std::int32_t tick) {
+    return ((tick % kTicksPerBar) + kTicksPerBar) % kTicksPerBar;
+}
+
+}  // namespace
+
+TBarPlace BarPlaceOf(std::int32_t tick) {
+    const std::int32_t within = TickInBar(tick);
+    if (within == kTicksPerBar / 2) return TBarPlace_Middle;
+    if (within != 0) return TBarPlace_Weak;
+    const std::int32_t bar = (tick - within) / kTicksPerBar;
+    return static_cast<TBarPlace>(((bar % 4) + 4) % 4);
+}
+
+CSongModel::CSongModel(std::vector<CTaughtSong> songs) : mSongs(std::move(songs)) {
+    std::erase_if(mSongs, [](const CTaughtSong& song) { return song.mChords.empty(); });
+    for (std::size_t index = 0; index < mSongs.size(); ++index) AddSong(index);
+    SortHistories();
+    CountPlaces();
+    CountSuccessors();
+    CountLengths();
+    CountKinds();
+    PredictAlone();
+}
+
+void CSongModel::AddSong(std::size_t index) {
+    const CTaughtSong& song = mSongs[index];
+    const auto songNumber = static_cast<std::int32_t>(index);
+    mPlaces.push_back(
+        {StartId(song.mKey.mSignKeyType == TSignKeyType_Minor), 0, songNumber, TBarPlace_Weak});
+    for (const CTaughtChord& chord : song.mChords) {
+        const auto next = static_cast<std::int32_t>(mVocabulary.size());
+        const auto [known, isNew] = mIds.try_emplace(chord.mChord.Code(), next);
+        if (isNew) mVocabulary.push_back(chord.mChord);
+        mPlaces.push_back({known->second, chord.mLength, songNumber, BarPlaceOf(chord.mBegin)});
+    }
+}
+
+std::int32_t CSongModel::IdOf(const CRelativeChord& chord) const {
+    const auto known = mIds.find(chord.Code());
+    return known == mIds.end() ? -1 : known->second;
+}
+
+/// The chord `back` places before a place; that before the start of a song is -1.
+std::int32_t CSongModel::IdAhead(std::size_t place, std::size_t back) const {
+    return place < back || mPlaces[place - back].mSong != mPlaces[place].mSong
+               ? -1
+               : mPlaces[place - back].mId;
+}
+
+void CSongModel::SortHistories() {
+    // The newest chords of a history side by side, so that most comparisons look at one word.
+    struct CKeyed {
+        std::uint64_t mNewest;
+        std::uint32_t mPlace;
+    };
+    std::vector<CKeyed> keyed;
+    keyed.reserve(mPlaces.size());
+    const auto word = [this](std::size_t place, std::size_t back) {
+        return static_cast<std::uint64_t>(IdAhead(place, back) + 3);
+    };
+    for (std::size_t place = 0; place < mPlaces.size(); ++place) {
+        if (mPlaces[place].mId < 0) continue;
+        keyed.push_back(
+            {word(place, 1) << 32U | word(place, 2), static_cast<std::uint32_t>(place)});
+    }
+    std::sort(keyed.begin(), keyed.end(), [this](const CKeyed& a, const CKeyed& b) {
+        if (a.mNewest != b.mNewest) return a.mNewest < b.mNewest;
+        for (std::size_t back = 3; back <= kLongestHistory; ++back) {
+            const std::int32_t idOfA = IdAhead(a.mPlace, back);
+            const std::int32_t idOfB = IdAhead(b.mPlace, back);
+            if (idOfA != idOfB) return idOfA < idOfB;
+        }
+        return a.mPlace < b.mPlace;
+    });
+    mByHistory.reserve(keyed.size());
+    for (const CKeyed& entry : keyed) mByHistory.push_back(entry.mPlace);
+}
+
+void CSongModel::CountPlaces() {
+    mPlaceCounts.resize(mVocabulary.size());
+    mChordBegins.assign(mVocabulary.size() + 1, 0);
+    for (const CPlace& place : mPlaces) {
+        if (place.mId < 0) continue;
+        ++mPlaceCounts[static_cast<std::size_t>(place.mId)][place.mBarPlace];
+        ++mChordBegins[static_cast<std::size_t>(place.mId) + 1];
+    }
+    std::partial_sum(mChordBegins.begin(), mChordBegins.end(), mChordBegins.begin());
+    mByChord.resize(mByHistory.size());
+    std::vector<std::size_t> next(mChordBegins.begin(), mChordBegins.end() - 1);
+    for (std::size_t place = 0; place < mPlaces.size(); ++place) {
+        if (mPlaces[place].mId < 0) continue;
+        mByChord[next[static_cast<std::size_t>(mPlaces[place].mId)]++] =
+            static_cast<std::uint32_t>(place);
+    }
+    mEndCounts.assign(mVocabulary.size(), 0);
+    std::size_t place = 0;
+    for (const CTaughtSong& song : mSongs) {
+        ++place;
+        for (const CTaughtChord& chord : song.mChords) {
+            mEndCounts[static_cast<std::size_t>(mPlaces[place++].mId)] += chord.mEndsSection;
+        }
+    }
+}
+
+void CSongModel::CountSuccessors() {
+    mSuccessorBegins.assign(1, 0);
+    std::vector<std::uint64_t> followers;
+    const auto count = static_cast<std::int32_t>(mVocabulary.size());
+    // In the order of SuccessorsOf: both starts, then the chords.
+    for (std::int32_t id = -3; id < count; ++id) {
+        if (id == -1) continue;
+        const CRange range = Narrowed({0, mByHistory.size()}, id, 1);
+        followers.clear();
+        for (std::size_t ix = range.mBegin; ix < range.mEnd; ++ix) {
+            const CPlace& place = mPlaces[mByHistory[ix]];
+            followers.push_back(static_cast<std::uint64_t>(place.mId) << 8U | place.mBarPlace);
+        }
+        std::sort(followers.begin(), followers.end());
+        for (std::size_t ix = 0; ix < followers.size(); ++ix) {
+            const bool isNew = ix == 0 || followers[ix] >> 8U != followers[ix - 1] >> 8U;
+            if (isNew)
+                mSuccessors.push_back({static_cast<std::int32_t>(followers[ix] >> 8U), 0, {}});
+            ++mSuccessors.back().mCount;
+            ++mSuccessors.back().mCountsAt[followers[ix] & 0xFFU];
+        }
+        mSuccessorBegins.push_back(mSuccessors.size());
+    }
+}
+
+void CSongModel::CountLengths() {
+    std::map<std::array<std::int32_t, 3>, std::map<std::int32_t, std::uint32_t>> counts;
+    for (const CTaughtSong& song : mSongs) {
+        const auto beats = static_cast<std::int32_t>(std::lround(song.mBeatsPerBar));
+        std::int32_t before = 0;
+        for (const CTaughtChord& chord : song.mChords) {
+            const std::int32_t tick = TickInBar(chord.mBegin);
+            ++counts[{beats, tick, 0}][chord.mLength];
+            if (before != 0) ++counts[{beats, tick, before}][chord.mLength];
+            before = chord.mLength;
+        }
+    }
+    for (const auto& [key, lengths] : counts) mLengths[key].assign(lengths.begin(), lengths.end());
+}
+
+std::uint32_t CSongModel::CountOf(std::int32_t id) const {
+    return static_cast<std::uint32_t>(PlacesOf(id).size());
+}
+
+std::uint32_t CSongModel::EndCountOf(std::int32_t id) const {
+    return mEndCounts[static_cast<std::size_t>(id)];
+}
+
+std::span<const std::uint32_t> CSongModel::PlacesOf(std::int32_t id) const {
+    const auto index = static_cast<std::size_t>(id);
+    return std::span(mByChord).subspan(mChordBegins[index],
+                                       mChordBegins[index + 1] - mChordBegins[index]);
+}
+
+std::span<const CSongModel::CSuccessor> CSongModel::SuccessorsOf(std::int32_t id) const {
+    if (id == -1 || mSuccessorBegins.empty()) return {};
+    const auto index = static_cast<std::size_t>(id < 0 ? id + 3 : id + 2);
+    return std::span(mSuccessors)
+        .subspan(mSuccessorBegins[index], mSuccessorBegins[index + 1] - mSuccessorBegins[index]);
+}
+
+const CLengthCounts& CSongModel::LengthsAt(int beatsPerBar, std::int32_t tickInBar,
+                                           std::int32_t lengthBefore) const {
+    static const CLengthCounts none;
+    const auto found = mLengths.find({beatsPerBar, tickInBar, lengthBefore});
+    return found == mLengths.end() ? none : found->second;
+}
+
+bool CSongModel::KnowsMetre(int beatsPerBar) const {
+    const auto found = mLengths.lower_bound({beatsPerBar, 0, 0});
+    return found != mLengths.end() && found->first[0] == beatsPerBar;
+}
+
+}  // namespace brindle

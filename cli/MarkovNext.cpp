@@ -1,0 +1,107 @@
+// SPDX-License-Identifier: MIT
+#include "cli/Input.h"
+#include "cli/Json.h"
+#include "cli/KeyText.h"
+#include "cli/MarkovSongs.h"
+#include "cli/TypedChords.h"
+
+#include "brindle/chords/WriteChordSymbol.h"
+#include "brindle/present/CTable.h"
+#include "brindle/present/TonalityName.h"
+#include "brindle/song/NextChords.h"
+
+#include <fmt/format.h>
+
+#include <memory>
+
+namespace brindle::cli {
+namespace {
+
+constexpr CCommandHelp kNextHelp{
+    "next",
+    "Rank the chords that may come next",
+    "  brindle markov next \"Dm7 G7\"\n"
+    "  brindle markov next \"Am F\" --key \"A minor\" --style folk\n"
+    "  brindle markov next \"Dm7 G7\" --model songs.json --json\n",
+};
+
+struct CNextOptions {
+    std::vector<std::string> mWords;
+    std::string mModel;
+    std::string mStyle;
+    std::string mKey;
+    std::uint64_t mCount = 10;
+    std::uint64_t mOrder = CSongModel::kLongestHistory;
+    CTypedChords mReading;
+    CFormatOptions mFormat;
+};
+
+/// Chords between white space; bar lines do not count.
+std::optional<std::vector<CChordLite>> TypedRow(const CNextOptions& options) {
+    const auto text = TextFromWords(options.mWords);
+    if (!text) return std::nullopt;
+    std::vector<std::string> words = WordsOf(FoldAccidentals(*text));
+    std::erase_if(words, [](const std::string& word) { return word == "|" || word == "."; });
+    return options.mReading.ReadSymbols(words);
+}
+
+std::string NextJson(const CNextChords& next) {
+    Json chords = Json::array();
+    for (const CNextChord& chord : next.mChords) {
+        chords.push_back({{"Symbol", WriteChordSymbol(chord.mChord)},
+                          {"Probability", NumberToJson(chord.mProbability)},
+                          {"Numeral", chord.mNumeral},
+                          {"Function", std::string(NameOf(chord.mFunction))}});
+    }
+    return JsonText({{"Key", TonalityName(next.mKey)}, {"Chords", chords}});
+}
+
+std::string NextText(const CNextChords& next, const CPaint& paint) {
+    CTable table({" probability", "chord", "numeral", "function"});
+    for (const CNextChord& chord : next.mChords) {
+        table.AddRow({fmt::format("{:.3f}", chord.mProbability), WriteChordSymbol(chord.mChord),
+                      chord.mNumeral, std::string(NameOf(chord.mFunction))});
+    }
+    return fmt::format("in {}\n\n{}", TonalityName(next.mKey), table.Text(paint));
+}
+
+TStatus MarkovNext(const CNextOptions& options) {
+    const auto chords = TypedRow(options);
+    if (!chords) return TStatus::BadUsage;
+    CNextChordOptions asked;
+    if (!options.mKey.empty()) {
+        const auto key = ReadKeyOption(options.mKey);
+        if (!key) return TStatus::BadUsage;
+        asked.mKey = *key;
+    }
+    asked.mCount = options.mCount;
+    asked.mOrder = options.mOrder;
+    const auto model = ReadSongModelFile(options.mModel, options.mStyle);
+    if (!model) return TStatus::BadInput;
+    const CNextChords next = NextChords(*model, *chords, asked);
+    if (next.mKey.IsUndef()) {
+        return Fail(TStatus::BadUsage, "without a chord --key is needed");
+    }
+    return Print(options.mFormat.Format() == TFormat::Json ? NextJson(next)
+                                                           : NextText(next, PaintOfOutput()));
+}
+
+}  // namespace
+
+void AddMarkovNext(CCommand& markov) {
+    CCommand& command = markov.AddCommand(kNextHelp);
+    const auto options = std::make_shared<CNextOptions>();
+    command.AddArgument("CHORDS", options->mWords, "The chords before; - reads standard input");
+    command.AddOption("--model", "MODEL", options->mModel,
+                      "Model file of songs (default: the built-in one)");
+    command.AddOption("--style", "STYLE", options->mStyle, "Only from songs of this style");
+    command.AddOption("--key", "KEY", options->mKey, "Key of the chords (default: found)");
+    command.AddOption("--top", "N", options->mCount, "Chords to show (default: 10)");
+    command.AddOption("--order", "N", options->mOrder, "Longest history, in chords (default: 5)")
+        .InRange(std::uint64_t{1}, std::uint64_t{CSongModel::kLongestHistory});
+    options->mReading.AddTo(command);
+    options->mFormat.AddTo(command, {"text", "json"});
+    command.OnCall([options] { return MarkovNext(*options); });
+}
+
+}  // namespace brindle::cli

@@ -1,0 +1,116 @@
+// SPDX-License-Identifier: MIT
+#include "cli/MarkovSongs.h"
+
+#include "cli/ChordSources.h"
+#include "cli/Input.h"
+#include "cli/Json.h"
+#include "cli/Progress.h"
+
+#include "brindle/platform/AtomicFile.h"
+#include "brindle/song/BuiltInSongs.h"
+#include "brindle/song/ReadSong.h"
+#include "brindle/song/SongModelFile.h"
+
+#include <fmt/format.h>
+
+#include <algorithm>
+#include <filesystem>
+#include <set>
+
+namespace brindle::cli {
+namespace {
+
+/// The songs of a style, and what styles there are if there is none of it.
+std::optional<CSongModel> OfStyle(const CSongModel& model, const std::string& style) {
+    if (style.empty()) return model;
+    std::vector<CTaughtSong> songs;
+    std::set<std::string> styles;
+    for (const CTaughtSong& song : model.Songs()) {
+        if (song.mStyle == style) songs.push_back(song);
+        if (!song.mStyle.empty()) styles.insert(song.mStyle);
+    }
+    if (songs.empty()) {
+        Fail(TStatus::BadUsage,
+             fmt::format("--style: the model has no songs of the style {}; it has {}",
+                         Printable(style),
+                         styles.empty() ? "none" : fmt::format("{}", fmt::join(styles, ", "))));
+        return std::nullopt;
+    }
+    return CSongModel(std::move(songs));
+}
+
+/// A song without a title has the name of its file.
+void TakeTitle(const std::string& path, CSong& song) {
+    if (song.mTitle.empty()) song.mTitle = std::filesystem::path(path).stem().string();
+}
+
+std::string LearnedSongsText(const CSongModel& model, std::size_t files, bool isJson) {
+    const std::size_t songs = model.Songs().size();
+    if (isJson) {
+        return JsonText({{"Files", files},
+                         {"Songs", songs},
+                         {"Chords", model.ChordCount()},
+                         {"DifferentChords", model.VocabularySize()}});
+    }
+    return fmt::format("learned {} {} from {} {}: {} chords, {} different ones\n", songs,
+                       songs == 1 ? "song" : "songs", files, files == 1 ? "file" : "files",
+                       model.ChordCount(), model.VocabularySize());
+}
+
+}  // namespace
+
+std::optional<CSongModel> ReadSongModelFile(const std::string& path, const std::string& style) {
+    if (path.empty() || path == kBuiltInName) return OfStyle(BuiltInSongModel(), style);
+    const auto text = ReadInput(path);
+    if (!text) return std::nullopt;
+    CSongModelReading reading = ReadSongModel(*text);
+    if (reading.mFault.empty()) return OfStyle(reading.mModel, style);
+    const std::string name = path == "-" ? "standard input" : Printable(path);
+    Fail(TStatus::BadInput,
+         fmt::format("{} {}; brindle markov learn makes one", name, reading.mFault));
+    return std::nullopt;
+}
+
+CTaughtFiles TeachFiles(const std::vector<std::string>& paths, double beatsPerBar) {
+    CTaughtFiles taught;
+    CSongOptions reading;
+    reading.mBeatsPerBar = beatsPerBar;
+    const std::vector<CFoundFile> files = FindChordSources(paths);
+    CProgress progress(files.size());
+    for (const CFoundFile& file : files) {
+        progress.Step(file.mPath);
+        std::size_t learned = 0;
+        std::string fault = "there are no chords in it";
+        for (CSong& song : ReadSongsFile(file.mPath, reading)) {
+            if (song.HasFault()) fault = song.mFaults.front().mText;
+            TakeTitle(file.mPath, song);
+            CTaughtSong one = TeachSong(song);
+            if (song.HasFault() || one.mChords.empty()) continue;
+            taught.mSongs.push_back(std::move(one));
+            ++learned;
+        }
+        taught.mFiles += learned > 0 ? 1 : 0;
+        if (learned > 0) continue;
+        Fail(TStatus::BadInput,
+             fmt::format("{} was left out: {}", Printable(file.mPath), Printable(fault)));
+        taught.mIsNamedFileUnread = taught.mIsNamedFileUnread || file.mIsNamed;
+    }
+    return taught;
+}
+
+TStatus MarkovLearnSongs(const CLearnSongsOptions& options) {
+    CTaughtFiles taught = TeachFiles(options.mFiles, options.mBeatsPerBar);
+    if (taught.mSongs.empty()) return Fail(TStatus::BadInput, "there was nothing to learn");
+    if (options.mWithBuiltIn) {
+        for (const CSong& song : BuiltInSongs()) taught.mSongs.push_back(TeachSong(song));
+    }
+    const CSongModel model(std::move(taught.mSongs));
+    if (!WriteFileAtomically(options.mModel, SongModelText(model))) {
+        return Fail(TStatus::BadInput,
+                    fmt::format("{} cannot be written", Printable(options.mModel)));
+    }
+    const TStatus printed = Print(LearnedSongsText(model, taught.mFiles, options.mJson));
+    return taught.mIsNamedFileUnread ? TStatus::BadInput : printed;
+}
+
+}  // namespace brindle::cli

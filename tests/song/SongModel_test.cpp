@@ -1,0 +1,134 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/song/CSongModel.h"
+
+#include "brindle/chords/ReadChordText.h"
+#include "brindle/chords/WriteChordSymbol.h"
+#include "brindle/song/BuiltInSongs.h"
+#include "brindle/song/NextChords.h"
+#include "brindle/song/ReadSong.h"
+#include "brindle/song/ScoreSongs.h"
+#include "brindle/song/SongModelFile.h"
+
+#include <doctest/doctest.h>
+
+#include <numeric>
+#include <string>
+#include <vector>
+
+namespace {
+
+using namespace brindle;
+
+CChordLite Chord(const char* symbol) {
+    return ReadChordText(symbol).mChord;
+}
+
+CTaughtSong Taught(const std::string& text) {
+    CSongOptions options;
+    options.mEven = true;
+    return TeachSong(ReadSong(text, options));
+}
+
+}  // namespace
+
+TEST_CASE("The same song in two keys is learned as one") {
+    const CTaughtSong inC = Taught("C | Am | Dm7 | G7 | C | Am | F Fm | C");
+    const CTaughtSong inEb = Taught("Eb | Cm | Fm7 | Bb7 | Eb | Cm | Ab Abm | Eb");
+    REQUIRE(inC.mChords.size() == 9);
+    CHECK(inC.mChords == inEb.mChords);
+    CHECK(inC.mChords[7].mBegin == 6 * kTicksPerBar + kTicksPerBar / 2);
+    CHECK(inC.mChords[7].mLength == kTicksPerBar / 2);
+    CHECK(inC.mChords.back().mEndsSection);
+}
+
+TEST_CASE("A taught song is written again as it was, with its changes of key") {
+    const std::string text = "C | Am | Dm7 G7 | C | Fm7 | Bb7 | Ebmaj7 | Abmaj7 | Dm7b5 G7 | C";
+    CSongOptions options;
+    options.mEven = true;
+    const CSong song = ReadSong(text, options);
+    const std::vector<CChordLite> written = WrittenChordsOf(TeachSong(song));
+    REQUIRE(written.size() + 1 == song.mChords.size());
+    for (std::size_t ix = 0; ix < written.size(); ++ix) {
+        CHECK(WriteChordSymbol(written[ix]) == song.mSymbols[ix]);
+    }
+}
+
+TEST_CASE("Codes of chords read back, and what is no code is none") {
+    const CSongModel model = BuiltInSongModel();
+    for (const CTaughtSong& song : model.Songs()) {
+        for (const CTaughtChord& chord : song.mChords) {
+            CHECK(CRelativeChord::FromCode(chord.mChord.Code()) == chord.mChord);
+        }
+    }
+    for (const std::uint32_t code : {0U, 0x1000U, 0xC0091U, 0xC00091U, 0xD091U, 0x2000091U}) {
+        CHECK_FALSE(CRelativeChord::FromCode(code));
+    }
+}
+
+TEST_CASE("Probabilities behind any history leave little and never too much") {
+    const CSongModel model = BuiltInSongModel();
+    const auto size = static_cast<std::int32_t>(model.VocabularySize());
+    std::vector<double> probabilities;
+    for (std::int32_t id = 0; id < size; ++id) {
+        const std::vector<std::int32_t> history = {CSongModel::StartId(false), 0, id % 7, id};
+        for (std::size_t order = 0; order <= CSongModel::kLongestHistory; ++order) {
+            model.Predict(history, static_cast<TBarPlace>(id % 6), order, probabilities);
+            const double sum = std::accumulate(probabilities.begin(), probabilities.end(), 0.0);
+            CHECK(sum <= 1.0 + 1e-9);
+            CHECK(sum > 0.9);
+        }
+    }
+}
+
+TEST_CASE("What followed in the songs is the likeliest") {
+    const CSongModel model({Taught("C | F | G7 | C | C | F | G7 | C | C | Am | G7 | C")});
+    const CNextChords next =
+        NextChords(model, std::vector{Chord("Ab"), Chord("Bb7")}, {CSignKeyLite("Eb major"), 3});
+    REQUIRE(next.mChords.size() == 3);
+    CHECK(WriteChordSymbol(next.mChords[0].mChord) == "Eb");
+    CHECK(next.mChords[0].mNumeral == "I");
+    CHECK(next.mChords[0].mFunction == THarmFunction_Tonic);
+    CHECK(next.mChords[0].mProbability > 0.5);
+    CHECK(next.mChords[1].mProbability < next.mChords[0].mProbability);
+}
+
+TEST_CASE("A file of a model reads back, and a damaged one is refused") {
+    const CSongModel model = BuiltInSongModel("hymn");
+    const std::string text = SongModelText(model);
+    const CSongModelReading read = ReadSongModel(text);
+    REQUIRE(read.mFault == "");
+    CHECK(read.mModel.Songs() == model.Songs());
+    CHECK(SongModelText(read.mModel) == text);
+    // Any byte that is another one, and any end that is missing.
+    for (std::size_t at = 0; at + 1 < text.size(); at += 41) {
+        std::string damaged = text;
+        damaged[at] = damaged[at] == '1' ? '2' : '1';
+        const CSongModelReading other = ReadSongModel(damaged);
+        CHECK_MESSAGE((!other.mFault.empty() || other.mModel.Songs() == model.Songs()), at);
+        CHECK_FALSE(ReadSongModel(text.substr(0, at)).mFault.empty());
+    }
+    CHECK(ReadSongModel(R"({"BrindleSongModel":2,"Sum":"","Songs":[]})").mFault ==
+          "is a song model of version 2, and this program reads version 1");
+    CHECK(ReadSongModel("{}").mFault == "is no song model");
+}
+
+TEST_CASE("Songs are foretold better by their keys than without, at every length of history") {
+    const CSongModel model = BuiltInSongModel();
+    for (std::size_t order = 1; order <= CSongModel::kLongestHistory; ++order) {
+        const double relative = SumOfScores(ScoreSongs(model, model.Songs(), order)).BitsPerChord();
+        const double absolute =
+            SumOfScores(ScoreSongs(model, model.Songs(), order, false)).BitsPerChord();
+        CAPTURE(order);
+        CHECK(relative < 0.8 * absolute);
+        CHECK(relative > 1.0);
+    }
+}
+
+TEST_CASE("A song that was learned is foretold as if it had not been") {
+    const std::string text = "C | E7 | Am | D7 | G7 | Bb | A7 | Dm | G7 | C";
+    const std::vector<CTaughtSong> song = {Taught(text)};
+    std::vector<CTaughtSong> songs = BuiltInSongModel().Songs();
+    const double without = SumOfScores(ScoreSongs(CSongModel(songs), song, 3)).mBits;
+    songs.push_back(song.front());
+    CHECK(SumOfScores(ScoreSongs(CSongModel(songs), song, 3)).mBits == doctest::Approx(without));
+}

@@ -1,0 +1,240 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/song/WriteSong.h"
+
+#include "brindle/analysis/RomanNumeral.h"
+#include "brindle/chords/WriteChordSymbol.h"
+#include "brindle/song/BuiltInSongs.h"
+#include "brindle/theory/KeyIntervals.h"
+
+#include <doctest/doctest.h>
+
+#include <map>
+#include <string>
+#include <vector>
+
+namespace {
+
+using namespace brindle;
+
+const CSongModel& BuiltIn() {
+    static const CSongModel model = BuiltInSongModel();
+    return model;
+}
+
+CSignKeyLite KeyOf(const char* name) {
+    return CSignKeyLite(name);
+}
+
+CWriteSongOptions OptionsOf(const char* form, std::size_t bars, std::uint64_t seed) {
+    CWriteSongOptions options;
+    options.mForm = form;
+    options.mBars = bars;
+    options.mSeed = seed;
+    return options;
+}
+
+void Wish(CWriteSongOptions& options, TSongWishKind kind, const char* text) {
+    const CSongWishReading reading = ReadChordsWish(kind, text, options.mKey);
+    REQUIRE_MESSAGE(reading.mFault.empty(), reading.mFault);
+    options.mWishes.insert(options.mWishes.end(), reading.mWishes.begin(), reading.mWishes.end());
+}
+
+void WishSheet(CWriteSongOptions& options, const char* text) {
+    const CSongWishReading reading = ReadSheetWishes(text, options.mBeatsPerBar);
+    REQUIRE_MESSAGE(reading.mFault.empty(), reading.mFault);
+    options.mWishes.insert(options.mWishes.end(), reading.mWishes.begin(), reading.mWishes.end());
+}
+
+/// The symbol that sounds on each beat.
+std::vector<std::string> BeatsOf(const CSong& song) {
+    std::vector<std::string> beats;
+    for (std::size_t ix = 0; ix + 1 < song.mChords.size(); ++ix) {
+        const double length = song.mChords[ix + 1].mPosition - song.mChords[ix].mPosition;
+        beats.insert(beats.end(), static_cast<std::size_t>(length), song.mSymbols[ix]);
+    }
+    return beats;
+}
+
+int RootAboveTonic(const CSong& song, std::size_t chord) {
+    return FoldIntoOctave(song.mChords[chord].mRootKeyEnh.mKeyNr -
+                          song.mStatedKey->mRootKeyEnh.mKeyNr);
+}
+
+/// The longest run of equal chords and lengths in one learned song, found by comparing all places.
+double LongestQuoteByHand(const CSongModel& model, const CSong& song) {
+    std::vector<std::pair<CRelativeChord, std::int32_t>> row;
+    const CTaughtSong taught = TeachSong(song);
+    for (const CTaughtChord& chord : taught.mChords) row.emplace_back(chord.mChord, chord.mLength);
+    std::int32_t longest = 0;
+    for (const CTaughtSong& source : model.Songs()) {
+        for (std::size_t from = 0; from < source.mChords.size(); ++from) {
+            for (std::size_t at = 0; at < row.size(); ++at) {
+                std::int32_t length = 0;
+                for (std::size_t ix = 0; at + ix < row.size() && from + ix < source.mChords.size();
+                     ++ix) {
+                    const CTaughtChord& chord = source.mChords[from + ix];
+                    if (!(row[at + ix].first == chord.mChord) ||
+                        row[at + ix].second != chord.mLength) {
+                        break;
+                    }
+                    length += chord.mLength;
+                }
+                longest = std::max(longest, length);
+            }
+        }
+    }
+    return static_cast<double>(longest) / kTicksPerBar;
+}
+
+}  // namespace
+
+TEST_CASE("A written song fills its bars, ends on its tonic and is the same for the same seed") {
+    for (const char* const key : {"C major", "Eb major", "F# minor", "A minor"}) {
+        for (std::uint64_t seed = 1; seed <= 5; ++seed) {
+            CAPTURE(key);
+            CAPTURE(seed);
+            CWriteSongOptions options = OptionsOf("AABA", 32, seed);
+            options.mKey = KeyOf(key);
+            const CWrittenSong written = WriteSong(BuiltIn(), options);
+            REQUIRE(written.mFault == "");
+            CHECK(BeatsOf(written.mSong).size() == 32 * 4);
+            CHECK(RootAboveTonic(written.mSong, written.mSong.mChords.size() - 2) == 0);
+            CHECK(WriteSong(BuiltIn(), options).mSong.mSymbols == written.mSong.mSymbols);
+        }
+    }
+}
+
+TEST_CASE("Parts of one letter are the same up to their last two bars") {
+    for (std::uint64_t seed = 1; seed <= 5; ++seed) {
+        const CWrittenSong written = WriteSong(BuiltIn(), OptionsOf("AABA", 32, seed));
+        REQUIRE(written.mFault == "");
+        const std::vector<std::string> beats = BeatsOf(written.mSong);
+        const auto part = [&](std::size_t index, std::size_t bars) {
+            const auto begin = beats.begin() + static_cast<std::ptrdiff_t>(index * 32);
+            return std::vector<std::string>(begin, begin + static_cast<std::ptrdiff_t>(bars * 4));
+        };
+        CHECK(part(0, 6) == part(1, 6));
+        CHECK(part(1, 8) == part(3, 8));
+        CHECK(part(0, 6) != part(2, 6));
+    }
+}
+
+TEST_CASE("A sheet with gaps is filled and its chords stay where they are") {
+    CWriteSongOptions options = OptionsOf("", 8, 3);
+    // A chord that no song of the model has, in the middle of a bar.
+    WishSheet(options, "C | _ | _ F#m7b5/A | G7 | _ | Abmaj7 . . Db7 | _ | C");
+    const CWrittenSong written = WriteSong(BuiltIn(), options);
+    REQUIRE(written.mFault == "");
+    const std::vector<std::string> beats = BeatsOf(written.mSong);
+    REQUIRE(beats.size() == 32);
+    const std::map<std::size_t, std::string> wanted = {
+        {0, "C"},       {3, "C"},       {10, "F#m7b5/A"}, {11, "F#m7b5/A"}, {12, "G7"}, {15, "G7"},
+        {20, "Abmaj7"}, {22, "Abmaj7"}, {23, "Db7"},      {28, "C"},        {31, "C"}};
+    for (const auto& [beat, symbol] : wanted) {
+        CAPTURE(beat);
+        CHECK(beats[beat] == symbol);
+    }
+}
+
+TEST_CASE("Wishes are met in every key") {
+    for (const char* const name : {"C major", "Ab major", "B major", "D minor"}) {
+        for (std::uint64_t seed = 1; seed <= 3; ++seed) {
+            CAPTURE(name);
+            CAPTURE(seed);
+            CWriteSongOptions options = OptionsOf("AABA", 32, seed);
+            options.mKey = KeyOf(name);
+            Wish(options, TSongWish_Begin, "IV");
+            Wish(options, TSongWish_End, "V7");
+            Wish(options, TSongWish_Contains, "ii-V-I of E");
+            Wish(options, TSongWish_Never, "vi");
+            const CWrittenSong written = WriteSong(BuiltIn(), options);
+            REQUIRE(written.mFault == "");
+            const CSong& song = written.mSong;
+            CHECK(RootAboveTonic(song, 0) == 5);
+            CHECK(song.mSymbols.back() == WriteChordSymbol(*ChordFromNumeral("V7", options.mKey)));
+            bool isThere = false;
+            for (std::size_t ix = 0; ix + 3 < song.mChords.size(); ++ix) {
+                isThere = isThere || (song.mChords[ix].mRootKeyEnh.mKeyNr == 6 &&
+                                      song.mChords[ix + 1].mRootKeyEnh.mKeyNr == 11 &&
+                                      song.mChords[ix + 2].mRootKeyEnh.mKeyNr == 4);
+            }
+            CHECK(isThere);
+        }
+    }
+}
+
+TEST_CASE("Chords that are never wanted do not come") {
+    for (std::uint64_t seed = 1; seed <= 10; ++seed) {
+        CWriteSongOptions options = OptionsOf("AABA", 32, seed);
+        Wish(options, TSongWish_Never, "G7 F");
+        const CWrittenSong written = WriteSong(BuiltIn(), options);
+        REQUIRE(written.mFault == "");
+        for (const std::string& symbol : written.mSong.mSymbols) {
+            CHECK(symbol.substr(0, symbol.find('/')) != "G7");
+            CHECK(symbol.substr(0, symbol.find('/')) != "F");
+        }
+    }
+}
+
+TEST_CASE("The smallest set of wishes that contradict is told") {
+    CWriteSongOptions options = OptionsOf("", 8, 1);
+    WishSheet(options, "_ | Am | _ | G7");
+    Wish(options, TSongWish_Begin, "F");
+    Wish(options, TSongWish_Never, "G7 E7");
+    CHECK(WriteSong(BuiltIn(), options).mContradiction ==
+          std::vector<std::string>{"G7 in bar 4", "G7 E7"});
+
+    options.mWishes.clear();
+    WishSheet(options, "C | _ | _ | _");
+    Wish(options, TSongWish_Begin, "F");
+    CHECK(WriteSong(BuiltIn(), options).mContradiction ==
+          std::vector<std::string>{"C in bar 1", "F"});
+
+    // The first two parts of AABA begin alike.
+    options.mForm = "AABA";
+    options.mBars = 16;
+    options.mWishes.clear();
+    WishSheet(options, "C | _ | _ | _ | F | _ | _ | _");
+    CHECK(WriteSong(BuiltIn(), options).mContradiction ==
+          std::vector<std::string>{"C in bar 1", "F in bar 5"});
+}
+
+TEST_CASE("No passage longer than the limit stands in one song") {
+    for (const double limit : {1.0, 2.0, 4.0}) {
+        for (std::uint64_t seed = 1; seed <= 8; ++seed) {
+            CAPTURE(limit);
+            CAPTURE(seed);
+            CWriteSongOptions options = OptionsOf("", 16, seed);
+            options.mMostQuotedBars = limit;
+            const CWrittenSong written = WriteSong(BuiltIn(), options);
+            if (!written.mFault.empty()) continue;
+            CHECK(written.mLongestQuote.mBars <= limit);
+        }
+    }
+}
+
+TEST_CASE("The longest quote is found, and where it stands") {
+    CSong song = BuiltInSongs().front();
+    CTaughtSong taught = TeachSong(song);
+    const CSongModel model({taught});
+    CWriteSongOptions options = OptionsOf("", 8, 1);
+    options.mMostQuotedBars = 0.0;
+    for (std::uint64_t seed = 1; seed <= 10; ++seed) {
+        options.mSeed = seed;
+        const CWrittenSong written = WriteSong(model, options);
+        REQUIRE(written.mFault == "");
+        CHECK(written.mLongestQuote.mTitle == song.mTitle);
+        CHECK(written.mLongestQuote.mBars >= LongestQuoteByHand(model, written.mSong));
+    }
+}
+
+TEST_CASE("What cannot be written says why") {
+    CHECK(WriteSong(CSongModel{}, OptionsOf("", 8, 1)).mFault == "the model has learned nothing");
+    CHECK(WriteSong(BuiltIn(), OptionsOf("AAB", 32, 1)).mFault ==
+          "a form is letters from A to Z that share 32 bars evenly");
+    CHECK(WriteSong(BuiltIn(), OptionsOf("", 0, 1)).mFault == "a song has 1 to 256 bars");
+    CHECK(ReadSheetWishes("C | X", 4).mFault == "bar 2: X is no chord; a gap is _");
+    CHECK(ReadSheetWishes("C F G", 4).mFault == "bar 1: 3 words do not share its 4 beats evenly");
+    CHECK(ReadChordsWish(TSongWish_Contains, "ii-V-I of X", KeyOf("C major")).mFault ==
+          "ii-V-I of X: there is no such key");
+}
