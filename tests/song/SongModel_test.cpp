@@ -119,7 +119,7 @@ TEST_CASE("Songs are foretold better by their keys than without, at every length
         const double absolute =
             SumOfScores(ScoreSongs(model, model.Songs(), order, false)).BitsPerChord();
         CAPTURE(order);
-        CHECK(relative < 0.8 * absolute);
+        CHECK(relative < 0.9 * absolute);
         CHECK(relative > 1.0);
     }
 }
