@@ -175,7 +175,6 @@
 #include "brindle/present/ChordsText.h"
 #include "brindle/present/CopiesText.h"
 #include "brindle/present/Explain.h"
-#include "brindle/present/FindGrids.h"
 #include "brindle/present/FunctionsText.h"
 #include "brindle/present/GridPackageJson.h"
 #include "brindle/present/GridsJson.h"

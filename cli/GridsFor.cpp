@@ -4,7 +4,10 @@
 #include "cli/ChordTextOptions.h"
 #include "cli/CommandLine.h"
 #include "cli/GridOptions.h"
+#include "cli/TypedChords.h"
+#include "cli/TypedSongs.h"
 
+#include "brindle/analysis/TChordStringParse.h"
 #include "brindle/present/GridsSvg.h"
 #include "brindle/present/SongGrids.h"
 
@@ -19,7 +22,7 @@ constexpr CCommandHelp kGridsForHelp{
     "for",
     "Choose the fingerings of a song, and the capo that makes it easiest",
     "  brindle grids for \"Bb F | Gm Eb\"\n"
-    "  brindle grids for --file song.cho --capo 0 --format svg >song.svg\n"
+    "  brindle grids for song.cho --capo 0 --format svg >song.svg\n"
     "  brindle grids for \"C Am F G\" --tuning ukulele\n",
 };
 
@@ -27,7 +30,10 @@ constexpr int kEasiestCapo = -1;
 constexpr int kLastCapo = 12;
 
 struct CGridsForOptions {
-    CChordReadingOptions mText;
+    CTypedSongs mSongs;
+    double mBeatsPerBar = 4.0;
+    double mBeatsPerChord = 1.0;
+    CTypedChords mReading;
     std::string mTuning = "EADGBE";
     int mCapo = kEasiestCapo;
     int mHighestCapo = 7;
@@ -46,13 +52,12 @@ std::vector<CSongFingerings> SongsOf(std::span<const CChordLite> chords,
     return {ChooseFingerings(chords, tuning, song)};
 }
 
-TStatus GridsFor(const CGridsForOptions& options) {
-    if (const auto contradiction = options.mText.Contradiction()) {
-        return Fail(TStatus::BadUsage, *contradiction);
-    }
-    const auto tuning = ReadTuningOption(options.mTuning);
-    if (!tuning) return TStatus::BadUsage;
-    const auto song = options.mText.ReadSong();
+TSongOutput GridsOf(const CTypedSong& typed, const GChShortTuning& tuning,
+                    const CGridsForOptions& options) {
+    TChordStringParse parse;
+    parse.mBeatsPerBar = options.mBeatsPerBar;
+    parse.mBeatsPerChord = options.mBeatsPerChord;
+    const auto song = options.mReading.ReadSongOrFail(typed, parse);
     if (!song) return TStatus::BadInput;
     std::vector<CChordLite> chords;
     std::vector<std::string> symbols;
@@ -60,16 +65,29 @@ TStatus GridsFor(const CGridsForOptions& options) {
         chords.push_back(song->mChords[i]);
         symbols.push_back(song->mSymbols.SymbolOf(song->mChords[i]));
     }
-    const CShownSongGrids shown = MakeSongGrids(chords, symbols, SongsOf(chords, *tuning, options));
+    const CShownSongGrids shown = MakeSongGrids(chords, symbols, SongsOf(chords, tuning, options));
     const CGridStyle style = options.mFingering.Style();
     switch (options.mFormat.Format()) {
         case TFormat::Json:
-            return Print(SongGridsJson(shown));
+            return SongGridsJson(shown);
         case TFormat::Svg:
-            return Print(GridsSvg(shown.mGrids, "Chord grids", style));
+            return GridsSvg(shown.mGrids, "Chord grids", style);
         default:
-            return Print(SongGridsText(shown, PaintOfOutput(), style));
+            return SongGridsText(shown, PaintOfOutput(), style);
     }
+}
+
+TStatus GridsFor(const CGridsForOptions& options) {
+    auto contradiction = options.mSongs.Contradiction(options.mFormat.Format());
+    if (!contradiction) {
+        contradiction = BeatsContradiction(options.mBeatsPerBar, options.mBeatsPerChord);
+    }
+    if (contradiction) return Fail(TStatus::BadUsage, *contradiction);
+    const auto tuning = ReadTuningOption(options.mTuning);
+    if (!tuning) return TStatus::BadUsage;
+    return options.mSongs.Print(options.mFormat.Format(), [&](const CTypedSong& song) {
+        return GridsOf(song, *tuning, options);
+    });
 }
 
 }  // namespace
@@ -77,7 +95,9 @@ TStatus GridsFor(const CGridsForOptions& options) {
 void AddGridsFor(CCommand& grids) {
     CCommand& command = grids.AddCommand(kGridsForHelp);
     const auto options = std::make_shared<CGridsForOptions>();
-    options->mText.AddTo(command);
+    options->mSongs.AddTo(command);
+    AddBeats(command, options->mBeatsPerBar, options->mBeatsPerChord);
+    options->mReading.AddTo(command, "In what form the song is written");
     command.AddOption("--tuning", "TUNING", options->mTuning,
                       "Name or open strings (default: EADGBE)");
     command.AddOption("--capo", "N", options->mCapo, "Fret of the capodaster (default: easiest)")

@@ -5,7 +5,6 @@
 #include "brindle/guitarchords/GChDatabase.h"
 #include "brindle/platform/Resources.h"
 #include "brindle/present/ChordGrid.h"
-#include "brindle/present/FindGrids.h"
 #include "brindle/present/GridsJson.h"
 #include "brindle/present/GridsSvg.h"
 #include "brindle/present/ShownText.h"
@@ -99,8 +98,10 @@ brindle_status brindle_grids_find(brindle_grid_package* package, const char* sym
             return Fail(BRINDLE_ERROR_INPUT, fault,
                         static_cast<std::size_t>(std::max(reading.mFaultPos, 1)));
         }
-        Give(FindGrids(package->mDatabase, brindle::Printable(symbol), reading.mChord, strings,
-                       capo),
+        brindle::CFingeringOptions options;
+        options.mCapo = capo;
+        Give(brindle::GridsForChord(package->mDatabase, brindle::Printable(symbol), reading.mChord,
+                                    strings, options),
              grids);
         return BRINDLE_OK;
     });

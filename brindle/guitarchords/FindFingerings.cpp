@@ -16,7 +16,7 @@ bool IsBetter(const CFingering& a, const CFingering& b) {
     return a.mCost != b.mCost ? a.mCost < b.mCost : a.mFrets < b.mFrets;
 }
 
-constexpr int kRoot = 0;
+constexpr int kRootTone = 0;
 constexpr int kMostCapo = 12;
 constexpr std::size_t kMostFingerings = 1000;
 
@@ -42,7 +42,7 @@ CSemitones MayBeOmitted(CSemitones semitones, int strings, const CFingeringOptio
     if (options.mMayOmitTones) tones = OmittableTones(semitones);
     // Somebody else plays the root, or there is no string for it.
     const bool isCrowded = options.mMayOmitTones && (semitones - tones).size() > strings;
-    if (semitones.size() > 2 && (options.mMayOmitRoot || isCrowded)) tones.AddIntvl(kRoot);
+    if (semitones.size() > 2 && (options.mMayOmitRoot || isCrowded)) tones.AddIntvl(kRootTone);
     return tones;
 }
 

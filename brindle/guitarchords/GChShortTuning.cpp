@@ -8,7 +8,7 @@ namespace brindle {
 namespace {
 
 constexpr int kFewestStrings = 3;
-constexpr int kHighestPitch = 127;
+constexpr int kHighestOpenPitch = 127;
 
 }  // namespace
 
@@ -49,7 +49,7 @@ bool GChIsValidShortTuning(const GChShortTuning& tuning) {
     const int strings = GChNumberOfStringsInShortTuning(tuning);
     return strings >= kFewestStrings &&
            std::all_of(tuning.begin(), tuning.begin() + strings,
-                       [](std::uint8_t pitch) { return pitch <= kHighestPitch; });
+                       [](std::uint8_t pitch) { return pitch <= kHighestOpenPitch; });
 }
 
 std::vector<int> GChPitchArrayFromShortTuning(const GChShortTuning& tuning) {

@@ -10,7 +10,7 @@
 namespace brindle {
 namespace {
 
-constexpr int kHighestPitch = 127;
+constexpr int kHighestSoundingPitch = 127;
 
 std::vector<int> PitchesOf(const GChChord& chord, int capo) {
     std::vector<int> pitches;
@@ -36,7 +36,7 @@ std::optional<CSemitones> TonesLeftOut(std::span<const int> pitches, const CChor
     CSemitones allowed = chord.mSemitones;
     if (chord.IsSlashChord()) allowed.AddIntvl(chord.mBassKeyEnh.mKeyNr - root);
     CSemitones sounding;
-    int lowest = kHighestPitch + 1;
+    int lowest = kHighestSoundingPitch + 1;
     for (const int pitch : pitches) {
         if (pitch < 0) continue;
         sounding.AddIntvl(pitch - root);

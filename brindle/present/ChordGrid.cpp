@@ -111,7 +111,7 @@ std::string StoredName(const GChChord& chord, int root, int capo) {
 }
 
 /// The degree of a tone above a root as guitarists count it.
-std::string DegreeText(int tone) {
+std::string DegreeOnDot(int tone) {
     static constexpr auto kDegrees = std::to_array<std::string_view>(
         {"1", "b2", "2", "b3", "3", "4", "b5", "5", "#5", "6", "b7", "7"});
     return std::string(kDegrees[static_cast<std::size_t>(FoldIntoOctave(tone))]);
@@ -124,7 +124,7 @@ std::vector<std::string> OmittedDegrees(CSemitones omitted) {
     std::vector<std::string> degrees;
     for (const int tone : kOrder) {
         if (!omitted.HasIntvl(tone)) continue;
-        degrees.push_back(tone == 2 ? "9" : tone == 5 ? "11" : DegreeText(tone));
+        degrees.push_back(tone == 2 ? "9" : tone == 5 ? "11" : DegreeOnDot(tone));
     }
     return degrees;
 }
@@ -163,7 +163,7 @@ std::string DotText(const CChordGrid& grid, std::size_t string, TGridDots dots) 
     const int pitch = grid.mPitches[string];
     if (pitch < 0 || dots == TGridDots::Fingers) return {};
     if (dots == TGridDots::Notes) return std::string(GChOctPitchDefaultName(FoldIntoOctave(pitch)));
-    return grid.mRoot < 0 ? std::string() : DegreeText(pitch - grid.mRoot);
+    return grid.mRoot < 0 ? std::string() : DegreeOnDot(pitch - grid.mRoot);
 }
 
 std::string TuningTitle(const CChordGrid& grid) {

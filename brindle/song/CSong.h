@@ -3,6 +3,7 @@
 
 #include "brindle/analysis/CHarmAnlsChords.h"
 #include "brindle/analysis/CHarmAnlsSignKeys.h"
+#include "brindle/analysis/ReadHarmony.h"
 #include "brindle/platform/CTextFault.h"
 #include "brindle/song/TSongFormat.h"
 #include "brindle/theory/CSignKeyLite.h"
@@ -82,6 +83,8 @@ struct CSong {
     /// Of each chord, as written; the end marker has none. A score has no written symbols: these
     /// are the ones that read back as its chords.
     std::vector<std::string> mSymbols;
+    /// How the seventh of each chord is spelled, where the source tells it; may have fewer entries.
+    std::vector<TSeventhSpelling> mSevenths;
     /// Empty for a text without bar lines.
     std::vector<CSongBar> mBars;
     std::vector<CSongSection> mSections;

@@ -16,6 +16,7 @@ CSongReading ReadSongHarmony(const CSong& song, CReadingOptions options) {
     if (options.mStatedKey.IsUndef() && IsTrusted(song, options.mKeys)) {
         options.mStatedKey = *song.mStatedKey;
     }
+    if (options.mSevenths.empty()) options.mSevenths = song.mSevenths;
     return ReadHarmony(song.mChords, options);
 }
 

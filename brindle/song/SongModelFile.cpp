@@ -144,7 +144,7 @@ private:
     std::string mFault;
 };
 
-CSongModelReading Refused(std::string fault) {
+CSongModelReading RefusedModel(std::string fault) {
     return {CSongModel{}, std::move(fault)};
 }
 
@@ -168,18 +168,18 @@ bool LooksLikeSongModel(std::string_view text) {
 
 CSongModelReading ReadSongModel(std::string_view text) {
     const Json json = Json::parse(text, nullptr, false);
-    if (!json.is_object() || !json.contains(kMark)) return Refused("is no song model");
+    if (!json.is_object() || !json.contains(kMark)) return RefusedModel("is no song model");
     const Json& version = json[std::string(kMark)];
-    if (!version.is_number_unsigned()) return Refused("is no song model");
+    if (!version.is_number_unsigned()) return RefusedModel("is no song model");
     if (version != kVersion) {
-        return Refused(
+        return RefusedModel(
             fmt::format("is a song model of version {}, and this program reads version {}",
                         version.get<std::uint64_t>(), kVersion));
     }
     const auto songs = json.find("Songs");
     const auto sum = json.find("Sum");
     if (songs == json.end() || !songs->is_array() || sum == json.end() || !sum->is_string()) {
-        return Refused("is damaged: it has no songs");
+        return RefusedModel("is damaged: it has no songs");
     }
     CSongModelReader reader;
     std::vector<CTaughtSong> taught;
@@ -189,9 +189,9 @@ CSongModelReading ReadSongModel(std::string_view text) {
         taught.push_back(reader.SongOf(song));
     }
     if (reader.Fault().empty() && SumOf(taught) != sum->get<std::string>()) {
-        return Refused("is damaged: its sum does not fit its songs");
+        return RefusedModel("is damaged: its sum does not fit its songs");
     }
-    if (!reader.Fault().empty()) return Refused("is damaged: it " + reader.Fault());
+    if (!reader.Fault().empty()) return RefusedModel("is damaged: it " + reader.Fault());
     return {CSongModel(std::move(taught)), {}};
 }
 

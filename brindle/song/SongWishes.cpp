@@ -16,7 +16,7 @@ namespace brindle {
 namespace {
 
 constexpr std::uint64_t kThirdsAndFifths = 0b111111000;
-constexpr std::size_t kMostBars = 1024;
+constexpr std::size_t kMostSheetBars = 1024;
 constexpr std::string_view kBlanks = " \t\r\n,;";
 
 std::vector<std::string_view> PiecesOf(std::string_view text, std::string_view between) {
@@ -144,7 +144,7 @@ CSongWishReading ReadSheetWishes(std::string_view text, int beatsPerBar) {
     const std::vector<std::string_view> bars = BarTexts(text);
     CSongWishReading empty;
     if (bars.empty()) empty.mFault = "there are no bars";
-    if (bars.size() > kMostBars) empty.mFault = "there are too many bars";
+    if (bars.size() > kMostSheetBars) empty.mFault = "there are too many bars";
     if (!empty.mFault.empty()) return empty;
     CSheetWishReader reader(beatsPerBar);
     for (const std::string_view bar : bars) reader.ReadBar(bar);

@@ -13,7 +13,7 @@
 namespace brindle {
 namespace {
 
-constexpr std::size_t kMostBars = 256;
+constexpr std::size_t kLongestSong = 256;
 constexpr int kMostBeatsPerBar = 24;
 // Songs that quote too much are rarely left without a way.
 constexpr int kMostTries = 20;
@@ -151,8 +151,8 @@ CWrittenQuote QuoteOf(const CSongModel& model, const CWrittenChords& chords,
 std::string FaultOf(const CSongModel& model, const CWriteSongOptions& options) {
     if (model.IsEmpty()) return "the model has learned nothing";
     if (options.mKey.IsUndef()) return "the key is none";
-    if (options.mBars == 0 || options.mBars > kMostBars) {
-        return fmt::format("a song has 1 to {} bars", kMostBars);
+    if (options.mBars == 0 || options.mBars > kLongestSong) {
+        return fmt::format("a song has 1 to {} bars", kLongestSong);
     }
     if (options.mBeatsPerBar < 1 || options.mBeatsPerBar > kMostBeatsPerBar) {
         return fmt::format("a bar has 1 to {} beats", kMostBeatsPerBar);
@@ -164,7 +164,7 @@ std::string FaultOf(const CSongModel& model, const CWriteSongOptions& options) {
     return {};
 }
 
-CWrittenSong Refused(std::string fault) {
+CWrittenSong RefusedSong(std::string fault) {
     CWrittenSong refused;
     refused.mFault = std::move(fault);
     return refused;
@@ -173,7 +173,7 @@ CWrittenSong Refused(std::string fault) {
 }  // namespace
 
 CWrittenSong WriteSong(const CSongModel& model, const CWriteSongOptions& options) {
-    CWrittenSong result = Refused(FaultOf(model, options));
+    CWrittenSong result = RefusedSong(FaultOf(model, options));
     if (!result.mFault.empty()) return result;
     for (const std::size_t wish : ContradictingWishes(model, options)) {
         result.mContradiction.push_back(options.mWishes[wish].mText);
@@ -187,7 +187,7 @@ CWrittenSong WriteSong(const CSongModel& model, const CWriteSongOptions& options
         CPlanWriter writer(model, options, plan, random);
         const TStretchEnd end = writer.Write();
         if (end == TStretch_Impossible)
-            return Refused("the songs of the model never come to rest in such a key");
+            return RefusedSong("the songs of the model never come to rest in such a key");
         if (end != TStretch_Written) continue;
         result.mLongestQuote = QuoteOf(model, Joined(writer.Parts()), options);
         // Copies of parts may join to more than either, and what was wished for may be a quote.
@@ -197,8 +197,8 @@ CWrittenSong WriteSong(const CSongModel& model, const CWriteSongOptions& options
         result.mSong = SongOf(writer.Parts(), plan, options);
         return result;
     }
-    return Refused(fmt::format("no song was found that quotes {} bars at most; allow more",
-                               options.mMostQuotedBars));
+    return RefusedSong(fmt::format("no song was found that quotes {} bars at most; allow more",
+                                   options.mMostQuotedBars));
 }
 
 }  // namespace brindle

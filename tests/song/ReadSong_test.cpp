@@ -3,6 +3,7 @@
 
 #include "brindle/musicxml/TMusicXMLDoc.h"
 #include "brindle/song/AnalyseSong.h"
+#include "brindle/song/ReadSongHarmony.h"
 #include "brindle/song/internal/ChartLinks.h"
 
 #include <doctest/doctest.h>
@@ -256,6 +257,16 @@ TEST_CASE("An analysis in Roman numerals is a song in the keys that it states") 
     CHECK_FALSE(noted.HasFault());
     CHECK(noted.mFaults.size() == 1);
     CHECK(Shown(noted) == "C@0 end@4");
+}
+
+TEST_CASE("Numerals tell how a seventh is written, which tells a German sixth from a substitute") {
+    const auto numeral = [](std::string_view text, std::size_t ix) {
+        const CSong song = ReadSong(text);
+        return ReadSongHarmony(song).mChords.at(ix).mNumeral;
+    };
+    CHECK(numeral("m1 C: I b3 Ger65/V\nm2 V/V b3 V\nm3 I b3 V\nm4 I", 1) == "Ger6/V");
+    CHECK(numeral("m1 C: I b3 Ger65\nm2 V b3 V7\nm3 I b3 V\nm4 I", 1) == "Ger6");
+    CHECK(numeral("m1 C: I b3 V7/bII\nm2 V b3 V7\nm3 I b3 V\nm4 I", 1) == "subV7/V");
 }
 
 TEST_CASE("What cannot be read is a fault and no song") {

@@ -52,10 +52,8 @@ TEST_CASE("The easiest capo lets a song be played with open chords") {
         const char* mSong;
         std::vector<int> mCapos;
     };
-    for (const CRow& row : std::vector<CRow>{{"C Am F G", {0}},
-                                             {"G D Em C", {0}},
-                                             {"Bb F Gm Eb", {3}},
-                                             {"Eb Bb Cm Ab", {1, 3}}}) {
+    for (const CRow& row : std::vector<CRow>{
+             {"C Am F G", {0}}, {"G D Em C", {0}}, {"Bb F Gm Eb", {3}}, {"Eb Bb Cm Ab", {1, 3}}}) {
         const auto capos = CompareCapos(ChordsOf(row.mSong), kGChStandardGuitar);
         INFO(row.mSong << ": capo " << capos.front().mCapo);
         REQUIRE(capos.size() == 8);

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/analysis/ReadRomanText.h"
+#include "brindle/analysis/internal/AugmentedSixths.h"
 #include "brindle/chords/WriteChordSymbol.h"
 #include "brindle/song/internal/SongReaders.h"
 #include "brindle/song/internal/StatedKey.h"
@@ -18,12 +19,27 @@ void AppendChord(const CChordLite& chord, double position, CSong& song) {
     song.mSymbols.push_back(WriteChordSymbol(chord));
 }
 
+/// V7 has a minor seventh, and so has Fr43 above its root, the second degree. What stands on the
+/// flat sixth has an augmented sixth instead: Ger65, It6.
+TSeventhSpelling SeventhOf(const CRomanTextChord& chord) {
+    constexpr int seventh = 10;
+    if (!chord.mChord.mSemitones.HasIntvl(seventh)) return TSeventhSpelling_Undef;
+    const bool isSixth =
+        std::any_of(kAugmentedSixths.begin(), kAugmentedSixths.end(), [&](const auto& sixth) {
+            return sixth.mRoot.mNumber == 6 &&
+                   chord.mNumeral.compare(0, sixth.mWord.size(), sixth.mWord) == 0;
+        });
+    return isSixth ? TSeventhSpelling_AugmentedSixth : TSeventhSpelling_MinorSeventh;
+}
+
 /// Before the first numeral nothing sounds.
 void AppendChords(const CRomanTextReading& reading, CSong& song) {
     if (reading.mChords.empty()) return;
     if (reading.mChords.front().mPosition > 0.0) AppendChord(CChordLite_NoChordYield, 0.0, song);
     for (const CRomanTextChord& chord : reading.mChords) {
         AppendChord(chord.mChord, chord.mPosition, song);
+        song.mSevenths.resize(song.mChords.size());
+        song.mSevenths.back() = SeventhOf(chord);
     }
     const CRomanTextChord& last = reading.mChords.back();
     song.mChords.emplace_back(CChordLite_Undef, last.mPosition + last.mLength);

@@ -6,7 +6,7 @@
 namespace brindle {
 namespace {
 
-constexpr int kMostBars = 4;
+constexpr int kLongestChordInBars = 4;
 constexpr double kLeastWeight = 1e-4;
 // What is rarer among the lengths at a place is a slip, or belongs to a rhythm of its own.
 constexpr double kRareShare = 0.03;
@@ -29,13 +29,13 @@ CSongLengths::CSongLengths(const CSongModel& model, int beatsPerBar)
     : mModel(model), mBeatsPerBar(beatsPerBar) {}
 
 std::vector<double> CSongLengths::Learned(std::size_t beatInBar, std::int32_t before) const {
-    std::vector<double> weights(static_cast<std::size_t>(kMostBars * mBeatsPerBar), 0.0);
+    std::vector<double> weights(static_cast<std::size_t>(kLongestChordInBars * mBeatsPerBar), 0.0);
     const auto ticks = [&](std::int32_t beats) { return beats * kTicksPerBar / mBeatsPerBar; };
     const auto tick = ticks(static_cast<std::int32_t>(beatInBar));
     for (const auto& [length, count] : mModel.LengthsAt(mBeatsPerBar, tick, ticks(before))) {
         const std::int32_t beats = length * mBeatsPerBar / kTicksPerBar;
         const bool isWhole = beats * kTicksPerBar == length * mBeatsPerBar;
-        if (!isWhole || beats < 1 || beats > kMostBars * mBeatsPerBar) continue;
+        if (!isWhole || beats < 1 || beats > kLongestChordInBars * mBeatsPerBar) continue;
         weights[static_cast<std::size_t>(beats) - 1] += count;
     }
     Normalise(weights);
@@ -45,7 +45,7 @@ std::vector<double> CSongLengths::Learned(std::size_t beatInBar, std::int32_t be
 /// In a metre that was never heard: a chord a bar, or two in one that has a middle.
 std::vector<double> CSongLengths::Usual(std::size_t beatInBar) const {
     const auto bar = static_cast<std::size_t>(mBeatsPerBar);
-    std::vector<double> weights(bar * kMostBars, 0.0);
+    std::vector<double> weights(bar * kLongestChordInBars, 0.0);
     weights[bar - beatInBar - 1] += 1.0;
     if (beatInBar == 0) weights[2 * bar - 1] += 0.4;
     if (beatInBar == 0 && bar % 2 == 0) weights[bar / 2 - 1] += 0.4;
