@@ -112,7 +112,7 @@ TEST_CASE("Keys and scales are read and written, with their tones and signs") {
     REQUIRE(brindle_key_scale(&key, &scale) == BRINDLE_OK);
     CHECK(scale.mask == 0x5AD);
 
-    CHECK(brindle_key_read("Bb moll", &key) == BRINDLE_ERROR_INPUT);
+    CHECK(brindle_key_read("Bb mell", &key) == BRINDLE_ERROR_INPUT);
     CHECK(brindle_last_error_position() == 4);
     CHECK(brindle_scale_read("C nothing", &scale) == BRINDLE_ERROR_INPUT);
     CHECK(TextOf(brindle_key_write, &key) == "[an undefined key]");

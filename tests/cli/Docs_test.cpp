@@ -101,7 +101,8 @@ TEST_CASE("The documents show what the program does and code that is built") {
             if (piece.mLanguage == "console") {
                 piece.mText = RunAgain(piece.mText);
             } else {
-                const bool isCode = piece.mLanguage == "cpp" || piece.mLanguage == "cmake";
+                const bool isCode = piece.mLanguage == "cpp" || piece.mLanguage == "c" ||
+                                    piece.mLanguage == "cmake";
                 CHECK_MESSAGE(isCode, "a block in a language that no test knows");
                 CHECK(examples.find(piece.mText) != examples.npos);
             }
