@@ -32,7 +32,7 @@ std::string ActionOf(const COptionPage& option) {
     return option.TakesFile() ? "_files" : " ";
 }
 
-std::string Specification(const COptionPage& option, const std::string& name) {
+std::string ArgumentsOf(const COptionPage& option, const std::string& name) {
     const std::string many = option.mIsMany ? "*" : "";
     if (option.mIsArgument) {
         return fmt::format("'{}:{}:{}'", option.mIsMany ? "*" : "", ZshQuoted(name, ":"),
@@ -51,7 +51,7 @@ std::string Arguments(const CCommandPage& page) {
     std::string text;
     for (const COptionPage& option : page.mOptions) {
         for (const std::string& name : option.mNames) {
-            text += " \\\n        " + Specification(option, name);
+            text += " \\\n        " + ArgumentsOf(option, name);
         }
     }
     return text;
