@@ -9,7 +9,6 @@
 #include <libxml/xmlerror.h>
 
 #include <algorithm>
-#include <cstring>
 #include <mutex>
 #include <new>
 #include <string>
@@ -65,7 +64,7 @@ struct CParse::Callbacks {
         CParse& parse = *static_cast<CParse*>(self);
         if (parse.mContext != nullptr && parse.IsTagTooLong()) parse.EndInTag();
         const auto count = std::min(static_cast<std::size_t>(length), parse.mRest.size());
-        std::memcpy(buffer, parse.mRest.data(), count);
+        std::copy_n(parse.mRest.begin(), count, buffer);
         parse.mRest.remove_prefix(count);
         return static_cast<int>(count);
     }
