@@ -3,6 +3,7 @@
 
 #include "brindle/chords/ChordDegree.h"
 #include "brindle/chords/internal/SpelledOutChord.h"
+#include "brindle/theory/KeyIntervals.h"
 
 namespace brindle {
 namespace {
@@ -31,6 +32,16 @@ std::vector<CKeyEnh> ChordTones(const CChordLite& chord) {
         keys.push_back(key.IsUndef() ? chord.mRootKeyEnh + tone : key);
     }
     return keys;
+}
+
+CKeyEnh ToneAboveRoot(const CChordLite& chord, int intvl) {
+    CChordLite with = chord;
+    with.mSemitones.AddIntvl(intvl);
+    const CKeyEnh& root = chord.mRootKeyEnh;
+    for (const CKeyEnh& tone : ChordTones(with)) {
+        if (FoldIntoOctave(tone.mKeyNr - root.mKeyNr) == intvl) return tone;
+    }
+    return root + intvl;
 }
 
 }  // namespace brindle

@@ -13,4 +13,7 @@ namespace brindle {
 /// is no chord tone is none of them. Empty for what is no chord.
 [[nodiscard]] std::vector<CKeyEnh> ChordTones(const CChordLite& chord);
 
+/// The tone 0 to 11 semitones above the root, spelled as if the chord had it: Bb for 10 above Cm.
+[[nodiscard]] CKeyEnh ToneAboveRoot(const CChordLite& chord, int intvl);
+
 }  // namespace brindle

@@ -3,6 +3,7 @@
 
 #include "brindle/analysis/CHarmAnlsChords.h"
 #include "brindle/analysis/CKeyOfSong.h"
+#include "brindle/chords/ChordTones.h"
 #include "brindle/chords/WriteChordSymbol.h"
 #include "brindle/present/ShownText.h"
 #include "brindle/theory/KeyIntervals.h"
@@ -116,7 +117,7 @@ CChordLite CMarkovSpelling::Spelled(const CChordLite& chord) const {
         RootInKey(chord.mRootKeyEnh.mKeyNr, tonic - (isMinor ? 6 : 5), tonic - (isMinor ? 4 : 1));
     if (!chord.HasBassNote()) return spelled;
     const int intvl = FoldIntoOctave(chord.mBassKeyEnh.mKeyNr - chord.mRootKeyEnh.mKeyNr);
-    spelled.mBassKeyEnh = spelled.mRootKeyEnh + intvl;
+    spelled.mBassKeyEnh = ToneAboveRoot(spelled, intvl);
     return spelled;
 }
 

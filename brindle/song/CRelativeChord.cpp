@@ -4,6 +4,7 @@
 #include "brindle/analysis/internal/KeyNumbers.h"
 #include "brindle/analysis/internal/NumeralDegree.h"
 #include "brindle/analysis/internal/NumeralText.h"
+#include "brindle/chords/ChordTones.h"
 #include "brindle/theory/KeyIntervals.h"
 
 namespace brindle {
@@ -67,7 +68,7 @@ CChordLite ChordInKey(const CRelativeChord& chord, const CSignKeyLite& key) {
     CChordLite written;
     written.mRootKeyEnh = RootInKey(chord, key);
     written.mSemitones = CSemitones(std::uint64_t{chord.mMask});
-    if (chord.mBass != 0) written.mBassKeyEnh = written.mRootKeyEnh + static_cast<int>(chord.mBass);
+    if (chord.mBass != 0) written.mBassKeyEnh = ToneAboveRoot(written, chord.mBass);
     return written;
 }
 

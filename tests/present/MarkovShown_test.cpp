@@ -38,6 +38,9 @@ TEST_CASE("A sequence is spelled in its key, whatever songs its chords come from
     // Db major, with an F sharp from a song in sharps.
     CHECK(Spelled("(4,Ebm7);(4,Ab7);(4,F#7);(8,Db)") == "(4,Ebm7);(4,Ab7);(4,Gb7);(8,Db)");
     // A minor: its leading tone is a G sharp, its Neapolitan a B flat.
+    // A bass that the chord does not have is a seventh all the same.
+    CHECK(Spelled("(4,Eb);(4,Cm/A#);(4,Ab);(4,Bb7);(8,Eb)") ==
+          "(4,Eb);(4,Cm/Bb);(4,Ab);(4,Bb7);(8,Eb)");
     CHECK(Spelled("(4,Am);(4,A#);(4,Abdim7);(4,E7);(8,Am)") ==
           "(4,Am);(4,Bb);(4,G#dim7);(4,E7);(8,Am)");
     // A bass goes with its root: the third of D is F sharp also in flats.
