@@ -115,6 +115,8 @@ TEST_CASE("The pictures are what the program draws") {
     const std::pair<const char*, const char*> pictures[] = {
         {"/docs/pictures/after-youve-gone.svg",
          "brindle analyse --file examples/songs/after-youve-gone.txt --format svg"},
+        {"/docs/pictures/auld-lang-syne.svg",
+         "brindle analyse examples/songs/auld-lang-syne.txt --format svg"},
         {"/docs/pictures/three-keys.svg",
          "brindle keys 'Dm7 G7 Cmaj7 | Fm7 Bb7 Ebmaj7 | Am7b5 D7 Gm' --beats-per-bar 3 "
          "--format svg"},
