@@ -8,6 +8,8 @@ program_packages=(g++ cmake ninja-build pkg-config libboost-dev libfmt-dev nlohm
                   libcli11-dev libxml2-dev libzip-dev libplist-dev gettext)
 # The same for the tests and the benches.
 test_packages=(doctest-dev libbenchmark-dev python3-jsonschema)
+# The same for the tests under sanitizers and the fuzzers, which share one build by clang.
+sanitizer_packages=(clang libclang-rt-14-dev)
 
 say() { printf 'brindle: %s\n' "$*" >&2; }
 

@@ -1,10 +1,10 @@
 #!/usr/bin/env bash
-# fuzz/run.sh [SECONDS]: builds every fuzzer with clang and runs each for so many seconds (10). What
+# fuzz/run.sh [SECONDS]: builds every fuzzer and runs each for so many seconds (10). What
 # it finds on its way stays in build/fuzz/corpus; an input that fails is written to build/fuzz.
 set -euo pipefail
 source "$(dirname "$(readlink -f "${BASH_SOURCE[0]}")")/../cmake/setup.sh"
-need_packages clang libclang-rt-14-dev
-build fuzz fuzzers
+need_packages "${sanitizer_packages[@]}"
+build asan fuzzers
 
 for source in "$root"/fuzz/*_fuzz.cpp; do
     name=$(basename "$source" .cpp) subject=$(basename "$source" _fuzz.cpp)
@@ -16,7 +16,7 @@ for source in "$root"/fuzz/*_fuzz.cpp; do
     # Options of one fuzzer: an input that takes long is cut, longer seeds are replayed by the tests.
     [ ! -f "$root/fuzz/$subject.options" ] || mapfile -t -O "${#options[@]}" options <"$root/fuzz/$subject.options"
     mkdir -p "$found"
-    if ! "$root/build/fuzz/bin/$name" "${options[@]}" "$found" "$root/fuzz/corpus/$subject" >"$log" 2>&1; then
+    if ! "$root/build/asan/bin/$name" "${options[@]}" "$found" "$root/fuzz/corpus/$subject" >"$log" 2>&1; then
         tail -40 "$log"
         exit 1
     fi
