@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "cli/HarmoniesFromNotes.h"
 
-#include "brindle/platform/Alerts.h"
 #include "brindle/platform/Error.h"
 #include "brindle/present/HarmoniesText.h"
 
@@ -13,19 +12,7 @@
 namespace brindle::cli {
 namespace {
 
-/// What goes wrong in an import is told once, by its error.
-class CNoAlerts {
-public:
-    CNoAlerts() {
-        SetAlertHandler([](const CAlert&) {});
-    }
-    CNoAlerts(const CNoAlerts&) = delete;
-    CNoAlerts& operator=(const CNoAlerts&) = delete;
-    ~CNoAlerts() { SetAlertHandler({}); }
-};
-
 std::optional<CScoreNotes> ReadNotes(const CTypedSong& song) {
-    const CNoAlerts quiet;
     CScoreNotes notes;
     Error error;
     if (ReadScoreNotes(song.mText, notes, &error)) return notes;

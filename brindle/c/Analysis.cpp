@@ -92,6 +92,23 @@ brindle_chord_reading ChordAt(const brindle_analysis& analysis, size_t index) {
             index < explanations.size() ? explanations[index].c_str() : ""};
 }
 
+// What is told of a chord that is not there.
+brindle_chord_reading NoChordReading() {
+    const brindle::CChordReading reading;
+    return {0.0,
+            0.0,
+            "",
+            ToC(brindle::CChordLite()),
+            ToC(reading.mKey),
+            "",
+            reading.mFunction,
+            reading.mRelation,
+            reading.mResolvesTo,
+            reading.mUnder,
+            0,
+            ""};
+}
+
 // The text that `make` gives for an analysis.
 template <class TMake>
 brindle_status GiveTextOf(const brindle_analysis* analysis, char** text, const TMake& make) {
@@ -154,8 +171,7 @@ size_t brindle_analysis_chord_count(const brindle_analysis* analysis) {
 brindle_status brindle_analysis_chord(const brindle_analysis* analysis, size_t index,
                                       brindle_chord_reading* chord) {
     if (chord == nullptr) return FailForNull("chord");
-    *chord = {};
-    chord->symbol = chord->numeral = chord->explanation = "";
+    *chord = NoChordReading();
     if (analysis == nullptr) return FailForNull("analysis");
     ForgetFault();
     const size_t count = ChordCountOf(analysis->mSong);
@@ -171,7 +187,7 @@ size_t brindle_analysis_region_count(const brindle_analysis* analysis) {
 brindle_status brindle_analysis_region(const brindle_analysis* analysis, size_t index,
                                        brindle_region* region) {
     if (region == nullptr) return FailForNull("region");
-    *region = {};
+    *region = {ToC(brindle::CSignKeyLite()), 0.0, 0.0, 0, 0};
     if (analysis == nullptr) return FailForNull("analysis");
     ForgetFault();
     const auto& regions = analysis->mReading.mRegions;
@@ -189,7 +205,7 @@ size_t brindle_analysis_center_count(const brindle_analysis* analysis) {
 brindle_status brindle_analysis_center(const brindle_analysis* analysis, size_t index,
                                        brindle_center* center) {
     if (center == nullptr) return FailForNull("center");
-    *center = {};
+    *center = {ToC(brindle::CScaleLite()), 0.0, 0};
     if (analysis == nullptr) return FailForNull("analysis");
     ForgetFault();
     const auto& centers = analysis->mCenters;

@@ -4,6 +4,7 @@
 #include "brindle/musicxml/ImportScore.h"
 #include "brindle/musicxml/MuxmlJsonLines.h"
 #include "brindle/musicxml/ScoreContainer.h"
+#include "brindle/platform/Alerts.h"
 #include "brindle/present/ImportMidi.h"
 #include "brindle/present/ImportedScore.h"
 #include "brindle/present/ShownText.h"
@@ -16,6 +17,7 @@ namespace {
 
 // Imports a score for a host of methods; the status tells how that went.
 brindle_status Import(std::string_view bytes, const brindle::MusicXmlParserDelegate& host) {
+    const brindle::CMutedAlerts quiet;
     brindle::Error error;
     const bool isContainer = brindle::IsScoreContainer(bytes);
     if (ImportScore(bytes, isContainer, brindle::kImportTicksPerQuarter, host, error)) {

@@ -1,13 +1,10 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/musicxml/ScoreNotes.h"
-#include "brindle/musicxml/MusicXmlParser.h"
+#include "brindle/musicxml/ImportScore.h"
 #include "brindle/musicxml/ScoreContainer.h"
+#include "brindle/platform/Alerts.h"
 
 #include <algorithm>
-#include <memory>
-#include <optional>
-#include <stdexcept>
-#include <string>
 #include <tuple>
 
 namespace brindle {
@@ -63,37 +60,15 @@ private:
     double mBeat = 1.0;
 };
 
-std::shared_ptr<const MusicXmlParserDelegate> HostFor(
-    const std::shared_ptr<CCollector>& collector) {
-    auto host = std::make_shared<MusicXmlParserDelegate>();
-    host->didEncounterPartEnd = [collector](const auto&) { collector->PartEnd(); };
-    host->didEncounterMeasureEnd = [collector](const CMuxmlMeasure& measure) {
-        collector->MeasureEnd(measure);
+MusicXmlParserDelegate HostFor(CCollector& collector) {
+    MusicXmlParserDelegate host;
+    host.didEncounterPartEnd = [&collector](const auto&) { collector.PartEnd(); };
+    host.didEncounterMeasureEnd = [&collector](const CMuxmlMeasure& measure) {
+        collector.MeasureEnd(measure);
     };
-    host->didEncounterSignTime = [collector](const CMuxmlSignTime& t) { collector->SignTime(t); };
-    host->didEncounterNote = [collector](const CMuxmlNote& note) { collector->Note(note); };
+    host.didEncounterSignTime = [&collector](const CMuxmlSignTime& t) { collector.SignTime(t); };
+    host.didEncounterNote = [&collector](const CMuxmlNote& note) { collector.Note(note); };
     return host;
-}
-
-bool Import(std::string_view bytes, const std::shared_ptr<const MusicXmlParserDelegate>& host,
-            Error& error) {
-    MusicXmlParser parser;
-    parser.MidiTicksPerQuarter = kTicksPerQuarterOfNotes;
-    std::optional<std::string> unpacked;
-    if (IsScoreContainer(bytes)) {
-        unpacked = ScoreInContainer(bytes);
-        if (!unpacked) {
-            error = {"", 0, ContainerFault(bytes)};
-            return false;
-        }
-    }
-    try {
-        return parser.parseBytes(unpacked ? std::string_view(*unpacked) : bytes, host, &error);
-    } catch (const std::domain_error& exception) {
-        // Divisions of 0 leave no unit in which places in the bar could be told.
-        error = {"", 0, exception.what()};
-        return false;
-    }
 }
 
 }  // namespace
@@ -101,8 +76,10 @@ bool Import(std::string_view bytes, const std::shared_ptr<const MusicXmlParserDe
 bool ReadScoreNotes(std::string_view bytes, CScoreNotes& notes, Error* error) {
     notes = {};
     Error own;
-    const auto collector = std::make_shared<CCollector>(notes);
-    const bool isRead = Import(bytes, HostFor(collector), own);
+    const CMutedAlerts quiet;
+    CCollector collector(notes);
+    const bool isRead = ImportScore(bytes, IsScoreContainer(bytes), kTicksPerQuarterOfNotes,
+                                    HostFor(collector), own);
     if (!isRead && error != nullptr) *error = own;
     std::sort(notes.mNotes.begin(), notes.mNotes.end(), [](const auto& a, const auto& b) {
         return std::tie(a.mPosition, a.mNote.mNoteNr) < std::tie(b.mPosition, b.mNote.mNoteNr);

@@ -19,6 +19,8 @@ CHandlerInUse& HandlerInUse() {
     return handler;
 }
 
+thread_local int theMutedDepth = 0;
+
 void WriteToStandardError(const CAlert& alert) {
     std::cerr << alert.messageText + ": " + alert.informativeText + '\n';
 }
@@ -32,6 +34,7 @@ void SetAlertHandler(TAlertHandler handler) {
 }
 
 void ShowAlert(const CAlert& alert) {
+    if (theMutedDepth > 0) return;
     TAlertHandler handler;
     {
         CHandlerInUse& inUse = HandlerInUse();
@@ -39,6 +42,14 @@ void ShowAlert(const CAlert& alert) {
         handler = inUse.mHandler;
     }
     handler ? handler(alert) : WriteToStandardError(alert);
+}
+
+CMutedAlerts::CMutedAlerts() {
+    ++theMutedDepth;
+}
+
+CMutedAlerts::~CMutedAlerts() {
+    --theMutedDepth;
 }
 
 }  // namespace brindle

@@ -22,4 +22,13 @@ void SetAlertHandler(TAlertHandler handler);
 /// Hands the alert to the handler, on the caller's thread.
 void ShowAlert(const CAlert& alert);
 
+/// While one lives, alerts of its thread are shown to nobody: for a caller who is told the error.
+class CMutedAlerts {
+public:
+    CMutedAlerts();
+    CMutedAlerts(const CMutedAlerts&) = delete;
+    CMutedAlerts& operator=(const CMutedAlerts&) = delete;
+    ~CMutedAlerts();
+};
+
 }  // namespace brindle

@@ -17,7 +17,7 @@ constexpr std::size_t kMostFileBytes = std::size_t{256} << 20;
 
 CSong FailedSong(TSongFormat format, std::string reason) {
     CSong song;
-    song.mFormat = format;
+    if (format != TSongFormat_Auto) song.mFormat = format;
     song.mFaults.push_back({.mText = std::move(reason)});
     return song;
 }

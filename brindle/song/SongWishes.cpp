@@ -15,7 +15,6 @@
 namespace brindle {
 namespace {
 
-constexpr std::uint64_t kThirdsAndFifths = 0b111111000;
 constexpr std::size_t kMostSheetBars = 1024;
 constexpr std::string_view kBlanks = " \t\r\n,;";
 
@@ -113,12 +112,36 @@ std::string_view WithoutKeyName(std::string_view text, CSignKeyLite& key) {
     return text;
 }
 
-/// A numeral without a figure stands for all chords of its kind.
+/// Beside a perfect fifth b5 and #5 are tensions.
+std::uint64_t ThirdAndFifth(std::uint64_t mask) {
+    constexpr std::uint64_t kThirds = 0b11000;
+    constexpr std::uint64_t kPerfectFifth = 1 << 7;
+    constexpr std::uint64_t kAlteredFifths = 1 << 6 | 1 << 8;
+    return mask & (kThirds | ((mask & kPerfectFifth) != 0 ? kPerfectFifth : kAlteredFifths));
+}
+
+/// The sevenths above a chord's root that its key has: V takes the minor one, I the major one.
+std::uint64_t SeventhsIn(const CSignKeyLite& key, const CChordLite& chord) {
+    constexpr std::uint64_t kMajor = 0b101010110101;
+    constexpr std::uint64_t kMinorWithLeadingTone = 0b110110101101;
+    const std::uint64_t scale =
+        key.mSignKeyType == TSignKeyType_Minor ? kMinorWithLeadingTone : kMajor;
+    const int degree = AbsKeyIntvlFromTo(key.mRootKeyEnh.mKeyNr, chord.mRootKeyEnh.mKeyNr);
+    std::uint64_t sevenths = 0;
+    for (const int seventh : {10, 11}) {
+        if ((scale >> FoldIntoOctave(degree + seventh) & 1) != 0) sevenths |= 1ULL << seventh;
+    }
+    return sevenths;
+}
+
+/// A numeral without a figure stands for the chords of its kind that the key has.
 std::optional<CWishedChord> WishedNumeral(std::string_view text, const CSignKeyLite& key) {
     const auto chord = ChordFromNumeral(text, key);
     if (!chord) return std::nullopt;
     const bool isPlain = text.find_first_not_of("ivIVb#") == std::string_view::npos;
-    return CWishedChord{*chord, isPlain};
+    const bool isAltered = text.find_first_of("b#") != std::string_view::npos;
+    return CWishedChord{*chord, isPlain,
+                        isAltered ? CWishedChord::kBothSevenths : SeventhsIn(key, *chord)};
 }
 
 std::optional<CWishedChord> WishedChordOf(std::string_view text, const CSignKeyLite& key) {
@@ -135,7 +158,10 @@ bool AreAllChords(const std::vector<std::string_view>& words, const CSignKeyLite
 
 bool CWishedChord::Fits(int root, int bass, std::uint64_t mask) const {
     if (root != FoldIntoOctave(mChord.mRootKeyEnh.mKeyNr)) return false;
-    if (mIsKind) return ((mask ^ mChord.mSemitones.Mask()) & kThirdsAndFifths) == 0;
+    if (mIsKind) {
+        return ThirdAndFifth(mask) == ThirdAndFifth(mChord.mSemitones.Mask()) &&
+               (mask & kBothSevenths & ~mSevenths) == 0;
+    }
     const int wishedBass = mChord.HasBassNote() ? FoldIntoOctave(mChord.mBassKeyEnh.mKeyNr) : root;
     return bass == wishedBass && mask == mChord.mSemitones.Mask();
 }
@@ -171,9 +197,13 @@ CSongWishReading ReadChordsWish(TSongWishKind kind, std::string_view text,
             return reading;
         }
         wish.mChords.push_back(*chord);
+        if (kind == TSongWish_Never) wish.mChords.back().mSevenths = CWishedChord::kBothSevenths;
     }
-    if (words.empty()) reading.mFault = "there are no chords";
-    reading.mWishes.push_back(std::move(wish));
+    if (words.empty()) {
+        reading.mFault = "there are no chords";
+    } else {
+        reading.mWishes.push_back(std::move(wish));
+    }
     return reading;
 }
 

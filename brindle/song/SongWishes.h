@@ -14,9 +14,13 @@ namespace brindle {
 /// A chord that is wished for, or a kind of chord.
 struct CWishedChord {
     CChordLite mChord;
-    /// Any chord on this root with the third and the fifth of the chord: Dm, Dm7 and Dm9 for ii in
-    /// C. Otherwise exactly this one.
+    /// Any chord on this root with the third and the fifth of the chord, and no other sevenths than
+    /// `mSevenths`: Dm, Dm7 and Dm9 for ii in C. Otherwise exactly this one.
     bool mIsKind = false;
+    /// Bit 10 for a minor seventh and bit 11 for a major one.
+    std::uint64_t mSevenths = kBothSevenths;
+
+    static constexpr std::uint64_t kBothSevenths = 0b110000000000;
 
     /// Whether a chord is such a one, whatever its spelling.
     [[nodiscard]] bool Fits(int root, int bass, std::uint64_t mask) const;

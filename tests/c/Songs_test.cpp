@@ -109,6 +109,12 @@ TEST_CASE("An analysis outlives its song and tells each chord as a teacher reads
           "Dm7@0 ii7 subdominant>1; G7@1 V7 dominant>2; C@4 I tonic>-1; "
           "A7@5 V7/ii dominant>4; Dm7@8 ii7 subdominant>5; G7@9 V7 dominant>6; C@12 I tonic>-1");
     brindle_chord_reading chord;
+    CHECK(brindle_analysis_chord(analysis.get(), 9999, &chord) == BRINDLE_ERROR_ARGUMENT);
+    CHECK(chord.chord.root.pitch_class == BRINDLE_NONE);
+    CHECK(chord.resolves_to == -1);
+    brindle_center center;
+    CHECK(brindle_analysis_center(analysis.get(), 9999, &center) == BRINDLE_ERROR_ARGUMENT);
+    CHECK(center.scale.root.pitch_class == BRINDLE_NONE);
     REQUIRE(brindle_analysis_chord(analysis.get(), 0, &chord) == BRINDLE_OK);
     CHECK(chord.relation == BRINDLE_RELATION_RELATED_SECOND);
     CHECK(brindle_relation_name(chord.relation) == std::string("related second"));
@@ -123,7 +129,6 @@ TEST_CASE("An analysis outlives its song and tells each chord as a teacher reads
     REQUIRE(brindle_analysis_region(analysis.get(), 0, &region) == BRINDLE_OK);
     CHECK(region.chord_count == 7);
     CHECK(region.end == 16.0);
-    brindle_center center;
     REQUIRE(brindle_analysis_center_count(analysis.get()) > 0);
     REQUIRE(brindle_analysis_center(analysis.get(), 0, &center) == BRINDLE_OK);
     CHECK(TextOf(brindle_scale_write, &center.scale).substr(0, 1) == "C");

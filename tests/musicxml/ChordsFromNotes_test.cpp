@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/musicxml/ChordsFromNotes.h"
+#include "brindle/platform/Alerts.h"
 #include "brindle/platform/Error.h"
 
 #include <doctest/doctest.h>
@@ -127,8 +128,14 @@ TEST_CASE("Notes are read as they sound: ties are one note, grace notes none") {
 TEST_CASE("What is no score tells why") {
     CScoreNotes score;
     Error error;
+    std::vector<std::string> alerts;
+    SetAlertHandler([&alerts](const CAlert& alert) { alerts.push_back(alert.informativeText); });
     CHECK_FALSE(ReadScoreNotes("no score", score, &error));
     CHECK_FALSE(error.description.empty());
+    CHECK_MESSAGE(alerts.empty(), "who is told the error is not shown an alert, too");
+    ShowAlert({.messageText = {}, .informativeText = "another", .button = {}});
+    CHECK(alerts == std::vector<std::string>{"another"});
+    SetAlertHandler({});
     CHECK_FALSE(ReadScoreNotes("PK\x03\x04", score, &error));
     CHECK(score.mNotes.empty());
 }

@@ -271,6 +271,7 @@ TEST_CASE("Numerals tell how a seventh is written, which tells a German sixth fr
 
 TEST_CASE("What cannot be read is a fault and no song") {
     CHECK(Faults(ReadSongFile("/no/such/file")) == "0:0: there is no such file");
+    CHECK(ReadSongFile("/no/such/file").mFormat == TSongFormat_ChordText);
     CHECK(Faults(ReadSongFile("/")) == "0:0: the file cannot be read, or is larger than 256 MiB");
     CHECK(Faults(ReadSong("<score-partwise>\n <part></parts>")).substr(0, 2) == "2:");
     std::string archive = "PK\x03\x04";

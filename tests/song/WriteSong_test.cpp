@@ -4,6 +4,7 @@
 #include "brindle/analysis/RomanNumeral.h"
 #include "brindle/chords/WriteChordSymbol.h"
 #include "brindle/song/BuiltInSongs.h"
+#include "brindle/song/ReadSong.h"
 #include "brindle/theory/KeyIntervals.h"
 
 #include <doctest/doctest.h>
@@ -225,6 +226,40 @@ TEST_CASE("The longest quote is found, and where it stands") {
         REQUIRE(written.mFault == "");
         CHECK(written.mLongestQuote.mTitle == song.mTitle);
         CHECK(written.mLongestQuote.mBars >= LongestQuoteByHand(model, written.mSong));
+    }
+}
+
+TEST_CASE("A wished-for numeral takes the sevenths of its key, and a forbidden one all") {
+    struct CRow {
+        TSongWishKind mKind;
+        const char* mText;
+        const char* mFitting;
+        const char* mUnfit;
+    };
+    const CRow rows[] = {
+        {TSongWish_Contains, "ii-V-I of Bb", "Cm9 F13 Bbmaj7", "C Fmaj7 Bb7"},
+        {TSongWish_Contains, "iv V i of A minor", "Dm6 E7b9 Am(maj7)", "D Emaj7 A"},
+        {TSongWish_Contains, "I bVII of C", "C6 Bb7", "C7 Bbm"},
+        {TSongWish_Contains, "ii7 V7 of C", "Dm7 G7", "Dm G9"},
+        {TSongWish_Never, "I of C", "C7", "Cm"},
+    };
+    for (const CRow& row : rows) {
+        INFO(std::string(row.mText));
+        const auto read = ReadChordsWish(row.mKind, row.mText, KeyOf("C major"));
+        REQUIRE(read.mFault == "");
+        const auto fits = [&](const char* chords) {
+            std::string answer;
+            const CSong song = ReadSong(chords);
+            for (std::size_t i = 0; i < read.mWishes[0].mChords.size(); ++i) {
+                const CChordLite& chord = song.mChords[i];
+                const int root = chord.mRootKeyEnh.mKeyNr;
+                const std::uint64_t mask = chord.mSemitones.Mask();
+                answer += read.mWishes[0].mChords[i].Fits(root, root, mask) ? 'y' : 'n';
+            }
+            return answer;
+        };
+        CHECK(fits(row.mFitting).find('n') == std::string::npos);
+        CHECK(fits(row.mUnfit).find('y') == std::string::npos);
     }
 }
 
