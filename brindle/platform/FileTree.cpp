@@ -36,21 +36,57 @@ bool WriteNewFile(const fs::path& path, std::string_view bytes) {
     return close(file) == 0 && ok;
 }
 
-/// Fills a folder that is there and empty.
-bool FillFolder(const fs::path& folder, const FileNode& tree) {
+/// Whether a link stands at the path that leads out of its folder.
+bool LeadsOut(const fs::path& path) {
+    std::error_code error;
+    if (!fs::is_symlink(fs::symlink_status(path, error))) return false;
+    const auto behind = WholeFiles::BehindLinks(path);
+    if (!behind) return false;
+    const fs::path target = fs::weakly_canonical(*behind, error);
+    if (error) return false;
+    const fs::path folder = fs::weakly_canonical(path.parent_path(), error);
+    return !error &&
+           std::mismatch(folder.begin(), folder.end(), target.begin(), target.end()).first !=
+               folder.end();
+}
+
+bool CopyLink(const fs::path& link, const fs::path& copy) {
+    std::error_code error;
+    fs::copy_symlink(link, copy, error);
+    return !error;
+}
+
+/// Fills a folder that is there and empty. Links that lead out of `old`, which it is to replace,
+/// are in it again.
+bool FillFolder(const fs::path& folder, const FileNode& tree, const fs::path& old) {
     for (const auto& [name, child] : tree.mChildren) {
-        const fs::path path = folder / name;
         if (!IsEntryName(name)) return false;
+        const fs::path path = folder / name;
+        bool ok = false;
         if (child.mIsFolder) {
-            if (mkdir(path.c_str(), kUsualFolderRights) != 0 || !FillFolder(path, child)) {
-                return false;
-            }
-        } else if (!WriteNewFile(path, child.mContents)) {
-            return false;
+            ok =
+                mkdir(path.c_str(), kUsualFolderRights) == 0 && FillFolder(path, child, old / name);
+        } else if (LeadsOut(old / name)) {
+            ok = CopyLink(old / name, path);
+        } else {
+            ok = WriteNewFile(path, child.mContents);
         }
+        if (!ok) return false;
     }
     WholeFiles::FlushFolder(folder);
     return true;
+}
+
+/// Writes what stands behind the links of a folder that was filled.
+bool WriteBehindLinks(const fs::path& folder, const FileNode& tree) {
+    return std::all_of(tree.mChildren.begin(), tree.mChildren.end(), [&](const auto& entry) {
+        const auto& [name, child] = entry;
+        const fs::path path = folder / name;
+        if (child.mIsFolder) return WriteBehindLinks(path, child);
+        std::error_code ignored;
+        return !fs::is_symlink(fs::symlink_status(path, ignored)) ||
+               WriteFileAtomically(path, child.mContents);
+    });
 }
 
 /// Exchanges two folders in one step; false where the system cannot.
@@ -123,8 +159,9 @@ bool WriteFolderAtomically(const fs::path& path, const FileNode& tree) {
     if (!ScratchEntries::MakeNewFolder(beside, kUsualFolderRights)) return false;
     // Behind an exchange it is the old folder, else what could not be put in its place.
     const ScratchEntries::CRemover remover(beside);
-    const bool ok =
-        FillFolder(beside, tree) && TakeRightsOf(*target, beside) && PutInPlace(beside, *target);
+    // Relative links lead to the same place from here, as both folders lie in one.
+    const bool ok = FillFolder(beside, tree, *target) && TakeRightsOf(*target, beside) &&
+                    WriteBehindLinks(beside, tree) && PutInPlace(beside, *target);
     if (ok) WholeFiles::FlushFolder(target->parent_path());
     return ok;
 }

@@ -26,8 +26,10 @@ inline constexpr std::uint64_t kFolderMaxSize = std::uint64_t{1} << 30;
 /// Where the system cannot exchange two folders in one step, the old one is moved aside first: a
 /// kill just then leaves it beside. False when it failed, when the tree is no folder or has a name
 /// that no file can have, and when something other than a folder stands at the path; nothing is
-/// left behind then. A link is followed, also one to nothing. What a kill has left is removed by
-/// the next writer of the folder after an hour.
+/// left behind then. A link is followed, also one to nothing. So are links in the folder that lead
+/// out of it, where the tree has a file of that name: they stay, and what they name is replaced,
+/// each for itself, before the folder is. What a kill has left is removed by the next writer of the
+/// folder after an hour.
 [[nodiscard]] bool WriteFolderAtomically(const std::filesystem::path& path, const FileNode& tree);
 
 /// The path with the user's home folder for a "~" at its start.

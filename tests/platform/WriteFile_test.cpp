@@ -110,6 +110,57 @@ TEST_CASE("A folder is written behind links, too") {
     CHECK(NamesIn(folder.Path()) == std::vector<std::string>{"dangling", "there"});
 }
 
+TEST_CASE("Links in a folder that lead out of it stay, and what they name is written") {
+    const CScratchFolder folder;
+    const std::string path = folder.File("package");
+    fs::create_directory(folder.File("elsewhere"));
+    fs::create_directory(path);
+    const auto tree = [](const std::string& content) {
+        FileNode result = TreeWith(content);
+        for (const char* const name : {"inside", "relative", "dangling", "ring"}) {
+            result.mChildren[name].mContents = content + " " + name;
+        }
+        return result;
+    };
+    REQUIRE(WriteFileAtomically(folder.File("elsewhere/one"), "old"));
+    REQUIRE(WriteFileAtomically(folder.File("elsewhere/unnamed"), "old"));
+    fs::create_symlink(folder.File("elsewhere/one"), path + "/file");
+    fs::create_symlink("../elsewhere/two", path + "/relative");
+    fs::create_symlink("../elsewhere/three", path + "/dangling");
+    fs::create_symlink("file beside", path + "/inside");
+    fs::create_symlink("ring", path + "/ring");
+    fs::create_symlink("../elsewhere/unnamed", path + "/not in the tree");
+    for (const char* const content : {"first", "second"}) {
+        REQUIRE(WriteFolderAtomically(path, tree(content)));
+        for (const char* const link : {"/file", "/relative", "/dangling"}) {
+            CHECK(S_ISLNK(ModeOf(path + link)));
+        }
+        for (const char* const name : {"inside", "ring", "relative", "dangling"}) {
+            CHECK(ReadWholeFile(path + "/" + name) == std::string(content) + " " + name);
+        }
+        CHECK(ReadWholeFile(folder.File("elsewhere/one")) == content);
+        CHECK(ReadWholeFile(folder.File("elsewhere/two")) == std::string(content) + " relative");
+    }
+    CHECK(S_ISREG(ModeOf(path + "/inside")));
+    CHECK(NamesIn(path) ==
+          std::vector<std::string>{"dangling", "file", "inside", "relative", "ring"});
+    CHECK(ReadWholeFile(folder.File("elsewhere/unnamed")) == "old");
+    CHECK(NamesIn(folder.Path()) == std::vector<std::string>{"elsewhere", "package"});
+}
+
+TEST_CASE("A link in a folder to what cannot be written leaves the folder as it was") {
+    const CScratchFolder folder;
+    const std::string path = folder.File("package");
+    fs::create_directories(folder.File("elsewhere/folder"));
+    REQUIRE(WriteFolderAtomically(path, TreeWith("old")));
+    fs::create_symlink("../elsewhere/folder", path + "/link");
+    FileNode tree = TreeWith("new");
+    tree.mChildren["link"].mContents = "x";
+    CHECK_FALSE(WriteFolderAtomically(path, tree));
+    CHECK(ReadWholeFile(path + "/file") == "old");
+    CHECK(NamesIn(folder.Path()) == std::vector<std::string>{"elsewhere", "package"});
+}
+
 TEST_CASE("A pipe takes the bytes and stays a pipe") {
     const CScratchFolder folder;
     const std::string path = folder.File("pipe");
