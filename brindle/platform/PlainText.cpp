@@ -3,7 +3,9 @@
 
 #include <fmt/format.h>
 #include <iterator>
+#include <limits>
 #include <ostream>
+#include <string>
 
 namespace brindle::PlainText {
 
@@ -11,6 +13,8 @@ namespace {
 
 // Room for the longest number: 309 digits of the largest double, sign, point, two decimals.
 using TBuffer = fmt::basic_memory_buffer<char, 320>;
+
+constexpr std::string_view kPlainFixed = "{:>6.2f}";
 
 void Write(std::ostream& stream, const TBuffer& buffer) {
     PlainText::Write(stream, std::string_view(buffer.data(), buffer.size()));
@@ -35,9 +39,14 @@ void WriteUnsigned(std::ostream& stream, std::uint64_t value) {
     Write(stream, buffer);
 }
 
+// Undefined positions are the lowest number there is, and each analysis has some. Its 309 digits
+// take as long as 600 other numbers.
 void WriteFixed(std::ostream& stream, double value) {
+    static const std::string lowest =
+        fmt::format(kPlainFixed, std::numeric_limits<double>::lowest());
+    if (value == std::numeric_limits<double>::lowest()) return Write(stream, lowest);
     TBuffer buffer;
-    fmt::format_to(std::back_inserter(buffer), "{:>6.2f}", value);
+    fmt::format_to(std::back_inserter(buffer), kPlainFixed, value);
     Write(stream, buffer);
 }
 
