@@ -37,26 +37,34 @@ XmlError ErrorFrom(const xmlError& error) {
 
 }  // namespace
 
+// The library prints what it lacks at its start unless somebody listens already. Its second start
+// does nothing, so that one short of memory is told once.
 void StartLibrary() {
     static std::once_flag once;
-    std::call_once(once, xmlInitParser);
+    std::call_once(once, [] {
+        const CErrorListener listener;
+        xmlInitParser();
+        if (listener.WasShort()) throw std::bad_alloc();
+    });
 }
 
-CMemoryWatch::CMemoryWatch()
-    : mFormer((StartLibrary(), xmlStructuredError)), mFormerContext(xmlStructuredErrorContext) {
+CErrorListener::CErrorListener()
+    : mFormer(xmlStructuredError), mFormerContext(xmlStructuredErrorContext) {
     xmlSetStructuredErrorFunc(this, Hear);
 }
 
-CMemoryWatch::~CMemoryWatch() {
+CErrorListener::~CErrorListener() {
     xmlSetStructuredErrorFunc(mFormerContext, mFormer);
 }
 
-void CMemoryWatch::Hear(void* self, xmlErrorPtr error) {
-    if (error->code == XML_ERR_NO_MEMORY) static_cast<CMemoryWatch*>(self)->mWasShort = true;
+void CErrorListener::Hear(void* self, xmlErrorPtr error) {
+    if (error->code == XML_ERR_NO_MEMORY) static_cast<CErrorListener*>(self)->mWasShort = true;
 }
 
+CMemoryWatch::CMemoryWatch() : mListener((StartLibrary(), CErrorListener())) {}
+
 void CMemoryWatch::Check() const {
-    if (mWasShort) throw std::bad_alloc();
+    if (mListener.WasShort()) throw std::bad_alloc();
 }
 
 struct CParse::Callbacks {

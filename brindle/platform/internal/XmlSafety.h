@@ -22,15 +22,14 @@ void StartLibrary();
 
 /// Hears what the XML library reports to nobody, which else it would print, and remembers whether
 /// memory was short. For one thread; the former listener comes back at the end.
-class CMemoryWatch {
+class CErrorListener {
 public:
-    CMemoryWatch();
-    ~CMemoryWatch();
-    CMemoryWatch(const CMemoryWatch&) = delete;
-    CMemoryWatch& operator=(const CMemoryWatch&) = delete;
+    CErrorListener();
+    ~CErrorListener();
+    CErrorListener(const CErrorListener&) = delete;
+    CErrorListener& operator=(const CErrorListener&) = delete;
 
-    /// Throws `std::bad_alloc` if memory was short since the beginning.
-    void Check() const;
+    [[nodiscard]] bool WasShort() const { return mWasShort; }
 
 private:
     static void Hear(void* self, xmlErrorPtr error);
@@ -38,6 +37,18 @@ private:
     xmlStructuredErrorFunc mFormer;
     void* mFormerContext;
     bool mWasShort = false;
+};
+
+/// Listens while the XML library is used, which it starts if that has not been done.
+class CMemoryWatch {
+public:
+    CMemoryWatch();
+
+    /// Throws `std::bad_alloc` if memory was short since the beginning.
+    void Check() const;
+
+private:
+    CErrorListener mListener;
 };
 
 /// One parse of bytes in memory. Entities of the document itself are expanded; every external one
