@@ -2,6 +2,7 @@
 #include "Interface.h"
 
 #include <array>
+#include <cstdint>
 #include <fstream>
 #include <iterator>
 #include <string>
@@ -20,19 +21,59 @@ const std::string& Score() {
     return bytes;
 }
 
-/// What a host may do with handles of its own, as one text; no check in it, since the tests' own
-/// are not for threads.
-std::string WorkOf(int number) {
-    const auto text = [](brindle_status status, char* made) {
-        std::string result = status == BRINDLE_OK ? made : brindle_last_error();
-        brindle_free(made);
-        return result + '\n';
-    };
-    const auto call = [&](const auto& function, auto... arguments) {
-        char* made = nullptr;
-        const brindle_status status = function(arguments..., &made);
-        return text(status, made);
-    };
+// What a host may do with handles of its own, as text; no check in it, since the tests' own are not
+// for threads.
+
+/// The text that a function makes of its arguments, or its error.
+template <class TFunction, class... TArguments>
+std::string TextBy(const TFunction& function, TArguments... arguments) {
+    char* made = nullptr;
+    const brindle_status status = function(arguments..., &made);
+    std::string result = status == BRINDLE_OK ? made : brindle_last_error();
+    brindle_free(made);
+    return result + '\n';
+}
+
+std::string WithValues(int number) {
+    const brindle_style style{number % 3, number % 2};
+    brindle_key key{};
+    brindle_key_read(number % 2 == 0 ? "F# minor" : "Bb", &key);
+    brindle_scale scale{};
+    brindle_scale_read(number % 2 == 0 ? "D dorian" : "Ab blues minor", &scale);
+    brindle_chord chord{};
+    brindle_chord_read(number % 2 == 0 ? "F#m7b5/C" : "Dbmaj9", 0, &chord);
+    return TextBy(brindle_key_write, &key) + TextBy(brindle_scale_write, &scale) +
+           TextBy(brindle_chord_write, &chord, &style) +
+           TextBy(brindle_tone_write, &chord.root, &style);
+}
+
+std::string WithNames(int number) {
+    const std::vector<int> notes{48 + number, 52 + number, 55 + number, 58};
+    brindle_names* names = nullptr;
+    brindle_names_of_notes(notes.data(), notes.size(), nullptr, &names);
+    brindle_name name{};
+    brindle_names_get(names, 0, &name);
+    std::string result = name.symbol;
+    brindle_names_free(names);
+    return result;
+}
+
+std::string WithMarkov(int number, const brindle_song* song) {
+    brindle_markov* model = nullptr;
+    brindle_markov_new(2, &model);
+    brindle_markov_learn(model, song);
+    std::string result = TextBy(brindle_markov_write, model);
+    brindle_markov* again = nullptr;
+    brindle_markov_read(result.c_str(), &again);
+    brindle_markov_options options = brindle_markov_options_default();
+    options.seed = static_cast<std::uint64_t>(number);
+    result += TextBy(brindle_markov_generate, again, &options);
+    brindle_markov_free(again);
+    brindle_markov_free(model);
+    return result;
+}
+
+std::string WithSong(int number) {
     const std::array<std::string, 4> songs{"Dm7 G7 | C A7 | Dm7 G7 | C", "Am F | C G | x",
                                            "Cm7 F7 | Bb Eb | Am7b5 D7 | Gm", Score()};
     const std::string& bytes = songs[static_cast<std::size_t>(number) % songs.size()];
@@ -41,35 +82,42 @@ std::string WorkOf(int number) {
     brindle_analysis* analysis = nullptr;
     const brindle_analysis_options options{{{-1, 127}, BRINDLE_MODE_NONE}, 7};
     brindle_analyse(song, &options, &analysis);
-    std::string result = call(brindle_analysis_json, analysis);
-    result += call(brindle_analysis_svg, analysis, BRINDLE_PICTURE_LEAD_SHEET);
-    result += call(brindle_analysis_svg, analysis, BRINDLE_PICTURE_TIME_AXIS);
-    result += call(brindle_score_json_lines, bytes.data(), bytes.size());
-    brindle_markov* model = nullptr;
-    brindle_markov_new(2, &model);
-    brindle_markov_learn(model, song);
-    result += call(brindle_markov_generate, model, nullptr);
-    brindle_markov_free(model);
-    const std::vector<int> notes{48 + number, 52 + number, 55 + number, 58};
-    brindle_names* names = nullptr;
-    brindle_names_of_notes(notes.data(), notes.size(), nullptr, &names);
-    brindle_name name;
-    brindle_names_get(names, 0, &name);
-    result += name.symbol;
-    brindle_names_free(names);
-    brindle_grids* grids = nullptr;
-    brindle_grids_of_frets(number % 2 == 0 ? "x02010" : "x0201", nullptr, 0, &grids);
-    result += call(brindle_grids_json, grids);
-    brindle_grids_free(grids);
-    brindle_grid_package* package = nullptr;
-    brindle_grid_package_read(BRINDLE_SOURCE_DIR "/data/Chord Grids/GuitarChords.gchdb", &package);
-    brindle_grids_find(package, "Am7", nullptr, 0, &grids);
-    result += call(brindle_grids_json, grids);
-    brindle_grids_free(grids);
-    brindle_grid_package_free(package);
+    std::string result = TextBy(brindle_analysis_json, analysis);
+    result += TextBy(brindle_analysis_text, analysis);
+    result += TextBy(brindle_analysis_svg, analysis, BRINDLE_PICTURE_LEAD_SHEET);
+    result += TextBy(brindle_analysis_svg, analysis, BRINDLE_PICTURE_TIME_AXIS);
+    result += TextBy(brindle_score_json_lines, bytes.data(), bytes.size());
+    result += WithMarkov(number, song);
     brindle_analysis_free(analysis);
     brindle_song_free(song);
     return result;
+}
+
+std::string TextOfGrids(brindle_grids* grids) {
+    std::string result =
+        TextBy(brindle_grids_json, grids) + TextBy(brindle_grids_svg, grids, "title");
+    brindle_grids_free(grids);
+    return result;
+}
+
+std::string WithGrids(int number) {
+    brindle_grids* grids = nullptr;
+    brindle_grids_of_frets(number % 2 == 0 ? "x02010" : "x0201", nullptr, 0, &grids);
+    std::string result = TextOfGrids(grids);
+    brindle_grid_package* package = nullptr;
+    brindle_grid_package_read(BRINDLE_SOURCE_DIR "/data/Chord Grids/GuitarChords.gchdb", &package);
+    // The package has no chords of the second tuning, so they are searched for.
+    for (const char* const tuning : {static_cast<const char*>(nullptr), "DADGAD"}) {
+        grids = nullptr;
+        brindle_grids_find(package, "Am7", tuning, 0, &grids);
+        result += TextOfGrids(grids);
+    }
+    brindle_grid_package_free(package);
+    return result;
+}
+
+std::string WorkOf(int number) {
+    return WithSong(number) + WithValues(number) + WithNames(number) + WithGrids(number);
 }
 
 TEST_CASE("Threads with handles of their own get what one thread gets, and their own errors") {
