@@ -16,6 +16,22 @@ namespace {
 
 using namespace brindle;
 
+// Some hundreds of steps of the search: as far up the neck as six strings allow, and on more of
+// them what two frets under a hand that mutes nothing have. What bounds the search is tested
+// elsewhere.
+CFingeringOptions FewSteps(const GChShortTuning& tuning) {
+    constexpr int kUsualStrings = 6;
+    CFingeringOptions options;
+    options.mLimit = 5;
+    options.mHighestFret = 5;
+    options.mSpan = 3;
+    if (GChNumberOfStringsInShortTuning(tuning) > kUsualStrings) {
+        options.mHighestFret = options.mSpan = 2;
+        options.mMutable = 0;
+    }
+    return options;
+}
+
 std::string_view TakeLine(std::string_view& text) {
     const std::string_view line = text.substr(0, text.find('\n'));
     text.remove_prefix(std::min(line.size() + 1, text.size()));
@@ -29,10 +45,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     const auto tuning = ReadTuning(TakeLine(text));
     if (!tuning) return 0;
     const CChordLite chord = ReadChordText(TakeLine(text)).mChord;
-    CFingeringOptions options;
-    options.mLimit = 5;
-    options.mHighestFret = 12;
-    auto grids = FoundGrids("chord", chord, *tuning, options);
+    auto grids = FoundGrids("chord", chord, *tuning, FewSteps(*tuning));
     for (const CChordGrid& grid : grids) {
         const auto frets = ReadFrets(FretsText(grid));
         if (!frets || *frets != grid.mFrets) std::abort();
