@@ -15,6 +15,10 @@ std::string QuartersOfTicks(std::int32_t ticks) {
     return ShortNumber(static_cast<double>(ticks) / kImportTicksPerQuarter);
 }
 
+std::string ShownQuarters(std::int32_t ticks) {
+    return QuartersOfTicks(ticks) + (ticks == kImportTicksPerQuarter ? " quarter" : " quarters");
+}
+
 // The number of the bar in which a position lies. Bars may begin at the same place; the last
 // counts.
 std::string BarAt(const CImportedPart& part, std::int32_t position) {
@@ -55,16 +59,15 @@ std::string PartText(CImportedPart part, const CPaint& paint) {
                                      [](const CImportedEvent& event) { return event.mIsNote; });
     const std::string separator = part.mID.empty() || part.mName.empty() ? "" : " ";
     const std::string name = Printable(part.mID + separator + part.mName);
-    std::string text =
-        fmt::format("{}: {} {}, {} {}, {} quarters\n\n",
-                    paint.Strong(name.empty() ? "Part without name" : name), part.mMeasures.size(),
-                    part.mMeasures.size() == 1 ? "bar" : "bars", notes,
-                    notes == 1 ? "note" : "notes", QuartersOfTicks(part.mEnd));
+    std::string text = fmt::format(
+        "{}: {} {}, {} {}, {}\n\n", paint.Strong(name.empty() ? "Part without name" : name),
+        part.mMeasures.size(), part.mMeasures.size() == 1 ? "bar" : "bars", notes,
+        notes == 1 ? "note" : "notes", ShownQuarters(part.mEnd));
     text += table.Text(paint, "  ");
     for (const CImportedEvent& note : part.mNotesLeftOpen) {
-        text += fmt::format("\n  The tie of {} at {} does not end; it is played for {} quarters\n",
+        text += fmt::format("\n  The tie of {} at {} does not end; it is played for {}\n",
                             note.mWhat, QuartersOfTicks(note.mPosition),
-                            note.mLength ? QuartersOfTicks(*note.mLength) : "?");
+                            note.mLength ? ShownQuarters(*note.mLength) : "? quarters");
     }
     return text;
 }

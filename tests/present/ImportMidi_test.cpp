@@ -105,7 +105,9 @@ TEST_CASE("A note whose tie does not end sounds as long as it is written, and is
     CHECK(notes[1].mChannel == 0);
     CHECK(ImportText(score, CPaint(false))
               .find("The tie of C4 at 0 does not end; it is played for "
-                    "2 quarters") != std::string::npos);
+                    "2 quarters\n") != std::string::npos);
+    const CImportedScore shorter = Import("", Pitched("<tie type='start'/>"));
+    CHECK(ImportText(shorter, CPaint(false)).ends_with("it is played for 1 quarter\n"));
 }
 
 TEST_CASE("A tie that ends is one note and nothing is told") {
