@@ -202,6 +202,7 @@ TStatus AnalyseText(const CTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
     parse.mChordNamePrefs = NamePrefs();
     CTypedChords reading = options.mReading;
     if (options.mFormat.Format() == TFormat::Native) reading.UseNative();
+    if (!signKeys.empty()) reading.UseKey(signKeys.front().mSignKey);
     const auto song = reading.ReadSongOrFail(typed, parse);
     if (!song) return TStatus::BadInput;
     analysed.mAnalyse.AnalyseFromChords(

@@ -69,12 +69,15 @@ struct CSongWithKeys {
 };
 
 // Nothing when the text is not understood; then the error has been printed.
-std::optional<CSongWithKeys> SongOfText(const CTypedSong& typed, const CKeysOptions& options) {
+std::optional<CSongWithKeys> SongOfText(const CTypedSong& typed, const CSignKeyLite& key,
+                                        const CKeysOptions& options) {
     TChordStringParse parse;
     parse.mBeatsPerBar = options.mKeys.mBeatsPerBar;
     parse.mBeatsPerChord = options.mBeatsPerChord;
     parse.mChordNamePrefs = NamePrefs();
-    auto read = options.mReading.ReadSongOrFail(typed, parse);
+    CTypedChords reading = options.mReading;
+    reading.UseKey(key);
+    auto read = reading.ReadSongOrFail(typed, parse);
     if (!read) return std::nullopt;
     CHarmonicAnalyse chordsOnly;
     chordsOnly.mChords = std::move(read->mChords);
@@ -112,7 +115,8 @@ std::string Present(const CSongWithKeys& song, const CSongReading& reading,
 
 TSongOutput KeysOf(const CTypedSong& typed, const CReadingOptions& readingOptions,
                    const CKeysOptions& options) {
-    auto song = typed.mIsScore ? SongOfScore(typed, options) : SongOfText(typed, options);
+    auto song = typed.mIsScore ? SongOfScore(typed, options)
+                               : SongOfText(typed, readingOptions.mStatedKey, options);
     if (!song) return TStatus::BadInput;
     if (!options.mKey.empty()) song->mSong.mStatedKey = readingOptions.mStatedKey;
     return Present(*song, ReadSongHarmony(song->mSong, readingOptions), options);

@@ -1,21 +1,17 @@
 // SPDX-License-Identifier: MIT
 #include "cli/CommandLine.h"
 #include "cli/Input.h"
-#include "cli/Json.h"
 #include "cli/KeyText.h"
 #include "cli/TypedChords.h"
 
-#include "brindle/analysis/CHarmAnlsChords.h"
-#include "brindle/analysis/CKeyOfSong.h"
 #include "brindle/analysis/ReadNumerals.h"
 #include "brindle/analysis/ReadRomanText.h"
 #include "brindle/analysis/RomanNumeral.h"
 #include "brindle/chords/ReadChordText.h"
 #include "brindle/chords/WriteChordSymbol.h"
+#include "brindle/present/NumeralsJson.h"
 #include "brindle/present/RomanTextTable.h"
 #include "brindle/present/ShownNames.h"
-
-#include <fmt/format.h>
 
 #include <algorithm>
 #include <memory>
@@ -32,6 +28,7 @@ constexpr CCommandHelp kNumeralsHelp{
     "  brindle numerals \"Fm7 Bb7/D Eb\" --key Eb --figures\n"
     "  brindle numerals \"i iio6 V6/5/V Cad64 V7\" --key \"C minor\" --figures\n"
     "  brindle numerals --from romantext analysis.txt\n"
+    "  brindle numerals --from romantext \"C: I V65/V V a: i\"\n"
     "  brindle numerals \"Fm7 Bb7 Eb\" --key Eb --nashville\n"
     "  cat song.txt | brindle numerals - --key \"A minor\" --json\n",
 };
@@ -66,45 +63,11 @@ CNumeralsReading ReadChordWords(std::string_view text) {
     return reading;
 }
 
-// The numerals of all words in one key; empty for the marks.
-std::vector<std::string> Numerals(const std::vector<CNumeralWord>& words, const CSignKeyLite& key,
-                                  const CNumeralOptions& options) {
-    CHarmAnlsChords chords;
-    for (const CNumeralWord& word : words) {
-        chords.emplace_back(word.mChord, static_cast<double>(chords.size()));
-    }
-    CKeyOfSong keys;
-    keys.mRegions.push_back({.mKey = key, .mBegin = 0, .mEnd = chords.size()});
-    return NumeralsOf(chords, keys, options);
-}
-
-std::string WordsJson(const std::vector<CNumeralWord>& words, const CSignKeyLite& key,
-                      bool areNumerals, CNumeralOptions options) {
-    options.mNashville = false;
-    const std::vector<std::string> roman = Numerals(words, key, options);
-    options.mNashville = true;
-    const std::vector<std::string> nashville = Numerals(words, key, options);
-    Json list = Json::array();
-    for (std::size_t i = 0; i < words.size(); ++i) {
-        const CNumeralWord& word = words[i];
-        if (word.IsMark() || word.mChord.IsUndef()) continue;
-        list.push_back(
-            {{"Symbol", areNumerals ? WriteChordSymbol(word.mChord) : Printable(word.mText)},
-             {"Numeral", roman[i]},
-             {"Nashville", nashville[i]},
-             {"RootKeyEnh", KeyEnhToJson(word.mChord.mRootKeyEnh)},
-             {"BassKeyEnh", KeyEnhToJson(word.mChord.mBassKeyEnh)},
-             {"Semitones", word.mChord.mSemitones.Mask()},
-             {"Intervals", IntervalsToJson(word.mChord.mSemitones)}});
-    }
-    return JsonText({{"Key", key.NameLong(NamePrefs())}, {"Chords", list}});
-}
-
 // The lines as they were typed, with the words turned.
 std::string WordsText(const std::vector<CNumeralWord>& words, const CSignKeyLite& key,
                       bool toChords, const CNumeralOptions& options) {
     std::vector<std::string> turned(words.size());
-    if (!toChords) turned = Numerals(words, key, options);
+    if (!toChords) turned = NumeralsOfWords(words, key, options);
     std::string text;
     for (std::size_t i = 0; i < words.size(); ++i) {
         if (i > 0) text += words[i].mLine == words[i - 1].mLine ? ' ' : '\n';
@@ -117,48 +80,57 @@ std::string WordsText(const std::vector<CNumeralWord>& words, const CSignKeyLite
     return text + '\n';
 }
 
-TStatus NumeralsOfWords(const CNumeralsOptions& options) {
-    if (options.mKey.empty()) {
-        return Fail(TStatus::BadUsage, "--key is required; see brindle numerals --help");
-    }
-    const auto key = ReadKeyOption(options.mKey);
-    if (!key) return TStatus::BadUsage;
-    const auto lines = TypedSongLines(options.mWords);
-    if (!lines) return TStatus::BadInput;
-    const std::string text = fmt::format("{}", fmt::join(*lines, "\n"));
-    const bool areNumerals = AreNumerals(text, *key, options);
-    const CNumeralsReading reading =
-        areNumerals ? ReadNumerals(text, *key, options.mNumerals) : ReadChordWords(text);
-    if (!reading.mFaults.empty()) {
-        const std::size_t count = options.mIsLenient ? reading.mFaults.size() : 1;
-        PrintFaults(text, std::span(reading.mFaults).first(count), options.mIsLenient);
-        if (!options.mIsLenient) return TStatus::BadInput;
-    }
-    if (options.mFormat.Format() == TFormat::Json) {
-        return Print(WordsJson(reading.mWords, *key, areNumerals, options.mNumerals));
-    }
-    const bool toChords = areNumerals && !options.mNumerals.mNashville;
-    return Print(WordsText(reading.mWords, *key, toChords, options.mNumerals));
+// False where faults end the reading; they have been printed.
+bool AcceptsFaults(const std::string& text, const std::vector<CTextFault>& faults,
+                   const CNumeralsOptions& options) {
+    if (faults.empty()) return true;
+    const std::size_t count = options.mIsLenient ? faults.size() : 1;
+    PrintFaults(text, std::span(faults).first(count), options.mIsLenient);
+    return options.mIsLenient;
 }
 
-TStatus NumeralsOfAnalysis(const CNumeralsOptions& options) {
-    if (options.mWords.size() != 1) {
-        return Fail(TStatus::BadUsage, "--from romantext reads one file, or - for standard input");
+TStatus ShowWords(const std::string& text, const CSignKeyLite& key,
+                  const CNumeralsOptions& options) {
+    const bool areNumerals = AreNumerals(text, key, options);
+    const CNumeralsReading reading =
+        areNumerals ? ReadNumerals(text, key, options.mNumerals) : ReadChordWords(text);
+    if (!AcceptsFaults(text, reading.mFaults, options)) return TStatus::BadInput;
+    if (options.mFormat.Format() == TFormat::Json) {
+        return Print(NumeralsJson(reading, text, key, areNumerals, options.mNumerals));
     }
-    const auto text = ReadInput(options.mWords.front());
-    if (!text) return TStatus::BadInput;
-    const CRomanTextReading reading = ReadRomanText(*text);
-    if (!reading.mFaults.empty()) {
-        const std::size_t count = options.mIsLenient ? reading.mFaults.size() : 1;
-        PrintFaults(*text, std::span(reading.mFaults).first(count), options.mIsLenient);
-        if (!options.mIsLenient) return TStatus::BadInput;
-    }
+    const bool toChords = areNumerals && !options.mNumerals.mNashville;
+    return Print(WordsText(reading.mWords, key, toChords, options.mNumerals));
+}
+
+TStatus ShowAnalysis(const std::string& text, const CSignKeyLite& key,
+                     const CNumeralsOptions& options) {
+    const CRomanTextReading reading = ReadRomanText(text, key);
+    PrintFaults(text, reading.mNotes, true);
+    if (!AcceptsFaults(text, reading.mFaults, options)) return TStatus::BadInput;
     const bool isJson = options.mFormat.Format() == TFormat::Json;
-    return Print(isJson ? RomanTextJson(reading) : RomanTextText(reading, PaintOfOutput()));
+    return Print(isJson ? RomanTextJson(reading, text) : RomanTextText(reading, PaintOfOutput()));
+}
+
+// As it was typed or stands in a file, so that faults have their lines.
+std::optional<std::string> TypedNumerals(const std::vector<std::string>& words) {
+    const bool isSource = words.size() == 1 && (words[0] == "-" || IsFileName(words[0]));
+    return isSource ? ReadInput(words[0]) : TextFromWords(words);
 }
 
 TStatus Numerals(const CNumeralsOptions& options) {
-    return options.mFrom == "romantext" ? NumeralsOfAnalysis(options) : NumeralsOfWords(options);
+    const bool isAnalysis = options.mFrom == "romantext";
+    CSignKeyLite key;
+    if (options.mKey.empty() && !isAnalysis) {
+        return Fail(TStatus::BadUsage, "--key is required; see brindle numerals --help");
+    }
+    if (!options.mKey.empty()) {
+        const auto typed = ReadKeyOption(options.mKey);
+        if (!typed) return TStatus::BadUsage;
+        key = *typed;
+    }
+    const auto text = TypedNumerals(options.mWords);
+    if (!text) return TStatus::BadInput;
+    return isAnalysis ? ShowAnalysis(*text, key, options) : ShowWords(*text, key, options);
 }
 
 }  // namespace
@@ -178,10 +150,10 @@ void AddNumerals(CCommand& program) {
     const auto options = std::make_shared<CNumeralsOptions>();
     command
         .AddArgument("TEXT", options->mWords,
-                     "Numerals or chords, or the file of an analysis; - reads standard input")
+                     "Numerals, chords or an analysis, or a file with them; - reads standard input")
         .Required();
     command.AddOption("--key", "KEY", options->mKey,
-                      "The key, as in \"A minor\" or Bb; an analysis has its own");
+                      "The key, as in \"A minor\" or Bb; of an analysis, up to its own first key");
     command.AddChoice("--from", options->mFrom, {"guess", "numerals", "chords", "romantext"},
                       "What the text has; the first word tells numerals from chords");
     command.AddFlag("--lenient", options->mIsLenient,

@@ -175,6 +175,7 @@ CSong CTypedChords::ReadSource(std::string_view bytes, const TChordStringParse& 
     prefs.mBeatsPerChord = parse.mBeatsPerChord;
     prefs.mEven = mIsEven;
     prefs.mLenient = mIsLenient;
+    prefs.mKey = mKey;
     return brindle::ReadSong(bytes, prefs);
 }
 

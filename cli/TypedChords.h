@@ -52,6 +52,8 @@ public:
 
     /// As --symbols native: by the parser that hosts use, which has no faults.
     void UseNative() { mReader = "native"; }
+    /// Of numerals up to the first key of their own.
+    void UseKey(const CSignKeyLite& key) { mKey = key; }
     [[nodiscard]] bool IsLenient() const { return mIsLenient; }
 
     /// The chords of typed symbols, one for each; any H among them makes them all German. Nothing
@@ -79,6 +81,7 @@ private:
     std::string mForm = "auto";
     bool mIsLenient = false;
     bool mIsEven = false;
+    CSignKeyLite mKey;
 };
 
 }  // namespace brindle::cli

@@ -1,5 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/analysis/ReadNumerals.h"
+
+#include "brindle/analysis/CHarmAnlsChords.h"
+#include "brindle/analysis/CKeyOfSong.h"
 #include "brindle/platform/Ascii.h"
 
 #include <algorithm>
@@ -33,6 +36,17 @@ std::vector<CNumeralWord> NumeralWords(std::string_view text) {
         text.remove_prefix(word.size());
     }
     return words;
+}
+
+std::vector<std::string> NumeralsOfWords(const std::vector<CNumeralWord>& words,
+                                         const CSignKeyLite& key, const CNumeralOptions& options) {
+    CHarmAnlsChords chords;
+    for (const CNumeralWord& word : words) {
+        chords.emplace_back(word.mChord, static_cast<double>(chords.size()));
+    }
+    CKeyOfSong keys;
+    keys.mRegions.push_back({.mKey = key, .mBegin = 0, .mEnd = chords.size()});
+    return NumeralsOf(chords, keys, options);
 }
 
 CNumeralsReading ReadNumerals(std::string_view text, const CSignKeyLite& key,

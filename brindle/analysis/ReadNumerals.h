@@ -34,6 +34,11 @@ struct CNumeralsReading {
 /// The words between white space, with their places; their chords are undefined.
 [[nodiscard]] std::vector<CNumeralWord> NumeralWords(std::string_view text);
 
+/// The numerals of the chords of all words in one key; empty for words without a chord.
+[[nodiscard]] std::vector<std::string> NumeralsOfWords(const std::vector<CNumeralWord>& words,
+                                                       const CSignKeyLite& key,
+                                                       const CNumeralOptions& options = {});
+
 /// Reads a text of Roman numerals or Nashville numbers with bar lines: `ii7 V7 | I^7 .`
 ///
 /// A word that is not understood is a fault and has no chord; the others are read all the same.

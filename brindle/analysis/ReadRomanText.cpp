@@ -4,6 +4,7 @@
 #include "brindle/analysis/RomanNumeral.h"
 #include "brindle/analysis/internal/RomanTextWords.h"
 #include "brindle/platform/Ascii.h"
+#include "brindle/theory/ReadKeyText.h"
 
 #include <algorithm>
 #include <array>
@@ -38,12 +39,34 @@ bool IsDoubleBar(std::string_view word) {
     return word.find_first_not_of("|:") == word.npos && word.find('|') != word.npos;
 }
 
+bool HasBeats(std::string_view line) {
+    for (std::string_view word = TakeWord(line); !word.empty(); word = TakeWord(line)) {
+        if (BeatOf(word)) return true;
+    }
+    return false;
+}
+
+constexpr CNumeralOptions kNumeralsOfRomanText{.mFigures = true, .mByKey = true};
+
+// Headers have a colon, too, "Form: binary". Those of one letter are keys.
+bool BeginsWithNumeral(std::string_view line) {
+    const std::string_view word = TakeWord(line);
+    if (BeatOf(word) || KeyOf(word)) return true;
+    const CSignKeyLite anyKey({0, TEnh_n}, TSignKeyType_Major);
+    return word.find(':') == word.npos &&
+           !ReadNumeral(word, anyKey, kNumeralsOfRomanText).mChord.IsUndef();
+}
+
 bool IsWordForNoChord(std::string_view word) {
     return word == "NC" || word == "N.C." || word == "NC.";
 }
 
 class CRomanTextReader {
 public:
+    explicit CRomanTextReader(const CSignKeyLite& key) {
+        if (!key.IsUndef()) mKey = key;
+    }
+
     CRomanTextReading Read(std::string_view text);
 
 private:
@@ -76,6 +99,10 @@ private:
     void CopyMeasures(const CMeasureRange& range, std::string_view source);
     void FillTo(int number);
     void AddMeasure(int number, const CMeasureText& measure, bool hasLetter);
+    void ReadTypedLine(std::string_view line);
+    void ReadTypedWord(std::string_view word, CPlaceInText& place);
+    [[nodiscard]] CPlaceInText PlaceOfNextBar() const;
+    void CloseBar(int number, const CPlaceInText& place);
     void ReadWord(std::string_view word, CPlaceInText& place);
     void ReadBeat(double beat, std::string_view word, CPlaceInText& place);
     void ReadNumeralAt(std::string_view word, CPlaceInText& place);
@@ -110,6 +137,7 @@ void CRomanTextReader::ReadLine() {
     std::string_view line = Ascii::Trimmed(mLine);
     if (line.empty()) return;
     if (const auto range = TakeMeasures(line)) return ReadMeasureLine(line, *range);
+    if (BeginsWithNumeral(line)) return ReadTypedLine(line);
     const std::size_t colon = mLine.find(':');
     if (colon != mLine.npos) return ReadHeader(colon);
     Fail("this is neither a measure nor a header", line);
@@ -126,7 +154,9 @@ void CRomanTextReader::ReadHeader(std::size_t colon) {
     if (name == "Composer") return set(mReading.mComposer);
     if (name == "Analyst") return set(mReading.mAnalyst);
     if (name == "Time Signature" || name == "Time signature") return ReadTime(value);
-    if (name == "Pedal") Fail("pedals are left out", name, true);
+    if (name == "Pedal") return Fail("pedals are left out", name, true);
+    // "E flat: I V" is meant as music.
+    if (ReadKeyText(name).mError.empty()) Fail("a key is written as in Eb: or f#:", name);
 }
 
 void CRomanTextReader::ReadTime(std::string_view value) {
@@ -189,16 +219,51 @@ void CRomanTextReader::AddMeasure(int number, const CMeasureText& measure, bool 
     FillTo(number);
     if (mReading.mBars.size() >= kMostBars) return Fail("there are too many measures", mLine);
     mLastNumber = number;
-    CPlaceInText place{mEnd, mTime.BarLength(), mEnd};
+    CPlaceInText place = PlaceOfNextBar();
     std::string_view rest = measure.mText;
     while (true) {
         const std::string_view word = TakeWord(rest);
         if (word.empty()) break;
         ReadWord(word, place);
     }
+    CloseBar(number, place);
+}
+
+CRomanTextReader::CPlaceInText CRomanTextReader::PlaceOfNextBar() const {
+    return {mEnd, mTime.BarLength(), mEnd};
+}
+
+void CRomanTextReader::CloseBar(int number, const CPlaceInText& place) {
     const double length = place.mBarLength - place.mPickup;
     mReading.mBars.push_back({number, place.mBarPosition, length});
     mEnd = place.mBarPosition + length;
+}
+
+void CRomanTextReader::ReadTypedLine(std::string_view line) {
+    mLastNumber = std::max(mLastNumber, 0);
+    if (HasBeats(line)) return AddMeasure(mLastNumber + 1, {line, mLine, mLineNumber}, false);
+    CPlaceInText place = PlaceOfNextBar();
+    for (std::string_view word = TakeWord(line); !word.empty(); word = TakeWord(line)) {
+        if (mReading.mBars.size() >= kMostBars) return Fail("there are too many measures", word);
+        ReadTypedWord(word, place);
+    }
+    if (place.mPosition > place.mBarPosition) CloseBar(++mLastNumber, place);
+}
+
+void CRomanTextReader::ReadTypedWord(std::string_view word, CPlaceInText& place) {
+    if (KeyOf(word)) return ReadWord(word, place);
+    const bool isBarLine = IsDoubleBar(word);
+    const bool isFull = place.mPosition >= place.mBarPosition + place.mBarLength;
+    if (isFull || (isBarLine && place.mPosition > place.mBarPosition)) {
+        CloseBar(++mLastNumber, place);
+        place = PlaceOfNextBar();
+    }
+    if (isBarLine) {
+        if (word != "|") mReading.mDoubleBars.push_back(place.mPosition);
+        return;
+    }
+    if (word != ".") ReadNumeralAt(word, place);
+    place.mPosition += mTime.BeatLength();
 }
 
 void CRomanTextReader::ReadWord(std::string_view word, CPlaceInText& place) {
@@ -234,8 +299,7 @@ void CRomanTextReader::ReadNumeralAt(std::string_view word, CPlaceInText& place)
     if (mKey) chord.mKey = *mKey;
     if (!IsWordForNoChord(word)) {
         if (!mKey) return Fail("a numeral needs a key before it, as in C: I", word);
-        const CNumeralReading reading =
-            ReadNumeral(word, *mKey, {.mFigures = true, .mByKey = true});
+        const CNumeralReading reading = ReadNumeral(word, *mKey, kNumeralsOfRomanText);
         if (reading.mChord.IsUndef()) {
             Fail(reading.mFault, word.substr(std::min(reading.mFaultOffset, word.size())));
         } else {
@@ -277,8 +341,8 @@ void CRomanTextReader::SetLengths() {
 
 }  // namespace
 
-CRomanTextReading ReadRomanText(std::string_view text) {
-    return CRomanTextReader().Read(text);
+CRomanTextReading ReadRomanText(std::string_view text, const CSignKeyLite& key) {
+    return CRomanTextReader(key).Read(text);
 }
 
 }  // namespace brindle

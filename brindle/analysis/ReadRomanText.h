@@ -76,8 +76,15 @@ struct CRomanTextReading {
 /// the second one. `m5-8 = m1-4` copies measures, in the key of the place. A chord sounds up to the
 /// next one or the end. A measure 0 begins with its first beat.
 ///
+/// A line may have no measure, as people type it. With beats it is the next measure,
+/// `C: I b3 V65/V`; without them each numeral has a beat, in as many measures as that takes, and
+/// `|`, `||` and `.` are bar lines and holds: `C: I V | vi . a: i`.
+///
+/// `key` is that of the numerals before the first key that the text states; if it is undefined,
+/// they are faults.
+///
 /// Time is linear in the length of what is read and copied; more than 100,000 measures or copied
 /// words are a fault.
-[[nodiscard]] CRomanTextReading ReadRomanText(std::string_view text);
+[[nodiscard]] CRomanTextReading ReadRomanText(std::string_view text, const CSignKeyLite& key = {});
 
 }  // namespace brindle

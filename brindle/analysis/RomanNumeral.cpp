@@ -160,14 +160,25 @@ bool IsSpelled(const CKeyEnh& keyEnh) {
     return IsSensefulEnhForKeyNr(keyEnh.mKeyNr, keyEnh.mEnh);
 }
 
+// Letters from the root to the bass as it is spelled; the usual ones of its sound if it is not.
+int LettersToBass(const CChordLite& chord) {
+    const bool isSpelled = IsSpelled(chord.mRootKeyEnh) && IsSpelled(chord.mBassKeyEnh);
+    if (isSpelled) return LettersBetween(chord.mRootKeyEnh, chord.mBassKeyEnh);
+    const int intvl = IntvlBetween(chord.mRootKeyEnh, chord.mBassKeyEnh);
+    return kUsualLetters[static_cast<std::size_t>(intvl)];
+}
+
+// A figure would read the E sharp of G7/E# as F.
+bool IsSpelledOtherwise(const CChordLite& chord, int intvl) {
+    const bool isSpelled = IsSpelled(chord.mRootKeyEnh) && IsSpelled(chord.mBassKeyEnh);
+    return isSpelled && LettersToBass(chord) + 1 != StepOfSemitone(chord.mSemitones, intvl);
+}
+
 // The degree of the bass, as many letters above the root as it is spelled; the usual one of its
 // sound where that takes more than two accidentals. Counted in degrees, so that it is the same in
 // all keys.
 CNumeralDegree BassDegree(const CChordLite& chord, int rootNumber, const CSignKeyLite& key) {
-    const int intvl = IntvlBetween(chord.mRootKeyEnh, chord.mBassKeyEnh);
-    const bool isSpelled = IsSpelled(chord.mRootKeyEnh) && IsSpelled(chord.mBassKeyEnh);
-    const int letters = isSpelled ? LettersBetween(chord.mRootKeyEnh, chord.mBassKeyEnh)
-                                  : kUsualLetters[static_cast<std::size_t>(intvl)];
+    const int letters = LettersToBass(chord);
     CNumeralDegree degree{(rootNumber - 1 + letters) % 7 + 1, 0};
     const int dist = DistToTonic(chord.mBassKeyEnh, key);
     degree.mAccidental = SmallestKeyIntvlBetween(SemitonesOfDegree(degree, key.mSignKeyType), dist);
@@ -191,7 +202,8 @@ CTail TailOf(const CChordLite& chord, const CWrittenDegree& degree, const CSignK
     std::string bass;
     const int intvl = chord.HasBassNote() ? IntvlBetween(chord.mRootKeyEnh, chord.mBassKeyEnh) : 0;
     std::string figured;
-    if (intvl != 0 && options.mFigures && sign.mAlterations.empty()) {
+    const bool mayHaveFigure = sign.mAlterations.empty() && !IsSpelledOtherwise(chord, intvl);
+    if (intvl != 0 && options.mFigures && mayHaveFigure) {
         figured = SignWithFigure(text, chord.mSemitones, intvl);
     }
     if (intvl != 0 && figured.empty()) {
@@ -229,7 +241,11 @@ std::vector<std::string> NumeralsOf(const CHarmAnlsChords& chords, const CKeyOfS
         if (region == keys.mRegions.rend()) break;
         const std::string numeral = RomanNumeral(chords[begin], region->mKey, next, options);
         for (std::size_t ix = begin; ix < end; ++ix) {
-            if (!chords[ix].IsUndef()) numerals[ix] = numeral;
+            // The same sounds may be spelled anew: F7/Eb F7/D#.
+            const bool isSpelledAlike = chords[ix] == chords[begin];
+            if (chords[ix].IsUndef()) continue;
+            numerals[ix] =
+                isSpelledAlike ? numeral : RomanNumeral(chords[ix], region->mKey, next, options);
         }
         end = begin;
     }

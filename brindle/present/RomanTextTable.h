@@ -12,7 +12,4 @@ struct CRomanTextReading;
 /// An analysis as a table, a line for each chord.
 [[nodiscard]] std::string RomanTextText(const CRomanTextReading& reading, const CPaint& paint);
 
-/// The same as JSON, with bars, keys and time signatures.
-[[nodiscard]] std::string RomanTextJson(const CRomanTextReading& reading);
-
 }  // namespace brindle

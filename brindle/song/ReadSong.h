@@ -24,6 +24,8 @@ struct CSongOptions {
     bool mLenient = false;
     /// `mBIsBFlat` is set by any H in the song.
     CChordTextOptions mChordTextPrefs{};
+    /// Of the numerals of an analysis, up to the first key that it states.
+    CSignKeyLite mKey = {};
 };
 
 /// Reads a song in any form.

@@ -93,6 +93,48 @@ TEST_CASE("Measures are copied in the key of their new place, and in their own k
           "20+4 G vi; 24+2 C I; 26+2 C V; 28+4 C vi");
 }
 
+TEST_CASE("A typed line needs no measure") {
+    const struct {
+        const char* mText;
+        const char* mChords;
+        const char* mBars;
+    } rows[] = {
+        {"C: I V a: i", "0+1 C I; 1+1 C V; 2+2 Am i", "1@0+4"},
+        {"C: I IV V I vi", "0+1 C I; 1+1 C IV; 2+1 C V; 3+1 C I; 4+4 C vi", "1@0+4 2@4+4"},
+        {"C: I V | a: i . V || i", "0+1 C I; 1+3 C V; 4+2 Am i; 6+2 Am V; 8+4 Am i",
+         "1@0+4 2@4+4 3@8+4"},
+        {"Time Signature: 6/8\nC: I V7 I", "0+1.5 C I; 1.5+1.5 C V7; 3+3 C I", "1@0+3 2@3+3"},
+        {"C: I b3 V65/V", "0+2 C I; 2+2 C V65/V", "1@0+4"},
+        {"C: I\nV\nm4 I", "0+4 C I; 4+8 C V; 12+4 C I", "1@0+4 2@4+4 3@8+4 4@12+4"},
+        {"C: I NC\n\nb3 a: V", "0+1 C I; 1+5 C NC; 6+2 Am V", "1@0+4 2@4+4"},
+    };
+    for (const auto& row : rows) {
+        INFO(std::string(row.mText));
+        const CRomanTextReading reading = ReadRomanText(row.mText);
+        CHECK(FaultsText(reading.mFaults).empty());
+        CHECK(ChordsText(reading) == row.mChords);
+        CHECK(BarsText(reading) == row.mBars);
+    }
+    const CRomanTextReading doubleBar = ReadRomanText("C: I | V || I");
+    CHECK(doubleBar.mDoubleBars == std::vector<double>{8.0});
+    CHECK(FaultsText(ReadRomanText("C: I X77 V").mFaults) == "1:6 this is no degree");
+    CHECK(FaultsText(ReadRomanText("C major: I V").mFaults) ==
+          "1:1 a key is written as in Eb: or f#:");
+    CHECK(ReadRomanText("Form: binary\nNote: I think so\nPiece: V\n").mFaults.empty());
+}
+
+TEST_CASE("A key from outside holds up to the first one of the text") {
+    const CSignKeyLite gMajor({7, TEnh_n}, TSignKeyType_Major);
+    const CRomanTextReading reading = ReadRomanText("m1 I b3 V65/V\nm2 D: I\n", gMajor);
+    CHECK(FaultsText(reading.mFaults).empty());
+    CHECK(ChordsText(reading) == "0+2 G I; 2+2 G V65/V; 4+4 D I");
+    CHECK(reading.mChords[1].mChord == CChordLite("A7/C#", ChordNamePrefsNonUTF8));
+    CHECK(reading.mKeys.size() == 2);
+    CHECK(ReadRomanText("I V", gMajor).mChords.size() == 2);
+    CHECK(FaultsText(ReadRomanText("m1 I").mFaults) ==
+          "1:4 a numeral needs a key before it, as in C: I");
+}
+
 struct CBeatCase {
     const char* mTime;
     const char* mBeats;

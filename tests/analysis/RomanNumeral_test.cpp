@@ -65,6 +65,8 @@ constexpr auto kCases = std::to_array<CNumeralCase>({
     {"C minor", "Ab/C",    "",    "VI/^1",        "VI6",       "6/^1"},
     {"C major", "A7/C#",   "Dm",  "V7/ii/^#1",   "V65/ii",    "67/^#1"},
     {"C major", "C/Bb",    "",    "I/^b7",       "I/^b7",     "1/^b7"},
+    {"C major", "Cm/D#",   "",    "i/^#2",        "i/^#2",     "1-/^#2"},
+    {"C major", "G7/E#",   "",    "V7/^#3",       "V7/^#3",    "57/^#3"},
     {"A minor", "E7/G#",   "Am",  "V7/^#7",      "V65",       "57/^#7"},
     // All tones
     {"C major", "C7b5",    "",    "I7b5",        "I7b5",      "17b5"},

@@ -8,6 +8,7 @@
 #include "brindle/analysis/TChordStringParse.h"
 #include "brindle/analysis/internal/KeyTables.h"
 #include "brindle/analysis/internal/LocalKeys.h"
+#include "brindle/theory/CChordNamePrefs.h"
 #include "brindle/theory/KeyIntervals.h"
 
 #include <doctest/doctest.h>
@@ -48,6 +49,18 @@ std::string RegionsText(const CHarmAnlsChords& chords, const CKeyOfSong& keys) {
         for (std::size_t i = region.mBegin; i < region.mEnd; ++i) text += " " + numerals[i];
     }
     return text;
+}
+
+TEST_CASE("Each chord keeps the spelling of its own bass, also of the same sounds in a row") {
+    CHarmAnlsChords chords;
+    for (const char* symbol : {"F7/Eb", "F7/D#", "F7/Eb", "E"}) {
+        chords.emplace_back(CChordLite(symbol, ChordNamePrefsNonUTF8),
+                            static_cast<double>(chords.size()));
+    }
+    CKeyOfSong keys;
+    keys.mRegions.push_back(
+        {.mKey = CSignKeyLite({9, TEnh_n}, TSignKeyType_Minor), .mBegin = 0, .mEnd = 4});
+    CHECK(RegionsText(chords, keys) == "A Minor: subV7/V/^b5 subV7/V/^#4 subV7/V/^b5 V");
 }
 
 TEST_CASE("Three cadences in a row are three regions, and the first is the key of the song") {

@@ -48,6 +48,9 @@ MORE_COMMANDS = [
     "net weights --json",
     'keys "Dm7 G7 C" --json',
     'numerals "V7b9 iih7 V13 I" --key "A minor" --json',
+    'numerals "I X77 V" --key C --lenient --json',
+    'numerals --from romantext "C: I V7 a: i" --json',
+    'numerals --from romantext "m1 vi a: i b2 nonsense b3 NC" --key C --lenient --json',
     "types --json",
     "vector Db7/B --json",
     "import examples/scores/frere-jacques.musicxml --json",
@@ -129,6 +132,7 @@ def planted_faults_pass(schemas):
                 "Intervals": [0, 4, 7],
             }
         ],
+        "Faults": [{"Line": 1, "Column": 3, "Word": "X", "Text": "this is no degree"}],
     }
     assert not schemas.errors("numerals", copy.deepcopy(value))
     faults = list(spoiled(value))

@@ -38,8 +38,7 @@ void AppendChords(const CRomanTextReading& reading, CSong& song) {
     if (reading.mChords.front().mPosition > 0.0) AppendChord(CChordLite_NoChordYield, 0.0, song);
     for (const CRomanTextChord& chord : reading.mChords) {
         AppendChord(chord.mChord, chord.mPosition, song);
-        song.mSevenths.resize(song.mChords.size());
-        song.mSevenths.back() = SeventhOf(chord);
+        StateSeventh(SeventhOf(chord), song);
     }
     const CRomanTextChord& last = reading.mChords.back();
     song.mChords.emplace_back(CChordLite_Undef, last.mPosition + last.mLength);
@@ -71,7 +70,7 @@ void AppendFaults(const CRomanTextReading& reading, CSong& song) {
 }  // namespace
 
 CSong ReadRomanSong(std::string_view text, const CSongOptions& prefs) {
-    const CRomanTextReading reading = ReadRomanText(text);
+    const CRomanTextReading reading = ReadRomanText(text, prefs.mKey);
     CSong song;
     song.mFormat = TSongFormat_RomanText;
     song.mTitle = reading.mTitle;

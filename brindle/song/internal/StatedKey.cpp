@@ -33,4 +33,10 @@ void AppendStatedKey(const CSignKeyLite& key, double position, CSong& song) {
     keys.back().mSignKey = key;
 }
 
+void StateSeventh(TSeventhSpelling seventh, CSong& song) {
+    if (seventh == TSeventhSpelling_Undef) return;
+    song.mSevenths.resize(song.mChords.size());
+    song.mSevenths.back() = seventh;
+}
+
 }  // namespace brindle

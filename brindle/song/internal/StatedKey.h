@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "brindle/analysis/ReadHarmony.h"
 #include "brindle/theory/CSignKeyLite.h"
 
 #include <optional>
@@ -16,5 +17,8 @@ struct CSong;
 /// A key that begins to hold; what is no key changes nothing.
 void AppendStatedKey(std::string_view text, double position, CSong& song);
 void AppendStatedKey(const CSignKeyLite& key, double position, CSong& song);
+
+/// How the seventh of the last chord is spelled; what is undefined needs no entry.
+void StateSeventh(TSeventhSpelling seventh, CSong& song);
 
 }  // namespace brindle
