@@ -51,6 +51,7 @@ CChordTextReading ReadChordText(std::string_view text, const CChordTextOptions& 
     reading.mKind = TChordText_Chord;
     reading.mChord = parser.Chord();
     reading.mHasH = parser.HasH();
+    reading.mHasAugmentedSixth = parser.HasAugmentedSixth();
     SetParserText(reading, text, prefs.mBIsBFlat);
     return reading;
 }

@@ -47,6 +47,9 @@ struct CChordTextReading {
     bool mParserTextIsExact = false;
     /// Root or bass is written with the letter H.
     bool mHasH = false;
+    /// The tone ten semitones above the root is written as a raised sixth, `Ab(#6)`, and by nothing
+    /// else.
+    bool mHasAugmentedSixth = false;
     /// Where the fault is: characters (not bytes) from 1; 0 without a fault.
     int mFaultPos = 0;
     /// What is wrong, as in `"x" at 4 is not understood`. Only the first fault is told.

@@ -61,6 +61,9 @@ struct TMusicXMLHarmony {
     TMusicXMLPitch mBass;
     std::vector<TMusicXMLDegree> mDegrees;
     std::string mExtraText2;
+    /// The kind is written as an augmented sixth, "Italian", "French" or "German": what sounds as a
+    /// minor seventh is a raised sixth.
+    bool mHasAugmentedSixth = false;
 
     /// Whether this is the sign that no chord sounds.
     [[nodiscard]] bool IsNoChord() const {

@@ -25,14 +25,28 @@ struct CSongTime {
     friend bool operator==(const CSongTime&, const CSongTime&) = default;
 };
 
+/// A sign that jumps lead to.
+enum TSongSign : std::uint8_t {
+    TSongSign_None,
+    TSongSign_Segno,
+    TSongSign_Coda,
+};
+
 /// A bar as it is played. A bar that is played twice stands twice.
 struct CSongBar {
+    static constexpr std::size_t kNotWritten = static_cast<std::size_t>(-1);
+
     /// As printed, "12" or "12a"; of a typed song, the number of the written bar.
     std::string mNumber;
     double mPosition = 0.0;
     /// An upbeat is as long as it is written.
     double mLength = 0.0;
     CSongTime mTime;
+    /// The bar of the written song that this is, from 0; `kNotWritten` if the source does not tell.
+    std::size_t mWritten = kNotWritten;
+    /// What stands where the bar begins, and what at its end: "To Coda", "Fine", "D.C. al Fine".
+    TSongSign mSign = TSongSign_None;
+    std::string mWords = {};
 
     friend bool operator==(const CSongBar&, const CSongBar&) = default;
 };

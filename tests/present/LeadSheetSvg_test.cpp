@@ -70,8 +70,11 @@ std::string Shown(const CSong& song) {
         if (bar.mBeginsSection) text += "<" + bar.mSection + "> ";
         if (!bar.mEnding.empty()) text += "[" + bar.mEnding + " ";
         if (!bar.mRemark.empty()) text += "{" + bar.mRemark + "} ";
+        if (bar.mSign == TSongSign_Segno) text += "$ ";
+        if (bar.mSign == TSongSign_Coda) text += "@ ";
         for (std::size_t i = bar.mBegin; i < bar.mEnd; ++i) text += song.mSymbols[i] + " ";
         if (bar.mBarCount > 1) text += fmt::format("({}) ", bar.mBarCount);
+        if (!bar.mWords.empty()) text += "(" + bar.mWords + ") ";
         if (bar.mEndsRepeat) text += ":";
         if (bar.mTimes > 2) text += fmt::format("x{} ", bar.mTimes);
     }
@@ -143,6 +146,27 @@ TEST_CASE("Repeated passages stand once between their signs") {
         {"C | F | C | F", "| C | F | C | F "},
     };
     for (const auto& [text, shown] : songs) CHECK(Shown(EvenSong(text)) == shown);
+}
+
+TEST_CASE("What a jump plays again stands once, with the words and signs of the song") {
+    const std::pair<const char*, const char*> songs[] = {
+        {"C | F Fine | G | D.C. al Fine", "| C | F (Fine) | G (D.C. al Fine) "},
+        {"C | Segno F | To Coda | G | D.S. al Coda | Coda Am",
+         "| C | $ F (To Coda) | G (D.S. al Coda) | @ Am "},
+        // Repeats around a jump, and one that is not taken again behind it.
+        {"|: C | F [1 G :| [2 Am | D.C.", "|: C | F | [1. G :| [2. Am (D.C.) "},
+        {"|: C | F :| G | Fine | |: Dm | Em :| D.C. al Fine",
+         "|: C | F :| G (Fine) |: Dm | Em (D.C. al Fine) :"},
+        {"C | F | |: G | To Coda | Am :| D.C. al Coda | Coda Dm | C",
+         "| C | F |: G (To Coda) | Am (D.C. al Coda) :| @ Dm | C "},
+    };
+    for (const auto& [text, shown] : songs) CHECK(Shown(EvenSong(text)) == shown);
+}
+
+TEST_CASE("A jump without words is labelled wherever it leads to") {
+    CSong song = EvenSong("C | F | G | Am | Dm | F | G | Am");
+    for (std::size_t i = 0; i < song.mBars.size(); ++i) song.mBars[i].mWritten = i < 5 ? i : i - 4;
+    CHECK(Shown(song) == "| C | F | G | Am | Dm | {= bars 2–4} F | G | Am ");
 }
 
 // A song of bars with a chord each, with repeats as pairs of bars and a count.

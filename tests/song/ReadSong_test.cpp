@@ -269,6 +269,64 @@ TEST_CASE("Numerals tell how a seventh is written, which tells a German sixth fr
     CHECK(numeral("m1 C: I b3 V7/bII\nm2 V b3 V7\nm3 I b3 V\nm4 I", 1) == "subV7/V");
 }
 
+TEST_CASE("A sixth that is written as one makes an augmented sixth, in chord texts and in scores") {
+    const auto numeral = [](const CSong& song) {
+        REQUIRE(song.mFaults.empty());
+        return ReadSongHarmony(song).mChords.at(2).mNumeral;
+    };
+    // In jazz C7 before B7 is a substitute, unless it is written with an A sharp.
+    const auto text = [&](std::string_view symbol) {
+        return numeral(ReadSong(fmt::format("Em7 | F#m7b5 | {} | B7 | Em7", symbol)));
+    };
+    CHECK(text("C7") == "subV7/V");
+    CHECK(text("C(#6)") == "Ger6");
+    CHECK(text("C(#6)no5") == "It6");
+    CHECK(text("C7(#6)") == "subV7/V");
+    const auto score = [&](std::string_view kind) {
+        std::string measures;
+        const std::pair<std::string_view, std::string_view> chords[] = {{"E", "minor-seventh"},
+                                                                        {"A", "minor-seventh"},
+                                                                        {"C", kind},
+                                                                        {"B", "dominant"},
+                                                                        {"E", "minor-seventh"}};
+        for (const auto& [root, word] : chords) {
+            measures += fmt::format(
+                "<measure><harmony><root><root-step>{}</root-step></root><kind>{}</kind></harmony>"
+                "<note><rest/><duration>4</duration></note></measure>",
+                root, word);
+        }
+        return numeral(
+            ReadSong("<score-partwise><part-list><score-part id=\"P\"/></part-list>"
+                     "<part id=\"P\">" +
+                     measures + "</part></score-partwise>"));
+    };
+    CHECK(score("German") == "Ger6");
+    CHECK(score("Italian") == "It6");
+    CHECK(score("French") == "Fr6");
+    CHECK(score("dominant") != "Ger6");
+}
+
+TEST_CASE("Bars tell what is written about jumps, each time that they are played") {
+    const auto signs = [](const CSong& song) {
+        std::string text;
+        for (const CSongBar& bar : song.mBars) {
+            text += fmt::format("{}{}{}{} ", bar.mWritten, bar.mSign == TSongSign_Segno ? "$" : "",
+                                bar.mSign == TSongSign_Coda ? "@" : "",
+                                bar.mWords.empty() ? "" : "(" + bar.mWords + ")");
+        }
+        return text;
+    };
+    CHECK(signs(ReadSong("C | Segno F | To Coda | G | D.S. al Coda | Coda Am")) ==
+          "0 1$(To Coda) 2(D.S. al Coda) 1$(To Coda) 3@ ");
+    const CSong score = ReadSongFile(kLeadSheets + "/beautiful_dreamer.musicxml");
+    REQUIRE(score.mBars.size() > 40);
+    std::string words;
+    for (const CSongBar& bar : score.mBars) {
+        if (!bar.mWords.empty()) words += bar.mNumber + ": " + bar.mWords + "; ";
+    }
+    CHECK(words.starts_with("27: D.C. al Coda; "));
+}
+
 TEST_CASE("What cannot be read is a fault and no song") {
     CHECK(Faults(ReadSongFile("/no/such/file")) == "0:0: there is no such file");
     CHECK(ReadSongFile("/no/such/file").mFormat == TSongFormat_ChordText);

@@ -17,6 +17,11 @@ std::string_view SixthName(const CChordInSong& chord) {
     return chord.Has(7) ? "Ger6" : "It6";
 }
 
+// Ab C D F# counted from its bass, as scores tell it.
+std::string_view WrittenSixthName(const CChordInSong& chord) {
+    return chord.Has(6) && !chord.Has(7) ? "Fr6" : SixthName(chord);
+}
+
 // Ab7 before G in C, where the seventh wants to rise: F sharp. In jazz it is a substitute dominant.
 bool NameGermanSixth(const CChordInSong& chord, CChordName& name) {
     if (!chord.Is(TKeyChordClass_Dom) || chord.Degree() != 8 || chord.Traits().mIsJazz) {
@@ -33,9 +38,9 @@ bool NameWrittenSixth(const CChordInSong& chord, CChordName& name) {
     if (!chord.Is(TKeyChordClass_Dom) || !chord.Has(10)) return false;
     if (chord.UpToNext() != kSemitoneDown) return false;
     const int target = FoldIntoOctave(chord.Degree() - 8);
-    Apply(chord, SixthName(chord), target, chord.Next(), name);
+    Apply(chord, WrittenSixthName(chord), target, chord.Next(), name);
     std::string& numeral = name.mReading.mNumeral;
-    numeral = SixthName(chord);
+    numeral = WrittenSixthName(chord);
     if (target != 0) numeral += '/' + name.mReading.mServes.Name();
     name.Be(TChordRelation_AugmentedSixth, THarmFunction_Subdominant);
     return true;

@@ -25,6 +25,7 @@ public:
     [[nodiscard]] const CFaultAt& Fault() const { return mFault; }
     [[nodiscard]] CChordLite Chord() const;
     [[nodiscard]] bool HasH() const { return mRoot.mIsH || (mBass && mBass->mIsH); }
+    [[nodiscard]] bool HasAugmentedSixth() const { return mTones.HasAugmentedSixth(); }
 
 private:
     bool Fail(TFault fault, std::size_t pos, std::size_t length = 0);

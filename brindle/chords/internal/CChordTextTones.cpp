@@ -141,6 +141,7 @@ void CChordTextTones::Add(int number, int sign) {
     if (number == 7 && sign == 0) return AddSingle(7);
     // `add b7` is the minor seventh, as is `add 7`.
     const int seventh = sign > 0 ? 11 : 10;
+    mSixthIsRaised = mSixthIsRaised || (number == 6 && sign == 1);
     mTones |= Bit(number == 7 ? seventh : ToneOfDegree(number) + sign);
 }
 
@@ -168,6 +169,7 @@ bool CChordTextTones::Alter(CAlteredDegree altered) {
                                              return r.mDegree == degree && r.mSign == sign;
                                          });
     if (row == kAlterationRows.end()) return false;
+    mSixthIsRaised = mSixthIsRaised || (degree == 6 && sign == 1);
     mStack &= ~Bit(row->mReplaces);
     mTones |= Bit(row->mTone);
     return true;

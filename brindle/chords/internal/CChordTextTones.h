@@ -55,6 +55,10 @@ public:
     void Omit(int degree);
 
     [[nodiscard]] CSemitones Semitones() const;
+    /// A sixth is raised, and there is no minor seventh beside it.
+    [[nodiscard]] bool HasAugmentedSixth() const {
+        return mSixthIsRaised && (mSevenths & Bit(10)) == 0;
+    }
 
 private:
     using TTones = std::uint32_t;  // bit n is the tone n semitones above the root
@@ -75,6 +79,7 @@ private:
     bool mIsDiminished = false;
     bool mIsMajorMarked = false;
     bool mSeventhIsLeftOut = false;
+    bool mSixthIsRaised = false;
 };
 
 }  // namespace brindle::ChordText

@@ -84,6 +84,9 @@ constexpr auto kKindAliases = std::to_array<CKindAlias>({
 constexpr auto kDegreeOfSemitone = std::to_array<std::string_view>(
     {"", "add b9", "add 9", "b3", "3", "add 11", "b5", "5", "#5", "6", "7", "ma7"});
 
+constexpr auto kAugmentedSixthWords =
+    std::to_array<std::string_view>({"italian", "french", "german"});
+
 constexpr std::size_t kLongestPrinted = 64;
 constexpr std::string_view kNoChord = "none";
 constexpr std::string_view kRootAlone = "pedal";
@@ -162,6 +165,11 @@ std::string FoldedKindWord(std::string_view word) {
     return folded;
 }
 
+bool IsAugmentedSixth(std::string_view kind) {
+    const auto* const end = kAugmentedSixthWords.end();
+    return std::find(kAugmentedSixthWords.begin(), end, FoldedKindWord(kind)) != end;
+}
+
 std::string_view WithoutBlanks(std::string_view text) {
     const std::size_t begin = std::min(text.find_first_not_of(' '), text.size());
     return text.substr(begin, text.find_last_not_of(' ') + 1 - begin);
@@ -210,6 +218,7 @@ void SetTones(TMusicXMLHarmony& harmony, CSemitones tones) {
 }  // namespace
 
 void SetKind(TMusicXMLHarmony& harmony, std::string_view printed) {
+    harmony.mHasAugmentedSixth = IsAugmentedSixth(harmony.mKind);
     if (IsKind(harmony.mKind)) return;
     printed = WithoutBlanks(printed);
     if (printed.size() > kLongestPrinted) printed = {};

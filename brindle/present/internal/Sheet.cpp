@@ -79,6 +79,9 @@ std::vector<CSheetBar> GivenBars(const CSong& song) {
         bar.mNumber = given.mNumber;
         bar.mPosition = given.mPosition;
         bar.mLength = given.mLength;
+        bar.mSign = given.mSign;
+        bar.mWords = given.mWords;
+        bar.mWritten = given.mWritten;
         if (!given.mTime.IsUndef() && !(given.mTime == time)) bar.mTime = time = given.mTime;
     }
     const double usual = bars.size() > 1 ? bars[1].mLength : 0.0;
@@ -114,7 +117,8 @@ void PlaceSections(const CSong& song, std::vector<CSheetBar>& bars) {
 
 bool IsPlain(const CSheetBar& bar) {
     return bar.mBegin == bar.mEnd && !bar.mBeginsSection && !bar.mBeginsRepeat &&
-           !bar.mEndsRepeat && !bar.mIsInEnding && bar.mRemark.empty() && bar.mTime.IsUndef();
+           !bar.mEndsRepeat && !bar.mIsInEnding && bar.mRemark.empty() && bar.mTime.IsUndef() &&
+           bar.mSign == TSongSign_None && bar.mWords.empty();
 }
 
 // Joins each long row of bars without chords to one rest.

@@ -41,8 +41,13 @@ struct CSheetBar {
     /// The bar lies under the bracket of an ending.
     bool mIsInEnding = false;
     bool mClosesEnding = false;
-    /// "= bars 1-8": where a jump plays again what stands elsewhere.
+    /// "= bars 1-8": what stands elsewhere is played again, and no sign says so.
     std::string mRemark;
+    /// Where jumps lead to, and at the end of the bar the words for them.
+    TSongSign mSign = TSongSign_None;
+    std::string mWords;
+    /// As in the song.
+    std::size_t mWritten = CSongBar::kNotWritten;
 };
 
 struct CSheet {
@@ -54,8 +59,9 @@ struct CSheet {
     std::vector<double> mPositions;
 };
 
-/// A passage that is repeated at once is written once, with its endings; any other passage that is
-/// played again is written out, with a remark. Linear in bars and chords.
+/// A passage that is repeated at once is written once, with its endings, and so is what a written
+/// jump plays again; any other passage that is played again is written out, with a remark. Linear
+/// in bars and chords.
 [[nodiscard]] CSheet MakeSheet(const CSong& song);
 
 /// The number of chords without the end marker.

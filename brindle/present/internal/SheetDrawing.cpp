@@ -33,7 +33,13 @@ constexpr double kLegendSize = 11.0;
 constexpr double kHeadGap = 8.0;
 
 bool HasHeads(const CSheetBar& bar) {
-    return bar.mBeginsSection || !bar.mRemark.empty() || bar.mTimes > 2;
+    return bar.mBeginsSection || !bar.mRemark.empty() || bar.mTimes > 2 ||
+           bar.mSign != TSongSign_None || !bar.mWords.empty();
+}
+
+// Behind "To Coda" the music goes on.
+bool EndsPart(const CSheetBar& bar) {
+    return bar.mWords.find("D.") != std::string::npos || bar.mWords == "Fine";
 }
 
 /// The heights of the parts of a line.
@@ -135,7 +141,8 @@ private:
         const CSheetBar& bar = BarOf(placed);
         const double x = placed.End();
         const bool isLast = placed.mBar + 1 == mScore.mSheet.mBars.size();
-        const bool isDouble = !isLast && mScore.mSheet.mBars[placed.mBar + 1].mBeginsSection;
+        const bool isDouble =
+            !isLast && (EndsPart(bar) || mScore.mSheet.mBars[placed.mBar + 1].mBeginsSection);
         if (bar.mEndsRepeat || isLast) {
             BarLine(x - 1.7, "thick");
             BarLine(x - 5.6);
@@ -194,7 +201,10 @@ private:
         const double x = (left + right) / 2;
         if (bar.mBarCount > 1) return DrawLongRest(left, right, bar.mBarCount);
         const bool sounds = bar.mBegin > 0;
-        if (!sounds) {
+        if (sounds && bar.mSign == TSongSign_Coda) {
+            // What sounds on is that of the bar where the jump began, not that of the one above.
+            DrawChord({bar.mBegin - 1, placed.mX + LeftPadding(bar)});
+        } else if (!sounds) {
             mPen.Rect(x - 5, Middle() - 2.5, 10, 5, "quiet");
         } else if (IsSimple(placed.mBar)) {
             DrawSlash(x);
@@ -238,15 +248,17 @@ private:
         };
         for (const CPlacedBar& placed : mLine.mBars) {
             const CSheetBar& bar = BarOf(placed);
+            if (placed.mIsBegin && bar.mSign != TSongSign_None) DrawSign(placed, free);
             if (placed.mIsBegin && bar.mBeginsSection) DrawSection(placed, free);
             drawKeys(placed.End());
             if (placed.mIsBegin && !bar.mRemark.empty()) {
                 DrawHead(placed.mX + 2, kRemarkSize, bar.mRemark, "ita quiet", free);
             }
             if (placed.mIsEnd && bar.mTimes > 2) {
-                const std::string times = fmt::format("\xC3\x97{}", bar.mTimes);
-                const double width = kSectionSize * WidthOf(times);
-                DrawHead(placed.End() - width, kSectionSize, times, "ttl ink", free);
+                DrawAtEnd(placed, fmt::format("\xC3\x97{}", bar.mTimes), "ttl ink", free);
+            }
+            if (placed.mIsEnd && !bar.mWords.empty()) {
+                DrawAtEnd(placed, bar.mWords, "ttl ita ink", free);
             }
         }
     }
@@ -260,6 +272,42 @@ private:
         if (x + size > HeadEnd()) return;
         mPen.Text(mX + x, HeadLine(), size, cut, style);
         free = x + size * WidthOf(cut) + kHeadGap;
+    }
+
+    void DrawAtEnd(const CPlacedBar& placed, const std::string& text, std::string_view style,
+                   double& free) {
+        // A little room, so that rounding does not cut the text.
+        const double width = kSectionSize * (WidthOf(text) + 0.1);
+        DrawHead(placed.End() - width, kSectionSize, text, style, free);
+    }
+
+    // Drawn by hand, as few fonts have these signs.
+    void DrawSign(const CPlacedBar& placed, double& free) {
+        const double x = std::max(placed.mX + 1, free);
+        if (BarOf(placed).mSign == TSongSign_Coda) {
+            DrawCodaSign(mX + x + 7, HeadLine() - 4.5);
+        } else {
+            DrawSegnoSign(mX + x + 7, HeadLine() - 4.5);
+        }
+        free = x + 14 + kHeadGap;
+    }
+
+    void DrawCodaSign(double x, double y) {
+        mPen.Path(fmt::format("M{0} {1}a3.6 4.6 0 1 0 7.2 0a3.6 4.6 0 1 0 -7.2 0",
+                              SvgNumber(x - 3.6), SvgNumber(y)),
+                  "bar");
+        mPen.Line(x - 6.2, y, x + 6.2, y, "bar");
+        mPen.Line(x, y - 7.2, x, y + 7.2, "bar");
+    }
+
+    void DrawSegnoSign(double x, double y) {
+        mPen.Path(fmt::format("M{} {}c-2 -3 -7 -1.5 -4.5 1.8c1.6 2 7.4 1.6 9 3.6c2.5 3.3 -2.5 4.8 "
+                              "-4.5 1.8",
+                              SvgNumber(x), SvgNumber(y - 3.6)),
+                  "bar");
+        mPen.Line(x - 4.6, y + 6.6, x + 4.6, y - 6.6, "bar");
+        mPen.Dot(x - 4.6, y + 1.2, 1.1, "ink");
+        mPen.Dot(x + 4.6, y - 1.2, 1.1, "ink");
     }
 
     // A short line may have names that are longer.

@@ -63,12 +63,16 @@ private:
         bool mIsShort = false;  // keeps the width of its bars
     };
 
+    [[nodiscard]] static bool BeginsLine(const CSheetBar& bar) {
+        return bar.mBeginsSection || !bar.mRemark.empty() || bar.mSign == TSongSign_Coda;
+    }
+
     // A full line of bars, or as many as there are before a section or the target of a jump.
     [[nodiscard]] std::size_t EndOfGroup(std::size_t begin) const {
         std::size_t end = begin + 1;
         std::size_t count = mSheet.mBars[begin].mIsUpbeat ? 0 : 1;
         while (end < mSheet.mBars.size() && count < mBarsPerLine &&
-               !mSheet.mBars[end].mBeginsSection && mSheet.mBars[end].mRemark.empty()) {
+               !BeginsLine(mSheet.mBars[end])) {
             ++end;
             ++count;
         }

@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <unordered_map>
 #include <utility>
 
 namespace brindle::LeadSheet {
@@ -42,12 +43,19 @@ public:
         : mSong(song), mSheet(sheet), mBars(sheet.mBars), mIsHidden(sheet.mBars.size(), false) {}
 
     void Fold() {
+        FoldJumps();
         const std::vector<CRepeat> repeats = Repeats();
         for (std::size_t i = 0; i < repeats.size();) {
             std::size_t next = i + 1;
             if (!mIsHidden[repeats[i].mAgain]) next = FoldFrom(repeats, i);
             i = next;
         }
+        TakeOutHidden();
+        RemarkReplays();
+    }
+
+private:
+    void TakeOutHidden() {
         std::size_t kept = 0;
         for (std::size_t i = 0; i < mBars.size(); ++i) {
             if (mIsHidden[i]) continue;
@@ -57,7 +65,62 @@ public:
         mBars.resize(kept);
     }
 
-private:
+    // What a written jump plays again stands there already.
+    void FoldJumps() {
+        const std::unordered_map<std::size_t, std::size_t> jumps = BarsThatJump();
+        std::unordered_map<std::size_t, std::size_t> first;
+        bool isReplay = false;
+        for (std::size_t i = 0; i < mBars.size(); ++i) {
+            const std::size_t written = mBars[i].mWritten;
+            if (written == CSongBar::kNotWritten) return;
+            const auto [drawn, isNew] = first.try_emplace(written, i);
+            isReplay = isReplay && !isNew && AreSame(drawn->second, i);
+            if (isReplay) HideBar(i, drawn->second);
+            const auto jump = jumps.find(written);
+            isReplay = isReplay || (jump != jumps.end() && jump->second == i);
+        }
+    }
+
+    // By its place in the written song, the last time that each bar with words for a jump leads
+    // back. Earlier ones take a repeat that ends there.
+    [[nodiscard]] std::unordered_map<std::size_t, std::size_t> BarsThatJump() const {
+        std::unordered_map<std::size_t, std::size_t> jumps;
+        for (std::size_t i = 0; i + 1 < mBars.size(); ++i) {
+            const bool hasJump = mBars[i].mWords.find("D.") != std::string::npos;
+            const bool leadsBack = mBars[i + 1].mWritten <= mBars[i].mWritten;
+            if (hasJump && leadsBack) jumps.insert_or_assign(mBars[i].mWritten, i);
+        }
+        return jumps;
+    }
+
+    // Wherever drawn bars begin to stand a second time, a remark tells where they stood first.
+    void RemarkReplays() {
+        std::unordered_map<std::size_t, std::size_t> first;
+        for (std::size_t i = 0; i < mBars.size();) {
+            std::size_t source = SourceOf(i, first);
+            if (source == kNone) {
+                ++i;
+                continue;
+            }
+            const std::size_t begin = i;
+            const std::size_t from = source;
+            while (i < mBars.size() && SourceOf(i, first) == source) {
+                ++i;
+                ++source;
+            }
+            if (i - begin > 1 && mBars[begin].mRemark.empty()) Remark(begin, from, i - begin);
+        }
+    }
+
+    // The bar that is drawn first for the same written one; `kNone` for a bar that is that itself.
+    [[nodiscard]] std::size_t SourceOf(std::size_t bar,
+                                       std::unordered_map<std::size_t, std::size_t>& first) const {
+        const std::size_t written = mBars[bar].mWritten;
+        if (written == CSongBar::kNotWritten) return kNone;
+        const std::size_t source = first.try_emplace(written, bar).first->second;
+        return source == bar ? kNone : source;
+    }
+
     // The bar that begins there, `kNone` if there is none.
     [[nodiscard]] std::size_t BarAt(double position) const {
         const auto bar = std::lower_bound(
@@ -74,7 +137,7 @@ private:
             const CRepeat repeat{BarAt(told.mSourcePosition), BarAt(told.mPosition),
                                  told.mBarCount};
             if (repeat.mAgain == kNone || repeat.mSource >= repeat.mAgain) continue;
-            repeats.push_back(repeat);
+            if (!mIsHidden[repeat.mAgain]) repeats.push_back(repeat);
         }
         std::sort(repeats.begin(), repeats.end(), [](const CRepeat& one, const CRepeat& other) {
             return one.mAgain < other.mAgain;
@@ -131,7 +194,8 @@ private:
             ++next;
         }
         if (passage.mAgain.empty() || !IsFree(passage)) {
-            Remark(repeats[first]);
+            const CRepeat& repeat = repeats[first];
+            if (repeat.mCount > 1) Remark(repeat.mAgain, repeat.mSource, repeat.mCount);
             return first + 1;
         }
         FindEnd(passage);
@@ -230,11 +294,10 @@ private:
         if (goesBack) mBars[end - 1].mEndsRepeat = true;
     }
 
-    void Remark(const CRepeat& repeat) {
-        if (repeat.mCount < 2) return;
-        const std::string& first = mBars[repeat.mSource].mNumber;
-        const std::string& last = mBars[repeat.mSource + repeat.mCount - 1].mNumber;
-        mBars[repeat.mAgain].mRemark = fmt::format("= bars {}\xE2\x80\x93{}", first, last);
+    void Remark(std::size_t again, std::size_t source, std::size_t count) {
+        const std::string& first = mBars[source].mNumber;
+        const std::string& last = mBars[source + count - 1].mNumber;
+        mBars[again].mRemark = fmt::format("= bars {}\xE2\x80\x93{}", first, last);
     }
 
     const CSong& mSong;
@@ -246,7 +309,7 @@ private:
 }  // namespace
 
 void FoldRepeats(const CSong& song, CSheet& sheet) {
-    if (!song.mRepeats.empty()) CFolding(song, sheet).Fold();
+    CFolding(song, sheet).Fold();
 }
 
 }  // namespace brindle::LeadSheet

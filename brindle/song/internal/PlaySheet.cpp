@@ -3,6 +3,7 @@
 #include "brindle/song/internal/SheetBars.h"
 #include "brindle/song/internal/SongTokens.h"
 #include "brindle/song/internal/StatedKey.h"
+#include "brindle/song/internal/WrittenSigns.h"
 
 #include <algorithm>
 #include <cmath>
@@ -65,6 +66,7 @@ private:
     void AppendBar(std::size_t bar) {
         mSong.mBars.push_back({std::to_string(bar + 1), mStarts.back(), mPosition - mStarts.back(),
                                mWritten.mBars[bar].mTime});
+        SetWritten(bar, mWritten.mMarks[bar], mSong.mBars.back());
     }
 
     bool PlayBar(const CWrittenBar& bar) {
@@ -109,6 +111,7 @@ private:
         } else if (token.mKind == TTokenKind::Chord) {
             mSong.mChords.emplace_back(token.mChord, mPosition);
             mSong.mSymbols.emplace_back(token.mText);
+            StateSeventh(token.mSeventh, mSong);
         }
         if (mBudget == 0)
             return GiveUp("its repeats and jumps make the song too long to be played");

@@ -3,6 +3,7 @@
 #include "brindle/song/HarmonySymbols.h"
 #include "brindle/song/internal/SongReaders.h"
 #include "brindle/song/internal/StatedKey.h"
+#include "brindle/song/internal/WrittenSigns.h"
 
 #include <algorithm>
 #include <map>
@@ -37,6 +38,7 @@ void AppendChords(const CPlayedScore& score, CSong& song) {
     for (const TMusicXMLHarmony& harmony : score.mDoc.Harmonies) {
         song.mChords.emplace_back(ChordOfHarmony(harmony), harmony.mPosition);
         song.mSymbols.push_back(HarmonySymbol(harmony));
+        if (harmony.mHasAugmentedSixth) StateSeventh(TSeventhSpelling_AugmentedSixth, song);
     }
     if (song.mChords.empty()) return;
     // An offset may move the last chord behind the last bar line.
@@ -57,6 +59,8 @@ void AppendBars(const CPlayedScore& score, CSong& song) {
         bar.mNumber = measure.mNumber;
         bar.mPosition = begin;
         bar.mLength = end - begin;
+        const std::size_t written = score.mOrder.mMeasures[i];
+        SetWritten(written, score.mWritten.mMarks[written], bar);
         if (time > 0) bar.mTime = {times[time - 1].mNumerator, times[time - 1].mDenominator};
         if (measure.mHasRehearsal) song.mSections.push_back({measure.mRehearsal, begin});
     }

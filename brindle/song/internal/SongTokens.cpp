@@ -84,10 +84,13 @@ void CTokenList::AddReading(std::string_view text, const CChordTextReading& read
             return;
         }
         case TChordText_Chord:
-        case TChordText_NoChord:
-            Add(TTokenKind::Chord, text).mChord = reading.mChord;
+        case TChordText_NoChord: {
+            CToken& chord = Add(TTokenKind::Chord, text);
+            chord.mChord = reading.mChord;
+            if (reading.mHasAugmentedSixth) chord.mSeventh = TSeventhSpelling_AugmentedSixth;
             mHasH = mHasH || reading.mHasH;
             return;
+        }
     }
 }
 

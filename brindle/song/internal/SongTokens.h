@@ -33,6 +33,7 @@ struct CToken {
     std::string_view mText;
     /// Of a chord.
     CChordLite mChord;
+    TSeventhSpelling mSeventh = TSeventhSpelling_Undef;
     /// Holds: steps. RepeatBars: bars.
     int mCount = 1;
     /// Of a bar line.
