@@ -163,6 +163,25 @@ TEST_CASE("What a jump plays again stands once, with the words and signs of the 
     for (const auto& [text, shown] : songs) CHECK(Shown(EvenSong(text)) == shown);
 }
 
+TEST_CASE("Words for jumps are drawn whole, and a coda begins with the chord that sounds on") {
+    CSong song = EvenSong("Dm | F To Coda | G7 | C D.C. al Coda | Coda . | Am");
+    const std::string svg = LeadSheetSvg(song, ReadHarmony(song.mChords));
+    for (const char* words : {">To Coda<", ">D.C. al Coda<"}) {
+        CHECK(svg.find(words) != std::string::npos);
+    }
+    const auto count = [&](const std::string& text) {
+        std::size_t found = 0;
+        for (std::size_t at = svg.find(text); at != std::string::npos;
+             at = svg.find(text, at + 1)) {
+            ++found;
+        }
+        return found;
+    };
+    // F in its own bar and in that of the coda.
+    CHECK(count(">F<") == 2);
+    CHECK(count(">G<") == 1);
+}
+
 TEST_CASE("A jump without words is labelled wherever it leads to") {
     CSong song = EvenSong("C | F | G | Am | Dm | F | G | Am");
     for (std::size_t i = 0; i < song.mBars.size(); ++i) song.mBars[i].mWritten = i < 5 ? i : i - 4;
