@@ -107,6 +107,8 @@ TStatus ShowAnalysis(const std::string& text, const CSignKeyLite& key,
     const CRomanTextReading reading = ReadRomanText(text, key);
     PrintFaults(text, reading.mNotes, true);
     if (!AcceptsFaults(text, reading.mFaults, options)) return TStatus::BadInput;
+    // What is taken for headers alone was hardly meant so.
+    if (reading.mChords.empty()) return Fail(TStatus::BadInput, "the analysis has no numerals");
     const bool isJson = options.mFormat.Format() == TFormat::Json;
     return Print(isJson ? RomanTextJson(reading, text) : RomanTextText(reading, PaintOfOutput()));
 }
