@@ -3,11 +3,9 @@
 
 #include "cli/CommandLine.h"
 #include "cli/Input.h"
-#include "cli/Json.h"
-#include "cli/Output.h"
 
 #include <string>
-#include <type_traits>
+#include <string_view>
 #include <variant>
 #include <vector>
 
@@ -19,41 +17,25 @@ struct CLineOptions {
     CFormatOptions mFormat;
 };
 
-/// What each typed line means. The first line with a fault, or with nothing to read, gives an error
-/// status instead. `read` gives a record with `mError` and `mColumn`.
-template <class Read>
-std::variant<TStatus, std::vector<std::invoke_result_t<Read, const std::string&>>> ReadLines(
-    const std::vector<std::string>& words, Read read) {
+/// What each typed line means: the member `value` of what `read` gives, a record that also has
+/// `mError` and `mColumn`. The first line with a fault, or with nothing to read, gives an error
+/// status instead.
+template <class Reading, class Value>
+std::variant<TStatus, std::vector<Value>> ReadLines(const std::vector<std::string>& words,
+                                                    Reading (*read)(std::string_view),
+                                                    Value Reading::*value) {
     const auto lines = TypedLines(words);
     if (!lines) return TStatus::BadInput;
-    std::vector<std::invoke_result_t<Read, const std::string&>> readings;
+    std::vector<Value> values;
     for (const std::string& line : *lines) {
         const std::string typed = FoldAccidentals(line);
-        readings.push_back(read(typed));
-        if (readings.back().mError.empty()) continue;
-        return FailAt(TStatus::BadInput, readings.back().mError, typed, readings.back().mColumn);
-    }
-    return readings;
-}
-
-/// Reads each typed line and prints what the lines mean: one JSON list of that name, or texts with
-/// a blank line between. `read` is that of ReadLines; `toJson` and `toText` take its records.
-template <class Read, class ToJson, class ToText>
-TStatus PrintLineByLine(const CLineOptions& options, const char* listName, Read read, ToJson toJson,
-                        ToText toText) {
-    const auto lines = ReadLines(options.mWords, read);
-    if (lines.index() == 0) return std::get<0>(lines);
-    const bool isJson = options.mFormat.Format() == TFormat::Json;
-    Json list = Json::array();
-    std::string text;
-    for (const auto& reading : std::get<1>(lines)) {
-        if (isJson) {
-            list.push_back(toJson(reading));
-        } else {
-            text += (text.empty() ? "" : "\n") + toText(reading);
+        const Reading reading = read(typed);
+        if (!reading.mError.empty()) {
+            return FailAt(TStatus::BadInput, reading.mError, typed, reading.mColumn);
         }
+        values.push_back(reading.*value);
     }
-    return Print(isJson ? JsonText({{listName, list}}) : text);
+    return values;
 }
 
 }  // namespace brindle::cli

@@ -1,15 +1,11 @@
 // SPDX-License-Identifier: MIT
 #include "cli/CommandLine.h"
-#include "cli/KeyText.h"
 #include "cli/LineByLine.h"
 
-#include "brindle/present/ShownNames.h"
-#include "brindle/theory/CScaleLite.h"
-
-#include <fmt/format.h>
+#include "brindle/present/ScalesText.h"
+#include "brindle/theory/ReadKeyText.h"
 
 #include <memory>
-#include <sstream>
 
 namespace brindle::cli {
 namespace {
@@ -22,56 +18,12 @@ constexpr CCommandHelp kScaleHelp{
     "  cat scales.txt | brindle scale -\n",
 };
 
-std::string TypeName(TScaleType type) {
-    std::ostringstream name;
-    name << type;
-    return name.str();
-}
-
-// In the language of the user; empty for a scale without a type.
-std::string LocalizedName(TScaleType type) {
-    return CScaleHeavy::LocalizedNameForScaleType(type).value_or(std::string());
-}
-
-std::string_view NameOf(const CScaleHeavy& scale) {
-    return scale.ScaleType() == st_custom ? "Custom" : scale.ScaleRow().mName;
-}
-
-Json ScaleToJson(const CScaleHeavy& scale) {
-    const CSemitones semitones = CScaleLite(scale).mSemitones;
-    return {{"Name", fmt::format("{} {}", KeyName(scale.RootKeyEnh()), NameOf(scale))},
-            {"CKeyEnh", KeyEnhToJson(scale.RootKeyEnh())},
-            {"Type", TypeName(scale.ScaleType())},
-            {"TypeName", LocalizedName(scale.ScaleType())},
-            {"Semitones", semitones.Mask()},
-            {"Intervals", IntervalsToJson(semitones)},
-            {"Notes", KeyEnhsToJson(KeysOf(scale))},
-            {"SignsCount", scale.SignsCount()}};
-}
-
-std::string TypeText(TScaleType type) {
-    return fmt::format("{} ({})", LocalizedName(type), TypeName(type));
-}
-
-std::string ScaleText(const CScaleHeavy& scale, const CPaint& paint) {
-    const CSemitones semitones = CScaleLite(scale).mSemitones;
-    return fmt::format(
-        "{}\n"
-        "  notes      {}\n"
-        "  semitones  {}\n"
-        "  mask       {}\n"
-        "  type       {}\n"
-        "  signs      {}\n",
-        paint.Strong(fmt::format("{} {}", KeyName(scale.RootKeyEnh()), NameOf(scale))),
-        NotesText(KeysOf(scale)), SemitonesText(semitones), semitones.Mask(),
-        TypeText(scale.ScaleType()), SignsText(scale.SignsCount()));
-}
-
 TStatus Scale(const CLineOptions& options) {
-    return PrintLineByLine(
-        options, "Scales", ReadScaleText,
-        [](const CScaleText& read) { return ScaleToJson(read.mScale); },
-        [](const CScaleText& read) { return ScaleText(read.mScale, PaintOfOutput()); });
+    const auto scales = ReadLines(options.mWords, ReadScaleText, &CScaleText::mScale);
+    if (scales.index() == 0) return std::get<0>(scales);
+    return Print(options.mFormat.Format() == TFormat::Json
+                     ? ScalesJson(std::get<1>(scales))
+                     : ScalesText(std::get<1>(scales), PaintOfOutput()));
 }
 
 }  // namespace
