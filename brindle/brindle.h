@@ -208,6 +208,7 @@
 #include "brindle/present/SongShapes.h"
 #include "brindle/present/TonalitiesText.h"
 #include "brindle/present/TonalityName.h"
+#include "brindle/present/VectorsText.h"
 #include "brindle/present/WrittenSongText.h"
 #include "brindle/song/AnalyseSong.h"
 #include "brindle/song/BuiltInSongs.h"

@@ -1,14 +1,11 @@
 // SPDX-License-Identifier: MIT
 #include "cli/CommandLine.h"
 #include "cli/Input.h"
-#include "cli/Json.h"
 #include "cli/TypedChords.h"
 
 #include "brindle/analysis/CHarmAnlsChordForMetro.h"
 #include "brindle/analysis/ChordVectorText.h"
-#include "brindle/chords/WriteChordSymbol.h"
-#include "brindle/present/CTable.h"
-#include "brindle/present/ShownNames.h"
+#include "brindle/present/VectorsText.h"
 
 #include <algorithm>
 #include <iterator>
@@ -35,70 +32,8 @@ struct CVectorOptions {
     CFormatOptions mFormat;
 };
 
-/// A chord, its vector, and what the vector says.
-struct CShownVector {
-    std::string mSymbol;  // empty when the vector was typed
-    std::vector<float> mVector;
-    CHarmAnlsChordForMetro mReadBack;
-    std::string mError;
-    std::size_t mColumn = 0;
-};
-
 bool IsVectorText(std::string_view typed) {
     return !typed.empty() && std::string_view("01[{").find(typed.front()) != typed.npos;
-}
-
-CShownVector Show(const std::string& typed, const CChordLite& chord) {
-    CShownVector shown;
-    if (IsVectorText(typed)) {
-        CChordVectorText text = ReadChordVector(typed);
-        shown.mVector = std::move(text.mVector);
-        shown.mError = std::move(text.mError);
-        shown.mColumn = text.mColumn;
-    } else {
-        shown.mSymbol = Printable(typed);
-        shown.mVector = CHarmAnlsChordForMetro(chord).GetChordVectorRepresentation();
-    }
-    shown.mReadBack.SetFromChordVectorRepresentation(shown.mVector);
-    return shown;
-}
-
-std::string NameOf(const CHarmAnlsChordForMetro& chord) {
-    if (chord.IsUndef() || chord.IsWildcard() || chord.IsEADGBE()) {
-        return chord.NameForMetroExport(true);
-    }
-    return WriteChordSymbol(chord);
-}
-
-Json VectorToJson(const CShownVector& shown) {
-    Json places = Json::array();
-    for (const float place : shown.mVector) places.push_back(place == 1.0F ? 1 : 0);
-    const CHarmAnlsChordForMetro& chord = shown.mReadBack;
-    return {{"Symbol", shown.mSymbol.empty() ? Json(nullptr) : Json(shown.mSymbol)},
-            {"VectorRep", places},
-            {"ReadBack",
-             {{"Name", NameOf(chord)},
-              {"NameForExport", chord.NameForMetroExport(true)},
-              {"RootKeyEnh", KeyEnhToJson(chord.mRootKeyEnh)},
-              {"BassKeyEnh", KeyEnhToJson(chord.mBassKeyEnh)},
-              {"Semitones", chord.mSemitones.Mask()},
-              {"Intervals", IntervalsToJson(chord.mSemitones)}}}};
-}
-
-std::string VectorsJson(const std::vector<CShownVector>& vectors) {
-    Json list = Json::array();
-    for (const CShownVector& vector : vectors) list.push_back(VectorToJson(vector));
-    return JsonText({{"Vectors", list}});
-}
-
-std::string VectorsText(const std::vector<CShownVector>& vectors, const CPaint& paint) {
-    CTable table({"chord", "vector", "reads back"});
-    for (const CShownVector& shown : vectors) {
-        const std::string name = NameOf(shown.mReadBack);
-        table.AddRow(
-            {shown.mSymbol.empty() ? "-" : shown.mSymbol, WriteChordVector(shown.mVector), name});
-    }
-    return table.Text(paint);
 }
 
 bool IsDigits(std::string_view word) {
@@ -152,10 +87,15 @@ TStatus Vector(const CVectorOptions& options) {
     std::vector<CShownVector> vectors;
     auto chord = chords->begin();
     for (const std::string& typed : *things) {
-        vectors.push_back(Show(typed, IsVectorText(typed) ? CChordLite() : *chord++));
-        const CShownVector& shown = vectors.back();
-        if (shown.mError.empty()) continue;
-        return FailAt(TStatus::BadInput, shown.mError, typed, shown.mColumn);
+        if (!IsVectorText(typed)) {
+            vectors.push_back(ShowVectorOfChord(Printable(typed), *chord++));
+            continue;
+        }
+        const CChordVectorText read = ReadChordVector(typed);
+        if (!read.mError.empty()) {
+            return FailAt(TStatus::BadInput, read.mError, typed, read.mColumn);
+        }
+        vectors.push_back(ShowVector(read.mVector));
     }
     return Print(options.mFormat.Format() == TFormat::Json ? VectorsJson(vectors)
                                                            : VectorsText(vectors, PaintOfOutput()));
