@@ -172,6 +172,7 @@
 #include "brindle/present/CTimeAxis.h"
 #include "brindle/present/CentersText.h"
 #include "brindle/present/ChordGrid.h"
+#include "brindle/present/ChordTypesText.h"
 #include "brindle/present/ChordsText.h"
 #include "brindle/present/CopiesText.h"
 #include "brindle/present/Explain.h"
