@@ -196,6 +196,7 @@
 #include "brindle/present/MarkovMidi.h"
 #include "brindle/present/MarkovText.h"
 #include "brindle/present/MidiFile.h"
+#include "brindle/present/NetText.h"
 #include "brindle/present/NumeralsJson.h"
 #include "brindle/present/ReadingJson.h"
 #include "brindle/present/ReadingText.h"

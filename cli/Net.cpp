@@ -1,15 +1,10 @@
 // SPDX-License-Identifier: MIT
 #include "cli/CommandLine.h"
-#include "cli/Json.h"
 
 #include "brindle/neural/ChordAnalysisNeuronalNet.h"
-#include "brindle/neural/ChordRootPatterns.h"
-#include "brindle/neural/NeuronalNet.h"
-
-#include <fmt/format.h>
+#include "brindle/present/NetText.h"
 
 #include <memory>
-#include <sstream>
 
 namespace brindle::cli {
 namespace {
@@ -34,78 +29,14 @@ constexpr CCommandHelp kWeightsHelp{
     "  brindle net weights >net.txt\n",
 };
 
-constexpr int kOutputCount = 12;
-
-training_pattern TrainingPattern(const CChordRootPattern& pattern, std::size_t inputCount) {
-    training_pattern training;
-    for (std::size_t i = 0; i < inputCount; ++i) {
-        training.mInputs.push_back((pattern.mInputs >> i & 1) != 0 ? 1.0 : 0.0);
-    }
-    for (int i = 0; i < kOutputCount; ++i) {
-        training.mOutputs.push_back(i == pattern.mRootIntvl ? 1.0 : 0.0);
-    }
-    training.mTellingName = ChordShapes()[pattern.mShape].mName;
-    return training;
-}
-
-// Every input that a voicing of the usual chords can give.
-std::vector<training_pattern> AllPatterns(const NeuronalNet& net) {
-    std::vector<training_pattern> patterns;
-    for (const CChordRootPattern& pattern : ChordRootPatterns()) {
-        patterns.push_back(
-            TrainingPattern(pattern, static_cast<std::size_t>(net.get_input_neuron_count())));
-    }
-    return patterns;
-}
-
-// The sum of squared differences over all patterns.
-double OverallError(NeuronalNet& net, const std::vector<training_pattern>& patterns) {
-    double error = 0.0;
-    for (const training_pattern& pattern : patterns) {
-        net.use(pattern.mInputs);
-        const double root = net.getRMS(pattern.mOutputs);
-        error += root * root;
-    }
-    return error;
-}
-
-Json PropertiesToJson(const NeuronalNet& net) {
-    const TDynNetProp& dynProp = net.get_dyn_net_prop();
-    const TNeuronProp& neuron = dynProp.mNeuronProp;
-    Json layers = Json::array();
-    for (int layer = 0; layer < dynProp.mHiddenLayerCount; ++layer) {
-        layers.push_back(dynProp.mHiddenLayerSizes[static_cast<std::size_t>(layer)]);
-    }
-    return {{"InputNeuronCount", net.get_fixed_net_prop().mInputNeuronCount},
-            {"OutputNeuronCount", net.get_fixed_net_prop().mOutputNeuronCount},
-            {"HiddenLayerSizes", layers},
-            {"InputType", static_cast<int>(neuron.mInputType)},
-            {"ActivationType", static_cast<int>(neuron.mActType)},
-            {"ActivationSlope", neuron.mActivationSlope},
-            {"ActivationThreshold", neuron.mActivationThreshold},
-            {"OutputType", static_cast<int>(neuron.mOutputType)},
-            {"OutputThreshold", neuron.mOutputThreshold}};
-}
-
 TStatus PrintTrace(const CFormatOptions& format) {
     const NeuronalNet net(ChordAnalysisNeuronalNet);
-    if (format.Format() == TFormat::Json) return Print(JsonText(PropertiesToJson(net)));
-    std::ostringstream trace;
-    trace << net;
-    return Print(trace.str());
+    return Print(format.Format() == TFormat::Json ? NetJson(net) : NetText(net));
 }
 
 TStatus PrintWeights(const CFormatOptions& format) {
-    NeuronalNet net(ChordAnalysisNeuronalNet);
-    const std::vector<training_pattern> patterns = AllPatterns(net);
-    if (format.Format() != TFormat::Json) {
-        const double error = OverallError(net, patterns);
-        return Print(net.weights_to_text(0, error, net.get_learning_factor(), patterns));
-    }
-    return Print(JsonText({{"Properties", PropertiesToJson(net)},
-                           {"PatternCount", patterns.size()},
-                           {"FailureCount", net.batch_verify(patterns)},
-                           {"Weights", net.get_weights()}}));
+    const NeuronalNet net(ChordAnalysisNeuronalNet);
+    return Print(format.Format() == TFormat::Json ? NetWeightsJson(net) : NetWeightsText(net));
 }
 
 using TPrinter = TStatus (*)(const CFormatOptions& format);
