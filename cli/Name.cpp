@@ -1,12 +1,23 @@
 // SPDX-License-Identifier: MIT
-#include "cli/Name.h"
+#include "cli/CommandLine.h"
 #include "cli/Input.h"
 #include "cli/KeyText.h"
+#include "cli/NamingOptions.h"
 
+#include "brindle/chords/NameNotes.h"
 #include "brindle/chords/ReadChordText.h"
+#include "brindle/neural/RootCostsByNet.h"
+#include "brindle/present/ChordsOverRootsText.h"
+#include "brindle/present/NamedChordsText.h"
+#include "brindle/theory/ReadNotesText.h"
 
+#include <fmt/format.h>
+
+#include <algorithm>
 #include <memory>
 #include <optional>
+#include <string>
+#include <vector>
 
 namespace brindle::cli {
 namespace {
@@ -28,6 +39,26 @@ constexpr CCommandHelp kNameHelp{
 };
 
 constexpr int kMostCandidates = 12;
+
+struct CNameOptions {
+    std::vector<std::string> mWords;
+    std::string mMethod = "notes";
+    std::string mKey;
+    std::string mBefore;
+    std::string mAfter;
+    std::string mBass = "usual";
+    std::string mRoot;
+    int mCandidates = 1;
+    bool mAllRoots = false;
+    bool mProgression = false;
+    bool mIsExact = false;
+    ::brindle::CNamingOptions mContext;  // of the words above, but the limit
+    CKeyEnh mRootKey;                    // of mRoot
+    cli::CNamingOptions mNaming;
+    CFormatOptions mFormat;
+};
+
+using TNamesOfSets = std::vector<std::vector<CNamedChord>>;
 
 TBassUse BassUseOf(const std::string& word) {
     if (word == "only") return TBassUse::Only;
@@ -95,6 +126,60 @@ bool ReadContext(CNameOptions& options) {
     }
     if (options.mAllRoots) options.mCandidates = kMostCandidates;
     return ReadRoot(options);
+}
+
+TNamesOfSets NamesOf(const std::vector<CNotesText>& sets, const CNameOptions& options) {
+    std::vector<std::vector<CNote>> notes;
+    for (const CNotesText& set : sets) notes.push_back(set.mTyped);
+    if (options.mProgression) return NameProgression(notes, options.mContext);
+    TNamesOfSets names;
+    for (const auto& set : notes) {
+        auto context = options.mContext;
+        if (options.mMethod == "both") context.mRootCosts = RootCostsByNet(set);
+        names.push_back(NameNotes(set, context));
+    }
+    return names;
+}
+
+/// The name over the root of --root first. Without one there are no names, and that is told.
+void PutRootFirst(std::vector<CNamedChord>& names, const CNameOptions& options) {
+    const auto isOfRoot = [&](const CNamedChord& name) {
+        return name.mRoot.mKeyNr == options.mRootKey.mKeyNr;
+    };
+    std::stable_partition(names.begin(), names.end(), isOfRoot);
+    if (options.mRootKey.IsUndef() || names.empty() || isOfRoot(names.front())) return;
+    static_cast<void>(
+        Fail(TStatus::BadInput,
+             fmt::format("these notes have no name over {}; --method net names them over any root",
+                         options.mRoot)));
+    names.clear();
+}
+
+/// By how common chords are.
+std::string NameAsPlayed(const std::vector<CNotesText>& sets, const CNameOptions& options) {
+    TNamesOfSets names = NamesOf(sets, options);
+    for (auto& ofSet : names) PutRootFirst(ofSet, options);
+    const CNamedChordStyle style{options.mNaming.PlayersPrefs(), options.mIsExact};
+    if (options.mFormat.Format() == TFormat::Json) return NamedChordsJson(names, style);
+    return NamedChordsText(names, static_cast<std::size_t>(options.mCandidates), style,
+                           PaintOfOutput());
+}
+
+/// By a search for the root, "net" or "score", and the name of the chord over it.
+std::string NameByRoot(const std::vector<CNotesText>& sets, const CNameOptions& options) {
+    const CChordNamePrefs prefs = options.mNaming.Prefs();
+    const auto search = options.mMethod == "net" ? TSingleChordAnalysisAlgo_NeuronalNet
+                                                 : TSingleChordAnalysisAlgo_Score;
+    std::vector<CNotesOverRoots> chords;
+    for (const CNotesText& set : sets) {
+        chords.push_back(
+            {{set.mNotes.begin(), set.mNotes.end()},
+             NameOverRoots(set.mNotes, {options.mRootKey, search, options.mAllRoots, prefs})});
+    }
+    if (options.mFormat.Format() == TFormat::Json) {
+        return ChordsOverRootsJson(chords, prefs, options.mAllRoots);
+    }
+    return ChordsOverRootsText(chords, prefs, PaintOfOutput());
 }
 
 TStatus Name(CNameOptions options) {

@@ -1,18 +1,15 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "cli/Json.h"
-
 #include "brindle/theory/CMySet.h"
 #include "brindle/theory/CNote.h"
 
 #include <cstddef>
-#include <span>
 #include <string>
 #include <string_view>
 #include <vector>
 
-namespace brindle::cli {
+namespace brindle {
 
 /// Notes that were typed, or what is wrong with them and where.
 struct CNotesText {
@@ -20,7 +17,9 @@ struct CNotesText {
     std::vector<CNote> mTyped;
     /// Each sounding note once, MIDI numbers with the usual spelling.
     CMySet<CNote> mNotes;
+    /// Empty if nothing is wrong, as for a text without notes.
     std::string mError;
+    /// In bytes from 0.
     std::size_t mColumn = 0;
 };
 
@@ -28,13 +27,8 @@ struct CNotesText {
 inline constexpr std::size_t kMostTypedNotes = 128;
 
 /// Reads "C4 Eb4 67": keys with their octave, or MIDI numbers of 0 to 127. A key without octave is
-/// the next one above the note before it, the first one that of middle C.
+/// the next one above the note before it, the first one that of middle C. The octave is that of the
+/// letter: Cb4 is below C4.
 [[nodiscard]] CNotesText ReadNotesText(std::string_view text, const CChordNamePrefs& prefs);
 
-/// "C4 Eb4 G4"
-[[nodiscard]] std::string NotesName(std::span<const CNote> notes, const CChordNamePrefs& prefs);
-
-/// A list of names and numbers.
-[[nodiscard]] Json NotesToJson(std::span<const CNote> notes, const CChordNamePrefs& prefs);
-
-}  // namespace brindle::cli
+}  // namespace brindle

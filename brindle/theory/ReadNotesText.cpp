@@ -1,19 +1,15 @@
 // SPDX-License-Identifier: MIT
-#include "cli/NotesText.h"
-
-#include "cli/Output.h"
+#include "brindle/theory/ReadNotesText.h"
 
 #include "brindle/theory/CChordNamePrefs.h"
 #include "brindle/theory/KeyIntervals.h"
-
-#include <fmt/format.h>
 
 #include <algorithm>
 #include <charconv>
 #include <optional>
 #include <utility>
 
-namespace brindle::cli {
+namespace brindle {
 namespace {
 
 constexpr std::int64_t kMiddleC = 60;
@@ -49,25 +45,26 @@ public:
         const std::string_view octave = word.substr(static_cast<std::size_t>(consumed));
         if (octave.empty()) return Add(NoteNrFrom(mNext, key.mKeyNr), key.mEnh, word);
         const auto octaveNr = WholeNumber(octave);
-        if (!octaveNr)
-            return fmt::format("behind the key stands its octave, not {}", Printable(octave));
-        const int octaveOfMiddleC = 3 + mPrefs.mOctaveNaming;
-        // The octave is that of the letter: Cb4 is below C4.
-        const int signs = EnhToSemitone(key.mEnh);
-        const int aboveC = FoldIntoOctave(key.mKeyNr - signs) + signs;
-        return Add((std::int64_t{*octaveNr} - octaveOfMiddleC) * 12 + kMiddleC + aboveC, key.mEnh,
-                   word);
+        if (!octaveNr) return "behind the key stands its octave, not " + std::string(octave);
+        return Add(NoteNrIn(*octaveNr, key), key.mEnh, word);
     }
 
     [[nodiscard]] CNotesText Notes() && { return std::move(mNotes); }
 
 private:
+    [[nodiscard]] std::int64_t NoteNrIn(int octaveNr, const CKeyEnh& key) const {
+        const int octaveOfMiddleC = 3 + mPrefs.mOctaveNaming;
+        const int signs = EnhToSemitone(key.mEnh);
+        const int aboveC = FoldIntoOctave(key.mKeyNr - signs) + signs;
+        return (std::int64_t{octaveNr} - octaveOfMiddleC) * 12 + kMiddleC + aboveC;
+    }
+
     std::string Add(std::int64_t noteNr, TEnh enh, std::string_view word) {
         if (noteNr < 0 || noteNr > kHighestNoteNr) {
-            return fmt::format("{} is outside of the notes 0 to 127", Printable(word));
+            return std::string(word) + " is outside of the notes 0 to 127";
         }
         if (mNotes.mTyped.size() == kMostTypedNotes) {
-            return fmt::format("a chord has at most {} notes", kMostTypedNotes);
+            return "a chord has at most " + std::to_string(kMostTypedNotes) + " notes";
         }
         mNotes.mTyped.emplace_back(noteNr, enh);
         const auto isSame = [&](const CNote& note) { return note.mNoteNr == noteNr; };
@@ -82,12 +79,6 @@ private:
     CNotesText mNotes;
     std::int64_t mNext = kMiddleC;
 };
-
-/// With the octave of its letter: note 60 is C4 or B#3.
-std::string NoteText(const CNote& note, const CChordNamePrefs& prefs) {
-    const std::int64_t natural = note.mNoteNr - EnhToSemitone(note.mEnh);
-    return note.KeyName(prefs) + CNote(std::max<std::int64_t>(natural, 0), TEnh_n).OctName(prefs);
-}
 
 }  // namespace
 
@@ -104,20 +95,4 @@ CNotesText ReadNotesText(std::string_view text, const CChordNamePrefs& prefs) {
     return std::move(reader).Notes();
 }
 
-std::string NotesName(std::span<const CNote> notes, const CChordNamePrefs& prefs) {
-    std::string name;
-    for (const CNote& note : notes) {
-        name += (name.empty() ? "" : " ") + NoteText(note, prefs);
-    }
-    return name;
-}
-
-Json NotesToJson(std::span<const CNote> notes, const CChordNamePrefs& prefs) {
-    Json list = Json::array();
-    for (const CNote& note : notes) {
-        list.push_back({{"Name", NoteText(note, prefs)}, {"NoteNr", note.mNoteNr}});
-    }
-    return list;
-}
-
-}  // namespace brindle::cli
+}  // namespace brindle
