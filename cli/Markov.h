@@ -2,13 +2,12 @@
 #pragma once
 
 #include "cli/CommandLine.h"
-#include "cli/Json.h"
 
 #include "brindle/markov/VariableLengthMarkovModel.h"
-#include "brindle/present/MarkovText.h"
 
 #include <optional>
 #include <string>
+#include <vector>
 
 /// What the commands of `brindle markov` share.
 namespace brindle::cli {
@@ -26,9 +25,6 @@ void SetSeed(VariableLengthMarkovModel& model, const std::optional<std::uint64_t
 /// the error has been printed, with `option` as its place.
 [[nodiscard]] std::optional<std::vector<CMarkovObject>> ReadSymbols(const std::string& option,
                                                                     const std::string& text);
-
-/// Length, symbol, root, bass and semitones of a chord; its type for any other symbol.
-[[nodiscard]] Json SymbolToJson(const CMarkovObject& object, const CMarkovSpelling& spelling);
 
 void AddMarkovLearn(CCommand& markov);
 void AddMarkovGenerate(CCommand& markov);

@@ -4,12 +4,11 @@
 
 #include "brindle/platform/AtomicFile.h"
 #include "brindle/present/MarkovMidi.h"
+#include "brindle/present/MarkovSequencesText.h"
 #include "brindle/song/SongModelFile.h"
 
 #include <fmt/format.h>
 
-#include <algorithm>
-#include <cmath>
 #include <memory>
 
 namespace brindle::cli {
@@ -60,15 +59,6 @@ struct CGenerateOptions {
     CFormatOptions mFormat;
 };
 
-/// What was drawn.
-struct CGenerated {
-    TMarkovSampledSequence mChosen;
-    /// The heaviest first.
-    std::vector<TMarkovSampledSequence> mSequences;
-    /// The part of all weight that each sequence has, 0 to 1.
-    std::vector<double> mShares;
-};
-
 std::optional<std::string> Contradiction(const CGenerateOptions& options) {
     if (options.mTemplate.empty() == (options.mBeats == 0.0)) {
         return "either --beats or --template is needed";
@@ -99,76 +89,6 @@ std::optional<TMarkovGenerateOptions> OptionsFor(VariableLengthMarkovModel& mode
     generate.mSampleCount = options.mSamples;
     generate.Validate(model);
     return generate;
-}
-
-CGenerated Generate(VariableLengthMarkovModel& model, const TMarkovGenerateOptions& options) {
-    CGenerated generated;
-    model.SampleSequenceWithLength(generated.mChosen, generated.mSequences, true, options);
-    std::reverse(generated.mSequences.begin(), generated.mSequences.end());
-    // Relative to the heaviest, since the weights themselves may be too small for a number.
-    double highest = -1e300;
-    for (const auto& sequence : generated.mSequences) {
-        highest = std::max(highest, sequence.mLogProbability);
-    }
-    double sum = 0.0;
-    for (const auto& sequence : generated.mSequences) {
-        const double weight = std::exp(sequence.mLogProbability - highest) * sequence.mCount;
-        generated.mShares.push_back(weight);
-        sum += weight;
-    }
-    for (double& share : generated.mShares) share /= sum;
-    return generated;
-}
-
-Json SampledToJson(const TMarkovSampledObject& sampled, const CMarkovSpelling& spelling) {
-    Json json = SymbolToJson(*sampled.mObject, spelling);
-    const auto number = [](double value) { return std::isfinite(value) ? Json(value) : Json(); };
-    json["Probability"] = number(sampled.mProbability);
-    json["NormalizedEntropy"] = number(sampled.mNormalizedEntropy);
-    json["HistoryLength"] = sampled.mHistoryLength;
-    return json;
-}
-
-std::string GeneratedJson(const CGenerated& generated) {
-    const CMarkovSpelling spelling(generated.mChosen.mSymbols);
-    Json symbols = Json::array();
-    for (const auto& sampled : generated.mChosen.mSampledObjects) {
-        symbols.push_back(SampledToJson(sampled, spelling));
-    }
-    Json sequences = Json::array();
-    for (std::size_t ix = 0; ix < generated.mSequences.size(); ++ix) {
-        const TMarkovSampledSequence& sequence = generated.mSequences[ix];
-        sequences.push_back({{"Share", generated.mShares[ix]},
-                             {"Count", sequence.mCount},
-                             {"LogProbability", sequence.mLogProbability},
-                             {"ChordString", ChordString(sequence.mSymbols, spelling)}});
-    }
-    return JsonText({{"ChordString", ChordString(generated.mChosen.mSymbols, spelling)},
-                     {"Symbols", symbols},
-                     {"Sequences", sequences}});
-}
-
-std::string OthersText(const CGenerated& generated, const CGenerateOptions& options,
-                       const CMarkovSpelling& spelling, const CPaint& paint) {
-    std::string text;
-    std::size_t shown = 0;
-    for (std::size_t ix = 0; ix < generated.mSequences.size() && shown < options.mOthers; ++ix) {
-        const TMarkovSampledSequence& sequence = generated.mSequences[ix];
-        if (sequence.mSymbols == generated.mChosen.mSymbols) continue;
-        ++shown;
-        text += paint.Faint(fmt::format(
-            "\nor, with weight {:.2f}{}:\n", generated.mShares[ix],
-            sequence.mCount == 1 ? "" : fmt::format(", drawn {} times", sequence.mCount)));
-        text += BarsText(sequence.mSymbols, spelling, options.mBeatsPerBar, 4) + '\n';
-    }
-    return text;
-}
-
-std::string GeneratedText(const CGenerated& generated, const CGenerateOptions& options) {
-    const CPaint paint = PaintOfOutput();
-    const CMarkovSpelling spelling(generated.mChosen.mSymbols);
-    return BarsText(generated.mChosen.mSymbols, spelling, options.mBeatsPerBar, 4) + '\n' +
-           OthersText(generated, options, spelling, paint);
 }
 
 /// Whether the file is a plain model: what makes sequences and writes no songs.
@@ -215,8 +135,8 @@ TStatus MarkovGenerate(const CGenerateOptions& options) {
     model->SetSearchLimits({options.mAttempts, kMostSteps});
     const auto generateOptions = OptionsFor(*model, options);
     if (!generateOptions) return TStatus::BadUsage;
-    const CGenerated generated = Generate(*model, *generateOptions);
-    if (generated.mSequences.empty()) {
+    const CMarkovDraws draws = DrawMarkovSequences(*model, *generateOptions);
+    if (draws.mSequences.empty()) {
         return Fail(
             TStatus::BadInput,
             "the model finds no such sequence: each chord, and the end, must have been learned "
@@ -224,13 +144,15 @@ TStatus MarkovGenerate(const CGenerateOptions& options) {
     }
     if (options.mMidi &&
         !WriteFileAtomically(*options.mMidi,
-                             MidiFileBytes(MidiPieceOf(generated.mChosen.mSymbols, options.mTempo,
+                             MidiFileBytes(MidiPieceOf(draws.mChosen.mSymbols, options.mTempo,
                                                        options.mBeatsPerBar)))) {
         return Fail(TStatus::BadInput,
                     fmt::format("{} cannot be written", Printable(*options.mMidi)));
     }
-    return Print(options.mFormat.Format() == TFormat::Json ? GeneratedJson(generated)
-                                                           : GeneratedText(generated, options));
+    return Print(
+        options.mFormat.Format() == TFormat::Json
+            ? DrawnSequencesJson(draws)
+            : DrawnSequencesText(draws, options.mBeatsPerBar, options.mOthers, PaintOfOutput()));
 }
 
 void AddHistoryOptions(CCommand& command, CGenerateOptions& options) {

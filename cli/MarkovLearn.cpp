@@ -1,10 +1,12 @@
 // SPDX-License-Identifier: MIT
 #include "cli/ChordSources.h"
+#include "cli/Json.h"
 #include "cli/Markov.h"
 #include "cli/MarkovSongs.h"
 #include "cli/Progress.h"
 
 #include "brindle/present/ShownNames.h"
+#include "brindle/song/LearnSong.h"
 
 #include <fmt/format.h>
 
@@ -52,15 +54,8 @@ struct CLearned {
     bool mIsNamedFileUnread = false;
 };
 
-void Learn(VariableLengthMarkovModel& model, CHarmAnlsChordsWithLength chords, bool simplify) {
-    if (simplify) {
-        for (CHarmAnlsChordWithLength& chord : chords) chord.SimplifyChord();
-    }
-    std::vector<CMarkovObject> symbols;
-    MarkovObjectsVectorForHarmChords(chords, symbols);
-    model.StartSequence();
-    for (const CMarkovObject& symbol : symbols) model.LearnAddSymbol(symbol);
-    model.EndSequence();
+void SimplifyChords(CHarmAnlsChordsWithLength& chords) {
+    for (CHarmAnlsChordWithLength& chord : chords) chord.SimplifyChord();
 }
 
 CLearned LearnFiles(VariableLengthMarkovModel& model, const CLearnOptions& options) {
@@ -79,8 +74,9 @@ CLearned LearnFiles(VariableLengthMarkovModel& model, const CLearnOptions& optio
             continue;
         }
         ++learned.mFiles;
-        for (const CHarmAnlsChordsWithLength& chords : source.mSequences) {
-            Learn(model, chords, options.mSimplify);
+        for (CHarmAnlsChordsWithLength chords : source.mSequences) {
+            if (options.mSimplify) SimplifyChords(chords);
+            LearnChords(model, chords);
             learned.mChords += chords.size();
         }
     }

@@ -45,14 +45,18 @@ std::vector<CHarmAnlsChordsWithLength> ChordSequencesOf(const CSong& song) {
     return sequences;
 }
 
+void LearnChords(VariableLengthMarkovModel& model, const CHarmAnlsChordsWithLength& chords) {
+    std::vector<CMarkovObject> symbols;
+    MarkovObjectsVectorForHarmChords(chords, symbols);
+    model.StartSequence();
+    for (const CMarkovObject& symbol : symbols) model.LearnAddSymbol(symbol);
+    model.EndSequence();
+}
+
 std::size_t LearnSong(VariableLengthMarkovModel& model, const CSong& song) {
     std::size_t count = 0;
     for (const CHarmAnlsChordsWithLength& chords : ChordSequencesOf(song)) {
-        std::vector<CMarkovObject> symbols;
-        MarkovObjectsVectorForHarmChords(chords, symbols);
-        model.StartSequence();
-        for (const CMarkovObject& symbol : symbols) model.LearnAddSymbol(symbol);
-        model.EndSequence();
+        LearnChords(model, chords);
         count += chords.size();
     }
     return count;

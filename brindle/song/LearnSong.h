@@ -16,7 +16,10 @@ class VariableLengthMarkovModel;
 /// no number above 0 are left out.
 [[nodiscard]] std::vector<CHarmAnlsChordsWithLength> ChordSequencesOf(const CSong& song);
 
-/// Learns each of these sequences. The number of chords that were learned.
+/// Learns one sequence.
+void LearnChords(VariableLengthMarkovModel& model, const CHarmAnlsChordsWithLength& chords);
+
+/// Learns each sequence of a song. The number of chords that were learned.
 std::size_t LearnSong(VariableLengthMarkovModel& model, const CSong& song);
 
 }  // namespace brindle
