@@ -8,7 +8,6 @@
 #include <fmt/format.h>
 
 #include <algorithm>
-#include <array>
 #include <cmath>
 #include <filesystem>
 #include <utility>
@@ -44,25 +43,6 @@ std::string FaultText(const CSongFault& fault) {
     return fmt::format("line {}, column {}: {}", fault.mLine, fault.mColumn, fault.mText);
 }
 
-bool HasKnownEnding(const fs::path& path) {
-    constexpr auto endings = std::to_array<std::string_view>({".xml", ".musicxml", ".mxl", ".txt"});
-    return std::find(endings.begin(), endings.end(), path.extension().string()) != endings.end();
-}
-
-void AddFolder(const std::string& folder, std::vector<CFoundFile>& files) {
-    const std::size_t before = files.size();
-    std::error_code error;
-    const auto skip = fs::directory_options::skip_permission_denied;
-    for (fs::recursive_directory_iterator entry(folder, skip, error), end; entry != end;
-         entry.increment(error)) {
-        if (entry->is_regular_file(error) && HasKnownEnding(entry->path())) {
-            files.push_back({entry->path().string(), false});
-        }
-    }
-    std::sort(files.begin() + static_cast<std::ptrdiff_t>(before), files.end(),
-              [](const CFoundFile& a, const CFoundFile& b) { return a.mPath < b.mPath; });
-}
-
 }  // namespace
 
 CChordSource ReadChordSource(const std::string& path, const TChordStringParse& parse,
@@ -76,19 +56,6 @@ CChordSource ReadChordSource(const std::string& path, const TChordStringParse& p
                                     [](const CSongFault& f) { return !f.mIsNote; });
     const bool isGivenUp = fault != song.mFaults.end() && !reading.IsLenient();
     return isGivenUp ? Failed(FaultText(*fault)) : FromSong(song);
-}
-
-std::vector<CFoundFile> FindChordSources(const std::vector<std::string>& paths) {
-    std::vector<CFoundFile> files;
-    for (const std::string& path : paths) {
-        std::error_code error;
-        if (fs::is_directory(path, error)) {
-            AddFolder(path, files);
-        } else {
-            files.push_back({path, true});
-        }
-    }
-    return files;
 }
 
 }  // namespace brindle::cli

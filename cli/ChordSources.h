@@ -24,14 +24,4 @@ struct CChordSource {
 [[nodiscard]] CChordSource ReadChordSource(const std::string& path, const TChordStringParse& parse,
                                            const CTypedChords& reading);
 
-/// A file that was named or that stands in a folder that was.
-struct CFoundFile {
-    std::string mPath;
-    bool mIsNamed = false;
-};
-
-/// The files themselves and those in the folders, in alphabetic order, whose names end in .xml,
-/// .musicxml, .mxl or .txt.
-[[nodiscard]] std::vector<CFoundFile> FindChordSources(const std::vector<std::string>& paths);
-
 }  // namespace brindle::cli

@@ -6,6 +6,7 @@
 #include "cli/Progress.h"
 
 #include "brindle/present/ShownNames.h"
+#include "brindle/song/FindSongFiles.h"
 #include "brindle/song/LearnSong.h"
 
 #include <fmt/format.h>
@@ -62,7 +63,7 @@ CLearned LearnFiles(VariableLengthMarkovModel& model, const CLearnOptions& optio
     TChordStringParse parse;
     parse.mBeatsPerBar = options.mBeatsPerBar;
     parse.mChordNamePrefs = NamePrefs();
-    const std::vector<CFoundFile> files = FindChordSources(options.mFiles);
+    const std::vector<CFoundFile> files = FindSongFiles(options.mFiles);
     CLearned learned;
     CProgress progress(files.size());
     for (const CFoundFile& file : files) {

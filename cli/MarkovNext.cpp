@@ -1,16 +1,10 @@
 // SPDX-License-Identifier: MIT
 #include "cli/Input.h"
-#include "cli/Json.h"
 #include "cli/KeyText.h"
 #include "cli/MarkovSongs.h"
 #include "cli/TypedChords.h"
 
-#include "brindle/chords/WriteChordSymbol.h"
-#include "brindle/present/CTable.h"
-#include "brindle/present/TonalityName.h"
-#include "brindle/song/NextChords.h"
-
-#include <fmt/format.h>
+#include "brindle/present/NextChordsText.h"
 
 #include <memory>
 
@@ -45,26 +39,6 @@ std::optional<std::vector<CChordLite>> TypedRow(const CNextOptions& options) {
     return options.mReading.ReadSymbols(words);
 }
 
-std::string NextJson(const CNextChords& next) {
-    Json chords = Json::array();
-    for (const CNextChord& chord : next.mChords) {
-        chords.push_back({{"Symbol", WriteChordSymbol(chord.mChord)},
-                          {"Probability", NumberToJson(chord.mProbability)},
-                          {"Numeral", chord.mNumeral},
-                          {"Function", std::string(NameOf(chord.mFunction))}});
-    }
-    return JsonText({{"Key", TonalityName(next.mKey)}, {"Chords", chords}});
-}
-
-std::string NextText(const CNextChords& next, const CPaint& paint) {
-    CTable table({" probability", "chord", "numeral", "function"});
-    for (const CNextChord& chord : next.mChords) {
-        table.AddRow({fmt::format("{:.3f}", chord.mProbability), WriteChordSymbol(chord.mChord),
-                      chord.mNumeral, std::string(NameOf(chord.mFunction))});
-    }
-    return fmt::format("in {}\n\n{}", TonalityName(next.mKey), table.Text(paint));
-}
-
 TStatus MarkovNext(const CNextOptions& options) {
     const auto chords = TypedRow(options);
     if (!chords) return TStatus::BadUsage;
@@ -82,8 +56,8 @@ TStatus MarkovNext(const CNextOptions& options) {
     if (next.mKey.IsUndef()) {
         return Fail(TStatus::BadUsage, "without a chord --key is needed");
     }
-    return Print(options.mFormat.Format() == TFormat::Json ? NextJson(next)
-                                                           : NextText(next, PaintOfOutput()));
+    return Print(options.mFormat.Format() == TFormat::Json ? NextChordsJson(next)
+                                                           : NextChordsText(next, PaintOfOutput()));
 }
 
 }  // namespace

@@ -1,11 +1,7 @@
 // SPDX-License-Identifier: MIT
-#include "cli/Json.h"
 #include "cli/MarkovSongs.h"
 
-#include "brindle/present/CTable.h"
-#include "brindle/song/ScoreSongs.h"
-
-#include <fmt/format.h>
+#include "brindle/present/SongScoresText.h"
 
 #include <memory>
 
@@ -30,48 +26,6 @@ struct CScoreOptions {
     CFormatOptions mFormat;
 };
 
-struct COrderRow {
-    std::size_t mOrder = 0;
-    CSongScore mRelative;
-    CSongScore mAbsolute;
-};
-
-std::vector<COrderRow> OrderRows(const CSongModel& model, const std::vector<CTaughtSong>& songs) {
-    std::vector<COrderRow> rows;
-    for (std::size_t order = 1; order <= CSongModel::kLongestHistory; ++order) {
-        rows.push_back({order, SumOfScores(ScoreSongs(model, songs, order)),
-                        SumOfScores(ScoreSongs(model, songs, order, false))});
-    }
-    return rows;
-}
-
-std::string ScoreJson(const std::vector<COrderRow>& rows, std::size_t songs) {
-    Json orders = Json::array();
-    for (const COrderRow& row : rows) {
-        orders.push_back({{"Order", row.mOrder},
-                          {"BitsPerChord", NumberToJson(row.mRelative.BitsPerChord())},
-                          {"BitsPerChordWithoutKeys", NumberToJson(row.mAbsolute.BitsPerChord())}});
-    }
-    return JsonText({{"Songs", songs},
-                     {"Chords", rows.front().mRelative.mChords},
-                     {"Smoothing", "interpolation"},
-                     {"Orders", orders}});
-}
-
-std::string ScoreText(const std::vector<COrderRow>& rows, std::size_t songs, const CPaint& paint) {
-    CTable table({" order", " bits per chord", " without keys", " saved"});
-    for (const COrderRow& row : rows) {
-        const double relative = row.mRelative.BitsPerChord();
-        const double absolute = row.mAbsolute.BitsPerChord();
-        table.AddRow({fmt::format("{}", row.mOrder), fmt::format("{:.3f}", relative),
-                      fmt::format("{:.3f}", absolute),
-                      fmt::format("{:.1f} %", 100.0 * (1.0 - relative / absolute))});
-    }
-    return fmt::format("{} {}, {} chords, histories interpolated\n\n{}", songs,
-                       songs == 1 ? "song" : "songs", rows.front().mRelative.mChords,
-                       table.Text(paint));
-}
-
 TStatus MarkovScore(const CScoreOptions& options) {
     const auto model = ReadSongModelFile(options.mModel, options.mStyle);
     if (!model) return TStatus::BadInput;
@@ -79,11 +33,11 @@ TStatus MarkovScore(const CScoreOptions& options) {
     CTaughtFiles taught = TeachFiles(options.mFiles, options.mBeatsPerBar);
     if (options.mFiles.empty()) taught.mSongs = model->Songs();
     if (taught.mSongs.empty()) return Fail(TStatus::BadInput, "there is no song to foretell");
-    const std::vector<COrderRow> rows = OrderRows(*model, taught.mSongs);
+    const std::vector<COrderScores> scores = ScoresByOrder(*model, taught.mSongs);
     const std::size_t songs = taught.mSongs.size();
-    const TStatus printed =
-        Print(options.mFormat.Format() == TFormat::Json ? ScoreJson(rows, songs)
-                                                        : ScoreText(rows, songs, PaintOfOutput()));
+    const TStatus printed = Print(options.mFormat.Format() == TFormat::Json
+                                      ? SongScoresJson(scores, songs)
+                                      : SongScoresText(scores, songs, PaintOfOutput()));
     return taught.mIsNamedFileUnread ? TStatus::BadInput : printed;
 }
 

@@ -1,42 +1,35 @@
 // SPDX-License-Identifier: MIT
 #include "cli/MarkovSongs.h"
 
-#include "cli/ChordSources.h"
 #include "cli/Input.h"
 #include "cli/Json.h"
 #include "cli/Progress.h"
 
 #include "brindle/platform/AtomicFile.h"
 #include "brindle/song/BuiltInSongs.h"
+#include "brindle/song/FindSongFiles.h"
 #include "brindle/song/ReadSong.h"
 #include "brindle/song/SongModelFile.h"
+#include "brindle/song/SongStyles.h"
 
 #include <fmt/format.h>
 
 #include <algorithm>
 #include <filesystem>
-#include <set>
 
 namespace brindle::cli {
 namespace {
 
-/// The songs of a style, and what styles there are if there is none of it.
+/// The songs of a style. Nothing when there are none; then it has been told what styles there are.
 std::optional<CSongModel> OfStyle(const CSongModel& model, const std::string& style) {
     if (style.empty()) return model;
-    std::vector<CTaughtSong> songs;
-    std::set<std::string> styles;
-    for (const CTaughtSong& song : model.Songs()) {
-        if (song.mStyle == style) songs.push_back(song);
-        if (!song.mStyle.empty()) styles.insert(song.mStyle);
-    }
-    if (songs.empty()) {
-        Fail(TStatus::BadUsage,
-             fmt::format("--style: the model has no songs of the style {}; it has {}",
-                         Printable(style),
-                         styles.empty() ? "none" : fmt::format("{}", fmt::join(styles, ", "))));
-        return std::nullopt;
-    }
-    return CSongModel(std::move(songs));
+    auto ofStyle = ModelOfStyle(model, style);
+    if (ofStyle) return ofStyle;
+    const auto styles = StylesOf(model);
+    Fail(TStatus::BadUsage,
+         fmt::format("--style: the model has no songs of the style {}; it has {}", Printable(style),
+                     styles.empty() ? "none" : fmt::format("{}", fmt::join(styles, ", "))));
+    return std::nullopt;
 }
 
 /// A song without a title has the name of its file.
@@ -75,7 +68,7 @@ CTaughtFiles TeachFiles(const std::vector<std::string>& paths, double beatsPerBa
     CTaughtFiles taught;
     CSongOptions reading;
     reading.mBeatsPerBar = beatsPerBar;
-    const std::vector<CFoundFile> files = FindChordSources(paths);
+    const std::vector<CFoundFile> files = FindSongFiles(paths);
     CProgress progress(files.size());
     for (const CFoundFile& file : files) {
         progress.Step(file.mPath);

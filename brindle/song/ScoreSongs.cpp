@@ -83,4 +83,14 @@ CSongScore SumOfScores(std::span<const CSongScore> scores) {
     return sum;
 }
 
+std::vector<COrderScores> ScoresByOrder(const CSongModel& model,
+                                        std::span<const CTaughtSong> songs) {
+    std::vector<COrderScores> scores;
+    for (std::size_t order = 1; order <= CSongModel::kLongestHistory; ++order) {
+        scores.push_back({order, SumOfScores(ScoreSongs(model, songs, order)),
+                          SumOfScores(ScoreSongs(model, songs, order, false))});
+    }
+    return scores;
+}
+
 }  // namespace brindle

@@ -32,4 +32,15 @@ struct CSongScore {
 /// All of them together.
 [[nodiscard]] CSongScore SumOfScores(std::span<const CSongScore> scores);
 
+/// How well songs are foretold by histories of one length.
+struct COrderScores {
+    std::size_t mOrder = 0;
+    CSongScore mWithKeys;
+    CSongScore mWithoutKeys;
+};
+
+/// All songs together for each length of histories, from 1 to that of models.
+[[nodiscard]] std::vector<COrderScores> ScoresByOrder(const CSongModel& model,
+                                                      std::span<const CTaughtSong> songs);
+
 }  // namespace brindle
