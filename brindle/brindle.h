@@ -183,6 +183,7 @@
 #include "brindle/present/CopiesText.h"
 #include "brindle/present/Explain.h"
 #include "brindle/present/FunctionsText.h"
+#include "brindle/present/GridLibrariesText.h"
 #include "brindle/present/GridPackageJson.h"
 #include "brindle/present/GridsJson.h"
 #include "brindle/present/GridsSvg.h"

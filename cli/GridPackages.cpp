@@ -5,14 +5,11 @@
 #include "cli/Input.h"
 #include "cli/Json.h"
 
-#include "brindle/platform/FileNode.h"
-#include "brindle/present/CTable.h"
+#include "brindle/present/GridLibrariesText.h"
 #include "brindle/present/GridPackageJson.h"
 #include "brindle/present/GridsJson.h"
 #include "brindle/present/GridsSvg.h"
 #include "brindle/present/GridsText.h"
-
-#include <fmt/format.h>
 
 #include <memory>
 
@@ -38,49 +35,18 @@ struct CPackageOptions {
     CFormatOptions mFormat;
 };
 
-Json LibraryToJson(const GChLibrary& library) {
-    const auto tuning = library.gchTuning();
-    return {{"Name", library.libraryName()},
-            {"Tuning", tuning->tuningName()},
-            {"OpenStrings", GChPitchArrayFromShortTuning(tuning->shortTuning())},
-            {"Chords", library.numberOfChords()},
-            {"ReadOnly", library.isReadOnlyLibrary()}};
-}
-
-std::string LibrariesText(const GChDatabase& database) {
-    CTable table({"library", "tuning", "open strings", " chords", "read-only"});
-    for (const auto& library : database.allLibrariesForAnyTuning()) {
-        const auto tuning = library->gchTuning();
-        table.AddRow({Printable(library->libraryName()), Printable(tuning->tuningName()),
-                      tuning->tuningPitchesString(), fmt::format("{}", library->numberOfChords()),
-                      library->isReadOnlyLibrary() ? "yes" : "no"});
-    }
-    std::string text = PaintOfOutput().Faint(table.Head()) + '\n';
-    for (std::size_t row = 0; row < table.RowCount(); ++row) text += table.Row(row) + '\n';
-    return text;
-}
-
 TStatus List(const CPackageOptions& options) {
     const auto database = ReadGrids(options.mPath);
     if (database == nullptr) return TStatus::BadInput;
-    if (options.mFormat.Format() != TFormat::Json) return Print(LibrariesText(*database));
-    Json list = Json::array();
-    for (const auto& library : database->allLibrariesForAnyTuning()) {
-        list.push_back(LibraryToJson(*library));
-    }
-    return Print(JsonText({{"Libraries", list}}));
+    return Print(options.mFormat.Format() == TFormat::Json
+                     ? GridLibrariesJson(*database)
+                     : GridLibrariesText(*database, PaintOfOutput()));
 }
 
 TStatus Show(const CPackageOptions& options) {
     const auto database = ReadGrids(options.mPath);
     if (database == nullptr) return TStatus::BadInput;
-    std::vector<CChordGrid> grids;
-    for (const auto& library : database->allLibrariesForAnyTuning()) {
-        for (const auto& chord : library->basicChords()) {
-            grids.push_back(GridOfChord("", *GChChord::make(chord, 0), 0));
-            grids.back().mSymbol = grids.back().mName;
-        }
-    }
+    const std::vector<CChordGrid> grids = AllGridsOf(*database);
     if (options.mFormat.Format() == TFormat::Json) return Print(GridsJson(grids));
     if (options.mFormat.Format() == TFormat::Svg) return Print(GridsSvg(grids, "Chord grids"));
     return Print(GridsText(grids, PaintOfOutput()));
@@ -92,13 +58,6 @@ TStatus Export(const CPackageOptions& options) {
     return Print(JsonText(DatabaseToJson(*database)));
 }
 
-/// Whether the files of a package give back what is written into them.
-bool CanBeKept(const GChDatabase& database) {
-    GChDatabase readBack;
-    readBack.readFromDbPackageWrapper(database.writeLibrariesToDbPackageWrapper(false), {});
-    return DatabaseToJson(readBack) == DatabaseToJson(database);
-}
-
 TStatus Import(const CPackageOptions& options) {
     const auto text = ReadInput(options.mFile);
     if (!text) return TStatus::BadInput;
@@ -108,7 +67,7 @@ TStatus Import(const CPackageOptions& options) {
     if (json.is_discarded()) return Fail(TStatus::BadInput, from + " is no JSON");
     GChDatabase database;
     std::string fault = ReadDatabase(json, database);
-    if (fault.empty() && !CanBeKept(database)) {
+    if (fault.empty() && !CanPackageKeep(database)) {
         fault =
             "a package cannot keep all of it; a fingering has 1 to 15 elements, these lie within "
             "8 frets, and of more than 8 strings the upper ones are muted together";

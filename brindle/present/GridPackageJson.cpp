@@ -3,6 +3,7 @@
 
 #include "brindle/guitarchords/GChChordTypes.h"
 #include "brindle/guitarchords/GChPitches.h"
+#include "brindle/platform/FileNode.h"
 #include "brindle/present/JsonValues.h"
 #include "brindle/present/internal/GridValues.h"
 
@@ -202,6 +203,12 @@ std::string ReadDatabase(const Json& json, GChDatabase& database) {
         if (!fault.empty()) return fault;
     }
     return {};
+}
+
+bool CanPackageKeep(const GChDatabase& database) {
+    GChDatabase readBack;
+    readBack.readFromDbPackageWrapper(database.writeLibrariesToDbPackageWrapper(false), {});
+    return DatabaseToJson(readBack) == DatabaseToJson(database);
 }
 
 }  // namespace brindle

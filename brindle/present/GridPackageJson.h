@@ -15,4 +15,8 @@ namespace brindle {
 /// what is wrong and where.
 [[nodiscard]] std::string ReadDatabase(const nlohmann::ordered_json& json, GChDatabase& database);
 
+/// Whether the files of a package give back what is written into them: they cannot keep every
+/// fingering that JSON can tell.
+[[nodiscard]] bool CanPackageKeep(const GChDatabase& database);
+
 }  // namespace brindle
