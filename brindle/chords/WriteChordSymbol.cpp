@@ -6,6 +6,7 @@
 
 #include "brindle/chords/WriteChordSymbol.h"
 
+#include "brindle/chords/internal/ChordKinds.h"
 #include "brindle/chords/internal/SignsOfRoot.h"
 #include "brindle/platform/Ascii.h"
 #include "brindle/theory/KeyIntervals.h"
@@ -27,6 +28,10 @@ constexpr TTones Tones(T... tones) {
     return (TTones{0} | ... | (TTones{1} << tones));
 }
 
+consteval TTones TonesOfKind(std::string_view suffix) {
+    return static_cast<TTones>(TonesOfChordKind(suffix).Mask());
+}
+
 constexpr bool Has(TTones tones, TTones wanted) {
     return (tones & wanted) == wanted;
 }
@@ -41,12 +46,12 @@ struct CSuffixRow {
 
 // Chords that have a sign of their own.
 constexpr auto kWholeChordRows = std::to_array<CSuffixRow>({
-    {Tones(0, 3, 6), "dim"},
-    {Tones(0, 3, 6, 9), "dim7"},
-    {Tones(0, 3, 6, 11), "dim(maj7)"},
-    {Tones(0, 4, 8), "aug"},
-    {Tones(0, 7), "5"},
-    {Tones(0, 2, 5, 7), "sus24"},
+    {TonesOfKind("dim"), "dim"},
+    {TonesOfKind("dim7"), "dim7"},
+    {TonesOfKind("dim(maj7)"), "dim(maj7)"},
+    {TonesOfKind("aug"), "aug"},
+    {TonesOfKind("5"), "5"},
+    {TonesOfKind("sus24"), "sus24"},
 });
 
 struct CNumberRow {

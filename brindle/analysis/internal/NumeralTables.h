@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "brindle/chords/internal/ChordKinds.h"
 #include "brindle/theory/CSemitones.h"
 #include "brindle/theory/TSignKeyType.h"
 
@@ -47,35 +48,35 @@ struct CNumeralSign {
 // ^ for maj. The first sign of a chord is the one that is written.
 // clang-format off
 inline constexpr auto kNumeralSigns = std::to_array<CNumeralSign>({
-    // text   on a large numeral         on a small numeral
-    {"",      {0, 4, 7},                 {0, 3, 7}},
-    {"6",     {0, 4, 7, 9},              {0, 3, 7, 9}},
-    {"add6",  {0, 4, 7, 9},              {0, 3, 7, 9}},
-    {"69",    {0, 2, 4, 7, 9},           {0, 2, 3, 7, 9}},
-    {"add9",  {0, 2, 4, 7},              {0, 2, 3, 7}},
-    {"^7",    {0, 4, 7, 11},             {0, 3, 7, 11}},
-    {"^",     {0, 4, 7, 11},             {0, 3, 7, 11}},
-    {"^9",    {0, 2, 4, 7, 11},          {0, 2, 3, 7, 11}},
-    {"7",     {0, 4, 7, 10},             {0, 3, 7, 10}},
-    {"9",     {0, 2, 4, 7, 10},          {0, 2, 3, 7, 10}},
-    {"11",    {0, 2, 4, 5, 7, 10},       {0, 2, 3, 5, 7, 10}},
-    {"13",    {0, 2, 4, 5, 7, 9, 10},    {0, 2, 3, 5, 7, 9, 10}},
-    {"7b9",   {0, 1, 4, 7, 10},          {0, 1, 3, 7, 10}},
-    {"7#9",   {0, 3, 4, 7, 10},          {}},
-    {"7b5",   {0, 4, 6, 10},             {0, 3, 6, 10}},
-    {"h7",    {0, 3, 6, 10},             {0, 3, 6, 10}},
-    {"h",     {0, 3, 6, 10},             {0, 3, 6, 10}},
-    {"o",     {0, 3, 6},                 {0, 3, 6}},
-    {"o7",    {0, 3, 6, 9},              {0, 3, 6, 9}},
-    {"+",     {0, 4, 8},                 {}},
-    {"+7",    {0, 4, 8, 10},             {}},
-    {"sus",   {0, 5, 7},                 {}},
-    {"sus4",  {0, 5, 7},                 {}},
-    {"sus2",  {0, 2, 7},                 {}},
-    {"7sus",  {0, 5, 7, 10},             {}},
-    {"7sus4", {0, 5, 7, 10},             {}},
-    {"9sus",  {0, 2, 5, 7, 10},          {}},
-    {"5",     {0, 7},                    {}},
+    // text   on a large numeral           on a small numeral
+    {"",      TonesOfChordKind(""),        TonesOfChordKind("m")},
+    {"6",     TonesOfChordKind("6"),       TonesOfChordKind("m6")},
+    {"add6",  TonesOfChordKind("6"),       TonesOfChordKind("m6")},
+    {"69",    TonesOfChordKind("69"),      TonesOfChordKind("m69")},
+    {"add9",  TonesOfChordKind("add9"),    TonesOfChordKind("madd9")},
+    {"^7",    TonesOfChordKind("maj7"),    TonesOfChordKind("mmaj7")},
+    {"^",     TonesOfChordKind("maj7"),    TonesOfChordKind("mmaj7")},
+    {"^9",    TonesOfChordKind("maj9"),    TonesOfChordKind("mmaj9")},
+    {"7",     TonesOfChordKind("7"),       TonesOfChordKind("m7")},
+    {"9",     TonesOfChordKind("9"),       TonesOfChordKind("m9")},
+    {"11",    TonesOfChordKind("11"),      TonesOfChordKind("m11")},
+    {"13",    TonesOfChordKind("13"),      TonesOfChordKind("m13")},
+    {"7b9",   TonesOfChordKind("7b9"),     TonesOfChordKind("m7b9")},
+    {"7#9",   TonesOfChordKind("7#9"),     {}},
+    {"7b5",   TonesOfChordKind("7b5"),     TonesOfChordKind("m7b5")},
+    {"h7",    TonesOfChordKind("m7b5"),    TonesOfChordKind("m7b5")},
+    {"h",     TonesOfChordKind("m7b5"),    TonesOfChordKind("m7b5")},
+    {"o",     TonesOfChordKind("dim"),     TonesOfChordKind("dim")},
+    {"o7",    TonesOfChordKind("dim7"),    TonesOfChordKind("dim7")},
+    {"+",     TonesOfChordKind("aug"),     {}},
+    {"+7",    TonesOfChordKind("7#5"),     {}},
+    {"sus",   TonesOfChordKind("sus4"),    {}},
+    {"sus4",  TonesOfChordKind("sus4"),    {}},
+    {"sus2",  TonesOfChordKind("sus2"),    {}},
+    {"7sus",  TonesOfChordKind("7sus4"),   {}},
+    {"7sus4", TonesOfChordKind("7sus4"),   {}},
+    {"9sus",  TonesOfChordKind("9sus4"),   {}},
+    {"5",     TonesOfChordKind("5"),       {}},
 });
 // clang-format on
 

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/chords/internal/CChordTextParser.h"
 
+#include "brindle/chords/internal/ChordKinds.h"
 #include "brindle/theory/KeyIntervals.h"
 
 #include <algorithm>
@@ -39,51 +40,42 @@ constexpr CColonDegree TakeDegree(CTextScan& scan) {
 
 struct CColonRow {
     std::string_view mWord;
-    std::string_view mDegrees;
+    CSemitones mTones;
 };
 
 // Here 7 is the major seventh, b7 the minor one.
+// clang-format off
 constexpr auto kColonRows = std::to_array<CColonRow>({
-    {"maj", "1 3 5"},
-    {"min", "1 b3 5"},
-    {"dim", "1 b3 b5"},
-    {"aug", "1 3 #5"},
-    {"sus2", "1 2 5"},
-    {"sus4", "1 4 5"},
-    {"sus", "1 4 5"},
-    {"1", "1"},
-    {"5", "1 5"},
-    {"maj6", "1 3 5 6"},
-    {"6", "1 3 5 6"},
-    {"min6", "1 b3 5 6"},
-    {"7", "1 3 5 b7"},
-    {"maj7", "1 3 5 7"},
-    {"min7", "1 b3 5 b7"},
-    {"minmaj7", "1 b3 5 7"},
-    {"dim7", "1 b3 b5 bb7"},
-    {"hdim7", "1 b3 b5 b7"},
-    {"hdim", "1 b3 b5 b7"},
-    {"9", "1 3 5 b7 9"},
-    {"maj9", "1 3 5 7 9"},
-    {"min9", "1 b3 5 b7 9"},
-    {"11", "1 3 5 b7 9 11"},
-    {"maj11", "1 3 5 7 9 11"},
-    {"min11", "1 b3 5 b7 9 11"},
-    {"13", "1 3 5 b7 9 11 13"},
-    {"maj13", "1 3 5 7 9 11 13"},
-    {"min13", "1 b3 5 b7 9 11 13"},
+    {"maj",     TonesOfChordKind("")},
+    {"min",     TonesOfChordKind("m")},
+    {"dim",     TonesOfChordKind("dim")},
+    {"aug",     TonesOfChordKind("aug")},
+    {"sus2",    TonesOfChordKind("sus2")},
+    {"sus4",    TonesOfChordKind("sus4")},
+    {"sus",     TonesOfChordKind("sus4")},
+    {"1",       CSemitones{0}},
+    {"5",       TonesOfChordKind("5")},
+    {"maj6",    TonesOfChordKind("6")},
+    {"6",       TonesOfChordKind("6")},
+    {"min6",    TonesOfChordKind("m6")},
+    {"7",       TonesOfChordKind("7")},
+    {"maj7",    TonesOfChordKind("maj7")},
+    {"min7",    TonesOfChordKind("m7")},
+    {"minmaj7", TonesOfChordKind("mmaj7")},
+    {"dim7",    TonesOfChordKind("dim7")},
+    {"hdim7",   TonesOfChordKind("m7b5")},
+    {"hdim",    TonesOfChordKind("m7b5")},
+    {"9",       TonesOfChordKind("9")},
+    {"maj9",    TonesOfChordKind("maj9")},
+    {"min9",    TonesOfChordKind("m9")},
+    {"11",      TonesOfChordKind("11")},
+    {"maj11",   TonesOfChordKind("maj11")},
+    {"min11",   TonesOfChordKind("m11")},
+    {"13",      TonesOfChordKind("13")},
+    {"maj13",   TonesOfChordKind("maj13")},
+    {"min13",   TonesOfChordKind("m13")},
 });
-
-constexpr CSemitones TonesOf(std::string_view degrees) {
-    CSemitones tones;
-    CTextScan scan(degrees, degrees);
-    while (!scan.AtEnd()) {
-        tones.SetSemitone(TakeDegree(scan).Tone(), true);
-        scan.SkipBlanks();
-    }
-    return tones;
-}
-static_assert(TonesOf("1 b3 b5 bb7") == CSemitones{0, 3, 6, 9});
+// clang-format on
 
 /// The tones of a word; a text without one has the root alone.
 std::optional<CSemitones> TonesOfWord(std::string_view word, bool hasDegrees) {
@@ -91,7 +83,7 @@ std::optional<CSemitones> TonesOfWord(std::string_view word, bool hasDegrees) {
     const auto* const row = std::find_if(kColonRows.begin(), kColonRows.end(),
                                          [&](const CColonRow& r) { return r.mWord == word; });
     if (row == kColonRows.end()) return std::nullopt;
-    return TonesOf(row->mDegrees);
+    return row->mTones;
 }
 
 }  // namespace

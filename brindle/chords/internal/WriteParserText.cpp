@@ -2,6 +2,7 @@
 #include "brindle/chords/internal/WriteParserText.h"
 
 #include "brindle/chords/internal/CTextScan.h"
+#include "brindle/chords/internal/ChordKinds.h"
 #include "brindle/theory/CChordNamePrefs.h"
 #include "brindle/theory/KeyIntervals.h"
 
@@ -17,6 +18,10 @@ using TTones = std::uint32_t;  // bit n is the tone n semitones above the root
 template <class... T>
 constexpr TTones Tones(T... tones) {
     return (TTones{0} | ... | (TTones{1} << tones));
+}
+
+consteval TTones TonesOfKind(std::string_view suffix) {
+    return static_cast<TTones>(TonesOfChordKind(suffix).Mask());
 }
 
 constexpr bool Has(TTones tones, TTones wanted) {
@@ -51,10 +56,10 @@ struct CWholeChordRow {
 };
 
 constexpr auto kWholeChordRows = std::to_array<CWholeChordRow>({
-    {Tones(0, 3, 6), "dim"},
-    {Tones(0, 3, 6, 9), "dim7"},
-    {Tones(0, 4, 8), "aug"},
-    {Tones(0, 7), "5"},
+    {TonesOfKind("dim"), "dim"},
+    {TonesOfKind("dim7"), "dim7"},
+    {TonesOfKind("aug"), "aug"},
+    {TonesOfKind("5"), "5"},
 });
 
 struct CFirstNumberRow {
