@@ -213,10 +213,20 @@ TStatus AnalyseText(const CTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
     return TStatus::Success;
 }
 
+/// Reads a score in the timing that is asked for. Without one the error has been printed.
+void ReadScore(const CTypedSong& typed, const CAnalyseOptions& options, CAnalysedSong& analysed) {
+    if (options.mTiming == "native") {
+        analysed.mSheet = ReadLeadSheet(typed, TTiming::Native);
+        analysed.mSong = options.mReading.ReadSource(typed.mText, {});
+    } else if (auto read = ReadPlayedSheet(typed)) {
+        analysed.mSheet = std::move(read->mSheet);
+        analysed.mSong = std::move(read->mSong);
+    }
+}
+
 TStatus AnalyseScore(const CTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
                      const CAnalyseOptions& options, CAnalysedSong& analysed) {
-    analysed.mSheet =
-        ReadLeadSheet(typed, options.mTiming == "native" ? TTiming::Native : TTiming::Played);
+    ReadScore(typed, options, analysed);
     if (!analysed.mSheet) return TStatus::BadInput;
     TMusicXMLDoc& sheet = *analysed.mSheet;
     const TFormat format = options.mFormat.Format();
@@ -232,7 +242,6 @@ TStatus AnalyseScore(const CTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
     analyse.AnalyseFromMusicXMLDoc(sheet, RouteOf(options.mRoute));
     analyse.mChords = WithRests(analyse.mChords, sheet);
     analysed.mSymbols.emplace(sheet, analyse.mChords);
-    analysed.mSong = options.mReading.ReadSource(typed.mText, {});
     return TStatus::Success;
 }
 

@@ -89,17 +89,18 @@ std::optional<CSongWithKeys> SongOfText(const CTypedSong& typed, const CSignKeyL
 }
 
 std::optional<CSongWithKeys> SongOfScore(const CTypedSong& typed, const CKeysOptions& options) {
-    auto sheet = ReadLeadSheet(typed, TTiming::Played);
-    if (!sheet) return std::nullopt;
+    auto read = ReadPlayedSheet(typed);
+    if (!read) return std::nullopt;
+    const TMusicXMLDoc& sheet = read->mSheet;
     CHarmonicAnalyse chordsOnly;
-    chordsOnly.AnalyseFromMusicXMLDoc(*sheet, TAnalyse_None);
-    chordsOnly.mChords = WithRests(chordsOnly.mChords, *sheet);
-    const CChordSymbols symbols(*sheet, chordsOnly.mChords);
-    CShownSong song = MakeSong(chordsOnly, nullptr, symbols, *sheet);
+    chordsOnly.AnalyseFromMusicXMLDoc(sheet, TAnalyse_None);
+    chordsOnly.mChords = WithRests(chordsOnly.mChords, sheet);
+    const CChordSymbols symbols(sheet, chordsOnly.mChords);
+    CShownSong song = MakeSong(chordsOnly, nullptr, symbols, sheet);
     CKeyOptions keyOptions = options.mKeys;
-    keyOptions.mBeatsPerBar = BeatsPerBarOf(*sheet);
+    keyOptions.mBeatsPerBar = BeatsPerBarOf(sheet);
     song.mKeys = MakeSongKeys(chordsOnly.mChords, symbols, keyOptions, options.mNumerals);
-    return CSongWithKeys{options.mReading.ReadSource(typed.mText, {}), std::move(song)};
+    return CSongWithKeys{std::move(read->mSong), std::move(song)};
 }
 
 std::string Present(const CSongWithKeys& song, const CSongReading& reading,

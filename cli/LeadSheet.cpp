@@ -114,4 +114,15 @@ std::optional<TMusicXMLDoc> ReadLeadSheet(const CTypedSong& song, TTiming timing
     return sheet;
 }
 
+std::optional<CSheetSong> ReadPlayedSheet(const CTypedSong& song) {
+    CSheetSong sheet = ReadSheetSong(song.mText);
+    if (!sheet.mSong.HasFault()) return sheet;
+    const CSongFault& fault = sheet.mSong.mFaults.front();
+    const std::string place =
+        fault.mLine > 0 ? fmt::format("{}:{}: ", fault.mLine, fault.mColumn) : "";
+    Fail(TStatus::BadInput,
+         fmt::format("{}: {}{}", Printable(song.mName), place, Printable(fault.mText)));
+    return std::nullopt;
+}
+
 }  // namespace brindle::cli

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "brindle/musicxml/TMusicXMLDoc.h"
+#include "brindle/song/ReadSheetSong.h"
 
 #include <optional>
 #include <string>
@@ -44,5 +44,9 @@ struct CSongSource {
 /// The chords of a score, plain or compressed. Nothing when it cannot be read; then the error has
 /// been printed.
 [[nodiscard]] std::optional<TMusicXMLDoc> ReadLeadSheet(const CTypedSong& song, TTiming timing);
+
+/// The score as it is played and as a song, read once. Nothing when it cannot be read; then the
+/// error has been printed.
+[[nodiscard]] std::optional<CSheetSong> ReadPlayedSheet(const CTypedSong& song);
 
 }  // namespace brindle::cli

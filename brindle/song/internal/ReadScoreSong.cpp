@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
+#include "brindle/musicxml/ScoreContainer.h"
 #include "brindle/musicxml/internal/PlayedScore.h"
 #include "brindle/song/HarmonySymbols.h"
+#include "brindle/song/ReadSheetSong.h"
 #include "brindle/song/internal/SongReaders.h"
 #include "brindle/song/internal/StatedKey.h"
 #include "brindle/song/internal/WrittenSigns.h"
@@ -9,7 +11,9 @@
 #include <map>
 #include <utility>
 
-namespace brindle::SongReaders {
+namespace brindle {
+
+namespace SongReaders {
 
 namespace {
 
@@ -75,10 +79,7 @@ void AppendRepeats(const CPlayedScore& score, CSong& song) {
     }
 }
 
-}  // namespace
-
-CSong ReadScoreSong(std::string_view bytes, TSongFormat format) {
-    const CPlayedScore score = PlayScoreBytes(bytes);
+CSong SongOf(const CPlayedScore& score, TSongFormat format) {
     CSong song;
     song.mFormat = format;
     song.mTitle = score.mWritten.mTitle;
@@ -99,4 +100,20 @@ CSong ReadScoreSong(std::string_view bytes, TSongFormat format) {
     return song;
 }
 
-}  // namespace brindle::SongReaders
+}  // namespace
+
+CSong ReadScoreSong(std::string_view bytes, TSongFormat format) {
+    return SongOf(PlayScoreBytes(bytes), format);
+}
+
+}  // namespace SongReaders
+
+CSheetSong ReadSheetSong(std::string_view bytes) {
+    CPlayedScore score = PlayScoreBytes(bytes);
+    const auto format =
+        IsScoreContainer(bytes) ? TSongFormat_CompressedMusicXml : TSongFormat_MusicXml;
+    CSong song = SongReaders::SongOf(score, format);
+    return {std::move(song), std::move(score.mDoc)};
+}
+
+}  // namespace brindle
