@@ -5,6 +5,7 @@
 #include "cli/Output.h"
 
 #include "brindle/musicxml/ScoreContainer.h"
+#include "brindle/platform/Ascii.h"
 #include "brindle/platform/Error.h"
 #include "brindle/platform/XmlStreamParser.h"
 #include "brindle/song/ReadSong.h"
@@ -27,9 +28,7 @@ std::string_view LastDot(std::string_view name) {
 
 bool HasScoreName(std::string_view name) {
     std::string ending(LastDot(name));
-    std::transform(ending.begin(), ending.end(), ending.begin(), [](char c) {
-        return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
-    });
+    std::transform(ending.begin(), ending.end(), ending.begin(), Ascii::ToLower);
     return ending == ".musicxml" || ending == ".xml" || ending == ".mxl";
 }
 

@@ -2,8 +2,8 @@
 #pragma once
 
 #include "brindle/theory/CKeyEnh.h"
+#include "brindle/theory/KeyIntervals.h"
 
-#include <array>
 #include <string>
 
 namespace brindle {
@@ -19,9 +19,8 @@ struct CChordDegree {
     [[nodiscard]] constexpr bool IsUndef() const { return mNumber == 0; }
     /// Semitones above the root, 0 to 11; -1 for none.
     [[nodiscard]] constexpr int Tone() const {
-        constexpr std::array<int, 7> kMajorScale{0, 2, 4, 5, 7, 9, 11};
         if (mNumber < 1) return -1;
-        return (kMajorScale[static_cast<unsigned>(mNumber - 1) % 7] + mSigns + 24) % 12;
+        return (kNaturalKeyNrs[static_cast<unsigned>(mNumber - 1) % 7] + mSigns + 24) % 12;
     }
     /// The key of this tone over a root, with the letter that its number asks for. Undefined where
     /// that takes more than a double sign, and over the undefined root.

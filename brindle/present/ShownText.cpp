@@ -21,10 +21,6 @@ bool IsControl(std::string_view character) {
     return character == "\xEF\xBF\xBE" || character == "\xEF\xBF\xBF";
 }
 
-bool BeginsCharacter(char c) {
-    return (static_cast<unsigned char>(c) & 0xC0) != 0x80;
-}
-
 }  // namespace
 
 std::string Printable(std::string_view text) {
@@ -41,13 +37,13 @@ std::string Printable(std::string_view text) {
 }
 
 std::size_t CountCharacters(std::string_view text) {
-    return static_cast<std::size_t>(std::count_if(text.begin(), text.end(), BeginsCharacter));
+    return static_cast<std::size_t>(std::count_if(text.begin(), text.end(), BeginsUtf8Character));
 }
 
 std::string FirstCharacters(std::string_view text, std::size_t count) {
     std::size_t begun = 0;
     const auto* const end = std::find_if(text.begin(), text.end(), [&](char c) {
-        begun += BeginsCharacter(c);
+        begun += BeginsUtf8Character(c);
         return begun > count;
     });
     return {text.begin(), end};

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/musicxml/ScoreContainer.h"
+#include "brindle/platform/Ascii.h"
 #include "brindle/song/ReadSong.h"
 #include "brindle/song/internal/ChartLinks.h"
 #include "brindle/song/internal/LineKinds.h"
@@ -34,7 +35,7 @@ bool HasDirective(std::string_view text) {
 bool HasMarkOfChart(std::string_view text) {
     for (std::size_t i = 0; i + 2 < text.size(); ++i) {
         if (text[i] == 'T' && IsDigit(text[i + 1]) && IsDigit(text[i + 2])) return true;
-        const bool isPart = text[i] == '*' && text[i + 1] >= 'A' && text[i + 1] <= 'Z';
+        const bool isPart = text[i] == '*' && Ascii::IsCapital(text[i + 1]);
         if (isPart) return true;
     }
     return false;

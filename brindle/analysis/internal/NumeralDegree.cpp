@@ -11,7 +11,7 @@ namespace {
 
 constexpr int kMostAccidentals = 2;
 
-constexpr std::array<int, 7> kMajorDegrees{0, 2, 4, 5, 7, 9, 11};
+constexpr const std::array<int, 7>& kMajorDegrees = kNaturalKeyNrs;
 constexpr std::array<int, 7> kMinorDegrees{0, 2, 3, 5, 7, 8, 10};
 
 // Sharps before the degree, flats as a negative number. A minus is a flat.

@@ -11,8 +11,7 @@ namespace brindle {
 
 /// Key number of a letter, 0 (C) to 6 (B).
 [[nodiscard]] constexpr int KeyNrOfLetter(int letter) {
-    constexpr std::array<int, 7> kKeyNrs{0, 2, 4, 5, 7, 9, 11};
-    return kKeyNrs[static_cast<std::size_t>(letter)];
+    return kNaturalKeyNrs[static_cast<std::size_t>(letter)];
 }
 
 /// The letter that a spelled key is written with, 0 (C) to 6 (B). A spelling that makes no sense

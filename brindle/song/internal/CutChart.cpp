@@ -1,4 +1,5 @@
 // SPDX-License-Identifier: MIT
+#include "brindle/platform/Utf8.h"
 #include "brindle/song/internal/PlayWords.h"
 #include "brindle/song/internal/SongTokens.h"
 #include "brindle/song/internal/SongWords.h"
@@ -215,10 +216,7 @@ private:
 
     void TakeUnknown() {
         std::size_t length = 1;
-        while (length < mRest.size() &&
-               (static_cast<unsigned char>(mRest[length]) & 0xC0) == 0x80) {
-            ++length;
-        }
+        while (length < mRest.size() && !BeginsUtf8Character(mRest[length])) ++length;
         const std::string_view unknown = Take(length);
         mList.AddFault(unknown, "\"" + std::string(unknown) + "\" is not understood");
     }

@@ -2,6 +2,7 @@
 #include "brindle/song/internal/LineKinds.h"
 
 #include "brindle/chords/ReadChordText.h"
+#include "brindle/platform/Ascii.h"
 #include "brindle/song/internal/PlayWords.h"
 #include "brindle/song/internal/SongWords.h"
 
@@ -33,7 +34,7 @@ bool IsAnyOf(std::string_view word, const auto& list) {
 }
 
 bool IsLetter(char c) {
-    return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z') || (c & 0x80) != 0;
+    return Ascii::IsLetter(c) || (c & 0x80) != 0;
 }
 
 bool IsBarSign(std::string_view word) {

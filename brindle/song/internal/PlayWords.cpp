@@ -3,6 +3,7 @@
 
 #include "brindle/musicxml/internal/PlayMarks.h"
 #include "brindle/musicxml/internal/ScoreWords.h"
+#include "brindle/platform/Ascii.h"
 #include "brindle/song/internal/SongWords.h"
 
 #include <algorithm>
@@ -45,7 +46,7 @@ std::string FoldedPlayWord(std::string_view word) {
     constexpr std::string_view kLeftOut = ".,()";
     std::string folded;
     for (const char c : Lower(word)) {
-        if ((c >= 'a' && c <= 'z') || IsDigit(c)) {
+        if (Ascii::IsSmallLetter(c) || IsDigit(c)) {
             folded += c;
         } else if (kLeftOut.find(c) == kLeftOut.npos) {
             return {};

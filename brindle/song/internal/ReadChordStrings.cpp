@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/markov/MarkovChords.h"
+#include "brindle/platform/Utf8.h"
 #include "brindle/song/internal/SongReaders.h"
 #include "brindle/theory/KeyNames.h"
 
@@ -63,11 +64,8 @@ private:
     }
 
     void AddFault(std::string_view line, std::size_t offset, std::string text) {
-        const auto before = line.substr(0, offset);
-        const auto column = std::count_if(before.begin(), before.end(), [](char c) {
-            return (static_cast<unsigned char>(c) & 0xC0) != 0x80;
-        });
-        mSong.mFaults.push_back({mLine, static_cast<std::size_t>(column) + 1, std::move(text)});
+        const std::size_t before = CountUtf8Characters(line.substr(0, offset));
+        mSong.mFaults.push_back({mLine, before + 1, std::move(text)});
     }
 
     std::string_view mText;

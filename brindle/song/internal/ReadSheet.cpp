@@ -1,4 +1,5 @@
 // SPDX-License-Identifier: MIT
+#include "brindle/platform/Utf8.h"
 #include "brindle/song/internal/SongReaders.h"
 #include "brindle/song/internal/SongTokens.h"
 
@@ -23,7 +24,7 @@ public:
             if (c == '\n') {
                 ++mLine;
                 mColumn = 1;
-            } else if ((static_cast<unsigned char>(c) & 0xC0) != 0x80) {
+            } else if (BeginsUtf8Character(c)) {
                 ++mColumn;
             }
         }

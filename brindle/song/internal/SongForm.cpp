@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/song/internal/SongForm.h"
 
+#include "brindle/platform/Ascii.h"
+
 #include <algorithm>
 
 namespace brindle {
@@ -11,8 +13,7 @@ std::size_t CFormPart::EndingBar() const {
 
 std::vector<CFormPart> PartsOfForm(const std::string& form, std::size_t bars) {
     const std::string letters = form.empty() ? "A" : form;
-    const bool areLetters = std::all_of(letters.begin(), letters.end(),
-                                        [](char letter) { return letter >= 'A' && letter <= 'Z'; });
+    const bool areLetters = std::all_of(letters.begin(), letters.end(), Ascii::IsCapital);
     if (!areLetters || bars == 0 || bars % letters.size() != 0) return {};
     std::vector<CFormPart> parts;
     for (std::size_t ix = 0; ix < letters.size(); ++ix) {
