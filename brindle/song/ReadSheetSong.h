@@ -17,7 +17,6 @@ struct CSheetSong {
 };
 
 /// Reads a score, plain or in a container, for those who need what only one of the forms tells.
-/// Half the time of both.
 [[nodiscard]] CSheetSong ReadSheetSong(std::string_view bytes);
 
 }  // namespace brindle
