@@ -210,6 +210,7 @@
 #include "brindle/present/NetText.h"
 #include "brindle/present/NextChordsText.h"
 #include "brindle/present/NumeralsJson.h"
+#include "brindle/present/NumeralsText.h"
 #include "brindle/present/ReadingJson.h"
 #include "brindle/present/ReadingText.h"
 #include "brindle/present/RomanTextTable.h"

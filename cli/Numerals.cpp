@@ -7,13 +7,10 @@
 #include "brindle/analysis/ReadNumerals.h"
 #include "brindle/analysis/ReadRomanText.h"
 #include "brindle/analysis/RomanNumeral.h"
-#include "brindle/chords/ReadChordText.h"
-#include "brindle/chords/WriteChordSymbol.h"
 #include "brindle/present/NumeralsJson.h"
+#include "brindle/present/NumeralsText.h"
 #include "brindle/present/RomanTextTable.h"
-#include "brindle/present/ShownNames.h"
 
-#include <algorithm>
 #include <memory>
 #include <span>
 
@@ -42,42 +39,8 @@ struct CNumeralsOptions {
     CFormatOptions mFormat;
 };
 
-// The first chord tells whether the text has numerals. No chord symbol begins as a numeral does.
 bool AreNumerals(std::string_view text, const CSignKeyLite& key, const CNumeralsOptions& options) {
-    if (options.mFrom != "guess") return options.mFrom == "numerals";
-    const std::vector<CNumeralWord> words = NumeralWords(text);
-    const auto first = std::find_if(words.begin(), words.end(),
-                                    [](const CNumeralWord& word) { return !word.IsMark(); });
-    return first != words.end() && ChordFromNumeral(first->mText, key).has_value();
-}
-
-CNumeralsReading ReadChordWords(std::string_view text) {
-    CNumeralsReading reading{NumeralWords(text), {}};
-    for (CNumeralWord& word : reading.mWords) {
-        if (word.IsMark()) continue;
-        word.mChord = ReadChordText(word.mText).mChord;
-        if (word.mChord.IsUndef()) {
-            reading.mFaults.push_back({word.mLine, word.mColumn, "this is no chord"});
-        }
-    }
-    return reading;
-}
-
-// The lines as they were typed, with the words turned.
-std::string WordsText(const std::vector<CNumeralWord>& words, const CSignKeyLite& key,
-                      bool toChords, const CNumeralOptions& options) {
-    std::vector<std::string> turned(words.size());
-    if (!toChords) turned = NumeralsOfWords(words, key, options);
-    std::string text;
-    for (std::size_t i = 0; i < words.size(); ++i) {
-        if (i > 0) text += words[i].mLine == words[i - 1].mLine ? ' ' : '\n';
-        if (words[i].mChord.IsUndef()) {
-            text += Printable(words[i].mText);
-        } else {
-            text += toChords ? WriteChordSymbol(words[i].mChord) : turned[i];
-        }
-    }
-    return text + '\n';
+    return options.mFrom == "guess" ? BeginsWithNumeral(text, key) : options.mFrom == "numerals";
 }
 
 // False where faults end the reading; they have been printed.
@@ -99,7 +62,7 @@ TStatus ShowWords(const std::string& text, const CSignKeyLite& key,
         return Print(NumeralsJson(reading, text, key, areNumerals, options.mNumerals));
     }
     const bool toChords = areNumerals && !options.mNumerals.mNashville;
-    return Print(WordsText(reading.mWords, key, toChords, options.mNumerals));
+    return Print(NumeralWordsText(reading.mWords, key, toChords, options.mNumerals));
 }
 
 TStatus ShowAnalysis(const std::string& text, const CSignKeyLite& key,

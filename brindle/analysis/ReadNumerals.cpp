@@ -3,20 +3,13 @@
 
 #include "brindle/analysis/CHarmAnlsChords.h"
 #include "brindle/analysis/CKeyOfSong.h"
+#include "brindle/chords/ReadChordText.h"
 #include "brindle/platform/Ascii.h"
+#include "brindle/platform/Utf8.h"
 
 #include <algorithm>
 
 namespace brindle {
-namespace {
-
-std::size_t CharactersOf(std::string_view text) {
-    return static_cast<std::size_t>(std::count_if(text.begin(), text.end(), [](char c) {
-        return (static_cast<unsigned char>(c) & 0xC0U) != 0x80U;
-    }));
-}
-
-}  // namespace
 
 std::vector<CNumeralWord> NumeralWords(std::string_view text) {
     std::vector<CNumeralWord> words;
@@ -32,7 +25,7 @@ std::vector<CNumeralWord> NumeralWords(std::string_view text) {
         }
         const std::string_view word = text.substr(0, text.find_first_of(Ascii::kWhiteSpace));
         words.push_back({std::string(word), line, column, {}});
-        column += CharactersOf(word);
+        column += CountUtf8Characters(word);
         text.remove_prefix(word.size());
     }
     return words;
@@ -59,9 +52,28 @@ CNumeralsReading ReadNumerals(std::string_view text, const CSignKeyLite& key,
         if (numeral.mFault.empty()) continue;
         const auto before = std::string_view(word.mText).substr(0, numeral.mFaultOffset);
         reading.mFaults.push_back(
-            {word.mLine, word.mColumn + CharactersOf(before), std::string(numeral.mFault)});
+            {word.mLine, word.mColumn + CountUtf8Characters(before), std::string(numeral.mFault)});
     }
     return reading;
+}
+
+CNumeralsReading ReadChordWords(std::string_view text) {
+    CNumeralsReading reading{NumeralWords(text), {}};
+    for (CNumeralWord& word : reading.mWords) {
+        if (word.IsMark()) continue;
+        word.mChord = ReadChordText(word.mText).mChord;
+        if (word.mChord.IsUndef()) {
+            reading.mFaults.push_back({word.mLine, word.mColumn, "this is no chord"});
+        }
+    }
+    return reading;
+}
+
+bool BeginsWithNumeral(std::string_view text, const CSignKeyLite& key) {
+    const std::vector<CNumeralWord> words = NumeralWords(text);
+    const auto first = std::find_if(words.begin(), words.end(),
+                                    [](const CNumeralWord& word) { return !word.IsMark(); });
+    return first != words.end() && ChordFromNumeral(first->mText, key).has_value();
 }
 
 }  // namespace brindle

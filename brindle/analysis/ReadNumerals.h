@@ -46,4 +46,10 @@ struct CNumeralsReading {
 [[nodiscard]] CNumeralsReading ReadNumerals(std::string_view text, const CSignKeyLite& key,
                                             const CNumeralOptions& options = {});
 
+/// Reads a text of chord symbols with bar lines in the same way.
+[[nodiscard]] CNumeralsReading ReadChordWords(std::string_view text);
+
+/// Whether the first word that is no mark is a numeral; no chord symbol begins as one.
+[[nodiscard]] bool BeginsWithNumeral(std::string_view text, const CSignKeyLite& key);
+
 }  // namespace brindle

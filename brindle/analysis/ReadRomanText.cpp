@@ -4,6 +4,7 @@
 #include "brindle/analysis/RomanNumeral.h"
 #include "brindle/analysis/internal/RomanTextWords.h"
 #include "brindle/platform/Ascii.h"
+#include "brindle/platform/Utf8.h"
 #include "brindle/theory/ReadKeyText.h"
 
 #include <algorithm>
@@ -29,10 +30,7 @@ struct CMeasureText {
 };
 
 std::size_t CharactersBefore(std::string_view line, const char* end) {
-    const auto count = end - line.data();
-    return static_cast<std::size_t>(std::count_if(line.begin(), line.begin() + count, [](char c) {
-        return (static_cast<unsigned char>(c) & 0xC0U) != 0x80U;
-    }));
+    return CountUtf8Characters(line.substr(0, static_cast<std::size_t>(end - line.data())));
 }
 
 bool IsDoubleBar(std::string_view word) {

@@ -2,6 +2,7 @@
 #include "brindle/song/internal/SongTokens.h"
 
 #include "brindle/platform/ReadNumber.h"
+#include "brindle/platform/Utf8.h"
 
 #include <algorithm>
 #include <array>
@@ -44,7 +45,7 @@ constexpr auto kRepeatRows = std::to_array<CRepeatRow>({
 std::size_t ByteOfCharacter(std::string_view text, int pos) {
     std::size_t byte = 0;
     for (int begun = 0; byte < text.size(); ++byte) {
-        begun += (static_cast<unsigned char>(text[byte]) & 0xC0) != 0x80;
+        begun += BeginsUtf8Character(text[byte]) ? 1 : 0;
         if (begun == pos) break;
     }
     return byte;
