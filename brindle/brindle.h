@@ -197,6 +197,7 @@
 #include "brindle/present/KeysJson.h"
 #include "brindle/present/KeysSvg.h"
 #include "brindle/present/LeadSheetSvg.h"
+#include "brindle/present/LearnedText.h"
 #include "brindle/present/MakeSong.h"
 #include "brindle/present/MakeSongCopies.h"
 #include "brindle/present/MakeSongKeys.h"

@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: MIT
 #include "cli/ChordSources.h"
-#include "cli/Json.h"
 #include "cli/Markov.h"
 #include "cli/MarkovSongs.h"
 #include "cli/Progress.h"
 
+#include "brindle/present/LearnedText.h"
 #include "brindle/present/ShownNames.h"
 #include "brindle/song/FindSongFiles.h"
 #include "brindle/song/LearnSong.h"
@@ -46,12 +46,9 @@ struct CLearnOptions {
     CFormatOptions mFormat;
 };
 
-/// What was read and learned.
+/// What was learned of files.
 struct CLearned {
-    std::size_t mFiles = 0;
-    std::size_t mChords = 0;
-    /// Names of files and what is wrong with them.
-    std::vector<std::pair<std::string, std::string>> mUnread;
+    CLearnReport mReport;
     bool mIsNamedFileUnread = false;
 };
 
@@ -70,46 +67,22 @@ CLearned LearnFiles(VariableLengthMarkovModel& model, const CLearnOptions& optio
         progress.Step(file.mPath);
         const CChordSource source = ReadChordSource(file.mPath, parse, options.mReading);
         if (!source.mError.empty()) {
-            learned.mUnread.emplace_back(file.mPath, source.mError);
+            learned.mReport.mUnread.emplace_back(file.mPath, source.mError);
             learned.mIsNamedFileUnread = learned.mIsNamedFileUnread || file.mIsNamed;
             continue;
         }
-        ++learned.mFiles;
+        ++learned.mReport.mFiles;
         for (CHarmAnlsChordsWithLength chords : source.mSequences) {
             if (options.mSimplify) SimplifyChords(chords);
             LearnChords(model, chords);
-            learned.mChords += chords.size();
+            learned.mReport.mChords += chords.size();
         }
     }
     return learned;
 }
 
-std::string LearnedJson(const CLearned& learned, const VariableLengthMarkovModel& model) {
-    Json unread = Json::array();
-    for (const auto& [name, error] : learned.mUnread) {
-        unread.push_back({{"File", Printable(name)}, {"Error", Printable(error)}});
-    }
-    return JsonText({{"Files", learned.mFiles},
-                     {"Chords", learned.mChords},
-                     {"MaxHistoryLength", model.mMaxHistoryLength},
-                     {"Symbols", model.mObjects.size()},
-                     {"Histories", model.mTransitionMap.size()},
-                     {"Unread", unread}});
-}
-
-std::string Plural(std::size_t count, std::string_view one, std::string_view many) {
-    return fmt::format("{} {}", count, count == 1 ? one : many);
-}
-
-std::string LearnedText(const CLearned& learned, const VariableLengthMarkovModel& model) {
-    return fmt::format("learned {} from {}: {}, {}\n", Plural(learned.mChords, "chord", "chords"),
-                       Plural(learned.mFiles, "file", "files"),
-                       Plural(model.mObjects.size(), "symbol", "symbols"),
-                       Plural(model.mTransitionMap.size(), "history", "histories"));
-}
-
-void ReportUnread(const CLearned& learned) {
-    for (const auto& [name, error] : learned.mUnread) {
+void ReportUnread(const CLearnReport& report) {
+    for (const auto& [name, error] : report.mUnread) {
         Fail(TStatus::BadInput,
              fmt::format("{} was left out: {}", Printable(name), Printable(error)));
     }
@@ -126,15 +99,15 @@ TStatus MarkovLearn(const CLearnOptions& options) {
     if (options.mWithBuiltIn) return Fail(TStatus::BadUsage, "--with-built-in is not for --plain");
     VariableLengthMarkovModel model(options.mOrder);
     const CLearned learned = LearnFiles(model, options);
-    ReportUnread(learned);
-    if (learned.mFiles == 0) return Fail(TStatus::BadInput, "there was nothing to learn");
+    ReportUnread(learned.mReport);
+    if (learned.mReport.mFiles == 0) return Fail(TStatus::BadInput, "there was nothing to learn");
     if (!model.SaveToFile(options.mModel)) {
         return Fail(TStatus::BadInput,
                     fmt::format("{} cannot be written", Printable(options.mModel)));
     }
     const TStatus printed =
-        Print(options.mFormat.Format() == TFormat::Json ? LearnedJson(learned, model)
-                                                        : LearnedText(learned, model));
+        Print(options.mFormat.Format() == TFormat::Json ? LearnedJson(learned.mReport, model)
+                                                        : LearnedText(learned.mReport, model));
     return learned.mIsNamedFileUnread ? TStatus::BadInput : printed;
 }
 

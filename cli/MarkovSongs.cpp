@@ -2,10 +2,10 @@
 #include "cli/MarkovSongs.h"
 
 #include "cli/Input.h"
-#include "cli/Json.h"
 #include "cli/Progress.h"
 
 #include "brindle/platform/AtomicFile.h"
+#include "brindle/present/LearnedText.h"
 #include "brindle/song/BuiltInSongs.h"
 #include "brindle/song/FindSongFiles.h"
 #include "brindle/song/ReadSong.h"
@@ -35,19 +35,6 @@ std::optional<CSongModel> OfStyle(const CSongModel& model, const std::string& st
 /// A song without a title has the name of its file.
 void TakeTitle(const std::string& path, CSong& song) {
     if (song.mTitle.empty()) song.mTitle = std::filesystem::path(path).stem().string();
-}
-
-std::string LearnedSongsText(const CSongModel& model, std::size_t files, bool isJson) {
-    const std::size_t songs = model.Songs().size();
-    if (isJson) {
-        return JsonText({{"Files", files},
-                         {"Songs", songs},
-                         {"Chords", model.ChordCount()},
-                         {"DifferentChords", model.VocabularySize()}});
-    }
-    return fmt::format("learned {} {} from {} {}: {} chords, {} different ones\n", songs,
-                       songs == 1 ? "song" : "songs", files, files == 1 ? "file" : "files",
-                       model.ChordCount(), model.VocabularySize());
 }
 
 }  // namespace
@@ -102,7 +89,8 @@ TStatus MarkovLearnSongs(const CLearnSongsOptions& options) {
         return Fail(TStatus::BadInput,
                     fmt::format("{} cannot be written", Printable(options.mModel)));
     }
-    const TStatus printed = Print(LearnedSongsText(model, taught.mFiles, options.mJson));
+    const TStatus printed = Print(options.mJson ? LearnedSongsJson(model, taught.mFiles)
+                                                : LearnedSongsText(model, taught.mFiles));
     return taught.mIsNamedFileUnread ? TStatus::BadInput : printed;
 }
 
