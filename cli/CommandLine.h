@@ -43,6 +43,7 @@ void AddFunction(CCommand& program);
 void AddTypes(CCommand& program);
 void AddNet(CCommand& program);
 void AddCopies(CCommand& program);
+void AddCorpus(CCommand& program);
 void AddVector(CCommand& program);
 void AddKeys(CCommand& program);
 void AddNumerals(CCommand& program);

@@ -18,6 +18,7 @@ constexpr CCommandHelp kProgramHelp{
     "  brindle analyse song.txt --format svg >song.svg\n"
     "  brindle keys song.txt\n"
     "  brindle import song.musicxml --midi song.mid\n"
+    "  brindle corpus songs >songs.jsonl\n"
     "  brindle chord F#m7/C# Bb13\n"
     "  brindle function Dm7 G7 --key C\n"
     "  brindle numerals \"ii7 V7 I^7\" --key \"Eb major\"\n"
@@ -39,6 +40,7 @@ TStatus RunProgram(int argc, char** argv) {
     AddCopies(program);
     AddHarmonies(program);
     AddImport(program);
+    AddCorpus(program);
     AddChord(program);
     AddFunction(program);
     AddNumerals(program);

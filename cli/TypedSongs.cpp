@@ -6,6 +6,8 @@
 #include "cli/Json.h"
 #include "cli/Progress.h"
 
+#include "brindle/present/CJsonWriter.h"
+
 #include <fmt/format.h>
 
 #include <algorithm>
@@ -88,16 +90,11 @@ TStatus CTypedSongs::Print(TFormat format,
 std::string JsonLine(std::string_view name, std::string_view json) {
     const Json typed = std::string(name);
     std::string line = "{\"Song\":" + typed.dump(-1, ' ', false, Json::error_handler_t::replace);
-    bool isInString = false;
-    bool isEscaped = false;
     const std::size_t first = json.find('{') + 1;
     const bool isEmpty = json.find_first_not_of(" \n", first) == json.find('}', first);
     if (!isEmpty) line += ',';
-    for (const char c : json.substr(first)) {
-        if (isInString || (c != ' ' && c != '\n')) line += c;
-        if (c == '"' && !isEscaped) isInString = !isInString;
-        isEscaped = isInString && c == '\\' && !isEscaped;
-    }
+    line += JsonOnOneLine(json.substr(first));
+    line.pop_back();
     return line;
 }
 

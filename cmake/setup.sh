@@ -5,7 +5,7 @@ root=$(cd "$(dirname "$(readlink -f "${BASH_SOURCE[0]}")")/.." && pwd)
 
 # Debian's names of what the library and the program are built with; gettext makes the catalogues.
 program_packages=(g++ cmake ninja-build pkg-config libboost-dev libfmt-dev nlohmann-json3-dev
-                  libcli11-dev libxml2-dev libzip-dev libplist-dev gettext)
+                  libcli11-dev libxml2-dev libzip-dev libplist-dev libarchive-dev gettext)
 # The same for the tests and the benches.
 test_packages=(doctest-dev libbenchmark-dev python3-jsonschema)
 # The same for the tests under sanitizers and the fuzzers, which share one build by clang.

@@ -154,4 +154,18 @@ void CJsonWriter::AppendMargin(std::size_t level) {
     mText.append(kIndent * level, ' ');
 }
 
+std::string JsonOnOneLine(std::string_view json) {
+    std::string line;
+    line.reserve(json.size());
+    bool isInString = false;
+    bool isEscaped = false;
+    for (const char c : json) {
+        if (isInString || (c != ' ' && c != '\n')) line += c;
+        if (c == '"' && !isEscaped) isInString = !isInString;
+        isEscaped = isInString && c == '\\' && !isEscaped;
+    }
+    line += '\n';
+    return line;
+}
+
 }  // namespace brindle

@@ -77,4 +77,7 @@ private:
     bool mIsBehindKey = false;
 };
 
+/// The JSON of a writer without white space between its parts, and with an end of line.
+[[nodiscard]] std::string JsonOnOneLine(std::string_view json);
+
 }  // namespace brindle

@@ -77,10 +77,10 @@ bool CSong::HasFault() const {
 std::vector<CSong> ReadSongs(std::string_view bytes, const CSongOptions& prefs) {
     const TSongFormat format =
         prefs.mFormat == TSongFormat_Auto ? SongFormatOf(bytes) : prefs.mFormat;
-    if (format != TSongFormat_ChartLink && format != TSongFormat_ChartPage) {
-        return OneSong(ReadOneSong(bytes, format, prefs));
+    if (SongReaders::HoldsCharts(bytes, format)) {
+        return SongReaders::ReadChartLinks(bytes, format, prefs);
     }
-    return SongReaders::ReadChartLinks(bytes, format, prefs);
+    return OneSong(ReadOneSong(bytes, format, prefs));
 }
 
 CSong ReadSong(std::string_view bytes, const CSongOptions& prefs) {

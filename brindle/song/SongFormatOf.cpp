@@ -4,6 +4,7 @@
 #include "brindle/song/ReadSong.h"
 #include "brindle/song/internal/ChartLinks.h"
 #include "brindle/song/internal/LineKinds.h"
+#include "brindle/song/internal/SongReaders.h"
 #include "brindle/song/internal/SongWords.h"
 
 #include <algorithm>
@@ -114,6 +115,13 @@ bool IsPage(std::string_view text) {
 }
 
 }  // namespace
+
+bool SongReaders::HoldsCharts(std::string_view bytes, TSongFormat format) {
+    if (format == TSongFormat_ChartLink || format == TSongFormat_ChartPage) return true;
+    if (format != TSongFormat_Auto || IsScoreContainer(bytes)) return false;
+    const std::string_view text = WithoutMarksInFront(bytes);
+    return text.starts_with('<') ? IsPage(text) : ChartLinks::BeginsWithLink(text);
+}
 
 TSongFormat SongFormatOf(std::string_view bytes) {
     if (IsScoreContainer(bytes)) return TSongFormat_CompressedMusicXml;

@@ -63,6 +63,8 @@ MORE_COMMANDS = [
     "markov generate --seed 1 --json",
     'markov next "Dm7 G7" --json',
     "markov score built-in --json",
+    "corpus examples/songs examples/scores leadsheets",
+    "corpus examples/songs no-such-file examples/scores/SOURCE.txt",
 ]
 TWO_WORDS = {"grids", "net", "markov"}
 # What prints JSON without being asked, and what prints a line of it for each event.
@@ -142,7 +144,7 @@ def planted_faults_pass(schemas):
 
 def values_of(text, name):
     """Events and several songs have a line each."""
-    if name != "import-line" and not text.startswith('{"Song":'):
+    if name not in {"import-line", "corpus"} and not text.startswith('{"Song":'):
         return [json.loads(text)]
     return [json.loads(line) for line in text.splitlines()]
 

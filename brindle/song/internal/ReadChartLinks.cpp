@@ -48,26 +48,55 @@ CSong ReadChart(const ChartLinks::CPackedChart& chart, TSongFormat format,
     return song;
 }
 
+/// The text of a link is packed: a fault stands where the link does.
+void MoveFaults(const ChartLinks::CPackedChart& chart, std::size_t line, std::size_t column,
+                CSong& song) {
+    for (CSongFault& fault : song.mFaults) {
+        fault.mText = chart.mTitle + ", character " + std::to_string(fault.mColumn) +
+                      " of the chart: " + fault.mText;
+        fault.mLine = line;
+        fault.mColumn = column;
+    }
+}
+
+CSong SongWithoutCharts(TSongFormat format) {
+    CSong song;
+    song.mFormat = format;
+    song.mFaults.push_back({1, 1, "no chart stands here"});
+    return song;
+}
+
+std::size_t BytesOf(const ChartLinks::CPackedChart& chart) {
+    return sizeof(chart) + chart.mChart.size() + chart.mTitle.size() + chart.mMakers.size();
+}
+
 }  // namespace
+
+std::vector<CUnreadSong> SplitChartLinks(std::string_view text, TSongFormat format,
+                                         const CSongOptions& prefs) {
+    std::vector<CUnreadSong> songs;
+    CPlaces places(text);
+    for (ChartLinks::CPackedChart& chart : ChartLinks::FindCharts(text)) {
+        places.GoTo(chart.mOffset);
+        const std::size_t bytes = BytesOf(chart);
+        const auto read = [chart = std::move(chart), line = places.Line(), column = places.Column(),
+                           format, prefs] {
+            CSong song = ReadChart(chart, format, prefs);
+            MoveFaults(chart, line, column, song);
+            return song;
+        };
+        songs.push_back({read, bytes});
+    }
+    if (songs.empty()) songs.push_back({[format] { return SongWithoutCharts(format); }, 0});
+    return songs;
+}
 
 std::vector<CSong> ReadChartLinks(std::string_view text, TSongFormat format,
                                   const CSongOptions& prefs) {
     std::vector<CSong> songs;
-    CPlaces places(text);
-    for (const ChartLinks::CPackedChart& chart : ChartLinks::FindCharts(text)) {
-        places.GoTo(chart.mOffset);
-        CSong& song = songs.emplace_back(ReadChart(chart, format, prefs));
-        // The text of a link is packed: a fault stands where the link does.
-        for (CSongFault& fault : song.mFaults) {
-            fault.mText = chart.mTitle + ", character " + std::to_string(fault.mColumn) +
-                          " of the chart: " + fault.mText;
-            fault.mLine = places.Line();
-            fault.mColumn = places.Column();
-        }
+    for (const CUnreadSong& song : SplitChartLinks(text, format, prefs)) {
+        songs.push_back(song.mRead());
     }
-    if (!songs.empty()) return songs;
-    songs.emplace_back().mFormat = format;
-    songs.back().mFaults.push_back({1, 1, "no chart stands here"});
     return songs;
 }
 

@@ -2,6 +2,7 @@
 #pragma once
 
 #include "brindle/song/ReadSong.h"
+#include "brindle/song/SplitSongs.h"
 
 #include <string_view>
 #include <vector>
@@ -12,7 +13,13 @@ namespace brindle::SongReaders {
 /// Chord text, plain or even, chords above lyrics, ChordPro, and packed charts.
 [[nodiscard]] CSong ReadSheet(std::string_view text, TSongFormat format, const CSongOptions& prefs);
 
-/// Links, or a page with links; each link has one or more charts.
+/// Whether bytes of this form are links, or a page with links; asked at once, without a look at all
+/// of them.
+[[nodiscard]] bool HoldsCharts(std::string_view bytes, TSongFormat format);
+
+/// The charts of links, or of a page with links; each link has one or more.
+[[nodiscard]] std::vector<CUnreadSong> SplitChartLinks(std::string_view text, TSongFormat format,
+                                                       const CSongOptions& prefs);
 [[nodiscard]] std::vector<CSong> ReadChartLinks(std::string_view text, TSongFormat format,
                                                 const CSongOptions& prefs);
 
