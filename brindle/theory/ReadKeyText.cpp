@@ -2,7 +2,9 @@
 #include "brindle/theory/ReadKeyText.h"
 
 #include "brindle/theory/CChordNamePrefs.h"
+#include "brindle/theory/ScaleCatalogue.h"
 #include "brindle/theory/ScaleStrings.h"
+#include "brindle/theory/SetFromStringHelper.h"
 #include "brindle/theory/SignKeyStrings.h"
 #include "brindle/theory/internal/GermanKeyText.h"
 
@@ -31,6 +33,16 @@ bool IsReadToItsEnd(std::string_view text, int position) {
     return text.find_first_not_of(' ', static_cast<std::size_t>(position)) == text.npos;
 }
 
+// The scale whose printed name is this, in whatever case; null for none.
+const CScaleRow* ScaleOfName(std::string_view name) {
+    const std::string sought = SetFromStringHelper::ToLowercase(name);
+    const auto* const row =
+        std::find_if(kScaleCatalogue.begin(), kScaleCatalogue.end(), [&](const CScaleRow& scale) {
+            return !scale.mName.empty() && SetFromStringHelper::ToLowercase(scale.mName) == sought;
+        });
+    return row == kScaleCatalogue.end() ? nullptr : row;
+}
+
 }  // namespace
 
 CKeyText ReadKeyText(std::string_view typed) {
@@ -54,7 +66,9 @@ CScaleText ReadScaleText(std::string_view typed) {
     int position = root.mConsumed;
     static_cast<void>(_SemitonesScaleFromString(text, position));
     if (!IsReadToItsEnd(text, position)) {
-        return {{}, "no scale of this name is known", root.mWord};
+        const CScaleRow* const row = ScaleOfName(std::string_view(text).substr(root.mWord));
+        if (row == nullptr) return {{}, "no scale of this name is known", root.mWord};
+        return {CScaleHeavy(root.mRoot, row->Semitones()), {}, 0};
     }
     CScaleText read;
     read.mScale.SetFromString(text, ChordNamePrefsNonUTF8);

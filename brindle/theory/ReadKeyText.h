@@ -31,7 +31,8 @@ struct CScaleText {
     std::size_t mColumn = 0;
 };
 
-/// Reads "D dorian", "Bb blues minor", "Am" with accidentals in # and b.
+/// Reads "D dorian", "Bb blues minor", "Am" with accidentals in # and b, and all names of the
+/// catalogue as they are printed: "A Natural Minor".
 [[nodiscard]] CScaleText ReadScaleText(std::string_view text);
 
 }  // namespace brindle

@@ -2,6 +2,8 @@
 #include "brindle/theory/ReadKeyText.h"
 
 #include "brindle/theory/CChordNamePrefs.h"
+#include "brindle/theory/CScaleLite.h"
+#include "brindle/theory/ScaleCatalogue.h"
 
 #include <doctest/doctest.h>
 
@@ -36,6 +38,18 @@ TEST_CASE("Keys are read in English and in German") {
         INFO(std::string(row.mTyped));
         CHECK(KeyOf(row.mTyped) == std::string(row.mKey));
     }
+}
+
+TEST_CASE("Every scale is read by the name that it is printed with") {
+    for (const CScaleRow& row : kScaleCatalogue) {
+        if (row.mName.empty()) continue;
+        const std::string name = "Eb " + std::string(row.mName);
+        INFO(name);
+        const CScaleText read = ReadScaleText(name);
+        CHECK(read.mError.empty());
+        CHECK(CScaleLite(read.mScale) == CScaleLite(CKeyEnh_Eb, row.Semitones()));
+    }
+    CHECK(ReadScaleText("Eb natural").mError == "no scale of this name is known");
 }
 
 }  // namespace
