@@ -213,6 +213,7 @@
 #include "brindle/present/NextChordsText.h"
 #include "brindle/present/NumeralsJson.h"
 #include "brindle/present/NumeralsText.h"
+#include "brindle/present/PrintableSong.h"
 #include "brindle/present/ReadingJson.h"
 #include "brindle/present/ReadingText.h"
 #include "brindle/present/RomanTextTable.h"

@@ -3,7 +3,7 @@
 #include "brindle/c/internal/Handles.h"
 #include "brindle/c/internal/Values.h"
 
-#include "brindle/present/ShownText.h"
+#include "brindle/present/PrintableSong.h"
 #include "brindle/present/internal/ReadingBars.h"
 #include "brindle/song/ReadSong.h"
 
@@ -41,20 +41,6 @@ brindle::CSongOptions FromC(const brindle_song_options& options) {
     result.mLenient = options.lenient != 0;
     result.mChordTextPrefs = ChordOptionsOf(options.chord_flags);
     return result;
-}
-
-void MakePrintable(std::string& text) {
-    text = brindle::Printable(text);
-}
-
-void MakePrintable(brindle::CSong& song) {
-    for (std::string* const text : {&song.mTitle, &song.mMakers, &song.mStyle}) {
-        MakePrintable(*text);
-    }
-    for (std::string& symbol : song.mSymbols) MakePrintable(symbol);
-    for (brindle::CSongBar& bar : song.mBars) MakePrintable(bar.mNumber);
-    for (brindle::CSongSection& section : song.mSections) MakePrintable(section.mName);
-    for (brindle::CSongFault& fault : song.mFaults) MakePrintable(fault.mText);
 }
 
 // `read` gives the song for options.
