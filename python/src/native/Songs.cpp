@@ -1,0 +1,239 @@
+// SPDX-License-Identifier: MIT
+#include "Arguments.h"
+#include "Bind.h"
+#include "SourceSong.h"
+
+#include "brindle/present/PrintableSong.h"
+
+#include <nanobind/stl/optional.h>
+#include <nanobind/stl/shared_ptr.h>
+#include <nanobind/stl/string.h>
+#include <nanobind/stl/string_view.h>
+
+#include <cmath>
+
+namespace brindle::python {
+namespace {
+
+constexpr CWord<TSongFormat> kFormats[] = {
+    {"auto", TSongFormat_Auto},
+    {"chord-text", TSongFormat_ChordText},
+    {"even-text", TSongFormat_EvenText},
+    {"chords-above-lyrics", TSongFormat_ChordsAboveLyrics},
+    {"chord-pro", TSongFormat_ChordPro},
+    {"chart", TSongFormat_Chart},
+    {"chart-link", TSongFormat_ChartLink},
+    {"chart-page", TSongFormat_ChartPage},
+    {"chord-strings", TSongFormat_ChordStrings},
+    {"musicxml", TSongFormat_MusicXml},
+    {"compressed-musicxml", TSongFormat_CompressedMusicXml},
+    {"roman-text", TSongFormat_RomanText},
+};
+
+std::string_view FormatWord(TSongFormat format) {
+    for (const auto& row : kFormats) {
+        if (row.mValue == format) return row.mWord;
+    }
+    return "";
+}
+
+CSongOptions OptionsFor(std::string_view format, double beatsPerBar, double beatsPerChord,
+                        bool isEven, bool isLenient) {
+    const auto areBeats = [](double beats) { return std::isfinite(beats) && beats > 0.0; };
+    if (!areBeats(beatsPerBar) || !areBeats(beatsPerChord)) {
+        throw nb::value_error("beats are numbers above 0");
+    }
+    CSongOptions options;
+    options.mFormat = ValueOfWord("format", format, kFormats);
+    options.mBeatsPerBar = beatsPerBar;
+    options.mBeatsPerChord = beatsPerChord;
+    options.mEven = isEven;
+    options.mLenient = isLenient;
+    return options;
+}
+
+CSourceSongPtr Read(const nb::bytes& source, std::string_view format, double beatsPerBar,
+                    double beatsPerChord, bool isEven, bool isLenient) {
+    auto song = std::make_shared<CSourceSong>();
+    song->mOptions = OptionsFor(format, beatsPerBar, beatsPerChord, isEven, isLenient);
+    song->mSource.assign(source.c_str(), source.size());
+    const nb::gil_scoped_release released;
+    song->mSong = ReadSong(song->mSource, song->mOptions);
+    MakePrintable(song->mSong);
+    return song;
+}
+
+nb::tuple ChordsOf(const CSourceSong& source) {
+    const nb::object record = RecordType("SongChord");
+    const CSong& song = source.mSong;
+    nb::list chords;
+    for (std::size_t i = 0; i < ChordCount(song); ++i) {
+        const auto& chord = song.mChords[i];
+        chords.append(record(chord.mPosition, LengthOfChord(song, i), SymbolOfChord(song, i),
+                             CChordLite(chord)));
+    }
+    return nb::tuple(chords);
+}
+
+nb::tuple FaultsOf(const CSourceSong& source) {
+    const nb::object record = RecordType("Fault");
+    return TupleOf(source.mSong.mFaults, [&](const CSongFault& fault) {
+        return record(fault.mText, fault.mLine, fault.mColumn, fault.mIsNote);
+    });
+}
+
+nb::tuple BarsOf(const CSourceSong& source) {
+    const nb::object record = RecordType("Bar");
+    return TupleOf(source.mSong.mBars, [&](const CSongBar& bar) {
+        const nb::object time =
+            bar.mTime.IsUndef()
+                ? nb::none()
+                : nb::object(nb::make_tuple(bar.mTime.mNumerator, bar.mTime.mDenominator));
+        return record(bar.mNumber, bar.mPosition, bar.mLength, time);
+    });
+}
+
+nb::tuple SectionsOf(const CSourceSong& source) {
+    const nb::object record = RecordType("Section");
+    return TupleOf(source.mSong.mSections, [&](const CSongSection& section) {
+        return record(section.mName, section.mPosition);
+    });
+}
+
+nb::tuple PickleOf(const CSourceSong& song) {
+    const CSongOptions& options = song.mOptions;
+    return nb::make_tuple(nb::module_::import_("brindle._songs").attr("read_again"),
+                          nb::make_tuple(nb::bytes(song.mSource.data(), song.mSource.size()),
+                                         FormatWord(options.mFormat), options.mBeatsPerBar,
+                                         options.mBeatsPerChord, options.mEven, options.mLenient));
+}
+
+std::string ReprOf(const CSourceSong& song) {
+    const std::size_t count = ChordCount(song.mSong);
+    const std::string title = song.mSong.mTitle.empty() ? "" : " \"" + song.mSong.mTitle + "\"";
+    return "<Song" + title + " of " + std::to_string(count) + (count == 1 ? " chord>" : " chords>");
+}
+
+constexpr const char* kSong =
+    R"(A song from any source, played through its repeats, endings and jumps.
+
+It is made by `read` and never changes. All positions and lengths are beats from its beginning: quarter
+notes in a score, what the song itself counts in a text.
+
+>>> import brindle
+>>> song = brindle.read("Dm7 G7 | Cmaj7 . . .")
+>>> song
+<Song of 3 chords>
+>>> [(chord.position, chord.symbol) for chord in song]
+[(0.0, 'Dm7'), (1.0, 'G7'), (4.0, 'Cmaj7')])";
+
+void BindLists(nb::class_<CSourceSong>& song) {
+    song.def_prop_ro("chords", ChordsOf,
+                     nb::sig("def chords(self, /) -> tuple[brindle._records.SongChord, ...]"),
+                     R"(Its chords as they are played.
+
+>>> import brindle
+>>> brindle.read("C . G7 .").chords[1].length
+2.0)");
+    song.def_prop_ro("faults", FaultsOf,
+                     nb::sig("def faults(self, /) -> tuple[brindle._records.Fault, ...]"),
+                     R"(What is wrong with it, or was left out of it; empty if all is understood.
+
+>>> import brindle
+>>> fault = brindle.read("C what G").faults[0]
+>>> fault.line, fault.column
+(1, 3))");
+    song.def_prop_ro("bars", BarsOf,
+                     nb::sig("def bars(self, /) -> tuple[brindle._records.Bar, ...]"),
+                     R"(Its bars as they are played; empty for a text without bar lines.
+
+>>> import brindle
+>>> [bar.position for bar in brindle.read("C . . . | F . . . | G . . .").bars]
+[0.0, 4.0, 8.0])");
+    song.def_prop_ro("sections", SectionsOf,
+                     nb::sig("def sections(self, /) -> tuple[brindle._records.Section, ...]"),
+                     R"(Verses, choruses, rehearsal marks.
+
+>>> import brindle
+>>> brindle.read("{title: T}\n{soc}\n[C]la [G]la\n{eoc}\n").sections
+(Section(name='Chorus', position=0.0),))");
+}
+
+void BindFacts(nb::class_<CSourceSong>& song) {
+    song.def_prop_ro(
+        "title", [](const CSourceSong& self) { return self.mSong.mTitle; },
+        R"(Its title; "" if it tells none.
+
+>>> import brindle
+>>> brindle.read("{title: Greensleeves}\n[Am]Alas my [G]love").title
+'Greensleeves')");
+    song.def_prop_ro(
+        "makers", [](const CSourceSong& self) { return self.mSong.mMakers; },
+        R"(Composers, artists and writers of the words.
+
+>>> import brindle
+>>> brindle.read("{composer: Foster}\n[C]la").makers
+'Foster')");
+    song.def_prop_ro(
+        "style", [](const CSourceSong& self) { return self.mSong.mStyle; },
+        R"(Its style, as a chart tells it.
+
+>>> import brindle
+>>> brindle.read("C F G").style
+'')");
+    song.def_prop_ro(
+        "format", [](const CSourceSong& self) { return FormatWord(self.mSong.mFormat); },
+        R"(What it was read as.
+
+>>> import brindle
+>>> brindle.read("C F G").format
+'chord-text')");
+    song.def_prop_ro(
+        "stated_key", [](const CSourceSong& self) { return self.mSong.mStatedKey; },
+        R"(The first key that it states.
+
+>>> import brindle
+>>> brindle.read("{key: Em}\n[Em]la [B7]la").stated_key
+Key('E Minor'))");
+    song.def_prop_ro(
+        "tempo", [](const CSourceSong& self) { return self.mSong.mTempo; },
+        R"(Quarter notes a minute.
+
+>>> import brindle
+>>> brindle.read("{tempo: 96}\n[C]la").tempo
+96.0)");
+    song.def_prop_ro(
+        "beats_per_bar", [](const CSourceSong& self) { return self.mSong.mBeatsPerBar; },
+        R"(Length of a bar.
+
+>>> import brindle
+>>> brindle.read("C F G", beats_per_bar=3).beats_per_bar
+3.0)");
+    song.def_prop_ro(
+        "has_fault", [](const CSourceSong& self) { return self.mSong.HasFault(); },
+        R"(Whether something was not understood; it then has no chords, unless it was read leniently.
+
+>>> import brindle
+>>> brindle.read("C what G").has_fault
+True)");
+}
+
+}  // namespace
+
+void BindSongs(nb::module_& module) {
+    nb::class_<CSourceSong> song(module, "Song", kSong);
+    BindFacts(song);
+    BindLists(song);
+    song.def("__len__", [](const CSourceSong& self) { return ChordCount(self.mSong); });
+    song.def(
+        "__iter__", [](const CSourceSong& self) { return nb::iter(ChordsOf(self)); },
+        nb::sig("def __iter__(self) -> collections.abc.Iterator[brindle._records.SongChord]"));
+    song.def("__repr__", ReprOf);
+    song.def("__reduce__", PickleOf,
+             nb::sig("def __reduce__(self) -> tuple[typing.Any, tuple[typing.Any, ...]]"));
+    module.def("_read", Read, nb::arg("source"), nb::arg("format"), nb::arg("beats_per_bar"),
+               nb::arg("beats_per_chord"), nb::arg("even"), nb::arg("lenient"),
+               "Reads the bytes of a song.");
+}
+
+}  // namespace brindle::python
