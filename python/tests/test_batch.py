@@ -51,7 +51,7 @@ def test_a_batch_has_what_the_objects_have(lenient):
 def test_the_schema_is_as_documented():
     lists = {
         "chords": "list<item: struct<position: double, length: double, symbol: string, root: int8, "
-        "mask: uint16, numeral: string, function: string, relation: string, key: string>>",
+        "mask: int16, numeral: string, function: string, relation: string, key: string>>",
         "faults": "list<item: struct<line: int32, column: int32, text: string, is_note: bool>>",
     }
     shown = {field.name: str(field.type) for field in brindle.batch_schema()}

@@ -67,7 +67,7 @@ std::size_t CArrowColumn::WidthOfNumber() const {
             return 8;
         case 'i':
             return 4;
-        case 'S':
+        case 's':
             return 2;
         default:
             return 1;

@@ -49,8 +49,8 @@ namespace brindle::python {
 /// A column of a table in Arrow's layout, filled from the first row to the last.
 class CArrowColumn {
 public:
-    /// `format` is Arrow's: "g" doubles, "i" 32 bits, "c" 8 bits, "C" unsigned 8 bits, "S" unsigned
-    /// 16 bits, "b" booleans, "u" UTF-8, "+l" lists, "+s" records.
+    /// `format` is Arrow's: "g" doubles, "i" 32 bits, "s" 16 bits, "c" 8 bits, "b" booleans, "u"
+    /// UTF-8, "+l" lists, "+s" records.
     CArrowColumn(std::string name, std::string format, std::vector<CArrowColumn> children = {});
 
     void AddNull();

@@ -85,7 +85,7 @@ CArrowColumn ChordsColumn() {
     fields.emplace_back("length", "g");
     fields.emplace_back("symbol", "u");
     fields.emplace_back("root", "c");
-    fields.emplace_back("mask", "S");
+    fields.emplace_back("mask", "s");
     fields.emplace_back("numeral", "u");
     fields.emplace_back("function", "u");
     fields.emplace_back("relation", "u");
@@ -133,7 +133,7 @@ void AddChord(CArrowColumn& chords, const CSongRow& row, std::size_t index) {
         chords.Child(kMask).AddNull();
     } else {
         chords.Child(kRoot).AddNumber(static_cast<std::int8_t>(chord.mRootKeyEnh.mKeyNr));
-        chords.Child(kMask).AddNumber(static_cast<std::uint16_t>(chord.mSemitones.Mask()));
+        chords.Child(kMask).AddNumber(static_cast<std::int16_t>(chord.mSemitones.Mask()));
     }
     chords.Child(kNumeral).AddText(reading.mNumeral);
     chords.Child(kFunction).AddText(NameOf(reading.mFunction));
