@@ -20,7 +20,10 @@ void MakePrintable(CSong& song) {
         MakeTextPrintable(*text);
     }
     for (std::string& symbol : song.mSymbols) MakeTextPrintable(symbol);
-    for (CSongBar& bar : song.mBars) MakeTextPrintable(bar.mNumber);
+    for (CSongBar& bar : song.mBars) {
+        MakeTextPrintable(bar.mNumber);
+        MakeTextPrintable(bar.mWords);
+    }
     for (CSongSection& section : song.mSections) MakeTextPrintable(section.mName);
     for (CSongFault& fault : song.mFaults) MakeTextPrintable(fault.mText);
 }
