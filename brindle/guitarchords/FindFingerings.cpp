@@ -11,11 +11,6 @@
 namespace brindle {
 namespace {
 
-/// Less cost first; of equal ones the order of frets, so that the result is always the same.
-bool IsBetter(const CFingering& a, const CFingering& b) {
-    return a.mCost != b.mCost ? a.mCost < b.mCost : a.mFrets < b.mFrets;
-}
-
 constexpr int kRootTone = 0;
 constexpr int kMostCapo = 12;
 constexpr std::size_t kMostFingerings = 1000;
@@ -75,10 +70,10 @@ std::vector<CFingering> FindFingerings(const CChordLite& chord, const GChShortTu
     if (hasBass) task.mNeededKeys |= 1U << task.mBass;
     task.mIsSymmetric = IsSymmetric(chord.mSemitones);
     task.mOptions = options;
+    task.mOptions.mLimit = std::min(options.mLimit, kMostFingerings);
     std::vector<CFingering> found = SearchFingerings(task);
-    const auto limit = std::min({options.mLimit, kMostFingerings, found.size()});
-    std::sort(found.begin(), found.end(), IsBetter);
-    found.resize(limit);
+    std::sort(found.begin(), found.end(), IsBetterFingering);
+    found.resize(std::min(task.mOptions.mLimit, found.size()));
     return found;
 }
 

@@ -165,13 +165,66 @@ TEST_CASE("The first fingering and its fingers are those of the books") {
              {"B7", "x21202", "-213-4"},
              {"Dm", "xx0231", "---231"},
              {"D/F#", "200232", ""},
-             {"Am/G", "302010", ""},
+             {"Am/G", "302210", ""},
+             {"Cmaj7", "x32000", ""},
+             {"Fmaj7", "xx3210", ""},
+             {"Bm7b5", "x20201", ""},
+             {"C/E", "032010", ""},
          }) {
         const auto found = FindFingerings(ChordOf(row.mSymbol), kGChStandardGuitar);
         INFO(row.mSymbol);
         REQUIRE_FALSE(found.empty());
         CHECK(Text(found.front()) == row.mFrets);
         if (row.mFingers[0] != '\0') CHECK(FingersText(found.front()) == row.mFingers);
+    }
+}
+
+TEST_CASE("The best few are the first of many") {
+    CFingeringOptions few;
+    few.mLimit = 3;
+    CFingeringOptions many;
+    many.mLimit = 1000;
+    for (const char* symbol : {"C", "A11", "Em7", "F#m7b5", "G/F#", "Bbm(maj7)", "Cdim7", "B5"}) {
+        for (const char* tuning : {"standard", "ukulele", "dadgad", "7-string"}) {
+            INFO(symbol << " " << tuning);
+            auto all = FindFingerings(ChordOf(symbol), *TuningOfName(tuning), many);
+            const auto best = FindFingerings(ChordOf(symbol), *TuningOfName(tuning), few);
+            REQUIRE(best.size() == std::min<std::size_t>(3, all.size()));
+            all.resize(best.size());
+            CHECK(all == best);
+        }
+    }
+}
+
+TEST_CASE("What a player minds lies behind what he does not") {
+    struct CRow {
+        const char* mSymbol;
+        const char* mBefore;
+        const char* mBehind;
+        const char* mBecause;
+    };
+    for (const CRow& row : std::vector<CRow>{
+             {"Am", "x02210", "577555", "it lies at the nut"},
+             {"A", "x02220", "x02225", "the hand is narrow"},
+             {"Em7", "022030", "020030", "the seventh sounds once"},
+             {"G/F#", "220003", "220002", "the bass that is foreign sounds once"},
+             {"Gaug", "321003", "x21003", "the root is lowest, though each tone may be the root"},
+             {"C7", "x32310", "x3231x", "the treble sounds"},
+             {"Dm7", "xx0211", "x00211", "the root is lowest"},
+             {"G", "320003", "3x0003", "no string is muted inside"},
+             {"B7", "x21202", "x2120x", "an open string need not be muted"},
+             {"E6", "022120", "02212x", "nothing is muted"},
+         }) {
+        CFingeringOptions options;
+        options.mLimit = 1000;
+        const auto found = FindFingerings(ChordOf(row.mSymbol), kGChStandardGuitar, options);
+        const auto placeOf = [&](const char* frets) {
+            return std::find_if(found.begin(), found.end(),
+                                [&](const CFingering& each) { return Text(each) == frets; });
+        };
+        INFO(row.mSymbol << ": " << row.mBecause);
+        REQUIRE(placeOf(row.mBehind) != found.end());
+        CHECK(placeOf(row.mBefore) < placeOf(row.mBehind));
     }
 }
 

@@ -1,56 +1,83 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/guitarchords/internal/FingeringCost.h"
 
+#include "brindle/theory/KeyIntervals.h"
+
 #include <algorithm>
 #include <array>
 
 namespace brindle {
 namespace {
 
-// On the scale of the effort of a hand. Fitted to guitar and ukulele fingerings that people wrote
-// down, and rounded. Mutes and the bass weigh most: without them far fewer of ours are theirs.
+// Weights of what players mind, fitted to half of a collection of guitar and ukulele fingerings
+// that people wrote down, checked on the other half, and rounded.
+
+// The hand. Who chooses a fingering minds a barre less than it works: it can be moved and damped.
+constexpr int kCostOfFinger = 40;
+constexpr int kCostOfBarre = 45;
+constexpr int kCostOfBentBarre = 320;  // that must not touch the string above it
+constexpr int kCostOfHalfStretch = 30;
+constexpr int kCostOfExtraWidth = 80;
+
+// The neck.
 constexpr int kCostOfPosition = 55;    // each fret from the nut to the lowest finger
-constexpr int kCostOfHighFret = 60;    // each fret beyond the third
-constexpr int kCostOfFarOpen = 200;    // each fret beyond the fourth above open strings
+constexpr int kCostOfHighFret = 85;    // each fret beyond the third
+constexpr int kCostOfFarOpen = 280;    // each fret beyond the fourth above open strings
 constexpr int kCostOfOpenString = 40;  // it rings on when the hand moves
-constexpr int kCostOfOmittedTone = 150;
+
+// Tones.
+constexpr int kCostOfOmittedTone = 230;
 constexpr int kCostOfOmittedRoot = 600;
-constexpr int kCostOfOtherBass = 320;
+constexpr int kCostOfOtherBass = 380;
+constexpr int kCostOfAnyBass = 200;      // where each tone may be the root
+constexpr int kCostOfDoubledTone = 120;  // that is no root, third or fifth
+constexpr int kCostOfDoubledBass = 150;  // that is foreign to its chord, beside that
+
+// Strings that do not sound.
 constexpr int kCostOfSilentTreble = 150;
-constexpr int kSavedByHand = 40;  // a hand without open strings lies over those it mutes
-constexpr int kCostOfSilentBass = 35;
-constexpr int kCostOfThinChord = 450;  // each bass string beyond two that is silent
-constexpr int kCostOfSilentInside = 150;
+constexpr int kSavedByHand = 60;  // a hand without open strings lies over those it mutes
+constexpr int kCostOfSilentBass = 15;
+constexpr int kCostOfThinChord = 480;  // each bass string beyond two that is silent
+constexpr int kCostOfThreeStrings = 100;
+constexpr int kFewestOfChord = 4;
+constexpr int kCostOfSilentInside = 290;
 constexpr int kCostOfSilentOfFew = 250;  // each, where there are few strings
 constexpr int kFewStrings = 5;
 constexpr int kCostOfNeedlessMute = 80;  // the open string is a tone of the chord
-constexpr int kCostOfUnison = 30;        // two strings at the same pitch
 
-bool HasOpen(std::span<const std::int8_t> frets) {
-    return std::find(frets.begin(), frets.end(), 0) != frets.end();
+constexpr int kMinorThird = 3;
+constexpr int kMajorThird = 4;
+constexpr int kPerfectFifth = 7;
+
+CShapeCounts CountsOf(std::span<const std::int8_t> frets) {
+    CShapeCounts shape;
+    int mutes = 0;
+    bool hasSounded = false;
+    for (const int fret : frets) {
+        if (fret < 0) {
+            ++mutes;
+            continue;
+        }
+        (hasSounded ? shape.mSilentInside : shape.mSilentBass) += mutes;
+        mutes = 0;
+        hasSounded = true;
+        shape.mOpen += fret == 0 ? 1 : 0;
+        shape.mHighest = std::max(shape.mHighest, fret);
+        const bool isLower = shape.mPosition == 0 || fret < shape.mPosition;
+        if (fret > 0 && isLower) shape.mPosition = fret;
+    }
+    return shape;
 }
 
-int CostOfPlace(const CFingering& fingering) {
+/// Strings that do not sound, beside those that LeastCostOf counts.
+int CostOfSilence(const CFingering& fingering, const CShapeCounts& shape) {
     const auto frets = fingering.Frets();
-    const int highest = *std::max_element(frets.begin(), frets.end());
-    int cost = kCostOfPosition * std::max(0, fingering.Position() - 1);
-    cost += kCostOfHighFret * std::max(0, highest - 3);
-    cost += kCostOfOpenString * static_cast<int>(std::count(frets.begin(), frets.end(), 0));
-    return HasOpen(frets) ? cost + kCostOfFarOpen * std::max(0, highest - 4) : cost;
-}
-
-int CostOfSilence(const CFingering& fingering) {
-    const auto frets = fingering.Frets();
-    const auto sounds = [](int fret) { return fret >= 0; };
-    const auto first = std::find_if(frets.begin(), frets.end(), sounds) - frets.begin();
-    const auto treble = std::find_if(frets.rbegin(), frets.rend(), sounds) - frets.rbegin();
-    const auto silent = std::count(frets.begin(), frets.end(), kMutedString);
-    const int ofTreble = kCostOfSilentTreble - (HasOpen(frets) ? 0 : kSavedByHand);
-    const bool areFew = fingering.mStringCount <= kFewStrings;
-    return (areFew ? kCostOfSilentOfFew * static_cast<int>(silent) : 0) +
-           ofTreble * static_cast<int>(treble) + kCostOfSilentBass * static_cast<int>(first) +
-           kCostOfThinChord * std::max(0, static_cast<int>(first) - 2) +
-           kCostOfSilentInside * static_cast<int>(silent - first - treble);
+    const auto silent =
+        static_cast<int>(std::count(frets.begin(), frets.end(), std::int8_t{kMutedString}));
+    const int treble = silent - shape.mSilentBass - shape.mSilentInside;
+    int cost = treble * (kCostOfSilentTreble - (shape.mOpen > 0 ? 0 : kSavedByHand));
+    if (fingering.mStringCount - silent < kFewestOfChord) cost += kCostOfThreeStrings;
+    return fingering.mStringCount > kFewStrings ? cost : cost + kCostOfSilentOfFew * silent;
 }
 
 int CostOfMutes(const CFingering& fingering, const CFingeringTask& task) {
@@ -69,29 +96,59 @@ int CostOfMutes(const CFingering& fingering, const CFingeringTask& task) {
     return cost;
 }
 
-int CostOfUnisons(const CFingering& fingering) {
+/// Of a tone above the root for each string that sounds it again.
+int CostOfDoubling(int tone, const CFingeringTask& task) {
+    const bool isOfChord = task.mSemitones.HasIntvl(tone);
+    const bool isThird = tone == kMinorThird || tone == kMajorThird;
+    int cost = isOfChord ? 0 : kCostOfDoubledBass;
+    const bool mayBeDoubled = tone == 0 || tone == kPerfectFifth || (isThird && isOfChord);
+    return mayBeDoubled ? cost : cost + kCostOfDoubledTone;
+}
+
+int CostOfDoubledTones(const CFingering& fingering, const CFingeringTask& task) {
     int cost = 0;
-    std::array<bool, kHighestMidi + 1> hasSounded{};
+    std::array<bool, 12> hasSounded{};
     for (int string = 0; string < fingering.mStringCount; ++string) {
         const int pitch = fingering.Pitch(string);
         if (pitch < 0) continue;
-        auto& isUnison = hasSounded[static_cast<std::size_t>(pitch)];
-        if (isUnison) cost += kCostOfUnison;
-        isUnison = true;
+        const int tone = FoldIntoOctave(pitch - task.mRoot);
+        auto& isDoubled = hasSounded[static_cast<std::size_t>(tone)];
+        if (isDoubled) cost += CostOfDoubling(tone, task);
+        isDoubled = true;
     }
     return cost;
 }
 
+int CostOfTones(const CFingering& fingering, const CFingeringTask& task) {
+    int cost = kCostOfOmittedTone * fingering.mOmitted.size();
+    if (fingering.mOmitted.HasIntvl(0)) cost += kCostOfOmittedRoot - kCostOfOmittedTone;
+    if (!task.mBassCounts || fingering.mBassIsLowest) return cost;
+    const bool isAnyBass = task.mBass == task.mRoot && task.mIsSymmetric;
+    return cost + (isAnyBass ? kCostOfAnyBass : kCostOfOtherBass);
+}
+
 }  // namespace
 
-int CostOfFingering(const CFingering& fingering, const CFingeringTask& task, int effort) {
-    int cost = effort + CostOfPlace(fingering) + CostOfSilence(fingering) +
-               CostOfMutes(fingering, task) + CostOfUnisons(fingering);
-    const bool anyBass = !task.mBassCounts || (task.mBass == task.mRoot && task.mIsSymmetric);
-    if (!anyBass && !fingering.mBassIsLowest) cost += kCostOfOtherBass;
-    cost += kCostOfOmittedTone * fingering.mOmitted.size();
-    if (fingering.mOmitted.HasIntvl(0)) cost += kCostOfOmittedRoot - kCostOfOmittedTone;
+int LeastCostOf(const CShapeCounts& shape) {
+    int cost = kCostOfPosition * std::max(0, shape.mPosition - 1) +
+               kCostOfHighFret * std::max(0, shape.mHighest - 3) + kCostOfOpenString * shape.mOpen +
+               kCostOfFinger * shape.mFingers + kCostOfSilentBass * shape.mSilentBass +
+               kCostOfThinChord * std::max(0, shape.mSilentBass - 2) +
+               kCostOfSilentInside * shape.mSilentInside;
+    if (shape.mOpen > 0) cost += kCostOfFarOpen * std::max(0, shape.mHighest - 4);
     return cost;
+}
+
+int CostOfSoundAndPlace(const CFingering& fingering, const CFingeringTask& task) {
+    const CShapeCounts shape = CountsOf(fingering.Frets());
+    return LeastCostOf(shape) + CostOfSilence(fingering, shape) + CostOfMutes(fingering, task) +
+           CostOfDoubledTones(fingering, task) + CostOfTones(fingering, task);
+}
+
+int CostOfHand(const CHand& hand) {
+    return kCostOfFinger * hand.mCount + kCostOfBarre * hand.mBarres +
+           kCostOfBentBarre * hand.mBentBarres + kCostOfHalfStretch * hand.mStretch +
+           kCostOfExtraWidth * hand.mExtraWidth;
 }
 
 }  // namespace brindle

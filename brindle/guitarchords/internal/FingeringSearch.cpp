@@ -9,6 +9,7 @@
 #include <array>
 #include <bit>
 #include <cstddef>
+#include <limits>
 
 namespace brindle {
 namespace {
@@ -18,8 +19,8 @@ constexpr int kUpTheNeck = 7;
 constexpr int kFewestSounding = 3;
 // A guitar needs some thousands in a position; 12 strings have millions of ways.
 constexpr int kMostStepsInPosition = 40'000;
-// Only the best of so many are kept, which bounds the memory.
-constexpr std::size_t kMostKept = 4096;
+// The best of those that were found are kept at times rather than after each.
+constexpr std::size_t kFewestKept = 64;
 
 /// What can be done with a string in a position: at most each fret under the hand, open, muted.
 struct CStringWays {
@@ -35,11 +36,9 @@ struct CStringWays {
 struct CShapeState {
     std::uint32_t mKeys = 0;
     int mSounding = 0;
-    /// Muted strings since the last one that sounds, and of these those that lie inside.
+    /// Muted strings since the last one that sounds.
     int mMutes = 0;
-    int mInnerMutes = 0;
-    /// Fewest fingers that hold it.
-    int mFingers = 0;
+    CShapeCounts mCounts;
     int mLastFret = kMutedString;
     bool mHasLowest = false;
     /// A barre at the lowest fret may go on.
@@ -53,10 +52,15 @@ public:
         mHighestFret = std::max(1, highest - task.mCapo);
         const int tones = std::popcount(task.mNeededKeys);
         mFewestSounding = std::min(kFewestSounding, std::max(tones, 2));
+        mKept = std::max(task.mOptions.mLimit, kFewestKept);
     }
 
     std::vector<CFingering> Find() {
-        for (int position = 0; position <= mHighestFret; ++position) FindInPosition(position);
+        // Up the neck each fingering costs more, so there is an end before that of the neck.
+        for (int position = 0; position <= mHighestFret; ++position) {
+            if (LeastCostOf({.mPosition = position, .mHighest = position}) > mWorstCost) break;
+            FindInPosition(position);
+        }
         return std::move(mFound);
     }
 
@@ -79,7 +83,9 @@ private:
             if ((options.mMutable >> string & 1U) != 0) ways.Add(kMutedString);
         }
         mLastLowest = LastStringAt(position);
-        if (position == 0 || mLastLowest >= 0) GoOn(0, {});
+        CShapeState start;
+        start.mCounts.mPosition = position;
+        if (position == 0 || mLastLowest >= 0) GoOn(0, start);
     }
 
     /// The last string that can be pressed at the fret; -1 for none.
@@ -108,15 +114,18 @@ private:
     }
 
     void Take(int string, int fret, CShapeState& state) const {
-        if (fret > 0 && IsNewFinger(fret, state)) ++state.mFingers;
+        if (fret > 0 && IsNewFinger(fret, state)) ++state.mCounts.mFingers;
         if (fret == mPosition && fret > 0) state.mHasLowest = state.mBarreIsOpen = true;
         if (fret <= 0) state.mBarreIsOpen = false;
         state.mLastFret = fret;
         if (fret == kMutedString) {
-            if (state.mSounding > 0) ++state.mMutes;
+            ++state.mMutes;
             return;
         }
-        state.mInnerMutes += state.mMutes;
+        CShapeCounts& counts = state.mCounts;
+        (state.mSounding > 0 ? counts.mSilentInside : counts.mSilentBass) += state.mMutes;
+        counts.mHighest = std::max(counts.mHighest, fret);
+        if (fret == 0) ++counts.mOpen;
         state.mMutes = 0;
         ++state.mSounding;
         state.mKeys |= 1U << mTask.KeyAt(string, fret);
@@ -127,8 +136,9 @@ private:
     }
 
     [[nodiscard]] bool CanBecomeChord(const CShapeState& state, int stringsLeft) const {
-        return state.mFingers <= kHandFingers &&
-               state.mInnerMutes <= mTask.mOptions.mMostInnerMutes &&
+        return state.mCounts.mFingers <= kHandFingers &&
+               state.mCounts.mSilentInside <= mTask.mOptions.mMostInnerMutes &&
+               LeastCostOf(state.mCounts) <= mWorstCost &&
                state.mSounding + stringsLeft >= mFewestSounding &&
                std::popcount(mTask.mNeededKeys & ~state.mKeys) <= stringsLeft;
     }
@@ -142,14 +152,17 @@ private:
         fingering.mStringCount = mTask.mStrings;
         std::copy(frets.begin(), frets.end(), fingering.mFrets.begin());
         if (!SetSound(fingering, state.mKeys)) return;
+        const int cost = CostOfSoundAndPlace(fingering, mTask);
+        if (cost > mWorstCost) return;
         const auto hand = HandOf(frets);
         if (!hand) return;
+        fingering.mCost = cost + CostOfHand(*hand);
+        if (fingering.mCost > mWorstCost) return;
         fingering.mFingers = hand->mPlaces;
         fingering.mFingerCount = hand->mCount;
         fingering.mDifficulty = DifficultyOf(*hand);
-        fingering.mCost = CostOfFingering(fingering, mTask, hand->mEffort);
         mFound.push_back(fingering);
-        if (mFound.size() == 2 * kMostKept) KeepBest();
+        if (mFound.size() == 2 * mKept) KeepBest();
     }
 
     /// False when the lowest note or a pitch is not what it has to be.
@@ -169,17 +182,18 @@ private:
     }
 
     void KeepBest() {
-        const auto end = mFound.begin() + kMostKept;
-        std::nth_element(mFound.begin(), end, mFound.end(),
-                         [](const CFingering& a, const CFingering& b) {
-                             return a.mCost != b.mCost ? a.mCost < b.mCost : a.mFrets < b.mFrets;
-                         });
-        mFound.erase(end, mFound.end());
+        const auto last = mFound.begin() + static_cast<std::ptrdiff_t>(mKept) - 1;
+        std::nth_element(mFound.begin(), last, mFound.end(), IsBetterFingering);
+        mWorstCost = last->mCost;
+        mFound.resize(mKept);
     }
 
     const CFingeringTask& mTask;
     int mHighestFret = 0;
     int mFewestSounding = 0;
+    std::size_t mKept = 0;
+    /// More than this is not among the best.
+    int mWorstCost = std::numeric_limits<int>::max();
     int mPosition = 0;
     int mLastLowest = 0;
     int mSteps = 0;
@@ -189,6 +203,10 @@ private:
 };
 
 }  // namespace
+
+bool IsBetterFingering(const CFingering& a, const CFingering& b) {
+    return a.mCost != b.mCost ? a.mCost < b.mCost : a.mFrets < b.mFrets;
+}
 
 std::vector<CFingering> SearchFingerings(const CFingeringTask& task) {
     return CFingeringSearch(task).Find();

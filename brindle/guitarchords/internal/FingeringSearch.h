@@ -38,7 +38,11 @@ struct CFingeringTask {
     }
 };
 
-/// All fingerings of a task with their fingers, omitted tones, difficulty and cost, in no order.
+/// Less cost first; of equal ones the order of frets, so that the result is always the same.
+[[nodiscard]] bool IsBetterFingering(const CFingering& a, const CFingering& b);
+
+/// The fingerings of a task with their fingers, omitted tones, difficulty and cost, in no order: at
+/// least the best mOptions.mLimit ones of all.
 [[nodiscard]] std::vector<CFingering> SearchFingerings(const CFingeringTask& task);
 
 }  // namespace brindle

@@ -114,32 +114,39 @@ void NumberFingers(CHand& hand, bool hasOpen) {
     }
 }
 
-int EffortOfBarre(const CFingerPlace& barre, std::span<const std::int8_t> frets) {
+/// Whether a barre ends beside a string that sounds below it.
+bool IsBent(const CFingerPlace& barre, std::span<const std::int8_t> frets) {
+    const auto above = static_cast<std::size_t>(barre.mMaxString) + 1;
+    return barre.mFinger > 1 && above < frets.size() && frets[above] >= 0 &&
+           frets[above] < barre.mFret;
+}
+
+int EffortOfBarre(const CFingerPlace& barre) {
     const int strings = barre.mMaxString - barre.mMinString + 1;
     int effort = kEffortOfBarre + kEffortOfBarredString * (strings - 2);
     if (barre.mFret == 1 && strings >= kWideBarre) effort += kEffortAtNut;
-    if (barre.mFinger == 1) return effort;
-    const auto above = static_cast<std::size_t>(barre.mMaxString) + 1;
-    const bool isBent = above < frets.size() && frets[above] >= 0 && frets[above] < barre.mFret;
-    return effort + kEffortOfOtherBarre + (isBent ? kEffortOfBentFinger : 0);
+    return barre.mFinger == 1 ? effort : effort + kEffortOfOtherBarre;
 }
 
-int EffortOfReach(const CHand& hand) {
-    int effort = 0;
+void MeasureReach(CHand& hand) {
     for (int i = 1; i < hand.mCount; ++i) {
         const CFingerPlace& below = hand.mPlaces[static_cast<std::size_t>(i - 1)];
         const CFingerPlace& place = hand.mPlaces[static_cast<std::size_t>(i)];
         const int stretch = place.mFret - below.mFret - (place.mFinger - below.mFinger);
-        if (stretch > 0) {
-            effort += kEffortOfStretch * stretch / (below.mFret >= kNarrowFrets ? 2 : 1);
-        }
+        hand.mStretch += std::max(0, stretch) * (below.mFret >= kNarrowFrets ? 1 : 2);
     }
-    if (hand.mCount > 0) {
-        const int width =
-            hand.mPlaces[static_cast<std::size_t>(hand.mCount - 1)].mFret - hand.mPlaces[0].mFret;
-        if (width > 2) effort += kEffortOfWideHand * (width - 2);
+    const int last = std::max(hand.mCount - 1, 0);
+    const int width = hand.mPlaces[static_cast<std::size_t>(last)].mFret - hand.mPlaces[0].mFret;
+    hand.mExtraWidth = std::max(0, width - 2);
+}
+
+void MeasureBarres(CHand& hand, std::span<const std::int8_t> frets) {
+    for (const CFingerPlace& place :
+         std::span(hand.mPlaces).first(static_cast<std::size_t>(hand.mCount))) {
+        if (!place.IsBarre()) continue;
+        ++hand.mBarres;
+        if (IsBent(place, frets)) ++hand.mBentBarres;
     }
-    return effort;
 }
 
 int EffortOfMutes(std::span<const std::int8_t> frets) {
@@ -159,10 +166,12 @@ int EffortOfMutes(std::span<const std::int8_t> frets) {
 }
 
 int EffortOf(const CHand& hand, std::span<const std::int8_t> frets) {
-    int effort = EffortOfReach(hand) + EffortOfMutes(frets);
+    int effort = kEffortOfFinger * hand.mCount + kEffortOfBentFinger * hand.mBentBarres +
+                 kEffortOfStretch * hand.mStretch / 2 + kEffortOfWideHand * hand.mExtraWidth +
+                 EffortOfMutes(frets);
     for (const CFingerPlace& place :
          std::span(hand.mPlaces).first(static_cast<std::size_t>(hand.mCount))) {
-        effort += kEffortOfFinger + (place.IsBarre() ? EffortOfBarre(place, frets) : 0);
+        if (place.IsBarre()) effort += EffortOfBarre(place);
     }
     return effort;
 }
@@ -194,6 +203,8 @@ std::optional<CHand> HandOf(std::span<const std::int8_t> frets) {
         }
         if (!isHeld) continue;
         NumberFingers(hand, hasOpen);
+        MeasureReach(hand);
+        MeasureBarres(hand, frets);
         hand.mEffort = EffortOf(hand, frets);
         if (!easiest || hand.mEffort < easiest->mEffort) easiest = hand;
     }

@@ -14,6 +14,13 @@ namespace brindle {
 struct CHand {
     std::array<CFingerPlace, kHandFingers> mPlaces{};
     int mCount = 0;
+    int mBarres = 0;
+    /// Barres of other fingers than the index that must not touch the string above.
+    int mBentBarres = 0;
+    /// Half frets that neighbouring fingers are pulled apart; up the neck a fret is one.
+    int mStretch = 0;
+    /// Frets beyond three under the hand.
+    int mExtraWidth = 0;
     /// How hard it is to hold: about 60 make a step of difficulty.
     int mEffort = 0;
 };
