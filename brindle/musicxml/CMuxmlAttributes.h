@@ -15,13 +15,15 @@ namespace brindle {
 /// The attributes of one element, kept beyond the event that brought them.
 class CMuxmlAttributes {
 public:
+    /// No attributes.
     CMuxmlAttributes() = default;
+    /// Copies of these names and values.
     CMuxmlAttributes(
         std::initializer_list<std::pair<const std::string_view, std::string_view>> attributes);
 
     /// Takes over the attributes of an event. Texts that are held already lend their memory.
     void Assign(const XmlAttributes& attributes);
-    void Clear() { mCount = 0; }
+    void Clear() { mCount = 0; }  ///< forgets them, their memory is kept
 
     /// Value of the attribute; nothing if it is not there.
     [[nodiscard]] std::optional<std::string_view> Find(std::string_view name) const;

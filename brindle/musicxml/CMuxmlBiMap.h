@@ -11,15 +11,15 @@ namespace brindle {
 /// A word of a score and the value that it stands for.
 template <class Value>
 struct CMuxmlWord {
-    Value mValue;
-    std::string_view mWord;
+    Value mValue;            ///< what records hold
+    std::string_view mWord;  ///< exactly as the file has it; lives as long as the program
 };
 
 /// A closed list of words, read in both directions. It is a constant of the program, so that no
 /// table has to be filled before the first import.
 template <class Value, std::size_t Count>
 struct CMuxmlBiMap {
-    std::array<CMuxmlWord<Value>, Count> mRows;
+    std::array<CMuxmlWord<Value>, Count> mRows;  ///< in any order; looked up from the first on
 
     /// Words are compared exactly; nothing for a word that the list does not hold.
     [[nodiscard]] constexpr std::optional<Value> ValueOf(std::string_view word) const {

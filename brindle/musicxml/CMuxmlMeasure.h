@@ -10,19 +10,25 @@ namespace brindle {
 
 /// A measure of a part.
 struct CMuxmlMeasure {
+    /// The number of a measure that has none.
     static constexpr const char* kNumber_Undef = "_Undef";
 
+    /// Its begin, in ticks from the start of the part.
     std::int32_t mPositionAsMidiTicks = kMuxmlUndef;
+    /// One bar of the time signature later, whatever it holds; 0 without beats or beat type.
     std::int32_t mEndPositionAsMidiTicks = kMuxmlUndef;
-    XmlNode mMeasureXML;
+    XmlNode mMeasureXML;                  ///< the element `measure`
     std::string mNumber = kNumber_Undef;  ///< as printed, "12" or "X1"
     std::uint64_t mDivisions = 0;         ///< 0 where the measure does not tell them
     std::uint64_t mStaves = 0;            ///< 0 where the measure does not tell them
+    /// How many instruments the part has here; 0 where the measure does not tell it.
     std::uint64_t mInstruments = 0;
-    std::vector<XmlNode> mBarlineXMLs;
+    std::vector<XmlNode> mBarlineXMLs;  ///< the elements `barline`, with repeats and endings
 
+    /// Reads `number`.
     void ReadFromAttributes(const CMuxmlAttributes& attributes);
 
+    /// By name, see CMuxmlField.
     static constexpr auto Fields() {
         return std::tuple(
             MuxmlField("mPositionAsMidiTicks", &CMuxmlMeasure::mPositionAsMidiTicks),

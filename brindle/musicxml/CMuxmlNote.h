@@ -19,9 +19,10 @@ struct CMuxmlNote {
     /// Of a tied note, of the whole chain.
     std::int32_t mLengthAsMidiTicks = kMuxmlUndef;
     std::int32_t mLengthAsDuration = kMuxmlUndef;  ///< in units of the file
-    /// How much later than written the note is played, as the file tells it.
+    /// How much later than written the note is played. Kept: read from an element `attack`, while
+    /// MusicXML has an attribute of that name, so that its files leave it undefined.
     std::int32_t mPositionDisplayOffsetAsMidiTicks = kMuxmlUndef;
-    /// How much longer than written it is played, as the file tells it.
+    /// How much longer than written it is played; likewise from an element `release`.
     std::int32_t mLengthDisplayOffsetAsMidiTicks = kMuxmlUndef;
     /// 0 for each note that sounds, 255 for rests.
     std::uint8_t mMidiChannel = 255;
@@ -100,6 +101,7 @@ struct CMuxmlNote {
     /// the staff, -1 where there is none.
     [[nodiscard]] std::int64_t ConvertToNoteNrLarge(const CMuxmlSignKey& signKey) const;
 
+    /// By name, see CMuxmlField.
     static constexpr auto Fields() {
         return std::tuple(
             MuxmlField("mPositionAsMidiTicks", &CMuxmlNote::mPositionAsMidiTicks),

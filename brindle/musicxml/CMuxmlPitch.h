@@ -11,9 +11,10 @@ namespace brindle {
 
 /// A pitch as it is written: letter, alteration and octave. C in octave 4 is note 60.
 struct CMuxmlPitch {
+    /// The letter; undefined for a word that is none of the seven.
     TMuxmlEnum_Step mStep = TMuxmlEnum_Step_Undef;
-    float mAlteration = 0;  ///< semitones, may be a fraction
-    std::int32_t mOctave = 0;
+    float mAlteration = 0;     ///< semitones, may be a fraction
+    std::int32_t mOctave = 0;  ///< changes from B to C; 4 begins with the middle C
 
     /// The note number, not limited to 0 to 127; -1 for an undefined step. Fractions of a semitone
     /// are cut off toward note 0.
@@ -25,6 +26,7 @@ struct CMuxmlPitch {
 
     friend bool operator==(const CMuxmlPitch&, const CMuxmlPitch&) = default;
 
+    /// By name, see CMuxmlField.
     static constexpr auto Fields() {
         return std::tuple(MuxmlField("mStep", &CMuxmlPitch::mStep),
                           MuxmlField("mAlteration", &CMuxmlPitch::mAlteration),

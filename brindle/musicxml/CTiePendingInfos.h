@@ -13,13 +13,14 @@ namespace brindle {
 
 /// A chain of tied notes that has not ended yet.
 struct CTiePendingInfo {
-    std::int32_t mStaff = 0;
-    std::int32_t mVoice = 0;
-    CMuxmlPitch mPitch;
+    std::int32_t mStaff = 0;  ///< of all its notes, as the next two
+    std::int32_t mVoice = 0;  ///< as the file numbers it
+    CMuxmlPitch mPitch;       ///< as it is written: C sharp does not go on as D flat
+    /// Of its notes so far together, in units of the file.
     std::int32_t mPendingLengthAsDuration = 0;
-    std::int32_t mPendingLengthAsMidiTicks = 0;
-    std::vector<XmlNode> mNoteXMLs;
-    std::vector<CMuxmlNote> mNotes;  ///< the first one first
+    std::int32_t mPendingLengthAsMidiTicks = 0;  ///< the same in ticks
+    std::vector<XmlNode> mNoteXMLs;              ///< the elements of its notes
+    std::vector<CMuxmlNote> mNotes;              ///< the first one first
 
     /// Makes the closing note of the chain stand for the whole: it becomes the first note, but
     /// keeps its own place and length, and the longer of both graphical types. The lyrics of the
@@ -42,6 +43,7 @@ public:
     void ContinueEncounteredFor(const CMuxmlNote& note, std::int32_t ticks);
     /// The chain of the note; null when there is none.
     [[nodiscard]] const CTiePendingInfo* PendingDurationFor(const CMuxmlNote& note) const;
+    /// To be changed in place.
     [[nodiscard]] CTiePendingInfo* PendingDurationFor(const CMuxmlNote& note);
     /// Forgets the chain of the note, if there is one.
     void StopEncounteredFor(const CMuxmlNote& note);
@@ -49,8 +51,9 @@ public:
     /// The first note of each open chain with the length of the chain, by position.
     [[nodiscard]] std::vector<CMuxmlNote> NotesLeftOpen() const;
 
+    /// Open chains, several on one pitch each for itself.
     [[nodiscard]] std::size_t size() const { return mCount; }
-    [[nodiscard]] bool empty() const { return mCount == 0; }
+    [[nodiscard]] bool empty() const { return mCount == 0; }  ///< whether no chain is open
 
 private:
     struct CKey {

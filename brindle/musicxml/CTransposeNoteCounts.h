@@ -15,7 +15,7 @@ namespace brindle {
 /// is no map: a place is looked up by halving the list, and what was there first stays.
 class CTransposeNoteCounts {
 public:
-    using TEntry = std::pair<CMuxmlTranspose, std::int32_t>;
+    using TEntry = std::pair<CMuxmlTranspose, std::int32_t>;  ///< a transposition and its notes
 
     /// Adds to the count of the transposition; 0 only makes an entry for it. Beyond
     /// kMuxmlMaxTransposes no entries are made.
@@ -24,8 +24,11 @@ public:
     /// The first transposition with the largest count; the default one when there is none.
     [[nodiscard]] CMuxmlTranspose TransposeWithMostNotes() const;
 
+    /// The entries, mostly ascending; valid until the next Add.
     [[nodiscard]] std::vector<TEntry>::const_iterator begin() const { return mEntries.begin(); }
+    /// Behind the last of them.
     [[nodiscard]] std::vector<TEntry>::const_iterator end() const { return mEntries.end(); }
+    /// Different transpositions, kMuxmlMaxTransposes at most.
     [[nodiscard]] std::size_t size() const { return mEntries.size(); }
 
 private:

@@ -28,8 +28,9 @@ struct CChordsFromNotesOptions {
 struct CChordFromNotes {
     /// Quarter notes from the start.
     double mPosition = 0.0;
+    /// Quarter notes, up to where another chord begins or nothing sounds.
     double mLength = 0.0;
-    CNamedChord mChord;
+    CNamedChord mChord;  ///< its best name over the bass
 };
 
 /// The chords of a score without chord symbols.

@@ -20,6 +20,7 @@ class CHarmAnlsChord;
 [[nodiscard]] CSemitones XMLHarmonyKindToSemitones(std::string_view kind);
 /// The word for exactly these semitones; "none" if there is no such word.
 [[nodiscard]] std::string_view SemitonesToXMLHarmonyKind(CSemitones semitones);
+/// The word for exactly the tones of a chord, from its root on.
 [[nodiscard]] std::string_view ChordToXMLHarmonyKind(const CHarmAnlsChord& chord);
 
 }  // namespace brindle

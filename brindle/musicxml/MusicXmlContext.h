@@ -22,37 +22,44 @@ namespace brindle {
 /// a whole note. The fields may be read and set directly. Not for use by two threads at once.
 class MusicXmlContext {
 public:
+    /// What is learned about the part that is read; told at its end.
     CMuxmlPartGatheredInfo mCurrentPartGatheredInfo;
+    /// The one that ended last; while one is read, the default.
     CMuxmlMeasure CurrentMeasure;
-    CMuxmlSignTime CurrentSignTime;
-    CMuxmlSignKey CurrentSignKey;
-    CMuxmlClef CurrentClef;
-    CMuxmlTranspose CurrentTranspose;
+    CMuxmlSignTime CurrentSignTime;    ///< in force; 4/4 at the start of a part
+    CMuxmlSignKey CurrentSignKey;      ///< in force; C major at the start of a part
+    CMuxmlClef CurrentClef;            ///< the last one read, of whichever staff
+    CMuxmlTranspose CurrentTranspose;  ///< in force; none at the start of a part
     /// The last note that did not start together with the one before it.
     CMuxmlNote CurrentFirstChordNote;
-    CTiePendingInfos TiePendingInfos;
-    CVelocityFromDynamics VelocityFromDynamics;
-    bool InXMLElementBackup = false;
-    bool InXMLElementForward = false;
-    bool InXMLElementSound = false;  ///< not used
+    CTiePendingInfos TiePendingInfos;            ///< chains of tied notes whose end has not come
+    CVelocityFromDynamics VelocityFromDynamics;  ///< says 90 for all notes
+    bool InXMLElementBackup = false;             ///< the next duration moves the position back
+    bool InXMLElementForward = false;            ///< the next duration moves it on
+    bool InXMLElementSound = false;              ///< not used
+    /// Goes into all notes; nothing sets it to another than 0.
     std::uint8_t CurrentMidiChannel = 0;
-    std::int32_t TicksPerQuarter = 0;
+    std::int32_t TicksPerQuarter = 0;  ///< kept from part to part; below 1 all lengths are 0
+    /// Cursors into the three lists below, from 0; -1 before the first element.
     std::int32_t CurrentPartMeasuresXMLIx = -1;
-    std::int32_t CurrentPartMeasureNotesXMLIx = -1;
-    std::int32_t CurrentPartMeasureDirectionsXMLIx = -1;
-    std::int32_t CurrentPosAsMidiTicks = 0;
+    std::int32_t CurrentPartMeasureNotesXMLIx = -1;       ///< likewise, of the measure
+    std::int32_t CurrentPartMeasureDirectionsXMLIx = -1;  ///< likewise
+    std::int32_t CurrentPosAsMidiTicks = 0;               ///< where the next note begins
     /// What an incomplete first bar lacks.
     std::int32_t ShiftNotePosInIncompleteFirstBarAsDuration = 0;
     /// The position before the last advance: where the first note of a chord began.
     std::int32_t LastPosAsMidiTicks = 0;
-    std::int32_t MaxCurrentPosAsMidiTicks = 0;
-    std::int32_t CurrentBarStartAsMidiTicks = 0;
-    std::int32_t CurrentPartMeasureCount = 0;  ///< not used
+    std::int32_t MaxCurrentPosAsMidiTicks = 0;    ///< the farthest position of the part so far
+    std::int32_t CurrentBarStartAsMidiTicks = 0;  ///< where the measure that is read begins
+    std::int32_t CurrentPartMeasureCount = 0;     ///< not used
+    /// Units of the file in a quarter; 0 makes all lengths 0.
     std::uint64_t CurrentDivisionsPQN = 1;
-    XmlNode CurrentPartXML;
-    std::vector<XmlNode> CurrentPartMeasuresXMLs;
-    std::vector<XmlNode> CurrentPartMeasureNotesXMLs;
-    std::vector<XmlNode> CurrentPartMeasureDirectionsXMLs;
+    XmlNode CurrentPartXML;                            ///< the first `part` with the identifier
+    std::vector<XmlNode> CurrentPartMeasuresXMLs;      ///< its measures
+    std::vector<XmlNode> CurrentPartMeasureNotesXMLs;  ///< all `note` below the measure
+    std::vector<XmlNode> CurrentPartMeasureDirectionsXMLs;  ///< all `direction` below it
+    /// From the bar line, an upbeat counted from where its full bar would begin. Kept: a `backup`
+    /// makes it grow, too.
     std::int64_t CurrentPosInBarAsDuration = 0;
 
     /// `init`, with 0 ticks.
@@ -67,6 +74,7 @@ public:
     [[nodiscard]] XmlNode CurrentPartMeasureXML() const;
     /// One note, in spite of the name.
     [[nodiscard]] XmlNode CurrentPartMeasureNoteXMLs() const;
+    /// Where the last `direction` began.
     [[nodiscard]] XmlNode CurrentPartMeasureDirectionXML() const;
     /// To be changed in place.
     [[nodiscard]] CMuxmlPartGatheredInfo* CurrentPartGatheredInfo() {

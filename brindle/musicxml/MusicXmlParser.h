@@ -18,7 +18,7 @@ inline constexpr const char* kMusicXMLFileExtCompressed_mxl = "mxl";
 
 /// What a host may set. No step of the import reads it.
 struct TMusicXmlParserSettings {
-    bool ImportCueNotes = false;
+    bool ImportCueNotes = false;  ///< cue notes are always told, and take no time
 };
 
 /// Imports a MusicXML score, plain or compressed, as timed notes and what stands between them. A
@@ -29,8 +29,9 @@ struct TMusicXmlParserSettings {
 /// fixed name. The limits of an import are in MuxmlLimits.h.
 class MusicXmlParser {
 public:
-    TMusicXmlParserSettings Settings;
-    bool Trace = false;
+    TMusicXmlParserSettings Settings;  ///< stored for the host, without effect
+    bool Trace = false;                ///< handed on to all delegates; nothing looks at it
+    /// The unit of all times that the host is told; below 1 all lengths are 0.
     std::int32_t MidiTicksPerQuarter = 960;
     /// Receiver of the calls; not owned.
     std::weak_ptr<const brindle::MusicXmlParserDelegate> MusicXmlParserDelegate;
@@ -40,6 +41,8 @@ public:
     /// the first call to the host.
     ///
     /// Throws boost::bad_rational at the first note after divisions of 0, and what the host throws.
+    /// Such divisions, and what the stream finds at fault, are shown as alerts, too: by default on
+    /// standard error, see SetAlertHandler. ImportScore makes an error of the divisions.
     bool parseURL(const std::filesystem::path& url,
                   const std::shared_ptr<const brindle::MusicXmlParserDelegate>& delegate,
                   Error* error = nullptr);

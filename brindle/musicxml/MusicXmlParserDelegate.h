@@ -19,8 +19,9 @@ namespace brindle {
 
 /// How much there is to import.
 struct TMuxmlProgressBarInfo {
-    std::int32_t mPartCount = 0;
+    std::int32_t mPartCount = 0;  ///< in the list of a partwise score; 0 for a timewise one
 
+    /// By name, see CMuxmlField.
     static constexpr auto Fields() {
         return std::tuple(MuxmlField("mPartCount", &TMuxmlProgressBarInfo::mPartCount));
     }
@@ -28,9 +29,10 @@ struct TMuxmlProgressBarInfo {
 
 /// A tempo that holds from a position on.
 struct CMuxmlTempoChange {
-    std::int32_t mPositionAsMidiTicks = 0;
-    float mTempo = 0;  ///< quarters a minute
+    std::int32_t mPositionAsMidiTicks = 0;  ///< ticks from the start of the part
+    float mTempo = 0;                       ///< quarters a minute
 
+    /// By name, see CMuxmlField.
     static constexpr auto Fields() {
         return std::tuple(
             MuxmlField("mPositionAsMidiTicks", &CMuxmlTempoChange::mPositionAsMidiTicks),
@@ -46,26 +48,38 @@ struct CMuxmlTempoChange {
 /// in their order, and its end; then the part end; at last the document end. Notes that are tied
 /// come once, when the last of them is read.
 struct MusicXmlParserDelegate {
+    /// First of all, once.
     std::function<void(const TMuxmlProgressBarInfo& info)>
         didEncounterDocumentStartWithProgressBarInfo;
+    /// Last of all, once.
     std::function<void()> didEncounterDocumentEnd;
+    /// A part begins; its positions count from 0.
     std::function<void(const CMuxmlPart& part)> didEncounterPartStart;
+    /// The same part ends.
     std::function<void(const CMuxmlPartGatheredInfo& info)> didEncounterPartEnd;
+    /// A bar begins, in ticks from the start of the part.
     std::function<void(std::int32_t barStartAsMidiTicks)> didEncounterMeasureStart;
+    /// The same bar ends; only now its number and its attributes are told.
     std::function<void(const CMuxmlMeasure& measure)> didEncounterMeasureEnd;
+    /// The element `time` has ended, or a part begins without one: then 4/4 that is not printed.
     std::function<void(const CMuxmlSignTime& signTime)> didEncounterSignTime;
+    /// The element `key` has ended.
     std::function<void(const CMuxmlSignKey& signKey)> didEncounterSignKey;
     /// Kept: clefs are only told to a host that has didEncounterSignKey, too.
     std::function<void(const CMuxmlClef& clef)> didEncounterClef;
+    /// The element `transpose` has ended.
     std::function<void(const CMuxmlTranspose& transpose)> didEncounterTranspose;
+    /// A `sound` that tells a tempo has started.
     std::function<void(const CMuxmlTempoChange& tempoChange)> didEncounterTempoChange;
     /// `didEncounterInstrumentWithName:midiChannel:` Not sent.
     std::function<void(std::string_view name, std::int32_t midiChannel)>
         didEncounterInstrumentWithName;
+    /// A note that sounds, cue notes and grace notes among them; rests are not told.
     std::function<void(const CMuxmlNote& note)> didEncounterNote;
     /// A note whose tie never ends, with the length of what is tied to it. Told before the end of
     /// the part; such a note is no other call.
     std::function<void(const CMuxmlNote& note)> didLeaveTieOpen;
+    /// A `direction` has started: words, dynamics, pedals, whatever stands between notes.
     std::function<void(const CPositionedXMLElement& direction)> didEncounterDirection;
     /// `didEncounterCtrChangePedal:pedalType:value:` Not sent.
     std::function<void(std::int32_t position, std::int32_t pedalType, std::int32_t value)>

@@ -32,10 +32,15 @@ public:
     /// `parser:foundCharacters:`
     void foundCharacters(XmlStreamParser& parser, std::string_view text) override;
 
+    /// A copy of the song; complete when the document has ended.
     [[nodiscard]] TMusicXMLDoc getDoc() const { return musicXMLDoc; }
+    /// The song itself; an empty one stays behind.
     [[nodiscard]] TMusicXMLDoc takeDoc() { return std::move(musicXMLDoc); }
+    /// Copies of the written measures, those of all parts one behind the other.
     [[nodiscard]] std::vector<TMusicXMLMeasure> getMeasures() const { return measures; }
+    /// From each coda sign to the next one, in the order of the file.
     [[nodiscard]] TMeasurePairs getCodaPairs() const { return codaPairs; }
+    /// From each "D.S. al Coda" to the last segno before it.
     [[nodiscard]] TMeasurePairs getSegnoPairs() const { return segnoPairs; }
     /// Whether the song was cut at one of the limits of TMusicXMLDoc.h.
     [[nodiscard]] bool WasCut() const { return mWasCut; }

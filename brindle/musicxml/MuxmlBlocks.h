@@ -28,8 +28,10 @@ struct CMuxmlXY {
     /// From the default place up.
     float mRelativeY = 0;
 
+    /// Reads `default-x`, `default-y`, `relative-x`, `relative-y`.
     void ReadFromAttributes(const CMuxmlAttributes& attributes);
 
+    /// By name, see CMuxmlField.
     static constexpr auto Fields() {
         return std::tuple(MuxmlField("mDefaultX", &CMuxmlXY::mDefaultX),
                           MuxmlField("mDefaultY", &CMuxmlXY::mDefaultY),
@@ -40,10 +42,13 @@ struct CMuxmlXY {
 
 /// A place and a colour.
 struct CMuxmlXYColor : CMuxmlXY {
+    /// Undefined for the usual one. Kept: what begins with # is read as 0.
     std::int32_t mColor = kMuxmlUndef;
 
+    /// Reads `color`, and those of the place.
     void ReadFromAttributes(const CMuxmlAttributes& attributes);
 
+    /// By name, see CMuxmlField.
     static constexpr auto Fields() {
         return std::tuple(CMuxmlBlock<CMuxmlXY>{"CMuxmlXY"},
                           MuxmlField("mColor", &CMuxmlXYColor::mColor));
@@ -54,13 +59,15 @@ struct CMuxmlXYColor : CMuxmlXY {
 struct CMuxmlFont {
     /// Names of fonts, in the order of preference, between commas.
     std::string mFontFamily;
-    TMuxmlEnum_FontStyle mFontStyle = TMuxmlEnum_FontStyle_Normal;
+    TMuxmlEnum_FontStyle mFontStyle = TMuxmlEnum_FontStyle_Normal;  ///< normal or italic
     /// In points.
     float mFontSize = 0;
-    TMuxmlEnum_FontWeight mFontWeight = TMuxmlEnum_FontWeight_Normal;
+    TMuxmlEnum_FontWeight mFontWeight = TMuxmlEnum_FontWeight_Normal;  ///< normal or bold
 
+    /// Reads `font-family`, `font-style`, `font-size` (a word such as "large" is 0), `font-weight`.
     void ReadFromAttributes(const CMuxmlAttributes& attributes);
 
+    /// By name, see CMuxmlField.
     static constexpr auto Fields() {
         return std::tuple(MuxmlField("mFontFamily", &CMuxmlFont::mFontFamily),
                           MuxmlField("mFontStyle", &CMuxmlFont::mFontStyle),
@@ -71,10 +78,13 @@ struct CMuxmlFont {
 
 /// A font and a colour.
 struct CMuxmlFontAndColor : CMuxmlFont {
+    /// Undefined for the usual one. Kept: what begins with # is read as 0.
     std::int32_t mColor = kMuxmlUndef;
 
+    /// Reads `color`, and those of the font.
     void ReadFromAttributes(const CMuxmlAttributes& attributes);
 
+    /// By name, see CMuxmlField.
     static constexpr auto Fields() {
         return std::tuple(CMuxmlBlock<CMuxmlFont>{"CMuxmlFont"},
                           MuxmlField("mColor", &CMuxmlFontAndColor::mColor));
@@ -83,13 +93,15 @@ struct CMuxmlFontAndColor : CMuxmlFont {
 
 /// The line of a sign: its shape, and how it is dashed, in tenths of the distance of staff lines.
 struct CMuxmlLine {
-    TMuxmlEnum_LineShape mLineShape = TMuxmlEnum_LineShape_Undef;
-    TMuxmlEnum_LineType mLineType = TMuxmlEnum_LineType_Solid;
-    float mDashLength = 0;
-    float mSpaceLength = 0;
+    TMuxmlEnum_LineShape mLineShape = TMuxmlEnum_LineShape_Undef;  ///< straight or curved
+    TMuxmlEnum_LineType mLineType = TMuxmlEnum_LineType_Solid;  ///< solid, dashed, dotted or wavy
+    float mDashLength = 0;   ///< of a dashed line; 0 for the usual one
+    float mSpaceLength = 0;  ///< between two dashes; 0 for the usual one
 
+    /// Reads `line-shape`, `line-type`, `dash-length`, `space-length`.
     void ReadFromAttributes(const CMuxmlAttributes& attributes);
 
+    /// By name, see CMuxmlField.
     static constexpr auto Fields() {
         return std::tuple(MuxmlField("mLineShape", &CMuxmlLine::mLineShape),
                           MuxmlField("mLineType", &CMuxmlLine::mLineType),

@@ -17,6 +17,7 @@ enum TMuxmlEnum_YesNo : std::int32_t {
 };
 
 // clang-format off
+/// The words of `yes-no` in MusicXML.
 template <>
 inline constexpr auto mBiMap<TMuxmlEnum_YesNo> = MuxmlBiMap<TMuxmlEnum_YesNo>({
     {TMuxmlEnum_YesNo_Yes, "yes"},
@@ -34,6 +35,7 @@ enum TMuxmlEnum_StartStop : std::int32_t {
 };
 
 // clang-format off
+/// The words of `start-stop-continue` in MusicXML.
 template <>
 inline constexpr auto mBiMap<TMuxmlEnum_StartStop> = MuxmlBiMap<TMuxmlEnum_StartStop>({
     {TMuxmlEnum_StartStop_Start, "start"},
@@ -52,6 +54,7 @@ enum TMuxmlEnum_Stem : std::int32_t {
 };
 
 // clang-format off
+/// The words of `stem-value` in MusicXML.
 template <>
 inline constexpr auto mBiMap<TMuxmlEnum_Stem> = MuxmlBiMap<TMuxmlEnum_Stem>({
     {TMuxmlEnum_Stem_None, "none"},
@@ -75,6 +78,7 @@ enum TMuxmlEnum_Step : std::int32_t {
 };
 
 // clang-format off
+/// The words of `step` in MusicXML.
 template <>
 inline constexpr auto mBiMap<TMuxmlEnum_Step> = MuxmlBiMap<TMuxmlEnum_Step>({
     {TMuxmlEnum_Step_C, "C"},
@@ -97,6 +101,7 @@ enum TMuxmlEnum_NoteType : std::int32_t {
 };
 
 // clang-format off
+/// Words of our own: MusicXML has the elements `pitch`, `unpitched` and `rest`.
 template <>
 inline constexpr auto mBiMap<TMuxmlEnum_NoteType> = MuxmlBiMap<TMuxmlEnum_NoteType>({
     {TMuxmlEnum_NoteType_Undefined, "undefined"},
@@ -127,6 +132,7 @@ enum TMuxmlEnum_NoteTypeValue : std::int32_t {
 };
 
 // clang-format off
+/// The words of `note-type-value` in MusicXML, and a word for what it does not have.
 template <>
 inline constexpr auto mBiMap<TMuxmlEnum_NoteTypeValue> = MuxmlBiMap<TMuxmlEnum_NoteTypeValue>({
     {TMuxmlEnum_NoteTypeValue_1024th, "1024th"},
@@ -156,6 +162,7 @@ enum TMuxmlEnum_SymbolSize : std::int32_t {
 };
 
 // clang-format off
+/// The words of `symbol-size` in MusicXML, without `grace-cue`.
 template <>
 inline constexpr auto mBiMap<TMuxmlEnum_SymbolSize> = MuxmlBiMap<TMuxmlEnum_SymbolSize>({
     {TMuxmlEnum_SymbolSize_Full, "full"},
@@ -172,6 +179,7 @@ enum TMuxmlEnum_FontStyle : std::int32_t {
 };
 
 // clang-format off
+/// The words of `font-style` in MusicXML.
 template <>
 inline constexpr auto mBiMap<TMuxmlEnum_FontStyle> = MuxmlBiMap<TMuxmlEnum_FontStyle>({
     {TMuxmlEnum_FontStyle_Normal, "normal"},
@@ -187,6 +195,7 @@ enum TMuxmlEnum_FontWeight : std::int32_t {
 };
 
 // clang-format off
+/// The words of `font-weight` in MusicXML.
 template <>
 inline constexpr auto mBiMap<TMuxmlEnum_FontWeight> = MuxmlBiMap<TMuxmlEnum_FontWeight>({
     {TMuxmlEnum_FontWeight_Normal, "normal"},
@@ -202,6 +211,7 @@ enum TMuxmlEnum_AboveBelow : std::int32_t {
 };
 
 // clang-format off
+/// The words of `above-below` in MusicXML.
 template <>
 inline constexpr auto mBiMap<TMuxmlEnum_AboveBelow> = MuxmlBiMap<TMuxmlEnum_AboveBelow>({
     {TMuxmlEnum_AboveBelow_Above, "above"},
@@ -221,6 +231,7 @@ enum TMuxmlEnum_Accidental : std::int32_t {
 };
 
 // clang-format off
+/// The five common words of `accidental-value` in MusicXML.
 template <>
 inline constexpr auto mBiMap<TMuxmlEnum_Accidental> = MuxmlBiMap<TMuxmlEnum_Accidental>({
     {TMuxmlEnum_Accidental_Natural, "natural"},
@@ -240,6 +251,7 @@ enum TMuxmlEnum_FermataShape : std::int32_t {
 };
 
 // clang-format off
+/// The first three words of `fermata-shape` in MusicXML.
 template <>
 inline constexpr auto mBiMap<TMuxmlEnum_FermataShape> = MuxmlBiMap<TMuxmlEnum_FermataShape>({
     {TMuxmlEnum_FermataShape_Normal, "normal"},
@@ -256,6 +268,7 @@ enum TMuxmlEnum_UprightInverted : std::int32_t {
 };
 
 // clang-format off
+/// The words of `upright-inverted` in MusicXML.
 template <>
 inline constexpr auto mBiMap<TMuxmlEnum_UprightInverted> = MuxmlBiMap<TMuxmlEnum_UprightInverted>({
     {TMuxmlEnum_UprightInverted_Upright, "upright"},
@@ -272,6 +285,7 @@ enum TMuxmlEnum_LineShape : std::int32_t {
 };
 
 // clang-format off
+/// The words of `line-shape` in MusicXML.
 template <>
 inline constexpr auto mBiMap<TMuxmlEnum_LineShape> = MuxmlBiMap<TMuxmlEnum_LineShape>({
     {TMuxmlEnum_LineShape_Straight, "straight"},
@@ -289,6 +303,7 @@ enum TMuxmlEnum_LineType : std::int32_t {
 };
 
 // clang-format off
+/// The words of `line-type` in MusicXML.
 template <>
 inline constexpr auto mBiMap<TMuxmlEnum_LineType> = MuxmlBiMap<TMuxmlEnum_LineType>({
     {TMuxmlEnum_LineType_Solid, "solid"},
@@ -314,6 +329,7 @@ enum TMuxmlEnum_SignKeyMode : std::int32_t {
 };
 
 // clang-format off
+/// The words of `mode` in MusicXML.
 template <>
 inline constexpr auto mBiMap<TMuxmlEnum_SignKeyMode> = MuxmlBiMap<TMuxmlEnum_SignKeyMode>({
     {TMuxmlEnum_SignKeyMode_Major, "major"},
@@ -342,6 +358,7 @@ enum TMuxmlEnum_ClefSign : std::int32_t {
 };
 
 // clang-format off
+/// The words of `clef-sign` in MusicXML.
 template <>
 inline constexpr auto mBiMap<TMuxmlEnum_ClefSign> = MuxmlBiMap<TMuxmlEnum_ClefSign>({
     {TMuxmlEnum_ClefSign_G, "G"},
@@ -363,6 +380,7 @@ enum TMuxmlEnum_ShowTuplet : std::int32_t {
 };
 
 // clang-format off
+/// The words of `show-tuplet` in MusicXML.
 template <>
 inline constexpr auto mBiMap<TMuxmlEnum_ShowTuplet> = MuxmlBiMap<TMuxmlEnum_ShowTuplet>({
     {TMuxmlEnum_ShowTuplet_Actual, "actual"},
@@ -384,6 +402,7 @@ enum TMuxmlEnum_EnclosureShape : std::int32_t {
 };
 
 // clang-format off
+/// Most words of `enclosure-shape` in MusicXML.
 template <>
 inline constexpr auto mBiMap<TMuxmlEnum_EnclosureShape> = MuxmlBiMap<TMuxmlEnum_EnclosureShape>({
     {TMuxmlEnum_EnclosureShape_Square, "square"},
@@ -405,6 +424,7 @@ enum TMuxmlEnum_LeftCenterRight : std::int32_t {
 };
 
 // clang-format off
+/// The words of `left-center-right` in MusicXML.
 template <>
 inline constexpr auto mBiMap<TMuxmlEnum_LeftCenterRight> = MuxmlBiMap<TMuxmlEnum_LeftCenterRight>({
     {TMuxmlEnum_LeftCenterRight_Left, "left"},

@@ -13,16 +13,17 @@ namespace brindle {
 /// order as `Fields()`, from which it is printed and written as JSON (MuxmlJson.h).
 template <class Record, class Value>
 struct CMuxmlField {
-    std::string_view mName;
-    Value Record::*mMember;
+    std::string_view mName;  ///< as in the source, "mFifths"
+    Value Record::*mMember;  ///< where a record has it
 };
 
 /// A block of fields that a record begins with: one of its base classes.
 template <class Block>
 struct CMuxmlBlock {
-    std::string_view mName;
+    std::string_view mName;  ///< that of the class
 };
 
+/// A row of a tuple of fields.
 template <class Record, class Value>
 [[nodiscard]] constexpr CMuxmlField<Record, Value> MuxmlField(std::string_view name,
                                                               Value Record::*member) {
@@ -31,10 +32,12 @@ template <class Record, class Value>
 
 /// For counting only: becomes whatever an aggregate is made of.
 struct CMuxmlAnyValue {
+    /// Declared only: no value is ever made.
     template <class Value>
     operator Value() const;
 };
 
+/// Whether a record can be made of so many values.
 template <class Record, std::size_t... Numbers>
 [[nodiscard]] constexpr bool MuxmlTakesValues(std::index_sequence<Numbers...>) {
     return requires {
@@ -52,11 +55,14 @@ template <class Record, std::size_t Count = 1>
     }
 }
 
+/// Whether a row of the tuple is a field of the record itself, and not one of its blocks.
 template <class Record, class Field>
 inline constexpr bool kIsMuxmlFieldOf = false;
+/// It is, where both name the same record.
 template <class Record, class Value>
 inline constexpr bool kIsMuxmlFieldOf<Record, CMuxmlField<Record, Value>> = true;
 
+/// Whether any row of the tuple is such a field.
 template <class Record, class... Fields>
 [[nodiscard]] constexpr bool MuxmlHasOwnFields(const std::tuple<Fields...>&) {
     return (kIsMuxmlFieldOf<Record, Fields> || ...);
@@ -73,6 +79,7 @@ template <class Record>
     }
 }
 
+/// A record of an import: it gives its fields as `Fields()`.
 template <class T>
 concept MuxmlRecord = requires {
     T::Fields();

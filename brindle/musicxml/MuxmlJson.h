@@ -32,6 +32,7 @@ enum TMuxmlEnumForm : std::int32_t {
 /// an element is left out, and a list of them is written as the number of its members.
 class CMuxmlJson {
 public:
+    /// With words is for people, with numbers for what knows the enumerations.
     explicit CMuxmlJson(TMuxmlEnumForm form = TMuxmlEnumForm_Word) : mForm(form) {}
 
     /// The text of an object with all fields of the record.
@@ -53,12 +54,19 @@ public:
 
     // The values of fields
 
+    /// True or false.
     static void Append(std::string& text, bool value);
+    /// All digits, which readers with floating numbers round beyond 2^53.
     static void Append(std::string& text, std::int64_t value);
+    /// Likewise.
     static void Append(std::string& text, std::uint64_t value);
+    /// The fewest digits that read back the same; null where it is not finite.
     static void Append(std::string& text, double value);
+    /// In quotes and escaped; bytes that are no UTF-8 become U+FFFD.
     static void Append(std::string& text, std::string_view value);
 
+    /// Any value of a field by its type: records, enumerations, texts, numbers, lists, pairs and
+    /// fractions (as lists of two).
     template <class Value>
     void AppendValue(std::string& text, const Value& value) const {
         if constexpr (MuxmlRecord<Value>) {

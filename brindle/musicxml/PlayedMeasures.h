@@ -16,17 +16,22 @@ struct TMusicXMLHarmony;
 
 /// The written measures of a lead sheet and the jumps between them.
 struct CWrittenMeasures {
+    /// In the order of the file; not owned.
     std::span<const TMusicXMLMeasure> mMeasures;
+    /// From the index of each coda sign to that of the next one.
     std::span<const std::pair<std::int32_t, std::int32_t>> mCodaPairs;
+    /// From the index of each "D.S. al Coda" to that of the segno before it.
     std::span<const std::pair<std::int32_t, std::int32_t>> mSegnoPairs;
 };
 
 /// How far repeats and jumps may lead, from what is written; see kMaxTimesPlayed.
 struct CPlayLimits {
-    std::size_t mMeasures = 0;
-    std::size_t mBytes = 0;
+    std::size_t mMeasures = 0;  ///< most measures that are played
+    std::size_t mBytes = 0;     ///< most room that their harmonies take, see BytesOf
 };
 
+/// `kMaxTimesPlayed` times what is written, between the bounds of TMusicXMLDoc.h, and never less
+/// than what is written.
 [[nodiscard]] CPlayLimits PlayLimitsOf(std::size_t writtenMeasures, std::size_t writtenBytes);
 
 /// Walks the measures in playing order and appends what they hold to `doc`. False when the walk was

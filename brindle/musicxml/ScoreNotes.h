@@ -13,18 +13,18 @@ struct Error;
 
 /// A note that sounds from a position on. Both are quarter notes from the start of the score.
 struct CTimedNote {
-    double mPosition = 0.0;
-    double mLength = 0.0;
+    double mPosition = 0.0;  ///< when it begins
+    double mLength = 0.0;    ///< above 0; of tied notes together
     /// As it sounds; without a spelling in parts that are written in another pitch.
     CNote mNote;
 
-    [[nodiscard]] double EndPosition() const { return mPosition + mLength; }
+    [[nodiscard]] double EndPosition() const { return mPosition + mLength; }  ///< when it ends
 };
 
 /// A bar as it is written.
 struct CScoreBar {
-    double mPosition = 0.0;
-    double mEndPosition = 0.0;
+    double mPosition = 0.0;     ///< in quarter notes, as the end
+    double mEndPosition = 0.0;  ///< a whole bar later, also for an upbeat
     /// Length of a beat: a quarter in 4/4, a dotted one in 6/8.
     double mBeat = 1.0;
 };
@@ -34,6 +34,7 @@ struct CScoreNotes {
     /// By position, the lower note first. Tied notes are one note; grace notes, cue notes and
     /// unpitched ones are left out.
     std::vector<CTimedNote> mNotes;
+    /// Those of the first part, one behind the other.
     std::vector<CScoreBar> mBars;
 };
 

@@ -22,27 +22,29 @@ inline constexpr std::size_t kMaxWrittenMeasures = 1'000'000;
 /// song that goes on is cut there, and its load reports failure. A short song may play more often,
 /// and a long one less: see the two bounds below. What is written is played in any case.
 inline constexpr std::size_t kMaxTimesPlayed = 64;
-/// Measures that a song may always play, and most that it may.
+/// Measures that a song may always play.
 inline constexpr std::size_t kMinPlayedMeasures = 10'000;
+/// Most measures that it may play.
 inline constexpr std::size_t kMaxPlayedMeasures = 100'000;
-/// The same for the room of the played harmonies in bytes.
+/// Room in bytes that the played harmonies may always take.
 inline constexpr std::size_t kMinPlayedBytes = std::size_t{16} << 20;
+/// Most room that they may take.
 inline constexpr std::size_t kMaxPlayedBytes = std::size_t{256} << 20;
 
 /// A time signature that holds from a position in quarter notes on.
 struct TMusicXMLTimeSignature {
-    double mPosition = kPosUndef;
-    std::int32_t mNumerator = 4;
-    std::int32_t mDenominator = 4;
+    double mPosition = kPosUndef;   ///< where it begins to hold
+    std::int32_t mNumerator = 4;    ///< beats in a bar
+    std::int32_t mDenominator = 4;  ///< 4 where a quarter is the beat
 
     friend bool operator==(const TMusicXMLTimeSignature&, const TMusicXMLTimeSignature&) = default;
 };
 
 /// A part of a song that begins at a rehearsal mark.
 struct CHarmSection {
-    double mPosition = kPosUndef;
-    bool mFlag1 = false;
-    bool mFlag2 = true;
+    double mPosition = kPosUndef;  ///< in quarter notes
+    bool mFlag1 = false;           ///< not used
+    bool mFlag2 = true;            ///< not used
     /// True only for the first section of a song.
     bool mIsFirst = false;
 
@@ -51,7 +53,7 @@ struct CHarmSection {
 
 /// The start of a bar as it is played.
 struct CHarmBarline {
-    double mPosition = kPosUndef;
+    double mPosition = kPosUndef;  ///< in quarter notes, ascending in a list
 
     friend bool operator==(const CHarmBarline&, const CHarmBarline&) = default;
 };
@@ -59,14 +61,15 @@ struct CHarmBarline {
 /// The harmonies of a lead sheet in playing order, with repeats, endings and jumps played through.
 /// All positions are quarter notes from the start of the song.
 struct TMusicXMLDoc {
-    std::string Title;
+    std::string Title;  ///< in UTF-8; empty where the file tells none
     /// The keys as read, at unknown positions, then each change where it is played.
     CHarmAnlsSignKeys HarmSignKeys;
-    std::vector<TMusicXMLHarmony> Harmonies;
+    std::vector<TMusicXMLHarmony> Harmonies;  ///< in playing order
     /// Indexes into `Harmonies`, one for each measure with the word "/".
     std::vector<std::uint64_t> ChordSequences;
+    /// Each where it differs from the one before.
     std::vector<TMusicXMLTimeSignature> TimeSignatures;
-    std::vector<CHarmSection> HarmSections;
+    std::vector<CHarmSection> HarmSections;  ///< one for each rehearsal mark that is passed
     /// One entry for each jump back.
     CHarmCopies HarmCopies;
     /// Left empty by LoadFromMusicXMLFile.

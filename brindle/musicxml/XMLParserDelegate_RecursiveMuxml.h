@@ -25,32 +25,38 @@ class CScoreIndex;
 /// virtual for that reason. The root owns what they share: the context and the document as a tree.
 class XMLParserDelegate_RecursiveMuxml : public XmlStreamDelegate {
 public:
+    /// A delegate that is to be set up by createAndSetAsDelegateForParser.
     XMLParserDelegate_RecursiveMuxml();
     /// `initAsRootDelegateWithMidiTicksPerQuarter:andWholeDocumentXML:`
+    /// The root of an import with so many ticks to the quarter; it keeps a copy of the document.
     XMLParserDelegate_RecursiveMuxml(std::int32_t midiTicksPerQuarter,
                                      const XmlDocument& wholeDocumentXML);
+    /// Destroys its child, too, and the child's.
     ~XMLParserDelegate_RecursiveMuxml() override;
+    /// Not copied: others hold pointers to it.
     XMLParserDelegate_RecursiveMuxml(const XMLParserDelegate_RecursiveMuxml&) = delete;
+    /// Nor assigned.
     XMLParserDelegate_RecursiveMuxml& operator=(const XMLParserDelegate_RecursiveMuxml&) = delete;
 
-    bool Trace = false;
+    bool Trace = false;  ///< the parent's; nothing looks at it
     /// Names of the open elements below this delegate's own.
     std::vector<std::string> currentElementParentNames;
     /// The host's; only the root's is used.
     std::weak_ptr<const brindle::MusicXmlParserDelegate> MusicXmlParserDelegate;
     /// Owns this delegate; null for the root.
     XMLParserDelegate_RecursiveMuxml* ParentDelegate = nullptr;
-    XMLParserDelegate_RecursiveMuxml* RootDelegate = nullptr;
+    XMLParserDelegate_RecursiveMuxml* RootDelegate = nullptr;  ///< itself, of the root
+    /// The one that has the parser now or handed it on; null at the lowest.
     std::unique_ptr<XMLParserDelegate_RecursiveMuxml> ChildDelegate;
     /// The element whose end ends this delegate.
     std::string MyRecursiveTreeStartsAtElementName;
     // Of the root only:
-    std::unique_ptr<MusicXmlContext> musicXmlContext;
-    std::unique_ptr<XmlDocument> wholeDocumentXML;
-    XmlNode partListXML;
+    std::unique_ptr<MusicXmlContext> musicXmlContext;  ///< the state that all delegates share
+    std::unique_ptr<XmlDocument> wholeDocumentXML;     ///< the file as a tree, for looking ahead
+    XmlNode partListXML;                               ///< the first `part-list`; empty without one
     /// The element that is open now, "" when there is none, and its attributes.
     std::string currentElementName;
-    CMuxmlAttributes currentAttributes;
+    CMuxmlAttributes currentAttributes;  ///< those of that element
 
     /// Makes a delegate of the class for an element that starts, and makes it the parser's.
     /// `createAndSetAsDelegateForParser:elementName:namespaceURI:qualifiedName:attributes:`
@@ -96,21 +102,27 @@ public:
     [[nodiscard]] std::int32_t getScorePartCountFromXMLDocument() const;
 
 protected:
+    /// Text of the element that is open, or "" at its start. This class hands it to the parent.
     virtual void foundTrimmedCharacters(XmlStreamParser& parser, std::string_view text);
 
     /// Gives the parser back to the parent, which destroys this delegate: nothing may touch it
     /// afterwards.
     void setParserDelegateToParentDelegateAndReleaseSelf(std::string_view name,
                                                          XmlStreamParser& parser);
+    /// Forgets the element that ends, and takes it from the open ones if it is the last of them.
     void didEndElement_resetCurrentElementNameAndRemoveFromCurrentElementParentNames(
         std::string_view name);
 
     /// Stores name and attributes of an element that starts.
     void EnterElement(std::string_view name, const XmlAttributes& attributes);
+    /// The current element becomes one of the open ones.
     void PushCurrentElementName() { currentElementParentNames.push_back(currentElementName); }
+    /// Whether an open element of this delegate has the name.
     [[nodiscard]] bool IsInside(std::string_view name) const;
 
+    /// The state of the import, the root's.
     [[nodiscard]] MusicXmlContext& Context() const { return *RootDelegate->musicXmlContext; }
+    /// What is looked up in the tree, the root's.
     [[nodiscard]] muxml::CScoreIndex& Index() const { return *RootDelegate->mIndex; }
 
     /// Whether the host has the method.

@@ -10,8 +10,8 @@ namespace brindle {
 /// Reads a `note` and makes of it a note in time. A delegate reads one note.
 class XMLParserDelegate_RecursiveMuxml_Note final : public XMLParserDelegate_RecursiveMuxml_Child {
 public:
-    CMuxmlNote EncounteredNote;
-    std::string InstrumentName;
+    CMuxmlNote EncounteredNote;  ///< the note; moved away when its element has ended
+    std::string InstrumentName;  ///< the text of `instrument`; nothing looks at it
 
     void didStartMyElement(XmlStreamParser& parser, std::string_view name,
                            const XmlAttributes& attributes) override;
@@ -25,14 +25,15 @@ public:
 
     /// The elements of that name below the note; looked for once.
     void FindNotations();
-    void FindNotehead();
-    void FindNoteheadText();
-    void FoundTie();
+    void FindNotehead();      ///< the first `notehead`, likewise
+    void FindNoteheadText();  ///< the first `notehead-text`, likewise
+    void FoundTie();          ///< the `type` of the `tie` that is open, up to kMuxmlMaxTies
     /// The side of the ratio of a tuplet that is open now; null outside a tuplet.
     [[nodiscard]] CMuxmlTupletPortion* OpenTupletPortion();
 
 protected:
     void didEndMyElement() override { encounteredNote(); }
+    /// Looks the element up in its table; what no row knows goes to the measure.
     void foundTrimmedCharacters(XmlStreamParser& parser, std::string_view text) override;
 
 private:

@@ -12,22 +12,26 @@ namespace brindle {
 /// Reads a `part` and hands its measures to their delegates.
 class XMLParserDelegate_RecursiveMuxml_Part final : public XMLParserDelegate_RecursiveMuxml_Child {
 public:
-    std::string CurrentPartID;
-    // Instruments by the identifier of their part. Nothing fills them.
+    std::string CurrentPartID;  ///< the attribute `id` of the part, "P1"
+    /// By the identifier of their part. Nothing fills them.
     std::multimap<std::string, CMuxmlScoreInstrument> ScoreInstruments;
-    std::multimap<std::string, CMuxmlScoreInstrument> MidiInstruments;
+    std::multimap<std::string, CMuxmlScoreInstrument> MidiInstruments;  ///< likewise
 
     void didStartMyElement(XmlStreamParser& parser, std::string_view name,
                            const XmlAttributes& attributes) override;
     void didStartElement(XmlStreamParser& parser, std::string_view name,
                          const XmlAttributes& attributes) override;
 
+    /// Begins the part anew at position 0, and tells the host its time signature if its first
+    /// measure has none, then its names and instruments.
     void encounteredPartStart(const XmlAttributes& attributes);
+    /// Tells the host the notes whose ties are open, and what was learned about the part.
     void encounteredPartEnd();
 
 protected:
     void didEndMyElement() override { encounteredPartEnd(); }
     void didEndInnerElement(std::string_view name) override;
+    /// Keeps the text to itself.
     void foundTrimmedCharacters(XmlStreamParser&, std::string_view) override {}
 
 private:

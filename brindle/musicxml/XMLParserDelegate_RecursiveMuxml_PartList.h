@@ -9,6 +9,7 @@ namespace brindle {
 /// tree when a part starts.
 class XMLParserDelegate_RecursiveMuxml_PartList final : public XMLParserDelegate_RecursiveMuxml {
 protected:
+    /// Drops the text.
     void foundTrimmedCharacters(XmlStreamParser&, std::string_view) override {}
 };
 

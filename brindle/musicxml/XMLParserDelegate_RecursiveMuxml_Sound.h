@@ -11,6 +11,7 @@ public:
     void didStartMyElement(XmlStreamParser& parser, std::string_view name,
                            const XmlAttributes& attributes) override;
 
+    /// Tells the host a tempo, quarters a minute, at the current position.
     void encounteredTempoChange(float tempo);
 };
 
