@@ -13,7 +13,7 @@ namespace brindle {
 
 /// What is to be found in a song.
 struct CAnalyseSongOptions {
-    TAnalyse mRoute = TAnalyse_TonicProgressions;
+    TAnalyse mRoute = TAnalyse_TonicProgressions;  ///< how centers are looked for
     /// Instead of the keys that the song states; empty for those.
     CHarmAnlsSignKeys mSignKeys;
     /// All readings that progressions to a tonic allow.
@@ -28,8 +28,9 @@ struct CSongAnalysis {
     CHarmonicAnalyse mAnalyse;
     /// Empty if they were not asked for.
     CHarmAnlsCenters mReadings;
+    /// Empty if they were not asked for.
     std::vector<CCopiedPassage> mCopies;
-    CKeyOfSong mKeys;
+    CKeyOfSong mKeys;  ///< the key of the song and its local keys
     /// Of each chord in the key of its region; empty for one that has none.
     std::vector<std::string> mNumerals;
 };

@@ -16,7 +16,7 @@ struct CRelativeChord {
     /// Semitones from the tonic of the chord before, of the first chord from that of the song, up
     /// to the tonic of this one: 0 to 11.
     std::uint8_t mShift = 0;
-    bool mIsMinorKey = false;
+    bool mIsMinorKey = false;  ///< of the key that the chord is in
     /// Semitones from the tonic up to the root, 0 to 11.
     std::uint8_t mRoot = 0;
     /// Semitones from the root up to the bass, 1 to 11; 0 for none of its own.
@@ -36,7 +36,7 @@ struct CRelativeChord {
 [[nodiscard]] CRelativeChord RelativeChordOf(const CChordLite& chord, const CSignKeyLite& key,
                                              int tonicBefore);
 
-/// The chord in the key on the tonic, spelled as it is written there: bVI in C is Ab, #ivo is F#o.
+/// The chord in the key on the tonic, spelled as it is written there: bVI in C is Ab, `#ivo` F#o.
 [[nodiscard]] CChordLite ChordInKey(const CRelativeChord& chord, const CSignKeyLite& key);
 
 /// The key `semitones` above the tonic of `home`, spelled as a degree of it, or with fewer signs if

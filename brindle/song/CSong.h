@@ -18,18 +18,19 @@ namespace brindle {
 
 /// A time signature. Undefined where a song does not tell one.
 struct CSongTime {
-    std::int32_t mNumerator = 0;
-    std::int32_t mDenominator = 0;
+    std::int32_t mNumerator = 0;    ///< beats in a bar
+    std::int32_t mDenominator = 0;  ///< 4 where a quarter is the beat
 
+    /// Whether one of the numbers is not above 0.
     [[nodiscard]] bool IsUndef() const { return mNumerator <= 0 || mDenominator <= 0; }
     friend bool operator==(const CSongTime&, const CSongTime&) = default;
 };
 
 /// A sign that jumps lead to.
 enum TSongSign : std::uint8_t {
-    TSongSign_None,
-    TSongSign_Segno,
-    TSongSign_Coda,
+    TSongSign_None,   ///< no sign
+    TSongSign_Segno,  ///< where D.S. goes on
+    TSongSign_Coda,   ///< where what is behind "To Coda" goes on
 };
 
 /// A bar as it is played. A bar that is played twice stands twice.
@@ -38,10 +39,10 @@ struct CSongBar {
 
     /// As printed, "12" or "12a"; of a typed song, the number of the written bar.
     std::string mNumber;
-    double mPosition = 0.0;
+    double mPosition = 0.0;  ///< of its bar line, in beats
     /// An upbeat is as long as it is written.
     double mLength = 0.0;
-    CSongTime mTime;
+    CSongTime mTime;  ///< that holds in it
     /// The bar of the written song that this is, from 0; `kNotWritten` if the source does not tell.
     std::size_t mWritten = kNotWritten;
     /// What stands where the bar begins, and what at its end: "To Coda", "Fine", "D.C. al Fine".
@@ -53,16 +54,17 @@ struct CSongBar {
 
 /// A part of a song that begins here: a rehearsal mark, a verse, a chorus. It may have no name.
 struct CSongSection {
-    std::string mName;
-    double mPosition = 0.0;
+    std::string mName;       ///< "A", "Chorus"
+    double mPosition = 0.0;  ///< in beats
 
     friend bool operator==(const CSongSection&, const CSongSection&) = default;
 };
 
 /// A written passage that is played again, as a repeat or a jump tells.
 struct CSongRepeat {
-    /// Where the second playing begins, and where the first did.
+    /// Where the second playing begins.
     double mPosition = 0.0;
+    /// Where the first playing began.
     double mSourcePosition = 0.0;
     /// From both places on so many bars are the same.
     std::size_t mBarCount = 0;
@@ -72,8 +74,8 @@ struct CSongRepeat {
 
 /// What a song tells beside its chords, such as `{"album", "Kind of Blue"}`.
 struct CSongRemark {
-    std::string mName;
-    std::string mText;
+    std::string mName;  ///< as the source calls it, "album"
+    std::string mText;  ///< what it says there
 
     friend bool operator==(const CSongRemark&, const CSongRemark&) = default;
 };
@@ -87,10 +89,10 @@ using CSongFault = CTextFault;
 /// what the song itself counts in a text. Texts are UTF-8 and as the source has them; empty is what
 /// it does not tell.
 struct CSong {
-    std::string mTitle;
+    std::string mTitle;  ///< of the song itself, not of its file
     /// Who made it: composers, artists, writers of the words, separated by ", ".
     std::string mMakers;
-    std::string mStyle;
+    std::string mStyle;  ///< as the source calls it, "Medium Swing"
     /// As played, with the end marker; empty for a song without chords. Where no chord sounds
     /// stands "No Chord Yield" or an undefined chord.
     CHarmAnlsChords mChords;
@@ -101,7 +103,7 @@ struct CSong {
     std::vector<TSeventhSpelling> mSevenths;
     /// Empty for a text without bar lines.
     std::vector<CSongBar> mBars;
-    std::vector<CSongSection> mSections;
+    std::vector<CSongSection> mSections;  ///< as played, by position
     /// The first key of the song, if it tells root and type.
     std::optional<CSignKeyLite> mStatedKey;
     /// All stated keys where they begin to hold; their types may be undefined.
@@ -110,12 +112,12 @@ struct CSong {
     std::optional<double> mTempo;
     /// Length of a bar by the first time signature, else that of the preferences or of most bars.
     double mBeatsPerBar = 4.0;
-    /// Frets of a capo, and semitones by which the song asks to be transposed. Both are only told:
-    /// the chords are those that are written.
+    /// The fret of a capodaster, 0 for none. It is only told: the chords are those that are
+    /// written.
     int mCapo = 0;
-    int mTranspose = 0;
-    std::vector<CSongRepeat> mRepeats;
-    std::vector<CSongRemark> mRemarks;
+    int mTranspose = 0;  ///< semitones that the song asks for, negative down; only told, too
+    std::vector<CSongRepeat> mRepeats;  ///< by the places where they are played
+    std::vector<CSongRemark> mRemarks;  ///< in the order of the source
     /// What it was read as; never TSongFormat_Auto.
     TSongFormat mFormat = TSongFormat_ChordText;
     /// By their places; empty if all is understood.

@@ -23,8 +23,9 @@ enum TBarPlace : std::uint8_t {
     TBarPlace_Middle,
     TBarPlace_Weak,
 };
-inline constexpr std::size_t kBarPlaceCount = 6;
+inline constexpr std::size_t kBarPlaceCount = 6;  ///< as many as TBarPlace has
 
+/// Of a tick from the first bar line, kTicksPerBar to the bar; negative in an upbeat.
 [[nodiscard]] TBarPlace BarPlaceOf(std::int32_t tick);
 
 /// Which lengths followed at a place of the bar, and how often; in ticks.
@@ -41,24 +42,31 @@ using CLengthCounts = std::vector<std::pair<std::int32_t, std::uint32_t>>;
 /// two chords was heard.
 class CSongModel {
 public:
+    /// Chords that a prediction looks back at most.
     static constexpr std::size_t kLongestHistory = 5;
 
+    /// A model that has heard nothing.
     CSongModel() = default;
+    /// A model of these songs; those without chords are left out.
     explicit CSongModel(std::vector<CTaughtSong> songs);
 
+    /// The songs that it was made of, by which places name them.
     [[nodiscard]] const std::vector<CTaughtSong>& Songs() const { return mSongs; }
-    [[nodiscard]] bool IsEmpty() const { return mSongs.empty(); }
+    [[nodiscard]] bool IsEmpty() const { return mSongs.empty(); }  ///< no song with chords
     /// All chords, those of all songs together.
     [[nodiscard]] std::size_t ChordCount() const { return mPlaces.size() - mSongs.size(); }
 
     // Chords have numbers, 0 to VocabularySize() - 1.
 
+    /// Different chords.
     [[nodiscard]] std::size_t VocabularySize() const { return mVocabulary.size(); }
+    /// The chord of a number, which must be one.
     [[nodiscard]] const CRelativeChord& Chord(std::int32_t id) const {
         return mVocabulary[static_cast<std::size_t>(id)];
     }
     /// -1 for a chord that was never heard.
     [[nodiscard]] std::int32_t IdOf(const CRelativeChord& chord) const;
+    /// How often the chord stands in the songs.
     [[nodiscard]] std::uint32_t CountOf(std::int32_t id) const;
     /// How often the chord was the last of a part.
     [[nodiscard]] std::uint32_t EndCountOf(std::int32_t id) const;
@@ -78,25 +86,28 @@ public:
 
     /// How often each chord came behind a chord; the chords in ascending order.
     struct CSuccessor {
-        std::int32_t mId;
-        std::uint32_t mCount;
-        std::array<std::uint32_t, kBarPlaceCount> mCountsAt;
+        std::int32_t mId;                                     ///< of the second chord
+        std::uint32_t mCount;                                 ///< how often it came
+        std::array<std::uint32_t, kBarPlaceCount> mCountsAt;  ///< the same by its TBarPlace
     };
+    /// What followed a chord or a StartId, by number.
     [[nodiscard]] std::span<const CSuccessor> SuccessorsOf(std::int32_t id) const;
 
     /// Of chords that begin at a tick of the bar behind one of such a length, in songs with as many
     /// beats in a bar. `lengthBefore` 0 is any.
     [[nodiscard]] const CLengthCounts& LengthsAt(int beatsPerBar, std::int32_t tickInBar,
                                                  std::int32_t lengthBefore) const;
+    /// Whether a song has as many beats in a bar.
     [[nodiscard]] bool KnowsMetre(int beatsPerBar) const;
 
     /// A place in the songs: a chord, or, with an `mId` below 0, what stands before a song.
     struct CPlace {
-        std::int32_t mId;
-        std::int32_t mLength;
-        std::int32_t mSong;
-        TBarPlace mBarPlace;
+        std::int32_t mId;      ///< a number or a StartId
+        std::int32_t mLength;  ///< in ticks; 0 before a song
+        std::int32_t mSong;    ///< an index of Songs()
+        TBarPlace mBarPlace;   ///< where the chord begins
     };
+    /// All songs, one behind the other.
     [[nodiscard]] std::span<const CPlace> Places() const { return mPlaces; }
     /// The places of a chord in ascending order.
     [[nodiscard]] std::span<const std::uint32_t> PlacesOf(std::int32_t id) const;

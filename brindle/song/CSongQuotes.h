@@ -14,16 +14,18 @@ namespace brindle {
 struct CSongQuote {
     /// An index of CSongModel::Songs(); -1 for no quote.
     std::int32_t mSong = -1;
-    /// Where it begins there and in what was written, in ticks.
+    /// Where it begins there, in ticks from the first bar line.
     std::int32_t mSourceTick = 0;
+    /// Where it begins in what was written, in ticks from its first chord.
     std::int32_t mTick = 0;
+    /// In ticks; 0 for no quote.
     std::int32_t mLength = 0;
 };
 
 /// A chord of what is written.
 struct CQuotedChord {
-    std::int32_t mId = -1;
-    std::int32_t mLength = 0;
+    std::int32_t mId = -1;     ///< its number in the model; -1 for one that it has not heard
+    std::int32_t mLength = 0;  ///< in ticks
 };
 
 /// Follows a row of chords through all songs at once: which places of the songs its end is like,
@@ -33,6 +35,7 @@ public:
     /// The model must outlive it.
     explicit CSongQuotes(const CSongModel& model) : mModel(&model) {}
 
+    /// Goes on by one chord.
     void Add(const CQuotedChord& chord);
     /// The longest run, in ticks, that stands in one song and ends with `chord` if it is added now.
     [[nodiscard]] std::int32_t LengthWith(const CQuotedChord& chord) const;

@@ -15,10 +15,10 @@ inline constexpr std::int32_t kTicksPerBar = 24;
 
 /// A chord of a song with its place in the bars.
 struct CTaughtChord {
-    CRelativeChord mChord;
+    CRelativeChord mChord;  ///< in the key of its passage
     /// In ticks from the first bar line; an upbeat is before it.
     std::int32_t mBegin = 0;
-    std::int32_t mLength = 0;
+    std::int32_t mLength = 0;  ///< in ticks
     /// The last chord of a part of the song, or of the song.
     bool mEndsSection = false;
 
@@ -28,12 +28,12 @@ struct CTaughtChord {
 /// A song as a model learns it: relative to its keys, in ticks of its bars, equal neighbours as one
 /// chord.
 struct CTaughtSong {
-    std::string mTitle;
-    std::string mStyle;
+    std::string mTitle;  ///< may be empty
+    std::string mStyle;  ///< as its source calls it; may be empty
     /// That it was written in.
     CSignKeyLite mKey;
-    double mBeatsPerBar = 4.0;
-    std::vector<CTaughtChord> mChords;
+    double mBeatsPerBar = 4.0;          ///< of the song; ticks count bars of any length
+    std::vector<CTaughtChord> mChords;  ///< by time
 
     friend bool operator==(const CTaughtSong&, const CTaughtSong&) = default;
 };

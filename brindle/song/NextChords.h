@@ -17,20 +17,22 @@ struct CNextChord {
     CChordLite mChord;
     /// Of all chords that may come, 0 to 1.
     double mProbability = 0.0;
-    /// What it is behind the chords before, "V7/ii", and what it does there.
+    /// What it is behind the chords before, "V7/ii".
     std::string mNumeral;
-    THarmFunction mFunction = THarmFunction_Undef;
+    THarmFunction mFunction = THarmFunction_Undef;  ///< what it does there
 };
 
+/// What is asked of NextChords.
 struct CNextChordOptions {
     /// The key that the chords are in; undefined to find it.
     CSignKeyLite mKey;
-    std::size_t mCount = 10;
+    std::size_t mCount = 10;  ///< most chords that are wanted
     /// Where the next chord begins.
     TBarPlace mPlace = TBarPlace_Bar1;
-    std::size_t mOrder = CSongModel::kLongestHistory;
+    std::size_t mOrder = CSongModel::kLongestHistory;  ///< chords before that are looked at
 };
 
+/// What may come, and the key in which that is said.
 struct CNextChords {
     /// That of the chords; undefined without a chord and a key.
     CSignKeyLite mKey;

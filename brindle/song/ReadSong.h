@@ -12,10 +12,10 @@ namespace brindle {
 
 /// How a song is read.
 struct CSongOptions {
-    TSongFormat mFormat = TSongFormat_Auto;
-    /// Length of a bar, and how far a chord or a hold moves on, in a text that does not tell. Beats
-    /// above 0.
+    TSongFormat mFormat = TSongFormat_Auto;  ///< to be found out, or the only form that is tried
+    /// Length of a bar in a text that does not tell; beats above 0.
     double mBeatsPerBar = 4.0;
+    /// How far a chord or a hold moves on in such a text; beats above 0.
     double mBeatsPerChord = 1.0;
     /// The chords of a bar that has no holds share it evenly, in texts of any form; a text without
     /// bar lines has no bars. Charts are always read so.
@@ -42,6 +42,7 @@ struct CSongOptions {
 /// The same for a file; that it is missing, unreadable or larger than 256 MiB is a fault. A song
 /// without a title has none: the name of the file is not one.
 [[nodiscard]] CSong ReadSongFile(const std::string& path, const CSongOptions& prefs = {});
+/// All songs of a file.
 [[nodiscard]] std::vector<CSong> ReadSongsFile(const std::string& path,
                                                const CSongOptions& prefs = {});
 

@@ -11,7 +11,7 @@ namespace brindle {
 
 /// How well chords are foretold.
 struct CSongScore {
-    std::size_t mChords = 0;
+    std::size_t mChords = 0;  ///< that were foretold
     /// Sum over the chords; the key of a song counts log2 24 once, where chords are told by it.
     double mBits = 0.0;
 

@@ -22,7 +22,7 @@ struct CSongFingeringOptions {
 
 /// A song as it lies under the hand.
 struct CSongFingerings {
-    int mCapo = 0;
+    int mCapo = 0;  ///< the fret of the capodaster, 0 for none
     /// Of each chord; without strings where there is no chord, and for a chord that cannot be held.
     std::vector<CFingering> mFingerings;
     /// Chords that cannot be held.

@@ -10,7 +10,7 @@ namespace brindle {
 
 /// What a song model file holds, or what is wrong with it.
 struct CSongModelReading {
-    CSongModel mModel;
+    CSongModel mModel;  ///< empty if the file is at fault
     /// Empty if the file was read.
     std::string mFault;
 };

@@ -10,9 +10,9 @@ struct TMusicXMLDoc;
 
 /// The chords of a score as a chord text, and with which lengths `analyse` reads it back.
 struct CChordText {
-    std::string mText;
-    double mBeatsPerBar = 4.0;
-    double mBeatsPerChord = 1.0;
+    std::string mText;            ///< bars between |, holds as dots
+    double mBeatsPerBar = 4.0;    ///< quarter notes in each bar of the text
+    double mBeatsPerChord = 1.0;  ///< quarter notes that a chord or a dot takes
 };
 
 /// Writes four bars a line. An upbeat is filled up to a bar in front. A bar line stands only where

@@ -14,7 +14,7 @@ namespace brindle {
 
 /// What song is to be written.
 struct CWriteSongOptions {
-    CSignKeyLite mKey{{0, TEnh_n}, TSignKeyType_Major};
+    CSignKeyLite mKey{{0, TEnh_n}, TSignKeyType_Major};  ///< of the song; its parts may leave it
     /// One letter for each part, "AABA": parts of one letter are the same up to their endings.
     /// Empty for a song of one part.
     std::string mForm;
@@ -22,7 +22,7 @@ struct CWriteSongOptions {
     std::size_t mBars = 32;
     /// 1 to 24.
     int mBeatsPerBar = 4;
-    std::vector<CSongWish> mWishes;
+    std::vector<CSongWish> mWishes;  ///< all of them are met, or there is no song
     /// The longest passage that may stand just so in a song of the model; 0 for any.
     double mMostQuotedBars = 4.0;
     /// Chords of history that are asked for, 1 to CSongModel::kLongestHistory.
@@ -37,10 +37,11 @@ struct CWriteSongOptions {
 struct CWrittenQuote {
     /// Of the song it stands in; empty for a song without a title.
     std::string mTitle;
-    /// In bars, also of a bar: where it stands there and here, from 1, and how long it is. A length
-    /// of 0 is no quote.
+    /// Where it stands there, in bars from 1, also within a bar.
     double mSourceBar = 0.0;
+    /// Where it stands in the written song, likewise.
     double mBar = 0.0;
+    /// How many bars it has, also parts of one; 0 for no quote.
     double mBars = 0.0;
 };
 
@@ -49,7 +50,7 @@ struct CWrittenSong {
     /// With its parts, and with the parts that repeat the one before them. Without chords if there
     /// is a fault.
     CSong mSong;
-    CWrittenQuote mLongestQuote;
+    CWrittenQuote mLongestQuote;  ///< of all that stand in it
     /// A smallest set of wishes that cannot be met together, as they were typed.
     std::vector<std::string> mContradiction;
     /// Empty if the song was written.
