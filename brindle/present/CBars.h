@@ -15,9 +15,12 @@ namespace brindle {
 /// are all as long as the first, or begin where a score tells.
 class CBars {
 public:
+    /// `starts`, ascending, are where the bars of a score begin; without them all bars have
+    /// `beatsPerBar`, which is above 0.
     explicit CBars(double beatsPerBar, std::vector<double> starts = {})
         : mBeatsPerBar(beatsPerBar), mStarts(std::move(starts)) {}
 
+    /// The number of the bar, from 1; 0 and less before the first one.
     [[nodiscard]] long BarOf(double position) const {
         if (!mStarts.empty()) return StartsUpTo(position);
         return std::lround(std::floor(position / mBeatsPerBar)) + 1;

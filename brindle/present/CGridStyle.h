@@ -14,7 +14,7 @@ enum class TGridDots : std::uint8_t {
 
 /// How chord grids are drawn.
 struct CGridStyle {
-    TGridDots mDots = TGridDots::Fingers;
+    TGridDots mDots = TGridDots::Fingers;  ///< what is written on them, where there is room
     /// The lowest string stands on the right.
     bool mLeftHanded = false;
 };

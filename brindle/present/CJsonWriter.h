@@ -23,14 +23,22 @@ namespace brindle {
 /// has been written is final, so that a megabyte of output needs a megabyte.
 class CJsonWriter {
 public:
+    /// An object as the next value.
     CJsonWriter& BeginObject() { return Begin('{'); }
+    /// The innermost open value, an object, is complete.
     CJsonWriter& EndObject() { return End('}'); }
+    /// A list as the next value.
     CJsonWriter& BeginArray() { return Begin('['); }
+    /// The innermost open value, a list, is complete.
     CJsonWriter& EndArray() { return End(']'); }
+    /// The name of the next value of an object, escaped as a text is.
     CJsonWriter& Key(std::string_view name);
 
+    /// What is undefined.
     CJsonWriter& Null() { return Scalar("null"); }
+    /// true or false
     CJsonWriter& Bool(bool value) { return Scalar(value ? "true" : "false"); }
+    /// All digits, which readers with floating numbers round beyond 2^53.
     CJsonWriter& Integer(std::int64_t value);
     /// The shortest form that reads back as the same number, "1.0" for a whole one. Null for an
     /// infinite number, for no number and for an undefined position.

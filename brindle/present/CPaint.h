@@ -10,10 +10,14 @@ namespace brindle {
 /// at all.
 class CPaint {
 public:
+    /// Without colours all texts stay as they are.
     explicit CPaint(bool colored) : mColored(colored) {}
 
+    /// Bold.
     [[nodiscard]] std::string Strong(std::string_view text) const;
+    /// Cyan.
     [[nodiscard]] std::string Accent(std::string_view text) const;
+    /// Dim, for what is beside the matter.
     [[nodiscard]] std::string Faint(std::string_view text) const;
 
 private:

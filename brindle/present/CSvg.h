@@ -17,9 +17,9 @@ namespace brindle {
 
 /// How a text is written into a picture.
 struct CSvgFont {
-    double mSize = 12.0;
-    std::string_view mColor = "#222222";
-    bool mBold = false;
+    double mSize = 12.0;                  ///< height of the letters in pixels
+    std::string_view mColor = "#222222";  ///< as in CSS; not owned
+    bool mBold = false;                   ///< thick letters
     /// "middle" or "end": where the text has its x; its start otherwise.
     std::string_view mAnchor = {};
 };
@@ -30,10 +30,14 @@ struct CSvgFont {
 /// A picture that is put together from rectangles, lines and texts. Sizes are in pixels.
 class CSvg {
 public:
+    /// Rounded a little; `tooltip` is shown where the pointer rests, empty for none.
     void Rect(double x, double y, double width, double height, std::string_view fill,
               std::string_view tooltip = {});
+    /// One pixel wide.
     void Line(double x1, double y1, double x2, double y2, std::string_view color);
+    /// Filled, with a line of one pixel around it.
     void Circle(double x, double y, double radius, std::string_view fill, std::string_view line);
+    /// `y` is the line that the letters stand on.
     void Text(double x, double y, std::string_view text, const CSvgFont& font);
     /// Writes as much of the text as fits into the width.
     void TextCut(double x, double y, double width, std::string_view text, const CSvgFont& font);

@@ -13,13 +13,16 @@ namespace brindle {
 /// blank is not shown.
 class CTable {
 public:
+    /// The names of the columns, none of them empty.
     explicit CTable(std::vector<std::string> columns);
 
     /// One cell for each column.
     void AddRow(std::vector<std::string> cells);
 
+    /// The line of the names, without an end of line.
     [[nodiscard]] std::string Head() const;
-    [[nodiscard]] std::size_t RowCount() const { return mRows.size(); }
+    [[nodiscard]] std::size_t RowCount() const { return mRows.size(); }  ///< without the head
+    /// The line of a row from 0, without an end of line.
     [[nodiscard]] std::string Row(std::size_t row) const;
     /// All lines behind a margin, the head faint.
     [[nodiscard]] std::string Text(const CPaint& paint, std::string_view margin = {}) const;

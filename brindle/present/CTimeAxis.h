@@ -10,17 +10,17 @@ namespace brindle {
 
 /// A piece of a range that lies on one line of a picture, in pixels from the left of the line.
 struct CTimeSegment {
-    std::size_t mLine = 0;
-    double mLeft = 0.0;
-    double mRight = 0.0;
+    std::size_t mLine = 0;  ///< from 0
+    double mLeft = 0.0;     ///< where it begins
+    double mRight = 0.0;    ///< where it ends
 
-    [[nodiscard]] double Width() const { return mRight - mLeft; }
+    [[nodiscard]] double Width() const { return mRight - mLeft; }  ///< in pixels
 };
 
 /// A bar line, and the number of the bar that begins there.
 struct CBarLine {
-    double mX = 0.0;
-    long mBar = 0;
+    double mX = 0.0;  ///< in pixels from the left of the line
+    long mBar = 0;    ///< as CBars counts
 };
 
 /// How the time of a song breaks into lines as text does, at bar lines where a bar fits into a
@@ -31,7 +31,7 @@ public:
     /// are chords.
     CTimeAxis(const CShownSong& song, double lineWidth, double widestChord);
 
-    [[nodiscard]] std::size_t LineCount() const { return mLineCount; }
+    [[nodiscard]] std::size_t LineCount() const { return mLineCount; }  ///< at least 1
     /// The pieces of a range from the first line to the last.
     [[nodiscard]] std::vector<CTimeSegment> SegmentsOf(const CTimeRange& range) const;
     /// The whole of a line that belongs to the song.

@@ -25,8 +25,9 @@ struct CChordGrid {
     std::string mName;
     /// Other names that are nearly as likely.
     std::vector<std::string> mOtherNames;
-    GChShortTuning mTuning{};
-    int mCapo = 0;
+    GChShortTuning mTuning{};  ///< of the open strings, from the lowest on
+    int mCapo = 0;             ///< the fret of a capodaster, 0 for none
+    /// The fretted strings, with their fingers where these are known.
     std::vector<GChChordElem> mElems;
     /// Of each string: -1 muted, 0 open, else the fret that sounds, counted from the capodaster.
     std::vector<int> mFrets;
@@ -45,9 +46,11 @@ struct CChordGrid {
 /// The frets that are drawn.
 struct CFretWindow {
     int mFirst = 0;  ///< 0: from the nut
-    int mCount = 4;
+    int mCount = 4;  ///< how many frets are drawn from that one on
 };
 
+/// From the nut if the highest fret allows it, else from the lowest fret that is held; as many as
+/// the fingering needs, but not less than four.
 [[nodiscard]] CFretWindow WindowOf(const CChordGrid& grid);
 
 /// The name, behind commas the other ones: "Am7, C6/A", and what is left out: "C13 (no 5, 11)".

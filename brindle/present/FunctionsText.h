@@ -14,12 +14,12 @@ class CSignKeyHeavy;
 
 /// The function of a chord in a key, as it is shown.
 struct CChordFunction {
-    std::string mSymbol;
-    int mFunction = -1;    // none
-    std::string mNumeral;  // empty without a function, as the letters
-    std::string mLetters;
-    int mRootDegree = -1;
-    int mBassDegree = -1;
+    std::string mSymbol;   ///< as somebody wrote it, made safe to show
+    int mFunction = -1;    ///< as CChordHeavy::HarmFuncIn tells it, 0 to 14; -1 for none
+    std::string mNumeral;  ///< "IIm"; empty without a function, as the letters
+    std::string mLetters;  ///< "Sp": tonic T, dominant D, subdominant S, parallel p
+    int mRootDegree = -1;  ///< of the key, from 0; -1 for none
+    int mBassDegree = -1;  ///< likewise, of the lowest note
 };
 
 /// `symbol` is the chord as somebody wrote it.

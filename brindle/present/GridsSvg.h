@@ -10,8 +10,9 @@
 
 namespace brindle {
 
-// Distances of a diagram in full size, in pixels.
+/// From string to string of a diagram in full size, in pixels.
 inline constexpr double kGridStringGap = 16.0;
+/// From fret to fret, likewise.
 inline constexpr double kGridFretGap = 20.0;
 
 /// Draws a diagram without its name into a picture. `left` is the string on the left, `top` the

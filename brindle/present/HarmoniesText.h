@@ -15,9 +15,10 @@ struct TMusicXMLDoc;
 /// The same as JSON, see docs/json.md.
 [[nodiscard]] std::string HarmoniesJson(const TMusicXMLDoc& sheet);
 
-/// The chords that the notes of a score make, as a table behind the key, and as JSON.
+/// The chords that the notes of a score make, as a table behind the key.
 [[nodiscard]] std::string ChordsFromNotesText(const CScoreNotes& score,
                                               const CChordsFromNotes& chords, const CPaint& paint);
+/// The same as JSON, see docs/json.md.
 [[nodiscard]] std::string ChordsFromNotesJson(const CChordsFromNotes& chords);
 
 }  // namespace brindle

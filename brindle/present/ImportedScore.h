@@ -22,56 +22,55 @@ struct CImportedEvent {
     std::optional<std::int32_t> mLength;  ///< in ticks; of notes, where it is known
     std::string mWhat;                    ///< "Bb4", "time 3/4"
     std::string mMarks;                   ///< "chord staccato"
-    bool mIsNote = false;
-    std::int64_t mNoteNr = -1;
-    int mVelocity = 0;
-    std::int32_t mVoice = 0;
-    std::int32_t mStaff = 0;
-    bool mIsUnpitched = false;
-    /// Of a note, what its instrument is played with: from 0, where the score tells it.
+    bool mIsNote = false;                 ///< otherwise it is something between notes
+    std::int64_t mNoteNr = -1;  ///< of a note as it sounds, 0 to 127; -1 where it has no pitch
+    int mVelocity = 0;          ///< of a note, 1 to 127
+    std::int32_t mVoice = 0;    ///< of a note; 0 where the score tells none
+    std::int32_t mStaff = 0;    ///< of a note, from 1; 0 where the score tells none
+    bool mIsUnpitched = false;  ///< a note of drums and their like
+    /// Of a note without pitch, the key that plays it, from 0, where the score tells it.
     std::optional<int> mMidiKey;
+    /// The channel of a note's instrument, from 0, where the score tells it.
     std::optional<int> mMidiChannel;
 };
 
 /// Where a measure begins, and its number as it is printed.
 struct CImportedMeasure {
-    std::int32_t mPosition = 0;
-    std::string mNumber;
+    std::int32_t mPosition = 0;  ///< in ticks
+    std::string mNumber;         ///< "12", "X1"; "-" for none
 };
 
 /// How MIDI plays an instrument of a part; all numbers from 0.
 struct CImportedInstrument {
-    std::optional<int> mProgram;
-    std::optional<int> mChannel;
+    std::optional<int> mProgram;       ///< the sound, 0 is a grand piano
+    std::optional<int> mChannel;       ///< 9 is that of drums
     std::optional<int> mUnpitchedKey;  ///< of all notes without a pitch
 };
 
 /// A part of a score: its name, how MIDI plays it, and all that happens in it, in the order of the
 /// file.
 struct CImportedPart {
-    std::string mID;
-    std::string mName;
+    std::string mID;              ///< as in the list of parts, "P1"
+    std::string mName;            ///< the best that CMuxmlPart has; may be empty
     std::optional<int> mProgram;  ///< from 0
     std::optional<int> mChannel;  ///< from 0
     /// By the identifiers that notes have.
     std::map<std::string, CImportedInstrument, std::less<>> mInstruments;
-    std::vector<CImportedEvent> mEvents;
-    std::vector<CImportedMeasure> mMeasures;
+    std::vector<CImportedEvent> mEvents;      ///< in the order of the file
+    std::vector<CImportedMeasure> mMeasures;  ///< likewise
     /// Notes whose ties never end: they are none of the events, and sound as long as is written.
     std::vector<CImportedEvent> mNotesLeftOpen;
-    std::int32_t mEnd = 0;
+    std::int32_t mEnd = 0;  ///< in ticks, the end of its last bar
 };
 
 /// What an import told, kept for the eye and the ear.
 struct CImportedScore {
-    std::vector<CImportedPart> mParts;
-    std::vector<CMidiTempo> mTempos;
-    // Of the first part:
-    std::vector<CMidiTimeSignature> mTimeSignatures;
-    std::vector<CMidiKeySignature> mKeySignatures;
-    // While the score is filled:
-    bool mIsInPart = false;
-    std::vector<CImportedEvent> mEventsBeforePart;
+    std::vector<CImportedPart> mParts;                ///< in the order of the file
+    std::vector<CMidiTempo> mTempos;                  ///< of all parts, as they come
+    std::vector<CMidiTimeSignature> mTimeSignatures;  ///< of the first part
+    std::vector<CMidiKeySignature> mKeySignatures;    ///< of the first part, as they sound
+    bool mIsInPart = false;                           ///< while the score is filled
+    std::vector<CImportedEvent> mEventsBeforePart;  ///< likewise; they go to the part that follows
 };
 
 /// A host that fills the score, which must live as long.

@@ -20,7 +20,9 @@ using Json = nlohmann::ordered_json;
 
 /// Key number, spelling and name; null for the undefined key.
 void WriteKeyEnh(CJsonWriter& json, const CKeyEnh& keyEnh);
+/// The same as a value.
 [[nodiscard]] Json KeyEnhToJson(const CKeyEnh& keyEnh);
+/// A list of such values.
 [[nodiscard]] Json KeyEnhsToJson(const std::vector<CKeyEnh>& keys);
 
 /// Name, root and type; null for the undefined key.
@@ -28,6 +30,7 @@ void WriteSignKey(CJsonWriter& json, const CSignKeyLite& key);
 
 /// The semitones of a mask in ascending order.
 void WriteIntervals(CJsonWriter& json, CSemitones semitones);
+/// The same as a value.
 [[nodiscard]] Json IntervalsToJson(CSemitones semitones);
 
 /// A position, a length or a probability; null when it is undefined.

@@ -21,11 +21,12 @@ enum TShade : int {
     Shade_NightSheetName = 78,
 };
 
-// The color of a key: neighbours on the circle of fifths have neighbouring colors, and minor keys
-// are darker. Without a key it is gray.
-
+/// The color of a key as "#rrggbb": neighbours on the circle of fifths have neighbouring colors,
+/// and minor keys are darker. Without a key it is gray.
 [[nodiscard]] std::string ColorOf(const CKeyEnh& root, bool isMinor, TShade shade);
+/// The same for a key.
 [[nodiscard]] std::string ColorOf(const CSignKeyLite& key, TShade shade);
+/// The same for a center, which is minor with a minor third and no major one.
 [[nodiscard]] std::string ColorOf(const CHarmCenterLite& center, TShade shade);
 
 }  // namespace brindle

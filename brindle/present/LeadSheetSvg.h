@@ -17,6 +17,7 @@ enum TSheetTheme : std::uint8_t {
     TSheetTheme_Dark,
 };
 
+/// What a lead sheet is drawn on.
 enum TSheetPage : std::uint8_t {
     TSheetPage_Endless,  ///< one page, as high as the song
     TSheetPage_A4,       ///< 210 by 297 mm
@@ -41,7 +42,7 @@ struct CLeadSheetOptions {
 ///
 /// A passage that repeats the one directly before it stands once between repeat signs, with its
 /// endings; one that is played again by a jump is written out and says which bars it is. A long
-/// rest is one bar with a number. Pages stand below each other, each an <svg> of its own; a song
+/// rest is one bar with a number. Pages stand below each other, each an `<svg>` of its own; a song
 /// is set smaller if that lets it fit: by an eighth for one page, by a third at most for two.
 /// `reading` is that of the chords of the song; what it lacks is left out. Values of options beyond
 /// their ranges count as the nearer end. Linear in the length of the song.

@@ -16,11 +16,14 @@ namespace brindle {
 /// have them. A bass is spelled from its root, as in D/F#. Without a key chords stay as they are.
 class CMarkovSpelling {
 public:
+    /// Spells in the key that FindKeys finds for the sequence.
     explicit CMarkovSpelling(MarkovSequenceView sequence);
+    /// Spells in a key; an undefined one changes nothing.
     explicit CMarkovSpelling(const CSignKeyLite& key) : mKey(key) {}
 
     /// Undefined for a sequence without chords.
     [[nodiscard]] const CSignKeyLite& Key() const { return mKey; }
+    /// The same keys with the spelling of this one.
     [[nodiscard]] CChordLite Spelled(const CChordLite& chord) const;
     /// A chord as people type it, "U" for a gap, "start" and "end", "#3" for an indexed symbol.
     [[nodiscard]] std::string SymbolOf(const CMarkovObject& object) const;

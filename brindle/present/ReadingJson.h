@@ -12,8 +12,8 @@ namespace brindle {
 
 /// A song with what is known about its chords, to be written. All must outlive this.
 struct CReadSong {
-    const CSong& mSong;
-    const CSongReading& mReading;
+    const CSong& mSong;            ///< not owned
+    const CSongReading& mReading;  ///< of its chords, one entry each
     /// A sentence for each chord; empty to leave them out.
     std::span<const std::string> mExplanations = {};
 };

@@ -18,106 +18,108 @@ namespace brindle {
 
 /// A range of time in beats.
 struct CTimeRange {
-    double mBegin = 0.0;
-    double mEnd = 0.0;
+    double mBegin = 0.0;  ///< inside the range
+    double mEnd = 0.0;    ///< not inside
 
+    /// It ends where it begins, or before.
     [[nodiscard]] bool IsEmpty() const { return !(mBegin < mEnd); }
 };
 
 /// A chord as it is shown.
 struct CShownChord {
-    CTimeRange mRange;
-    std::string mSymbol;
-    int mRootDist = -1;  ///< semitones above the center, -1 for none
-    int mBassDist = -1;
+    CTimeRange mRange;     ///< up to the next chord of the song or its end
+    std::string mSymbol;   ///< as it was written
+    int mRootDist = -1;    ///< semitones above the center, -1 for none
+    int mBassDist = -1;    ///< likewise, of the bass
     std::string mNumeral;  ///< the function in the center, empty for none
 };
 
 /// A passage that repeats an earlier one, with its exact ranges and the symbols of its chords.
 struct CShownCopy {
-    CTimeRange mSource;
-    CTimeRange mTarget;
-    std::vector<std::string> mSymbols;
-    CHarmCopy mCopy;
+    CTimeRange mSource;                 ///< where it was first
+    CTimeRange mTarget;                 ///< where it comes again
+    std::vector<std::string> mSymbols;  ///< as written at the target
+    CHarmCopy mCopy;                    ///< the same in bars
 };
 
 /// A center as it is shown. Its range is that of its chords; without chords it is empty and begins
 /// where the center does.
 struct CShownCenter {
-    CHarmCenterLite mHarmCenter;
-    std::string mName;
-    double mProbability = kPosUndef;
-    CTimeRange mRange;
-    std::vector<CShownChord> mChords;
+    CHarmCenterLite mHarmCenter;       ///< undefined for chords without a center
+    std::string mName;                 ///< "C Major"; "unknown" if undefined
+    double mProbability = kPosUndef;   ///< as the analysis weighs it; kPosUndef where it does not
+    CTimeRange mRange;                 ///< in beats
+    std::vector<CShownChord> mChords;  ///< by time, each once
 };
 
 /// A key signature from its place on, with the centers that are heard under it.
 struct CShownSignKey {
-    std::string mName;
-    CSignKeyLite mSignKey;
-    double mBegin = 0.0;
-    std::vector<CShownCenter> mCenters;
+    std::string mName;                   ///< "C Major"; "unknown" if undefined
+    CSignKeyLite mSignKey;               ///< undefined where none is known
+    double mBegin = 0.0;                 ///< in beats
+    std::vector<CShownCenter> mCenters;  ///< as the analysis has them
 };
 
 /// What a score tells beside its chords.
 struct CShownScore {
-    std::string mTitle;
+    std::string mTitle;  ///< empty for none
     /// "6/8", where it begins to hold.
     struct CTime {
-        double mPosition = 0.0;
-        std::string mName;
+        double mPosition = 0.0;  ///< in beats
+        std::string mName;       ///< numbers with a slash
     };
-    std::vector<CTime> mTimes;
+    std::vector<CTime> mTimes;  ///< by position
     /// Rehearsal marks.
     std::vector<double> mSections;
-    /// Passages that are played again: the bars from `mBegin` are those from `mSource`.
+    /// A passage that is played again: the bars from `mBegin` are those from `mSource`.
     struct CCopy {
-        double mBegin = 0.0;
-        double mSource = 0.0;
-        std::size_t mBarCount = 0;
+        double mBegin = 0.0;        ///< in beats
+        double mSource = 0.0;       ///< in beats, earlier
+        std::size_t mBarCount = 0;  ///< how many bars are the same
     };
-    std::vector<CCopy> mCopies;
+    std::vector<CCopy> mCopies;  ///< by `mBegin`
 };
 
 /// A chord with its numeral in the key of its region; empty for a chord that is none.
 struct CShownNumeral {
-    CTimeRange mRange;
-    std::string mSymbol;
-    std::string mNumeral;
+    CTimeRange mRange;     ///< up to the next chord
+    std::string mSymbol;   ///< as it was written
+    std::string mNumeral;  ///< "V7/ii"; empty where no chord sounds
 };
 
 /// A stretch of a song in one key, with its chords.
 struct CShownKeyRegion {
-    CSignKeyLite mKey;
-    std::string mName;
-    CTimeRange mRange;
-    std::vector<CShownNumeral> mChords;
+    CSignKeyLite mKey;                   ///< of the stretch
+    std::string mName;                   ///< "C Major"
+    CTimeRange mRange;                   ///< without a gap to the next one
+    std::vector<CShownNumeral> mChords;  ///< by time
 };
 
 /// The key of a song and its local keys as they are shown.
 struct CShownKeys {
-    CSignKeyLite mKey;
-    std::string mName = "none";
-    double mConfidence = kPosUndef;
-    std::array<double, 24> mScores{};
-    std::vector<CShownKeyRegion> mRegions;
+    CSignKeyLite mKey;                      ///< undefined for a song without chords
+    std::string mName = "none";             ///< "C Major", or "none"
+    double mConfidence = kPosUndef;         ///< 0 to 1, see CKeyOfSong; kPosUndef without a key
+    std::array<double, 24> mScores{};       ///< the points of C to B major, then C to B minor
+    std::vector<CShownKeyRegion> mRegions;  ///< by time
 };
 
 /// An analysis prepared for the eye: named, with the length of each chord, each chord once, and
 /// without the end marker.
 struct CShownSong {
-    double mBeatsPerBar = 4.0;
+    double mBeatsPerBar = 4.0;  ///< of most bars, or of all where mBarStarts is empty
     /// Where the bars of a score begin; empty where all bars are equal.
     std::vector<double> mBarStarts;
-    double mEnd = 0.0;
-    CShownScore mScore;
-    std::vector<CShownSignKey> mSignKeys;
+    double mEnd = 0.0;                     ///< where the last chord ends
+    CShownScore mScore;                    ///< empty for a text that tells none of it
+    std::vector<CShownSignKey> mSignKeys;  ///< by time
     /// Chords of the text that stand in no center.
     std::vector<CShownChord> mLooseChords;
-    std::vector<CShownCopy> mCopies;
+    std::vector<CShownCopy> mCopies;  ///< empty if they were not asked for
+    /// By their begins, of those that begin together the longest first.
     std::vector<CShownCenter> mReadings;
-    bool mHasReadings = false;
-    CShownKeys mKeys;
+    bool mHasReadings = false;  ///< they were asked for, even if none was found
+    CShownKeys mKeys;           ///< of the whole song, whatever the centers are
 };
 
 /// Calls `function` with every chord of the text: those of the centers, then the loose ones.

@@ -20,8 +20,9 @@ namespace brindle {
 /// The first `count` characters of a text.
 [[nodiscard]] std::string FirstCharacters(std::string_view text, std::size_t count);
 
-/// The text, filled with blanks on the right (left) side to so many characters.
+/// The text with blanks behind it up to so many characters.
 [[nodiscard]] std::string PadRight(std::string_view text, std::size_t width);
+/// The text with blanks in front of it.
 [[nodiscard]] std::string PadLeft(std::string_view text, std::size_t width);
 
 /// A number with at most three digits after the point and no zeros at the end: "1", "2.5".

@@ -14,11 +14,11 @@ namespace brindle {
 
 /// A place of the capodaster for a song, and what the hand then plays.
 struct CShownCapo {
-    int mCapo = 0;
+    int mCapo = 0;  ///< its fret, 0 for none
     /// Less is easier.
     int mCost = 0;
-    double mDifficulty = 0.0;
-    std::size_t mHoles = 0;
+    double mDifficulty = 0.0;  ///< mean of the chords that are held, 0 to 9
+    std::size_t mHoles = 0;    ///< chords that cannot be held
     /// Each different chord by the name of its shape, in the order of the song.
     std::vector<std::string> mShapes;
 };
@@ -28,8 +28,9 @@ struct CShownSongGrids {
     /// Each different one, in the order of the song. The name is that of the shape under the
     /// capodaster, the symbol that of the song.
     std::vector<CChordGrid> mGrids;
-    /// Of each chord of the song: its symbol, and which grid it is; none for a rest and a hole.
+    /// Of each chord of the song its symbol.
     std::vector<std::string> mSymbols;
+    /// Of each chord which of the grids it is; nothing for a rest and a hole.
     std::vector<std::optional<std::size_t>> mGridOfChord;
     /// The first one is drawn. The others were compared with it.
     std::vector<CShownCapo> mCapos;
@@ -46,6 +47,7 @@ struct CShownSongGrids {
 /// The capo and what it makes easier, the way of the chords, and the diagrams.
 [[nodiscard]] std::string SongGridsText(const CShownSongGrids& song, const CPaint& paint,
                                         const CGridStyle& style);
+/// The same as JSON, with all places of the capo.
 [[nodiscard]] std::string SongGridsJson(const CShownSongGrids& song);
 
 }  // namespace brindle

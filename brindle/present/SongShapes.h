@@ -11,16 +11,16 @@ namespace brindle {
 
 // The shapes that the pictures of a song share. Heights count from the top of a line of the song.
 
-inline constexpr std::string_view kInk = "#222222";
-inline constexpr std::string_view kFaintInk = "#666666";
+inline constexpr std::string_view kInk = "#222222";       ///< of chord symbols
+inline constexpr std::string_view kFaintInk = "#666666";  ///< of what stands beside them
 
-inline constexpr double kSymbolSize = 14.0;
-inline constexpr double kLabelSize = 12.0;
-inline constexpr double kSmallSize = 10.0;
+inline constexpr double kSymbolSize = 14.0;  ///< of chord symbols, in pixels
+inline constexpr double kLabelSize = 12.0;   ///< of the labels of bands
+inline constexpr double kSmallSize = 10.0;   ///< of bar numbers
 
 /// Where the lines of a song lie in a picture, in pixels.
 struct CLinePlaces {
-    double mLeft = 0.0;
+    double mLeft = 0.0;         ///< where all of them begin
     std::vector<double> mTops;  ///< of each line
 };
 
@@ -29,11 +29,11 @@ void DrawBarLines(CSvg& svg, const CTimeAxis& axis, const CLinePlaces& places, d
 
 /// A colored band with a label: where it lies, and how it looks.
 struct CBand {
-    double mTop = 0.0;
-    double mHeight = 18.0;
-    std::string mColor;
-    std::string mLabel;
-    CSvgFont mFont;
+    double mTop = 0.0;      ///< of the band in its line, in pixels
+    double mHeight = 18.0;  ///< in pixels
+    std::string mColor;     ///< of its ground, as in CSS
+    std::string mLabel;     ///< cut where it does not fit; whole as a tooltip
+    CSvgFont mFont;         ///< of its label
 };
 
 /// Draws a band over all lines that the range touches, with its label on each.
@@ -46,11 +46,11 @@ void DrawKeyRegions(CSvg& svg, const CTimeAxis& axis, const CLinePlaces& places,
 
 /// A chord in a colored box, with a text under it.
 struct CChordBox {
-    double mTop = 0.0;
-    std::string mColor;
-    std::string mSymbol;
-    std::string mCaption;
-    CSvgFont mCaptionFont;
+    double mTop = 0.0;      ///< of the box in its line, in pixels
+    std::string mColor;     ///< of its ground, as in CSS
+    std::string mSymbol;    ///< in the box
+    std::string mCaption;   ///< below the box
+    CSvgFont mCaptionFont;  ///< of that text
 };
 
 /// From the top of a chord's box to the top of its caption.
