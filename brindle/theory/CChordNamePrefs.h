@@ -36,6 +36,7 @@ struct CChordNamePrefs {
     std::int32_t mChordPrefD = 0;
     /// Parts of a chord name are joined by ",".
     bool mCommaParts = false;
+    /// The second of the two.
     std::int32_t mChordPrefE = 4;
     /// 1: options after the first stand in "(" and ")"; otherwise options are joined by "/".
     std::int32_t mOptionBrackets = 0;
@@ -49,6 +50,7 @@ struct CChordNamePrefs {
     std::string mSlashText = "/";
 };
 
+/// Writes all fields with their names on one line, for debugging.
 std::ostream& operator<<(std::ostream& stream, const CChordNamePrefs& prefs);
 
 // The global preferences. A host may change them; nothing locks them.

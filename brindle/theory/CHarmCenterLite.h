@@ -15,17 +15,22 @@ struct CSignKeyLite;
 
 /// A tonal center that holds for a passage: a root and a modal mask.
 struct CHarmCenterLite {
+    /// The tonic; undefined for no center.
     CKeyEnh mRootKeyEnh;
+    /// Intervals of its scale above the tonic: 2741 for major, 1709 for dorian.
     CSemitones mSemitones;
 
     constexpr CHarmCenterLite() = default;
+    /// Root and mask as they are.
     constexpr CHarmCenterLite(CKeyEnh root, CSemitones semitones)
         : mRootKeyEnh(root), mSemitones(semitones) {}
+    /// The root of a scale as tonic, with the scale's tones.
     constexpr explicit CHarmCenterLite(const CScaleLite& scale)
         : CHarmCenterLite(scale.mRootKeyEnh, scale.mSemitones) {}
     /// The tonic of a sign key, 2741 or 1453 above its root; undefined for an undefined type.
     explicit CHarmCenterLite(const CSignKeyLite& signKey);
 
+    /// True when the root is undefined, whatever the mask.
     [[nodiscard]] constexpr bool IsUndef() const { return mRootKeyEnh.IsUndef(); }
     /// The same root and mask as a scale.
     [[nodiscard]] constexpr CScaleLite ToScaleLite() const { return {mRootKeyEnh, mSemitones}; }
@@ -47,8 +52,10 @@ struct CHarmCenterLite {
     }
 };
 
+/// Writes root and mask on one line, for debugging.
 std::ostream& operator<<(std::ostream& stream, const CHarmCenterLite& center);
 
+/// No center: an undefined root and an empty mask.
 inline constexpr CHarmCenterLite CHarmCenterLite_Undef{};
 
 }  // namespace brindle

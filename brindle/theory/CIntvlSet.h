@@ -19,18 +19,23 @@ class CSemitones;
 /// 127, so `CIntvlSet(0, 4, 7)` and `CIntvlSet(0, 4, 7, -1)` are the same set.
 class CIntvlSet : public CMySet<int> {
 public:
+    /// Two octaves: where a ninth and a second are told apart.
     static constexpr int kDefaultWrapIntvl = 24;
 
     CIntvlSet() = default;
+    /// @cond (doxygen takes this for other members)
     template <std::same_as<int>... Rest>
     explicit(sizeof...(Rest) == 0) CIntvlSet(int first, Rest... rest) {
         SetIntvls(first, rest...);
     }
+    /// @endcond
+    /// The listed intervals in semitones, with the default wrap interval.
     explicit CIntvlSet(std::span<const int> intvls) { SetIntvls(intvls); }
     /// The set as it is, whatever its members.
     explicit CIntvlSet(const CMySet<int>& intvls, int wrapIntvl = kDefaultWrapIntvl)
         : CMySet<int>(intvls), mWrapIntvl(wrapIntvl) {}
 
+    /// The span in semitones in which the set is described; 24 by default.
     [[nodiscard]] int WrapIntvl() const { return mWrapIntvl; }
 
     /// Exact member test; `kIntvlUndef` gives false.
@@ -41,6 +46,7 @@ public:
 
     /// Whether all listed values are members.
     [[nodiscard]] bool HasIntvls(std::span<const int> intvls) const;
+    /// The same for values written out. A first value that ends the list gives true.
     template <std::same_as<int>... Rest>
     [[nodiscard]] bool HasIntvls(int first, Rest... rest) const {
         return HasIntvls(std::to_array({first, rest...}));
@@ -48,12 +54,14 @@ public:
     /// Whether the listed values are the members and nothing else is. A listed value at or above
     /// the wrap interval makes it false.
     [[nodiscard]] bool HasExactTheseIntvls(std::span<const int> intvls) const;
+    /// The same for values written out.
     template <std::same_as<int>... Rest>
     [[nodiscard]] bool HasExactTheseIntvls(int first, Rest... rest) const {
         return HasExactTheseIntvls(std::to_array({first, rest...}));
     }
     /// Whether each listed value is here in some octave and each member is listed in some octave.
     [[nodiscard]] bool HasExactlyTheseIntvlsInAnyOctave(std::span<const int> intvls) const;
+    /// The same for values written out.
     template <std::same_as<int>... Rest>
     [[nodiscard]] bool HasExactlyTheseIntvlsInAnyOctave(int first, Rest... rest) const {
         return HasExactlyTheseIntvlsInAnyOctave(std::to_array({first, rest...}));
@@ -73,6 +81,7 @@ public:
 
     /// Replaces the members; the wrap interval stays.
     void SetIntvls(std::span<const int> intvls);
+    /// The same for values written out.
     template <std::same_as<int>... Rest>
     void SetIntvls(int first, Rest... rest) {
         SetIntvls(std::to_array({first, rest...}));

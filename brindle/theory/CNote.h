@@ -44,8 +44,8 @@ inline constexpr std::int64_t kNoteNrSmallUndef = 255;
 ///
 /// Fields that are set directly are not checked; a note number beyond 0 to 127 is off the keyboard.
 struct CNote {
-    std::int64_t mNoteNr = kNoteNrUndef;
-    TEnh mEnh = TEnh_Undef;
+    std::int64_t mNoteNr = kNoteNrUndef;  ///< as in MIDI, 0 to 127; -1 and 255 are no note
+    TEnh mEnh = TEnh_Undef;               ///< how its key is written
 
     constexpr CNote() = default;
     /// The note number is limited to 0 to 127. The spelling is repaired, unless `TEnh_Undef`.
@@ -56,15 +56,19 @@ struct CNote {
     constexpr CNote(const CKeyEnh& keyEnh, int oct) : mEnh(keyEnh.mEnh) {
         if (!keyEnh.IsUndef()) mNoteNr = _NoteNrFromKeyNrAndOct(keyEnh.mKeyNr, oct);
     }
+    /// The same from a pair of key number and spelling.
     constexpr CNote(const std::pair<int, TEnh>& keyEnh, int oct)
         : CNote(CKeyEnh{keyEnh.first, keyEnh.second}, oct) {}
 
+    /// True when the note number is -1 or 255, whatever the spelling.
     [[nodiscard]] constexpr bool IsUndef() const { return IsNoteNrUndef(mNoteNr); }
     /// 0 to 11, or 15.
     [[nodiscard]] constexpr int KeyNr() const { return KeyNrOfNoteNr(mNoteNr); }
+    /// Key and spelling without the octave.
     [[nodiscard]] constexpr CKeyEnh KeyEnh() const { return {KeyNr(), mEnh}; }
     /// Of the key number: the undefined note counts as black.
     [[nodiscard]] constexpr bool IsBlackKey() const { return brindle::IsBlackKey(KeyNr()); }
+    /// Whether one of the seven letters with this accidental is the key of the note.
     [[nodiscard]] constexpr bool HasSensefulEnh() const {
         return IsSensefulEnhForKeyNr(KeyNr(), mEnh);
     }
@@ -76,6 +80,7 @@ struct CNote {
         mEnh = enh;
         if (enh != TEnh_Undef) MakeSensefulEnhAssumingCMajor();
     }
+    /// Sets the spelling as it is, one that the key cannot have too.
     constexpr void SetEnhAndDontMakeSenseful(TEnh enh) { mEnh = enh; }
     /// As the constructor.
     void SetNoteNrAndEnh(std::int64_t noteNr, TEnh enh);
@@ -85,8 +90,9 @@ struct CNote {
     }
     /// As SetNoteNr, then repairs the present spelling, `TEnh_Undef` too.
     void SetNoteNrAndMakeSensefulEnhAssumingCMajor(std::int64_t noteNr);
-    /// Changes the key within the octave; key 15 makes the note undefined. An undefined note counts
-    /// as one of the lowest octave. Not limited: B in the octave of note 127 is 131.
+    /// Changes the key within the octave (the key is first reduced into 0 to 11); key 15 makes the
+    /// note undefined. -1 counts as a note of the lowest octave, 255 as one of the octave below it,
+    /// which is off the keyboard. Not limited: B in the octave of note 127 is 131.
     void SetKeyNr(int keyNr);
     /// As SetKeyNr, then repairs the present spelling.
     void SetKeyNrAndEnhAssumingCMajor(int keyNr);
@@ -98,7 +104,9 @@ struct CNote {
     /// One step of respelling as the free functions of these names do it, except that triple
     /// accidentals are not taken as double ones.
     void EnhShiftToFlats();
+    /// As EnhShiftToFlats, towards sharps.
     void EnhShiftToSharps();
+    /// As EnhShiftToFlats, to and fro: a sharp goes to flats, all others to sharps.
     void EnhShift();
     /// Takes the spelling that the scale gives to this key.
     void AdjustEnhToScale(const CScaleHeavy& scale);
@@ -107,7 +115,9 @@ struct CNote {
     /// undefined note.
     void AddIntvlAndClampToKey(int intvl);
 
+    /// The name of the key with its accidental, "Eb"; "Undef" for an undefined note.
     [[nodiscard]] std::string KeyName(const CChordNamePrefs& prefs) const;
+    /// The letter or syllable alone, as the spelling selects it; "Undef" for an undefined note.
     [[nodiscard]] std::string KeyNameWithoutEnh(const CChordNamePrefs& prefs) const;
     /// The octave as a number; note 60 is octave 3, 4 or 5 by `mOctaveNaming`. Empty if undefined.
     [[nodiscard]] std::string OctName(const CChordNamePrefs& prefs) const;
@@ -138,8 +148,10 @@ private:
     }
 };
 
+/// Writes note number and spelling, for debugging.
 std::ostream& operator<<(std::ostream& stream, const CNote& note);
 
+/// No note: number -1, no spelling.
 inline constexpr CNote CNote_Undef{};
 
 }  // namespace brindle

@@ -48,11 +48,16 @@ public:
 
     // A field of the row of a type, of major for a type without one
 
+    /// The English name, "Natural Minor".
     [[nodiscard]] static std::string_view GetNameForScaleType(TScaleType type);
+    /// Whether its colour is major, minor or neither.
     [[nodiscard]] static TScaleMode GetModeForScaleType(TScaleType type);
+    /// How many steps an octave has: 5 for a pentatonic scale, 7 for a mode.
     [[nodiscard]] static int GetDegreesPerOctaveForScaleType(TScaleType type);
+    /// Semitones above the root of each degree, from degree 0; 0 beyond the last one.
     [[nodiscard]] static const std::array<int, 12>& GetDegreeToRootOffsetIntvlArrayForScaleType(
         TScaleType type);
+    /// See CScaleRow::mDegreeEnh.
     [[nodiscard]] static const std::array<TEnh, 12>& GetDegreeEnhForScaleType(TScaleType type);
     /// The name in the user's language, "Major (Ionian)" where there is no translation; none for
     /// a type outside 1 to 30.
@@ -60,30 +65,44 @@ public:
 
     // Making a scale. The root takes the key alone, in the lowest octave, with a repaired spelling.
 
+    /// An undefined scale: no root, the empty row, no spellings.
     constexpr CScaleHeavy() { mEnhOfKeyNr.fill(TEnh_Undef); }
+    /// A named scale on a key.
     CScaleHeavy(const CKeyEnh& root, TScaleType type);
+    /// The same on the key of a note; the octave is not kept.
     CScaleHeavy(const CNote& root, TScaleType type);
     /// The root in the spelling whose major scale has the fewest signs.
     CScaleHeavy(int rootKeyNr, TScaleType type);
+    /// The scale of a mask: of its named type, else of type `st_custom`.
     CScaleHeavy(const CKeyEnh& root, CSemitones semitones);
+    /// The same of a set of intervals above the root, in semitones.
     CScaleHeavy(const CKeyEnh& root, const CIntvlSet& intvls);
+    /// The same on the key of a note.
     CScaleHeavy(const CNote& root, const CIntvlSet& intvls);
+    /// The same of the keys of the scale, 0 to 11. Without a root it has no steps.
     CScaleHeavy(const CKeyEnh& root, const CMySet<int>& keyNrs);
+    /// The same on the key of a note.
     CScaleHeavy(const CNote& root, const CMySet<int>& keyNrs);
     /// The scale that a text such as "C dorian" names, see ScaleStrings.h.
     CScaleHeavy(std::string_view text, const CChordNamePrefs& prefs);
+    /// The same; null is the undefined scale.
     CScaleHeavy(const char* text, const CChordNamePrefs& prefs);
 
+    /// Makes the scale undefined.
     void SetUndef() { *this = CScaleHeavy(); }
+    /// As the constructor from a key and a type.
     void SetFromRootKeyEnhAndScaleType_ResetCustomScaleData(const CKeyEnh& root, TScaleType type);
     /// Keeps the steps of a custom scale, for the type `st_custom`.
     void SetFromRootKeyEnhAndScaleType_DontResetCustomScaleData(const CKeyEnh& root,
                                                                 TScaleType type);
+    /// As the constructor from a mask.
     void SetFromRootKeyEnhAndCustomScaleSemitones_ResetCustomScaleData(const CKeyEnh& root,
                                                                        CSemitones semitones);
-    /// Members from the thirteenth on are left out. Members above 11 stay as they are.
+    /// As the constructor from intervals. Members from the thirteenth on are left out. Members
+    /// above 11 stay as they are.
     void SetFromRootKeyEnhAndCustomScaleIntvlSet_ResetCustomScaleData(const CKeyEnh& root,
                                                                       const CIntvlSet& intvls);
+    /// As the constructor from keys.
     void SetFromRootKeyEnhAndCustomScaleKeyNrSet_ResetCustomScaleData(const CKeyEnh& root,
                                                                       const CMySet<int>& keyNrs);
     /// Reads a text such as "C dorian", see ScaleStrings.h.
@@ -93,10 +112,13 @@ public:
 
     /// Repairs the spelling of the root as the constructors do.
     void SetRootKeyEnh(const CKeyEnh& root);
+    /// The same, with the old spellings of the other keys.
     void SetRootKeyEnhWithoutCalcEnh(const CKeyEnh& root);
     /// Takes the note as it is, octave and spelling included.
     void SetRootNote(const CNote& root);
+    /// Keeps the root and spells anew; a type without a row has the steps of major.
     void SetScaleType(TScaleType type);
+    /// The same, with the old spellings.
     void SetScaleTypeWithoutCalcEnh(TScaleType type);
     /// Gives the own row, that of the type `st_custom`, the twelve chromatic steps it starts with.
     void InitCustomScaleData() { mCustomScaleData = kCustomScaleRow; }
@@ -112,11 +134,15 @@ public:
 
     // Reading
 
+    /// The root with its octave; the lowest one unless SetRootNote has set another.
     [[nodiscard]] constexpr const CNote& RootNote() const { return mRootNote; }
+    /// Key and spelling of the root.
     [[nodiscard]] CKeyEnh RootKeyEnh() const { return mRootNote.KeyEnh(); }
     /// 0 to 11, or 15.
     [[nodiscard]] int RootKeyNr() const { return mRootNote.KeyNr(); }
+    /// `st_custom` for steps that no named scale has.
     [[nodiscard]] constexpr TScaleType ScaleType() const { return mScaleType; }
+    /// True when the root is undefined, whatever the type.
     [[nodiscard]] constexpr bool IsUndef() const { return mRootNote.IsUndef(); }
     /// The row in use: of the table of scales, or the scale's own.
     [[nodiscard]] constexpr const CScaleRow& ScaleRow() const {
@@ -127,20 +153,31 @@ public:
     /// The first type of the table whose steps are those of the own row; `st_custom` if none is.
     [[nodiscard]] TScaleType FindScaleTypeForCustomScale() const;
 
+    /// Whether it is one of the seven modes of the major scale, by the type alone.
     [[nodiscard]] bool IsModalScale() const { return IsScaleTypeModal(mScaleType); }
+    /// How many steps an octave has; 0 for the empty row.
     [[nodiscard]] int DegreesPerOctave() const { return ScaleRow().mDegreesPerOctave; }
 
-    // Which degree an interval above the root, a key, or a note is; -1 for none
+    // Which degree (from 0) an interval above the root, a key, or a note is; -1 for none. Intervals
+    // and keys are not reduced: 12 is no degree of any scale.
 
+    /// Only the steps are asked, so that a scale without a root has intervals, too.
     [[nodiscard]] int IntvlToDegreeNr(int intvl) const;
+    /// The key is 0 to 11; -1 for an undefined scale.
     [[nodiscard]] int KeyNrToDegreeNr(int keyNr) const;
+    /// By the key of the note, in any octave.
     [[nodiscard]] int NoteNrToDegreeNr(std::int64_t noteNr) const;
+    /// By the key of the note, in any octave and spelling.
     [[nodiscard]] int NoteToDegreeNr(const CNote& note) const;
+    /// Whether the interval above the root, 0 to 11, is a step; it is so without a root, too.
     [[nodiscard]] bool HasIntvl(int intvl) const { return IntvlToDegreeNr(intvl) >= 0; }
+    /// Whether the key, 0 to 11, belongs to the scale.
     [[nodiscard]] bool HasKeyNr(int keyNr) const { return KeyNrToDegreeNr(keyNr) >= 0; }
+    /// Whether the key of the note does.
     [[nodiscard]] bool HasNoteNr(std::int64_t noteNr) const {
         return NoteNrToDegreeNr(noteNr) >= 0;
     }
+    /// Whether the key of the note does, in any spelling.
     [[nodiscard]] bool HasNote(const CNote& note) const { return NoteToDegreeNr(note) >= 0; }
 
     // What stands on a degree, counted on through the octaves. A negative degree, and any degree of
@@ -148,28 +185,37 @@ public:
 
     /// 0 to 11, or 15.
     [[nodiscard]] int DegreeNrToKeyNr(int degree) const;
+    /// Key and spelling; the spelling is undefined in a custom scale.
     [[nodiscard]] CKeyEnh DegreeNrToKeyEnh(int degree) const;
     /// The note with a number of 0 to 11.
     [[nodiscard]] CNote DegreeNrToNoteInLowestOctave(int degree) const;
     /// The key of the degree in octave `oct`, where octave -1 is the lowest. Degree 0 of C major in
     /// octave 4 is 60.
     [[nodiscard]] std::int64_t DegreeNrToNoteNr(int degree, int oct) const;
+    /// The same, spelled by the scale.
     [[nodiscard]] CNote DegreeNrToNote(int degree, int oct) const;
 
     // The spelling of a key; `TEnh_Undef` where the scale has none. Key numbers and steps are
     // reduced into the octave, an undefined note reads as key 3.
 
+    /// Of a key of 0 to 11.
     [[nodiscard]] TEnh EnhForKeyNr(int keyNr) const;
     /// Of the key `step` semitones above the root.
     [[nodiscard]] TEnh EnhForChromStep(int step) const;
+    /// Of the key of a note.
     [[nodiscard]] TEnh EnhForNote(const CNote& note) const;
     /// By key number.
     [[nodiscard]] constexpr const std::array<TEnh, 12>& EnhOfKeyNr() const { return mEnhOfKeyNr; }
-    // Stores a spelling, repaired.
+    // Stores a spelling, repaired as the keys are usually written in C major. CalcEnh overwrites
+    // it.
+    /// Of a key of 0 to 11.
     void SetEnhForKeyNr(int keyNr, TEnh enh);
+    /// Of the key `step` semitones above the root.
     void SetEnhForChromStep(int step, TEnh enh);
+    /// Of the key of a note.
     void SetEnhForNote(const CNote& note, TEnh enh);
 
+    /// The steps as a mask, without the root.
     [[nodiscard]] CSemitones ToSemitones() const { return ScaleRow().Semitones(); }
     /// The steps, with the octave as wrap interval.
     [[nodiscard]] CIntvlSet ToIntvlSet() const;
@@ -178,9 +224,11 @@ public:
 
     /// The sharps of the scale, negative for flats: -1 for F major, 0 for E phrygian.
     [[nodiscard]] int SignsCount() const;
+    /// The same without its sign; 0 for an undefined scale.
     [[nodiscard]] int SignsCountAbs() const;
     /// The root of the major scale that has the notes of this modal scale; undefined if it is none.
     [[nodiscard]] CKeyEnh RelatedIonianScaleRootKeyEnh() const;
+    /// That major scale; undefined if this is no modal scale.
     [[nodiscard]] CScaleHeavy RelatedIonianScale() const;
 
     /// "D Dorian".
@@ -244,8 +292,10 @@ private:
 
 static_assert(std::is_trivially_copyable_v<CScaleHeavy>);
 
+/// Writes root and type on one line, for debugging.
 std::ostream& operator<<(std::ostream& stream, const CScaleHeavy& scale);
 
+/// No scale: no root, no steps, no spellings.
 inline constexpr CScaleHeavy CScaleHeavy_Undef{};
 
 }  // namespace brindle

@@ -17,16 +17,18 @@ struct CChordNamePrefs;
 
 /// The compact form of a scale: a root and the semitones above it.
 struct CScaleLite {
-    CKeyEnh mRootKeyEnh;
-    CSemitones mSemitones;
+    CKeyEnh mRootKeyEnh;    ///< the tonic; undefined for no scale
+    CSemitones mSemitones;  ///< its tones above the root: 2741 for major
 
     constexpr CScaleLite() = default;
+    /// Root and mask as they are.
     constexpr CScaleLite(CKeyEnh root, CSemitones semitones)
         : mRootKeyEnh(root), mSemitones(semitones) {}
     /// Root and tones of a full scale.
     explicit CScaleLite(const CScaleHeavy& scale);
     /// The scale that a text such as "C dorian" names, see ScaleStrings.h.
     explicit CScaleLite(std::string_view text, const CChordNamePrefs& prefs);
+    /// The same; null is the undefined scale.
     explicit CScaleLite(const char* text, const CChordNamePrefs& prefs);
 
     /// True when the root is undefined.
@@ -36,8 +38,11 @@ struct CScaleLite {
     /// Semitones from the root up to the key, 0 to 11; -1 when the root is undefined. A key of 15
     /// is not tested.
     [[nodiscard]] int DistToRootKey(int keyNr) const;
+    /// Whether the mask is one of the seven modes of the major scale; the root does not matter.
     [[nodiscard]] bool IsModalScale() const;
+    /// Whether it is one of those with a major third and a fifth: ionian, lydian, mixolydian.
     [[nodiscard]] bool IsModalScaleMajor() const;
+    /// Whether it is one of those with a minor third and a fifth: dorian, phrygian, aeolian.
     [[nodiscard]] bool IsModalScaleMinor() const;
 
     /// The relative natural minor of a major scale, A minor for C major, and back; any other scale
@@ -73,8 +78,10 @@ struct CScaleLite {
 
 static_assert(std::is_trivially_copyable_v<CScaleLite>);
 
+/// Writes root and mask on one line, for debugging.
 std::ostream& operator<<(std::ostream& stream, const CScaleLite& scale);
 
+/// No scale: an undefined root and an empty mask.
 inline constexpr CScaleLite CScaleLite_Undef{};
 
 }  // namespace brindle

@@ -26,6 +26,7 @@ class CIntvlSet;
 class CSemitones {
 public:
     constexpr CSemitones() = default;
+    /// The mask as it is. Bits above 11 are no tones, yet size, comparison and Mask see them.
     constexpr explicit CSemitones(std::uint64_t mask) : mMask(mask) {}
 
     /// Each value below 12 sets its bit; larger values are ignored.
@@ -45,7 +46,9 @@ public:
         (SetSemitone(ix++, bits), ...);
     }
 
+    /// Bit n: n semitones above the root.
     [[nodiscard]] constexpr std::uint64_t Mask() const { return mMask; }
+    /// No bit is set, so it counts as undefined, too.
     [[nodiscard]] constexpr bool IsEmpty() const { return mMask == 0; }
     /// Number of intervals in the set.
     [[nodiscard]] constexpr int size() const { return std::popcount(mMask); }
@@ -61,8 +64,11 @@ public:
     /// The members as an interval set that wraps at the octave.
     [[nodiscard]] CIntvlSet IntvlSet() const;
 
+    /// Whether it is one of the seven modes of the major scale.
     [[nodiscard]] constexpr bool IsModalScale() const;
+    /// Whether it is ionian, lydian or mixolydian.
     [[nodiscard]] constexpr bool IsModalScaleMajor() const;
+    /// Whether it is dorian, phrygian or aeolian.
     [[nodiscard]] constexpr bool IsModalScaleMinor() const;
 
     /// The interval to add to index `ix` (0 to 11) to reach a member, 0 if `ix` is one itself.
@@ -74,6 +80,7 @@ public:
     /// The index reached when wrapping at the octave; `ix` itself where there is none.
     [[nodiscard]] int QuantizeToActiveSemitonwAsIndex(int ix, TQuantizeDirection direction) const;
 
+    /// Empties the set.
     constexpr void Reset() { mMask = 0; }
     /// Sets or clears bit `ix`; an index outside 0 to 11 is ignored.
     constexpr void SetSemitone(int ix, bool on) {
@@ -85,12 +92,16 @@ public:
     constexpr void AddIntvl(int intvl) { SetSemitone(SemitoneIxFromIntvl(intvl), true); }
     /// Clears the bit of the interval, reduced into the octave.
     constexpr void EraseIntvl(int intvl) { SetSemitone(SemitoneIxFromIntvl(intvl), false); }
+    /// Sets the bit of each interval, reduced into the octave.
     void AddIntvls(const CIntvlSet& intvls);
+    /// Clears the bit of each interval, reduced into the octave.
     void EraseIntvls(const CIntvlSet& intvls);
+    /// Replaces the set by the intervals, reduced into the octave.
     void SetFromIntvlSet(const CIntvlSet& intvls);
 
     /// Adds the tones of the basic chord: 0 4 7 for a major chord, nothing for `None`.
     constexpr void AddSemitonesFromBasicChord(TBasicChord basicChord);
+    /// Replaces the set by the tones of the basic chord.
     constexpr void SetFromBasicChord(TBasicChord basicChord) {
         Reset();
         AddSemitonesFromBasicChord(basicChord);
@@ -125,12 +136,16 @@ public:
     friend constexpr bool operator==(const CSemitones&, const CSemitones&) = default;
     friend constexpr auto operator<=>(const CSemitones&, const CSemitones&) = default;
 
-    // The masks of small chord vocabularies. The first two rows of each are no chord and all tones.
+    // The masks of small chord vocabularies, by index. The first two of each are no chord and all
+    // tones.
+    /// 0 4 7 and 0 3 7: the major and the minor triad.
     static constexpr std::array<std::uint64_t, 4> _sSemitones_Chords_MajorMinorMode{0, 4095, 145,
                                                                                     137};
+    /// The chords of common songs: triads, sixths, sevenths, ninths without seventh, power chord.
     static constexpr std::array<std::uint64_t, 18> _sSemitones_Chords_CommonMode{
         0,    4095, 145, 137,  657, 649,  1169, 2193, 149,
         1161, 73,   585, 1097, 273, 1297, 133,  161,  129};
+    /// The common chords that a recogniser tells apart; the third is a bare root.
     static constexpr std::array<std::uint64_t, 18> _sSemitones_Chords_MetroRecognizedMode{
         0, 4095, 1, 145, 137, 1169, 2193, 149, 1161, 2185, 73, 585, 273, 1297, 133, 161, 129, 1153};
 
@@ -140,10 +155,14 @@ private:
     std::uint64_t mMask = 0;
 };
 
+/// Writes the mask as a number.
 std::ostream& operator<<(std::ostream& stream, const CSemitones& semitones);
 
+/// No tones.
 inline constexpr CSemitones CSemitones_Undef{};
-inline constexpr CSemitones kSemitonesMajor(0xAB5);         // 0 2 4 5 7 9 11
+/// The major scale.
+inline constexpr CSemitones kSemitonesMajor(0xAB5);  // 0 2 4 5 7 9 11
+/// The natural minor scale.
 inline constexpr CSemitones kSemitonesNaturalMinor(0x5AD);  // 0 2 3 5 7 8 10
 
 /// The seven modes of the major scale, from the mode on C to the mode on B in the usual order.

@@ -19,6 +19,7 @@ struct CSignKeyNoEnh;
 class CSignKeyHeavy : public CScaleHeavy {
 public:
     constexpr CSignKeyHeavy() = default;
+    /// The key of that tonic and mode; an undefined root gives an undefined sign key.
     CSignKeyHeavy(const CKeyEnh& root, TSignKeyTypeNoUndef type);
     /// The root in the spelling whose major scale has the fewest signs.
     CSignKeyHeavy(int rootKeyNr, TSignKeyTypeNoUndef type);
@@ -32,15 +33,22 @@ public:
     /// True when the root or the type is undefined.
     [[nodiscard]] bool IsUndef() const;
 
+    /// Its scale, major or natural minor.
     [[nodiscard]] const CScaleHeavy& Scale() const { return *this; }
+    /// Its tones above the tonic: 2741 or 1453; empty if undefined.
     [[nodiscard]] CSemitones Semitones() const { return SemitonesFromSignKeyType(SignKeyType()); }
+    /// Key, spelling and type, without the octave.
     [[nodiscard]] CSignKeyLite ToSignKeyLite() const;
+    /// Key and type, without the spelling.
     [[nodiscard]] CSignKeyNoEnh ToSignKeyNoEnh() const;
+    /// The tonic as a center, with the mask of Semitones().
     [[nodiscard]] CHarmCenterLite ToHarmCenter() const;
 
     /// Distances and keys as in CSignKeyLite.
     [[nodiscard]] int DistToSignKeyRoot(int keyNr) const;
+    /// The key counted from the root, 0 to 11; 15 when either is undefined.
     [[nodiscard]] int KeyNrToSignKeyKeyNr(int keyNr) const;
+    /// The key that stands `signKeyKeyNr` semitones above the root; 15 when either is undefined.
     [[nodiscard]] int SignKeyKeyNrToKeyNr(int signKeyKeyNr) const;
 
     /// The relative key, despite the given name: the one with the same signature in the other
@@ -49,7 +57,9 @@ public:
     /// The major key with the same signature.
     [[nodiscard]] CSignKeyHeavy IonicSignKey() const;
 
+    /// As the constructor.
     void SetRootKeyEnhAndSignKeyType(const CKeyEnh& root, TSignKeyTypeNoUndef type);
+    /// Keeps the root.
     void SetSignKeyType(TSignKeyTypeNoUndef type);
     /// Spells the root as CSignKeyLite does; its octave stays.
     void SetRootNoteEnhWithLeastSigns();
@@ -72,8 +82,10 @@ public:
     [[nodiscard]] static CSignKeyHeavy FromJSONDict(const nlohmann::json& dictionary);
 };
 
+/// Writes root and type on one line, for debugging.
 std::ostream& operator<<(std::ostream& stream, const CSignKeyHeavy& signKey);
 
+/// No key: no root, no type.
 inline constexpr CSignKeyHeavy CSignKeyHeavy_Undef{};
 
 }  // namespace brindle

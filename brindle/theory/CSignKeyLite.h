@@ -21,16 +21,18 @@ struct CSignKeyNoEnh;
 
 /// A major or minor key as a key signature names it: a spelled root and a type.
 struct CSignKeyLite {
-    CKeyEnh mRootKeyEnh;
-    TSignKeyType mSignKeyType = TSignKeyType_Undef;
+    CKeyEnh mRootKeyEnh;                             ///< the tonic
+    TSignKeyType mSignKeyType = TSignKeyType_Undef;  ///< major or minor
 
     constexpr CSignKeyLite() = default;
+    /// Root and type as they are.
     constexpr CSignKeyLite(CKeyEnh root, TSignKeyType type)
         : mRootKeyEnh(root), mSignKeyType(type) {}
     /// Root and type of a full sign key.
     explicit CSignKeyLite(const CSignKeyHeavy& signKey);
     /// The sign key that a text such as "F# minor" names, read with CurrentChordNamePrefs.
     explicit CSignKeyLite(std::string_view text);
+    /// The same; null is the undefined sign key.
     explicit CSignKeyLite(const char* text);
 
     /// True when the root or the type is undefined.
@@ -40,12 +42,14 @@ struct CSignKeyLite {
 
     /// The major or natural minor scale on the root; an undefined type has an empty mask.
     [[nodiscard]] CScaleLite Scale() const;
+    /// Its tones above the tonic: 2741 or 1453; empty for an undefined type.
     [[nodiscard]] constexpr CSemitones Semitones() const {
         return SemitonesFromSignKeyType(mSignKeyType);
     }
     /// The full form. An undefined type counts as major; an undefined root gives
     /// CSignKeyHeavy_Undef.
     [[nodiscard]] CSignKeyHeavy ToSignKeyHeavy() const;
+    /// Key and type, without the spelling.
     [[nodiscard]] CSignKeyNoEnh ToSignKeyNoEnh() const;
     /// The tonic as a center, with the mask of Semitones().
     [[nodiscard]] CHarmCenterLite ToHarmCenter() const;
@@ -58,8 +62,10 @@ struct CSignKeyLite {
     /// The key that stands `signKeyKeyNr` semitones above the root; 15 when either is undefined.
     [[nodiscard]] int SignKeyKeyNrToKeyNr(int signKeyKeyNr) const;
 
-    /// Sharps of the key signature, flats as a negative number.
+    /// Sharps of the key signature, flats as a negative number: -3 for C minor. 0 for an undefined
+    /// root or type.
     [[nodiscard]] int SignsCount() const;
+    /// The same without its sign.
     [[nodiscard]] int SignsCountAbs() const;
 
     /// The relative key, despite the given name: the one with the same signature in the other
@@ -88,8 +94,10 @@ struct CSignKeyLite {
 
 static_assert(std::is_trivially_copyable_v<CSignKeyLite>);
 
+/// Writes root and type on one line, for debugging.
 std::ostream& operator<<(std::ostream& stream, const CSignKeyLite& signKey);
 
+/// No key: no root, no type.
 inline constexpr CSignKeyLite CSignKeyLite_Undef{};
 
 }  // namespace brindle

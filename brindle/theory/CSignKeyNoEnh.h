@@ -22,15 +22,18 @@ struct CSignKeyLite;
 /// A major or minor key whose root has no spelling. Where a spelling is needed, the root is
 /// spelled as the root of a major scale with few signs, also in minor: key 1 minor is D flat minor.
 struct CSignKeyNoEnh {
-    int mRootKeyNr = kKeyNrUndef;
-    TSignKeyType mSignKeyType = TSignKeyType_Undef;
+    int mRootKeyNr = kKeyNrUndef;                    ///< the tonic, 0 (C) to 11 (B); 15 for none
+    TSignKeyType mSignKeyType = TSignKeyType_Undef;  ///< major or minor
 
     constexpr CSignKeyNoEnh() = default;
+    /// Root and type as they are.
     constexpr CSignKeyNoEnh(int rootKeyNr, TSignKeyType type)
         : mRootKeyNr(rootKeyNr), mSignKeyType(type) {}
+    /// Key and type of a full sign key.
     explicit CSignKeyNoEnh(const CSignKeyHeavy& signKey);
     /// The sign key that a text such as "F# minor" names, read with CurrentChordNamePrefs.
     explicit CSignKeyNoEnh(std::string_view text);
+    /// The same; null is the undefined sign key.
     explicit CSignKeyNoEnh(const char* text);
 
     /// True when the root or the type is undefined.
@@ -42,20 +45,25 @@ struct CSignKeyNoEnh {
     [[nodiscard]] CSignKeyLite SignKey() const;
     /// The scale of the spelled form.
     [[nodiscard]] CScaleLite Scale() const;
+    /// Its tones above the tonic: 2741 or 1453; empty for an undefined type.
     [[nodiscard]] constexpr CSemitones Semitones() const {
         return SemitonesFromSignKeyType(mSignKeyType);
     }
     /// The full form of the spelled form.
     [[nodiscard]] CSignKeyHeavy ToSignKeyHeavy() const;
+    /// The tonic of the spelled form as a center.
     [[nodiscard]] CHarmCenterLite ToHarmCenter() const;
 
     /// Distances and keys as in CSignKeyLite.
     [[nodiscard]] int DistToSignKeyRoot(int keyNr) const;
+    /// The key counted from the root, 0 to 11; 15 when either is undefined.
     [[nodiscard]] int KeyNrToSignKeyKeyNr(int keyNr) const;
+    /// The key that stands `signKeyKeyNr` semitones above the root; 15 when either is undefined.
     [[nodiscard]] int SignKeyKeyNrToKeyNr(int signKeyKeyNr) const;
 
     /// Sharps of the spelled form, flats as a negative number.
     [[nodiscard]] int SignsCount() const;
+    /// The same without its sign.
     [[nodiscard]] int SignsCountAbs() const;
 
     /// The relative key, despite the given name: the one with the same signature in the other
@@ -66,6 +74,7 @@ struct CSignKeyNoEnh {
 
     /// Names of the spelled form.
     [[nodiscard]] std::string NameShort(const CChordNamePrefs& prefs) const;
+    /// "Db Minor"; "Undef".
     [[nodiscard]] std::string NameLong(const CChordNamePrefs& prefs) const;
 
     /// Writes `{"RootKeyNr":3,"Type":"major"}`.
@@ -78,8 +87,10 @@ struct CSignKeyNoEnh {
 
 static_assert(std::is_trivially_copyable_v<CSignKeyNoEnh>);
 
+/// Writes root and type on one line, for debugging.
 std::ostream& operator<<(std::ostream& stream, const CSignKeyNoEnh& signKey);
 
+/// No key: no root, no type.
 inline constexpr CSignKeyNoEnh CSignKeyNoEnh_Undef{};
 
 }  // namespace brindle

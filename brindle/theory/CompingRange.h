@@ -8,9 +8,11 @@ namespace brindle {
 // The comping range is the octave around middle C, F to F, in which chords are voiced unless told
 // otherwise.
 
+/// The F below middle C.
 inline constexpr std::int64_t kCompingRangeStartNoteNr = 53;
 /// In semitones.
 inline constexpr int kCompingRangeWidth = 12;
+/// The F above middle C; it is inside, too.
 inline constexpr std::int64_t kCompingRangeEndNoteNr = 65;
 /// An octave number for hosts; nothing here reads it.
 inline constexpr int kCompingRangeBelowOctNr = 4;

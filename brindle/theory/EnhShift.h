@@ -11,6 +11,7 @@ namespace brindle {
 // Each step comes in two forms: keys take triple accidentals as double ones; notes take them as
 // they are, by the forms named Unclamped.
 
+/// As EnhShiftToFlats, with triple accidentals as they are.
 [[nodiscard]] constexpr TEnh EnhShiftToFlatsUnclamped(int keyNr, TEnh enh) {
     const TEnh c = enh == TEnh_Undef ? TEnh_n : enh;
     switch (FoldKeyNr(keyNr)) {
@@ -34,6 +35,7 @@ namespace brindle {
     }
 }
 
+/// As EnhShiftToSharps, with triple accidentals as they are.
 [[nodiscard]] constexpr TEnh EnhShiftToSharpsUnclamped(int keyNr, TEnh enh) {
     const TEnh c = enh == TEnh_Undef ? TEnh_n : enh;
     switch (FoldKeyNr(keyNr)) {
@@ -57,6 +59,7 @@ namespace brindle {
     }
 }
 
+/// As EnhShift, with triple accidentals as they are.
 [[nodiscard]] constexpr TEnh EnhShiftUnclamped(int keyNr, TEnh enh) {
     const TEnh c = enh == TEnh_Undef ? TEnh_n : enh;
     const int key = FoldKeyNr(keyNr);

@@ -13,6 +13,7 @@ struct CChordNamePrefs;
 
 /// The signs U+266F and U+266D in UTF-8.
 inline constexpr std::string_view kUtf8Sharp = "\xE2\x99\xAF";
+/// The flat sign.
 inline constexpr std::string_view kUtf8Flat = "\xE2\x99\xAD";
 
 /// The name of a key with its accidental: "Eb", "Es", "Mib". "Undef" for key 15; any other number

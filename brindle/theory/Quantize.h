@@ -22,8 +22,9 @@ enum TWrapAtOctave : std::int32_t {
 
 /// To which side semitones move, and whether they stay within the octave.
 struct TQuantizeSemitonesOptions {
+    /// Which way to go from a tone outside.
     TQuantizeDirection mDirection = TQuantizeDirection_ClosestTieRight;
-    TWrapAtOctave mWrapAtOctave = TWrapAtOctave_Yes;
+    TWrapAtOctave mWrapAtOctave = TWrapAtOctave_Yes;  ///< whether the search ends at the octave
 };
 
 /// The side taken when two degrees of a scale are equally near. Any value other than 0 is left.

@@ -15,8 +15,9 @@ namespace brindle {
 
 /// A key that was typed, or what is wrong with it and where.
 struct CKeyText {
-    CSignKeyLite mSignKey;
-    std::string mError;
+    CSignKeyLite mSignKey;  ///< the key; undefined if it could not be read
+    std::string mError;     ///< what is wrong, for people; empty for a key
+    /// Where the fault begins, in bytes from 0; 0 without one.
     std::size_t mColumn = 0;
 };
 
@@ -26,8 +27,9 @@ struct CKeyText {
 
 /// A scale that was typed, or what is wrong with it and where.
 struct CScaleText {
-    CScaleHeavy mScale;
-    std::string mError;
+    CScaleHeavy mScale;  ///< the scale; undefined if it could not be read
+    std::string mError;  ///< what is wrong, for people; empty for a scale
+    /// Where the fault begins, in bytes from 0; 0 without one.
     std::size_t mColumn = 0;
 };
 

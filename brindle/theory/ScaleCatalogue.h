@@ -26,14 +26,16 @@ enum TScaleMode : std::int32_t {
 struct CScaleRow {
     /// The key of the row.
     TScaleType mType = st_Undef;
-    std::string_view mName;
+    std::string_view mName;  ///< in English, "Natural Minor"
     /// Number of degrees. May exceed 12 in a custom row; then only the first 12 have an offset.
     int mDegreesPerOctave = 0;
     /// Semitones above the root of degree 0, 1, ...; 0 beyond the last degree.
     std::array<int, 12> mDegreeToRootOffsetIntvl{};
-    /// By semitone above the root, the spelling relative to that of the root.
+    /// By degree from 0, how the step is written against the plain degree of major or minor: a
+    /// sharp for the seventh of harmonic minor. Natural elsewhere. Carried for hosts; scales are
+    /// spelled by CScaleHeavy::CalcEnh, which does not read it.
     std::array<TEnh, 12> mDegreeEnh{};
-    TScaleMode mMode = TScaleMode_Custom;
+    TScaleMode mMode = TScaleMode_Custom;  ///< of the type; custom for the empty row
 
     /// The degrees that have an offset: the degree count, but 0 to 12.
     [[nodiscard]] constexpr int StoredDegreeCount() const {
@@ -55,9 +57,10 @@ struct CScaleRow {
 };
 
 /// One spelling in the table of scales that is not natural.
+/// Where the spelling goes in CScaleRow::mDegreeEnh.
 struct CStepSpelling {
-    std::size_t mStep;
-    TEnh mEnh;
+    std::size_t mStep;  ///< the degree, from 0
+    TEnh mEnh;          ///< what stands there
 };
 
 /// Not a constant expression: a row of the table that arrives here does not compile.

@@ -15,16 +15,19 @@ struct CSensefulSpellings {
     std::uint32_t mEnhs;    ///< bit n: the spelling of value n - 1
 };
 
+/// Bit k for each key k of 0 to 11.
 template <class... TKeyNr>
 consteval std::uint32_t KeyNrBits(TKeyNr... keyNrs) {
     return ((1U << keyNrs) | ...);
 }
+/// Bit n for each spelling of value n - 1.
 template <class... CSpelling>
 consteval std::uint32_t EnhBits(CSpelling... enhs) {
     return ((1U << (enhs - TEnh_bbb)) | ...);
 }
 
 // clang-format off
+/// All keys, those of equal spellings in one row.
 inline constexpr auto kSensefulSpellings = std::to_array<CSensefulSpellings>({
     {KeyNrBits(0, 5),  EnhBits(TEnh_bb, TEnh_n, TEnh_s, TEnh_sss)},
     {KeyNrBits(1, 6),  EnhBits(TEnh_bbb, TEnh_b, TEnh_s, TEnh_ss)},

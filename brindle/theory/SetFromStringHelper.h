@@ -110,10 +110,11 @@ template <class CKeywords>
 /// A thing of a vocabulary: the keywords that mean it, its name, and a value that belongs to the
 /// owner of the table, such as a scale's mask or a sign key type.
 struct CKeywordsAndName {
-    std::vector<std::string> mKeywords;
-    std::string mName;
-    std::int32_t mPayload = 0;
+    std::vector<std::string> mKeywords;  ///< in the order in which they are tried
+    std::string mName;                   ///< as it is shown
+    std::int32_t mPayload = 0;           ///< 0 if the table needs none
 
+    /// Whether a keyword matches `text` from its start, in any letter case.
     [[nodiscard]] bool MatchesKeywords(SetFromStringHelper::TSpaces spaces,
                                        std::string_view text) const;
 };
@@ -126,6 +127,7 @@ public:
     /// The first record whose keywords match, or the end.
     [[nodiscard]] const_iterator FindFirstMatching(SetFromStringHelper::TSpaces spaces,
                                                    std::string_view text) const;
+    /// The same, to change it.
     [[nodiscard]] iterator FindFirstMatching(SetFromStringHelper::TSpaces spaces,
                                              std::string_view text);
 

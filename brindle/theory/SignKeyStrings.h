@@ -16,7 +16,9 @@ struct CSignKeyNoEnh;
 /// in any letter case. A bare key or a word that is not known means major. Without a key the root
 /// stays undefined and the type is read from the start of the text.
 void SetFromString(std::string_view text, CSignKeyLite& signKey, const CChordNamePrefs& prefs);
+/// The same, without the spelling.
 void SetFromString(std::string_view text, CSignKeyNoEnh& signKey, const CChordNamePrefs& prefs);
+/// The same, with its scale.
 void SetFromString(std::string_view text, CSignKeyHeavy& signKey, const CChordNamePrefs& prefs);
 
 /// The type whose word is all of `text` from `pos` on, blanks apart; `pos` moves behind it. Major

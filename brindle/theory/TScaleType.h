@@ -57,8 +57,11 @@ enum TScaleType : std::int32_t {
 
 /// Step to the next or the previous number, without end.
 TScaleType& operator++(TScaleType& type);
+/// The same; gives the type before it.
 TScaleType operator++(TScaleType& type, int);
+/// One step back.
 TScaleType& operator--(TScaleType& type);
+/// The same; gives the type before it.
 TScaleType operator--(TScaleType& type, int);
 
 /// Writes the enumerator, as "st_dorian"; a value outside the enumeration writes "undef".
