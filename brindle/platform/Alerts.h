@@ -13,6 +13,7 @@ struct CAlert {
     std::string button;           ///< the word that closes the panel
 };
 
+/// What a host does with an alert.
 using TAlertHandler = std::function<void(const CAlert&)>;
 
 /// Lets a host show alerts by its own means; an empty handler brings the default back, which writes

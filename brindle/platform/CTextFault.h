@@ -12,6 +12,7 @@ struct CTextFault {
     std::size_t mLine = 0;
     /// In characters (not bytes) from 1.
     std::size_t mColumn = 0;
+    /// What is wrong, for people, in one line.
     std::string mText;
     /// All else is there and what stands here was left out, such as the other songs of a list. Any
     /// other fault takes the whole result, unless the reading is lenient.

@@ -15,11 +15,14 @@ public:
     bool open(const std::string& path);
     /// Goes on at the end of a file. False when it cannot be opened.
     bool open_for_append(const std::string& path);
+    /// Ends the file; nothing if none is open.
     void close();
 
     /// The time, a separator and the text.
     void append(std::string_view text);
+    /// The text alone.
     void append_plain(std::string_view text);
+    /// The time alone.
     void append_timestamp();
 
     /// The local time as `asctime` writes it, without its line end: "Wed Jun 30 21:49:08 1993".

@@ -13,6 +13,7 @@ namespace brindle {
 /// The steps are those of SplitMix64: a counter that grows by the golden ratio, then mixed.
 class SeededRandom {
 public:
+    /// Equal seeds give equal numbers; any seed will do, 0 too.
     constexpr explicit SeededRandom(std::uint64_t seed) : mState(seed) {}
 
     /// 32 random bits.

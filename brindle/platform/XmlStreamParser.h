@@ -18,6 +18,7 @@ inline constexpr std::size_t kXmlMaxTextLength = 10'000'000;
 class XmlAttributes {
 public:
     XmlAttributes() = default;
+    /// For the parser; the fields are borrowed, five an attribute.
     XmlAttributes(const unsigned char* const* fields, int count) : mFields(fields), mCount(count) {}
 
     /// Value of the attribute; nothing if it is not there. Prefixes of names are not looked at.
@@ -26,6 +27,7 @@ public:
     [[nodiscard]] std::string_view Value(std::string_view name) const {
         return Find(name).value_or(std::string_view());
     }
+    /// The number of attributes.
     [[nodiscard]] int size() const { return mCount; }
     /// Name and value of the n-th attribute, counted from 0.
     [[nodiscard]] std::pair<std::string_view, std::string_view> At(int n) const;
@@ -43,13 +45,17 @@ class XmlStreamParser;
 class XmlStreamDelegate {
 public:
     virtual ~XmlStreamDelegate() = default;
+    /// Before all else; an empty or too long text has only the error.
     virtual void didStartDocument(XmlStreamParser&) {}
     /// Only for a well-formed text.
     virtual void didEndDocument(XmlStreamParser&) {}
+    /// A start tag; name and attributes are valid during the call.
     virtual void didStartElement(XmlStreamParser&, std::string_view name, const XmlAttributes&) = 0;
+    /// An end tag, also of an empty element.
     virtual void didEndElement(XmlStreamParser&, std::string_view name) = 0;
     /// All text between two tags in one piece, white space included; never empty.
     virtual void foundCharacters(XmlStreamParser&, std::string_view text) = 0;
+    /// The text is not well-formed; it is the last event.
     virtual void parseErrorOccurred(XmlStreamParser&, const XmlError&) {}
 };
 
@@ -68,6 +74,7 @@ public:
 
     /// The delegate is not owned. It may be set during a parse: the next event goes to it.
     void setDelegate(XmlStreamDelegate* delegate) { mDelegate = delegate; }
+    /// The delegate that gets the next event; null for none.
     [[nodiscard]] XmlStreamDelegate* delegate() const { return mDelegate; }
 
     /// Whether text is delivered from here on; a delegate that reads few texts saves time by this.
@@ -78,9 +85,11 @@ public:
     /// fault have been delivered. What the delegate throws ends the parse and is passed on.
     bool parse(std::string_view bytes);
 
+    /// The fault that ended the last parse; nothing if it was well-formed.
     [[nodiscard]] const std::optional<XmlError>& parserError() const { return mError; }
-    /// The place that the parse has reached, from 1.
+    /// The line that the parse has reached, from 1; 0 when none is running.
     [[nodiscard]] int lineNumber() const;
+    /// The column in that line, from 1; 0 when none is running.
     [[nodiscard]] int columnNumber() const;
 
 private:
