@@ -28,15 +28,19 @@ enum TMarkovObjectType : std::int32_t {
 /// gap. Those that are no chord hold an undefined chord, of length 1.0 unless they are gaps of
 /// another length.
 struct CMarkovObject {
+    /// A TMarkovObjectType; others are kept as they are.
     std::int32_t mType = TMarkovObjectType_Chord;
     /// -1 unless the symbol is an indexed one.
     std::int32_t mIndex = -1;
+    /// The chord, with its length in beats.
     CHarmAnlsChordWithLength mChord{CHarmAnlsChord{}, 1.0};
+    /// Of a value symbol; the lowest double in others.
     double mValue = std::numeric_limits<double>::lowest();
     /// Take part in equality only.
     std::array<std::uint64_t, 3> mFurtherValues{};
-    std::int32_t mNumber = 1;
+    std::int32_t mNumber = 1;  ///< of a number symbol; 1 in others
 
+    /// A gap takes up time, too.
     [[nodiscard]] constexpr bool IsGap() const { return mType == TMarkovObjectType_Gap; }
     /// Chords and gaps take up time, the other symbols do not.
     [[nodiscard]] constexpr bool HasBeats() const {
@@ -45,6 +49,8 @@ struct CMarkovObject {
     /// The same for equal symbols.
     [[nodiscard]] std::size_t Hash() const;
 
+    /// Writes an object with the type and the chord or the index. Kept: a number or a value is not
+    /// written, and the text of these and of indexed symbols is no strict JSON.
     void AppendJSONString(std::ostream& stream) const;
 
     /// Reads a symbol from a dictionary.
@@ -65,15 +71,19 @@ struct CMarkovObject {
     friend bool operator<(const CMarkovObject& a, const CMarkovObject& b);
 };
 
+/// Writes type, index and chord, for debugging.
 std::ostream& operator<<(std::ostream& stream, const CMarkovObject& object);
 
+/// A symbol of that type with the defaults of all other fields.
 [[nodiscard]] constexpr CMarkovObject MarkovObjectOfType(TMarkovObjectType type) {
     CMarkovObject object;
     object.mType = type;
     return object;
 }
 
+/// Stands before a sequence, as often as the history is long.
 inline constexpr CMarkovObject CMarkovObject_Start = MarkovObjectOfType(TMarkovObjectType_Start);
+/// Stands behind a sequence, as often as the history is long.
 inline constexpr CMarkovObject CMarkovObject_End = MarkovObjectOfType(TMarkovObjectType_End);
 /// The plain gap, of one beat.
 inline constexpr CMarkovObject CMarkovObject_Gap = MarkovObjectOfType(TMarkovObjectType_Gap);

@@ -30,14 +30,17 @@ using MarkovIterator = std::list<CMarkovStoredObject>::const_iterator;
 
 /// The order of tables, which compare their symbols and never where these are stored.
 struct CMarkovLess {
+    /// Whether `a` comes before `b`, both of a store and not its end.
     bool operator()(MarkovIterator a, MarkovIterator b) const { return *a < *b; }
 };
 
 /// Symbols in the order of time.
 using MarkovSequence = std::vector<MarkovIterator>;
+/// The same without owning them.
 using MarkovSequenceView = std::span<const MarkovIterator>;
 /// The probability, or another weight, of each symbol. Filled in order, then asked.
 using MarkovProbabilities = boost::container::flat_map<MarkovIterator, double, CMarkovLess>;
+/// Symbols that order alike are one.
 using MarkovSymbolSet = boost::container::flat_set<MarkovIterator, CMarkovLess>;
 
 /// The store of symbols: a list without repetitions, in the order in which the symbols came.
@@ -49,7 +52,9 @@ public:
     // Tables hold iterators, so a copy would point into the list that it was made from.
     CMarkovObjects(const CMarkovObjects&) = delete;
     CMarkovObjects& operator=(const CMarkovObjects&) = delete;
+    /// Symbols keep their iterators; the end of the list is another one then.
     CMarkovObjects(CMarkovObjects&&) = default;
+    /// The same.
     CMarkovObjects& operator=(CMarkovObjects&&) = default;
     ~CMarkovObjects() = default;
 
@@ -60,10 +65,15 @@ public:
     /// The symbol at a place counted from 0; the end of the list outside of it.
     [[nodiscard]] MarkovIterator At(std::int64_t place) const;
 
+    /// The first symbol of the store.
     [[nodiscard]] MarkovIterator begin() const { return mList.begin(); }
+    /// The end, which stands for "no symbol".
     [[nodiscard]] MarkovIterator end() const { return mList.end(); }
+    /// How many symbols there are.
     [[nodiscard]] std::size_t size() const { return mList.size(); }
+    /// Whether there is none.
     [[nodiscard]] bool empty() const { return mList.empty(); }
+    /// Removes all symbols; every iterator is dead then.
     void Clear();
 
     /// An array of the symbols in list order.

@@ -13,7 +13,7 @@ namespace brindle {
 struct CMarkovTransitions {
     /// Oldest symbol first. Lives as long as the map.
     MarkovSequenceView mHistory;
-    MarkovCounts mCounts;
+    MarkovCounts mCounts;  ///< what followed; empty for a history that nothing has followed yet
 };
 
 /// The counts of a model: a map from histories of all lengths to the counts of what followed.
@@ -30,6 +30,7 @@ public:
     CMarkovTransitionMap& operator=(const CMarkovTransitionMap&) = delete;
     /// Leaves the other map empty.
     CMarkovTransitionMap(CMarkovTransitionMap&& other) noexcept { Swap(other); }
+    /// The same; what this map held is gone.
     CMarkovTransitionMap& operator=(CMarkovTransitionMap&& other) noexcept;
     ~CMarkovTransitionMap() = default;
 
@@ -43,15 +44,18 @@ public:
 
     /// The number of histories.
     [[nodiscard]] std::size_t size() const { return mSize; }
+    /// Whether no history was seen.
     [[nodiscard]] bool empty() const { return mSize == 0; }
 
     /// All entries, their histories in lexicographic order, a shorter one before its continuations;
     /// or those of one length.
     [[nodiscard]] std::vector<const CMarkovTransitions*> InOrder() const;
+    /// The entries with a history of this many symbols, in that order.
     [[nodiscard]] std::vector<const CMarkovTransitions*> InOrder(std::size_t length) const;
     /// The same without order.
     [[nodiscard]] std::vector<const CMarkovTransitions*> OfLength(std::size_t length) const;
 
+    /// Forgets all histories; what Find and InOrder gave is dead then.
     void Clear();
 
 private:

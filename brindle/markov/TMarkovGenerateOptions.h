@@ -14,8 +14,10 @@ struct TMarkovGenerateOptions {
     /// The wanted sequence: its chords are fixed, its gaps are to be filled. Free generation takes
     /// only its length.
     MarkovSequence mTemplate;
-    /// Longest and shortest history to try.
+    /// Longest history to try, in symbols: 1 to that of the model.
     std::uint64_t mMaxHistoryLength = 0;
+    /// Shortest history to try under a template and for the ending, 1 to the longest one; free
+    /// generation goes down to 1 whatever it is.
     std::uint64_t mMinHistoryLength = 0;
     /// History length for evidence and for reaching a fixed symbol.
     std::uint64_t mEvidenceHistoryLength = 0;

@@ -45,6 +45,7 @@ struct CMarkovSearchLimits {
 /// A model is used by one caller at a time: learning and asking share one window of symbols.
 class VariableLengthMarkovModel {
 public:
+    /// Gives 32 random bits a call.
     using RandomSource = std::function<std::uint32_t()>;
 
     /// The counts.
@@ -55,12 +56,16 @@ public:
     MarkovSequence mHistory;
     /// All symbols since QueryStartSequence, start symbols included.
     MarkovSequence mQuerySymbols;
+    /// The store of the symbols that all of these point into.
     CMarkovObjects mObjects;
 
+    /// An empty model. `maxHistoryLength` is N; a model of 0 learns nothing.
     explicit VariableLengthMarkovModel(std::uint64_t maxHistoryLength = 0);
     /// Where random numbers come from, 32 bits each; an empty one is the operating system.
     void SetRandomSource(RandomSource source);
+    /// Replaces the limits that end a search which finds nothing.
     void SetSearchLimits(const CMarkovSearchLimits& limits) { mSearchLimits = limits; }
+    /// The limits in force.
     [[nodiscard]] const CMarkovSearchLimits& SearchLimits() const { return mSearchLimits; }
 
     // Learning. A sequence is StartSequence, LearnAddSymbol for each symbol, EndSequence.
@@ -82,19 +87,25 @@ public:
     void Subvector(std::uint64_t n, MarkovSequenceView source, MarkovSequence& out);
     /// The same of the window, n limited to 1 up to N.
     void HistorySubvector(std::uint64_t n, MarkovSequence& out);
+    /// Limits `n` to 1 up to N; 0 for a model of 0.
     void ValidateHistoryLength(std::uint64_t& n) const;
 
     // Tables. They are empty for a history that was never seen.
 
+    /// The counts behind the last n symbols of the window, n limited to 1 up to N.
     void TransitionFrequenciesForNextSymbol(std::uint64_t n, MarkovCounts& out);
+    /// The same for the whole window.
     void TransitionFrequenciesForNextSymbol(MarkovCounts& out);
     /// The counts over their sum, without the start symbol. No smoothing, no shorter histories.
     void ProbabilitiesForNextSymbol(MarkovSequenceView history, MarkovProbabilities& out) const;
     /// For the last n symbols of the window.
     void ProbabilitiesForNextSymbol(std::uint64_t n, MarkovProbabilities& out);
+    /// For the whole window.
     void ProbabilitiesForNextSymbol(MarkovProbabilities& out) const;
+    /// Adds the count of the pair to that of its symbol.
     static void MapAddToOrInsert(MarkovCounts& map,
                                  const std::pair<MarkovIterator, std::uint32_t>& entry);
+    /// The sum of all values: 1 for a table without start symbols, 0 for an empty one.
     [[nodiscard]] static double SumProbabilities(const MarkovProbabilities& map);
     /// In natural units; 0 for an empty table, not a number for one with a zero in it.
     [[nodiscard]] static double CalculateEntropy(const MarkovProbabilities& map);
@@ -103,8 +114,11 @@ public:
 
     // The query window, which generation moves on.
 
+    /// Empties the query: the window is all start symbols, as before a song.
     void QueryStartSequence();
+    /// Moves the window on by a symbol, which joins the store if it is new. Nothing is counted.
     void QueryAddSymbol(const CMarkovObject& symbol);
+    /// Takes the last symbol back; nothing if the window is empty.
     void QueryRemoveLastItem();
 
     // Choosing. Each choice draws two random numbers and uses the second.
@@ -117,6 +131,7 @@ public:
                                      TMarkovSampledSequence& out) const;
     /// Turns logarithms into weights of which the largest is 1.
     static void NormalizeLogProbabilities(std::vector<CMarkovWeightedSequence>& sequences);
+    /// Takes out the symbols that the set has; those left keep their values.
     static void RemoveItemsFromProbabilities(MarkovProbabilities& map,
                                              const MarkovSymbolSet& symbols);
     /// Takes out the end symbol and the chords that are longer than `remaining` beats.
@@ -135,6 +150,7 @@ public:
     /// learned, gets a weight below e^-700.
     void GenerateSequenceWithFixedLength(std::uint64_t length, TMarkovSampledSequence& sequence,
                                          const TMarkovGenerateOptions& options);
+    /// The same with the longest history of the model.
     void GenerateSequenceWithFixedLength(TMarkovSampledSequence& sequence,
                                          const TMarkovGenerateOptions& options);
 
@@ -178,6 +194,7 @@ public:
     bool SaveToFile(const std::string& path) const;
     /// The text of a model file.
     void AppendJSONString(std::ostream& stream) const;
+    /// Writes the histories of length N with their counts, symbols by the converter's indices.
     void TransitionMapAppendToJSON(std::ostream& stream, CIteratorIndexConverter& converter) const;
 
     /// Reads a model from a file.
@@ -192,8 +209,10 @@ public:
         /// Fills the model from what stands under "VariableLengthMarkovModel".
         static void VariableLengthMarkovModelFromJSONDictionary(const nlohmann::json& dictionary,
                                                                 VariableLengthMarkovModel& model);
+        /// Reads what TransitionMapAppendToJSON wrote; entries that make no sense are left out.
         [[nodiscard]] static CMarkovTransitionMap MarkovTransitionMapFromJSONDictionary(
             const nlohmann::json& dictionary, CIteratorIndexConverter& converter);
+        /// Reads the window under "History"; indices that no symbol has are left out.
         static void HistoryFromJSONDictionary(const nlohmann::json& dictionary,
                                               MarkovSequence& history,
                                               CIteratorIndexConverter& converter);
