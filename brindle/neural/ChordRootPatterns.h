@@ -12,10 +12,10 @@ namespace brindle {
 
 /// A chord shape that the net learns to hear the root of.
 struct CChordShape {
-    std::string_view mName;
-    CSemitones mTones;      ///< above the root, folded into one octave
-    bool mIsOfCatalogue;    ///< of the usual shapes, not one of the further ones
-    bool mIsSecondReading;  ///< loses to another shape with the same notes if no root is lowest
+    std::string_view mName;  ///< "minor", in English
+    CSemitones mTones;       ///< above the root, folded into one octave
+    bool mIsOfCatalogue;     ///< of the usual shapes, not one of the further ones
+    bool mIsSecondReading;   ///< loses to another shape with the same notes if no root is lowest
 };
 
 /// All shapes: the usual ones in the order of the chord catalogue, then the further ones.
@@ -34,7 +34,7 @@ struct CChordRootPattern {
     std::uint32_t mInputs = 0;  ///< bit i: a note i semitones above the lowest, modulo 24
     int mRootIntvl = 0;         ///< 0 to 11 semitones from the lowest note up to the root
     std::size_t mShape = 0;     ///< index in ChordShapes() of the shape that it counts as
-    TOmission mOmission = TOmission_None;
+    TOmission mOmission = TOmission_None;  ///< what is left out of the shape
     bool mIsOfCatalogue = false;  ///< whether it is a voicing of a usual shape, nothing left out
 
     friend constexpr bool operator==(const CChordRootPattern&, const CChordRootPattern&) = default;

@@ -37,20 +37,20 @@ inline constexpr int kMaxHiddenLayers = 5;
 
 /// What all neurons of a net have in common.
 struct TNeuronProp {
-    INPUT_TYPE mInputType = INPUT_SUM;
-    ACT_TYPE mActType = ACT_SIGM;
-    double mActivationSlope = 1.0;
-    double mActivationThreshold = 0.0;
-    OUTPUT_TYPE mOutputType = OUTPUT_NONE;
-    double mOutputThreshold = 0.0;
+    INPUT_TYPE mInputType = INPUT_SUM;      ///< how inputs and weights are joined
+    ACT_TYPE mActType = ACT_SIGM;           ///< how excited the result makes it
+    double mActivationSlope = 1.0;          ///< the slope s of the activation
+    double mActivationThreshold = 0.0;      ///< the threshold t of the activation
+    OUTPUT_TYPE mOutputType = OUTPUT_NONE;  ///< what is handed on
+    double mOutputThreshold = 0.0;          ///< where OUTPUT_BIN goes over to 1.0
 
     friend constexpr bool operator==(const TNeuronProp&, const TNeuronProp&) = default;
 };
 
 /// The two ends of a net, which the task fixes.
 struct TFixedNetProp {
-    int mInputNeuronCount = 0;
-    int mOutputNeuronCount = 0;
+    int mInputNeuronCount = 0;   ///< length of the input vector
+    int mOutputNeuronCount = 0;  ///< length of the output vector
 
     friend constexpr bool operator==(const TFixedNetProp&, const TFixedNetProp&) = default;
 };
@@ -59,7 +59,7 @@ struct TFixedNetProp {
 struct TDynNetProp {
     int mHiddenLayerCount = 0;                                 ///< 0 to kMaxHiddenLayers
     std::array<int, kMaxHiddenLayers> mHiddenLayerSizes = {};  ///< neurons, from the input on
-    TNeuronProp mNeuronProp;
+    TNeuronProp mNeuronProp;  ///< of all neurons, output neurons too
 
     friend constexpr bool operator==(const TDynNetProp&, const TDynNetProp&) = default;
 };
@@ -67,17 +67,17 @@ struct TDynNetProp {
 /// A net as a constant: its shape and, in the order of NeuronalNet::get_weights, its weights.
 /// The weights are borrowed and must live as long as the record is used.
 struct TPredefinedWeights {
-    TFixedNetProp mFixedNetProp;
-    TDynNetProp mDynNetProp;
-    std::span<const double> mWeights;
+    TFixedNetProp mFixedNetProp;       ///< the ends of the net
+    TDynNetProp mDynNetProp;           ///< what stands between them
+    std::span<const double> mWeights;  ///< one a connection, no bias
 };
 
 /// An example to learn from: what goes in and what should come out.
 struct training_pattern {
-    std::vector<double> mInputs;
-    std::vector<double> mOutputs;
-    int mTag = 0;  ///< for the caller's own use; training does not read it
-    std::string mTellingName;
+    std::vector<double> mInputs;   ///< one value an input neuron
+    std::vector<double> mOutputs;  ///< the wanted value of each output neuron
+    int mTag = 0;                  ///< for the caller's own use; training does not read it
+    std::string mTellingName;      ///< for people, in reports
 };
 
 }  // namespace brindle

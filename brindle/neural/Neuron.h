@@ -45,20 +45,20 @@ public:
     /// The start weight that a random integer stands for: 0.01 to 0.99, or 0.1.
     [[nodiscard]] static double WeightFromRandomNumber(std::uint32_t number);
 
-    std::int32_t mWeightCount = 0;
-    double mValue = 0.0;     ///< output of the last calculation
-    double mExpTerm = 0.0;   ///< exp() term of the logistic, from calcVec's fast path only
-    double mNetInput = 0.0;  ///< net input of the last calculation
-    std::vector<double> mWeights;
+    std::int32_t mWeightCount = 0;  ///< how many inputs it reads
+    double mValue = 0.0;            ///< output of the last calculation
+    double mExpTerm = 0.0;          ///< exp() term of the logistic, from calcVec's fast path only
+    double mNetInput = 0.0;         ///< net input of the last calculation
+    std::vector<double> mWeights;   ///< one an input, of any sign and size
 
-    static inline INPUT_TYPE input_type = INPUT_SUM;
-    static inline ACT_TYPE activation_type = ACT_SIGM;
-    static inline OUTPUT_TYPE output_type = OUTPUT_NONE;
+    static inline INPUT_TYPE input_type = INPUT_SUM;      ///< how x and w are joined
+    static inline ACT_TYPE activation_type = ACT_SIGM;    ///< how excited the result makes it
+    static inline OUTPUT_TYPE output_type = OUTPUT_NONE;  ///< what is handed on
     /// (`activation_type` + `output_type` * 4) * 5 + `input_type`; 0 is the fast path.
     static inline int combined_type = 0;
-    static inline double activation_slope = 1.0;
-    static inline double activation_threshold = 0.0;
-    static inline double output_threshold = 0.0;
+    static inline double activation_slope = 1.0;      ///< the slope s, see ACT_TYPE
+    static inline double activation_threshold = 0.0;  ///< the threshold t, see ACT_TYPE
+    static inline double output_threshold = 0.0;      ///< where OUTPUT_BIN goes over to 1.0
     /// Adds 0.1 to the logistic's derivative, so that a neuron at its limits still learns.
     static inline bool flat_spot_elimination = true;
     /// Gives the start weights and the order of training patterns. Set it to repeat a run.

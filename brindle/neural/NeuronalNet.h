@@ -29,10 +29,14 @@ namespace brindle {
 /// may build, train or use nets at the same time.
 class NeuronalNet {
 public:
+    /// A net with random weights. `hiddenSizes` are the neurons of each hidden layer, from the
+    /// input on.
     NeuronalNet(int inputCount, std::span<const int> hiddenSizes, int outputCount,
                 INPUT_TYPE inputType, ACT_TYPE actType, double slope, double threshold,
                 OUTPUT_TYPE outputType, double outputThreshold);
+    /// The same from records.
     NeuronalNet(const TFixedNetProp& fixedNetProp, const TDynNetProp& dynNetProp);
+    /// A net with known weights, which are copied.
     explicit NeuronalNet(const TPredefinedWeights& predefined);
     /// As `predefined`, with `weights` in place of its own.
     NeuronalNet(const TPredefinedWeights& predefined, std::span<const double> weights);
@@ -45,6 +49,8 @@ public:
     /// Runs the net on `inputs`: at least get_input_neuron_count() values; where there are fewer,
     /// the others keep their last value.
     void use(const std::vector<double>& inputs);
+    /// Sets the input vector without a run. Values beyond it are left out; where there are fewer,
+    /// the others keep their last value.
     void setInput(const std::vector<double>& inputs);
 
     /// Values of the output neurons after the last run.
@@ -52,9 +58,13 @@ public:
     /// Index of the output neuron with the greatest value, the lower one if two are equal; 0 if
     /// there is none.
     [[nodiscard]] std::size_t winner() const;
+    /// The length of the input vector.
     [[nodiscard]] int get_input_neuron_count() const;
+    /// The ends of the net, without negative counts.
     [[nodiscard]] const TFixedNetProp& get_fixed_net_prop() const { return mFixedNetProp; }
+    /// What stands between them; the sizes of layers that are not there are 0.
     [[nodiscard]] const TDynNetProp& get_dyn_net_prop() const { return mDynNetProp; }
+    /// All weights in their order, as acquire_weights takes them.
     [[nodiscard]] std::vector<double> get_weights() const;
     /// Copies the weights if every property of the record is that of this net; otherwise returns
     /// false and changes nothing. The length of the array is not looked at: where it is too short,
@@ -63,11 +73,17 @@ public:
 
     /// For all neurons of the process; every net that is built turns it on again.
     static void enable_flat_spot_elimination(bool isEnabled);
+    /// How much of the change before goes into the next one, 0 for none; 0.6 at first.
     void set_momentum_amount(double amount) { mMomentumAmount = amount; }
+    /// The momentum in force.
     [[nodiscard]] double get_momentum_amount() const { return mMomentumAmount; }
+    /// The size of a training step; 1.0 at first, and what batch_train was given after it.
     void set_learning_factor(double factor) { mLearningFactor = factor; }
+    /// The factor in force.
     [[nodiscard]] double get_learning_factor() const { return mLearningFactor; }
+    /// Most cycles of batch_train; 10000 at first.
     void set_cycle_limit(int limit) { mCycleLimit = limit; }
+    /// The limit in force.
     [[nodiscard]] int get_cycle_limit() const { return mCycleLimit; }
 
     /// One step of back-propagation with the present learning factor and momentum. Returns the
@@ -96,12 +112,16 @@ public:
     /// false and leaves the net unchanged if the file cannot be opened or asks for a layer of more
     /// than kMaxLoadedLayerSize neurons or for more than kMaxLoadedWeights weights.
     bool load_net_properties_from_file(const char* path);
+    /// The same from a stream.
     bool load_net_properties(std::istream& stream);
     /// Reads weights from the lines behind "weight definitions", one each; a short file leaves the
     /// others as they are. Prints each. Returns false if the file cannot be opened.
     bool load_weights_from_file(const char* path);
+    /// The same from a stream.
     void load_weights(std::istream& stream);
+    /// Most neurons of a layer that a file may ask for.
     static constexpr int kMaxLoadedLayerSize = 1 << 16;
+    /// Most weights that a file may ask for.
     static constexpr std::int64_t kMaxLoadedWeights = 1 << 20;
 
     /// Prints the properties of the net to standard output.
