@@ -23,7 +23,8 @@ public:
     static constexpr int kDefaultWrapIntvl = 24;
 
     CIntvlSet() = default;
-    /// @cond (doxygen takes this for other members)
+    // Doxygen takes this constructor for other members.
+    /// @cond
     template <std::same_as<int>... Rest>
     explicit(sizeof...(Rest) == 0) CIntvlSet(int first, Rest... rest) {
         SetIntvls(first, rest...);
