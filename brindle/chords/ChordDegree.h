@@ -16,6 +16,7 @@ struct CChordDegree {
     /// the seventh without a sign is the major one.
     int mSigns = 0;
 
+    /// Whether it is no degree.
     [[nodiscard]] constexpr bool IsUndef() const { return mNumber == 0; }
     /// Semitones above the root, 0 to 11; -1 for none.
     [[nodiscard]] constexpr int Tone() const {

@@ -16,9 +16,12 @@ namespace brindle::ChordSymbol {
 class CKeywords {
 public:
     template <class... T>
+    /// One to six keywords; text literals, which live as long as the program.
     consteval explicit CKeywords(T... texts) : mTexts{texts...}, mCount(sizeof...(texts)) {}
 
+    /// The first keyword.
     [[nodiscard]] constexpr const std::string_view* begin() const { return mTexts.data(); }
+    /// One behind the last keyword.
     [[nodiscard]] constexpr const std::string_view* end() const { return mTexts.data() + mCount; }
 
 private:
@@ -30,26 +33,34 @@ private:
 using TIntvls = std::uint32_t;
 
 template <class... T>
+/// The mask of intervals of 0 to 23 semitones: `Intvls(4, 14)` is a third and a ninth.
 [[nodiscard]] consteval TIntvls Intvls(T... intvls) {
     return (TIntvls{0} | ... | (TIntvls{1} << intvls));
 }
 
+/// For the undefined chord.
 inline constexpr CKeywords kUndefKeywords("undef", "-");
+/// For "No Chord Force".
 inline constexpr CKeywords kNoChordForceKeywords("nochordforce");
+/// For "No Chord Yield".
 inline constexpr CKeywords kNoChordYieldKeywords("nochordyield", "nochord");
 
+/// A second in place of the third.
 inline constexpr CKeywords kSus2Keywords("sus 2", "sus2", "s 2", "s2");
+/// A fourth in place of the third.
 inline constexpr CKeywords kSus4Keywords("sus 4", "sus4", "sus", "s 4", "s4");
+/// A major seventh.
 inline constexpr CKeywords kMaj7Keywords("maj 7", "maj7", "ma 7", "ma7", "j 7", "j7");
+/// A major seventh with its ninth.
 inline constexpr CKeywords kMaj9Keywords("maj 9", "maj9", "ma 9", "ma9", "j 9", "j9");
 
 /// The words of a basic chord.
 struct CBasicChordRow {
-    CKeywords mKeywords;
-    TBasicChord mBasicChord;
+    CKeywords mKeywords;      ///< the longer one first
+    TBasicChord mBasicChord;  ///< what they mean
 };
 
-// Behind the root. There is no word for major: it is what remains.
+/// The basic chords behind the root. There is no word for major: it is what remains.
 inline constexpr auto kBasicChordRows = std::to_array<CBasicChordRow>({
     {CKeywords("min", "mi", "m", "-"), TBasicChord::Minor},
     {CKeywords("aug"), TBasicChord::Augmented},
@@ -61,21 +72,24 @@ inline constexpr auto kBasicChordRows = std::to_array<CBasicChordRow>({
 
 /// The words of an option and what it does to the tones of the chord, in semitones above the root.
 struct COptionRow {
-    CKeywords mKeywords;
+    CKeywords mKeywords;  ///< the longer one first
+    /// Tones that the option always brings.
     TIntvls mAdd;
     /// Added too when no option before this one has added anything: C9 and C13 bring the sevenths
     /// and ninths below them, C6 9 does not.
     TIntvls mAddIfFirst;
+    /// Tones that it takes away.
     TIntvls mErase;
     /// Added in place of `mAdd` to a diminished chord.
     TIntvls mAddIfDiminished = mAdd;
 };
 
+/// The thirds, which a suspension and the bare fifth take away.
 inline constexpr TIntvls kThirds = Intvls(3, 4);
 
-// The options in the order in which they are tried at each place of the symbol.
-// Kept: "b9" brings a minor seventh even as "add b9", "5" takes the thirds away, and "b13" leaves
-// the fifth alone where "#5" removes it.
+/// The options in the order in which they are tried at each place of the symbol.
+/// Kept: "b9" brings a minor seventh even as "add b9", "5" takes the thirds away, and "b13" leaves
+/// the fifth alone where "#5" removes it.
 // clang-format off
 inline constexpr auto kOptionRows = std::to_array<COptionRow>({
     // keywords                                     add             if first        erase
@@ -105,6 +119,7 @@ inline constexpr auto kOptionRows = std::to_array<COptionRow>({
 });
 // clang-format on
 
+/// Whether the keywords of each row keep the rules of SetFromStringHelper.
 template <class TRows>
 consteval bool KeywordListsAreWellFormed(const TRows& rows) {
     for (const auto& row : rows) {

@@ -30,10 +30,11 @@ struct CNamingOptions {
     /// The key of the piece; undefined if it is not known. A tonic without spelling (`TEnh_Undef`)
     /// is spelled with the fewest signs.
     CSignKeyLite mKey;
-    /// Root keys of the chords before and behind, 0 to 11; `kKeyNrUndef` if they are not known.
+    /// Root key of the chord before, 0 to 11; `kKeyNrUndef` if it is not known.
     int mPreviousRoot = kKeyNrUndef;
+    /// The same of the chord behind.
     int mNextRoot = kKeyNrUndef;
-    TBassUse mBass = TBassUse::Usual;
+    TBassUse mBass = TBassUse::Usual;  ///< what the lowest note means
     /// What another judge adds for each root key, in tenths of a bit and not negative: see
     /// RootCostsByNet.
     std::array<int, 12> mRootCosts{};
@@ -46,7 +47,7 @@ struct CNamedChord {
     /// Root, bass behind the slash (if there is one) and the tones that sound above the root. A
     /// bass that is foreign to the chord is none of its tones.
     CChordLite mChord;
-    CKeyEnh mRoot;
+    CKeyEnh mRoot;  ///< its root, with the spelling of the name
     /// What stands behind the slash; undefined without one.
     CKeyEnh mBass;
     /// What stands behind the root as people write it, "m7b5": of what is left out only a missing
@@ -54,9 +55,9 @@ struct CNamedChord {
     std::string mSuffix;
     /// The same with all that is left out: "7(no5)".
     std::string mExactSuffix;
-    /// The whole symbols in ASCII, "Dm7/C". ReadChordText reads exactly the notes from the exact
-    /// one.
+    /// The whole symbol in ASCII with mSuffix, "Dm7/C".
     std::string mSymbol;
+    /// The same with mExactSuffix: ReadChordText reads exactly the notes from it.
     std::string mExactSymbol;
     /// The notes from the lowest one up, each once, spelled as tones of this chord.
     std::vector<CNote> mNotes;

@@ -35,6 +35,7 @@ struct CChordTextOptions {
 
 /// What ReadChordText makes of a text.
 struct CChordTextReading {
+    /// Chord, no chord, repeat, or not understood.
     TChordTextKind mKind = TChordText_NotUnderstood;
     /// Chord: root, bass and exact semitones; a bass on the root's key is none. NoChord: "No Chord
     /// Yield" or "No Chord Force", or undefined for the word `undef`. Otherwise undefined.
@@ -57,10 +58,11 @@ struct CChordTextReading {
 };
 
 /// Reads a chord symbol as people write it: `Cmaj`, `Co7`, `CΔ`, `C-7`, `F♯m7♭5`, `C7alt/E`,
-/// `Ab:min7/b3`, `N.C.`.
+/// `Ab:min7/b3`.
 ///
-/// It knows the whole of its grammar and tells what it does not understand, where
-/// CChordSetFromStringHelper steps over it. Time is linear in the length of the text.
+/// It knows the whole of its grammar, "N.C." for no chord too, and tells what it does not
+/// understand, where CChordSetFromStringHelper steps over it. Time is linear in the length of the
+/// text.
 [[nodiscard]] CChordTextReading ReadChordText(std::string_view text,
                                               const CChordTextOptions& prefs = {});
 

@@ -18,7 +18,7 @@ enum TNoteNaming : std::uint8_t {
 
 /// How a chord symbol is written. The default is what people type: `Bbm7b5`.
 struct CChordSymbolStyle {
-    TNoteNaming mNotes = TNoteNaming_Letters;
+    TNoteNaming mNotes = TNoteNaming_Letters;  ///< letters, German names or syllables
     /// The signs U+266F and U+266D: `B♭m7♭5`.
     bool mUnicodeSigns = false;
 };
