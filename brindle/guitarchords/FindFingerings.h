@@ -21,8 +21,9 @@ enum class TFingeringBass : std::uint8_t {
     Free,      ///< any tone of the chord
 };
 
-/// Highest fret and most strings of a search.
+/// Highest fret of a search.
 inline constexpr int kFingeringMostFrets = 24;
+/// Most strings of a search.
 inline constexpr int kFingeringMostStrings = 12;
 
 /// What a hand and its player allow. Values out of their ranges are taken as the nearest.
@@ -31,9 +32,9 @@ struct CFingeringOptions {
     int mCapo = 0;
     /// The last fret of the neck, not counted from the capodaster. 1 to kFingeringMostFrets.
     int mHighestFret = 15;
-    /// So many frets lie under the hand, 2 to 7; from position 7 on mSpanUpTheNeck, since frets are
-    /// narrower there.
+    /// So many frets lie under the hand, 2 to 7, below position 7.
     int mSpan = 4;
+    /// The same from position 7 on, since frets are narrower there.
     int mSpanUpTheNeck = 5;
     /// A bit for each string that may be muted.
     std::uint32_t mMutable = 0xFFFF;
@@ -43,6 +44,7 @@ struct CFingeringOptions {
     bool mMayOmitTones = true;
     /// Whether the root may be left out, too, for a player who has somebody at the bass.
     bool mMayOmitRoot = false;
+    /// What the lowest note has to be.
     TFingeringBass mBass = TFingeringBass::Usual;
     /// Most fingerings that are wanted, the best ones. At most 1000.
     std::size_t mLimit = 100;

@@ -27,10 +27,12 @@ class GChTuning;
 /// are valid until the fingering changes. Not to be changed while another thread reads it.
 class GChBasicChord {
 public:
+    /// An empty fingering; the tuning is kept as it is, valid or not.
     explicit GChBasicChord(const GChShortTuning& shortTuning);
 
     // Where it belongs
 
+    /// Not owned; done by the library that takes the chord in.
     void setLibrary(const std::shared_ptr<GChLibrary>& library) { mGchLibrary = library; }
     /// Null for a chord that is in no library.
     [[nodiscard]] std::shared_ptr<GChLibrary> gchLibrary() const { return mGchLibrary.lock(); }
@@ -38,33 +40,46 @@ public:
     [[nodiscard]] std::shared_ptr<GChTuning> gchTuning() const;
     /// The tuning that the fingering was made for.
     [[nodiscard]] const GChShortTuning& shortTuning() const { return mShortTuning; }
+    /// Of its own tuning, 0 to 16.
     [[nodiscard]] int numberOfStrings() const;
     /// Unique within the running database, -1 for none.
     [[nodiscard]] std::int32_t dbChordID() const { return mDbChordID; }
+    /// Done by the library that reads it from a file.
     void setDbChordID(std::int32_t id) { mDbChordID = id; }
 
     // What it is
 
-    /// Key number of the root and of the bass, -1 for none. One signed byte each.
+    /// Key number of the root as it is stored, without a capodaster: 0 to 11, -1 for none. One
+    /// signed byte.
     [[nodiscard]] int rootNote() const { return mRootNote; }
+    /// Cut to one signed byte.
     void setRootNote(int root) { mRootNote = static_cast<std::int8_t>(root); }
+    /// Key number of the bass in the same way.
     [[nodiscard]] int bassNote() const { return mBassNote; }
+    /// Cut to one signed byte.
     void setBassNote(int bass) { mBassNote = static_cast<std::int8_t>(bass); }
     /// A CChordTypeId, kept in one signed byte.
     [[nodiscard]] std::int16_t chordType() const { return mChordType; }
+    /// Cut to one signed byte, too: 130 becomes -126.
     void setChordType(int chordType) { mChordType = static_cast<std::int8_t>(chordType); }
     /// A file keeps 0 to 7.
     [[nodiscard]] int difficultyLevel() const { return mDifficultyLevel; }
+    /// Cut to one byte.
     void setDifficultyLevel(int level) { mDifficultyLevel = static_cast<std::uint8_t>(level); }
     /// A name that the user has given, empty for none.
     [[nodiscard]] const std::string& userName() const { return mUserName; }
+    /// An empty name takes it away.
     void setUserName(std::string_view name) { mUserName = name; }
 
     /// A bit for each transpose index, which is taken modulo 32.
     [[nodiscard]] bool isFavoriteForTransposeIndex(int index) const;
+    /// For the index see isFavoriteForTransposeIndex.
     void setIsFavorite(bool isFavorite, int transposeIndex);
+    /// The favorites of all transpose indexes, bit 0 for index 0.
     [[nodiscard]] std::uint32_t isFavoriteMask() const { return mIsFavoriteMask; }
+    /// Replaces them all.
     void setIsFavoriteMask(std::uint32_t mask) { mIsFavoriteMask = mask; }
+    /// No favorite at any index.
     void clearFavoriteMask() { mIsFavoriteMask = 0; }
 
     // Strings
@@ -73,9 +88,13 @@ public:
     [[nodiscard]] bool isMutedForStringIndex(int stringIndex) const;
     /// setMuted:forStringIndex: changes nothing for a string above 7.
     void setMuted(bool isMuted, int stringIndex);
+    /// Bit 0 is the string with the lowest index; as one signed byte.
     [[nodiscard]] std::int8_t isMutedMask() const { return mIsMutedMask; }
+    /// Cut to one signed byte.
     void setIsMutedMask(int mask) { mIsMutedMask = static_cast<std::int8_t>(mask); }
+    /// Whether it sounds without a finger. A string outside 0 to 15 is not open.
     [[nodiscard]] bool isOpenForStringIndex(int stringIndex) const;
+    /// Whether a string of the tuning is open.
     [[nodiscard]] bool hasOpenStrings() const;
     /// How many frets the string sounds above its open pitch: -1 for a muted string and outside
     /// 0 to 15, 0 for an open string. The real element that was put down last on it counts, not
@@ -86,13 +105,17 @@ public:
 
     /// 0 if the whole fingering lies within so many frets from the nut, else its lowest fret.
     [[nodiscard]] int firstShownFretForNumberOfFrets(int frets) const;
-    /// The least fret that is not negative; 0 without elements.
+    /// The least fret that is not negative, 0 for the first one of the neck; 0 also without
+    /// elements.
     [[nodiscard]] int lowestFingeredFret() const;
+    /// Moves every element, as GChChordElem::shiftFretIndexBy does: nothing stops at the nut.
     void shiftFretIndexesBy(int frets);
 
     // Elements, in the order in which they were added. `sender` is not used.
 
+    /// The elements themselves; pointers to them are valid until the fingering changes.
     [[nodiscard]] const std::vector<GChChordElem>& chordElems() const { return mChordElems; }
+    /// How many there are; a file keeps the first 15.
     [[nodiscard]] std::size_t chordElemCount() const { return mChordElems.size(); }
     /// By fret, lowest string, highest string and finger.
     [[nodiscard]] std::vector<GChChordElem> sortedChordElems() const;
@@ -101,12 +124,15 @@ public:
     /// element from string 1 up to string 2. Null, and nothing is added, if it cannot exist.
     GChChordElem* addChordElem(const void* sender, int fingerNumber, int absFretIndex,
                                int stringIndex1, int stringIndex2, std::uint8_t fingerPointType);
+    /// The same for a real point.
     GChChordElem* addChordElem(const void* sender, int fingerNumber, int absFretIndex,
                                int stringIndex1, int stringIndex2);
+    /// A real point on one string.
     GChChordElem* addChordElem(const void* sender, int fingerNumber, int absFretIndex,
                                int stringIndex);
     /// These remove elements of this fingering, told by their address in chordElems().
     void removeChordElem(const GChChordElem* elem);
+    /// All of them at once; a null and an address of another fingering are passed over.
     void removeChordElems(std::span<const GChChordElem* const> elems);
 
     /// The first element at the fret that covers the string, or null.
@@ -115,14 +141,19 @@ public:
     [[nodiscard]] const GChChordElem* spotAtAbsFretIndex(int absFretIndex, int stringIndex) const;
     /// The single spot with the highest fret on the string, the first of several.
     [[nodiscard]] const GChChordElem* realSpotAtMaxIndexForStringIndex(int stringIndex) const;
+    /// The same among optional points.
     [[nodiscard]] const GChChordElem* optionalSpotAtMaxIndexForStringIndex(int stringIndex) const;
 
+    /// Whether there is a single spot at that string and fret, real or optional.
     [[nodiscard]] bool hasSingleSpot(const void* sender, int strIndex, int fretIndex) const;
+    /// The same with that finger.
     [[nodiscard]] bool hasSingleSpot(const void* sender, int strIndex, int fretIndex,
                                      int fingerNum) const;
-    // An element over exactly these strings, in any order; with one string a single spot counts.
+    /// Whether there is an element at the fret over exactly these strings, in any order; with one
+    /// string a single spot counts.
     [[nodiscard]] bool hasBarreSpot(const void* sender, int strIndex0, int strIndex1,
                                     int fretIndex) const;
+    /// The same with that finger.
     [[nodiscard]] bool hasBarreSpot(const void* sender, int strIndex0, int strIndex1, int fretIndex,
                                     int fingerNum) const;
     /// The fret of the first such element, or -1.
@@ -133,12 +164,18 @@ public:
 
     // Single spots of a string: all, optional ones, real ones
 
+    /// All, on one string; 0 for a negative index.
     [[nodiscard]] int numberOfSpotsForStringIndex(int stringIndex) const;
+    /// Those of GChFingerPointType_Optional.
     [[nodiscard]] int numberOfOptionalSpotsForStringIndex(int stringIndex) const;
+    /// Those of GChFingerPointType_Real.
     [[nodiscard]] int numberOfRealSpotsForStringIndex(int stringIndex) const;
-    // With `onlyLastElement` these remove only the spot with the highest fret.
+    /// Removes those of all kinds from a string; with `onlyLastElement` only the one with the
+    /// highest fret.
     void removeSpotsForStringIndex(int stringIndex, bool onlyLastElement);
+    /// The same of the optional ones.
     void removeOptionalSpotsForStringIndex(int stringIndex, bool onlyLastElement);
+    /// The same of the real ones.
     void removeRealSpotsForStringIndex(int stringIndex, bool onlyLastElement);
 
     // The whole
@@ -155,10 +192,12 @@ public:
     /// one of the root as stored and the pitches under the capodaster; nothing for a root above 11.
     [[nodiscard]] std::optional<std::string> chordName(int enhType, int capodasterOffset) const;
 
+    /// All that a file keeps, by name, and the pitches of the tuning.
     [[nodiscard]] nlohmann::json propertyList() const;
 
     // Its chunk in a library file (the layout is in internal/LibraryFile.h)
 
+    /// Bytes of the chunk, its own size field included.
     [[nodiscard]] std::size_t chordChunkSize() const;
     /// writeChordChunkToBuffer:remLength: the size of the chunk, 0 if it does not fit.
     ///

@@ -25,40 +25,60 @@ inline constexpr int kGChMaxElements = 15;
 /// a GChTuningDescr.
 class GChChordDescr {
 public:
+    /// Makes it a fingering without elements, of no chord.
     void clearDataFields() { *this = {}; }
+    /// The same as assigning.
     void setToChordDescr(const GChChordDescr& other) { *this = other; }
 
     /// addFingerNum:absFret:minStrIndex:maxStrIndex:fingerPointType: false, and nothing is added,
     /// for a 16th element and for one that cannot exist.
     bool addFingerNum(int fingerNum, int absFret, int minStrIndex, int maxStrIndex,
                       std::uint8_t fingerPointType);
+    /// The same for a real point.
     bool addFingerNum(int fingerNum, int absFret, int minStrIndex, int maxStrIndex);
+    /// A real point on one string.
     bool addFingerNum(int fingerNum, int absFret, int strIndex);
 
+    /// 0 to kGChMaxElements.
     [[nodiscard]] int numberOfElements() const { return mNumberOfElements; }
     /// In the order in which they were added.
     [[nodiscard]] std::vector<GChChordElemDescr> chordElems() const;
     /// By fret alone; those on one fret keep their order.
     [[nodiscard]] std::vector<GChChordElemDescr> chordElemsSortedByFret() const;
-    /// Without elements what the first one had last, 0 at first.
+    /// The least fret of the elements, 0 being the first of the neck; 0 without elements.
     [[nodiscard]] int lowestAbsFretIndex() const;
 
+    /// 0 is the easiest.
     [[nodiscard]] int difficultyLevel() const { return mDifficultyLevel; }
+    /// Cut to one byte.
     void setDifficultyLevel(int level) { mDifficultyLevel = static_cast<std::uint8_t>(level); }
+    /// Carried for the host; nothing here reads it.
     [[nodiscard]] int transposeRange() const { return mTransposeRange; }
+    /// Cut to one byte.
     void setTransposeRange(int range) { mTransposeRange = static_cast<std::uint8_t>(range); }
+    /// Key number, 0 to 11; -1 for none.
     [[nodiscard]] int rootNote() const { return mRootNote; }
+    /// Cut to one signed byte.
     void setRootNote(int root) { mRootNote = static_cast<std::int8_t>(root); }
+    /// Key number, 0 to 11; -1 for none.
     [[nodiscard]] int bassNote() const { return mBassNote; }
+    /// Cut to one signed byte.
     void setBassNote(int bass) { mBassNote = static_cast<std::int8_t>(bass); }
+    /// A CChordTypeId; 0 at first.
     [[nodiscard]] std::int16_t chordType() const { return mChordType; }
+    /// Cut to one signed byte.
     void setChordType(int chordType) { mChordType = static_cast<std::int8_t>(chordType); }
+    /// False for a string outside 0 to 15.
     [[nodiscard]] bool isMutedForStringIndex(int stringIndex) const;
     /// setMuted:forStringIndex: for index 0 to 15.
     void setMuted(bool isMuted, int stringIndex);
+    /// The favorites, a bit for each transpose index.
     [[nodiscard]] std::uint32_t isFavoriteMask() const { return mIsFavoriteMask; }
+    /// Replaces them all.
     void setIsFavoriteMask(std::uint32_t mask) { mIsFavoriteMask = mask; }
+    /// A name that the user has given, empty for none.
     [[nodiscard]] const std::string& userName() const { return mUserName; }
+    /// An empty name takes it away.
     void setUserName(std::string_view name) { mUserName = name; }
 
     /// pitchForStringIndex1:tuningDescr: under the capodaster of the tuning; -1 for a muted string

@@ -8,8 +8,9 @@
 
 namespace brindle {
 
-/// Most fingers, frets and point types of an element of a fingering.
+/// Numbers of fingers: 0 to 5. FindFingerings takes 1 for the index finger to 4 for the little one.
 inline constexpr int kGChFingers = 6;
+/// Indexes of frets: 0 to 31.
 inline constexpr int kGChFrets = 32;
 
 /// Whether a point of a fingering sounds. A point that was read from a file and is not real has
@@ -32,18 +33,26 @@ public:
         int fingerNumber, int absFretIndex, int coveredMinStr, int coveredMaxStr,
         std::uint8_t fingerPointType = GChFingerPointType_Real);
 
+    /// 0 to 5, see kGChFingers.
     [[nodiscard]] int fingerNumber() const { return mFingerNumber; }
-    /// Negative when it was shifted below the neck.
+    /// From 0, the first fret of the neck. Negative when it was shifted below the neck.
     [[nodiscard]] int absFretIndex() const { return mAbsFretIndex; }
+    /// The string with the highest index that it holds.
     [[nodiscard]] int coveredMaxStr() const { return mCoveredMaxStr; }
+    /// The string with the lowest index that it holds.
     [[nodiscard]] int coveredMinStr() const { return mCoveredMinStr; }
+    /// A GChFingerPointType, or 64.
     [[nodiscard]] std::uint8_t fingerPointType() const { return mFingerPointType; }
 
     /// The string of a single spot, -1 for a barre.
     [[nodiscard]] int singleStringIndex() const;
+    /// Whether it holds one string.
     [[nodiscard]] bool isSingleSpot() const { return mCoveredMinStr == mCoveredMaxStr; }
+    /// Whether it holds several.
     [[nodiscard]] bool isBarre() const { return mCoveredMinStr < mCoveredMaxStr; }
+    /// Whether it sounds: neither an alternative nor a point of type 64.
     [[nodiscard]] bool isReal() const { return mFingerPointType == GChFingerPointType_Real; }
+    /// Whether it holds the string.
     [[nodiscard]] bool coversString(int stringIndex) const {
         return mCoveredMinStr <= stringIndex && stringIndex <= mCoveredMaxStr;
     }

@@ -10,6 +10,7 @@ namespace brindle {
 
 // The built-in chord types, as a list that a host shows.
 
+/// How many there are, 30.
 [[nodiscard]] int GChNumberOfChordTypes();
 /// A negative index counts as 0; empty at or above the number of rows.
 [[nodiscard]] std::string GChChordTypeNameForIndex(int index);

@@ -50,21 +50,27 @@ public:
 
     // Tunings and libraries
 
+    /// Those that were read or asked for, in that order.
     [[nodiscard]] const std::vector<std::shared_ptr<GChTuning>>& tunings() const {
         return mTunings;
     }
+    /// The tuning whose fingerings are shown; null at first.
     [[nodiscard]] const std::shared_ptr<GChTuning>& activeTuning() const { return mActiveTuning; }
     /// False for a tuning that is not in this database. A change ends editing.
     bool setActiveTuning(const std::shared_ptr<GChTuning>& tuning);
+    /// The standard guitar under its localized name, which is added if it is missing.
     std::shared_ptr<GChTuning> tuningWithDefaultGuitarTuning();
     /// tuningWithShortTuning:tuningName: the first tuning that is the same up to octaves, else a
     /// new one; null if it is invalid.
     std::shared_ptr<GChTuning> tuningWithShortTuning(const GChShortTuning& shortTuning,
                                                      std::string_view tuningName);
+    /// See GChTuning::runTimeID; null if there is none.
     [[nodiscard]] std::shared_ptr<GChTuning> tuningWithRuntimeID(std::int64_t id) const;
-    // These take out; the files go at the next updateDatabaseFiles.
+    /// Takes a library out; its file goes at the next updateDatabaseFiles.
     void removeLibrary(const std::shared_ptr<GChLibrary>& library);
+    /// The same for a tuning and all its libraries. Without the active one none is active.
     void removeTuning(const std::shared_ptr<GChTuning>& tuning);
+    /// Tuning by tuning.
     [[nodiscard]] std::vector<std::shared_ptr<GChLibrary>> allLibrariesForAnyTuning() const;
     /// Without those that are read-only.
     [[nodiscard]] std::vector<std::shared_ptr<GChLibrary>> allUserLibrariesForAnyTuning() const;
@@ -80,15 +86,22 @@ public:
     /// of a library of it; of another library none. With the flag as views. Never null.
     [[nodiscard]] virtual std::shared_ptr<GChChordList> allChordsFilteringLibrary(
         const std::shared_ptr<GChLibrary>& library, bool createRanges);
+    /// In all libraries of the active tuning; 0 without one.
     [[nodiscard]] std::size_t numberOfActiveChords() const { return numberOfActiveBasicChords(); }
+    /// The same number: fingerings are not transposed.
     [[nodiscard]] std::size_t numberOfActiveBasicChords() const;
 
     // Editing
 
+    /// The fingering that the user is editing; nothing for none.
     [[nodiscard]] const std::optional<GChChord>& editedChord() const { return mEditedChord; }
+    /// Replaces it and nothing else.
     void setEditedChord(std::optional<GChChord> chord) { mEditedChord = std::move(chord); }
+    /// For the host to go back to; nothing here reads it.
     [[nodiscard]] const std::optional<GChChord>& undoChord() const { return mUndoChord; }
+    /// For the host.
     void setUndoChord(std::optional<GChChord> chord) { mUndoChord = std::move(chord); }
+    /// What the edited chord was before; nothing for a new one.
     [[nodiscard]] const std::optional<GChChord>& originalChord() const { return mOriginalChord; }
     /// Notes its library as the source library.
     void setOriginalChord(std::optional<GChChord> chord);
@@ -98,8 +111,11 @@ public:
     }
     /// Null without such a chord.
     [[nodiscard]] std::shared_ptr<GChBasicChord> editedBasicChord() const;
+    /// That of the original chord, in the same way.
     [[nodiscard]] std::shared_ptr<GChBasicChord> originalBasicChord() const;
+    /// For the host, until the active tuning changes.
     [[nodiscard]] bool chordNotInLibrary() const { return mChordNotInLibrary; }
+    /// For the host.
     void setChordNotInLibrary(bool isNotInLibrary) { mChordNotInLibrary = isNotInLibrary; }
     /// Whether the edited chord differs from the original, or there is no original.
     [[nodiscard]] bool editedChordHasChanges() const;
@@ -111,6 +127,7 @@ public:
     [[nodiscard]] const std::optional<GChChord>& additionalChordToDisplay() const {
         return mEditedChord;
     }
+    /// Whether there is an edited chord.
     [[nodiscard]] bool hasAdditionalChordToDisplay() const {
         return additionalChordToDisplay().has_value();
     }
@@ -118,11 +135,13 @@ public:
     // Files (in GChDatabase_Files.cpp). Reading never fails as a whole: what is damaged is skipped
     // or read as far as it goes.
 
+    /// The folder of the package that new libraries go to; empty for none.
     [[nodiscard]] const std::filesystem::path& defaultUserPackagePath() const {
         return mDefaultUserPackagePath;
     }
     /// Where new libraries are saved. Becomes empty unless a folder is there; a "~" is expanded.
     void setDefaultUserPackagePath(std::string_view path);
+    /// What stands for kGChDefaultTuningName when files are read from now on; empty for none.
     void setLocalizedDefaultTuningName(std::string_view name) {
         mLocalizedDefaultTuningName = name;
     }

@@ -13,14 +13,22 @@ class GChFilterParameter {
 public:
     /// No restrictions.
     GChFilterParameter() = default;
+    /// Lets all fingerings pass.
     void setNoRestrictions() { *this = {}; }
 
+    /// How the host spells the root that was asked for; Accepts does not read it.
     [[nodiscard]] std::int64_t rootEnhType() const { return mRootEnhType; }
+    /// The same of the bass.
     [[nodiscard]] std::int64_t bassEnhType() const { return mBassEnhType; }
+    /// Key number that the root must have; -1 for any, -2 for what no chord of a file has.
     [[nodiscard]] std::int64_t rootNoteToFilter() const { return mRootNoteToFilter; }
+    /// The same of the bass.
     [[nodiscard]] std::int64_t bassNoteToFilter() const { return mBassNoteToFilter; }
+    /// The CChordTypeId that the chord must have; -1 for any.
     [[nodiscard]] std::int64_t chordTypeToFilter() const { return mChordTypeToFilter; }
+    /// The difficulty that it must have; -1 for any.
     [[nodiscard]] std::int64_t difficultyToFilter() const { return mDifficultyToFilter; }
+    /// 1 for favorites, 0 for all others, -1 for any.
     [[nodiscard]] std::int64_t isFavoriteToFilter() const { return mIsFavoriteToFilter; }
 
     // For root and bass, -1 is no restriction, and all that is below is kept as -2.
@@ -33,7 +41,9 @@ public:
 
     // Here -1 asks for 0, the empty value, and all that is below is no restriction.
 
+    /// Asks for a CChordTypeId.
     void setChordTypeToFilter(std::int64_t chordType);
+    /// Asks for exactly this difficulty.
     void setDifficultyToFilter(std::int64_t difficulty);
     /// Any value above 0 asks for favorites.
     void setIsFavoriteToFilter(std::int64_t isFavorite);

@@ -19,6 +19,7 @@ class GChTuning;
 /// to it. Made by GChTuning::createLibraryWithPath.
 class GChLibrary : public std::enable_shared_from_this<GChLibrary> {
 public:
+    /// An empty library. The tuning is not owned, and createLibraryWithPath adds it to its list.
     GChLibrary(const std::shared_ptr<GChTuning>& tuning, std::filesystem::path path);
     GChLibrary(const GChLibrary&) = delete;
     GChLibrary& operator=(const GChLibrary&) = delete;
@@ -27,22 +28,28 @@ public:
     [[nodiscard]] std::shared_ptr<GChTuning> gchTuning() const { return mGchTuning.lock(); }
     /// Empty for none.
     [[nodiscard]] const std::string& libraryName() const { return mLibraryName; }
+    /// An empty name is none.
     void setLibraryName(std::string_view name) { mLibraryName = name; }
     /// Of its file; empty for a library that was never saved.
     [[nodiscard]] const std::filesystem::path& libraryPath() const { return mLibraryPath; }
+    /// Moves nothing: the next save goes there.
     void setLibraryPath(std::filesystem::path path) { mLibraryPath = std::move(path); }
     /// Kept in the file and left to the host.
     [[nodiscard]] bool isReadOnlyLibrary() const { return mIsReadOnlyLibrary; }
+    /// Nothing here keeps to it but GChDatabase::allUserLibrariesForAnyTuning.
     void setIsReadOnlyLibrary(bool isReadOnly) { mIsReadOnlyLibrary = isReadOnly; }
     /// Rises by one with each library made in this process.
     [[nodiscard]] std::int64_t runTimeID() const { return mRunTimeID; }
 
+    /// In the order in which they were added, none of them null.
     [[nodiscard]] const std::vector<std::shared_ptr<GChBasicChord>>& basicChords() const {
         return mBasicChords;
     }
+    /// How many there are.
     [[nodiscard]] std::size_t numberOfChords() const { return mBasicChords.size(); }
     /// Appends the chord, which belongs to this library from now on.
     void addChordRangePriv(const std::shared_ptr<GChBasicChord>& chord);
+    /// The same.
     void addBasicChord(const std::shared_ptr<GChBasicChord>& chord) { addChordRangePriv(chord); }
     /// The chord belongs to no library then. Nothing happens if it is not one of these.
     void deleteChordRange(const std::shared_ptr<GChBasicChord>& chord);

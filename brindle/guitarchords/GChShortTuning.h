@@ -16,10 +16,12 @@ inline constexpr int kGChMaxStrings = 16;
 /// The first 0 ends the list; without one there are 16 strings.
 using GChShortTuning = std::array<std::uint8_t, kGChMaxStrings>;
 
-/// E A D G B E.
+/// E A D G B E as they are written: an octave above what a guitar sounds, whose low E is 40.
 inline constexpr GChShortTuning kGChStandardGuitar{52, 57, 62, 67, 71, 76};
 
+/// No strings.
 void GChClearShortTuning(GChShortTuning& tuning);
+/// The same as assigning.
 void GChCopyShortTuning(const GChShortTuning& source, GChShortTuning& target);
 /// The standard guitar.
 void GChSetDefaultGuitarShortTuning(GChShortTuning& tuning);

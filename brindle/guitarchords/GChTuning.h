@@ -24,13 +24,19 @@ public:
     GChTuning(const GChTuning&) = delete;
     GChTuning& operator=(const GChTuning&) = delete;
 
+    /// Whether it has strings, 3 to 16.
     [[nodiscard]] bool isValid() const { return GChIsValidShortTuning(mShortTuning); }
+    /// The pitches of its strings; all 0 for an invalid tuning.
     [[nodiscard]] const GChShortTuning& shortTuning() const { return mShortTuning; }
+    /// 3 to 16; 0 for an invalid tuning.
     [[nodiscard]] int numberOfStrings() const;
     /// Empty for none.
     [[nodiscard]] const std::string& tuningName() const { return mTuningName; }
+    /// An empty name is none.
     void setTuningName(std::string_view name) { mTuningName = name; }
+    /// The fret of a capodaster, for the host; 0 at first.
     [[nodiscard]] int capodasterOffset() const { return mCapodasterOffset; }
+    /// For the host.
     void setCapodasterOffset(int offset) { mCapodasterOffset = offset; }
     /// Rises by one with each tuning made in this process.
     [[nodiscard]] std::int64_t runTimeID() const { return mRunTimeID; }
@@ -40,6 +46,7 @@ public:
     /// "E2 A2 D3 G3 B3 E4".
     [[nodiscard]] std::string tuningPitchesString() const;
 
+    /// In the order in which they were made or read.
     [[nodiscard]] const std::vector<std::shared_ptr<GChLibrary>>& tuningLibraries() const {
         return mTuningLibraries;
     }
@@ -47,8 +54,9 @@ public:
     std::shared_ptr<GChLibrary> createLibraryWithPath(const std::filesystem::path& path);
     /// False if it is not one of these.
     bool removeLibrary(const std::shared_ptr<GChLibrary>& library);
-    // Of all libraries. Fingerings are not transposed, so that both numbers are the same.
+    /// Of all libraries.
     [[nodiscard]] std::size_t numberOfChords() const { return numberOfBasicChords(); }
+    /// The same number: fingerings are not transposed.
     [[nodiscard]] std::size_t numberOfBasicChords() const;
 
 private:

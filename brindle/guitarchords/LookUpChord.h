@@ -13,7 +13,7 @@ namespace brindle {
 
 /// A fingering of a library for a chord that somebody asked for.
 struct CFoundGrid {
-    std::shared_ptr<GChBasicChord> mGrid;
+    std::shared_ptr<GChBasicChord> mGrid;  ///< as the library has it; never null
     /// Tones of the chord that it leaves out, above the root.
     CSemitones mOmitted;
 };

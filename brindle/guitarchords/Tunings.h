@@ -17,7 +17,7 @@ struct CNamedTuning {
     std::string_view mTitle;
     /// Another name, perhaps its letters; empty for none.
     std::string_view mAlias;
-    GChShortTuning mTuning{};
+    GChShortTuning mTuning{};  ///< from the string with the lowest index
 };
 
 /// The usual tunings of guitar, bass, ukulele, mandolin, banjo and cavaquinho. Guitars and basses
