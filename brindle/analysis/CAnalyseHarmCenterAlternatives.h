@@ -17,7 +17,9 @@ public:
     CAnalyseHarmCenterAlternatives(const CAnalyseHarmCenterAlternatives&) = delete;
     CAnalyseHarmCenterAlternatives& operator=(const CAnalyseHarmCenterAlternatives&) = delete;
 
+    /// The chords that were given; the readings point into them.
     CHarmAnlsChords mChords;
+    /// The tonic progressions that are looked for.
     CHarmAnlsProgressions mProgressions;
     /// The result.
     CHarmAnlsCenterAlternatives mAlternatives;

@@ -19,9 +19,10 @@ public:
     double mProbability = kPosUndef;
     /// Start in beats; `kPosUndef` when unknown.
     double mPosition = kPosUndef;
-    CHarmCenterLite mHarmCenter;
-    CHarmAnlsChords mChords;
+    CHarmCenterLite mHarmCenter;  ///< the tonic and its scale; undefined where none was found
+    CHarmAnlsChords mChords;      ///< in the order of time, perhaps with an end marker
 
+    /// True when there is no tonic.
     [[nodiscard]] bool IsUndef() const { return mHarmCenter.IsUndef(); }
 
     /// An undefined center takes key and mode of the sign key, and its position if its own is
@@ -30,6 +31,7 @@ public:
     /// Sets the distances of all chords to this center. Nothing for an undefined center.
     void AnalyseHarmFunctionsOfChords();
 
+    /// Writes an object with all fields. No strict JSON: its list of chords ends with a comma.
     void AppendJSONString(std::ostream& stream) const;
 
     /// Compares everything but the probability.
@@ -39,6 +41,7 @@ public:
     }
 };
 
+/// Writes the JSON text, for debugging.
 std::ostream& operator<<(std::ostream& stream, const CHarmAnlsCenter& center);
 
 }  // namespace brindle

@@ -13,8 +13,9 @@ class CHarmAnlsCenterAlternative {
 public:
     /// 0 to 1; more where equal readings were added up.
     double mProbability = 0.0;
-    CHarmAnlsCentersInChords mCenters;
+    CHarmAnlsCentersInChords mCenters;  ///< the centers of this reading
 
+    /// Removes each center that another one of this reading contains and outlasts.
     void RemoveShorterContainedHarmCenters() { mCenters.RemoveShorterContainedHarmCenters(); }
     /// Whether both readings cover the same range as a whole.
     [[nodiscard]] bool IsSimultaneousWith(const CHarmAnlsCenterAlternative& other) const;
@@ -37,6 +38,7 @@ public:
     /// All other readings over the same range as the one at `it`.
     [[nodiscard]] std::vector<std::reference_wrapper<CHarmAnlsCenterAlternative>>
     FindSimultaneousAlternatives(iterator it);
+    /// Whether another reading is an IsLongerContainingAlternativeFor the one at `it`.
     [[nodiscard]] bool HasLongerContainingAlternernative(const_iterator it) const;
     /// Readings over the same range share the probability equally; a reading that is alone over its
     /// range keeps what it has.

@@ -14,18 +14,21 @@ namespace brindle {
 /// valid only while it stays as it is.
 class CHarmAnlsCenterInChords {
 public:
+    /// A place in the list of chords.
     using chord_iterator = CHarmAnlsChords::const_iterator;
 
-    CHarmCenterLite mCenter;
-    chord_iterator mBegin{};
+    CHarmCenterLite mCenter;  ///< the tonic and its scale
+    chord_iterator mBegin{};  ///< the first chord
     /// One behind the last chord.
     chord_iterator mEnd{};
 
     /// Same range; the centers do not matter.
     [[nodiscard]] bool IsSimultaneousWith(const CHarmAnlsCenterInChords& other) const;
+    /// How many chords it has; mBegin must not lie behind mEnd.
     [[nodiscard]] std::size_t ChordsCount() const;
     /// Whether this range has more chords and the other lies inside it.
     [[nodiscard]] bool IsLongerAndContains(const CHarmAnlsCenterInChords& other) const;
+    /// Whether a place lies from mBegin to mEnd, both included.
     [[nodiscard]] bool _IteratorInsideBeginAndEnd(chord_iterator it) const;
 
     /// Grows the range to both sides over the chords that the center tolerates. The last chord of
@@ -42,6 +45,7 @@ public:
 /// The centers of one reading of a chord list.
 class CHarmAnlsCentersInChords : public std::vector<CHarmAnlsCenterInChords> {
 public:
+    /// A place in the list of chords.
     using chord_iterator = CHarmAnlsCenterInChords::chord_iterator;
     using std::vector<CHarmAnlsCenterInChords>::vector;
 
@@ -51,6 +55,7 @@ public:
     [[nodiscard]] bool HasLongerContainingHarmCenter(const_iterator it) const;
     /// Whether some element contains and outlasts some element of the other list.
     [[nodiscard]] bool IsLongerAndContains(const CHarmAnlsCentersInChords& other) const;
+    /// Whether some element contains and outlasts the given one.
     [[nodiscard]] bool HasCenterThatIsLongerAndContains(
         const CHarmAnlsCenterInChords& element) const;
     /// The first element with the same key, spelling and mask, or the end.

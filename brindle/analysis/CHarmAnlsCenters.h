@@ -36,9 +36,11 @@ public:
     /// Appends the chords of `second` to `first` and erases `second`. Returns the iterator behind.
     iterator _MergeHarmCentersAndEraseSecond(iterator first, iterator second);
 
+    /// Writes a list of the centers. No strict JSON: each list ends with a comma.
     void AppendJSONString(std::ostream& stream) const;
 };
 
+/// Writes the JSON text, for debugging.
 std::ostream& operator<<(std::ostream& stream, const CHarmAnlsCenters& centers);
 
 }  // namespace brindle

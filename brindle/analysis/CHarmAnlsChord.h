@@ -21,6 +21,7 @@ public:
     std::int32_t mBassDistToHarmCenter = -1;
 
     constexpr CHarmAnlsChord() = default;
+    /// A chord with its distances as they are; they are not worked out.
     constexpr explicit CHarmAnlsChord(const CChordLite& chord, std::int32_t rootDist = -1,
                                       std::int32_t bassDist = -1)
         : CChordLite(chord), mRootDistToHarmCenter(rootDist), mBassDistToHarmCenter(bassDist) {}
@@ -32,6 +33,7 @@ public:
 
     /// Writes the members without braces.
     void AppendJSONClassSubstring(std::ostream& stream) const;
+    /// Writes the same in braces.
     void AppendJSONString(std::ostream& stream) const;
 
     /// Compares root, bass (spelling included), semitones and both distances.
@@ -53,13 +55,17 @@ public:
     double mPosition = kPosUndef;
 
     constexpr CHarmAnlsChordWithPos() = default;
+    /// A chord with its function at a position in beats.
     constexpr explicit CHarmAnlsChordWithPos(const CHarmAnlsChord& chord,
                                              double position = kPosUndef)
         : CHarmAnlsChord(chord), mPosition(position) {}
+    /// A chord without a function at a position in beats.
     constexpr explicit CHarmAnlsChordWithPos(const CChordLite& chord, double position = kPosUndef)
         : CHarmAnlsChord(chord), mPosition(position) {}
 
+    /// Writes the members without braces, the position first.
     void AppendJSONClassSubstring(std::ostream& stream) const;
+    /// Writes the same in braces.
     void AppendJSONString(std::ostream& stream) const;
 
     friend constexpr bool operator==(const CHarmAnlsChordWithPos& a,
@@ -76,9 +82,11 @@ public:
     double mLength = kPosUndef;
 
     constexpr CHarmAnlsChordWithLength() = default;
+    /// A chord with its function that sounds so many beats.
     constexpr explicit CHarmAnlsChordWithLength(const CHarmAnlsChord& chord,
                                                 double length = kPosUndef)
         : CHarmAnlsChord(chord), mLength(length) {}
+    /// A chord without a function that sounds so many beats.
     constexpr explicit CHarmAnlsChordWithLength(const CChordLite& chord, double length = kPosUndef)
         : CHarmAnlsChord(chord), mLength(length) {}
 
@@ -86,7 +94,9 @@ public:
     /// four beats long.
     void SimplifyChord();
 
+    /// Writes the members without braces, the length first.
     void AppendJSONClassSubstring(std::ostream& stream) const;
+    /// Writes the same in braces.
     void AppendJSONString(std::ostream& stream) const;
 
     /// Reads a chord with length from a dictionary.
@@ -106,10 +116,14 @@ public:
 static_assert(std::is_trivially_copyable_v<CHarmAnlsChordWithPos>);
 static_assert(std::is_trivially_copyable_v<CHarmAnlsChordWithLength>);
 
+/// Writes the JSON text, for debugging.
 std::ostream& operator<<(std::ostream& stream, const CHarmAnlsChord& chord);
+/// Writes the JSON text, for debugging.
 std::ostream& operator<<(std::ostream& stream, const CHarmAnlsChordWithPos& chord);
+/// Writes the JSON text, for debugging.
 std::ostream& operator<<(std::ostream& stream, const CHarmAnlsChordWithLength& chord);
 
+/// No chord: no root, no distances.
 inline constexpr CHarmAnlsChord CHarmAnlsChord_Undef{};
 
 }  // namespace brindle

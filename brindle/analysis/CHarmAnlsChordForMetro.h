@@ -32,15 +32,19 @@ namespace brindle {
 /// Spellings and directions are lost in a vector.
 class CHarmAnlsChordForMetro : public CHarmAnlsChord {
 public:
+    /// Places of a vector.
     static constexpr std::size_t VectorSize = 46;
 
     /// The JSON text is the vector. For the caller to set.
     bool mWriteVectorRep = false;
 
     constexpr CHarmAnlsChordForMetro() = default;
+    /// The chord of this root, bass and semitones.
     constexpr explicit CHarmAnlsChordForMetro(const CChordLite& chord) : CHarmAnlsChord(chord) {}
 
+    /// Root key 4, E, with all twelve semitones, in any spelling.
     [[nodiscard]] bool IsEADGBE() const;
+    /// Root key 0, C, with all twelve semitones, in any spelling.
     [[nodiscard]] bool IsWildcard() const;
     /// The bass differs from the root, if only in spelling; never for the two chords above.
     [[nodiscard]] bool IsSlashChord() const;
@@ -49,6 +53,7 @@ public:
     /// preferences: sharps only, "C#m7 / B".
     [[nodiscard]] std::string NameForMetroExport(bool flag) const;
 
+    /// The 46 places as the class tells them, each 0.0 or 1.0.
     [[nodiscard]] std::vector<float> GetChordVectorRepresentation() const;
     /// Does nothing unless there are 46 entries of 0.0 or 1.0. Without a root place the record
     /// stays as it was, without a basic chord or a bass place its semitones or its bass do.
@@ -57,16 +62,24 @@ public:
     // Reductions to major and minor triads, and to the vocabulary of IsRecognizedMetroChord. The
     // argument drops the bass. An undefined root or a chord without semitones becomes undefined.
 
+    /// The major or the minor triad: minor if the chord holds 0 3 7 or 0 3 6 and no major,
+    /// augmented or suspended triad.
     [[nodiscard]] CHarmAnlsChordForMetro SimplifiedToMajorOrMinor(bool dropBass) const;
+    /// Becomes that chord.
     void SimplifyToMajorOrMinor(bool dropBass);
+    /// The nearest of _sSemitones_Chords_MetroRecognizedMode: the triad with its seventh, or less.
     [[nodiscard]] CHarmAnlsChordForMetro SimplifiedToRecognizedMetroChord(bool dropBass) const;
+    /// Becomes that chord.
     void SimplifyToRecognizedMetroChord(bool dropBass);
 
     // Whether the semitones are a row of the vocabulary. With the argument true a chord with a bass
     // is none.
 
+    /// Exactly a major or a minor triad, of the masks _sSemitones_Chords_MajorMinorMode.
     [[nodiscard]] bool IsMajorOrMinor(bool withoutBass) const;
+    /// A chord of the masks _sSemitones_Chords_MetroRecognizedMode.
     [[nodiscard]] bool IsRecognizedMetroChord(bool withoutBass) const;
+    /// A chord of the masks _sSemitones_Chords_CommonMode.
     [[nodiscard]] bool IsCommonChord(bool withoutBass) const;
 
     /// Sets the places of the keys that sound to 1.0; the others, and all places for an undefined
@@ -75,6 +88,7 @@ public:
 
     /// Writes root, bass and semitones, or the vector, as JSON members without braces.
     void AppendJSONClassSubstring(std::ostream& stream) const;
+    /// Writes the same in braces.
     void AppendJSONString(std::ostream& stream) const;
     /// Reads what AppendJSONString wrote, in either form. The flag stays as it was.
     void FromDictionary(const nlohmann::json& dictionary);

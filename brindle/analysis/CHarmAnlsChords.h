@@ -16,6 +16,7 @@ struct TChordStringParse;
 /// Different chords, whatever their function and position.
 using CHarmAnlsChordsSet = std::set<CHarmAnlsChord>;
 
+/// Chords by length: where one ends the next begins.
 using CHarmAnlsChordsWithLength = std::vector<CHarmAnlsChordWithLength>;
 
 /// A chord sequence, ascending by position. A list that was read from a chord text ends with an
@@ -30,11 +31,13 @@ public:
     /// Replaces the content with the chords of a chord text.
     void ParseStringIntoChords(std::string_view text, const TChordStringParse& parse);
 
-    /// The last position plus 1; `kPosUndef` for an empty list.
+    /// The last position plus 1, in beats; `kPosUndef` for an empty list. The end marker counts as
+    /// a chord.
     [[nodiscard]] double LastChordEndPos() const;
     /// The last element with a root; the end if there is none (which is also the begin of an empty
     /// list).
     [[nodiscard]] const_iterator LastNonUndefChord() const;
+    /// Each chord with a root once, without its position.
     [[nodiscard]] CHarmAnlsChordsSet CreateSetOfNonUndefChords() const;
     /// C at two positions counts once, C and C/E are two, C sharp and D flat are two.
     [[nodiscard]] std::size_t CountDifferentNonUndefChords() const;
@@ -48,9 +51,11 @@ public:
     /// to the end.
     void SortByPosition();
 
+    /// Writes a list of the chords. No strict JSON: it ends with a comma.
     void AppendJSONString(std::ostream& stream) const;
 };
 
+/// Writes the JSON text, for debugging.
 std::ostream& operator<<(std::ostream& stream, const CHarmAnlsChords& chords);
 
 }  // namespace brindle

@@ -21,12 +21,14 @@ enum TMatchDirection : std::int32_t {
 
 /// One chord of a progression: where it stands above the tonic, and its quality.
 struct CHarmAnlsProgressionEl {
-    /// Semitones from the tonic up to the chord's root.
+    /// Semitones from the tonic up to the chord's root. Only the steps between elements are
+    /// compared, reduced into the octave.
     std::int32_t mRootDistToHarmCenter = 0;
     /// The same for the bass. No match reads it.
     std::int32_t mBassDistToHarmCenter = 0;
-    CSemitonesMatch mSemitonesMatch;
+    CSemitonesMatch mSemitonesMatch;  ///< the quality of the chord
 
+    /// Writes an object with all fields.
     void AppendJSONString(std::ostream& stream) const;
 
     friend bool operator==(const CHarmAnlsProgressionEl&, const CHarmAnlsProgressionEl&) = default;
@@ -37,6 +39,7 @@ struct CHarmAnlsProgressionEl {
 /// their roots move as its roots do; bass and rhythm do not matter.
 class CHarmAnlsProgression : public std::vector<CHarmAnlsProgressionEl> {
 public:
+    /// A place in the list of chords.
     using chord_iterator = CHarmAnlsChords::const_iterator;
 
     /// Larger is better.
@@ -45,6 +48,7 @@ public:
     TSignKeyType mSignKeyType = TSignKeyType_Undef;
 
     CHarmAnlsProgression() = default;
+    /// The elements with the priority and the mode of the center that they tell.
     CHarmAnlsProgression(std::vector<CHarmAnlsProgressionEl> elements, std::int32_t priority,
                          TSignKeyType signKeyType);
 
@@ -64,8 +68,10 @@ public:
     /// chord if it sounds. Undefined if there is no such element or chord.
     [[nodiscard]] CHarmCenterLite HarmCenterCalculatedFromFoundProgressionNthChord(
         std::size_t n, chord_iterator it, const CHarmAnlsChords& chords) const;
+    /// The same of the last element.
     [[nodiscard]] CHarmCenterLite HarmCenterCalculatedFromFoundProgressionLastChord(
         chord_iterator it, const CHarmAnlsChords& chords) const;
+    /// The same of the first element, the chord at `it`.
     [[nodiscard]] CHarmCenterLite HarmCenterCalculatedFromFoundProgressionFirstChord(
         chord_iterator it, const CHarmAnlsChords& chords) const;
     /// Where a match at `it` begins; the end of the chords for an unknown direction.
@@ -78,12 +84,16 @@ public:
                               const CHarmAnlsChords& chords, std::int32_t rootDist,
                               chord_iterator chord) const;
 
+    /// Writes a list of the elements, without the priority and the mode. No strict JSON: it ends
+    /// with a comma.
     void AppendJSONString(std::ostream& stream) const;
 
     friend bool operator==(const CHarmAnlsProgression& a, const CHarmAnlsProgression& b) = default;
 };
 
+/// Writes the JSON text, for debugging.
 std::ostream& operator<<(std::ostream& stream, const CHarmAnlsProgressionEl& element);
+/// Writes the JSON text, for debugging.
 std::ostream& operator<<(std::ostream& stream, const CHarmAnlsProgression& progression);
 
 }  // namespace brindle

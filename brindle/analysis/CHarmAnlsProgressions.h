@@ -11,6 +11,7 @@ namespace brindle {
 /// A table of progressions, and the search for those that match a place of a chord list.
 class CHarmAnlsProgressions : public std::vector<CHarmAnlsProgression> {
 public:
+    /// A place in the list of chords.
     using chord_iterator = CHarmAnlsProgression::chord_iterator;
     using std::vector<CHarmAnlsProgression>::vector;
 
@@ -22,8 +23,10 @@ public:
     /// All rows that match at `it`, sorted. Empty for an unknown direction.
     [[nodiscard]] CHarmAnlsProgressions FindAndSortMatchingProgressions(
         chord_iterator it, const CHarmAnlsChords& chords, TMatchDirection direction) const;
+    /// The rows that match from `it` on, sorted.
     [[nodiscard]] CHarmAnlsProgressions FindAndSortForwardMatchingProgressions(
         chord_iterator it, const CHarmAnlsChords& chords) const;
+    /// The rows that match up to and with `it`, sorted.
     [[nodiscard]] CHarmAnlsProgressions FindAndSortBackwardMatchingProgressions(
         chord_iterator it, const CHarmAnlsChords& chords) const;
 
@@ -36,9 +39,11 @@ public:
     /// Sorts this table and gives its best rows.
     [[nodiscard]] CHarmAnlsProgressions SortAndGetBestMatchingProgressions();
 
+    /// Writes a list of the rows. No strict JSON: each list ends with a comma.
     void AppendJSONString(std::ostream& stream) const;
 };
 
+/// Writes the JSON text, for debugging.
 std::ostream& operator<<(std::ostream& stream, const CHarmAnlsProgressions& progressions);
 
 }  // namespace brindle

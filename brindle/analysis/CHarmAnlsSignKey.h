@@ -15,8 +15,8 @@ public:
     double mProbability = kPosUndef;
     /// Start in beats; `kPosUndef` when unknown.
     double mPosition = kPosUndef;
-    CSignKeyLite mSignKey;
-    CHarmAnlsCenters mHarmCenters;
+    CSignKeyLite mSignKey;          ///< the key signature; undefined where the score has none
+    CHarmAnlsCenters mHarmCenters;  ///< in the order of time
 
     /// True when the key or the type is undefined.
     [[nodiscard]] bool IsUndef() const { return mSignKey.IsUndef(); }
@@ -25,6 +25,7 @@ public:
     /// unknown.
     void IfUndefFillWithHarmAnlsCenter(const CHarmAnlsCenter& center);
 
+    /// Writes an object with all fields. No strict JSON: each list ends with a comma.
     void AppendJSONString(std::ostream& stream) const;
 
     /// Compares everything but the probability.
@@ -34,6 +35,7 @@ public:
     }
 };
 
+/// Writes the JSON text, for debugging.
 std::ostream& operator<<(std::ostream& stream, const CHarmAnlsSignKey& signKey);
 
 }  // namespace brindle

@@ -20,9 +20,11 @@ public:
     /// Joins equal neighbours among the centers of each sign key.
     void MergeAdjacentSameHarmCenters();
 
+    /// Writes a list of the sign keys. No strict JSON: each list ends with a comma.
     void AppendJSONString(std::ostream& stream) const;
 };
 
+/// Writes the JSON text, for debugging.
 std::ostream& operator<<(std::ostream& stream, const CHarmAnlsSignKeys& signKeys);
 
 }  // namespace brindle

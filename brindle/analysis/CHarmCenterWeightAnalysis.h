@@ -23,6 +23,7 @@ struct CHarmCenterWeightAnalysisParams {
 class CHarmCenterWeightAnalysis : public CHarmCenterWeightAnalysisParams {
 public:
     CHarmCenterWeightAnalysis() = default;
+    /// An analysis with these settings.
     explicit CHarmCenterWeightAnalysis(const CHarmCenterWeightAnalysisParams& params)
         : CHarmCenterWeightAnalysisParams(params) {}
 
@@ -32,6 +33,7 @@ public:
     void DetectHarmCentersFromChords(const CHarmAnlsChords& chords, CHarmAnlsCenters& centers);
 };
 
+/// Kept: writes one fixed line, without the settings.
 std::ostream& operator<<(std::ostream& stream, const CHarmCenterWeightAnalysis& analysis);
 
 }  // namespace brindle

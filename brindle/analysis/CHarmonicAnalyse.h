@@ -36,6 +36,8 @@ public:
     /// The table of the last run by tonic progressions or cadences.
     CHarmAnlsProgressions mProgressions;
 
+    /// Analyses a chord list. Without sign keys one is made that is undefined; all chords go to the
+    /// last center of the last one.
     void AnalyseFromChords(const CHarmAnlsChords& chords, const CHarmAnlsSignKeys& signKeys,
                            TAnalyse analyse);
     /// Analyses a chord text such as "Dm7 G7 | C".
@@ -53,10 +55,12 @@ public:
     /// Analyses what the object holds. May be called again on its own result.
     void Analyse(TAnalyse analyse);
 
-    /// These three append a copy and return the iterator to it. The caller keeps the order of time.
+    /// Appends a copy and returns the iterator to it. The caller keeps the order of time.
     CHarmAnlsSignKeys::iterator FillManually_AppendSignKey(const CHarmAnlsSignKey& signKey);
+    /// The same in a sign key of this object.
     CHarmAnlsCenters::iterator FillManually_AppendHarmCenterInSignKey(
         CHarmAnlsSignKeys::iterator signKey, const CHarmAnlsCenter& center);
+    /// The same in a center of this object.
     CHarmAnlsChords::iterator FillManually_AppendChordInHarmCenter(
         CHarmAnlsCenters::iterator center, const CHarmAnlsChordWithPos& chord);
 
@@ -139,6 +143,7 @@ private:
     void _FillSignKeysAndCentersAndSetHarmFunctions();
 };
 
+/// Writes the JSON text, for debugging.
 std::ostream& operator<<(std::ostream& stream, const CHarmonicAnalyse& analyse);
 
 }  // namespace brindle

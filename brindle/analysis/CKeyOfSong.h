@@ -15,7 +15,7 @@ class CHarmAnlsChords;
 /// How FindKeys weighs. A value that is not a number, or that makes no sense, counts as the
 /// default.
 struct CKeyOptions {
-    double mBeatsPerBar = 4.0;
+    double mBeatsPerBar = 4.0;  ///< the length of a bar, above 0
     /// What a chord gains in the key of the song. More keeps passages at home.
     double mHomeBonus = 0.4;
     /// What the nearest change of key costs, not less than 0. More makes longer regions.
@@ -24,12 +24,14 @@ struct CKeyOptions {
 
 /// A passage of a song in one key.
 struct CKeyRegion {
-    CSignKeyLite mKey;
-    /// The chords [mBegin, mEnd) of the list.
+    CSignKeyLite mKey;  ///< the key of the passage
+    /// Number of its first chord in the list, from 0.
     std::size_t mBegin = 0;
+    /// One behind the last one.
     std::size_t mEnd = 0;
-    /// In beats.
+    /// Where it begins, in beats.
     double mPosition = kPosUndef;
+    /// Where it ends, in beats: where the next one begins or the song ends.
     double mEndPosition = kPosUndef;
 };
 

@@ -31,6 +31,7 @@ public:
     constexpr explicit CSemitonesMatch(const std::array<TSemiMatch, 12>& entries) {
         for (unsigned n = 0; n < 12; ++n) SetSemitone(n, entries[n]);
     }
+    /// The same.
     constexpr CSemitonesMatch(const std::array<TSemiMatch, 12>& entries, int)
         : CSemitonesMatch(entries) {}
     /// Would read as a list of semitone numbers.
@@ -41,6 +42,7 @@ public:
         ResetToValue(TSemiMatch_Absent);
         for (const unsigned n : present) SetSemitone(n, TSemiMatch_Present);
     }
+    /// The same with the tones of `any`, which win over `present`.
     constexpr CSemitonesMatch(std::initializer_list<unsigned> present,
                               std::initializer_list<unsigned> any)
         : CSemitonesMatch(present) {
@@ -57,11 +59,14 @@ public:
                (semitones.Mask() & mAbsent) == 0;
     }
 
+    /// 12, or 0 after `clear`.
     [[nodiscard]] constexpr std::size_t size() const { return mIsCleared ? 0 : mEntries.size(); }
+    /// Whether `clear` has taken the entries away; then nothing fits.
     [[nodiscard]] constexpr bool empty() const { return mIsCleared; }
 
     /// All entries `TSemiMatch_Any`.
     constexpr void Reset() { ResetToValue(TSemiMatch_Any); }
+    /// All entries `value`, after `clear` too.
     constexpr void ResetToValue(TSemiMatch value) {
         mIsCleared = false;
         for (unsigned n = 0; n < 12; ++n) SetSemitone(n, value);
@@ -94,13 +99,16 @@ private:
     bool mIsCleared = false;
 };
 
+/// Writes the JSON text, for debugging.
 std::ostream& operator<<(std::ostream& stream, const CSemitonesMatch& match);
 
 /// Several patterns; a chord fits if it fits one of them.
 struct CSemitonesMatches : std::vector<CSemitonesMatch> {
     using vector::vector;
 
+    /// Whether one of them fits; false without patterns.
     [[nodiscard]] bool Matches(CSemitones semitones) const;
+    /// Writes a list of the patterns. No strict JSON: it ends with a comma.
     void AppendJSONString(std::ostream& stream) const;
 };
 

@@ -20,7 +20,9 @@ public:
     CSeparatorPattern() = default;
     /// A text that is no regular expression, a null pointer too, separates nothing.
     CSeparatorPattern(const std::string& pattern);
+    /// The same.
     CSeparatorPattern(const char* pattern);
+    /// The matches of a compiled expression, in its own grammar.
     CSeparatorPattern(std::regex regex);
 
     /// The pieces between the separators. A separator at the very start gives an empty first

@@ -12,7 +12,7 @@ namespace brindle {
 
 /// A range of a chord list.
 struct CChordRange {
-    CHarmAnlsChords::const_iterator mBegin;
+    CHarmAnlsChords::const_iterator mBegin;  ///< the first chord
     /// One behind the last chord.
     CHarmAnlsChords::const_iterator mEnd;
 

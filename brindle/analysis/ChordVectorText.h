@@ -13,8 +13,9 @@ namespace brindle {
 struct CChordVectorText {
     /// 46 places of 0.0 or 1.0; empty if the text is no vector.
     std::vector<float> mVector;
-    /// What is wrong, and where, counted from 0 in bytes; empty if nothing is.
+    /// What is wrong, for people; empty if nothing is.
     std::string mError;
+    /// Where it is, in bytes from 0; 0 also where it is the fault of the whole text.
     std::size_t mColumn = 0;
 };
 

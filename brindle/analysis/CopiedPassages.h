@@ -13,9 +13,10 @@ class CHarmonicAnalyse;
 /// A copy together with the chords that it is made of: bars and beats of a CHarmCopy are cut to
 /// whole numbers, these are exact.
 struct CCopiedPassage {
-    CHarmCopy mCopy;
-    /// Number of the first chord of the source and of the copy in the list `mChords`, from 0.
+    CHarmCopy mCopy;  ///< in bars and beats
+    /// Number of the first chord of the source in the list `mChords`, from 0.
     std::uint64_t mSource = 0;
+    /// Number of the first chord of the copy.
     std::uint64_t mTarget = 0;
     /// How many chords each of the two has.
     std::uint64_t mCount = 0;

@@ -17,11 +17,16 @@ namespace ModalCenters {
 
 /// Pitch classes as a set: bit n is that of number n.
 using TPitchClasses = std::uint32_t;
+/// Centers as a set: bit n is the center of that place.
 using TCenters = std::uint32_t;
 
+/// The place of the minor center on pitch class 0.
 inline constexpr int kMinorOffset = 12;
+/// How many keys there are; also the first place that is none.
 inline constexpr int kTonalityCount = 24;
+/// The place of a center without a scale.
 inline constexpr int kNoScale = 24;
+/// How many places there are.
 inline constexpr int kCount = 25;
 
 /// The set of the intervals above a root as pitch classes; key numbers outside 0 to 11 are reduced.

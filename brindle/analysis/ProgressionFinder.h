@@ -17,6 +17,7 @@ namespace brindle {
 /// and stay as they are.
 class CProgressionFinder {
 public:
+    /// Both are borrowed; rows without elements are left out.
     CProgressionFinder(const CHarmAnlsProgressions& table, const CHarmAnlsChords& chords);
 
     /// The best rows that match from the chord at index `at` on, in table order. Valid until the

@@ -60,7 +60,7 @@ enum TSeventhSpelling : std::uint8_t {
 
 /// How ReadHarmony reads. All that is left out is found from the chords.
 struct CReadingOptions {
-    CKeyOptions mKeys = {};
+    CKeyOptions mKeys = {};  ///< how keys are found
     /// The key of the song if it is known; undefined to find it.
     CSignKeyLite mStatedKey = {};
     /// One a chord of the list, or fewer. An augmented sixth makes a German or Italian sixth chord
@@ -75,10 +75,11 @@ struct CServedDegree {
     std::int8_t mSemitones = -1;
     /// As it is written: 3 and -1 for bIII.
     std::int8_t mNumber = 0;
-    std::int8_t mAccidental = 0;
+    std::int8_t mAccidental = 0;  ///< -1 for flat, 1 for sharp
     /// In small letters: ii.
     bool mIsMinor = false;
 
+    /// Whether it is the tonic; false for no degree.
     [[nodiscard]] constexpr bool IsTonic() const { return mSemitones == 0; }
     /// "I", "ii", "bIII"; empty for no degree. The tonic is "I" in minor, too.
     [[nodiscard]] std::string Name() const;
@@ -94,8 +95,8 @@ struct CChordReading {
     /// In that key: "ii7", "V7/ii", "subV7/I", "viio7/V", "N6", "Ger6"; empty for no chord. Without
     /// the bass.
     std::string mNumeral;
-    THarmFunction mFunction = THarmFunction_Undef;
-    TChordRelation mRelation = TChordRelation_Undef;
+    THarmFunction mFunction = THarmFunction_Undef;    ///< what it does in that key
+    TChordRelation mRelation = TChordRelation_Undef;  ///< what it is to the chords around it
     /// The degree that it prepares or stands for: I for G7 in C major, ii for A7 before Dm. A
     /// related second serves what its dominant serves, in the key of that.
     CServedDegree mServes;

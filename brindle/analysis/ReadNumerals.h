@@ -13,9 +13,10 @@ namespace brindle {
 
 /// A word of a text of numerals.
 struct CNumeralWord {
-    std::string mText;
-    /// From 1; the column in characters, not bytes.
+    std::string mText;  ///< as it is written
+    /// The line, from 1.
     std::size_t mLine = 0;
+    /// The column in characters, not bytes, from 1.
     std::size_t mColumn = 0;
     /// Undefined for a mark and for what is not understood.
     CChordLite mChord;
@@ -26,7 +27,7 @@ struct CNumeralWord {
 
 /// What ReadNumerals makes of a text.
 struct CNumeralsReading {
-    std::vector<CNumeralWord> mWords;
+    std::vector<CNumeralWord> mWords;  ///< all of them, with marks and what is not understood
     /// Empty if all is understood.
     std::vector<CTextFault> mFaults;
 };
@@ -39,7 +40,7 @@ struct CNumeralsReading {
                                                        const CSignKeyLite& key,
                                                        const CNumeralOptions& options = {});
 
-/// Reads a text of Roman numerals or Nashville numbers with bar lines: `ii7 V7 | I^7 .`
+/// Reads a text of Roman numerals or Nashville numbers with bar lines and holds: `ii7 V7 | I^7`.
 ///
 /// A word that is not understood is a fault and has no chord; the others are read all the same.
 /// Time is linear in the length of the text.

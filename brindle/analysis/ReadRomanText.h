@@ -20,47 +20,48 @@ namespace brindle {
 struct CRomanTextChord {
     /// "No Chord Yield" for `NC` and for a numeral that is not understood.
     CChordLite mChord;
-    CSignKeyLite mKey;
+    CSignKeyLite mKey;  ///< the key in which the numeral is read
     /// As it is written.
     std::string mNumeral;
-    double mPosition = 0.0;
-    double mLength = 0.0;
+    double mPosition = 0.0;  ///< where it begins, in quarters
+    double mLength = 0.0;    ///< up to the next chord, in quarters
     /// The chord where two keys meet: its numeral in the key before, else undefined and empty.
     CSignKeyLite mKeyBefore;
-    std::string mNumeralBefore;
+    std::string mNumeralBefore;  ///< as it is written, for that key
 };
 
 /// The key from a position on.
 struct CRomanTextKey {
-    CSignKeyLite mKey;
-    double mPosition = 0.0;
+    CSignKeyLite mKey;       ///< the key; never undefined
+    double mPosition = 0.0;  ///< in quarters
 };
 
 /// A measure: its number in the text, and its place and length in quarter notes.
 struct CRomanTextBar {
-    int mNumber = 0;
-    double mPosition = 0.0;
-    double mLength = 0.0;
+    int mNumber = 0;         ///< as the text counts, a pickup is 0
+    double mPosition = 0.0;  ///< where it begins, in quarters
+    double mLength = 0.0;    ///< in quarters
 };
 
 /// A time signature that holds from a position on: 3 and 4 for 3/4.
 struct CRomanTextTime {
-    int mBeats = 4;
-    int mBeatValue = 4;
-    double mPosition = 0.0;
+    int mBeats = 4;          ///< beats in a measure, the upper number
+    int mBeatValue = 4;      ///< which note is one, the lower number: 4 is a quarter
+    double mPosition = 0.0;  ///< from where on, in quarters
 };
 
 /// What ReadRomanText makes of a text.
 struct CRomanTextReading {
-    std::string mTitle;
-    std::string mMovement;
-    std::string mComposer;
-    std::string mAnalyst;
+    std::string mTitle;     ///< of the piece; empty if there is none, as the next three
+    std::string mMovement;  ///< its number or name
+    std::string mComposer;  ///< who wrote it
+    std::string mAnalyst;   ///< who read it
+    /// By position; each sounds up to the next one or the end.
     std::vector<CRomanTextChord> mChords;
-    std::vector<CRomanTextKey> mKeys;
+    std::vector<CRomanTextKey> mKeys;  ///< by position
     /// Measures that are left out between two others are there, too: the chord before them sounds.
     std::vector<CRomanTextBar> mBars;
-    std::vector<CRomanTextTime> mTimes;
+    std::vector<CRomanTextTime> mTimes;  ///< by position
     /// Where `||` and other double bars stand.
     std::vector<double> mDoubleBars;
     /// Empty if all is understood; what is not, is left out.

@@ -9,6 +9,7 @@ namespace brindle {
 /// How far the range of a found center reaches over its neighbouring chords.
 namespace RouteRanges {
 
+/// A place in the list of chords.
 using chord_iterator = CHarmAnlsChords::const_iterator;
 
 /// Moves `first` back, at most to `begin`, as long as the center tolerates the chord before it.

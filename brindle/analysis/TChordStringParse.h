@@ -13,6 +13,7 @@ namespace brindle {
 struct TChordStringParse {
     /// What stands between tokens; white space by default.
     CSeparatorPattern mSeparator;
+    /// The length of a bar. Where it is 0, a bar line makes positions that are not a number.
     double mBeatsPerBar = 4.0;
     /// How far a chord or a hold mark moves on, in beats.
     double mBeatsPerChord = 1.0;
@@ -22,7 +23,7 @@ struct TChordStringParse {
     std::vector<std::string> mHoldTokens{"."};
     /// Carried for the host; the reader finds slashes through `mChordNamePrefs`.
     std::vector<std::string> mSlashTokens{"/"};
-    CChordNamePrefs mChordNamePrefs;
+    CChordNamePrefs mChordNamePrefs;  ///< how roots are named: German, syllables
 };
 
 }  // namespace brindle
