@@ -15,8 +15,8 @@ namespace brindle {
 
 /// Whether a progression is looked for from a chord on or up to a chord.
 enum TMatchDirection : std::int32_t {
-    TMatchDirection_Forward = 0,
-    TMatchDirection_Backward = 1,
+    TMatchDirection_Forward = 0,   ///< from the chord on
+    TMatchDirection_Backward = 1,  ///< up to the chord
 };
 
 /// One chord of a progression: where it stands above the tonic, and its quality.

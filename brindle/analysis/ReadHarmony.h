@@ -49,9 +49,9 @@ enum TChordRelation : std::uint8_t {
 
 /// How the seventh of a chord is written, where it was read from notes: C to Bb or C to A#.
 enum TSeventhSpelling : std::uint8_t {
-    TSeventhSpelling_Undef,
-    TSeventhSpelling_MinorSeventh,
-    TSeventhSpelling_AugmentedSixth,
+    TSeventhSpelling_Undef,           ///< not spelled, or no seventh
+    TSeventhSpelling_MinorSeventh,    ///< C to B flat
+    TSeventhSpelling_AugmentedSixth,  ///< C to A sharp
 };
 
 /// The spelling of a written seventh above its root. Undefined if one of the two is not spelled, or

@@ -20,8 +20,8 @@ enum TAnalyse : std::int32_t {
 
 /// Whether a step looks only at centers whose key is undefined, or at all of them.
 enum TOnlyUndefCenters : std::int32_t {
-    TOnlyUndefCenters_Yes = 0,
-    TOnlyUndefCenters_No = 1,
+    TOnlyUndefCenters_Yes = 0,  ///< only those that nothing was found for
+    TOnlyUndefCenters_No = 1,   ///< all
 };
 
 }  // namespace brindle

@@ -45,9 +45,9 @@ public:
 
 /// Which of the two lists of CChordTypes a row is in.
 enum TChordTypeVec : std::int32_t {
-    TChordTypeVec_None = 0,
-    TChordTypeVec_BuiltIn = 1,
-    TChordTypeVec_User = 2,
+    TChordTypeVec_None = 0,     ///< in neither
+    TChordTypeVec_BuiltIn = 1,  ///< the rows that are always there
+    TChordTypeVec_User = 2,     ///< the rows of the host
 };
 
 /// The catalogue of chord types: the built-in rows in a fixed order, and the rows of the host.

@@ -12,11 +12,11 @@ namespace brindle {
 
 /// What one text between two bar lines can be.
 enum TChordTextKind : std::uint8_t {
-    TChordText_Chord,
-    TChordText_NoChord,
+    TChordText_Chord,    ///< a symbol with a root
+    TChordText_NoChord,  ///< "N.C." and its like
     /// The chord (or the bar) before it again: "%", "/", "-".
     TChordText_Repeat,
-    TChordText_NotUnderstood,
+    TChordText_NotUnderstood,  ///< none of these; the fault says why
 };
 
 /// How a chord text is read.

@@ -16,7 +16,7 @@ inline constexpr int kGChFrets = 32;
 /// Whether a point of a fingering sounds. A point that was read from a file and is not real has
 /// the type 64, which is neither of these.
 enum GChFingerPointType : std::uint8_t {
-    GChFingerPointType_Real = 0,
+    GChFingerPointType_Real = 0,      ///< a finger that is put down
     GChFingerPointType_Optional = 1,  ///< an alternative that the player may add
 };
 

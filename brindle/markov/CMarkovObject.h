@@ -15,7 +15,7 @@ namespace brindle {
 
 /// What a symbol of a chord sequence is.
 enum TMarkovObjectType : std::int32_t {
-    TMarkovObjectType_Chord = 1,
+    TMarkovObjectType_Chord = 1,   ///< told apart by `mChord`
     TMarkovObjectType_Number = 2,  ///< told apart by `mNumber`
     TMarkovObjectType_Value = 3,   ///< told apart by `mValue`
     TMarkovObjectType_Start = 4,   ///< stands before a sequence

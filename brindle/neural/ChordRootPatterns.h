@@ -23,10 +23,10 @@ struct CChordShape {
 
 /// Which tone of a chord is left out.
 enum TOmission : std::uint8_t {
-    TOmission_None = 0,
-    TOmission_Fifth = 1,
-    TOmission_Third = 2,
-    TOmission_Root = 3,
+    TOmission_None = 0,   ///< all tones sound
+    TOmission_Fifth = 1,  ///< the perfect fifth
+    TOmission_Third = 2,  ///< the third, of whatever size
+    TOmission_Root = 3,   ///< the root
 };
 
 /// What the net hears of a chord, and where the root is.

@@ -16,11 +16,12 @@ namespace brindle {
 
 /// The rule by which MakeSensefulEnhForKeyNr repairs; each selects the function of its name.
 enum TMakeSensefulEnh : std::int32_t {
-    TMakeSensefulEnh_AssumingCMajor = 0,
+    TMakeSensefulEnh_AssumingCMajor = 0,  ///< a usual spelling in C major
+    /// As the root of a major scale of few signs.
     TMakeSensefulEnh_MajorScaleRootWithLeastSigns = 1,
-    TMakeSensefulEnh_PreferSharps = 2,
-    TMakeSensefulEnh_PreferFlats = 3,
-    TMakeSensefulEnh_OnBlackKeyPreferGivenTEnh = 4,
+    TMakeSensefulEnh_PreferSharps = 2,               ///< black keys are sharp
+    TMakeSensefulEnh_PreferFlats = 3,                ///< black keys are flat
+    TMakeSensefulEnh_OnBlackKeyPreferGivenTEnh = 4,  ///< white keys are plain, black ones stay
 };
 
 /// Whether one of the seven letters with this accidental is this key. Key 15 goes with

@@ -11,9 +11,9 @@ namespace brindle {
 
 /// Which way a melody goes or a search looks.
 enum TKeyDirection : std::int32_t {
-    TKeyDirection_Closest = 0,
-    TKeyDirection_Up = 1,
-    TKeyDirection_Down = 2,
+    TKeyDirection_Closest = 0,  ///< whichever way is shorter, or unknown
+    TKeyDirection_Up = 1,       ///< to a higher note
+    TKeyDirection_Down = 2,     ///< to a lower note
 };
 
 /// Writes "Closest", "Up" or "Down", or "unknown TKeyDirection " and the number.

@@ -16,10 +16,10 @@ namespace brindle {
 
 /// The colour of a scale.
 enum TScaleMode : std::int32_t {
-    TScaleMode_Major = 0,
-    TScaleMode_Minor = 1,
-    TScaleMode_None = 2,
-    TScaleMode_Custom = 3,
+    TScaleMode_Major = 0,   ///< counts as a major scale
+    TScaleMode_Minor = 1,   ///< counts as a minor scale
+    TScaleMode_None = 2,    ///< counts as neither
+    TScaleMode_Custom = 3,  ///< of the type `st_custom` or none
 };
 
 /// A scale without a root: which steps it has and how it is called.

@@ -12,14 +12,14 @@ namespace brindle {
 /// accidental of the written note: D flat is `TEnh_b`, C sharp is `TEnh_s`. The value 6 is not
 /// used.
 enum TEnh : std::int8_t {
-    TEnh_bbb = -1,
-    TEnh_bb = 0,
-    TEnh_b = 1,
-    TEnh_n = 2,
-    TEnh_s = 3,
-    TEnh_ss = 4,
-    TEnh_sss = 5,
-    TEnh_Undef = 7,
+    TEnh_bbb = -1,   ///< triple flat
+    TEnh_bb = 0,     ///< double flat
+    TEnh_b = 1,      ///< flat
+    TEnh_n = 2,      ///< natural: the letter itself
+    TEnh_s = 3,      ///< sharp
+    TEnh_ss = 4,     ///< double sharp
+    TEnh_sss = 5,    ///< triple sharp
+    TEnh_Undef = 7,  ///< not spelled
 };
 
 /// By how many semitones the accidental raises the letter, -3 to 3; 0 for `TEnh_Undef`.

@@ -9,38 +9,38 @@ namespace brindle {
 
 /// The named scales. A scale of type `st_custom` holds a row of its own.
 enum TScaleType : std::int32_t {
-    st_Undef = 0,
-    st_maj = 1,
-    st_min = 2,
-    st_chrom = 3,
-    st_majmin = 4,
-    st_majaddb7 = 5,
-    st_min_harm = 6,
-    st_min_melo = 7,
-    st_maj_pent = 8,
-    st_min_pent = 9,
-    st_maj_blues = 10,
-    st_min_blues = 11,
-    st_lydian = 12,
-    st_mixolydian = 13,
-    st_dorian = 14,
-    st_phrygian = 15,
-    st_locrian = 16,
-    st_hm5 = 17,
-    st_japanese = 18,
-    st_southeast_asian = 19,
-    st_custom = 20,
-    DiminishedHalfWhole = 21,
-    DiminishedWholeHalf = 22,
-    BebopMajor = 23,
-    BebopDominant = 24,
-    BebopMelodicMinor = 25,
-    BebopHarmonicMinor = 26,
-    MixolydianSharp11 = 27,
-    LocrianMaj2 = 28,
-    Altered = 29,
-    DoubleHarmonic = 30,
-    st_Count = 31,
+    st_Undef = 0,              ///< no scale
+    st_maj = 1,                ///< major, ionian
+    st_min = 2,                ///< natural minor, aeolian
+    st_chrom = 3,              ///< all twelve keys
+    st_majmin = 4,             ///< major and natural minor together
+    st_majaddb7 = 5,           ///< major with both sevenths
+    st_min_harm = 6,           ///< harmonic minor
+    st_min_melo = 7,           ///< melodic minor, as it goes up
+    st_maj_pent = 8,           ///< major without fourth and seventh
+    st_min_pent = 9,           ///< minor without second and sixth
+    st_maj_blues = 10,         ///< major pentatonic with a minor third
+    st_min_blues = 11,         ///< minor pentatonic with a flat fifth
+    st_lydian = 12,            ///< major with a raised fourth
+    st_mixolydian = 13,        ///< major with a minor seventh
+    st_dorian = 14,            ///< minor with a major sixth
+    st_phrygian = 15,          ///< minor with a minor second
+    st_locrian = 16,           ///< minor with a minor second and a flat fifth
+    st_hm5 = 17,               ///< harmonic minor from its fifth, phrygian dominant
+    st_japanese = 18,          ///< five tones of Japan, miyako-bushi
+    st_southeast_asian = 19,   ///< five tones of South-East Asia
+    st_custom = 20,            ///< steps of its own
+    DiminishedHalfWhole = 21,  ///< half and whole tones in turn
+    DiminishedWholeHalf = 22,  ///< whole and half tones in turn
+    BebopMajor = 23,           ///< major with a minor sixth between
+    BebopDominant = 24,        ///< mixolydian with a major seventh between
+    BebopMelodicMinor = 25,    ///< melodic minor with a minor sixth between
+    BebopHarmonicMinor = 26,   ///< harmonic minor with a minor seventh between
+    MixolydianSharp11 = 27,    ///< melodic minor from its fourth
+    LocrianMaj2 = 28,          ///< melodic minor from its sixth
+    Altered = 29,              ///< melodic minor from its seventh
+    DoubleHarmonic = 30,       ///< major with minor second and sixth, Byzantine
+    st_Count = 31,             ///< behind the last type
 };
 
 /// Whether the scale is one of the seven modes of the major scale.

@@ -13,15 +13,15 @@ namespace brindle {
 
 /// The mode of a key signature.
 enum TSignKeyType : std::int32_t {
-    TSignKeyType_Undef = 0,
-    TSignKeyType_Major = 1,
-    TSignKeyType_Minor = 2,
+    TSignKeyType_Undef = 0,  ///< no key signature is known
+    TSignKeyType_Major = 1,  ///< major
+    TSignKeyType_Minor = 2,  ///< natural minor
 };
 
 /// The mode of a key signature that is always one of the two.
 enum TSignKeyTypeNoUndef : std::int32_t {
-    TSignKeyTypeNoUndef_Major = 0,
-    TSignKeyTypeNoUndef_Minor = 1,
+    TSignKeyTypeNoUndef_Major = 0,  ///< major
+    TSignKeyTypeNoUndef_Minor = 1,  ///< natural minor
 };
 
 /// The same mode in the other enumeration; undefined for a value outside 0 and 1.
