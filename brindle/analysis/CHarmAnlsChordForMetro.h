@@ -75,7 +75,8 @@ public:
     // Whether the semitones are a row of the vocabulary. With the argument true a chord with a bass
     // is none.
 
-    /// Exactly a major or a minor triad, of the masks _sSemitones_Chords_MajorMinorMode.
+    /// A major or a minor triad. Kept: no tones and all twelve count too, here and below, since the
+    /// masks (_sSemitones_Chords_MajorMinorMode) hold them.
     [[nodiscard]] bool IsMajorOrMinor(bool withoutBass) const;
     /// A chord of the masks _sSemitones_Chords_MetroRecognizedMode.
     [[nodiscard]] bool IsRecognizedMetroChord(bool withoutBass) const;

@@ -16,7 +16,7 @@ struct CHarmCopy {
     double mTargetPos = kPosUndef;
     /// From the copy back to its source, in bars: negative.
     std::int32_t mSourceOffsetBars = 0;
-    std::uint64_t mLengthBars = 0;  ///< whole bars of four beats; a rest is cut off
+    std::uint64_t mLengthBars = 0;  ///< in whole bars of four beats, what is left over is cut off
     /// Always 0.
     std::uint64_t mChords = 0;
 

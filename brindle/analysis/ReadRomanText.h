@@ -20,7 +20,8 @@ namespace brindle {
 struct CRomanTextChord {
     /// "No Chord Yield" for `NC` and for a numeral that is not understood.
     CChordLite mChord;
-    CSignKeyLite mKey;  ///< the key in which the numeral is read
+    /// The key in which the numeral is read; undefined for an `NC` before the first key.
+    CSignKeyLite mKey;
     /// As it is written.
     std::string mNumeral;
     double mPosition = 0.0;  ///< where it begins, in quarters

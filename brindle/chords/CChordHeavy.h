@@ -67,10 +67,10 @@ public:
     CChordHeavy(const CNote& root, const CIntvlSet& intvls, const CNote& bass);
     /// The tones of a skeleton: 0 4 7 for major. No bass.
     CChordHeavy(const CNote& root, TBasicChord basicChord, int wrapIntvl = DefaultWrapIntvl);
-    /// The same as with notes, the root without an octave.
+    /// The same from keys without an octave.
     CChordHeavy(CKeyEnh root, const CSemitones& semitones, CKeyEnh bass,
                 int wrapIntvl = DefaultWrapIntvl);
-    /// The same as with notes, the root without an octave.
+    /// The same from keys and intervals.
     CChordHeavy(CKeyEnh root, const CIntvlSet& intvls, CKeyEnh bass,
                 int wrapIntvl = DefaultWrapIntvl);
     /// The tones of a skeleton over a bass.
@@ -171,7 +171,7 @@ public:
     void SetSemitones(const CSemitones& semitones);
     /// The same of the tones of a skeleton.
     void SetBasicChord(TBasicChord basicChord);
-    /// Sets the root as SetRootKeyNr does, too.
+    /// SetRootKeyNr, then SetBasicChord.
     void SetRootKeyNrAndBasicChord(int rootKeyNr, TBasicChord basicChord);
 
     /// Adds the note, in its spelling; a root that was not specified follows the lowest note.

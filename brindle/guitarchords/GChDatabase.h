@@ -54,7 +54,7 @@ public:
     [[nodiscard]] const std::vector<std::shared_ptr<GChTuning>>& tunings() const {
         return mTunings;
     }
-    /// The tuning whose fingerings are shown; null at first.
+    /// The tuning whose fingerings are shown; null until one is set.
     [[nodiscard]] const std::shared_ptr<GChTuning>& activeTuning() const { return mActiveTuning; }
     /// False for a tuning that is not in this database. A change ends editing.
     bool setActiveTuning(const std::shared_ptr<GChTuning>& tuning);

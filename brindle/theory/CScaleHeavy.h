@@ -222,7 +222,8 @@ public:
     /// The keys of the scale; empty for an undefined root.
     [[nodiscard]] CMySet<int> ToKeyNrSet() const;
 
-    /// The sharps of the scale, negative for flats: -1 for F major, 0 for E phrygian.
+    /// The sharps of the scale, negative for flats: -1 for F major, 0 for E phrygian and for an
+    /// undefined scale. A custom scale has those of minor or major, by its third.
     [[nodiscard]] int SignsCount() const;
     /// The same without its sign; 0 for an undefined scale.
     [[nodiscard]] int SignsCountAbs() const;
