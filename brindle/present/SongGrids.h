@@ -46,6 +46,6 @@ struct CShownSongGrids {
 /// The capo and what it makes easier, the way of the chords, and the diagrams.
 [[nodiscard]] std::string SongGridsText(const CShownSongGrids& song, const CPaint& paint,
                                         const CGridStyle& style);
-[[nodiscard]] std::string SongGridsJson(const CShownSongGrids& song);
+[[nodiscard]] std::string SongGridsJson(const CShownSongGrids& song, const CGridStyle& style = {});
 
 }  // namespace brindle

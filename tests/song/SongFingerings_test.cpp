@@ -52,14 +52,25 @@ TEST_CASE("The easiest capo lets a song be played with open chords") {
         const char* mSong;
         std::vector<int> mCapos;
     };
-    for (const CRow& row : std::vector<CRow>{
-             {"C Am F G", {0}}, {"G D Em C", {0}}, {"Bb F Gm Eb", {3}}, {"Eb Bb Cm Ab", {1, 3}}}) {
+    for (const CRow& row : std::vector<CRow>{{"C Am F G", {0}},
+                                             {"G D Em C", {0}},
+                                             {"Bb F Gm Eb", {3}},
+                                             {"Eb Bb Cm Ab", {1, 3}},
+                                             {"F# C# D#m B", {2, 4, 6}},
+                                             {"B F# G#m E", {4}},
+                                             {"E A B7", {0}},
+                                             {"Dm7 G7 Cmaj7", {0}}}) {
         const auto capos = CompareCapos(ChordsOf(row.mSong), kGChStandardGuitar);
         INFO(row.mSong << ": capo " << capos.front().mCapo);
         REQUIRE(capos.size() == 8);
         CHECK(std::count(row.mCapos.begin(), row.mCapos.end(), capos.front().mCapo) == 1);
         CHECK(capos.front().mDifficulty <= 2.5);
     }
+}
+
+TEST_CASE("An easy chord is held whole") {
+    const auto song = ChooseFingerings(ChordsOf("E A Em G D"), kGChStandardGuitar);
+    CHECK(Texts(song) == "022100 x02220 022000 320003 xx0232");
 }
 
 TEST_CASE("Each chord of a song sounds under each capo") {
