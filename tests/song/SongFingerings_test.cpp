@@ -42,6 +42,9 @@ TEST_CASE("Fingerings of a song are near each other") {
     // The same form moves along the neck rather than going back to the nut.
     const auto song = ChooseFingerings(ChordsOf("Ebm7 Fm7 Ebm7 Fm7"), kGChStandardGuitar);
     REQUIRE(song.mFingerings.size() == 4);
+    // By itself Abm7 would be 424444.
+    CHECK(Texts(ChooseFingerings(ChordsOf("Ebm7 Abm7 Ebm7"), kGChStandardGuitar)) ==
+          "xx1322 xx1102 xx1322");
     for (std::size_t i = 1; i < 4; ++i) {
         CHECK(std::abs(song.mFingerings[i].Position() - song.mFingerings[i - 1].Position()) <= 3);
     }
