@@ -50,6 +50,8 @@ constexpr CCommandHelp kAnalyseHelp{
     "through its repeats, endings and jumps.\n",
 };
 
+constexpr int kLastCapo = 12;
+
 struct CAnalyseOptions {
     CTypedSongs mSongs;
     std::string mRoute = "tonic";
@@ -63,6 +65,8 @@ struct CAnalyseOptions {
     bool mLong = false;
     bool mExplain = false;
     bool mGrids = false;
+    int mCapo = 0;
+    bool mIsLeftHanded = false;
     CNumeralOptions mNumerals;
     CSheetPicture mSheetPicture;
     CFormatOptions mFormat;
@@ -90,6 +94,9 @@ std::optional<std::string> Contradiction(const CAnalyseOptions& options) {
     }
     if (options.mGrids && options.mFormat.Format() != TFormat::Svg) {
         return "--grids belong into a picture, --format svg";
+    }
+    if ((options.mCapo > 0 || options.mIsLeftHanded) && !options.mGrids) {
+        return "--capo and --left are for --grids";
     }
     return options.mSheetPicture.Contradiction();
 }
@@ -124,21 +131,24 @@ CShownKeys KeysOf(const CAnalysedSong& analysed, const CNumeralOptions& numerals
 }
 
 /// The fingerings of a guitar that are near each other, for each symbol.
-TChordGrids GridsOf(const CAnalysedSong& analysed) {
+TChordGrids GridsOf(const CAnalysedSong& analysed, int capo) {
     std::vector<CChordLite> chords;
     std::vector<std::string> symbols;
     for (const CHarmAnlsChordWithPos& chord : analysed.mAnalyse.mChords) {
         chords.push_back(chord);
         symbols.push_back(analysed.mSymbols->SymbolOf(chord));
     }
-    const CSongFingerings fingerings[] = {ChooseFingerings(chords, kGChStandardGuitar)};
+    CSongFingeringOptions choice;
+    choice.mFingering.mCapo = capo;
+    const CSongFingerings fingerings[] = {ChooseFingerings(chords, kGChStandardGuitar, choice)};
     return GridsBySymbol(MakeSongGrids(chords, symbols, fingerings));
 }
 
-std::string Picture(const CAnalysedSong& analysed, const CShownSong& song, bool withGrids) {
-    if (!withGrids) return AnalysisSvg(song);
-    const TChordGrids grids = GridsOf(analysed);
-    return AnalysisSvg(song, &grids);
+std::string Picture(const CAnalysedSong& analysed, const CShownSong& song,
+                    const CAnalyseOptions& options) {
+    if (!options.mGrids) return AnalysisSvg(song);
+    const TChordGrids grids = GridsOf(analysed, options.mCapo);
+    return AnalysisSvg(song, &grids, {.mLeftHanded = options.mIsLeftHanded});
 }
 
 // Readings and grids are drawn over the time axis alone.
@@ -185,7 +195,7 @@ std::string Present(const CAnalysedSong& analysed, const CAnalyseOptions& option
         case TFormat::Svg: {
             CShownSong song = SongOf(analysed, options);
             song.mCopies = MakeSongCopies(analysed.mAnalyse, *analysed.mSymbols);
-            return Picture(analysed, song, options.mGrids);
+            return Picture(analysed, song, options);
         }
         case TFormat::Text:
         case TFormat::Chords:
@@ -319,6 +329,10 @@ void AddAnalyse(CCommand& program) {
     options->mReading.AddTo(command, "In what form the chord text is written");
     command.AddFlag("--grids", options->mGrids,
                     "Draw a guitar fingering under each chord of the picture");
+    command
+        .AddOption("--capo", "N", options->mCapo, "Fret of a capodaster for --grids (default: 0)")
+        .InRange(0, kLastCapo);
+    command.AddFlag("--left", options->mIsLeftHanded, "Draw the grids for the left hand");
     options->mSheetPicture.AddTo(command);
     options->mFormat.AddTo(command, {"text", "json", "native", "svg"});
     command.OnCall([options] { return Analyse(*options); });

@@ -100,7 +100,7 @@ private:
 
 TStatus Present(const std::vector<CChordGrid>& grids, const CGridOptions& options) {
     const CGridStyle style = options.mFingering.Style();
-    if (options.mFormat.Format() == TFormat::Json) return Print(GridsJson(grids));
+    if (options.mFormat.Format() == TFormat::Json) return Print(GridsJson(grids, style));
     if (options.mFormat.Format() == TFormat::Text) {
         return Print(GridsText(grids, PaintOfOutput(), style));
     }

@@ -69,7 +69,7 @@ TSongOutput GridsOf(const CTypedSong& typed, const GChShortTuning& tuning,
     const CGridStyle style = options.mFingering.Style();
     switch (options.mFormat.Format()) {
         case TFormat::Json:
-            return SongGridsJson(shown);
+            return SongGridsJson(shown, style);
         case TFormat::Svg:
             return GridsSvg(shown.mGrids, "Chord grids", style);
         default:

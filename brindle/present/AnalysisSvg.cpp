@@ -53,6 +53,8 @@ constexpr double kFunctionSize = 11.0;
 constexpr double kNarrowestGrid = 76.0;
 constexpr double kGridLeft = 20.0;
 constexpr double kGridScale = 0.5;
+constexpr double kShapeTop = 176.0;  // under a grid, what is played under the capodaster
+constexpr double kShapeSize = 8.0;
 
 constexpr double kPadding = 5.0;
 
@@ -108,9 +110,10 @@ private:
 
 class CSongPicture {
 public:
-    CSongPicture(const CShownSong& song, const TChordGrids* grids)
+    CSongPicture(const CShownSong& song, const TChordGrids* grids, const CGridStyle& style)
         : mSong(song),
           mGrids(grids),
+          mGridStyle(style),
           mAxis(song, kLineWidth, WidestChord(song, grids != nullptr)),
           mLanes(song.mReadings) {
         PlaceLines();
@@ -237,7 +240,12 @@ private:
         const auto segments = mAxis.SegmentsOf(chord.mRange);
         if (grid == mGrids->end() || segments.empty()) return;
         const double x = kMargin + segments[0].mLeft + kPadding + kGridLeft;
-        DrawGrid(mSvg, grid->second, x, mPlaces.mTops[segments[0].mLine] + kGridTop, kGridScale);
+        const double top = mPlaces.mTops[segments[0].mLine];
+        DrawGrid(mSvg, grid->second, x, top + kGridTop, kGridScale, mGridStyle);
+        if (grid->second.mCapo == 0) return;
+        mSvg.Text(x, top + kShapeTop,
+                  fmt::format("capo {}: {}", grid->second.mCapo, grid->second.mName),
+                  {.mSize = kShapeSize, .mColor = kFaintInk});
     }
 
     void DrawReadings() {
@@ -259,6 +267,7 @@ private:
 
     const CShownSong& mSong;
     const TChordGrids* mGrids;
+    CGridStyle mGridStyle;
     CTimeAxis mAxis;
     CLanes mLanes;
     CSvg mSvg;
@@ -268,8 +277,8 @@ private:
 
 }  // namespace
 
-std::string AnalysisSvg(const CShownSong& song, const TChordGrids* grids) {
-    return CSongPicture(song, grids).File();
+std::string AnalysisSvg(const CShownSong& song, const TChordGrids* grids, const CGridStyle& style) {
+    return CSongPicture(song, grids, style).File();
 }
 
 }  // namespace brindle

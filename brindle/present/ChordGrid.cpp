@@ -2,6 +2,7 @@
 #include "brindle/present/ChordGrid.h"
 
 #include "brindle/chords/CChordTypes.h"
+#include "brindle/chords/ChordTones.h"
 #include "brindle/chords/WriteChordSymbol.h"
 #include "brindle/guitarchords/GChChordDescr.h"
 #include "brindle/guitarchords/GChHarmonyStrings.h"
@@ -89,6 +90,7 @@ void SetNames(CChordGrid& grid) {
     if (names.empty()) return;
     grid.mName = names.front().mSymbol;
     grid.mRoot = names.front().mRoot.mKeyNr;
+    grid.mChord = names.front().mChord;
     for (std::size_t i = 1; i < names.size(); ++i) {
         const bool isWhole = names[i].mOmitted.empty() && names[i].mAdded.empty();
         const bool isNear = names[i].mCost <= names.front().mCost + kNearlyAsLikely;
@@ -96,18 +98,26 @@ void SetNames(CChordGrid& grid) {
     }
 }
 
-/// What a library says that its fingering is, as people type it.
-std::string StoredName(const GChChord& chord, int root, int capo) {
-    const CKeyEnh rootKey{root, MakeSensefulEnhForKeyNrAssumingCMajor(root, TEnh_Undef)};
-    if (root < 0) return Printable(chord.chordName(capo));
-    if (!chord.userName().empty()) return WriteNoteName(rootKey) + Printable(chord.userName());
+/// The chord of a fingering of a library; undefined where the library does not tell its type.
+CChordLite StoredChord(const GChChord& chord, int root, int capo) {
     const CChordTypes& types = _s_chordTypes();
     const auto type = types.ChordTypeBuiltInFromId(chord.chordType());
-    if (type == types.BuiltIn().end()) return Printable(chord.chordName(capo));
-    const int bass = chord.bassNote(capo);
-    CKeyEnh bassKey;
-    if (bass >= 0) bassKey = {bass, MakeSensefulEnhForKeyNrAssumingCMajor(bass, TEnh_Undef)};
-    return WriteChordSymbol({rootKey, bassKey, type->mIntvls.ToSemitones()});
+    if (root < 0 || type == types.BuiltIn().end()) return {};
+    const auto keyOf = [](int keyNr) {
+        if (keyNr < 0) return CKeyEnh();
+        return CKeyEnh{keyNr, MakeSensefulEnhForKeyNrAssumingCMajor(keyNr, TEnh_Undef)};
+    };
+    return {keyOf(root), keyOf(chord.bassNote(capo)), type->mIntvls.ToSemitones()};
+}
+
+/// What a library says that its fingering is, as people type it.
+std::string StoredName(const GChChord& chord, int root, int capo) {
+    if (root >= 0 && !chord.userName().empty()) {
+        const CKeyEnh key{root, MakeSensefulEnhForKeyNrAssumingCMajor(root, TEnh_Undef)};
+        return WriteNoteName(key) + Printable(chord.userName());
+    }
+    const CChordLite stored = StoredChord(chord, root, capo);
+    return stored.IsUndef() ? Printable(chord.chordName(capo)) : WriteChordSymbol(stored);
 }
 
 /// The degree of a tone above a root as guitarists count it.
@@ -127,6 +137,16 @@ std::vector<std::string> OmittedDegrees(CSemitones omitted) {
         degrees.push_back(tone == 2 ? "9" : tone == 5 ? "11" : DegreeOnDot(tone));
     }
     return degrees;
+}
+
+/// The bass behind a slash stands as it is written, other notes as tones of the chord. Undefined
+/// without a chord that spells.
+CKeyEnh SpelledKey(const CChordLite& chord, int pitch) {
+    if (chord.IsUndef() || chord.mRootKeyEnh.mEnh == TEnh_Undef) return {};
+    const int keyNr = FoldIntoOctave(pitch);
+    const CKeyEnh& bass = chord.mBassKeyEnh;
+    if (chord.HasBassNote() && bass.mKeyNr == keyNr && bass.mEnh != TEnh_Undef) return bass;
+    return ToneAboveRoot(chord, FoldIntoOctave(keyNr - chord.mRootKeyEnh.mKeyNr));
 }
 
 }  // namespace
@@ -159,10 +179,25 @@ std::string FretsText(const CChordGrid& grid) {
     return text;
 }
 
+std::string NoteText(const CChordGrid& grid, std::size_t string) {
+    constexpr int kOctaveOfMidiZero = -2;
+    const int pitch = grid.mPitches[string];
+    if (pitch < 0) return {};
+    const CKeyEnh key = SpelledKey(grid.mChord, pitch);
+    if (key.IsUndef()) return GChMidiPitchDefaultName(pitch);
+    // B# lies in the octave below the C that it sounds as, and Cb in the one above.
+    const int natural = pitch - EnhToSemitone(key.mEnh);
+    return fmt::format("{}{}", WriteNoteName(key), natural / 12 + kOctaveOfMidiZero);
+}
+
 std::string DotText(const CChordGrid& grid, std::size_t string, TGridDots dots) {
     const int pitch = grid.mPitches[string];
     if (pitch < 0 || dots == TGridDots::Fingers) return {};
-    if (dots == TGridDots::Notes) return std::string(GChOctPitchDefaultName(FoldIntoOctave(pitch)));
+    if (dots == TGridDots::Notes) {
+        const CKeyEnh key = SpelledKey(grid.mChord, pitch);
+        if (!key.IsUndef()) return WriteNoteName(key);
+        return std::string(GChOctPitchDefaultName(FoldIntoOctave(pitch)));
+    }
     return grid.mRoot < 0 ? std::string() : DegreeOnDot(pitch - grid.mRoot);
 }
 
@@ -259,6 +294,7 @@ CChordGrid GridOfChord(std::string_view symbol, const GChChord& chord, int capo)
     }
     grid.mRoot = chord.rootNote(capo);
     if (grid.mRoot < 0) grid.mRoot = GChProposedRootNoteFromChord(&chord, capo);
+    grid.mChord = StoredChord(chord, grid.mRoot, capo);
     grid.mName = symbol.empty() ? StoredName(chord, grid.mRoot, capo) : std::string(symbol);
     grid.mDifficulty = chord.difficultyLevel();
     const auto library = chord.gchLibrary();
@@ -279,6 +315,7 @@ CChordGrid GridOfFingering(std::string_view symbol, const CFingering& fingering,
         grid.mPitches.push_back(fingering.Pitch(i));
     }
     grid.mRoot = chord.mRootKeyEnh.mKeyNr;
+    grid.mChord = chord;
     grid.mOmitted = OmittedDegrees(fingering.mOmitted);
     grid.mDifficulty = fingering.mDifficulty;
     return grid;
@@ -299,6 +336,7 @@ std::vector<CChordGrid> GridsForChord(const GChDatabase& database, std::string_v
     std::vector<CChordGrid> grids;
     for (const CFoundGrid& found : LookUpChord(database, chord, tuning, options.mCapo)) {
         grids.push_back(GridOfChord(symbol, *GChChord::make(found.mGrid, 0), options.mCapo));
+        grids.back().mChord = chord;
         grids.back().mOmitted = OmittedDegrees(found.mOmitted);
     }
     return grids.empty() ? FoundGrids(symbol, chord, tuning, options) : grids;

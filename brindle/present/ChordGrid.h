@@ -33,6 +33,8 @@ struct CChordGrid {
     std::vector<int> mFrets;
     /// Of each string: -1 muted.
     std::vector<int> mPitches;
+    /// The chord that spells its notes: Eb of Cm9, not D#. Undefined if it has no name.
+    CChordLite mChord;
     /// The key that the name stands on, 0 to 11.
     int mRoot = -1;
     /// Where it comes from; empty for typed frets and for what was searched.
@@ -61,6 +63,10 @@ struct CFretWindow {
 
 /// The frets of a text in one of these forms; nothing if it has another.
 [[nodiscard]] std::optional<std::vector<int>> ReadFrets(std::string_view text);
+
+/// The note that a string sounds with its octave, as guitarists write it, spelled by the chord:
+/// "Eb4". Empty for a muted string.
+[[nodiscard]] std::string NoteText(const CChordGrid& grid, std::size_t string);
 
 /// What a string says at its fret: its note, "F#", or its degree above the root of the name, "b3".
 /// Empty for a muted string, for a finger, and for a degree without a root.

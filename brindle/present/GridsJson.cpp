@@ -8,10 +8,10 @@
 
 namespace brindle {
 
-std::string GridsJson(const std::vector<CChordGrid>& grids) {
+std::string GridsJson(const std::vector<CChordGrid>& grids, const CGridStyle& style) {
     Json list = Json::array();
     for (const CChordGrid& grid : grids) list.push_back(GridToJson(grid));
-    return JsonText({{"Grids", list}});
+    return JsonText({{"LeftHanded", style.mLeftHanded}, {"Grids", list}});
 }
 
 }  // namespace brindle

@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/present/GridsText.h"
 
-#include "brindle/guitarchords/GChPitches.h"
 #include "brindle/present/ShownText.h"
 
 #include <fmt/format.h>
@@ -85,8 +84,8 @@ private:
 
 std::string PitchesText(const CChordGrid& grid) {
     std::vector<std::string> names;
-    for (const int pitch : grid.mPitches) {
-        if (pitch >= 0) names.push_back(GChMidiPitchDefaultName(pitch));
+    for (std::size_t i = 0; i < grid.mPitches.size(); ++i) {
+        if (grid.mPitches[i] >= 0) names.push_back(NoteText(grid, i));
     }
     return fmt::format("{}", fmt::join(names, " "));
 }

@@ -102,7 +102,7 @@ std::string SongGridsText(const CShownSongGrids& song, const CPaint& paint,
     return text + '\n' + GridsText(song.mGrids, paint, style);
 }
 
-std::string SongGridsJson(const CShownSongGrids& song) {
+std::string SongGridsJson(const CShownSongGrids& song, const CGridStyle& style) {
     Json capos = Json::array();
     for (const CShownCapo& capo : song.mCapos) capos.push_back(CapoToJson(capo));
     Json chords = Json::array();
@@ -113,7 +113,10 @@ std::string SongGridsJson(const CShownSongGrids& song) {
     }
     Json grids = Json::array();
     for (const CChordGrid& grid : song.mGrids) grids.push_back(GridToJson(grid));
-    return JsonText({{"Capos", capos}, {"Chords", chords}, {"Grids", grids}});
+    return JsonText({{"Capos", capos},
+                     {"Chords", chords},
+                     {"LeftHanded", style.mLeftHanded},
+                     {"Grids", grids}});
 }
 
 }  // namespace brindle

@@ -48,6 +48,6 @@ struct CShownSongGrids {
 [[nodiscard]] std::string SongGridsText(const CShownSongGrids& song, const CPaint& paint,
                                         const CGridStyle& style);
 /// The same as JSON, with all places of the capo.
-[[nodiscard]] std::string SongGridsJson(const CShownSongGrids& song);
+[[nodiscard]] std::string SongGridsJson(const CShownSongGrids& song, const CGridStyle& style = {});
 
 }  // namespace brindle

@@ -16,8 +16,9 @@ namespace {
 constexpr int kCostOfWay = 20;     // each fret along the neck
 constexpr int kCostOfFinger = 12;  // a finger that is put down anew
 constexpr int kCostOfHole = 5000;
-constexpr int kCostOfDifficulty = 40;  // a song is played at speed
-constexpr int kCostOfCapo = 10;
+constexpr int kCostOfDifficulty = 50;  // a song is played at speed
+constexpr int kCostOfBarre = 80;       // it tires the hand
+constexpr int kCostOfCapo = 30;
 constexpr int kCostOfCapoFret = 6;
 constexpr std::size_t kMostCandidates = 32;
 constexpr int kMostCapo = 12;
@@ -50,6 +51,16 @@ TCandidates CandidatesOf(const CChordLite& chord, const GChShortTuning& tuning,
     return FindFingerings(chord, tuning, search);
 }
 
+/// How much worse a fingering is than the best one of its chord, and how hard. Costs of different
+/// chords say nothing about which of them is easier.
+int CostOfHolding(const CFingering& fingering, const TCandidates& ofChord) {
+    const auto fingers = fingering.Fingers();
+    const bool hasBarre = std::any_of(fingers.begin(), fingers.end(),
+                                      [](const CFingerPlace& place) { return place.IsBarre(); });
+    return fingering.mCost - ofChord.front().mCost + kCostOfDifficulty * fingering.mDifficulty +
+           (hasBarre ? kCostOfBarre : 0);
+}
+
 /// The cheapest ways to the candidates of a chord, and from where each comes.
 struct CStage {
     const TCandidates* mCandidates = nullptr;
@@ -70,7 +81,7 @@ CStage StageAfter(const CStage* before, const TCandidates& candidates, std::size
             best = cost;
             from = i;
         }
-        stage.mCosts.push_back(best + candidate.mCost + kCostOfDifficulty * candidate.mDifficulty);
+        stage.mCosts.push_back(best + CostOfHolding(candidate, candidates));
         stage.mFrom.push_back(from);
     }
     return stage;

@@ -92,3 +92,4 @@ def test_what_is_no_text_raises():
             brindle.analyse_batch(texts)
     with pytest.raises(ValueError):
         brindle.analyse_batch(["C"], threads=0)
+    assert brindle.analyse_batch(["C"] * 1000, threads=10**9).num_rows == 1000

@@ -131,6 +131,20 @@ def test_notes_are_named():
     assert brindle.names([]) == []
 
 
+def test_states_that_make_no_sense_are_refused():
+    for value, state in [
+        (brindle.Note("C"), (99, 2)),
+        (brindle.Note("C"), (0, 77)),
+        (brindle.Note("C"), ("C", "#")),
+        (brindle.Key("C"), (brindle.Note("C"), 9)),
+        (brindle.Chord("C"), (brindle.Note("C"),)),
+        (brindle.Chord("C"), (1, 2, 3)),
+    ]:
+        with pytest.raises((ValueError, TypeError, IndexError, RuntimeError)):
+            value.__setstate__(state)
+        str(value)
+
+
 @given(values)
 def test_values_keep_themselves(value):
     """Pickles, copies, text and hash agree; what is printed reads back."""

@@ -40,7 +40,7 @@ TEST_CASE("Typed sequences are read as people type them, or their fault is told"
         {"( 4 , C ) ; (4,G7) ;", 2, ""},
         {"(4,F\xE2\x99\xAFm);(4,B\xE2\x99\xAD)", 2, ""},
         {"(4,Gm(maj7))", 1, ""},
-        {"(4,C);(4,Hx)", 0, "Hx is no chord; a gap is U"},
+        {"(4,C);(4,Xyz)", 0, "Xyz is no chord; a gap is U"},
         {"(0,C)", 0, wanted},
         {"(2000000,C)", 0, wanted},
         {"C F", 0, wanted},

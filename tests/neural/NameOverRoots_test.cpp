@@ -35,6 +35,7 @@ TEST_CASE("An inversion is named over its root, a foreign bass behind a slash") 
         options.mPrefs.mNoSpaceBetweenNameParts = 1;
         options.mPrefs.mNoSpaceAroundSlash = 1;
         options.mPrefs.mOmitBassOption = true;
+        options.mPrefs.mChordPrefB = false;  // show the bass within an octave, too
         const auto names = NameOverRoots(row.mNotes, options);
         REQUIRE(names.size() == 1);
         CHECK(names.front().mName == row.mName);

@@ -1,13 +1,17 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/present/ChordGrid.h"
 
+#include "brindle/chords/ReadChordText.h"
 #include "brindle/guitarchords/GChPitches.h"
 #include "brindle/guitarchords/GChTuningDescr.h"
+#include "brindle/present/GridsJson.h"
+#include "brindle/present/GridsSvg.h"
 #include "brindle/present/GridsText.h"
 
 #include <doctest/doctest.h>
 
 #include <string>
+#include <vector>
 
 namespace brindle::test {
 namespace {
@@ -73,6 +77,46 @@ TEST_CASE("A diagram is drawn from the nut to the last fret of its window") {
           "| | | | | |\n"
           "| | * * * |\n"
           "| | | | | |\n");
+}
+
+TEST_CASE("Notes are spelled by their chord, and their octave is that of their letter") {
+    struct CCase {
+        const char* mSymbol;
+        std::vector<int> mFrets;
+        const char* mNotes;
+    };
+    for (const auto& [symbol, frets, notes] : std::vector<CCase>{
+             {"Cm9", {-1, 3, 1, 3, 3, 3}, "C3 Eb3 Bb3 D4 G4"},
+             {"D#m", {-1, -1, 1, 3, 4, 2}, "D#3 A#3 D#4 F#4"},
+             {"C#", {-1, 4, 3, 1, 2, 1}, "C#3 E#3 G#3 C#4 E#4"},
+             {"C#maj7", {-1, 4, 3, 1, 1, 1}, "C#3 E#3 G#3 B#3 E#4"},
+             {"Abm", {4, 6, 6, 4, 4, 4}, "Ab2 Eb3 Ab3 Cb4 Eb4 Ab4"},
+             {"D/F#", {2, 0, 0, 2, 3, 2}, "F#2 A2 D3 A3 D4 F#4"},
+             {"F#dim7", {-1, -1, 1, 2, 1, 2}, "Eb3 A3 C4 F#4"},
+         }) {
+        const auto held = FingeringOfFrets(frets, kGChStandardGuitar);
+        REQUIRE(held);
+        const CChordGrid grid = GridOfFingering(symbol, *held, ReadChordText(symbol).mChord);
+        std::string told;
+        for (std::size_t i = 0; i < frets.size(); ++i) {
+            const std::string note = NoteText(grid, i);
+            if (!note.empty()) told += (told.empty() ? "" : " ") + note;
+            const std::string dot = DotText(grid, i, TGridDots::Notes);
+            CHECK(dot == note.substr(0, note.size() - (note.empty() ? 0 : 1)));
+        }
+        INFO(symbol);
+        CHECK(told == notes);
+    }
+}
+
+TEST_CASE("For the left hand the lowest string stands on the right") {
+    CGridStyle left;
+    left.mLeftHanded = true;
+    const std::string text = GridsText({GridOf("x32010")}, CPaint(false), left);
+    CHECK(text.find("o   o     x") != std::string::npos);
+    CHECK(GridsJson({GridOf("x32010")}, left).find("\"LeftHanded\": true") != std::string::npos);
+    CHECK(GridsJson({GridOf("x32010")}).find("\"LeftHanded\": false") != std::string::npos);
+    CHECK(GridsSvg({GridOf("x32010")}, "C", left) != GridsSvg({GridOf("x32010")}, "C"));
 }
 
 }  // namespace

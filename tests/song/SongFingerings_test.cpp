@@ -42,6 +42,9 @@ TEST_CASE("Fingerings of a song are near each other") {
     // The same form moves along the neck rather than going back to the nut.
     const auto song = ChooseFingerings(ChordsOf("Ebm7 Fm7 Ebm7 Fm7"), kGChStandardGuitar);
     REQUIRE(song.mFingerings.size() == 4);
+    // By itself Abm7 would be 424444.
+    CHECK(Texts(ChooseFingerings(ChordsOf("Ebm7 Abm7 Ebm7"), kGChStandardGuitar)) ==
+          "xx1322 xx1102 xx1322");
     for (std::size_t i = 1; i < 4; ++i) {
         CHECK(std::abs(song.mFingerings[i].Position() - song.mFingerings[i - 1].Position()) <= 3);
     }
@@ -52,14 +55,25 @@ TEST_CASE("The easiest capo lets a song be played with open chords") {
         const char* mSong;
         std::vector<int> mCapos;
     };
-    for (const CRow& row : std::vector<CRow>{
-             {"C Am F G", {0}}, {"G D Em C", {0}}, {"Bb F Gm Eb", {3}}, {"Eb Bb Cm Ab", {1, 3}}}) {
+    for (const CRow& row : std::vector<CRow>{{"C Am F G", {0}},
+                                             {"G D Em C", {0}},
+                                             {"Bb F Gm Eb", {3}},
+                                             {"Eb Bb Cm Ab", {1, 3}},
+                                             {"F# C# D#m B", {2, 4, 6}},
+                                             {"B F# G#m E", {4}},
+                                             {"E A B7", {0}},
+                                             {"Dm7 G7 Cmaj7", {0}}}) {
         const auto capos = CompareCapos(ChordsOf(row.mSong), kGChStandardGuitar);
         INFO(row.mSong << ": capo " << capos.front().mCapo);
         REQUIRE(capos.size() == 8);
         CHECK(std::count(row.mCapos.begin(), row.mCapos.end(), capos.front().mCapo) == 1);
         CHECK(capos.front().mDifficulty <= 2.5);
     }
+}
+
+TEST_CASE("An easy chord is held whole") {
+    const auto song = ChooseFingerings(ChordsOf("E A Em G D"), kGChStandardGuitar);
+    CHECK(Texts(song) == "022100 x02220 022000 320003 xx0232");
 }
 
 TEST_CASE("Each chord of a song sounds under each capo") {

@@ -44,6 +44,7 @@ constexpr int kCostOfSilentInside = 290;
 constexpr int kCostOfSilentOfFew = 250;  // each, where there are few strings
 constexpr int kFewStrings = 5;
 constexpr int kCostOfNeedlessMute = 80;  // the open string is a tone of the chord
+constexpr int kCostOfMutedBass = 160;    // it is the bass
 
 constexpr int kMinorThird = 3;
 constexpr int kMajorThird = 4;
@@ -88,10 +89,13 @@ int CostOfMutes(const CFingering& fingering, const CFingeringTask& task) {
         if (pitch >= 0) lowest = std::min(lowest, pitch);
     }
     for (int string = 0; string < task.mStrings; ++string) {
-        const auto at = static_cast<std::size_t>(string);
-        const bool mayRing = task.KeyAt(string, 0) == task.mBass ||
-                             (task.Allows(string, 0) && task.mTuning[at] + task.mCapo > lowest);
-        if (fingering.Pitch(string) < 0 && mayRing) cost += kCostOfNeedlessMute;
+        if (fingering.Pitch(string) >= 0) continue;
+        const int open = task.mTuning[static_cast<std::size_t>(string)] + task.mCapo;
+        if (task.KeyAt(string, 0) == task.mBass) {
+            cost += kCostOfMutedBass;
+        } else if (task.Allows(string, 0) && open > lowest) {
+            cost += kCostOfNeedlessMute;
+        }
     }
     return cost;
 }

@@ -21,10 +21,10 @@ Json FretsToJson(const std::vector<int>& frets) {
     return list;
 }
 
-Json PitchNamesToJson(const std::vector<int>& pitches) {
+Json PitchNamesToJson(const CChordGrid& grid) {
     Json list = Json::array();
-    for (const int pitch : pitches) {
-        list.push_back(pitch < 0 ? Json(nullptr) : Json(GChMidiPitchDefaultName(pitch)));
+    for (std::size_t i = 0; i < grid.mPitches.size(); ++i) {
+        list.push_back(grid.mPitches[i] < 0 ? Json(nullptr) : Json(NoteText(grid, i)));
     }
     return list;
 }
@@ -49,7 +49,7 @@ Json GridToJson(const CChordGrid& grid) {
             {"RootKeyNr", KeyNrToJson(grid.mRoot)},
             {"Frets", FretsToJson(grid.mFrets)},
             {"Pitches", FretsToJson(grid.mPitches)},
-            {"PitchNames", PitchNamesToJson(grid.mPitches)},
+            {"PitchNames", PitchNamesToJson(grid)},
             {"Elements", ElemsToJson(grid.mElems)},
             {"OpenStrings", GChPitchArrayFromShortTuning(grid.mTuning)},
             {"Capo", grid.mCapo},

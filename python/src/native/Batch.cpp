@@ -45,6 +45,9 @@ CSongRow RowOf(std::string_view text, const CSongOptions& options) {
     return row;
 }
 
+// More are of no use to anybody.
+constexpr std::size_t kMostThreads = 256;
+
 /// Calls `work` with each index below `count`, from so many threads; what one throws is thrown on.
 template <class TWork>
 void InThreads(std::size_t count, std::size_t threadCount, const TWork& work) {
@@ -60,8 +63,9 @@ void InThreads(std::size_t count, std::size_t threadCount, const TWork& work) {
             next = count;
         }
     };
+    const std::size_t used = std::min({threadCount, count, kMostThreads});
     std::vector<std::jthread> others;
-    for (std::size_t i = 1; i < std::min(threadCount, count); ++i) others.emplace_back(run);
+    for (std::size_t i = 1; i < used; ++i) others.emplace_back(run);
     run();
     others.clear();
     if (thrown) std::rethrow_exception(thrown);

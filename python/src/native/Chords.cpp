@@ -42,7 +42,7 @@ nb::tuple StateOf(const CChordLite& chord) {
 
 CChordLite ChordOfState(const nb::tuple& state) {
     return {nb::cast<CKeyEnh>(state[0]), nb::cast<CKeyEnh>(state[1]),
-            CSemitones(nb::cast<std::uint64_t>(state[2]))};
+            CSemitones(nb::cast<std::uint64_t>(state[2]) & 0xFFF)};
 }
 
 constexpr const char* kChord = R"(A chord: a root, the tones above it, and a bass if it has another.

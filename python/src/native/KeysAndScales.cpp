@@ -53,7 +53,11 @@ nb::tuple StateOfKey(const CSignKeyLite& key) {
 }
 
 CSignKeyLite KeyOfState(const nb::tuple& state) {
-    return {nb::cast<CKeyEnh>(state[0]), static_cast<TSignKeyType>(nb::cast<int>(state[1]))};
+    const int type = nb::cast<int>(state[1]);
+    if (type != TSignKeyType_Major && type != TSignKeyType_Minor) {
+        throw nb::value_error("this is no key");
+    }
+    return {nb::cast<CKeyEnh>(state[0]), static_cast<TSignKeyType>(type)};
 }
 
 nb::tuple StateOfScale(const CScaleLite& scale) {
@@ -61,7 +65,7 @@ nb::tuple StateOfScale(const CScaleLite& scale) {
 }
 
 CScaleLite ScaleOfState(const nb::tuple& state) {
-    return {nb::cast<CKeyEnh>(state[0]), CSemitones(nb::cast<std::uint64_t>(state[1]))};
+    return {nb::cast<CKeyEnh>(state[0]), CSemitones(nb::cast<std::uint64_t>(state[1]) & 0xFFF)};
 }
 
 void BindKey(nb::module_& module) {

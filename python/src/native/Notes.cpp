@@ -37,7 +37,10 @@ nb::tuple StateOf(const CKeyEnh& note) {
 }
 
 CKeyEnh NoteOfState(const nb::tuple& state) {
-    return {nb::cast<int>(state[0]), static_cast<TEnh>(nb::cast<int>(state[1]))};
+    const CKeyEnh note{nb::cast<int>(state[0]), static_cast<TEnh>(nb::cast<int>(state[1]))};
+    const bool isUnspelled = note.mEnh == TEnh_Undef && note.mKeyNr >= 0 && note.mKeyNr < 12;
+    if (note == CKeyEnh() || isUnspelled || note.HasSensefulEnh()) return note;
+    throw nb::value_error("this is no note");
 }
 
 std::optional<int> AccidentalOf(const CKeyEnh& note) {
