@@ -11,12 +11,12 @@ namespace brindle {
 
 /// What a model has learned of the histories of one length.
 struct CMarkovHistories {
-    std::size_t mLength = 0;
-    std::size_t mCount = 0;
+    std::size_t mLength = 0;  ///< symbols of a history, from 1
+    std::size_t mCount = 0;   ///< different histories of this length
     /// How open it is what follows, and how open it could be at most with as many continuations:
     /// means over all places of what was learned, in natural units.
     double mEntropy = 0.0;
-    double mMaxEntropy = 0.0;
+    double mMaxEntropy = 0.0;  ///< that of continuations which are all as likely
 };
 
 /// For each length from 1 to that of the model.
@@ -25,8 +25,8 @@ struct CMarkovHistories {
 
 /// A symbol that has followed a history.
 struct CMarkovContinuation {
-    MarkovIterator mSymbol;
-    std::uint32_t mCount = 0;
+    MarkovIterator mSymbol;    ///< where it stands in what was learned
+    std::uint32_t mCount = 0;  ///< how often it followed
     /// 0 to 1.
     double mProbability = 0.0;
 };

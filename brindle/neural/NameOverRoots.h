@@ -15,22 +15,25 @@ namespace brindle {
 
 /// The name that some notes have over one root, whether or not anybody would call them so.
 struct CChordOverRoot {
-    CKeyEnh mRoot;
+    CKeyEnh mRoot;  ///< spelled for its name
     /// Where it is not the root; else undefined.
     CKeyEnh mBass;
-    std::string mName;
-    std::vector<std::string> mOptions;
-    TBasicChord mBasicChord = TBasicChord::None;
+    std::string mName;                  ///< root, kind and options: "C7(b9)"
+    std::vector<std::string> mOptions;  ///< "b9", "no5" and so on, in the order of the name
+    TBasicChord mBasicChord = TBasicChord::None;  ///< the triad or seventh chord below them
     /// Whether the root is one of the notes.
     bool mIsSounding = false;
 };
 
+/// How names over roots are searched.
 struct CNameOverRootOptions {
     /// Undefined to search it.
     CKeyEnh mRoot;
+    /// What hears the root.
     TSingleChordAnalysisAlgo mSearch = TSingleChordAnalysisAlgo_NeuronalNet;
     /// Also the other eleven roots, those that sound first.
     bool mAllRoots = false;
+    /// How the names are written.
     CChordNamePrefs mPrefs = ChordNamePrefsNonUTF8;
 };
 

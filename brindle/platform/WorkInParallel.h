@@ -38,8 +38,8 @@ struct CParallelSteps {
     std::function<TResult(TPiece&)> mWork;
     /// Takes a result; false to end at once, without what is behind it.
     std::function<bool(TResult&&)> mTake;
-    std::function<std::size_t(const TPiece&)> mWeightOfPiece;
-    std::function<std::size_t(const TResult&)> mWeightOfResult;
+    std::function<std::size_t(const TPiece&)> mWeightOfPiece;    ///< bytes that a piece holds
+    std::function<std::size_t(const TResult&)> mWeightOfResult;  ///< bytes that a result holds
     /// Called several times a second as long as a result is waited for; false to end at once. May
     /// be empty.
     std::function<bool()> mPulse;
@@ -50,6 +50,7 @@ struct CParallelSteps {
 template <class TPiece, class TResult>
 class CParallelWork {
 public:
+    /// Threads start with Run; no jobs told are as many as the machine has cores.
     CParallelWork(const CParallelSteps<TPiece, TResult>& steps, const CParallelOptions& options)
         : mSteps(steps), mOptions(options) {
         if (mOptions.mJobs == 0) mOptions.mJobs = std::max(1U, std::thread::hardware_concurrency());
@@ -62,6 +63,7 @@ public:
         for (std::thread& thread : mThreads) thread.join();
     }
 
+    /// Returns when all is done or a step has ended it; throws again what a step threw.
     void Run() {
         if (mOptions.mJobs > 1) StartThreads();
         if (mThreads.empty()) return RunAlone();

@@ -12,8 +12,8 @@ namespace brindle {
 
 /// Notes and their names over roots, the best first; there is at least one.
 struct CNotesOverRoots {
-    std::vector<CNote> mNotes;
-    std::vector<CChordOverRoot> mNames;
+    std::vector<CNote> mNotes;           ///< from low to high
+    std::vector<CChordOverRoot> mNames;  ///< one for each root that was looked at
 };
 
 /// Notes with their names, as a table in which a root that does not sound stands in brackets.

@@ -13,6 +13,7 @@ namespace brindle {
 /// The libraries of a database with their tunings and numbers of chords, as a table and as JSON,
 /// see docs/json.md.
 [[nodiscard]] std::string GridLibrariesText(const GChDatabase& database, const CPaint& paint);
+/// The same as JSON, see docs/json.md.
 [[nodiscard]] std::string GridLibrariesJson(const GChDatabase& database);
 
 /// All fingerings of a database, each under the name of its chord.

@@ -9,6 +9,7 @@ namespace brindle {
 
 /// The shape of a net and the properties of its neurons, as text and as JSON, see docs/json.md.
 [[nodiscard]] std::string NetText(const NeuronalNet& net);
+/// The same as JSON, see docs/json.md.
 [[nodiscard]] std::string NetJson(const NeuronalNet& net);
 
 // A report on a net that hears the roots of chords: what it gets wrong of all voicings that

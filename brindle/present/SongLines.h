@@ -20,8 +20,8 @@ struct CSourceOfSong {
     std::string mMember;
     /// Of the songs in the file, from 1, and how many there are.
     std::size_t mNumber = 1;
-    std::size_t mCount = 1;
-    CUnreadSong mSong;
+    std::size_t mCount = 1;  ///< songs in the file
+    CUnreadSong mSong;       ///< read by the thread that analyses it
     /// Why there is no song to read; empty if there is one.
     std::string mFault;
 };

@@ -15,6 +15,7 @@ namespace brindle {
 /// score.
 [[nodiscard]] std::string SongScoresText(std::span<const COrderScores> scores, std::size_t songs,
                                          const CPaint& paint);
+/// The same as JSON, see docs/json.md.
 [[nodiscard]] std::string SongScoresJson(std::span<const COrderScores> scores, std::size_t songs);
 
 }  // namespace brindle

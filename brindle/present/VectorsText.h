@@ -16,14 +16,17 @@ struct CShownVector {
     std::string mSymbol;
     /// 46 places of 0.0 or 1.0, see CHarmAnlsChordForMetro.
     std::vector<float> mVector;
-    CHarmAnlsChordForMetro mReadBack;
+    CHarmAnlsChordForMetro mReadBack;  ///< the chord that the vector says
 };
 
+/// What a vector of 46 places says.
 [[nodiscard]] CShownVector ShowVector(std::vector<float> vector);
+/// The vector of a chord, under the symbol that it was written with.
 [[nodiscard]] CShownVector ShowVectorOfChord(std::string symbol, const CChordLite& chord);
 
 /// Vectors and what they say, as a table and as JSON, see docs/json.md.
 [[nodiscard]] std::string VectorsText(std::span<const CShownVector> vectors, const CPaint& paint);
+/// The same as JSON, see docs/json.md.
 [[nodiscard]] std::string VectorsJson(std::span<const CShownVector> vectors);
 
 }  // namespace brindle

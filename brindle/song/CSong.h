@@ -35,6 +35,7 @@ enum TSongSign : std::uint8_t {
 
 /// A bar as it is played. A bar that is played twice stands twice.
 struct CSongBar {
+    /// Of a bar whose source does not tell which written one it is.
     static constexpr std::size_t kNotWritten = static_cast<std::size_t>(-1);
 
     /// As printed, "12" or "12a"; of a typed song, the number of the written bar.
@@ -45,8 +46,9 @@ struct CSongBar {
     CSongTime mTime;  ///< that holds in it
     /// The bar of the written song that this is, from 0; `kNotWritten` if the source does not tell.
     std::size_t mWritten = kNotWritten;
-    /// What stands where the bar begins, and what at its end: "To Coda", "Fine", "D.C. al Fine".
+    /// What stands where the bar begins.
     TSongSign mSign = TSongSign_None;
+    /// What stands at its end: "To Coda", "Fine", "D.C. al Fine".
     std::string mWords = {};
 
     friend bool operator==(const CSongBar&, const CSongBar&) = default;

@@ -8,8 +8,8 @@ namespace brindle {
 
 /// A file that was named or that stands in a folder that was.
 struct CFoundFile {
-    std::string mPath;
-    bool mIsNamed = false;
+    std::string mPath;      ///< below the folder that was named
+    bool mIsNamed = false;  ///< itself, and not a folder around it
 };
 
 /// The files themselves, be they there or not, and those in the folders and below them, in

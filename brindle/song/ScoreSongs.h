@@ -34,9 +34,9 @@ struct CSongScore {
 
 /// How well songs are foretold by histories of one length.
 struct COrderScores {
-    std::size_t mOrder = 0;
-    CSongScore mWithKeys;
-    CSongScore mWithoutKeys;
+    std::size_t mOrder = 0;   ///< chords of history, from 1
+    CSongScore mWithKeys;     ///< chords told relative to their keys
+    CSongScore mWithoutKeys;  ///< all chords absolute
 };
 
 /// All songs together for each length of histories, from 1 to that of models.

@@ -20,6 +20,7 @@ struct CWishedChord {
     /// Bit 10 for a minor seventh and bit 11 for a major one.
     std::uint64_t mSevenths = kBothSevenths;
 
+    /// Any seventh.
     static constexpr std::uint64_t kBothSevenths = 0b110000000000;
 
     /// Whether a chord is such a one, whatever its spelling.

@@ -12,7 +12,7 @@ namespace brindle {
 
 /// A song of a source, which is read when it is wanted, on any thread.
 struct CUnreadSong {
-    std::function<CSong()> mRead;
+    std::function<CSong()> mRead;  ///< reads it, without a fault that is thrown
     /// What it takes in memory before it is read.
     std::size_t mByteCount = 0;
 };
