@@ -4,6 +4,7 @@
 #include "SourceSong.h"
 
 #include "brindle/chords/CChordLite.h"
+#include "brindle/platform/WorkInParallel.h"
 #include "brindle/present/PrintableSong.h"
 #include "brindle/present/ShownNames.h"
 #include "brindle/song/ReadSongHarmony.h"
@@ -12,12 +13,8 @@
 #include <nanobind/stl/string.h>
 
 #include <algorithm>
-#include <atomic>
-#include <exception>
-#include <mutex>
 #include <optional>
 #include <string_view>
-#include <thread>
 #include <vector>
 
 namespace brindle::python {
@@ -47,29 +44,6 @@ CSongRow RowOf(std::string_view text, const CSongOptions& options) {
 
 // More are of no use to anybody.
 constexpr std::size_t kMostThreads = 256;
-
-/// Calls `work` with each index below `count`, from so many threads; what one throws is thrown on.
-template <class TWork>
-void InThreads(std::size_t count, std::size_t threadCount, const TWork& work) {
-    std::atomic<std::size_t> next = 0;
-    std::exception_ptr thrown;
-    std::mutex mutex;
-    const auto run = [&] {
-        try {
-            for (std::size_t i = next++; i < count; i = next++) work(i);
-        } catch (...) {
-            const std::lock_guard lock(mutex);
-            thrown = std::current_exception();
-            next = count;
-        }
-    };
-    const std::size_t used = std::min({threadCount, count, kMostThreads});
-    std::vector<std::jthread> others;
-    for (std::size_t i = 1; i < used; ++i) others.emplace_back(run);
-    run();
-    others.clear();
-    if (thrown) std::rethrow_exception(thrown);
-}
 
 enum TChordField {
     kPosition,
@@ -178,26 +152,28 @@ void AddNoSong(CArrowColumn& table) {
     table.AddRecord();
 }
 
-// So many songs are read before their rows are written.
-constexpr std::size_t kSongsAtOnce = 4096;
+// What a row holds until it is written, about.
+std::size_t WeightOf(const std::optional<CSongRow>& row) {
+    constexpr std::size_t kBytesOfChord = 512;
+    return sizeof(CSongRow) + (row ? ChordCount(row->mSong) * kBytesOfChord : 0);
+}
 
 CArrowColumn TableOf(const CTexts& texts, std::size_t threadCount, const CSongOptions& options) {
     CArrowColumn table = SongsTable();
-    std::vector<CSongRow> rows;
-    for (std::size_t begin = 0; begin < texts.size(); begin += kSongsAtOnce) {
-        const std::size_t count = std::min(kSongsAtOnce, texts.size() - begin);
-        rows.assign(count, {});
-        InThreads(count, threadCount, [&](std::size_t i) {
-            if (texts[begin + i]) rows[i] = RowOf(*texts[begin + i], options);
-        });
-        for (std::size_t i = 0; i < count; ++i) {
-            if (texts[begin + i]) {
-                AddSong(table, rows[i]);
-            } else {
-                AddNoSong(table);
-            }
-        }
-    }
+    std::size_t next = 0;
+    CParallelSteps<std::size_t, std::optional<CSongRow>> steps;
+    steps.mNext = [&] { return next < texts.size() ? std::optional(next++) : std::nullopt; };
+    steps.mWork = [&](std::size_t i) {
+        return texts[i] ? std::optional(RowOf(*texts[i], options)) : std::nullopt;
+    };
+    steps.mTake = [&](std::optional<CSongRow>&& row) {
+        row ? AddSong(table, *row) : AddNoSong(table);
+        return true;
+    };
+    // The texts are there anyhow.
+    steps.mWeightOfPiece = [](std::size_t) { return std::size_t{1}; };
+    steps.mWeightOfResult = WeightOf;
+    WorkInParallel(steps, {.mJobs = std::min(threadCount, kMostThreads)});
     return table;
 }
 
