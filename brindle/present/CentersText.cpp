@@ -21,9 +21,7 @@ std::string DistanceText(int distance) {
 class CTextWriter {
 public:
     CTextWriter(const CShownSong& song, const CPaint& paint)
-        : mPaint(paint),
-          mBars(song.mBeatsPerBar, song.mBarStarts),
-          mHasReadings(song.mHasReadings) {}
+        : mPaint(paint), mBars(song.mBeatsPerBar, song.mBarStarts), mSong(song) {}
 
     void WriteHeading() {
         mText += mPaint.Strong("Centers by progressions: ") +
@@ -38,7 +36,7 @@ public:
         bool isAfterChords = true;
         for (const CShownCenter& center : signKey.mCenters) {
             const bool hasChords = !center.mChords.empty();
-            if (!hasChords && !center.mHarmCenter.IsUndef() && !mHasReadings) continue;
+            if (!hasChords && !center.mHarmCenter.IsUndef() && !mSong.mHasReadings) continue;
             if (isAfterChords || hasChords) StartParagraph();
             WriteHead(center);
             if (hasChords) WriteChords(center.mChords);
@@ -79,14 +77,25 @@ private:
         const bool hasChords = !center.mChords.empty();
         const std::string head =
             (hasChords || center.mHarmCenter.IsUndef() ? "Center " : "also heard: ") + center.mName;
-        std::string details = hasChords
-                                  ? ", " + BarsOf(center.mRange, mBars)
-                                  : fmt::format(", from bar {}", mBars.BarOf(center.mRange.mBegin));
+        std::string details =
+            ", " + (hasChords ? BarsOf(center.mRange, mBars) : WhereHeard(center));
         if (center.mProbability != kPosUndef && center.mProbability > 1.0) {
             details += fmt::format(", {} readings agree", ShortNumber(center.mProbability));
         }
         mText += "  " + mPaint.Accent(head) + mPaint.Faint(details) + '\n';
         if (hasChords) mText += '\n';
+    }
+
+    /// Where the reading is that has led to a center without chords.
+    [[nodiscard]] std::string WhereHeard(const CShownCenter& center) const {
+        const double begin = center.mRange.mBegin;
+        const auto reading = std::find_if(
+            mSong.mReadings.begin(), mSong.mReadings.end(), [&](const CShownCenter& other) {
+                return other.mHarmCenter == center.mHarmCenter && other.mRange.mBegin <= begin &&
+                       begin < other.mRange.mEnd;
+            });
+        return reading == mSong.mReadings.end() ? fmt::format("from bar {}", mBars.BarOf(begin))
+                                                : BarsOf(reading->mRange, mBars);
     }
 
     [[nodiscard]] static std::string SymbolsOf(const CShownCenter& center) {
@@ -114,7 +123,7 @@ private:
 
     const CPaint& mPaint;
     CBars mBars;
-    bool mHasReadings;
+    const CShownSong& mSong;
     std::string mText;
 };
 
