@@ -1,15 +1,14 @@
 // SPDX-License-Identifier: MIT
 #include "cli/KeyText.h"
 
-#include "cli/Input.h"
+#include "cli/Output.h"
 
 namespace brindle::cli {
 
 std::optional<CSignKeyLite> ReadKeyOption(std::string_view typed) {
-    const std::string text = FoldAccidentals(typed);
-    const CKeyText key = ReadKeyText(text);
+    const CKeyText key = ReadKeyText(typed);
     if (key.mError.empty()) return key.mSignKey;
-    static_cast<void>(FailAt(TStatus::BadUsage, "--key: " + key.mError, text, key.mColumn));
+    static_cast<void>(FailAt(TStatus::BadUsage, "--key: " + key.mError, typed, key.mColumn));
     return std::nullopt;
 }
 

@@ -27,8 +27,7 @@ std::variant<TStatus, std::vector<Value>> ReadLines(const std::vector<std::strin
     const auto lines = TypedLines(words);
     if (!lines) return TStatus::BadInput;
     std::vector<Value> values;
-    for (const std::string& line : *lines) {
-        const std::string typed = FoldAccidentals(line);
+    for (const std::string& typed : *lines) {
         const Reading reading = read(typed);
         if (!reading.mError.empty()) {
             return FailAt(TStatus::BadInput, reading.mError, typed, reading.mColumn);

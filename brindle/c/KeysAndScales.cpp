@@ -16,10 +16,11 @@ using namespace brindle::border;
 
 namespace {
 
-// The readers count bytes of a text in ASCII, which are its characters up to a fault.
+// The readers count bytes, and hosts characters.
 template <class TRead>
-brindle_status FailForName(const TRead& read) {
-    return Fail(BRINDLE_ERROR_INPUT, read.mError, read.mColumn + 1);
+brindle_status FailForName(const TRead& read, std::string_view typed) {
+    const std::size_t before = brindle::CountUtf8Characters(typed.substr(0, read.mColumn));
+    return Fail(BRINDLE_ERROR_INPUT, read.mError, before + 1);
 }
 
 brindle_status FailForUndefined(std::string_view what) {
@@ -49,8 +50,8 @@ brindle_status brindle_key_read(const char* text, brindle_key* key) {
     *key = ToC(brindle::CSignKeyLite());
     if (text == nullptr) return FailForNull("text");
     return Guarded([&] {
-        const brindle::CKeyText read = brindle::ReadKeyText(TypedName(text));
-        if (!read.mError.empty()) return FailForName(read);
+        const brindle::CKeyText read = brindle::ReadKeyText(text);
+        if (!read.mError.empty()) return FailForName(read, text);
         *key = ToC(read.mSignKey);
         return BRINDLE_OK;
     });
@@ -105,8 +106,8 @@ brindle_status brindle_scale_read(const char* text, brindle_scale* scale) {
     *scale = ToC(brindle::CScaleLite());
     if (text == nullptr) return FailForNull("text");
     return Guarded([&] {
-        const brindle::CScaleText read = brindle::ReadScaleText(TypedName(text));
-        if (!read.mError.empty()) return FailForName(read);
+        const brindle::CScaleText read = brindle::ReadScaleText(text);
+        if (!read.mError.empty()) return FailForName(read, text);
         *scale = ToC(brindle::CScaleLite(read.mScale));
         return BRINDLE_OK;
     });

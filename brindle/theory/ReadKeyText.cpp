@@ -2,6 +2,7 @@
 #include "brindle/theory/ReadKeyText.h"
 
 #include "brindle/theory/CChordNamePrefs.h"
+#include "brindle/theory/KeyNames.h"
 #include "brindle/theory/ScaleCatalogue.h"
 #include "brindle/theory/ScaleStrings.h"
 #include "brindle/theory/SetFromStringHelper.h"
@@ -28,6 +29,22 @@ CTypedRoot ReadRoot(const std::string& text) {
     return root;
 }
 
+// Where a place in the text with # and b stands in what was typed, whose signs may be longer.
+std::size_t TypedColumn(std::string_view typed, std::size_t column) {
+    std::size_t at = 0;
+    for (; column > 0 && at < typed.size(); --column) {
+        const std::string_view rest = typed.substr(at);
+        at += rest.starts_with(kUtf8Sharp) || rest.starts_with(kUtf8Flat) ? kUtf8Sharp.size() : 1;
+    }
+    return std::min(at, typed.size());
+}
+
+std::string WithAsciiSigns(std::string_view typed) {
+    std::string text(typed);
+    ConvertUtf8SharpAndFlatToAscii(text);
+    return text;
+}
+
 // Whether a reader that moved from the word's begin to `position` has read all of the text.
 bool IsReadToItsEnd(std::string_view text, int position) {
     return text.find_first_not_of(' ', static_cast<std::size_t>(position)) == text.npos;
@@ -46,19 +63,21 @@ const CScaleRow* ScaleOfName(std::string_view name) {
 }  // namespace
 
 CKeyText ReadKeyText(std::string_view typed) {
-    const std::string text = EnglishKeyText(typed).value_or(std::string(typed));
+    const std::string plain = WithAsciiSigns(typed);
+    const std::string text = EnglishKeyText(plain).value_or(plain);
     const CTypedRoot root = ReadRoot(text);
     if (root.mRoot.IsUndef()) return {{}, "a key begins with a letter A to H, as in \"Bb minor\""};
     int position = root.mConsumed;
     const TSignKeyType type = _SignKeyTypeFromString(text, position);
     if (!IsReadToItsEnd(text, position)) {
-        return {{}, "behind the key stands major or minor, or nothing", root.mWord};
+        return {
+            {}, "behind the key stands major or minor, or nothing", TypedColumn(typed, root.mWord)};
     }
     return {{root.mRoot, type}, {}, 0};
 }
 
 CScaleText ReadScaleText(std::string_view typed) {
-    const std::string text(typed);
+    const std::string text = WithAsciiSigns(typed);
     const CTypedRoot root = ReadRoot(text);
     if (root.mRoot.IsUndef()) {
         return {{}, "a scale begins with a letter A to H, as in \"D dorian\""};
@@ -67,7 +86,8 @@ CScaleText ReadScaleText(std::string_view typed) {
     static_cast<void>(_SemitonesScaleFromString(text, position));
     if (!IsReadToItsEnd(text, position)) {
         const CScaleRow* const row = ScaleOfName(std::string_view(text).substr(root.mWord));
-        if (row == nullptr) return {{}, "no scale of this name is known", root.mWord};
+        if (row == nullptr)
+            return {{}, "no scale of this name is known", TypedColumn(typed, root.mWord)};
         return {CScaleHeavy(root.mRoot, row->Semitones()), {}, 0};
     }
     CScaleText read;

@@ -21,8 +21,8 @@ struct CKeyText {
     std::size_t mColumn = 0;
 };
 
-/// Reads "F# minor", "Bb", "am" with accidentals in # and b, and German names: "fis-Moll", "B-Dur"
-/// (B flat major), "h moll" (B minor), "Es".
+/// Reads "F# minor", "Bb", "am" with accidentals in # and b or as the signs U+266F and U+266D, and
+/// German names: "fis-Moll", "B-Dur" (B flat major), "h moll" (B minor), "Es".
 [[nodiscard]] CKeyText ReadKeyText(std::string_view text);
 
 /// A scale that was typed, or what is wrong with it and where.
@@ -33,7 +33,7 @@ struct CScaleText {
     std::size_t mColumn = 0;
 };
 
-/// Reads "D dorian", "Bb blues minor", "Am" with accidentals in # and b, and all names of the
+/// Reads "D dorian", "Bb blues minor", "Am" with accidentals in the same ways, and all names of the
 /// catalogue as they are printed: "A Natural Minor".
 [[nodiscard]] CScaleText ReadScaleText(std::string_view text);
 

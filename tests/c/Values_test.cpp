@@ -114,6 +114,8 @@ TEST_CASE("Keys and scales are read and written, with their tones and signs") {
 
     CHECK(brindle_key_read("Bb mell", &key) == BRINDLE_ERROR_INPUT);
     CHECK(brindle_last_error_position() == 4);
+    CHECK(brindle_key_read("B♭ mell", &key) == BRINDLE_ERROR_INPUT);
+    CHECK(brindle_last_error_position() == 4);
     CHECK(brindle_scale_read("C nothing", &scale) == BRINDLE_ERROR_INPUT);
     CHECK(TextOf(brindle_key_write, &key) == "[an undefined key]");
     CHECK(brindle_key_relative(&key, &relative) == BRINDLE_ERROR_ARGUMENT);

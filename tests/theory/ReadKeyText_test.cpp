@@ -23,16 +23,23 @@ TEST_CASE("Keys are read in English and in German") {
         const char* mTyped;
         const char* mKey;
     } rows[] = {
-        {"F# minor", "F# Minor"}, {"Bb", "Bb Major"},         {"am", "A Minor"},
-        {"B", "B Major"},         {"H", "B Major"},           {"B minor", "B Minor"},
-        {"h-moll", "B Minor"},    {"B-Dur", "Bb Major"},      {"b moll", "Bb Minor"},
-        {"Bb moll", "Bb Minor"},  {"H-Dur", "B Major"},       {"fis-Moll", "F# Minor"},
-        {"Es-Dur", "Eb Major"},   {" As dur ", "Ab Major"},   {"cis MOLL", "C# Minor"},
-        {"Ces-Dur", "Cb Major"},  {"Fis", "F# Major"},        {"Es", "Eb Major"},
-        {"a-moll", "A Minor"},    {"Adur", "A Major"},        {"f# moll", "F# Minor"},
-        {"fis", "F# Major"},      {"Hes-Dur", "error at 1"},  {"Bis-Dur", "error at 3"},
-        {"J-Dur", "error at 0"},  {"moll", "error at 0"},     {"Aes-Dur", "error at 1"},
-        {"H# moll", "B# Minor"},  {"D dorian", "error at 2"},
+        {"F# minor", "F# Minor"},   {"Bb", "Bb Major"},
+        {"am", "A Minor"},          {"B", "B Major"},
+        {"H", "B Major"},           {"B minor", "B Minor"},
+        {"h-moll", "B Minor"},      {"B-Dur", "Bb Major"},
+        {"b moll", "Bb Minor"},     {"Bb moll", "Bb Minor"},
+        {"H-Dur", "B Major"},       {"fis-Moll", "F# Minor"},
+        {"Es-Dur", "Eb Major"},     {" As dur ", "Ab Major"},
+        {"cis MOLL", "C# Minor"},   {"Ces-Dur", "Cb Major"},
+        {"Fis", "F# Major"},        {"Es", "Eb Major"},
+        {"a-moll", "A Minor"},      {"Adur", "A Major"},
+        {"f# moll", "F# Minor"},    {"fis", "F# Major"},
+        {"Hes-Dur", "error at 1"},  {"Bis-Dur", "error at 3"},
+        {"J-Dur", "error at 0"},    {"moll", "error at 0"},
+        {"Aes-Dur", "error at 1"},  {"H# moll", "B# Minor"},
+        {"D dorian", "error at 2"}, {"F♯ minor", "F# Minor"},
+        {"B♭", "Bb Major"},         {"b♭m", "Bb Minor"},
+        {"c♯ moll", "C# Minor"},    {"F♯ dorian", "error at 5"},
     };
     for (const auto& row : rows) {
         INFO(std::string(row.mTyped));
@@ -49,6 +56,8 @@ TEST_CASE("Every scale is read by the name that it is printed with") {
         CHECK(read.mError.empty());
         CHECK(CScaleLite(read.mScale) == CScaleLite(CKeyEnh_Eb, row.Semitones()));
     }
+    CHECK(ReadScaleText("E♭ Dorian").mScale == ReadScaleText("Eb Dorian").mScale);
+    CHECK(ReadScaleText("E♭ natural").mColumn == std::string("E♭ ").size());
     CHECK(ReadScaleText("Eb natural").mError == "no scale of this name is known");
 }
 

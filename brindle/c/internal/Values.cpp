@@ -79,10 +79,4 @@ void GiveTones(const std::vector<CKeyEnh>& keys, brindle_tone* tones, std::size_
     for (std::size_t i = 0; i < *count; ++i) tones[i] = ToC(keys[i]);
 }
 
-std::string TypedName(const char* text) {
-    std::string typed(text);
-    ConvertUtf8SharpAndFlatToAscii(typed);
-    return typed;
-}
-
 }  // namespace brindle::border

@@ -36,7 +36,4 @@ namespace brindle::border {
 /// At most 12.
 void GiveTones(const std::vector<CKeyEnh>& keys, brindle_tone* tones, std::size_t* count);
 
-/// With # and b for the signs, as the readers of keys and scales want it.
-[[nodiscard]] std::string TypedName(const char* text);
-
 }  // namespace brindle::border

@@ -3,17 +3,15 @@
 
 #include "brindle/song/CSong.h"
 #include "brindle/song/internal/SongWords.h"
-#include "brindle/theory/KeyNames.h"
 #include "brindle/theory/ReadKeyText.h"
 
 namespace brindle {
 
 std::optional<CSignKeyLite> ReadStatedKey(std::string_view text) {
-    std::string folded(SongText::Trimmed(text));
-    ConvertUtf8SharpAndFlatToAscii(folded);
+    std::string name(SongText::Trimmed(text));
     // Charts write minor as a minus.
-    if (folded.ends_with('-')) folded.back() = 'm';
-    const CKeyText key = ReadKeyText(folded);
+    if (name.ends_with('-')) name.back() = 'm';
+    const CKeyText key = ReadKeyText(name);
     if (!key.mError.empty()) return std::nullopt;
     return key.mSignKey;
 }
