@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "cli/ChordSources.h"
 
+#include "cli/Input.h"
+
 #include "brindle/analysis/CHarmAnlsChords.h"
 #include "brindle/platform/AtomicFile.h"
 #include "brindle/song/LearnSong.h"
@@ -48,8 +50,9 @@ std::string FaultText(const CSongFault& fault) {
 CChordSource ReadChordSource(const std::string& path, const TChordStringParse& parse,
                              const CTypedChords& reading) {
     std::error_code error;
-    if (!fs::exists(path, error)) return Failed("no such file");
-    const auto bytes = ReadWholeFile(path, kMaxFileBytes);
+    const bool isInput = path == "-";
+    if (!isInput && !fs::exists(path, error)) return Failed("no such file");
+    const auto bytes = isInput ? ReadInput(path) : ReadWholeFile(path, kMaxFileBytes);
     if (!bytes) return Failed("it cannot be read, or is larger than 64 MiB");
     const CSong song = reading.ReadSource(*bytes, parse);
     const auto fault = std::find_if(song.mFaults.begin(), song.mFaults.end(),

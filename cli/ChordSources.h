@@ -20,7 +20,7 @@ struct CChordSource {
 };
 
 /// Reads a lead sheet in MusicXML, chord strings such as (4,C);(2,G7), one a line, or a chord text.
-/// The content tells which of them it is.
+/// The content tells which of them it is. "-" is standard input.
 [[nodiscard]] CChordSource ReadChordSource(const std::string& path, const TChordStringParse& parse,
                                            const CTypedChords& reading);
 

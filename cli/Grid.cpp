@@ -3,8 +3,10 @@
 #include "cli/GridDatabase.h"
 #include "cli/GridOptions.h"
 #include "cli/Input.h"
+#include "cli/NamingOptions.h"
 #include "cli/TypedChords.h"
 
+#include "brindle/chords/NameNotes.h"
 #include "brindle/present/GridsJson.h"
 #include "brindle/present/GridsSvg.h"
 #include "brindle/present/GridsText.h"
@@ -26,6 +28,7 @@ constexpr CCommandHelp kGridHelp{
     "  brindle grid Am7 F --format svg >grids.svg\n"
     "  brindle grid C13 --find --most 3 --dots intervals\n"
     "  brindle grid G7 --tuning ukulele --left\n"
+    "  brindle grid 224442 Bm --german --h-for-b\n"
     "\n"
     "A fingering has a fret for each string from the lowest one; x is a muted string,\n"
     "0 an open one. Frets of two digits need a - between the strings. A chord is looked\n"
@@ -45,6 +48,7 @@ struct CGridOptions {
     bool mIsFound = false;
     CFingeringOptionsOfUser mFingering;
     CTypedChords mReading;
+    CNamingOptions mNaming;
     CFormatOptions mFormat;
 };
 
@@ -52,13 +56,13 @@ struct CGridOptions {
 using TGrids = std::variant<TStatus, std::vector<CChordGrid>>;
 
 TGrids GridsOfFrets(const std::string& word, const std::vector<int>& frets,
-                    const GChShortTuning& tuning, int capo) {
+                    const GChShortTuning& tuning, const CGridOptions& options) {
     const auto strings = static_cast<std::size_t>(GChNumberOfStringsInShortTuning(tuning));
     if (frets.size() != strings) {
         return Fail(TStatus::BadInput, fmt::format("{} has {} strings, the tuning {} has {}", word,
                                                    frets.size(), TuningText(tuning), strings));
     }
-    auto grid = GridOfFrets(word, frets, tuning, capo);
+    auto grid = GridOfFrets(word, frets, tuning, options.mCapo, options.mNaming.ToldPrefs());
     if (!grid)
         return Fail(TStatus::BadInput, word + ": a fingering has at most 15 fretted strings");
     return std::vector{std::move(*grid)};
@@ -68,12 +72,14 @@ TGrids GridsOfFrets(const std::string& word, const std::vector<int>& frets,
 class CLookUp {
 public:
     CLookUp(const CGridOptions& options, const GChShortTuning& tuning)
-        : mOptions(options), mTuning(tuning) {}
+        : mOptions(options), mReading(options.mReading), mTuning(tuning) {
+        if (options.mNaming.ReadsBAsBFlat()) mReading.UseBAsBFlat();
+    }
 
     TGrids GridsOf(const std::string& word) {
         const std::string symbol = Printable(word);
         const bool beginsAsFrets = word.find_first_of("0123456789") == 0;
-        const auto chord = beginsAsFrets ? CChordLite() : mOptions.mReading.ReadSymbol(word);
+        const auto chord = beginsAsFrets ? CChordLite() : mReading.ReadSymbol(word);
         if (!chord) return TStatus::BadInput;
         if (chord->IsUndef()) {
             return Fail(TStatus::BadInput, symbol + " is neither a fingering nor a chord symbol");
@@ -87,6 +93,10 @@ public:
         auto grids = mOptions.mIsFound
                          ? FoundGrids(symbol, *chord, mTuning, fingering)
                          : GridsForChord(*mDatabase, symbol, *chord, mTuning, fingering);
+        if (const auto style = mOptions.mNaming.ToldPrefs()) {
+            const std::string name = Printable(ChordSymbolInStyle(*chord, *style));
+            for (CChordGrid& grid : grids) grid.mName = name;
+        }
         if (!grids.empty()) return grids;
         return Fail(TStatus::BadInput,
                     fmt::format("no fingering of {} for {}", symbol, TuningText(mTuning)));
@@ -94,6 +104,7 @@ public:
 
 private:
     const CGridOptions& mOptions;
+    CTypedChords mReading;
     GChShortTuning mTuning;
     std::unique_ptr<GChDatabase> mDatabase;
 };
@@ -111,19 +122,14 @@ TStatus Present(const std::vector<CChordGrid>& grids, const CGridOptions& option
 TStatus Grid(const CGridOptions& options) {
     const auto tuning = ReadTuningOption(options.mTuning);
     if (!tuning) return TStatus::BadUsage;
-    auto words = options.mWords;
-    if (IsStandardInput(words)) {
-        const auto text = ReadInput("-");
-        if (!text) return TStatus::BadInput;
-        words = WordsOf(*text);
-    }
+    const auto words = TypedSymbols(options.mWords);
+    if (!words) return TStatus::BadInput;
     CLookUp lookUp(options, *tuning);
     std::vector<CChordGrid> grids;
     auto status = TStatus::Success;
-    for (const std::string& word : words) {
+    for (const std::string& word : *words) {
         const auto frets = ReadFrets(word);
-        TGrids found =
-            frets ? GridsOfFrets(word, *frets, *tuning, options.mCapo) : lookUp.GridsOf(word);
+        TGrids found = frets ? GridsOfFrets(word, *frets, *tuning, options) : lookUp.GridsOf(word);
         if (found.index() == 0) {
             status = std::get<0>(found);
             continue;
@@ -152,6 +158,7 @@ void AddGrid(CCommand& program) {
     options->mFingering.AddTo(command);
     options->mReading.AddTo(command);
     options->mFormat.AddTo(command, {"text", "json", "svg"});
+    options->mNaming.AddSymbolsTo(command);
     command.OnCall([options] { return Grid(*options); });
 }
 

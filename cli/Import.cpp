@@ -2,6 +2,8 @@
 #include "cli/CommandLine.h"
 #include "cli/Input.h"
 #include "cli/Json.h"
+#include "cli/Progress.h"
+#include "cli/TypedSongs.h"
 
 #include "brindle/musicxml/ImportScore.h"
 #include "brindle/musicxml/MusicXmlParser.h"
@@ -15,10 +17,13 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
 #include <functional>
 #include <memory>
 #include <optional>
+#include <string>
 #include <utility>
+#include <vector>
 
 namespace brindle::cli {
 namespace {
@@ -28,11 +33,12 @@ constexpr CCommandHelp kImportHelp{
     "Import a MusicXML score as timed notes",
     "  brindle import song.musicxml\n"
     "  brindle import song.mxl --format ndjson | grep didEncounterNote\n"
-    "  brindle import song.mxl --midi song.mid\n",
+    "  brindle import song.mxl --midi song.mid\n"
+    "  brindle import scores/*.musicxml --json >scores.ndjson\n",
 };
 
 struct CImportOptions {
-    std::string mFile;
+    std::vector<std::string> mFiles;
     std::string mFormat = "text";
     bool mJson = false;
     std::optional<std::string> mMidiFile;
@@ -115,9 +121,27 @@ std::string ResultLine(bool isOk, const Error& error) {
     return line.dump(-1, ' ', false, Json::error_handler_t::replace) + '\n';
 }
 
-TStatus Import(const CImportOptions& options) {
-    if (options.mMidiFile == "") return Fail(TStatus::BadUsage, "--midi needs the name of a file");
-    const std::string name = options.mFile == "-" ? "standard input" : options.mFile;
+std::string HeadOf(const std::string& name, bool isFirst, const CImportOptions& options) {
+    if (options.mFiles.size() == 1) return {};
+    if (!options.IsNdjson()) return SongHead(name, isFirst);
+    const Json line{{"call", "song"}, {"name", name}};
+    return line.dump(-1, ' ', false, Json::error_handler_t::replace) + '\n';
+}
+
+// The file first: who reads the output may stop before its end.
+TStatus WriteMidi(const CImportedScore& score, const std::string& file) {
+    if (WriteFileAtomically(file, MidiFileBytes(MidiPieceOf(score)))) return TStatus::Success;
+    return Fail(TStatus::BadInput, fmt::format("{} cannot be written", Printable(file)));
+}
+
+/// What a score gives, and how its import ended: it may have a fault behind what it gives.
+struct CImported {
+    TStatus mStatus = TStatus::BadInput;
+    std::optional<std::string> mOutput;
+};
+
+CImported ImportFile(const std::string& file, const CImportOptions& options) {
+    const std::string name = InputName(file);
     const CAlertsAsErrors alerts(name);
     CImportedScore score;
     std::string output;
@@ -128,25 +152,39 @@ TStatus Import(const CImportOptions& options) {
         methods = options.mMidiFile ? Both(lines, methods) : lines;
     }
     Error error;
-    const auto isOk = ImportFrom(options.mFile, methods, error);
-    if (!isOk) return TStatus::BadInput;
-    if (!*isOk) {
-        Fail(TStatus::BadInput,
-             fmt::format("{}: {}", Printable(name), Printable(error.description)));
+    const auto isOk = ImportFrom(file, methods, error);
+    if (!isOk) return {};
+    if (!*isOk) Fail(TStatus::BadInput, fmt::format("{}: {}", name, Printable(error.description)));
+    if (*isOk && options.mMidiFile && WriteMidi(score, *options.mMidiFile) != TStatus::Success) {
+        return {};
     }
     const TStatus status = *isOk && alerts.Count() == 0 ? TStatus::Success : TStatus::BadInput;
-    if (options.IsNdjson()) {
-        output += ResultLine(*isOk, error);
-    } else if (*isOk) {
-        output = ImportText(score, PaintOfOutput());
+    if (options.IsNdjson()) return {status, output + ResultLine(*isOk, error)};
+    if (!*isOk) return {};
+    return {status, ImportText(score, PaintOfOutput())};
+}
+
+TStatus Import(const CImportOptions& options) {
+    if (options.mMidiFile == "") return Fail(TStatus::BadUsage, "--midi needs the name of a file");
+    if (options.mMidiFile && options.mFiles.size() > 1) {
+        return Fail(TStatus::BadUsage,
+                    fmt::format("--midi is for one score, and {} are told", options.mFiles.size()));
     }
-    // The file first: who reads the output may stop before its end.
-    if (*isOk && options.mMidiFile &&
-        !WriteFileAtomically(*options.mMidiFile, MidiFileBytes(MidiPieceOf(score)))) {
-        return Fail(TStatus::BadInput,
-                    fmt::format("{} cannot be written", Printable(*options.mMidiFile)));
+    CProgress progress(options.mFiles.size());
+    TStatus status = TStatus::Success;
+    bool isFirst = true;
+    for (const std::string& file : options.mFiles) {
+        progress.Step(file);
+        const CImported imported = ImportFile(file, options);
+        status = std::max(status, imported.mStatus);
+        if (!imported.mOutput) continue;
+        progress.Hide();
+        const TStatus printed =
+            Print(HeadOf(InputName(file), isFirst, options) + *imported.mOutput);
+        if (printed != TStatus::Success) return printed;
+        isFirst = false;
     }
-    return Print(output) == TStatus::Success ? status : TStatus::BadInput;
+    return status;
 }
 
 }  // namespace
@@ -155,8 +193,8 @@ void AddImport(CCommand& program) {
     CCommand& command = program.AddCommand(kImportHelp);
     const auto options = std::make_shared<CImportOptions>();
     command
-        .AddArgument("FILE", options->mFile,
-                     "A score in MusicXML, compressed if its name ends in .mxl; - reads standard "
+        .AddArgument("FILE", options->mFiles,
+                     "Scores in MusicXML, compressed if the name ends in .mxl; - reads standard "
                      "input")
         .Required();
     command.AddChoice("--format", options->mFormat, {"text", "ndjson"}, "Form of the output");

@@ -84,27 +84,47 @@ bool LooksLikeFileName(const std::string& word) {
     return HasFileEnding(word);
 }
 
+// Of a command that takes no songs: a file there may have the name of a chord.
+bool IsNoChordButAFile(const std::string& word) {
+    return LooksLikeFileName(word) && !ReadChordText(word).mFault.empty();
+}
+
+std::optional<std::string> ReadInputs(const std::vector<std::string>& names) {
+    std::string all;
+    for (const std::string& name : names) {
+        const auto text = ReadInput(name);
+        if (!text) return std::nullopt;
+        all += *text + '\n';
+    }
+    return all;
+}
+
 }  // namespace
 
 bool IsFileName(const std::string& word) {
     std::error_code error;
     if (std::filesystem::is_regular_file(word, error)) return true;
-    return LooksLikeFileName(word) && !ReadChordText(word).mFault.empty();
+    return IsNoChordButAFile(word);
 }
 
-bool IsStandardInput(const std::vector<std::string>& words) {
-    return words.size() == 1 && words.front() == "-";
+bool AreInputs(const std::vector<std::string>& words) {
+    if (words.size() == 1 && words.front() == "-") return true;
+    return !words.empty() && std::all_of(words.begin(), words.end(), IsNoChordButAFile);
+}
+
+std::string InputName(const std::string& path) {
+    return path == "-" ? "standard input" : Printable(path);
 }
 
 std::optional<std::string> ReadInput(const std::string& path) {
-    if (path == "-") return ReadAll(stdin, "standard input");
+    if (path == "-") return ReadAll(stdin, InputName(path));
     const std::unique_ptr<std::FILE, CCloser> file(std::fopen(path.c_str(), "rb"));
     if (file == nullptr) return Unreadable(path, std::strerror(errno));
     return ReadAll(file.get(), path);
 }
 
 std::optional<std::string> TextFromWords(const std::vector<std::string>& words) {
-    if (IsStandardInput(words)) return ReadInput("-");
+    if (AreInputs(words)) return ReadInputs(words);
     return fmt::format("{}", fmt::join(words, " "));
 }
 
@@ -117,7 +137,7 @@ std::string FoldAccidentals(std::string_view text) {
 std::optional<std::vector<std::string>> TypedLines(const std::vector<std::string>& words) {
     const auto text = TextFromWords(words);
     if (!text) return std::nullopt;
-    return IsStandardInput(words) ? TrimmedLines(*text) : std::vector<std::string>{*text};
+    return AreInputs(words) ? TrimmedLines(*text) : std::vector<std::string>{*text};
 }
 
 std::optional<std::vector<std::string>> TypedSongLines(const std::vector<std::string>& words) {
@@ -132,8 +152,8 @@ std::vector<std::string> WordsOf(std::string_view text) {
 }
 
 std::optional<std::vector<std::string>> TypedSymbols(const std::vector<std::string>& words) {
-    if (!IsStandardInput(words)) return words;
-    const auto text = ReadInput("-");
+    if (!AreInputs(words)) return words;
+    const auto text = ReadInputs(words);
     if (!text) return std::nullopt;
     return WordsOf(*text);
 }

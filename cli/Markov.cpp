@@ -34,9 +34,8 @@ std::optional<VariableLengthMarkovModel> ReadModel(const std::string& path) {
     if (!text) return std::nullopt;
     VariableLengthMarkovModel model;
     Helper::VariableLengthMarkovModelFromJSONString(*text, model);
-    const std::string_view name = path == "-" ? "standard input" : std::string_view(path);
     const auto fail = [&](std::string_view what) {
-        Fail(TStatus::BadInput, fmt::format("{} {}", Printable(name), what));
+        Fail(TStatus::BadInput, fmt::format("{} {}", InputName(path), what));
         return std::nullopt;
     };
     if (model.mMaxHistoryLength == 0) {

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "cli/ChordSources.h"
+#include "cli/Input.h"
 #include "cli/Markov.h"
 #include "cli/MarkovSongs.h"
 #include "cli/Progress.h"
@@ -84,7 +85,7 @@ CLearned LearnFiles(VariableLengthMarkovModel& model, const CLearnOptions& optio
 void ReportUnread(const CLearnReport& report) {
     for (const auto& [name, error] : report.mUnread) {
         Fail(TStatus::BadInput,
-             fmt::format("{} was left out: {}", Printable(name), Printable(error)));
+             fmt::format("{} was left out: {}", InputName(name), Printable(error)));
     }
 }
 
@@ -116,7 +117,8 @@ TStatus MarkovLearn(const CLearnOptions& options) {
 void AddMarkovLearn(CCommand& markov) {
     CCommand& command = markov.AddCommand(kMarkovLearnHelp);
     const auto options = std::make_shared<CLearnOptions>();
-    command.AddArgument("FILES", options->mFiles, "Files and folders").Required();
+    command.AddArgument("FILES", options->mFiles, "Files and folders; - reads standard input")
+        .Required();
     command.AddOption("-o,--output", "MODEL", options->mModel, "The model file that is written")
         .Required();
     command.AddFlag("--with-built-in", options->mWithBuiltIn, "Learn the built-in songs, too");

@@ -41,7 +41,7 @@ std::optional<std::vector<CChordLite>> TypedRow(const CNextOptions& options) {
 
 TStatus MarkovNext(const CNextOptions& options) {
     const auto chords = TypedRow(options);
-    if (!chords) return TStatus::BadUsage;
+    if (!chords) return TStatus::BadInput;
     CNextChordOptions asked;
     if (!options.mKey.empty()) {
         const auto key = ReadKeyOption(options.mKey);

@@ -37,6 +37,13 @@ void TakeTitle(const std::string& path, CSong& song) {
     if (song.mTitle.empty()) song.mTitle = std::filesystem::path(path).stem().string();
 }
 
+/// The songs of a file, or of standard input for "-".
+std::vector<CSong> SongsOf(const std::string& path, const CSongOptions& reading) {
+    if (path != "-") return ReadSongsFile(path, reading);
+    const auto bytes = ReadInput(path);
+    return bytes ? ReadSongs(*bytes, reading) : std::vector<CSong>();
+}
+
 }  // namespace
 
 std::optional<CSongModel> ReadSongModelFile(const std::string& path, const std::string& style) {
@@ -45,9 +52,8 @@ std::optional<CSongModel> ReadSongModelFile(const std::string& path, const std::
     if (!text) return std::nullopt;
     CSongModelReading reading = ReadSongModel(*text);
     if (reading.mFault.empty()) return OfStyle(reading.mModel, style);
-    const std::string name = path == "-" ? "standard input" : Printable(path);
     Fail(TStatus::BadInput,
-         fmt::format("{} {}; brindle markov learn makes one", name, reading.mFault));
+         fmt::format("{} {}; brindle markov learn makes one", InputName(path), reading.mFault));
     return std::nullopt;
 }
 
@@ -61,7 +67,7 @@ CTaughtFiles TeachFiles(const std::vector<std::string>& paths, double beatsPerBa
         progress.Step(file.mPath);
         std::size_t learned = 0;
         std::string fault = "there are no chords in it";
-        for (CSong& song : ReadSongsFile(file.mPath, reading)) {
+        for (CSong& song : SongsOf(file.mPath, reading)) {
             if (song.HasFault()) fault = song.mFaults.front().mText;
             TakeTitle(file.mPath, song);
             CTaughtSong one = TeachSong(song);
@@ -72,7 +78,7 @@ CTaughtFiles TeachFiles(const std::vector<std::string>& paths, double beatsPerBa
         taught.mFiles += learned > 0 ? 1 : 0;
         if (learned > 0) continue;
         Fail(TStatus::BadInput,
-             fmt::format("{} was left out: {}", Printable(file.mPath), Printable(fault)));
+             fmt::format("{} was left out: {}", InputName(file.mPath), Printable(fault)));
         taught.mIsNamedFileUnread = taught.mIsNamedFileUnread || file.mIsNamed;
     }
     return taught;

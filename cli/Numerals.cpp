@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "cli/CommandLine.h"
-#include "cli/Input.h"
 #include "cli/KeyText.h"
 #include "cli/TypedChords.h"
+#include "cli/TypedSongs.h"
 
 #include "brindle/analysis/ReadNumerals.h"
 #include "brindle/analysis/ReadRomanText.h"
@@ -12,6 +12,7 @@
 #include "brindle/present/RomanTextTable.h"
 
 #include <memory>
+#include <optional>
 #include <span>
 
 namespace brindle::cli {
@@ -31,7 +32,7 @@ constexpr CCommandHelp kNumeralsHelp{
 };
 
 struct CNumeralsOptions {
-    std::vector<std::string> mWords;
+    CTypedSongs mTexts;
     std::string mKey;
     std::string mFrom = "guess";
     bool mIsLenient = false;
@@ -44,58 +45,68 @@ bool AreNumerals(std::string_view text, const CSignKeyLite& key, const CNumerals
 }
 
 // False where faults end the reading; they have been printed.
-bool AcceptsFaults(const std::string& text, const std::vector<CTextFault>& faults,
+bool AcceptsFaults(const CTypedSong& text, const std::vector<CTextFault>& faults,
                    const CNumeralsOptions& options) {
     if (faults.empty()) return true;
     const std::size_t count = options.mIsLenient ? faults.size() : 1;
-    PrintFaults(text, std::span(faults).first(count), options.mIsLenient);
+    PrintFaults(text.mText, std::span(faults).first(count), options.mIsLenient, text.mName);
     return options.mIsLenient;
 }
 
-TStatus ShowWords(const std::string& text, const CSignKeyLite& key,
-                  const CNumeralsOptions& options) {
+TSongOutput WordsShown(const CTypedSong& typed, const CSignKeyLite& key,
+                       const CNumeralsOptions& options) {
+    const std::string& text = typed.mText;
     const bool areNumerals = AreNumerals(text, key, options);
     const CNumeralsReading reading =
         areNumerals ? ReadNumerals(text, key, options.mNumerals) : ReadChordWords(text);
-    if (!AcceptsFaults(text, reading.mFaults, options)) return TStatus::BadInput;
+    if (!AcceptsFaults(typed, reading.mFaults, options)) return TStatus::BadInput;
     if (options.mFormat.Format() == TFormat::Json) {
-        return Print(NumeralsJson(reading, text, key, areNumerals, options.mNumerals));
+        return NumeralsJson(reading, text, key, areNumerals, options.mNumerals);
     }
     const bool toChords = areNumerals && !options.mNumerals.mNashville;
-    return Print(NumeralWordsText(reading.mWords, key, toChords, options.mNumerals));
+    return NumeralWordsText(reading.mWords, key, toChords, options.mNumerals);
 }
 
-TStatus ShowAnalysis(const std::string& text, const CSignKeyLite& key,
-                     const CNumeralsOptions& options) {
-    const CRomanTextReading reading = ReadRomanText(text, key);
-    PrintFaults(text, reading.mNotes, true);
-    if (!AcceptsFaults(text, reading.mFaults, options)) return TStatus::BadInput;
+TSongOutput AnalysisShown(const CTypedSong& typed, const CSignKeyLite& key,
+                          const CNumeralsOptions& options) {
+    const CRomanTextReading reading = ReadRomanText(typed.mText, key);
+    PrintFaults(typed.mText, reading.mNotes, true, typed.mName);
+    if (!AcceptsFaults(typed, reading.mFaults, options)) return TStatus::BadInput;
     // What is taken for headers alone was hardly meant so.
     if (reading.mChords.empty()) return Fail(TStatus::BadInput, "the analysis has no numerals");
     const bool isJson = options.mFormat.Format() == TFormat::Json;
-    return Print(isJson ? RomanTextJson(reading, text) : RomanTextText(reading, PaintOfOutput()));
+    return isJson ? RomanTextJson(reading, typed.mText) : RomanTextText(reading, PaintOfOutput());
 }
 
-// As it was typed or stands in a file, so that faults have their lines.
-std::optional<std::string> TypedNumerals(const std::vector<std::string>& words) {
-    const bool isSource = words.size() == 1 && (words[0] == "-" || IsFileName(words[0]));
-    return isSource ? ReadInput(words[0]) : TextFromWords(words);
+// What is wrong with options that are fine one by one.
+std::optional<std::string> Contradiction(const CNumeralsOptions& options) {
+    const bool isAnalysis = options.mFrom == "romantext";
+    if (options.mKey.empty() && !isAnalysis) {
+        return "--key is required; see brindle numerals --help";
+    }
+    const CNumeralOptions& numerals = options.mNumerals;
+    if (isAnalysis &&
+        (numerals.mNashville || numerals.mFigures || numerals.mByKey || numerals.mPrintedSigns)) {
+        return "--nashville, --figures, --by-key and --printed-signs are not for --from "
+               "romantext, whose numerals stay as they are; brindle analyse writes its own";
+    }
+    return std::nullopt;
 }
 
 TStatus Numerals(const CNumeralsOptions& options) {
-    const bool isAnalysis = options.mFrom == "romantext";
-    CSignKeyLite key;
-    if (options.mKey.empty() && !isAnalysis) {
-        return Fail(TStatus::BadUsage, "--key is required; see brindle numerals --help");
+    if (const auto contradiction = Contradiction(options)) {
+        return Fail(TStatus::BadUsage, *contradiction);
     }
+    CSignKeyLite key;
     if (!options.mKey.empty()) {
         const auto typed = ReadKeyOption(options.mKey);
         if (!typed) return TStatus::BadUsage;
         key = *typed;
     }
-    const auto text = TypedNumerals(options.mWords);
-    if (!text) return TStatus::BadInput;
-    return isAnalysis ? ShowAnalysis(*text, key, options) : ShowWords(*text, key, options);
+    return options.mTexts.Print(options.mFormat.Format(), [&](const CTypedSong& text) {
+        return options.mFrom == "romantext" ? AnalysisShown(text, key, options)
+                                            : WordsShown(text, key, options);
+    });
 }
 
 }  // namespace
@@ -113,10 +124,9 @@ void AddNumeralOptions(CCommand& command, CNumeralOptions& options) {
 void AddNumerals(CCommand& program) {
     CCommand& command = program.AddCommand(kNumeralsHelp);
     const auto options = std::make_shared<CNumeralsOptions>();
-    command
-        .AddArgument("TEXT", options->mWords,
-                     "Numerals, chords or an analysis, or a file with them; - reads standard input")
-        .Required();
+    options->mTexts.AddTo(command,
+                          "Numerals, chords or an analysis, or files with them; - reads standard "
+                          "input");
     command.AddOption("--key", "KEY", options->mKey,
                       "The key, as in \"A minor\" or Bb; of an analysis, up to its own first key");
     command.AddChoice("--from", options->mFrom, {"guess", "numerals", "chords", "romantext"},

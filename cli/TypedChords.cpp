@@ -110,6 +110,7 @@ std::optional<std::vector<CChordLite>> CTypedChords::ReadSymbols(
         return chords;
     }
     CChordTextOptions prefs;
+    prefs.mBIsBFlat = mIsBBFlat;
     for (const std::string& symbol : symbols) {
         prefs.mBIsBFlat = prefs.mBIsBFlat || ReadChordText(symbol).mHasH;
     }

@@ -52,6 +52,8 @@ public:
 
     /// As --symbols native: by the parser that hosts use, which has no faults.
     void UseNative() { mReader = "native"; }
+    /// B is B flat, as in German, even where no H tells it.
+    void UseBAsBFlat() { mIsBBFlat = true; }
     /// Of numerals up to the first key of their own.
     void UseKey(const CSignKeyLite& key) { mKey = key; }
     [[nodiscard]] bool IsLenient() const { return mIsLenient; }
@@ -81,6 +83,7 @@ private:
     std::string mForm = "auto";
     bool mIsLenient = false;
     bool mIsEven = false;
+    bool mIsBBFlat = false;
     CSignKeyLite mKey;
 };
 

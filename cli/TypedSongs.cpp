@@ -28,8 +28,7 @@ std::string SongName(const CTypedSong& song) {
 std::string OneOfSeveral(const CTypedSong& song, TFormat format, std::string_view output,
                          bool isFirst) {
     if (format == TFormat::Json) return JsonLine(SongName(song), output) + '\n';
-    const std::string head = PaintOfOutput().Strong("==> " + SongName(song) + " <==");
-    return fmt::format("{}{}\n{}", isFirst ? "" : "\n", head, output);
+    return SongHead(SongName(song), isFirst).append(output);
 }
 
 }  // namespace
@@ -40,6 +39,10 @@ void CTypedSongs::AddTo(CCommand& command) {
                         "input");
     command.AddListOption("--file", "PATH", mFiles,
                           "Read a chord text or a score from a file; may be told several times");
+}
+
+void CTypedSongs::AddTo(CCommand& command, const std::string& purpose) {
+    command.AddArgument("TEXT", mWords, purpose).Required();
 }
 
 void CTypedSongs::AddFilesTo(CCommand& command) {
@@ -85,6 +88,11 @@ TStatus CTypedSongs::Print(TFormat format,
         isFirst = false;
     }
     return status;
+}
+
+std::string SongHead(std::string_view name, bool isFirst) {
+    const std::string head = PaintOfOutput().Strong(fmt::format("==> {} <==", name));
+    return fmt::format("{}{}\n", isFirst ? "" : "\n", head);
 }
 
 std::string JsonLine(std::string_view name, std::string_view json) {

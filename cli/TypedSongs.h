@@ -23,6 +23,8 @@ class CTypedSongs {
 public:
     /// Adds TEXT and --file, for texts and scores.
     void AddTo(CCommand& command);
+    /// Adds TEXT alone, which has to be told.
+    void AddTo(CCommand& command, const std::string& purpose);
     /// Adds FILE, for scores alone.
     void AddFilesTo(CCommand& command);
 
@@ -41,6 +43,9 @@ private:
     std::vector<std::string> mWords;
     std::vector<std::string> mFiles;
 };
+
+/// The line above the text of one of several songs, and a blank one between two of them.
+[[nodiscard]] std::string SongHead(std::string_view name, bool isFirst);
 
 /// The JSON of a song on one line: `json` without its white space, and before its members "Song",
 /// the name.

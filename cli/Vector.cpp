@@ -62,7 +62,7 @@ std::vector<std::string> WithVectorsJoined(const std::vector<std::string>& words
 
 // A line of standard input is a vector, or chord symbols between white space.
 std::optional<std::vector<std::string>> TypedThings(const std::vector<std::string>& words) {
-    if (!IsStandardInput(words)) return WithVectorsJoined(words);
+    if (!AreInputs(words)) return WithVectorsJoined(words);
     const auto lines = TypedLines(words);
     if (!lines) return std::nullopt;
     std::vector<std::string> things;

@@ -95,4 +95,8 @@ struct CNamedChord {
 [[nodiscard]] std::string NamedChordSymbol(const CNamedChord& chord, const CChordNamePrefs& prefs,
                                            bool isExact = false);
 
+/// The symbol of a chord as people type it, that of WriteChordSymbol, in such a style. Empty for an
+/// undefined root.
+[[nodiscard]] std::string ChordSymbolInStyle(const CChordLite& chord, const CChordNamePrefs& prefs);
+
 }  // namespace brindle

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/chords/NameNotes.h"
+#include "brindle/chords/WriteChordSymbol.h"
 #include "brindle/theory/CChordNamePrefs.h"
 #include "brindle/theory/KeyNames.h"
 
@@ -62,6 +63,14 @@ std::string NamedChordSymbol(const CNamedChord& chord, const CChordNamePrefs& pr
     symbol += prefs.mSlashText;
     symbol += OptionalSpaceAroundSlash(prefs);
     return symbol + KeyNrAndEnhToName(chord.mBass.mKeyNr, chord.mBass.mEnh, prefs);
+}
+
+std::string ChordSymbolInStyle(const CChordLite& chord, const CChordNamePrefs& prefs) {
+    CNamedChord named;
+    named.mRoot = chord.mRootKeyEnh;
+    if (chord.HasBassNote()) named.mBass = chord.mBassKeyEnh;
+    named.mSuffix = ChordSymbolSuffix(chord.mSemitones);
+    return NamedChordSymbol(named, prefs);
 }
 
 }  // namespace brindle

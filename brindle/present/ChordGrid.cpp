@@ -3,6 +3,7 @@
 
 #include "brindle/chords/CChordTypes.h"
 #include "brindle/chords/ChordTones.h"
+#include "brindle/chords/NameNotes.h"
 #include "brindle/chords/WriteChordSymbol.h"
 #include "brindle/guitarchords/GChChordDescr.h"
 #include "brindle/guitarchords/GChHarmonyStrings.h"
@@ -84,17 +85,20 @@ std::vector<int> PitchesOfKeys(const std::vector<int>& keyNrs) {
 }
 
 /// Names what the strings sound. Other names are those of whole chords that are nearly as likely.
-void SetNames(CChordGrid& grid) {
+void SetNames(CChordGrid& grid, const std::optional<CChordNamePrefs>& style) {
     constexpr int kNearlyAsLikely = 12;
     const auto names = NameFingering(grid.mPitches, grid.mTuning);
     if (names.empty()) return;
-    grid.mName = names.front().mSymbol;
+    const auto symbolOf = [&](const CNamedChord& name) {
+        return style ? Printable(NamedChordSymbol(name, *style)) : name.mSymbol;
+    };
+    grid.mName = symbolOf(names.front());
     grid.mRoot = names.front().mRoot.mKeyNr;
     grid.mChord = names.front().mChord;
     for (std::size_t i = 1; i < names.size(); ++i) {
         const bool isWhole = names[i].mOmitted.empty() && names[i].mAdded.empty();
         const bool isNear = names[i].mCost <= names.front().mCost + kNearlyAsLikely;
-        if (isWhole && isNear) grid.mOtherNames.push_back(names[i].mSymbol);
+        if (isWhole && isNear) grid.mOtherNames.push_back(symbolOf(names[i]));
     }
 }
 
@@ -258,7 +262,8 @@ std::string TuningText(const GChShortTuning& tuning) {
 }
 
 std::optional<CChordGrid> GridOfFrets(std::string_view symbol, const std::vector<int>& frets,
-                                      const GChShortTuning& tuning, int capo) {
+                                      const GChShortTuning& tuning, int capo,
+                                      const std::optional<CChordNamePrefs>& style) {
     const GChTuningDescr tuningDescr(tuning, capo);
     GChChordDescr chord;
     for (std::size_t i = 0; i < frets.size(); ++i) {
@@ -275,7 +280,7 @@ std::optional<CChordGrid> GridOfFrets(std::string_view symbol, const std::vector
     for (std::size_t i = 0; i < frets.size(); ++i) {
         grid.mPitches.push_back(chord.pitchForStringIndex1(static_cast<int>(i), tuningDescr));
     }
-    SetNames(grid);
+    SetNames(grid, style);
     if (const auto held = FingeringOfFrets(frets, tuning, capo)) {
         grid.mDifficulty = held->mDifficulty;
     }

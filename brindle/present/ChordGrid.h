@@ -6,6 +6,7 @@
 #include "brindle/guitarchords/GChDatabase.h"
 #include "brindle/guitarchords/GChShortTuning.h"
 #include "brindle/present/CGridStyle.h"
+#include "brindle/theory/CChordNamePrefs.h"
 
 #include <cstddef>
 #include <functional>
@@ -84,11 +85,11 @@ struct CFretWindow {
 /// "E2 A2 D3 G3 B3 E4"
 [[nodiscard]] std::string TuningText(const GChShortTuning& tuning);
 
-/// Frets without fingers, named as NameFingering does. Nothing if there are more fretted strings
-/// than a fingering has elements.
-[[nodiscard]] std::optional<CChordGrid> GridOfFrets(std::string_view symbol,
-                                                    const std::vector<int>& frets,
-                                                    const GChShortTuning& tuning, int capo);
+/// Frets without fingers, named as NameFingering does, in a style if one is given. Nothing if there
+/// are more fretted strings than a fingering has elements.
+[[nodiscard]] std::optional<CChordGrid> GridOfFrets(
+    std::string_view symbol, const std::vector<int>& frets, const GChShortTuning& tuning, int capo,
+    const std::optional<CChordNamePrefs>& style = {});
 
 /// A fingering of a library over its stored root. It is named by the symbol, or if that is empty by
 /// what the library says it is.

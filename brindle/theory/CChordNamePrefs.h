@@ -48,6 +48,8 @@ struct CChordNamePrefs {
     std::int32_t mNoSpaceAroundSlash = 1;
     /// What stands for the slash of a slash chord.
     std::string mSlashText = "/";
+
+    friend bool operator==(const CChordNamePrefs&, const CChordNamePrefs&) = default;
 };
 
 /// Writes all fields with their names on one line, for debugging.
