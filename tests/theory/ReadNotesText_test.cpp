@@ -20,6 +20,13 @@ std::string NumbersOf(const std::vector<CNote>& notes) {
     return text;
 }
 
+// Middle C is C4.
+CChordNamePrefs CountingLikeMusicians() {
+    CChordNamePrefs prefs = ChordNamePrefsNonUTF8;
+    prefs.mOctaveNaming = 1;
+    return prefs;
+}
+
 }  // namespace
 
 TEST_CASE("Notes are read with the octaves that musicians count, or as numbers") {
@@ -39,11 +46,12 @@ TEST_CASE("Notes are read with the octaves that musicians count, or as numbers")
     };
     for (const CRow& row : rows) {
         CAPTURE(row.mText);
-        const CNotesText read = ReadNotesText(row.mText, ChordNamePrefsNonUTF8);
+        const CNotesText read = ReadNotesText(row.mText, CountingLikeMusicians());
         CHECK(read.mError == "");
         CHECK(NumbersOf(read.mTyped) == row.mNumbers);
     }
-    CHECK(ReadNotesText("C4 B#3", ChordNamePrefsNonUTF8).mNotes.size() == 1);
+    CHECK(ReadNotesText("C4 B#3", CountingLikeMusicians()).mNotes.size() == 1);
+    CHECK(NumbersOf(ReadNotesText("C3", ChordNamePrefsNonUTF8).mTyped) == "60");
 }
 
 TEST_CASE("What is no note is told with its place") {
@@ -60,7 +68,7 @@ TEST_CASE("What is no note is told with its place") {
     };
     for (const CRow& row : rows) {
         CAPTURE(row.mText);
-        const CNotesText read = ReadNotesText(row.mText, ChordNamePrefsNonUTF8);
+        const CNotesText read = ReadNotesText(row.mText, CountingLikeMusicians());
         CHECK(read.mError == row.mError);
         CHECK(read.mColumn == row.mColumn);
     }
