@@ -102,6 +102,10 @@ const CAugmentedSixth* TakeAugmentedSixth(std::string_view& text) {
     return nullptr;
 }
 
+bool IsSubstitute(std::string_view text) {
+    return text.starts_with("sub");
+}
+
 bool IsWordOfNeapolitan(std::string_view text) {
     return text.starts_with('N');
 }
@@ -277,6 +281,11 @@ CChordOfNumeral ReadChord(const CNumeralPieces& pieces, const CFoldedNumeral& te
     CHead head = ReadHead(pieces.mChord, type);
     if (!head.mDegree.IsRead()) return Failed(kNoDegree, pieces.mChord);
     options.mFigures = options.mFigures || head.mHasFigures;
+    if (IsSubstitute(pieces.mChord)) {
+        // A dominant by its name; in its own key its seventh would be major.
+        options.mFigures = options.mFigures || options.mByKey;
+        options.mByKey = false;
+    }
     if (!pieces.mSlashedTail.empty()) {
         const std::string_view tailOfSign = HalfDiminishedTail(pieces.mSlashedTail);
         if (!head.mTail.empty() || tailOfSign.empty()) return Failed(kNoSign, pieces.mSlashedTail);

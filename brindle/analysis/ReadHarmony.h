@@ -134,9 +134,9 @@ struct CSongReading {
 [[nodiscard]] CSongReading ReadHarmony(const CHarmAnlsChords& chords,
                                        const CReadingOptions& options = {});
 
-/// The same reading with its numerals written by other options, such as Nashville numbers: those of
-/// NumeralsOf, by the chord and the next one. The default options change nothing. `chords` are
-/// those of the reading.
+/// The same reading with its numerals written by other options, see NumeralInStyle: what a chord is
+/// applied to stays as it was read. The default options change nothing. `chords` are those of the
+/// reading.
 [[nodiscard]] CSongReading WithNumerals(CSongReading reading, const CHarmAnlsChords& chords,
                                         const CNumeralOptions& options);
 

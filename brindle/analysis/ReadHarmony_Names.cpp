@@ -16,13 +16,10 @@ std::string CServedDegree::Name() const {
 CSongReading WithNumerals(CSongReading reading, const CHarmAnlsChords& chords,
                           const CNumeralOptions& options) {
     if (options == CNumeralOptions{}) return reading;
-    CKeyOfSong keys;
-    keys.mKey = reading.mKey;
-    keys.mRegions = reading.mRegions;
-    std::vector<std::string> numerals = NumeralsOf(chords, keys, options);
-    const std::size_t count = std::min(numerals.size(), reading.mChords.size());
+    const std::size_t count = std::min(chords.size(), reading.mChords.size());
     for (std::size_t ix = 0; ix < count; ++ix) {
-        reading.mChords[ix].mNumeral = std::move(numerals[ix]);
+        CChordReading& chord = reading.mChords[ix];
+        chord.mNumeral = NumeralInStyle(chord.mNumeral, chords[ix], chord.mKey, options);
     }
     return reading;
 }

@@ -194,9 +194,10 @@ struct CTail {
 CTail TailOf(const CChordLite& chord, const CWrittenDegree& degree, const CSignKeyLite& key,
              const CNumeralOptions& options) {
     const CChordSign sign = SignOfChord(chord.mSemitones, options);
-    std::string text(options.mByKey && sign.mAlterations.empty()
-                         ? SignByKey(sign.mSign, degree.mRoot)
-                         : sign.mSign);
+    // subV is a dominant by its name.
+    const bool isOfKey = options.mByKey && degree.mText != kSubstitute.mNumeral;
+    std::string text(isOfKey && sign.mAlterations.empty() ? SignByKey(sign.mSign, degree.mRoot)
+                                                          : sign.mSign);
     // Among figures a bare 6 is an inversion.
     if (text == "6" && (options.mFigures || options.mByKey)) text = "add6";
     std::string bass;
@@ -214,7 +215,70 @@ CTail TailOf(const CChordLite& chord, const CWrittenDegree& degree, const CSignK
     return {text + sign.mAlterations, bass};
 }
 
+// A degree that is written without an accidental and sounds so.
+bool IsNatural(const CReadDegree& degree, const CKeyEnh& keyEnh, const CSignKeyLite& key) {
+    const int semitones = SemitonesOfDegree(degree.mDegree, key.mSignKeyType);
+    return degree.mDegree.mAccidental == 0 && DistToTonic(keyEnh, key) == semitones;
+}
+
+// The degree of a numeral in the key, or in that of the degree behind its slash.
+CWrittenDegree DegreeOfNumeral(std::string_view numeral, const CChordLite& chord, CSignKeyLite key,
+                               const CNumeralOptions& options) {
+    const std::size_t slash = std::min(numeral.find('/'), numeral.size());
+    const CReadDegree own = ReadDegree(numeral.substr(0, slash));
+    const CReadDegree of = ReadDegree(numeral.substr(std::min(slash + 1, numeral.size())));
+    CWrittenDegree written{std::string(numeral.substr(0, slash - own.mRest.size())),
+                           {own.mDegree, key.mSignKeyType, own.mIsSmall},
+                           own.mDegree.mNumber,
+                           {}};
+    if (of.IsRead()) {
+        const CNumeralDegree target = FoldMinorFlat(of.mDegree, key.mSignKeyType);
+        const CSemitones triad(of.mIsSmall ? 137 : 145);
+        written.mTarget =
+            "/" + DegreeText(HeldInMinor(of.mDegree, triad, key, options), of.mIsSmall, false);
+        written.mNumber = (target.mNumber + own.mDegree.mNumber - 2) % 7 + 1;
+        key = CSignKeyLite(KeyOfDegree(target, key),
+                           of.mIsSmall ? TSignKeyType_Minor : TSignKeyType_Major);
+        written.mRoot.mKeyType = key.mSignKeyType;
+    }
+    if (own.IsRead() && IsNatural(own, chord.mRootKeyEnh, key)) {
+        const auto held = HeldInMinor(own.mDegree, chord.mSemitones, key, options);
+        if (held.mAccidental != 0) written.mText = DegreeText(held, own.mIsSmall, false);
+    }
+    return written;
+}
+
+// Each tone of a diminished seventh chord can be its root: the chord on that of its numeral. A
+// figure tells which tone lies below.
+CChordLite OnRootOfNumeral(CChordLite chord, std::string_view numeral, const CSignKeyLite& key,
+                           const CNumeralOptions& options) {
+    constexpr std::uint64_t kDiminishedSeventh = 0b1001001001;
+    if (chord.mSemitones.Mask() != kDiminishedSeventh) return chord;
+    const CKeyEnh root = ReadNumeral(numeral, key).mChord.mRootKeyEnh;
+    const int moved = IntvlBetween(chord.mRootKeyEnh, root);
+    if (root.IsUndef() || moved == 0 || moved % 3 != 0) return chord;
+    const CKeyEnh lowest = chord.HasBassNote() ? chord.mBassKeyEnh : chord.mRootKeyEnh;
+    const bool tellsBass = chord.HasBassNote() || options.mFigures;
+    chord.mRootKeyEnh = root;
+    chord.mBassKeyEnh = CKeyEnh_Undef;
+    if (tellsBass && IntvlBetween(root, lowest) != 0) {
+        chord.mBassKeyEnh = {lowest.mKeyNr, TEnh_Undef};
+    }
+    return chord;
+}
+
 }  // namespace
+
+std::string NumeralInStyle(std::string_view numeral, const CChordLite& chord,
+                           const CSignKeyLite& key, const CNumeralOptions& options) {
+    if (chord.IsUndef() || key.IsUndef()) return {};
+    if (options.mNashville) return RomanNumeral(chord, key, nullptr, options);
+    if (!ReadDegree(numeral).IsRead()) return std::string(numeral);
+    const CChordLite rooted = OnRootOfNumeral(chord, numeral, key, options);
+    const CWrittenDegree degree = DegreeOfNumeral(numeral, rooted, key, options);
+    const CTail tail = TailOf(rooted, degree, key, options);
+    return degree.mText + tail.mSign + degree.mTarget + tail.mBass;
+}
 
 std::string RomanNumeral(const CChordLite& chord, const CSignKeyLite& key, const CChordLite* next,
                          const CNumeralOptions& options) {

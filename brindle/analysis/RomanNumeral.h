@@ -48,6 +48,12 @@ struct CNumeralOptions {
                                        const CChordLite* next = nullptr,
                                        const CNumeralOptions& options = {});
 
+/// A numeral that is read already, "V7/ii" or "subV7/I", with all tones and the bass of its chord
+/// and in another style: the degree and what it is applied to stay, N6, Ger6 and their like stay
+/// as they are. With `mNashville` the number of the chord in the key.
+[[nodiscard]] std::string NumeralInStyle(std::string_view numeral, const CChordLite& chord,
+                                         const CSignKeyLite& key, const CNumeralOptions& options);
+
 /// The numeral of each chord of a list in its region; empty for the undefined ones.
 [[nodiscard]] std::vector<std::string> NumeralsOf(const CHarmAnlsChords& chords,
                                                   const CKeyOfSong& keys,

@@ -3,6 +3,7 @@
 #include "RandomChordTexts.h"
 #include "ReadingForms.h"
 
+#include "brindle/analysis/RomanNumeral.h"
 #include "brindle/theory/KeyIntervals.h"
 
 #include <doctest/doctest.h>
@@ -266,6 +267,76 @@ TEST_CASE("A seventh chord written with an augmented sixth is a German sixth, al
     CHECK(numeral("Em7 | Am7 | C7/Bb | B7 | Em7", {}, 2) == "subV7/V substitute dominant");
     // It does not lead down a semitone here.
     CHECK(numeral("C | C7 | F | G7 | C", {none, sixth}, 1) == "V7/IV dominant");
+}
+
+constexpr auto kStyles = std::to_array<CNumeralOptions>({
+    {.mFigures = true},
+    {.mPrintedSigns = true},
+    {.mByKey = true},
+    {.mFigures = true, .mByKey = true},
+});
+
+TEST_CASE("Other signs for numerals do not change what was read") {
+    struct CRow {
+        const char* mSong;
+        const char* mFigures;
+        const char* mByKey;
+    };
+    const CRow rows[] = {
+        {"C7 | F7 | C7 | C7 | F7 | F7 | C7 | C7 | G7 | F7 | C7 | G7",
+         "I7 IV7 I7 I7 IV7 IV7 I7 I7 V7 IV7 I7 V7",
+         "Id7 IVd7 Id7 Id7 IVd7 IVd7 Id7 Id7 V7 IVd7 Id7 V7"},
+        {"Dm7 | Db7 | Cmaj7", "ii7 subV7/I I^7", "ii7 subV7/I I^7"},
+        {"C | A7/C# | Dm | G7/B | C", "I V65/ii ii V65 I", "I V7/ii/^#1 ii V7/^7 I"},
+    };
+    for (const CRow& row : rows) {
+        INFO(std::string(row.mSong));
+        const CHarmAnlsChords song = BarsOf(row.mSong);
+        const auto numerals = [&](const CNumeralOptions& options) {
+            std::string text;
+            for (const auto& chord : WithNumerals(ReadHarmony(song), song, options).mChords) {
+                if (!chord.mNumeral.empty()) text += (text.empty() ? "" : " ") + chord.mNumeral;
+            }
+            return text;
+        };
+        CHECK(numerals({.mFigures = true}) == row.mFigures);
+        CHECK(numerals({.mByKey = true}) == row.mByKey);
+    }
+}
+
+TEST_CASE("A numeral in another style sounds as its chord, applied to the same degree") {
+    CChance chance(15);
+    for (int round = 0; round < 40; ++round) {
+        const CHarmAnlsChords song = RandomSong(chance, 60);
+        const CSongReading reading = ReadHarmony(song);
+        for (const CNumeralOptions& options : kStyles) {
+            const CSongReading styled = WithNumerals(reading, song, options);
+            for (std::size_t i = 0; i < song.size(); ++i) {
+                const std::string& numeral = styled.mChords[i].mNumeral;
+                const std::string& plain = reading.mChords[i].mNumeral;
+                const bool isName = plain.find_first_of("NGtr") != std::string::npos;
+                if (isName) CHECK(numeral == plain);
+                if (isName || plain.empty()) continue;
+                INFO(plain << " as " << numeral);
+                const CNumeralReading read = ReadNumeral(numeral, reading.mChords[i].mKey, options);
+                REQUIRE(!read.mChord.IsUndef());
+                CHECK(read.mChord.mSemitones == song[i].mSemitones);
+                // Each tone of a diminished seventh chord can be its root.
+                const int apart =
+                    FoldIntoOctave(read.mChord.mRootKeyEnh.mKeyNr) - song[i].mRootKeyEnh.mKeyNr;
+                CHECK(apart % (song[i].mSemitones.Mask() == 0x249 ? 3 : 12) == 0);
+                const auto bassOf = [](const CChordLite& chord) {
+                    const bool hasBass = chord.HasBassNote();
+                    return FoldIntoOctave((hasBass ? chord.mBassKeyEnh : chord.mRootKeyEnh).mKeyNr);
+                };
+                const bool tellsBass = options.mFigures || song[i].HasBassNote();
+                if (tellsBass) CHECK(bassOf(read.mChord) == bassOf(song[i]));
+                const bool isApplied = plain.find('/') != std::string::npos;
+                CHECK(isApplied ==
+                      (numeral.find_first_of("iIvV", numeral.find('/')) < numeral.size()));
+            }
+        }
+    }
 }
 
 TEST_CASE("No chords, one chord and very many are read") {
