@@ -19,6 +19,7 @@ constexpr std::size_t kMostBars = 100'000;
 constexpr std::size_t kMostCopiedWords = 100'000;
 constexpr std::size_t kMostFaults = 1'000;
 
+constexpr std::string_view kTooManyMeasures = "there are too many measures";
 constexpr std::string_view kNotHigher =
     "the number of the measure is not higher than the one before";
 
@@ -215,16 +216,27 @@ void CRomanTextReader::AddMeasure(int number, const CMeasureText& measure, bool 
         Fail(kNotHigher, mLine);
     }
     FillTo(number);
-    if (mReading.mBars.size() >= kMostBars) return Fail("there are too many measures", mLine);
+    if (mReading.mBars.size() >= kMostBars) return Fail(kTooManyMeasures, mLine);
     mLastNumber = number;
     CPlaceInText place = PlaceOfNextBar();
     std::string_view rest = measure.mText;
-    while (true) {
-        const std::string_view word = TakeWord(rest);
-        if (word.empty()) break;
+    bool isRead = false;
+    bool isBehindBarLine = false;
+    for (std::string_view word = TakeWord(rest); !word.empty(); word = TakeWord(rest)) {
+        if (word == "|") {
+            isBehindBarLine = isRead;
+            continue;
+        }
+        if (isBehindBarLine) {
+            if (mReading.mBars.size() + 1 >= kMostBars) return Fail(kTooManyMeasures, word);
+            CloseBar(mLastNumber++, place);
+            place = PlaceOfNextBar();
+            isBehindBarLine = false;
+        }
         ReadWord(word, place);
+        isRead = true;
     }
-    CloseBar(number, place);
+    CloseBar(mLastNumber, place);
 }
 
 CRomanTextReader::CPlaceInText CRomanTextReader::PlaceOfNextBar() const {
@@ -242,7 +254,7 @@ void CRomanTextReader::ReadTypedLine(std::string_view line) {
     if (HasBeats(line)) return AddMeasure(mLastNumber + 1, {line, mLine, mLineNumber}, false);
     CPlaceInText place = PlaceOfNextBar();
     for (std::string_view word = TakeWord(line); !word.empty(); word = TakeWord(line)) {
-        if (mReading.mBars.size() >= kMostBars) return Fail("there are too many measures", word);
+        if (mReading.mBars.size() >= kMostBars) return Fail(kTooManyMeasures, word);
         ReadTypedWord(word, place);
     }
     if (place.mPosition > place.mBarPosition) CloseBar(++mLastNumber, place);

@@ -50,7 +50,8 @@ TEST_CASE("A text that is no vector tells what is wrong, and where") {
         {"{}", "this is no JSON list of the places of a vector", 0},
     };
     for (const auto& [text, error, column] : cases) {
-        CAPTURE(text);
+        const auto& logged = text;
+        CAPTURE(logged);
         const CChordVectorText read = ReadChordVector(text);
         CHECK(read.mVector.empty());
         CHECK(read.mError == error);

@@ -111,7 +111,8 @@ TEST_CASE("A passage is repeated when chords, bass, spelling and lengths agree")
         {"C F C F G C F C F G", 4.0, {{8.0, -2, 2, 0}, {20.0, -5, 2, 0}, {28.0, -7, 2, 0}}},
     };
     for (const auto& [text, beats, copies] : cases) {
-        CAPTURE(text);
+        const auto& logged = text;
+        CAPTURE(logged);
         CHECK(FormOf(CopiesOf(text, beats)) == copies);
     }
 }

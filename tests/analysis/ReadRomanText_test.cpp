@@ -107,6 +107,8 @@ TEST_CASE("A typed line needs no measure") {
         {"C: I b3 V65/V", "0+2 C I; 2+2 C V65/V", "1@0+4"},
         {"C: I\nV\nm4 I", "0+4 C I; 4+8 C V; 12+4 C I", "1@0+4 2@4+4 3@8+4 4@12+4"},
         {"C: I NC\n\nb3 a: V", "0+1 C I; 1+5 C NC; 6+2 Am V", "1@0+4 2@4+4"},
+        {"m1 C: I b3 V65/V | a: i |", "0+2 C I; 2+2 C V65/V; 4+4 Am i", "1@0+4 2@4+4"},
+        {"C: I b3 IV | vi b3 IV", "0+2 C I; 2+2 C IV; 4+2 C vi; 6+2 C IV", "1@0+4 2@4+4"},
     };
     for (const auto& row : rows) {
         INFO(std::string(row.mText));

@@ -30,7 +30,8 @@ TEST_CASE("A chord symbol is read as root, bass and mask, and written again") {
         {"N.C.", {{-1, 127}, {-1, 127}, 0}, "N.C.", ""},
     };
     for (const auto& [symbol, wanted, written, tones] : cases) {
-        INFO(std::string(symbol));
+        const std::string logged(symbol);
+        INFO(logged);
         brindle_chord chord;
         REQUIRE(brindle_chord_read(symbol, 0, &chord) == BRINDLE_OK);
         CHECK(std::string(brindle_last_error()).empty());
@@ -73,7 +74,8 @@ TEST_CASE("What is no chord is told with its place") {
     };
     for (const auto& [text, position] :
          {CCase{"Cmajor7x", 8}, {"H\xFF", 2}, {"", 1}, {"%", 1}, {"♯♯♯", 1}}) {
-        INFO(std::string(text));
+        const std::string logged(text);
+        INFO(logged);
         brindle_chord chord;
         CHECK(brindle_chord_read(text, 0, &chord) == BRINDLE_ERROR_INPUT);
         CHECK(chord.root.pitch_class == BRINDLE_NONE);
@@ -92,7 +94,8 @@ TEST_CASE("Keys and scales are read and written, with their tones and signs") {
          {CCase{"D dorian", "D Dorian", "D E F G A B C"},
           {"E♭ blues minor", "Eb Minor Blues", "Eb Gb Ab A Bb Db"},
           {"F# major", "F# Major", "F# G# A# B C# D# E#"}}) {
-        INFO(std::string(text));
+        const std::string logged(text);
+        INFO(logged);
         brindle_scale scale;
         REQUIRE(brindle_scale_read(text, &scale) == BRINDLE_OK);
         CHECK(TextOf(brindle_scale_write, &scale) == name);

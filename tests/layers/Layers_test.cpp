@@ -85,7 +85,8 @@ TEST_CASE("The checker finds what is planted") {
         {"brindle/present/A.cpp", "#include <CLI/CLI.hpp>", true},
     };
     for (const auto& [path, text, isFault] : cases) {
-        INFO(path << " with " << text);
+        const std::string logged = std::string(path) + " with " + std::string(text);
+        INFO(logged);
         CHECK(IncludeFaults(path, text).empty() == !isFault);
     }
 }

@@ -107,7 +107,8 @@ TEST_CASE("The name of the score is found soon in a list of files without end") 
               true},
              {"<container><rootfile full-path='a'><rootfiles/></rootfile></container>", false},
              {"<rootfiles><container><rootfile full-path='a'/></container></rootfiles>", false}}) {
-        INFO(list);
+        const std::string logged(list);
+        INFO(logged);
         const auto failure =
             MusicXmlParser::unpackCompressedMusicXML(ZipOf("META-INF/container.xml", list), score);
         REQUIRE(failure.has_value());

@@ -39,7 +39,8 @@ TEST_CASE("A grid shows four frets from the nut, or from its lowest fret where i
         {"x-10-12-12-11-10", 9, 4},
     };
     for (const auto& [frets, first, count] : cases) {
-        INFO(frets);
+        const std::string logged(frets);
+        INFO(logged);
         const CFretWindow window = WindowOf(GridOf(frets));
         CHECK(window.mFirst == first);
         CHECK(window.mCount == count);
@@ -57,7 +58,8 @@ TEST_CASE("A letter a tritone away from the usual string is tuned down to") {
         {"E\u266DADGBE", "D#2 A2 D3 G3 B3 E4"}, {"GDAE", "G2 D3 A3 E4"},
     };
     for (const auto& [text, tuning] : cases) {
-        INFO(text);
+        const std::string logged(text);
+        INFO(logged);
         const auto read = ReadTuning(text);
         REQUIRE(read);
         CHECK(TuningText(*read) == tuning);
@@ -104,7 +106,8 @@ TEST_CASE("Notes are spelled by their chord, and their octave is that of their l
             const std::string dot = DotText(grid, i, TGridDots::Notes);
             CHECK(dot == note.substr(0, note.size() - (note.empty() ? 0 : 1)));
         }
-        INFO(symbol);
+        const std::string logged(symbol);
+        INFO(logged);
         CHECK(told == notes);
     }
 }

@@ -46,7 +46,8 @@ TEST_CASE("Harmonies of scores are written as people type them, and read back") 
         {"<kind>none</kind>", "N.C."},
     };
     for (const auto& [kind, symbol] : cases) {
-        INFO(kind);
+        const std::string logged(kind);
+        INFO(logged);
         const TMusicXMLHarmony harmony = HarmonyOf(kind);
         CHECK(HarmonySymbol(harmony) == symbol);
         const CChordLite chord = ChordOfHarmony(harmony);

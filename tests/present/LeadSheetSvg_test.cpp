@@ -242,7 +242,8 @@ TEST_CASE("A long rest is one bar, and bars are counted where a song has none") 
 TEST_CASE("Every chord stands once, between its bar lines, and no two texts touch") {
     for (const auto& [name, song] : ManySongs()) {
         for (const double width : {700.0, 500.0, 150.0}) {
-            INFO(name << " " << width);
+            const std::string logged(name);
+            INFO(logged << " " << width);
             const CSheetScore score = ScoreOf(song, width);
             std::vector<std::size_t> drawn;
             for (const CSheetLine& line : score.mLines.mLines) {
@@ -270,7 +271,8 @@ TEST_CASE("Every chord stands once, between its bar lines, and no two texts touc
 
 TEST_CASE("Arrows and brackets lead from a chord that is drawn to a later one") {
     for (const auto& [name, song] : ManySongs()) {
-        INFO(name);
+        const std::string logged(name);
+        INFO(logged);
         const CSongReading reading = ReadHarmony(song.mChords);
         const CSheet sheet = MakeSheet(song);
         const CSheetLinks links = MakeLinks(song, reading, sheet);
@@ -416,7 +418,8 @@ TEST_CASE("Whole lead sheets are as they were looked at") {
         {"repeats-narrow.svg", SvgOf(repeats, {.mWidth = 400.0})},
     };
     for (const auto& [name, svg] : sheets) {
-        INFO(name);
+        const std::string logged(name);
+        INFO(logged);
         const std::string path = BRINDLE_SOURCE_DIR "/tests/data/sheets/" + std::string(name);
         if (std::getenv("BRINDLE_RENEW_GOLDEN") != nullptr) std::ofstream(path) << svg;
         CHECK(ReadFile(path) == svg);

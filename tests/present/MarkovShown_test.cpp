@@ -55,7 +55,7 @@ TEST_CASE("Roots of keys with many signs are those that people type") {
         for (int keyNr = 0; keyNr < 12; ++keyNr) {
             CMarkovObject object;
             object.mType = TMarkovObjectType_Chord;
-            object.mChord.mRootKeyEnh = CKeyEnh(keyNr);
+            object.mChord.mRootKeyEnh = {keyNr, TEnh_Undef};
             object.mChord.mSemitones = {0, 4, 7};
             roots += (roots.empty() ? "" : " ") + spelling.SymbolOf(object);
         }

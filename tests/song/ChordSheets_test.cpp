@@ -162,7 +162,7 @@ TEST_CASE("Packed charts are read") {
     const CChordLite sameWithBass = ReadSong("C^7W/G", chart).mChords[1];
     CHECK(sameWithBass == CChordLite(CKeyEnh_C, CKeyEnh_G, CSemitones{0, 4, 7, 11}));
     const CSongOptions german{.mFormat = TSongFormat_Chart, .mChordTextPrefs{.mBIsBFlat = true}};
-    CHECK(ReadSong("C^7W/B", german).mChords[1].mBassKeyEnh == CKeyEnh(10, TEnh_b));
+    CHECK(ReadSong("C^7W/B", german).mChords[1].mBassKeyEnh == CKeyEnh{10, TEnh_b});
     CHECK(Shown("C^7 |?", chart) == R"(1:6: "?" is not understood)");
 }
 

@@ -29,7 +29,8 @@ TEST_CASE("A split source gives the songs that reading all of it gives") {
         {"", TSongFormat_Auto, 1},
     };
     for (const auto& [bytes, format, count] : cases) {
-        CAPTURE(bytes);
+        const auto& logged = bytes;
+        CAPTURE(logged);
         CSongOptions prefs;
         prefs.mFormat = format;
         const std::vector<CSong> whole = ReadSongs(bytes, prefs);

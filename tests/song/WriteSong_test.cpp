@@ -132,7 +132,8 @@ TEST_CASE("A sheet with gaps is filled and its chords stay where they are") {
         {0, "C"},       {3, "C"},       {10, "F#m7b5/A"}, {11, "F#m7b5/A"}, {12, "G7"}, {15, "G7"},
         {20, "Abmaj7"}, {22, "Abmaj7"}, {23, "Db7"},      {28, "C"},        {31, "C"}};
     for (const auto& [beat, symbol] : wanted) {
-        CAPTURE(beat);
+        const auto& logged = beat;
+        CAPTURE(logged);
         CHECK(beats[beat] == symbol);
     }
 }
