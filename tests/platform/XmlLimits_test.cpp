@@ -4,7 +4,15 @@
 #include "brindle/platform/XmlStreamParser.h"
 
 #include <doctest/doctest.h>
-#ifdef __SANITIZE_ADDRESS__
+// GCC tells of the address sanitizer by a macro, clang by a feature.
+#if defined(__has_feature)
+#if __has_feature(address_sanitizer)
+#define BRINDLE_COUNTS_LEAKS
+#endif
+#elif defined(__SANITIZE_ADDRESS__)
+#define BRINDLE_COUNTS_LEAKS
+#endif
+#ifdef BRINDLE_COUNTS_LEAKS
 #include <sanitizer/lsan_interface.h>
 #endif
 #include <libxml/parser.h>
@@ -63,7 +71,7 @@ double SecondsFor(const std::string& bytes) {
     return std::chrono::duration<double>(std::chrono::steady_clock::now() - begin).count();
 }
 
-#ifdef __SANITIZE_ADDRESS__
+#ifdef BRINDLE_COUNTS_LEAKS
 /// The XML library loses some of its own blocks when its memory is short.
 using CLeaksAllowed = __lsan::ScopedDisabler;
 #else
