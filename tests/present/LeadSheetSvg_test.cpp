@@ -231,6 +231,48 @@ TEST_CASE("Endings, several times, jumps and nonsense") {
     CHECK(Shown(odd) == "| C | F | C | F ");
 }
 
+/// "C | D | ": bars with the chords of `letters`.
+std::string BarsOf(std::string_view letters) {
+    std::string text;
+    for (const char letter : letters) text += std::string(1, letter) + " | ";
+    return text;
+}
+
+TEST_CASE("Written endings stand as they are, however long they are") {
+    for (const std::size_t body : {1U, 2U, 3U, 5U, 12U}) {
+        for (const std::size_t first : {1U, 2U, 4U, 5U, 9U, 20U}) {
+            for (const std::size_t second : {1U, 2U, 5U, 20U}) {
+                INFO(body << " " << first << " " << second);
+                const std::string common(body, 'C');
+                const std::string endOne(first, 'D');
+                const std::string endTwo(second, 'E');
+                const CSong song = EvenSong("|: " + BarsOf(common) + "[1 " + BarsOf(endOne) +
+                                            ":| [2 " + BarsOf(endTwo));
+                const CSheet sheet = MakeSheet(song);
+                REQUIRE(sheet.mBars.size() == body + first + second);
+                for (std::size_t i = 0; i < sheet.mBars.size(); ++i) {
+                    const CSheetBar& bar = sheet.mBars[i];
+                    CHECK(bar.mWritten == i);
+                    CHECK(bar.mBeginsRepeat == (i == 0));
+                    CHECK(bar.mEndsRepeat == (i + 1 == body + first));
+                    CHECK(bar.mEnding == (i == body ? "1." : i == body + first ? "2." : ""));
+                    CHECK(bar.mRemark.empty());
+                }
+            }
+        }
+    }
+    const std::pair<const char*, const char*> songs[] = {
+        {"|: C | [1 D | D :| [2 E | E | E :| [3 F", "|: C | [1. D | D :| [2. E | E | E :| [3. F "},
+        // The last ending ends before the next repeat.
+        {"|: C | [1 D | D | D :| [2 E | |: F | G :| A",
+         "|: C | [1. D | D | D :| [2. E |: F | G :| A "},
+    };
+    for (const auto& [text, shown] : songs) CHECK(Shown(EvenSong(text)) == shown);
+    const CSheet sheet = MakeSheet(EvenSong("|: C | [1 D | D | D :| [2 E | |: F | G :| A"));
+    CHECK(sheet.mBars[4].mIsInEnding);
+    CHECK(!sheet.mBars[5].mIsInEnding);
+}
+
 TEST_CASE("A long rest is one bar, and bars are counted where a song has none") {
     CSongOptions prefs;
     prefs.mBeatsPerChord = 2.0;

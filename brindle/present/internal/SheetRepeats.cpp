@@ -11,7 +11,7 @@
 namespace brindle::LeadSheet {
 namespace {
 
-// A first ending that is longer is no ending to the eye.
+// Where no repeat sign is known, a longer ending is no ending to the eye.
 constexpr std::size_t kLongestEnding = 8;
 
 /// A repeat in bars: from `mAgain` on, `mCount` bars are those from `mSource` on.
@@ -40,9 +40,14 @@ struct CPassage {
 class CFolding {
 public:
     CFolding(const CSong& song, CSheet& sheet)
-        : mSong(song), mSheet(sheet), mBars(sheet.mBars), mIsHidden(sheet.mBars.size(), false) {}
+        : mSong(song),
+          mSheet(sheet),
+          mBars(sheet.mBars),
+          mIsHidden(sheet.mBars.size(), false),
+          mIsSource(sheet.mBars.size(), false) {}
 
     void Fold() {
+        mJumps = BarsThatJump();
         FoldJumps();
         const std::vector<CRepeat> repeats = Repeats();
         for (std::size_t i = 0; i < repeats.size();) {
@@ -67,7 +72,6 @@ private:
 
     // What a written jump plays again stands there already.
     void FoldJumps() {
-        const std::unordered_map<std::size_t, std::size_t> jumps = BarsThatJump();
         std::unordered_map<std::size_t, std::size_t> first;
         bool isReplay = false;
         for (std::size_t i = 0; i < mBars.size(); ++i) {
@@ -76,8 +80,7 @@ private:
             const auto [drawn, isNew] = first.try_emplace(written, i);
             isReplay = isReplay && !isNew && AreSame(drawn->second, i);
             if (isReplay) HideBar(i, drawn->second);
-            const auto jump = jumps.find(written);
-            isReplay = isReplay || (jump != jumps.end() && jump->second == i);
+            isReplay = isReplay || IsJump(i);
         }
     }
 
@@ -91,6 +94,11 @@ private:
             if (hasJump && leadsBack) jumps.insert_or_assign(mBars[i].mWritten, i);
         }
         return jumps;
+    }
+
+    [[nodiscard]] bool IsJump(std::size_t bar) const {
+        const auto jump = mJumps.find(mBars[bar].mWritten);
+        return jump != mJumps.end() && jump->second == bar;
     }
 
     // Wherever drawn bars begin to stand a second time, a remark tells where they stood first.
@@ -131,13 +139,15 @@ private:
     }
 
     // In the order of playing. No two of them reach over each other.
-    [[nodiscard]] std::vector<CRepeat> Repeats() const {
+    [[nodiscard]] std::vector<CRepeat> Repeats() {
         std::vector<CRepeat> repeats;
         for (const CSongRepeat& told : mSong.mRepeats) {
             const CRepeat repeat{BarAt(told.mSourcePosition), BarAt(told.mPosition),
                                  told.mBarCount};
             if (repeat.mAgain == kNone || repeat.mSource >= repeat.mAgain) continue;
-            if (!mIsHidden[repeat.mAgain]) repeats.push_back(repeat);
+            if (mIsHidden[repeat.mAgain]) continue;
+            repeats.push_back(repeat);
+            mIsSource[repeat.mSource] = true;
         }
         std::sort(repeats.begin(), repeats.end(), [](const CRepeat& one, const CRepeat& other) {
             return one.mAgain < other.mAgain;
@@ -205,8 +215,8 @@ private:
     }
 
     // Whether a repeat is one more time of the passage.
-    [[nodiscard]] static bool Takes(const CPassage& passage, const std::vector<CRepeat>& repeats,
-                                    std::size_t index) {
+    [[nodiscard]] bool Takes(const CPassage& passage, const std::vector<CRepeat>& repeats,
+                             std::size_t index) const {
         const CRepeat& repeat = repeats[index];
         const bool isFirst = passage.mAgain.empty();
         const std::size_t before = isFirst ? passage.mBegin : passage.mAgain.back();
@@ -216,12 +226,28 @@ private:
         }
         const std::size_t common = std::min(repeat.mCount, passage.mLength);
         if (common == passage.mLength) return true;
-        // All times that end on their own are to leave the passage at the same place, and an ending
-        // is short.
+        // All times that end on their own are to leave the passage at the same place.
         const bool isSamePlace = passage.HasEndings() ? common == passage.mCommon : true;
+        if (common == 0 || !isSamePlace) return false;
+        if (IsWritten(repeat)) return GoesOnBehind(repeat, common);
         const std::size_t ending = passage.mLength - common;
         const bool isShort = repeat.mAgain - before - common <= kLongestEnding;
-        return common > 0 && isSamePlace && isShort && ending <= std::min(common, kLongestEnding);
+        return isShort && ending <= std::min(common, kLongestEnding);
+    }
+
+    // Whether the song tells which bars stand there a second time.
+    [[nodiscard]] bool IsWritten(const CRepeat& repeat) const {
+        const std::size_t written = mBars[repeat.mAgain].mWritten;
+        return written != CSongBar::kNotWritten && written == mBars[repeat.mSource].mWritten;
+    }
+
+    // Whether the written song goes back by a repeat sign, and leaves the passage for an ending
+    // that is written further on.
+    [[nodiscard]] bool GoesOnBehind(const CRepeat& repeat, std::size_t common) const {
+        const std::size_t next = repeat.mAgain + common;
+        return !IsJump(repeat.mAgain - 1) && next < mBars.size() &&
+               mBars[next].mWritten != CSongBar::kNotWritten &&
+               mBars[next].mWritten > mBars[next - 1].mWritten;
     }
 
     // Whether the first time of the passage is drawn and takes no sign twice.
@@ -235,7 +261,8 @@ private:
         return true;
     }
 
-    // The last ending is as long as the first, and ends before a section or a repeat.
+    // The last ending is as long as the first, as the song does not tell where it ends, and ends
+    // before a section, a repeat or a jump.
     void FindEnd(CPassage& passage) const {
         const std::size_t last = passage.mAgain.back();
         if (passage.mIsWhole.back()) {
@@ -245,7 +272,12 @@ private:
         const std::size_t begin = last + passage.mCommon;
         const std::size_t most = std::min(mBars.size(), last + passage.mLength);
         passage.mEnd = std::min(begin + 1, mBars.size());
-        while (passage.mEnd < most && !mBars[passage.mEnd].mBeginsSection) ++passage.mEnd;
+        while (passage.mEnd < most && !BeginsPart(passage.mEnd)) ++passage.mEnd;
+    }
+
+    [[nodiscard]] bool BeginsPart(std::size_t bar) const {
+        return mBars[bar].mBeginsSection || mIsHidden[bar] || mIsSource[bar] ||
+               mBars[bar].mSign != TSongSign_None || IsJump(bar - 1);
     }
 
     void Hide(const CPassage& passage) {
@@ -304,6 +336,10 @@ private:
     CSheet& mSheet;
     std::vector<CSheetBar>& mBars;
     std::vector<bool> mIsHidden;
+    /// Whether a repeat plays again what begins with the bar.
+    std::vector<bool> mIsSource;
+    /// By their places in the written song, the bars behind which a jump leads back.
+    std::unordered_map<std::size_t, std::size_t> mJumps;
 };
 
 }  // namespace
