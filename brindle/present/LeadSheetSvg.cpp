@@ -73,6 +73,8 @@ public:
                                    BarsPerLine(options, InnerWidth()));
         mScore.mMarks = MakeMarks(mScore.mLines, mScore.mTexts, reading,
                                   MakeLinks(song, reading, mScore.mSheet));
+        const std::size_t lines = LegendLines(mScore, LegendWidth());
+        if (lines > 1) mLegendRoom = kLegendLineHeight * static_cast<double>(lines - 1);
         mHeight = mIsA4 ? kA4Height / scale : 0.0;
         Fill();
     }
@@ -99,7 +101,11 @@ public:
 private:
     [[nodiscard]] double InnerWidth() const { return mWidth - mLeft - mRight; }
     [[nodiscard]] double Top() const { return kTop + (mIsA4 ? kPrintMargin : 0.0); }
-    [[nodiscard]] double Bottom() const { return kFooter + (mIsA4 ? kPrintMargin : 0.0); }
+    [[nodiscard]] double Bottom() const {
+        return kFooter + mLegendRoom + (mIsA4 ? kPrintMargin : 0.0);
+    }
+    // The number of the page stands beside it.
+    [[nodiscard]] double LegendWidth() const { return InnerWidth() - (mIsA4 ? 40.0 : 0.0); }
 
     [[nodiscard]] bool HasSubtitle() const { return !mSong.mMakers.empty() || !Style().empty(); }
 
@@ -166,7 +172,7 @@ private:
     void DrawFooter(CSheetPen& pen, std::size_t page) const {
         const double y = mHeight - Bottom() + 20;
         if (page + 1 == Count()) {
-            LeadSheet::DrawLegend(pen, mScore, mLeft, y, InnerWidth() - (Count() > 1 ? 40 : 0));
+            LeadSheet::DrawLegend(pen, mScore, mLeft, y, LegendWidth());
         }
         if (Count() > 1) {
             pen.Text(mWidth - mRight, y, kMakersSize, fmt::format("{} / {}", page + 1, Count()),
@@ -180,6 +186,7 @@ private:
     double mHeight = 0.0;
     double mLeft = 0.0;
     double mRight = 0.0;
+    double mLegendRoom = 0.0;  // of its lines behind the first
     CSheetScore mScore;
     std::vector<std::size_t> mPages;
 };

@@ -13,6 +13,7 @@
 #include <algorithm>
 #include <cmath>
 #include <cstdlib>
+#include <cstring>
 #include <filesystem>
 #include <fstream>
 #include <limits>
@@ -370,6 +371,42 @@ TEST_CASE("Seconds have brackets, dominants arrows, and what stands for them dot
     CHECK(Links("C | D7 | C/G | G7 | C") == "1>2 3>4 ");
     CHECK(Links("|: C | Dm7 G7 :|") == "[1-2] 2>back ");
     CHECK(Links("|: C | Dm7 G7 :| C") == "[1-2] 2>6 ");
+}
+
+TEST_CASE("The legend explains each sign that is used, inside the page, at any width") {
+    // Dm7 G7 and Dm7 Db7: every sign there is.
+    const CSong all = EvenSong("Dm7 G7 | C | Dm7 Db7 | C");
+    const CSong few = EvenSong("C | G7 | C");
+    const char* texts[] = {"a dominant resolves", "a substitute resolves", "ii and V",
+                           "ii and a substitute for V", "color of the key"};
+    for (const TSheetPage page : {TSheetPage_Endless, TSheetPage_A4}) {
+        for (const double width : {200.0, 260.0, 400.0, 560.0, 800.0, 2000.0}) {
+            INFO(width);
+            CLeadSheetOptions options;
+            options.mWidth = width;
+            options.mPage = page;
+            const std::string svg = LeadSheetSvg(all, ReadHarmony(all.mChords), options);
+            const double pageWidth = page == TSheetPage_A4 ? 793.7 : width;
+            const auto at = svg.find("viewBox=\"0 0 ");
+            const double height = std::stod(svg.substr(svg.find(' ', at + 13) + 1));
+            for (const char* text : texts) {
+                INFO(text);
+                const auto end = svg.find(fmt::format(">{}</text>", text));
+                REQUIRE(end != svg.npos);
+                const std::string tag = svg.substr(svg.rfind("<text", end), 120);
+                const auto value = [&](const char* name) {
+                    return std::stod(tag.substr(tag.find(name) + std::strlen(name) + 2));
+                };
+                const double size = value("font-size");
+                CHECK(value(" x") + size * 0.85 * WidthOf(text) < pageWidth);
+                CHECK(value(" y") < height - 8);
+            }
+        }
+    }
+    const std::string svg = LeadSheetSvg(few, ReadHarmony(few.mChords), {});
+    for (const char* text : {"a substitute resolves", "ii and V", "ii and a substitute for V"}) {
+        CHECK(svg.find(fmt::format(">{}<", text)) == svg.npos);
+    }
 }
 
 void CheckIsFile(const std::string& svg) {
