@@ -359,10 +359,15 @@ std::string Links(std::string_view text) {
     return shown;
 }
 
-TEST_CASE("Seconds have brackets, dominants arrows, and what stands for them dotted ones") {
+TEST_CASE("Seconds have brackets, dominants arrows, and substitutes dotted ones") {
     CHECK(Links("Dm7 | G7 | C | C") == "[0-1] 1>2 ");
     CHECK(Links("C | Dm7 Db7 | C | C") == "[1-2]~ 2>3~ ");
     CHECK(Links("C | G7 | Am | C") == "");
+    // What else stands for a dominant has no arrow: a sixth chord, wherever it leads, and the way
+    // home from the other side.
+    CHECK(Links("Am | C F7 | Em E7 | Am | Am | Dm | E7 | Am") == "4>5 8>9 ");
+    CHECK(Links("Am | Dm | F7 | E7 | Am | E7 | Am") == "3>4 5>6 ");
+    CHECK(Links("C | Fm7 Bb7 | C | F | G7 | C") == "[1-2]~ 5>6 ");
     CHECK(Links("C | G7 | G7 | C") == "2>3 ");
     CHECK(Links("C | G7sus4 | G7 | C") == "2>3 ");
     CHECK(Links("C | E7 | Am | D7 | G7 | C") == "[2-3] 1>2 3>4 4>5 ");

@@ -39,7 +39,7 @@ TLink LinkOf(const CChordReading& chord, const CChordReading& target,
         return TLink::DottedBracket;
     }
     if (isStillDominant) return TLink::None;
-    if (StandsForDominant(chord.mRelation)) return TLink::DottedArrow;
+    if (chord.mRelation == TChordRelation_SubstituteDominant) return TLink::DottedArrow;
     const bool isDominant = chord.mRelation == TChordRelation_Dominant ||
                             chord.mRelation == TChordRelation_LeadingDiminished;
     return isDominant && IsServedBy(chord, targetChord) ? TLink::Arrow : TLink::None;

@@ -14,7 +14,7 @@ struct CSheetLink {
     std::size_t mFrom = 0;
     /// Behind `mFrom`; `kNone` for an arrow that leads back over a repeat sign.
     std::size_t mTo = kNone;
-    /// From or to a chord that stands for a dominant.
+    /// An arrow from a substitute dominant, or a bracket to a chord that stands for a dominant.
     bool mIsDotted = false;
 
     friend bool operator==(const CSheetLink&, const CSheetLink&) = default;
