@@ -73,6 +73,7 @@ std::string Shown(const CSong& song) {
         if (!bar.mRemark.empty()) text += "{" + bar.mRemark + "} ";
         if (bar.mSign == TSongSign_Segno) text += "$ ";
         if (bar.mSign == TSongSign_Coda) text += "@ ";
+        if (bar.mHeld != kNone) text += "(" + song.mSymbols[bar.mHeld] + ") ";
         for (std::size_t i = bar.mBegin; i < bar.mEnd; ++i) text += song.mSymbols[i] + " ";
         if (bar.mBarCount > 1) text += fmt::format("({}) ", bar.mBarCount);
         if (!bar.mWords.empty()) text += "(" + bar.mWords + ") ";
@@ -181,6 +182,25 @@ TEST_CASE("Words for jumps are drawn whole, and a coda begins with the chord tha
     // F in its own bar and in that of the coda.
     CHECK(count(">F<") == 2);
     CHECK(count(">G<") == 1);
+}
+
+TEST_CASE("A part begins with its chord anew") {
+    const std::pair<const char*, const char*> songs[] = {
+        {"|: Am . . . | E7 . . . :| |: . . . . | D7 . . . :|", "|: Am | E7 :|: (E7) | D7 :"},
+        {"|: Am . . . | [1 E7 . . . | . . . . :| [2 . . . . | F . . .",
+         "|: Am | [1. E7 | :| [2. (Am) | F "},
+    };
+    for (const auto& [text, shown] : songs) CHECK(Shown(ReadSong(text)) == shown);
+    CSong sections = ReadSong("C . . . | . . . . | . . . . | G . . .");
+    sections.mSections = {{"A", 8.0}, {"B", 12.0}};
+    CHECK(Shown(sections) == "| C | | <A> (C) | <B> G ");
+    // A chord that comes later in the bar has its own place behind.
+    const CSong song = ReadSong("C . . . |: . . G . :|");
+    const CSheetScore score = ScoreOf(song);
+    const CPlacedBar& bar = score.mLines.mLines.back().mBars.back();
+    REQUIRE(bar.mChords.size() == 2);
+    CHECK(bar.mChords[0].mIsHeld);
+    CHECK(bar.mChords[0].mX + bar.mWidth / 3 < bar.mChords[1].mX);
 }
 
 TEST_CASE("A jump without words is labelled wherever it leads to") {
@@ -298,7 +318,7 @@ TEST_CASE("Every chord stands once, between its bar lines, and no two texts touc
                         CHECK(chord.mX >= free);
                         free = chord.mX + score.mLines.mScale * score.mTexts[chord.mChord].Width();
                         CHECK(free <= bar.End() + 0.01);
-                        drawn.push_back(chord.mChord);
+                        if (!chord.mIsHeld) drawn.push_back(chord.mChord);
                     }
                     free = bar.End();
                 }

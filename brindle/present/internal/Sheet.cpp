@@ -115,6 +115,22 @@ void PlaceSections(const CSong& song, std::vector<CSheetBar>& bars) {
     }
 }
 
+// Whether a reader comes to this bar from elsewhere, or looks for it.
+bool BeginsPart(const CSheetBar& bar) {
+    return bar.mBeginsSection || bar.mBeginsRepeat || !bar.mEnding.empty() ||
+           !bar.mRemark.empty() || bar.mSign != TSongSign_None;
+}
+
+// A part begins with a chord, also where that sounded before.
+void HoldChords(const CSong& song, CSheet& sheet) {
+    for (CSheetBar& bar : sheet.mBars) {
+        if (!BeginsPart(bar) || bar.mBegin == 0) continue;
+        const bool hasChord =
+            bar.mBegin < bar.mEnd && sheet.mPositions[bar.mBegin] <= bar.mPosition + kTolerance;
+        if (!hasChord && !song.mChords[bar.mBegin - 1].IsUndef()) bar.mHeld = bar.mBegin - 1;
+    }
+}
+
 bool IsPlain(const CSheetBar& bar) {
     return bar.mBegin == bar.mEnd && !bar.mBeginsSection && !bar.mBeginsRepeat &&
            !bar.mEndsRepeat && !bar.mIsInEnding && bar.mRemark.empty() && bar.mTime.IsUndef() &&
@@ -155,6 +171,7 @@ CSheet MakeSheet(const CSong& song) {
     PlaceChords(sheet.mPositions, sheet.mBars);
     PlaceSections(song, sheet.mBars);
     FoldRepeats(song, sheet);
+    HoldChords(song, sheet);
     JoinEmptyBars(sheet.mBars);
     return sheet;
 }

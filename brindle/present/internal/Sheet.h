@@ -24,6 +24,8 @@ struct CSheetBar {
     /// The chords [mBegin, mEnd) of the song begin in it.
     std::size_t mBegin = 0;
     std::size_t mEnd = 0;
+    /// The chord that sounds on where a part begins, so that it is written anew; `kNone` elsewhere.
+    std::size_t mHeld = kNone;
     /// Shorter than a bar, at the begin of the song.
     bool mIsUpbeat = false;
     /// Told where it begins to hold.

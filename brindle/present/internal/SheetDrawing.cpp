@@ -209,10 +209,7 @@ private:
         const double x = (left + right) / 2;
         if (bar.mBarCount > 1) return DrawLongRest(left, right, bar.mBarCount);
         const bool sounds = bar.mBegin > 0;
-        if (sounds && bar.mSign == TSongSign_Coda) {
-            // What sounds on is that of the bar where the jump began, not that of the one above.
-            DrawChord({bar.mBegin - 1, placed.mX + LeftPadding(bar)});
-        } else if (!sounds) {
+        if (!sounds) {
             mPen.Rect(x - 5, Middle() - 2.5, 10, 5, "quiet");
         } else if (IsSimple(placed.mBar)) {
             DrawSlash(x);
@@ -229,7 +226,8 @@ private:
     [[nodiscard]] bool IsSimple(std::size_t index) const {
         if (index == 0 || !mScore.mSheet.mBars[index].mEnding.empty()) return false;
         const CSheetBar& before = mScore.mSheet.mBars[index - 1];
-        return before.mEnd - before.mBegin <= 1 && before.mBarCount == 1;
+        const std::size_t held = before.mHeld == kNone ? 0 : 1;
+        return held + before.mEnd - before.mBegin <= 1 && before.mBarCount == 1;
     }
 
     void DrawSlash(double x) {

@@ -85,14 +85,15 @@ private:
         part.mPlaced.mBar = index;
         part.mFixed = LeftPadding(bar) + RightPadding(bar);
         part.mShare = bar.mIsUpbeat ? kUpbeatPart : 1.0;
-        for (std::size_t i = bar.mBegin; i < bar.mEnd; ++i) AddChord(part, i);
+        if (bar.mHeld != kNone) AddChord(part, {bar.mHeld, 0.0, true});
+        for (std::size_t i = bar.mBegin; i < bar.mEnd; ++i) AddChord(part, {i});
         return part;
     }
 
-    void AddChord(CPart& part, std::size_t chord) const {
+    void AddChord(CPart& part, const CPlacedChord& chord) const {
         if (!part.mPlaced.mChords.empty()) part.mChords += kChordGap;
-        part.mChords += mTexts[chord].Width();
-        part.mPlaced.mChords.push_back({chord});
+        part.mChords += mTexts[chord.mChord].Width();
+        part.mPlaced.mChords.push_back(chord);
     }
 
     [[nodiscard]] double Need(std::span<const CPart> parts) const {
@@ -125,7 +126,7 @@ private:
                 piece = EmptyPiece(part);
                 piece.mPlaced.mIsBegin = false;
             }
-            AddChord(piece, chord.mChord);
+            AddChord(piece, chord);
         }
         AddLine({piece}, false);
     }
@@ -232,7 +233,7 @@ private:
         for (std::size_t i = 0; i < lines.mLines.size(); ++i) {
             for (const CPlacedBar& bar : lines.mLines[i].mBars) {
                 for (const CPlacedChord& chord : bar.mChords) {
-                    lines.mPlaces[chord.mChord] = {i, chord.mX};
+                    if (!chord.mIsHeld) lines.mPlaces[chord.mChord] = {i, chord.mX};
                 }
             }
         }

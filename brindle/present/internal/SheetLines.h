@@ -31,6 +31,8 @@ struct CChordTexts {
 struct CPlacedChord {
     std::size_t mChord = 0;
     double mX = 0.0;
+    /// It has its place elsewhere and only sounds on here.
+    bool mIsHeld = false;
 };
 
 /// A bar on a line. A bar with more chords than a line can hold goes on on the next ones.

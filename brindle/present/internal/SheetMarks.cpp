@@ -91,7 +91,7 @@ private:
 
     void AddKey(const CSongReading& reading, const CPlacedBar& bar, const CPlacedChord& chord,
                 std::vector<CKeyMark>& keys) const {
-        if (chord.mChord >= reading.mChords.size()) return;
+        if (chord.mIsHeld || chord.mChord >= reading.mChords.size()) return;
         const CSignKeyLite& key = reading.mChords[chord.mChord].mKey;
         if (key.mRootKeyEnh.IsUndef() || key == keys.back().mKey) return;
         const bool isFirst = chord.mChord == bar.mChords.front().mChord;
