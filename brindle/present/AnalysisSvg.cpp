@@ -144,7 +144,8 @@ public:
                      {.mSize = kSmallSize, .mColor = kFaintInk});
             height += kSmallSize;
         }
-        return svg.File(kLineWidth + 2 * kMargin, height, Title());
+        return svg.File(kLineWidth + 2 * kMargin, height, Title(),
+                        DescriptionOf("The harmony of a song in time", mSong.mKeys));
     }
 
 private:

@@ -105,17 +105,19 @@ void CSvg::TextCut(double x, double y, double width, std::string_view text, cons
     Text(x, y, FirstCharacters(text, letters - 1) + std::string(kEllipsis), font);
 }
 
-std::string CSvg::File(double width, double height, std::string_view title) const {
+std::string CSvg::File(double width, double height, std::string_view title,
+                       std::string_view description) const {
     const std::string w = SvgNumber(width);
     const std::string h = SvgNumber(height);
     std::string file = R"(<?xml version="1.0" encoding="UTF-8"?>)"
                        "\n";
     file += fmt::format(
-        R"(<svg xmlns="http://www.w3.org/2000/svg" width="{0}" height="{1}" )"
+        R"(<svg xmlns="http://www.w3.org/2000/svg" role="img" width="{0}" height="{1}" )"
         R"(viewBox="0 0 {0} {1}" font-family="DejaVu Sans, Verdana, Arial, sans-serif">)"
         "\n",
         w, h);
     file += "<title>" + XmlEscaped(title) + "</title>\n";
+    if (!description.empty()) file += "<desc>" + XmlEscaped(description) + "</desc>\n";
     file += fmt::format(R"(<rect width="{}" height="{}" fill="#ffffff"/>)", w, h) + '\n';
     file += mBody;
     file += "</svg>\n";

@@ -42,8 +42,10 @@ public:
     /// Writes as much of the text as fits into the width.
     void TextCut(double x, double y, double width, std::string_view text, const CSvgFont& font);
 
-    /// The whole file; `title` is read out by screen readers.
-    [[nodiscard]] std::string File(double width, double height, std::string_view title) const;
+    /// The whole file, an image to screen readers, which read out `title` and `description`; an
+    /// empty description is left out.
+    [[nodiscard]] std::string File(double width, double height, std::string_view title,
+                                   std::string_view description = {}) const;
 
 private:
     std::string mBody;

@@ -61,7 +61,8 @@ public:
 
     [[nodiscard]] std::string File() const {
         return mSvg.File(kWidthOfKeys + 2 * kMarginOfKeys,
-                         mPlaces.mTops.back() + kKeysLineHeight + kMarginOfKeys, Title());
+                         mPlaces.mTops.back() + kKeysLineHeight + kMarginOfKeys, Title(),
+                         DescriptionOf("The keys of a song in time", mKeys));
     }
 
 private:

@@ -2,6 +2,7 @@
 #include "brindle/present/SongShapes.h"
 
 #include "brindle/present/KeyColor.h"
+#include "brindle/present/ShownText.h"
 
 #include <fmt/format.h>
 
@@ -83,6 +84,19 @@ void DrawChord(CSvg& svg, const CTimeAxis& axis, const CLinePlaces& places, cons
 double WidthOfChord(std::string_view symbol, std::string_view caption, double captionSize) {
     const double widest = std::max(TextWidth(symbol, kSymbolSize), TextWidth(caption, captionSize));
     return std::max(kNarrowestChord, widest + 2 * kPaddingOfChords);
+}
+
+std::string DescriptionOf(std::string_view picture, const CShownKeys& keys) {
+    constexpr std::size_t kMostCharacters = 600;
+    std::string text(picture);
+    for (const CShownKeyRegion& region : keys.mRegions) {
+        text += fmt::format(". {}:", region.mName);
+        for (const CShownNumeral& chord : region.mChords) {
+            text += " " + FirstCharacters(chord.mSymbol, 24);
+            if (text.size() > kMostCharacters) return Printable(text + " \xE2\x80\xA6");
+        }
+    }
+    return Printable(text);
 }
 
 }  // namespace brindle

@@ -44,6 +44,10 @@ void DrawBand(CSvg& svg, const CTimeAxis& axis, const CLinePlaces& places, const
 void DrawKeyRegions(CSvg& svg, const CTimeAxis& axis, const CLinePlaces& places,
                     const CShownKeys& keys, double top, double height);
 
+/// What a screen reader tells of such a picture: what it is, then the keys with their chords. No
+/// longer than anybody listens.
+[[nodiscard]] std::string DescriptionOf(std::string_view picture, const CShownKeys& keys);
+
 /// A chord in a colored box, with a text under it.
 struct CChordBox {
     double mTop = 0.0;      ///< of the box in its line, in pixels

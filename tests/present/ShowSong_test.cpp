@@ -2,7 +2,9 @@
 #include "brindle/present/ShowSong.h"
 
 #include "brindle/musicxml/TMusicXMLDoc.h"
+#include "brindle/platform/XmlDocument.h"
 #include "brindle/present/AnalysisSvg.h"
+#include "brindle/present/KeysSvg.h"
 #include "brindle/song/AnalyseSong.h"
 #include "brindle/song/ReadSong.h"
 #include "brindle/song/SheetTimes.h"
@@ -13,6 +15,7 @@
 #include <algorithm>
 #include <nlohmann/json.hpp>
 #include <string>
+#include <variant>
 #include <vector>
 
 namespace brindle::test {
@@ -98,6 +101,24 @@ TEST_CASE("Any song becomes a picture and JSON without a command line") {
     CHECK(even.mBarStarts.empty());
     CHECK_FALSE(even.mHasReadings);
     CHECK(ShownChords(Shown(CSong())).empty());
+}
+
+TEST_CASE("The pictures of a song tell a screen reader what they show") {
+    const CShownSong song = Shown(ReadSong("Dm7 G7 | C C"));
+    for (const std::string& svg : {AnalysisSvg(song), KeysSvg(song)}) {
+        CHECK(svg.find("<svg xmlns=\"http://www.w3.org/2000/svg\" role=\"img\" ") != svg.npos);
+        CHECK(svg.find("</title>\n<desc>") != svg.npos);
+        CHECK(svg.find(" in time. C Major: Dm7 G7 C C</desc>") != svg.npos);
+    }
+    std::string text;
+    for (int i = 0; i < 2000; ++i) text += "C7 F | ";
+    CShownSong hostile = Shown(ReadSong(text));
+    hostile.mKeys.mRegions.at(0).mChords.at(0).mSymbol = "<&\x01" + std::string(10'000, 'x');
+    for (const std::string& svg : {AnalysisSvg(hostile), KeysSvg(hostile)}) {
+        CHECK(std::holds_alternative<XmlDocument>(
+            XmlDocument::FromBytes(svg.substr(0, svg.find("</desc>") + 7) + "</svg>")));
+        CHECK(svg.find("</desc>") - svg.find("<desc>") < 700);
+    }
 }
 
 }  // namespace
