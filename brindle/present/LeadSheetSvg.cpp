@@ -3,6 +3,7 @@
 
 #include "brindle/present/CSvg.h"
 #include "brindle/present/ShownText.h"
+#include "brindle/present/internal/ReadingNotes.h"
 #include "brindle/present/internal/SheetDrawing.h"
 #include "brindle/present/internal/SheetStyle.h"
 
@@ -11,6 +12,8 @@
 #include <algorithm>
 #include <cmath>
 #include <iterator>
+#include <string>
+#include <vector>
 
 namespace brindle {
 namespace {
@@ -31,6 +34,7 @@ constexpr double kPrintMargin = 18.0;
 constexpr double kSheetTitleSize = 25.0;
 constexpr double kSmallestTitleSize = 16.0;
 constexpr double kMakersSize = 13.0;
+constexpr double kKeyNoteSize = 12.0;
 
 // A bar that is narrower is hard to read.
 constexpr double kNarrowestUsualBar = 105.0;
@@ -62,7 +66,9 @@ class CSheetPages {
 public:
     CSheetPages(const CSong& song, const CSongReading& reading, const CLeadSheetOptions& options,
                 double scale)
-        : mSong(song), mIsA4(options.mPage == TSheetPage_A4) {
+        : mSong(song),
+          mKeyNotes(KeyContradictions(song, reading)),
+          mIsA4(options.mPage == TSheetPage_A4) {
         const double asked = std::isfinite(options.mWidth) ? options.mWidth : 800.0;
         mWidth = mIsA4 ? kA4Width / scale : std::clamp(asked, 200.0, 4000.0);
         mLeft = kLeft + (mIsA4 ? kPrintMargin : 0.0);
@@ -113,6 +119,7 @@ private:
         double height = 0.0;
         if (!mSong.mTitle.empty()) height += kSheetTitleSize + 8;
         if (HasSubtitle()) height += kMakersSize + 4;
+        height += static_cast<double>(mKeyNotes.size()) * (kKeyNoteSize + 4);
         return height > 0.0 ? height + 6 : 0.0;
     }
 
@@ -163,6 +170,12 @@ private:
             pen.Text(mWidth - mRight, y + kMakersSize - 2, kMakersSize,
                      CutToWidth(mSong.mMakers, half), "ita ink", "end");
         }
+        if (HasSubtitle()) y += kMakersSize + 4;
+        for (const std::string& note : mKeyNotes) {
+            pen.Text(mLeft, y + kKeyNoteSize - 2, kKeyNoteSize,
+                     CutToWidth(note, InnerWidth() / kKeyNoteSize), "ita quiet");
+            y += kKeyNoteSize + 4;
+        }
         if (mScore.mLines.mLines.empty()) {
             pen.Text(mWidth / 2, Top() + HeadHeight() + 24, kMakersSize, "no chords", "ita quiet",
                      "middle");
@@ -181,6 +194,7 @@ private:
     }
 
     const CSong& mSong;
+    std::vector<std::string> mKeyNotes;
     bool mIsA4;
     double mWidth = 0.0;
     double mHeight = 0.0;
@@ -222,6 +236,10 @@ std::string Description(const CSong& song, const CSongReading& reading) {
     if (!song.mMakers.empty()) text += " of a song by " + Bounded(song.mMakers);
     const std::string key = NameOfKey(reading.mKey);
     if (!key.empty()) text += " in " + key;
+    // Without the full stop at their end.
+    for (const std::string& note : KeyContradictions(song, reading)) {
+        text += ". " + note.substr(0, note.size() - 1);
+    }
     const std::size_t count = CountChords(song);
     if (count > 0) text += ". Chords:";
     for (std::size_t i = 0; i < std::min({count, kMostToldChords, song.mSymbols.size()}); ++i) {

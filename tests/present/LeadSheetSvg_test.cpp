@@ -5,6 +5,7 @@
 #include "brindle/platform/XmlDocument.h"
 #include "brindle/present/internal/SheetDrawing.h"
 #include "brindle/song/ReadSong.h"
+#include "brindle/song/ReadSongHarmony.h"
 #include "tests/support/Transcript.h"
 
 #include <doctest/doctest.h>
@@ -441,6 +442,20 @@ void CheckIsFile(const std::string& svg) {
 
 std::string SvgOf(const CSong& song, const CLeadSheetOptions& options = {}) {
     return LeadSheetSvg(song, ReadHarmony(song.mChords), options);
+}
+
+TEST_CASE("Keys that contradict are told under the title and in the description") {
+    CSong song = ReadSong("C | F | G | C");
+    song.mStatedKey = CSignKeyLite("A minor");
+    CReadingOptions options;
+    options.mStatedKey = *song.mStatedKey;
+    const std::string note = "A Minor is the stated key; the chords alone would show C Major.";
+    const std::string svg = LeadSheetSvg(song, ReadSongHarmony(song, options));
+    CHECK(svg.find(note + "</text>") != std::string::npos);
+    CHECK(svg.find(note + " Chords: C F G C</desc>") != std::string::npos);
+    song.mStatedKey = CSignKeyLite("C major");
+    options.mStatedKey = *song.mStatedKey;
+    CHECK(LeadSheetSvg(song, ReadSongHarmony(song, options)).find("stated") == std::string::npos);
 }
 
 TEST_CASE("Hostile songs give whole files of bounded size") {
