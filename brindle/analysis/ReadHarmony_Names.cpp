@@ -1,4 +1,5 @@
 // SPDX-License-Identifier: MIT
+#include "brindle/analysis/CHarmAnlsChords.h"
 #include "brindle/analysis/ReadHarmony.h"
 #include "brindle/analysis/internal/NumeralText.h"
 
