@@ -6,7 +6,7 @@
 #include <string_view>
 #include <vector>
 
-// The two records of Arrow's C data interface, as Arrow's format specification gives them. Their
+// The two records of Arrow's C data interface, by which engines hand tables to each other. Their
 // layout never changes; the guard is the one that all its users share.
 #ifndef ARROW_C_DATA_INTERFACE
 #define ARROW_C_DATA_INTERFACE
