@@ -2,6 +2,8 @@
 #include "brindle/platform/PlainText.h"
 
 #include <fmt/format.h>
+
+#include <cmath>
 #include <iterator>
 #include <limits>
 #include <ostream>
@@ -45,6 +47,8 @@ void WriteFixed(std::ostream& stream, double value) {
     static const std::string lowest =
         fmt::format(kPlainFixed, std::numeric_limits<double>::lowest());
     if (value == std::numeric_limits<double>::lowest()) return Write(stream, lowest);
+    // What is no number has no sign that means anything.
+    if (std::isnan(value)) value = std::numeric_limits<double>::quiet_NaN();
     TBuffer buffer;
     fmt::format_to(std::back_inserter(buffer), kPlainFixed, value);
     Write(stream, buffer);

@@ -15,7 +15,8 @@ void Write(std::ostream& stream, std::string_view text);
 void WriteInteger(std::ostream& stream, std::int64_t value, int width = 0);
 /// Decimal, without padding.
 void WriteUnsigned(std::ostream& stream, std::uint64_t value);
-/// Two digits after the point, right-aligned in at least 6 places: "  1.00".
+/// Two digits after the point, right-aligned in at least 6 places: "  1.00", "  -inf",
+/// "   nan".
 void WriteFixed(std::ostream& stream, double value);
 /// A line feed, and flushes the stream.
 void EndLine(std::ostream& stream);

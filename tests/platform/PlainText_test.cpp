@@ -23,6 +23,7 @@ TEST_CASE("Numbers stand right-aligned in their field whatever the stream was to
         {kInfinity, "   inf"},
         {-kInfinity, "  -inf"},
         {std::numeric_limits<double>::quiet_NaN(), "   nan"},
+        {-std::numeric_limits<double>::quiet_NaN(), "   nan"},
     };
     for (const CRow& row : rows) {
         std::ostringstream stream;
