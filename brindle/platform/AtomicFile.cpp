@@ -71,7 +71,7 @@ using TWriteBytes = std::function<bool(int file)>;
 bool ReplaceFile(const fs::path& path, fs::path scratch, const mode_t* rights,
                  const TWriteBytes& writeBytes) {
     constexpr mode_t kNewFileRights = 0666;
-    ScratchEntries::RemoveOld(scratch);
+    ScratchEntries::RemoveOld(scratch, ScratchEntries::TEntry::File);
     COpenFile file(
         ScratchEntries::OpenNewFile(scratch, rights != nullptr ? *rights : kNewFileRights));
     if (!file.IsOpen()) return false;

@@ -12,8 +12,9 @@ namespace brindle {
 
 /// Replaces the file at `path` as a whole: the bytes are written beside it under a name that nobody
 /// can foresee, flushed to the disk and renamed over it. A full disk or a kill leaves the old file
-/// as it was. False when that failed; nothing is left behind then, as when `write` throws. What a
-/// kill has left is removed by the next writer of the file after an hour.
+/// as it was. False when that failed, with the reason in errno; nothing is left behind then, as
+/// when `write` throws. What a kill has left is removed by the next writer of the file after an
+/// hour.
 ///
 /// A link is followed, also one to nothing. A file keeps its rights, a new one has those that the
 /// process gives. Into a device, a pipe or what else is no file the bytes are written as they come;

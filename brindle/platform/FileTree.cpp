@@ -155,7 +155,7 @@ bool WriteFolderAtomically(const fs::path& path, const FileNode& tree) {
     const auto target = WholeFiles::BehindLinks(path.has_filename() ? path : path.parent_path());
     if (!target) return false;
     fs::path beside = *target;
-    ScratchEntries::RemoveOld(*target);
+    ScratchEntries::RemoveOld(*target, ScratchEntries::TEntry::Folder);
     if (!ScratchEntries::MakeNewFolder(beside, kUsualFolderRights)) return false;
     // Behind an exchange it is the old folder, else what could not be put in its place.
     const ScratchEntries::CRemover remover(beside);

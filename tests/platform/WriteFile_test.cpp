@@ -289,6 +289,23 @@ TEST_CASE("What a killed writer has left is removed after an hour, and nothing e
     CHECK_FALSE(fs::exists(oldFolder));
 }
 
+TEST_CASE("A writer takes nothing away that another kind of writer would have left") {
+    const CScratchFolder folder;
+    const std::string file = folder.File("file");
+    REQUIRE(WriteFolderAtomically(folder.File("file.brindle-abcdef"), TreeWith("of value")));
+    fs::create_directory(folder.File("file.brindle-ghijkl"));
+    REQUIRE(WriteFileAtomically(folder.File("tree.brindle-abcdef"), "of value"));
+    const std::vector<std::string> others{"file.brindle-abcdef", "file.brindle-ghijkl",
+                                          "tree.brindle-abcdef"};
+    for (const std::string& other : others) MakeOlder(folder.File(other), 4000);
+    REQUIRE(WriteFileAtomically(file, "x"));
+    REQUIRE(WriteFolderAtomically(folder.File("tree"), TreeWith("x")));
+    CHECK(NamesIn(folder.Path()) == std::vector<std::string>{"file", "file.brindle-abcdef",
+                                                             "file.brindle-ghijkl", "tree",
+                                                             "tree.brindle-abcdef"});
+    CHECK(ReadWholeFile(folder.File("file.brindle-abcdef/file")) == "of value");
+}
+
 TEST_CASE("A name of the longest length can be written") {
     const CScratchFolder folder;
     const std::string name(255, 'n');

@@ -59,10 +59,10 @@ bool MakeUnderNewName(fs::path& path, Make make) {
     return false;
 }
 
-bool IsOld(const fs::path& path) {
+bool IsOld(const fs::path& path, TEntry kind) {
     struct stat status {};
     if (lstat(path.c_str(), &status) != 0) return false;
-    if (!S_ISREG(status.st_mode) && !S_ISDIR(status.st_mode)) return false;
+    if ((status.st_mode & S_IFMT) != (kind == TEntry::File ? S_IFREG : S_IFDIR)) return false;
     const auto now = std::chrono::system_clock::now();
     return std::chrono::system_clock::from_time_t(status.st_mtime) < now - kOld;
 }
@@ -91,15 +91,18 @@ CRemover::~CRemover() {
     }
 }
 
-void RemoveOld(const fs::path& path) {
+void RemoveOld(const fs::path& path, TEntry kind) {
     const std::string start = StartOfName(path);
     const fs::path folder = path.has_parent_path() ? path.parent_path() : fs::path(".");
     std::error_code error;
     for (fs::directory_iterator entries(folder, error); entries != fs::directory_iterator();
          entries.increment(error)) {
         const fs::path& entry = entries->path();
+        if (!IsScratchName(entry.filename().string(), start) || !IsOld(entry, kind)) continue;
         std::error_code ignored;
-        if (IsScratchName(entry.filename().string(), start) && IsOld(entry)) {
+        if (kind == TEntry::File) {
+            fs::remove(entry, ignored);
+        } else {
             fs::remove_all(entry, ignored);
         }
     }

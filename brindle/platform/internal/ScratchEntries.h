@@ -28,8 +28,11 @@ private:
     std::filesystem::path mPath;
 };
 
-/// Removes what writers of this target have left that were killed more than an hour ago. Looks at
-/// each entry of the folder.
-void RemoveOld(const std::filesystem::path& path);
+/// What a writer makes under a scratch name.
+enum class TEntry { File, Folder };
+
+/// Removes what writers of this target have left that were killed more than an hour ago, as far as
+/// it is of the kind. Looks at each entry of the folder.
+void RemoveOld(const std::filesystem::path& path, TEntry kind);
 
 }  // namespace brindle::ScratchEntries
