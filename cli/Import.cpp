@@ -131,7 +131,7 @@ std::string HeadOf(const std::string& name, bool isFirst, const CImportOptions& 
 // The file first: who reads the output may stop before its end.
 TStatus WriteMidi(const CImportedScore& score, const std::string& file) {
     if (WriteFileAtomically(file, MidiFileBytes(MidiPieceOf(score)))) return TStatus::Success;
-    return Fail(TStatus::BadInput, fmt::format("{} cannot be written", Printable(file)));
+    return FailToWrite(file);
 }
 
 /// What a score gives, and how its import ended: it may have a fault behind what it gives.

@@ -146,8 +146,7 @@ TStatus MarkovGenerate(const CGenerateOptions& options) {
         !WriteFileAtomically(*options.mMidi,
                              MidiFileBytes(MidiPieceOf(draws.mChosen.mSymbols, options.mTempo,
                                                        options.mBeatsPerBar)))) {
-        return Fail(TStatus::BadInput,
-                    fmt::format("{} cannot be written", Printable(*options.mMidi)));
+        return FailToWrite(*options.mMidi);
     }
     return Print(
         options.mFormat.Format() == TFormat::Json

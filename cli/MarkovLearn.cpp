@@ -90,6 +90,9 @@ void ReportUnread(const CLearnReport& report) {
 }
 
 TStatus MarkovLearn(const CLearnOptions& options) {
+    if (options.mModel.empty()) {
+        return Fail(TStatus::BadUsage, "--output needs the name of a file, and it is empty");
+    }
     if (!options.mIsPlain) {
         if (options.mSimplify || options.mOrder != kUsualOrder) {
             return Fail(TStatus::BadUsage, "--order and --simplify are for --plain");
@@ -103,8 +106,7 @@ TStatus MarkovLearn(const CLearnOptions& options) {
     ReportUnread(learned.mReport);
     if (learned.mReport.mFiles == 0) return Fail(TStatus::BadInput, "there was nothing to learn");
     if (!model.SaveToFile(options.mModel)) {
-        return Fail(TStatus::BadInput,
-                    fmt::format("{} cannot be written", Printable(options.mModel)));
+        return FailToWrite(options.mModel);
     }
     const TStatus printed =
         Print(options.mFormat.Format() == TFormat::Json ? LearnedJson(learned.mReport, model)

@@ -92,8 +92,7 @@ TStatus MarkovLearnSongs(const CLearnSongsOptions& options) {
     }
     const CSongModel model(std::move(taught.mSongs));
     if (!WriteFileAtomically(options.mModel, SongModelText(model))) {
-        return Fail(TStatus::BadInput,
-                    fmt::format("{} cannot be written", Printable(options.mModel)));
+        return FailToWrite(options.mModel);
     }
     const TStatus printed = Print(options.mJson ? LearnedSongsJson(model, taught.mFiles)
                                                 : LearnedSongsText(model, taught.mFiles));

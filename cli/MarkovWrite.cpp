@@ -177,8 +177,7 @@ TStatus MarkovWrite(const CWriteOptions& written, const CWriteSettings& settings
     if (settings.mMidi &&
         !WriteFileAtomically(*settings.mMidi,
                              MidiFileBytes(MidiPieceOfSong(song.mSong, settings.mTempo)))) {
-        return Fail(TStatus::BadInput,
-                    fmt::format("{} cannot be written", Printable(*settings.mMidi)));
+        return FailToWrite(*settings.mMidi);
     }
     return Print(SongText(song, written, *options, settings.mFormat));
 }

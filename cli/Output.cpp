@@ -66,6 +66,12 @@ TStatus Print(std::string_view text) {
                 fmt::format("the output cannot be written: {}", std::strerror(errno)));
 }
 
+TStatus FailToWrite(const std::string& path) {
+    const int reason = errno;
+    return Fail(TStatus::BadInput,
+                fmt::format("{} cannot be written: {}", Printable(path), std::strerror(reason)));
+}
+
 CPaint PaintOfOutput() {
     return CPaint(WantsColor());
 }

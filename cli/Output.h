@@ -22,8 +22,11 @@ enum class TFormat { Text, Json, Native, Svg, Chords };
 /// Writes `brindle: message` to standard error and gives the status back.
 TStatus Fail(TStatus status, std::string_view message);
 
-/// The same with the input on a line of its own and a caret under its character `column`, counted
-/// from 0 in bytes.
+/// Says that a file cannot be written, and why; to be called while errno still tells that.
+TStatus FailToWrite(const std::string& path);
+
+/// The same as Fail with the input on a line of its own and a caret under its character `column`,
+/// counted from 0 in bytes.
 TStatus FailAt(TStatus status, std::string_view message, std::string_view input,
                std::size_t column);
 

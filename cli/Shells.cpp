@@ -46,7 +46,7 @@ TStatus WriteManPages(const CCommandPage& program, const std::filesystem::path& 
     for (const CCommandPage* const page : AllPages(program)) {
         const std::string path = (folder / ManPageFile(*page)).string();
         if (WriteFileAtomically(path, ManPage(*page, program, BrindleVersionString))) continue;
-        return Fail(TStatus::BadInput, fmt::format("{} cannot be written", Printable(path)));
+        return FailToWrite(path);
     }
     return TStatus::Success;
 }

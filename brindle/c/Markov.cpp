@@ -11,7 +11,9 @@
 
 #include <fmt/format.h>
 
+#include <cerrno>
 #include <cmath>
+#include <cstring>
 #include <memory>
 #include <sstream>
 #include <string>
@@ -155,7 +157,9 @@ brindle_status brindle_markov_write_file(const brindle_markov* model, const char
     if (path == nullptr) return FailForNull("path");
     return Guarded([&] {
         if (model->mModel.SaveToFile(path)) return BRINDLE_OK;
-        return Fail(BRINDLE_ERROR_FILE, brindle::Printable(path) + " cannot be written");
+        const int reason = errno;
+        return Fail(BRINDLE_ERROR_FILE,
+                    brindle::Printable(path) + " cannot be written: " + std::strerror(reason));
     });
 }
 

@@ -48,13 +48,17 @@ private:
     std::array<char, 65536> mBytes;
 };
 
-/// An open file that is closed at its end.
+/// An open file that is closed at its end; the reason of a failure before stays in errno.
 class COpenFile {
 public:
     explicit COpenFile(int file) : mFile(file) {}
     COpenFile(const COpenFile&) = delete;
     COpenFile& operator=(const COpenFile&) = delete;
-    ~COpenFile() { (void)Close(); }
+    ~COpenFile() {
+        const int reason = errno;
+        (void)Close();
+        errno = reason;
+    }
 
     [[nodiscard]] bool IsOpen() const { return mFile >= 0; }
     [[nodiscard]] int Get() const { return mFile; }
@@ -78,7 +82,7 @@ bool ReplaceFile(const fs::path& path, fs::path scratch, const mode_t* rights,
     const ScratchEntries::CRemover remover(scratch);
     const bool ok = (rights == nullptr || fchmod(file.Get(), *rights) == 0) &&
                     writeBytes(file.Get()) && fsync(file.Get()) == 0;
-    if (!file.Close() || !ok || rename(scratch.c_str(), path.c_str()) != 0) return false;
+    if (!ok || !file.Close() || rename(scratch.c_str(), path.c_str()) != 0) return false;
     WholeFiles::FlushFolder(path.parent_path());
     return true;
 }
@@ -87,18 +91,22 @@ bool ReplaceFile(const fs::path& path, fs::path scratch, const mode_t* rights,
 bool WriteInto(const fs::path& path, const TWriteBytes& writeBytes) {
     COpenFile file(open(path.c_str(), O_WRONLY | O_NOCTTY | O_CLOEXEC));
     if (!file.IsOpen()) return false;
-    const bool ok = writeBytes(file.Get());
-    return file.Close() && ok;
+    return writeBytes(file.Get()) && file.Close();
+}
+
+bool FailFor(int reason) {
+    errno = reason;
+    return false;
 }
 
 bool WriteFile(const fs::path& path, const fs::path& scratchFolder, const TWriteBytes& writeBytes) {
     struct stat status {};
     const bool isThere = stat(path.c_str(), &status) == 0;
-    if (isThere && S_ISDIR(status.st_mode)) return false;
+    if (isThere && S_ISDIR(status.st_mode)) return FailFor(EISDIR);
     // By its own name: a link such as /dev/fd/3 to a pipe names no file that could be followed.
     if (isThere && !S_ISREG(status.st_mode)) return WriteInto(path, writeBytes);
     const auto target = WholeFiles::BehindLinks(path);
-    if (!target) return false;
+    if (!target) return FailFor(ELOOP);
     const fs::path scratch = scratchFolder.empty() ? *target : scratchFolder / target->filename();
     const mode_t rights = isThere ? status.st_mode & 07777 : 0;
     return ReplaceFile(*target, scratch, isThere ? &rights : nullptr, writeBytes);

@@ -8,6 +8,7 @@
 #include <doctest/doctest.h>
 
 #include <fcntl.h>
+#include <sys/resource.h>
 #include <sys/stat.h>
 #include <sys/sysmacros.h>
 #include <sys/time.h>
@@ -16,6 +17,8 @@
 
 #include <algorithm>
 #include <array>
+#include <cerrno>
+#include <csignal>
 #include <ctime>
 #include <filesystem>
 #include <ostream>
@@ -304,6 +307,49 @@ TEST_CASE("A writer takes nothing away that another kind of writer would have le
                                                              "file.brindle-ghijkl", "tree",
                                                              "tree.brindle-abcdef"});
     CHECK(ReadWholeFile(folder.File("file.brindle-abcdef/file")) == "of value");
+}
+
+TEST_CASE("What cannot be written leaves its reason in errno") {
+    const CScratchFolder folder;
+    fs::create_directory(folder.File("folder"));
+    fs::create_symlink("ring", folder.File("ring"));
+    REQUIRE(WriteFileAtomically(folder.File("file"), "old"));
+    struct CRow {
+        std::string mName;
+        int mReason;
+    };
+    const CRow rows[] = {
+        {"no/such", ENOENT},
+        {"file/below", ENOTDIR},
+        {"folder", EISDIR},
+        {"ring", ELOOP},
+        {std::string(256, 'n'), ENAMETOOLONG},
+    };
+    for (const CRow& row : rows) {
+        INFO(row.mName);
+        errno = 0;
+        CHECK_FALSE(WriteFileAtomically(folder.File(row.mName), "x"));
+        CHECK(errno == row.mReason);
+    }
+
+    // A disk without space: the file is larger than the process may write.
+    rlimit old{};
+    REQUIRE(getrlimit(RLIMIT_FSIZE, &old) == 0);
+    const rlimit small{1'000, old.rlim_max};
+    REQUIRE(setrlimit(RLIMIT_FSIZE, &small) == 0);
+    const auto handler = signal(SIGXFSZ, SIG_IGN);
+    const bool isWritten = WriteFileAtomically(folder.File("file"), std::string(2'000, 'x'));
+    const int reason = errno;
+    const bool isStreamed = WriteFileAtomically(
+        folder.File("file"), [](std::ostream& stream) { stream << std::string(200'000, 'x'); });
+    const int reasonOfStream = errno;
+    signal(SIGXFSZ, handler);
+    REQUIRE(setrlimit(RLIMIT_FSIZE, &old) == 0);
+    CHECK_FALSE(isWritten);
+    CHECK(reason == EFBIG);
+    CHECK_FALSE(isStreamed);
+    CHECK(reasonOfStream == EFBIG);
+    CHECK(ReadWholeFile(folder.File("file")) == "old");
 }
 
 TEST_CASE("A name of the longest length can be written") {

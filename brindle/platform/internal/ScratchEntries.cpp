@@ -83,12 +83,14 @@ bool MakeNewFolder(fs::path& path, mode_t rights) {
 }
 
 CRemover::~CRemover() {
+    const int reason = errno;
     try {
         std::error_code ignored;
         fs::remove_all(mPath, ignored);
     } catch (const std::exception&) {
         // Without memory it stays and is removed as an old one.
     }
+    errno = reason;
 }
 
 void RemoveOld(const fs::path& path, TEntry kind) {

@@ -16,7 +16,7 @@ namespace brindle::ScratchEntries {
 /// Whether there is a new folder. The process's mask is taken off `rights`.
 [[nodiscard]] bool MakeNewFolder(std::filesystem::path& path, mode_t rights);
 
-/// Removes what stands at the path at its end, if anything does.
+/// Removes what stands at the path at its end, if anything does. Leaves errno as it is.
 class CRemover {
 public:
     explicit CRemover(std::filesystem::path path) : mPath(std::move(path)) {}
