@@ -19,20 +19,18 @@ public:
     CWalk(const CWrittenMeasures& written, TMusicXMLDoc& doc) : mWritten(written), mDoc(doc) {}
 
     bool Run() {
-        std::size_t count = 0;
-        std::size_t bytes = 0;
+        CPlayExtent written{.mMeasures = mWritten.mMeasures.size()};
         for (const TMusicXMLMeasure& measure : mWritten.mMeasures) {
-            count += measure.mHarmonies.size();
-            for (const TMusicXMLHarmony& harmony : measure.mHarmonies) bytes += BytesOf(harmony);
+            for (const TMusicXMLHarmony& harmony : measure.mHarmonies) written.Add(harmony);
         }
-        mDoc.Harmonies.reserve(count);
-        mLimits = PlayLimitsOf(mWritten.mMeasures.size(), bytes);
-        for (std::size_t played = 0; IsInside(mIx); ++played) {
-            if (played == mLimits.mMeasures || mBytes > mLimits.mBytes) return false;
+        mDoc.Harmonies.reserve(written.mHarmonies);
+        mLimits = PlayLimitsOf(written);
+        for (; IsInside(mIx); ++mPlayed.mMeasures) {
+            if (mPlayed.mMeasures == mLimits.mMeasures || !mPlayed.HasRoomIn(mLimits)) return false;
             PlayMeasure();
             ++mIx;
         }
-        return mBytes <= mLimits.mBytes;
+        return mPlayed.HasRoomIn(mLimits);
     }
 
 private:
@@ -110,8 +108,8 @@ private:
         if (mMeasure->mSlash) mDoc.ChordSequences.push_back(mDoc.Harmonies.size());
         bool isFirst = true;
         for (const TMusicXMLHarmony& written : mMeasure->mHarmonies) {
-            mBytes += BytesOf(written);
-            if (mBytes > mLimits.mBytes) return;
+            mPlayed.Add(written);
+            if (!mPlayed.HasRoomIn(mLimits)) return;
             TMusicXMLHarmony& harmony = mDoc.Harmonies.emplace_back(written);
             harmony.mPosition = mDistance;
             if (harmony.mKind.empty()) harmony.mKind = "major";
@@ -171,12 +169,10 @@ private:
     std::size_t mCodaPairIx = 0;
     std::size_t mSegnoPairIx = 0;
     double mDistance = 0.0;
-    std::size_t mBytes = 0;
-    CPlayLimits mLimits;
+    CPlayExtent mPlayed;
+    CPlayExtent mLimits;
     bool mFirstSection = true;
 };
-
-}  // namespace
 
 std::size_t BytesOf(const TMusicXMLHarmony& harmony) {
     std::size_t bytes = sizeof harmony + harmony.mRoot.mStep.size() + harmony.mKind.size() +
@@ -188,12 +184,20 @@ std::size_t BytesOf(const TMusicXMLHarmony& harmony) {
     return bytes;
 }
 
-CPlayLimits PlayLimitsOf(std::size_t writtenMeasures, std::size_t writtenBytes) {
-    const auto limit = [](std::size_t written, std::size_t least, std::size_t most) {
-        return std::max(written, std::clamp(kMaxTimesPlayed * written, least, most));
+}  // namespace
+
+void CPlayExtent::Add(const TMusicXMLHarmony& harmony) {
+    ++mHarmonies;
+    mBytes += BytesOf(harmony);
+}
+
+CPlayExtent PlayLimitsOf(const CPlayExtent& written) {
+    const auto limit = [](std::size_t count, std::size_t least, std::size_t most) {
+        return std::max(count, std::clamp(kMaxTimesPlayed * count, least, most));
     };
-    return {limit(writtenMeasures, kMinPlayedMeasures, kMaxPlayedMeasures),
-            limit(writtenBytes, kMinPlayedBytes, kMaxPlayedBytes)};
+    return {.mMeasures = limit(written.mMeasures, kMinPlayedMeasures, kMaxPlayedMeasures),
+            .mHarmonies = limit(written.mHarmonies, kMinPlayedHarmonies, kMaxPlayedHarmonies),
+            .mBytes = limit(written.mBytes, kMinPlayedBytes, kMaxPlayedBytes)};
 }
 
 bool PlayMeasures(const CWrittenMeasures& written, TMusicXMLDoc& doc) {

@@ -24,22 +24,26 @@ struct CWrittenMeasures {
     std::span<const std::pair<std::int32_t, std::int32_t>> mSegnoPairs;
 };
 
-/// How far repeats and jumps may lead, from what is written; see kMaxTimesPlayed.
-struct CPlayLimits {
-    std::size_t mMeasures = 0;  ///< most measures that are played
-    std::size_t mBytes = 0;     ///< most room that their harmonies take, see BytesOf
+/// How much of a song is written or played.
+struct CPlayExtent {
+    std::size_t mMeasures = 0;
+    std::size_t mHarmonies = 0;
+    std::size_t mBytes = 0;  ///< the room that the harmonies take, about
+
+    void Add(const TMusicXMLHarmony& harmony);
+    /// Whether the harmonies are no more than in `limits`.
+    [[nodiscard]] bool HasRoomIn(const CPlayExtent& limits) const {
+        return mHarmonies <= limits.mHarmonies && mBytes <= limits.mBytes;
+    }
 };
 
-/// `kMaxTimesPlayed` times what is written, between the bounds of TMusicXMLDoc.h, and never less
-/// than what is written.
-[[nodiscard]] CPlayLimits PlayLimitsOf(std::size_t writtenMeasures, std::size_t writtenBytes);
+/// How far repeats and jumps may lead: `kMaxTimesPlayed` times what is written, between the bounds
+/// of TMusicXMLDoc.h, and never less than what is written.
+[[nodiscard]] CPlayExtent PlayLimitsOf(const CPlayExtent& written);
 
 /// Walks the measures in playing order and appends what they hold to `doc`. False when the walk was
 /// cut at its limits.
 bool PlayMeasures(const CWrittenMeasures& written, TMusicXMLDoc& doc);
-
-/// The room in bytes that a harmony takes, about.
-[[nodiscard]] std::size_t BytesOf(const TMusicXMLHarmony& harmony);
 
 /// Whether a text tells how often a repeat is played: 2 to 4 characters with an "x", as in "3x".
 [[nodiscard]] bool IsRepeatWord(std::string_view text);

@@ -18,18 +18,22 @@ struct Error;
 
 /// Most measures that a score may have, those of all parts counted; a longer one fails to load.
 inline constexpr std::size_t kMaxWrittenMeasures = 1'000'000;
-/// How often repeats and jumps may play what is written, measures and room for harmonies alike. A
-/// song that goes on is cut there, and its load reports failure. A short song may play more often,
-/// and a long one less: see the two bounds below. What is written is played in any case.
+/// How often repeats and jumps may play what is written: measures, harmonies and their room alike.
+/// A song that goes on is cut there, and its load reports failure. A short song may play more
+/// often, and a long one less: see the bounds below. What is written is played in any case.
 inline constexpr std::size_t kMaxTimesPlayed = 64;
 /// Measures that a song may always play.
 inline constexpr std::size_t kMinPlayedMeasures = 10'000;
 /// Most measures that it may play.
 inline constexpr std::size_t kMaxPlayedMeasures = 100'000;
+/// Harmonies that a song may always play.
+inline constexpr std::size_t kMinPlayedHarmonies = 10'000;
+/// Most harmonies that it may play.
+inline constexpr std::size_t kMaxPlayedHarmonies = 100'000;
 /// Room in bytes that the played harmonies may always take.
 inline constexpr std::size_t kMinPlayedBytes = std::size_t{16} << 20;
 /// Most room that they may take.
-inline constexpr std::size_t kMaxPlayedBytes = std::size_t{256} << 20;
+inline constexpr std::size_t kMaxPlayedBytes = std::size_t{64} << 20;
 
 /// A time signature that holds from a position in quarter notes on.
 struct TMusicXMLTimeSignature {

@@ -286,24 +286,51 @@ TEST_CASE("What is played is bounded by what is written") {
     CHECK(doc.Harmonies.size() == 64 * 1'400);
     CHECK(error.description == "the song is too long to be played");
 
-    // A bar of many harmonies is bounded by their room: 500,000 would be played.
-    std::string harmonies;
-    for (int i = 0; i < 100; ++i) {
-        harmonies += "<harmony><root><root-step>C</root-step></root><kind>major</kind></harmony>";
-    }
-    CHECK_FALSE(
-        doc.LoadAsPlayedFromBytes(Score("<measure>" + harmonies +
-                                        "<barline><repeat direction='backward' times='5000'/>"
-                                        "</barline></measure>"),
-                                  &error));
-    CHECK(doc.Harmonies.size() * sizeof(TMusicXMLHarmony) <= kMinPlayedBytes + 1'000'000);
-    CHECK(doc.Harmonies.size() > 50'000);
-
     // What is written is played in any case.
     std::string many;
     for (std::size_t i = 0; i < kMaxPlayedMeasures + 10; ++i) many += "<measure/>";
     CHECK(doc.LoadAsPlayedFromBytes(Score(many), &error));
     CHECK(doc.HarmBarlines.size() == kMaxPlayedMeasures + 10);
+}
+
+TEST_CASE("Bars of many harmonies are bounded by these, and by their room") {
+    struct CRow {
+        std::size_t mWritten;  // in one bar
+        int mTimes;
+        std::string mDegreeValue;
+        std::size_t mPlayed;
+        bool mIsWhole;
+    };
+    const std::string longValue(1 << 20, '9');
+    const CRow rows[] = {
+        {100, 100, "7", 10'000, true},
+        {100, 101, "7", 10'000, false},
+        {1'000, 64, "7", 64'000, true},
+        {1'000, 65, "7", 64'000, false},
+        {3'000, 34, "7", 99'000, false},
+        {kMaxPlayedHarmonies + 10, 1, "7", kMaxPlayedHarmonies + 10, true},
+        {kMaxPlayedHarmonies + 10, 2, "7", kMaxPlayedHarmonies + 10, false},
+        {1, 60, longValue, 60, true},
+        {1, 70, longValue, 63, false},
+    };
+    for (const CRow& row : rows) {
+        INFO(row.mWritten << " times " << row.mTimes);
+        const std::string harmony =
+            "<harmony><root><root-step>C</root-step></root><kind>major</"
+            "kind><degree><degree-value>" +
+            row.mDegreeValue + "</degree-value></degree></harmony>";
+        std::string bar;
+        for (std::size_t i = 0; i < row.mWritten; ++i) bar += harmony;
+        TMusicXMLDoc doc;
+        Error error;
+        CHECK(doc.LoadAsPlayedFromBytes(
+                  Score(fmt::format("<measure>{}<barline><repeat direction='backward' times='{}'/>"
+                                    "</barline></measure>",
+                                    bar, row.mTimes)),
+                  &error) == row.mIsWhole);
+        CHECK(doc.Harmonies.size() == row.mPlayed);
+        CHECK(error.description == (row.mIsWhole ? "" : "the song is too long to be played"));
+    }
 }
 
 TEST_CASE("Hostile scores reach nothing outside and take bounded time and room") {

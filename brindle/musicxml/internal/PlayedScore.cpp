@@ -5,7 +5,6 @@
 #include "brindle/theory/CSignKeyHeavy.h"
 
 #include <algorithm>
-#include <numeric>
 #include <optional>
 
 namespace brindle {
@@ -32,14 +31,11 @@ public:
     bool Run() {
         FindWhatHolds();
         mOrder = PlayInOrder(mScore.mMarks);
-        const std::size_t mostBytes = MakeRoom();
-        for (const std::uint32_t ix : mOrder.mMeasures) {
-            if (mBytes > mostBytes) break;
-            Play(ix);
-        }
+        const bool hasRoom = MakeRoom();
+        for (std::size_t i = 0; i < mPlayedMeasures; ++i) Play(mOrder.mMeasures[i]);
         SetDurations();
         AppendCopies();
-        return !mOrder.mWasCut && mBytes <= mostBytes;
+        return !mOrder.mWasCut && hasRoom;
     }
 
 private:
@@ -55,28 +51,30 @@ private:
         }
     }
 
-    // A long song takes much room; it is taken once. Gives how much it may be.
-    std::size_t MakeRoom() {
-        std::vector<std::size_t> bytes;
+    // A long song takes much room; it is taken once, for the measures that are played whole. False
+    // when these are not all.
+    bool MakeRoom() {
+        std::vector<CPlayExtent> measures;
+        CPlayExtent written{.mMeasures = mScore.mMeasures.size()};
         for (const CScoreMeasure& measure : mScore.mMeasures) {
-            std::size_t sum = 0;
-            for (const CWrittenHarmony& harmony : measure.mHarmonies) {
-                sum += BytesOf(harmony.mHarmony);
-            }
-            bytes.push_back(sum);
+            CPlayExtent& extent = measures.emplace_back();
+            for (const CWrittenHarmony& harmony : measure.mHarmonies) extent.Add(harmony.mHarmony);
+            written.mHarmonies += extent.mHarmonies;
+            written.mBytes += extent.mBytes;
         }
-        const std::size_t written = std::accumulate(bytes.begin(), bytes.end(), std::size_t{0});
-        const std::size_t mostBytes = PlayLimitsOf(bytes.size(), written).mBytes;
-        std::size_t count = 0;
-        std::size_t sum = 0;
+        const CPlayExtent limits = PlayLimitsOf(written);
+        CPlayExtent played;
+        std::size_t harmonies = 0;
         for (const std::uint32_t ix : mOrder.mMeasures) {
-            sum += bytes[ix];
-            if (sum > mostBytes) break;
-            count += mScore.mMeasures[ix].mHarmonies.size();
+            played.mHarmonies += measures[ix].mHarmonies;
+            played.mBytes += measures[ix].mBytes;
+            if (!played.HasRoomIn(limits)) break;
+            harmonies = played.mHarmonies;
+            ++mPlayedMeasures;
         }
-        mDoc.Harmonies.reserve(count);
-        mDoc.HarmBarlines.reserve(mOrder.mMeasures.size());
-        return mostBytes;
+        mDoc.Harmonies.reserve(harmonies);
+        mDoc.HarmBarlines.reserve(mPlayedMeasures);
+        return mPlayedMeasures == mOrder.mMeasures.size();
     }
 
     void Play(std::size_t ix) {
@@ -90,7 +88,6 @@ private:
         AppendKey(mKeys[ix]);
         if (measure.mHasSlash) mDoc.ChordSequences.push_back(mDoc.Harmonies.size());
         for (const CWrittenHarmony& written : measure.mHarmonies) {
-            mBytes += BytesOf(written.mHarmony);
             TMusicXMLHarmony& harmony = mDoc.Harmonies.emplace_back(written.mHarmony);
             harmony.mPosition =
                 QuartersOf(std::max(TTicks{0}, AddTicks(mPosition, written.mOffset)));
@@ -153,7 +150,7 @@ private:
     TTicks mPosition = 0;
     std::optional<CScoreTime> mTime;
     std::optional<CScoreKey> mKey;
-    std::size_t mBytes = 0;
+    std::size_t mPlayedMeasures = 0;  // up to the limits
 };
 
 }  // namespace

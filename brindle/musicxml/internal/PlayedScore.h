@@ -42,8 +42,7 @@ struct CPlayedScore {
 /// Reads a score, plain or in a container, and plays it.
 [[nodiscard]] CPlayedScore PlayScoreBytes(std::string_view bytes);
 
-/// Plays `score.mWritten` into its other fields. False when the song was cut, as it is too long or
-/// its harmonies take more than kMaxPlayedBytes.
+/// Plays `score.mWritten` into its other fields. False when the song was cut, see kMaxTimesPlayed.
 bool LayOutAsPlayed(CPlayedScore& score);
 
 }  // namespace brindle

@@ -57,7 +57,7 @@ public:
     explicit CScorePlayer(TMarksOfMeasures marks)
         : mMarks(marks),
           mPlan(MakeJumpPlan(marks)),
-          mMostPlayed(PlayLimitsOf(marks.size(), 0).mMeasures),
+          mMostPlayed(PlayLimitsOf({.mMeasures = marks.size()}).mMeasures),
           mLastPlayed(marks.size(), kNoMeasure),
           mHasJumped(marks.size(), false) {}
 
