@@ -3,6 +3,7 @@
 
 #include "brindle/musicxml/TMusicXMLDoc.h"
 #include "brindle/present/CBars.h"
+#include "brindle/present/CJsonWriter.h"
 #include "brindle/present/CTable.h"
 #include "brindle/present/JsonValues.h"
 #include "brindle/present/ShownNames.h"
@@ -33,6 +34,21 @@ std::string DegreesText(const TMusicXMLHarmony& harmony) {
 // A score read as the library does may have chords without a place in time.
 std::string TimeText(double time) {
     return time > -1e9 && time < 1e9 ? ShortNumber(time) : "-";
+}
+
+void WriteHarmony(CJsonWriter& json, const TMusicXMLHarmony& harmony) {
+    json.BeginObject().Key("Position").Number(harmony.mPosition);
+    json.Key("Duration").Number(harmony.mDuration);
+    json.Key("Symbol").String(HarmonySymbol(harmony));
+    WriteKeyEnh(json.Key("RootKeyEnh"), harmony.mRoot.ToKeyEnh(NamePrefs()));
+    WriteKeyEnh(json.Key("BassKeyEnh"), harmony.mBass.ToKeyEnh(NamePrefs()));
+    json.Key("Kind").String(Printable(harmony.mKind)).Key("Degrees").BeginArray();
+    for (const TMusicXMLDegree& degree : harmony.mDegrees) {
+        json.BeginObject().Key("Value").String(Printable(degree.mValue));
+        json.Key("Alter").Integer(degree.mAlter);
+        json.Key("Type").String(Printable(degree.mType)).EndObject();
+    }
+    json.EndArray().EndObject();
 }
 
 }  // namespace
@@ -66,23 +82,12 @@ std::string HarmoniesText(const TMusicXMLDoc& sheet, const CPaint& paint) {
 }
 
 std::string HarmoniesJson(const TMusicXMLDoc& sheet) {
-    Json list = Json::array();
-    for (const TMusicXMLHarmony& harmony : sheet.Harmonies) {
-        Json degrees = Json::array();
-        for (const TMusicXMLDegree& degree : harmony.mDegrees) {
-            degrees.push_back({{"Value", Printable(degree.mValue)},
-                               {"Alter", degree.mAlter},
-                               {"Type", Printable(degree.mType)}});
-        }
-        list.push_back({{"Position", NumberToJson(harmony.mPosition)},
-                        {"Duration", NumberToJson(harmony.mDuration)},
-                        {"Symbol", HarmonySymbol(harmony)},
-                        {"RootKeyEnh", KeyEnhToJson(harmony.mRoot.ToKeyEnh(NamePrefs()))},
-                        {"BassKeyEnh", KeyEnhToJson(harmony.mBass.ToKeyEnh(NamePrefs()))},
-                        {"Kind", Printable(harmony.mKind)},
-                        {"Degrees", degrees}});
-    }
-    return JsonText({{"Title", Printable(sheet.Title)}, {"Harmonies", list}});
+    CJsonWriter json;
+    json.BeginObject().Key("Title").String(Printable(sheet.Title));
+    json.Key("Harmonies").BeginArray();
+    for (const TMusicXMLHarmony& harmony : sheet.Harmonies) WriteHarmony(json, harmony);
+    json.EndArray().EndObject();
+    return std::move(json).Text();
 }
 
 namespace {
