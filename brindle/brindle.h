@@ -103,6 +103,7 @@
 #include "brindle/musicxml/CMuxmlTranspose.h"
 #include "brindle/musicxml/CMuxmlTuplet.h"
 #include "brindle/musicxml/CMuxmlUnpitched.h"
+#include "brindle/musicxml/CPlayedTies.h"
 #include "brindle/musicxml/CPositionedXMLElement.h"
 #include "brindle/musicxml/CTiePendingInfos.h"
 #include "brindle/musicxml/CTransposeNoteCounts.h"

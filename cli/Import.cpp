@@ -93,6 +93,7 @@ MusicXmlParserDelegate Both(const MusicXmlParserDelegate& lines,
     join(&MusicXmlParserDelegate::didEncounterTempoChange);
     join(&MusicXmlParserDelegate::didEncounterDirection);
     join(&MusicXmlParserDelegate::didEncounterNote);
+    join(&MusicXmlParserDelegate::didPlayNote);
     join(&MusicXmlParserDelegate::didLeaveTieOpen);
     return both;
 }

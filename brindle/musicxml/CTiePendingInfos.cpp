@@ -48,14 +48,14 @@ void CTiePendingInfo::TransferRelevantObjectsToLastNote(CMuxmlNote& note, std::s
     }
 }
 
-CTiePendingInfos::CKey CTiePendingInfos::KeyOf(const CMuxmlNote& note) {
+CTiedPitch CTiedPitch::Of(const CMuxmlNote& note) {
     return {note.mStaff, note.mVoice, note.mPitch.mStep, note.mPitch.mAlteration,
             note.mPitch.mOctave};
 }
 
 void CTiePendingInfos::StartEncounteredFor(const CMuxmlNote& note, std::int32_t ticks) {
     if (mNoteCount >= kMuxmlMaxPendingNotes) return;
-    CTiePendingInfo& info = mInfos[KeyOf(note)].emplace_back();
+    CTiePendingInfo& info = mInfos[CTiedPitch::Of(note)].emplace_back();
     ++mCount;
     ++mNoteCount;
     info.mStaff = note.mStaff;
@@ -80,32 +80,17 @@ void CTiePendingInfos::ContinueEncounteredFor(const CMuxmlNote& note, std::int32
 }
 
 const CTiePendingInfo* CTiePendingInfos::PendingDurationFor(const CMuxmlNote& note) const {
-    const auto it = mInfos.find(KeyOf(note));
+    const auto it = mInfos.find(CTiedPitch::Of(note));
     return it == mInfos.end() ? nullptr : &it->second.front();
 }
 
 CTiePendingInfo* CTiePendingInfos::PendingDurationFor(const CMuxmlNote& note) {
-    const auto it = mInfos.find(KeyOf(note));
+    const auto it = mInfos.find(CTiedPitch::Of(note));
     return it == mInfos.end() ? nullptr : &it->second.front();
 }
 
-std::vector<CMuxmlNote> CTiePendingInfos::NotesLeftOpen() const {
-    std::vector<CMuxmlNote> notes;
-    for (const auto& [key, chains] : mInfos) {
-        for (const CTiePendingInfo& chain : chains) {
-            notes.push_back(chain.mNotes.front());
-            notes.back().mLengthAsDuration = chain.mPendingLengthAsDuration;
-            notes.back().mLengthAsMidiTicks = chain.mPendingLengthAsMidiTicks;
-        }
-    }
-    std::stable_sort(notes.begin(), notes.end(), [](const CMuxmlNote& a, const CMuxmlNote& b) {
-        return a.mPositionAsMidiTicks < b.mPositionAsMidiTicks;
-    });
-    return notes;
-}
-
 void CTiePendingInfos::StopEncounteredFor(const CMuxmlNote& note) {
-    const auto it = mInfos.find(KeyOf(note));
+    const auto it = mInfos.find(CTiedPitch::Of(note));
     if (it == mInfos.end()) return;
     mNoteCount -= std::min(mNoteCount, it->second.front().mNotes.size());
     it->second.pop_front();

@@ -29,6 +29,19 @@ struct CTiePendingInfo {
     void TransferRelevantObjectsToLastNote(CMuxmlNote& note, std::size_t& room) const;
 };
 
+/// What the notes of a tie have in common: their pitch as it is written, on one staff in one voice.
+struct CTiedPitch {
+    std::int32_t mStaff = 0;
+    std::int32_t mVoice = 0;  ///< as the file numbers it
+    TMuxmlEnum_Step mStep = TMuxmlEnum_Step_Undef;
+    float mAlteration = 0.0F;
+    std::int32_t mOctave = 0;
+
+    [[nodiscard]] static CTiedPitch Of(const CMuxmlNote& note);
+
+    friend auto operator<=>(const CTiedPitch&, const CTiedPitch&) = default;
+};
+
 /// The chains of tied notes that are open while a part is read. Notes belong to one chain when
 /// staff, voice and written pitch are the same.
 ///
@@ -48,27 +61,12 @@ public:
     /// Forgets the chain of the note, if there is one.
     void StopEncounteredFor(const CMuxmlNote& note);
 
-    /// The first note of each open chain with the length of the chain, by position.
-    [[nodiscard]] std::vector<CMuxmlNote> NotesLeftOpen() const;
-
     /// Open chains, several on one pitch each for itself.
     [[nodiscard]] std::size_t size() const { return mCount; }
     [[nodiscard]] bool empty() const { return mCount == 0; }  ///< whether no chain is open
 
 private:
-    struct CKey {
-        std::int32_t mStaff;
-        std::int32_t mVoice;
-        TMuxmlEnum_Step mStep;
-        float mAlteration;
-        std::int32_t mOctave;
-
-        friend auto operator<=>(const CKey&, const CKey&) = default;
-    };
-
-    static CKey KeyOf(const CMuxmlNote& note);
-
-    std::map<CKey, std::list<CTiePendingInfo>> mInfos;  ///< no list is empty
+    std::map<CTiedPitch, std::list<CTiePendingInfo>> mInfos;  ///< no list is empty
     std::size_t mCount = 0;
     std::size_t mNoteCount = 0;  ///< of all chains together
 };

@@ -6,6 +6,7 @@
 #include "brindle/musicxml/CMuxmlPartGatheredInfo.h"
 #include "brindle/musicxml/CMuxmlSignKey.h"
 #include "brindle/musicxml/CMuxmlSignTime.h"
+#include "brindle/musicxml/CPlayedTies.h"
 #include "brindle/musicxml/CTiePendingInfos.h"
 #include "brindle/musicxml/CVelocityFromDynamics.h"
 
@@ -33,6 +34,7 @@ public:
     /// The last note that did not start together with the one before it.
     CMuxmlNote CurrentFirstChordNote;
     CTiePendingInfos TiePendingInfos;            ///< chains of tied notes whose end has not come
+    CPlayedTies PlayedTies;                      ///< the same as they are heard
     CVelocityFromDynamics VelocityFromDynamics;  ///< says 90 for all notes
     bool InXMLElementBackup = false;             ///< the next duration moves the position back
     bool InXMLElementForward = false;            ///< the next duration moves it on
@@ -49,6 +51,8 @@ public:
     std::int32_t ShiftNotePosInIncompleteFirstBarAsDuration = 0;
     /// The position before the last advance: where the first note of a chord began.
     std::int32_t LastPosAsMidiTicks = 0;
+    /// The same as it is written, where the end of a tie has not moved it.
+    std::int32_t WrittenChordPosAsMidiTicks = 0;
     std::int32_t MaxCurrentPosAsMidiTicks = 0;    ///< the farthest position of the part so far
     std::int32_t CurrentBarStartAsMidiTicks = 0;  ///< where the measure that is read begins
     std::int32_t CurrentPartMeasureCount = 0;     ///< not used

@@ -76,8 +76,12 @@ struct MusicXmlParserDelegate {
         didEncounterInstrumentWithName;
     /// A note that sounds, cue notes and grace notes among them; rests are not told.
     std::function<void(const CMuxmlNote& note)> didEncounterNote;
-    /// A note whose tie never ends, with the length of what is tied to it. Told before the end of
-    /// the part; such a note is no other call.
+    /// A note as it is heard, where and as long as it is written; one of tied notes has the length
+    /// of all. Unlike didEncounterNote it joins only notes that adjoin, and it tells those whose
+    /// ties do not end, at the latest before the end of the part.
+    std::function<void(const CMuxmlNote& note)> didPlayNote;
+    /// A note whose tie leads to no adjoining note, with the length of what is tied to it. Told
+    /// before the end of the part, where it was told as a played one.
     std::function<void(const CMuxmlNote& note)> didLeaveTieOpen;
     /// A `direction` has started: words, dynamics, pedals, whatever stands between notes.
     std::function<void(const CPositionedXMLElement& direction)> didEncounterDirection;

@@ -42,6 +42,7 @@ private:
     void SetElements();
     void SetNoteNr();
     void SetVelocities();
+    void PlayAsWritten(std::int32_t ticks);
     TDeliver SetPlaceAndJoinTies(std::int32_t& ticks);
     TDeliver SetPlaceOfGraceNote(std::int32_t position, std::int32_t& ticks);
     TDeliver CloseChain(std::int32_t position, std::int32_t& ticks);

@@ -31,10 +31,14 @@ void TNote::encounteredNote() {
     std::int32_t ticks =
         Context().ConvertMuxmlDurationToMidiTicks(EncounteredNote.mLengthAsDuration);
     TDeliver deliver = TDeliver_No;
+    if (!EncounteredNote.mIsChordNote) {
+        Context().WrittenChordPosAsMidiTicks = Context().CurrentPosAsMidiTicks;
+    }
     if (EncounteredNote.mNoteType != TMuxmlEnum_NoteType_Rest) {
         EncounteredNote.mMidiChannel = Context().CurrentMidiChannel;
         SetNoteNr();
         SetVelocities();
+        if (!EncounteredNote.mIsGraceNote) PlayAsWritten(ticks);
         deliver = SetPlaceAndJoinTies(ticks);
     }
     GatherInfo();
@@ -81,6 +85,20 @@ void TNote::SetVelocities() {
     }
 }
 
+// Each note has the ties that are written at it.
+void TNote::PlayAsWritten(std::int32_t ticks) {
+    CMuxmlNote& note = EncounteredNote;
+    note.mPositionAsMidiTicks = Context().WrittenChordPosAsMidiTicks;
+    note.mLengthAsMidiTicks = ticks;
+    if (note.mNoteTies.empty()) {
+        TellHost<&brindle::MusicXmlParserDelegate::didPlayNote>(note);
+    } else if (const auto played = Context().PlayedTies.Take(note)) {
+        TellHost<&brindle::MusicXmlParserDelegate::didPlayNote>(*played);
+    }
+    note.mPositionAsMidiTicks = kMuxmlUndef;
+    note.mLengthAsMidiTicks = kMuxmlUndef;
+}
+
 // A chain of tied notes reaches the host once, when it closes, as one note with the length of all.
 TNote::TDeliver TNote::SetPlaceAndJoinTies(std::int32_t& ticks) {
     MusicXmlContext& context = Context();
@@ -108,6 +126,7 @@ TNote::TDeliver TNote::SetPlaceOfGraceNote(std::int32_t position, std::int32_t& 
     ticks = Context().TicksPerQuarter / 8;
     EncounteredNote.mLengthAsMidiTicks = ticks;
     EncounteredNote.mPositionAsMidiTicks = std::max(0, muxml::WrappedDifference(position, ticks));
+    TellHost<&brindle::MusicXmlParserDelegate::didPlayNote>(EncounteredNote);
     return TDeliver_Yes;
 }
 

@@ -99,7 +99,8 @@ void XMLParserDelegate_RecursiveMuxml_Part::
 
 void XMLParserDelegate_RecursiveMuxml_Part::encounteredPartEnd() {
     MusicXmlContext& context = Context();
-    for (const CMuxmlNote& note : context.TiePendingInfos.NotesLeftOpen()) {
+    for (const CMuxmlNote& note : context.PlayedTies.NotesLeftOpen()) {
+        TellHost<&brindle::MusicXmlParserDelegate::didPlayNote>(note);
         TellHost<&brindle::MusicXmlParserDelegate::didLeaveTieOpen>(note);
     }
     context.CurrentPartGatheredInfo()->mPartEndPosAsMidiTicks = context.CurrentPosAsMidiTicks;

@@ -8,8 +8,6 @@ namespace {
 
 constexpr int kPercussionChannel = 9;
 constexpr int kChannels = 16;
-// The snare drum of General MIDI, for a note that neither instrument nor staff place gives a key.
-constexpr int kUsualDrum = 38;
 
 // Parts without a channel of their own share the channels that are not for percussion.
 int ChannelOfPart(const CImportedPart& part, std::size_t index) {
@@ -19,15 +17,15 @@ int ChannelOfPart(const CImportedPart& part, std::size_t index) {
 }
 
 // Each instrument of a part may have a channel of its own; drums without one have that of drums.
-int ChannelOfNote(const CImportedPart& part, const CImportedEvent& note, int channel) {
+int ChannelOfNote(const CImportedPart& part, const CPlayedNote& note, int channel) {
     if (note.mMidiChannel) return std::min(*note.mMidiChannel, kChannels - 1);
     return note.mIsUnpitched && !part.mChannel ? kPercussionChannel : channel;
 }
 
 // Negative for a note without a known pitch.
-std::int64_t KeyOfNote(const CImportedEvent& note) {
+std::int64_t KeyOfNote(const CPlayedNote& note) {
     if (note.mMidiKey) return *note.mMidiKey;
-    return note.mIsUnpitched && note.mNoteNr < 0 ? kUsualDrum : note.mNoteNr;
+    return note.mIsUnpitched && note.mNoteNr < 0 ? kUsualDrumKey : note.mNoteNr;
 }
 
 void AddPrograms(const CImportedPart& part, int channel, CMidiTrack& track) {
@@ -44,14 +42,11 @@ CMidiTrack TrackOf(const CImportedPart& part, int channel) {
     CMidiTrack track;
     track.mName = part.mName;
     AddPrograms(part, channel, track);
-    for (const auto* const events : {&part.mEvents, &part.mNotesLeftOpen}) {
-        for (const CImportedEvent& event : *events) {
-            const std::int64_t key = KeyOfNote(event);
-            if (!event.mIsNote || !event.mLength || key < 0) continue;
-            track.mNotes.push_back({event.mPosition, *event.mLength,
-                                    ChannelOfNote(part, event, channel), static_cast<int>(key),
-                                    event.mVelocity});
-        }
+    for (const CPlayedNote& note : part.mPlayedNotes) {
+        const std::int64_t key = KeyOfNote(note);
+        if (!note.mLength || key < 0) continue;
+        track.mNotes.push_back({note.mPosition, *note.mLength, ChannelOfNote(part, note, channel),
+                                static_cast<int>(key), note.mVelocity});
     }
     return track;
 }

@@ -70,6 +70,10 @@ std::string_view WordOf(Enumeration value) {
     return mBiMap<Enumeration>.WordOf(value).value_or("?");
 }
 
+constexpr int kMidiPrograms = 128;
+constexpr int kMidiKeys = 128;
+constexpr int kMidiChannels = 16;
+
 using TListedParts = std::map<std::string, CImportedPart, std::less<>>;
 
 class CFiller {
@@ -114,12 +118,20 @@ public:
         event.mVelocity = note.mVelocity;
         event.mVoice = note.mVoice;
         event.mStaff = note.mStaff;
-        event.mIsUnpitched = note.mNoteType == TMuxmlEnum_NoteType_Unpitched;
-        if (const CImportedInstrument* const instrument = InstrumentOf(note)) {
-            if (event.mIsUnpitched) event.mMidiKey = instrument->mUnpitchedKey;
-            event.mMidiChannel = instrument->mChannel;
-        }
         return event;
+    }
+
+    void PlayedNote(const CMuxmlNote& note) const {
+        CPlayedNote& played = Part().mPlayedNotes.emplace_back();
+        played.mPosition = note.mPositionAsMidiTicks;
+        if (note.mLengthAsMidiTicks != kMuxmlUndef) played.mLength = note.mLengthAsMidiTicks;
+        played.mNoteNr = note.mNoteNr;
+        played.mVelocity = note.mVelocity;
+        played.mIsUnpitched = note.mNoteType == TMuxmlEnum_NoteType_Unpitched;
+        if (const CImportedInstrument* const instrument = InstrumentOf(note)) {
+            if (played.mIsUnpitched) played.mMidiKey = instrument->mUnpitchedKey;
+            played.mMidiChannel = instrument->mChannel;
+        }
     }
 
     void SignTime(const CMuxmlSignTime& time) const {
@@ -175,32 +187,41 @@ private:
 
     static CImportedPart ListedPart(const XmlNode& scorePart) {
         CImportedPart part;
-        part.mProgram = MidiNumber(scorePart, "midi-program");
-        part.mChannel = MidiNumber(scorePart, "midi-channel");
+        part.mProgram = MidiNumber(scorePart, "midi-program", kMidiPrograms);
+        part.mChannel = MidiNumber(scorePart, "midi-channel", kMidiChannels);
+        part.mUsualDrum.mUnpitchedKey = kUsualDrumKey;
+        bool hasUsualDrum = false;
         for (const XmlNode& midi : scorePart.descendants("midi-instrument")) {
-            part.mInstruments.insert_or_assign(
-                midi.attribute("id").value_or(""),
-                CImportedInstrument{MidiNumber(midi, "midi-program"),
-                                    MidiNumber(midi, "midi-channel"),
-                                    MidiNumber(midi, "midi-unpitched")});
+            const CImportedInstrument instrument{MidiNumber(midi, "midi-program", kMidiPrograms),
+                                                 MidiNumber(midi, "midi-channel", kMidiChannels),
+                                                 MidiNumber(midi, "midi-unpitched", kMidiKeys)};
+            part.mInstruments.insert_or_assign(midi.attribute("id").value_or(""), instrument);
+            if (hasUsualDrum || !instrument.mUnpitchedKey) continue;
+            part.mUsualDrum = instrument;
+            hasUsualDrum = true;
         }
         return part;
     }
 
-    // Notes of a part with one instrument need not name it. Null if it is not known.
+    // Notes of a part with one instrument need not name it; of several, the usual drum plays those
+    // without a pitch. Null if it is not known.
     [[nodiscard]] const CImportedInstrument* InstrumentOf(const CMuxmlNote& note) const {
         const auto& instruments = Part().mInstruments;
         const XmlNode named = note.mNoteXML.firstDescendant("instrument");
-        if (!named) return instruments.size() == 1 ? &instruments.begin()->second : nullptr;
-        const auto found = instruments.find(named.attribute("id").value_or(""));
-        return found == instruments.end() ? nullptr : &found->second;
+        if (!named && instruments.size() == 1) return &instruments.begin()->second;
+        if (named) {
+            const auto found = instruments.find(named.attribute("id").value_or(""));
+            if (found != instruments.end()) return &found->second;
+        }
+        const bool isDrum = note.mNoteType == TMuxmlEnum_NoteType_Unpitched;
+        return isDrum && instruments.size() > 1 ? &Part().mUsualDrum : nullptr;
     }
 
     // Numbers of MIDI count from 1 in scores.
-    static std::optional<int> MidiNumber(const XmlNode& scorePart, std::string_view name) {
-        const XmlNode found = scorePart.firstDescendant(name);
-        if (!found) return std::nullopt;
-        return std::max(1, ReadInteger(found.stringValue())) - 1;
+    static std::optional<int> MidiNumber(const XmlNode& scorePart, std::string_view name,
+                                         int most) {
+        const int number = ReadInteger(scorePart.firstDescendant(name).stringValue());
+        return number >= 1 && number <= most ? std::optional(number - 1) : std::nullopt;
     }
 
     CImportedScore* mScore;
@@ -240,6 +261,7 @@ MusicXmlParserDelegate HostFor(CImportedScore& score) {
                    fmt::format("direction {}", type ? type.name() : "of no type"));
     };
     host.didEncounterNote = [filler](const CMuxmlNote& note) { filler.Note(note); };
+    host.didPlayNote = [filler](const CMuxmlNote& note) { filler.PlayedNote(note); };
     host.didLeaveTieOpen = [filler](const CMuxmlNote& note) { filler.NoteLeftOpen(note); };
     return host;
 }

@@ -16,6 +16,9 @@ namespace brindle {
 /// Ticks to the quarter of an import by the program.
 inline constexpr std::int32_t kImportTicksPerQuarter = 960;
 
+/// The snare drum of General MIDI, for a note that neither instrument nor staff place gives a key.
+inline constexpr int kUsualDrumKey = 38;
+
 /// One line of the table of a part: a note, or something that stands between notes.
 struct CImportedEvent {
     std::int32_t mPosition = 0;           ///< in ticks
@@ -27,10 +30,18 @@ struct CImportedEvent {
     int mVelocity = 0;          ///< of a note, 1 to 127
     std::int32_t mVoice = 0;    ///< of a note; 0 where the score tells none
     std::int32_t mStaff = 0;    ///< of a note, from 1; 0 where the score tells none
-    bool mIsUnpitched = false;  ///< a note of drums and their like
+};
+
+/// A note as it is heard.
+struct CPlayedNote {
+    std::int32_t mPosition = 0;           ///< in ticks
+    std::optional<std::int32_t> mLength;  ///< in ticks, where it is known
+    std::int64_t mNoteNr = -1;            ///< 0 to 127; -1 where it has no pitch
+    int mVelocity = 0;                    ///< 1 to 127
+    bool mIsUnpitched = false;            ///< a note of drums and their like
     /// Of a note without pitch, the key that plays it, from 0, where the score tells it.
     std::optional<int> mMidiKey;
-    /// The channel of a note's instrument, from 0, where the score tells it.
+    /// The channel of its instrument, from 0, where the score tells it.
     std::optional<int> mMidiChannel;
 };
 
@@ -40,7 +51,8 @@ struct CImportedMeasure {
     std::string mNumber;         ///< "12", "X1"; "-" for none
 };
 
-/// How MIDI plays an instrument of a part; all numbers from 0.
+/// How MIDI plays an instrument of a part; all numbers from 0. A number that MIDI does not have is
+/// as one that the score does not tell.
 struct CImportedInstrument {
     std::optional<int> mProgram;       ///< the sound, 0 is a grand piano
     std::optional<int> mChannel;       ///< 9 is that of drums
@@ -56,9 +68,12 @@ struct CImportedPart {
     std::optional<int> mChannel;  ///< from 0
     /// By the identifiers that notes have.
     std::map<std::string, CImportedInstrument, std::less<>> mInstruments;
+    /// Of several instruments, the one for notes without a pitch that name none.
+    CImportedInstrument mUsualDrum;
     std::vector<CImportedEvent> mEvents;      ///< in the order of the file
     std::vector<CImportedMeasure> mMeasures;  ///< likewise
-    /// Notes whose ties never end: they are none of the events, and sound as long as is written.
+    std::vector<CPlayedNote> mPlayedNotes;    ///< all that is heard
+    /// Those of them whose ties lead nowhere.
     std::vector<CImportedEvent> mNotesLeftOpen;
     std::int32_t mEnd = 0;  ///< in ticks, the end of its last bar
 };
