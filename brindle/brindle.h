@@ -44,6 +44,7 @@
 #include "brindle/chords/CChordLite.h"
 #include "brindle/chords/CChordSetFromStringHelper.h"
 #include "brindle/chords/CChordTypes.h"
+#include "brindle/chords/CProgressionSpelling.h"
 #include "brindle/chords/ChordAndScaleStrings.h"
 #include "brindle/chords/ChordDegree.h"
 #include "brindle/chords/ChordSymbolKeywords.h"

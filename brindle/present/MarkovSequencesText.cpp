@@ -20,6 +20,15 @@ Json SampledToJson(const TMarkovSampledObject& sampled, const CMarkovSpelling& s
     return json;
 }
 
+/// One spelling for all that was drawn, in the key of what was chosen.
+CMarkovSpelling SpellingOf(const CMarkovDraws& draws) {
+    MarkovSequence others;
+    for (const TMarkovSampledSequence& sequence : draws.mSequences) {
+        others.insert(others.end(), sequence.mSymbols.begin(), sequence.mSymbols.end());
+    }
+    return CMarkovSpelling(draws.mChosen.mSymbols, others);
+}
+
 std::string WeightText(double share, int count) {
     const std::string drawn = count == 1 ? "" : fmt::format(", drawn {} times", count);
     return fmt::format("\nor, with weight {:.2f}{}:\n", share, drawn);
@@ -41,7 +50,7 @@ Json MarkovSymbolToJson(const CMarkovObject& object, const CMarkovSpelling& spel
 
 std::string DrawnSequencesText(const CMarkovDraws& draws, int beatsPerBar, std::size_t others,
                                const CPaint& paint) {
-    const CMarkovSpelling spelling(draws.mChosen.mSymbols);
+    const CMarkovSpelling spelling = SpellingOf(draws);
     const auto textOf = [&](const TMarkovSampledSequence& sequence) {
         return BarsText(sequence.mSymbols, spelling, beatsPerBar, kBarsOfLine) + '\n';
     };
@@ -56,7 +65,7 @@ std::string DrawnSequencesText(const CMarkovDraws& draws, int beatsPerBar, std::
 }
 
 std::string DrawnSequencesJson(const CMarkovDraws& draws) {
-    const CMarkovSpelling spelling(draws.mChosen.mSymbols);
+    const CMarkovSpelling spelling = SpellingOf(draws);
     Json symbols = Json::array();
     for (const auto& sampled : draws.mChosen.mSampledObjects) {
         symbols.push_back(SampledToJson(sampled, spelling));

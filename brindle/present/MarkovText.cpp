@@ -3,46 +3,20 @@
 
 #include "brindle/analysis/CHarmAnlsChords.h"
 #include "brindle/analysis/CKeyOfSong.h"
-#include "brindle/chords/ChordTones.h"
 #include "brindle/chords/WriteChordSymbol.h"
 #include "brindle/present/ShownText.h"
-#include "brindle/theory/KeyIntervals.h"
 
 #include <fmt/format.h>
 
 #include <algorithm>
 #include <cmath>
+#include <vector>
 
 namespace brindle {
 namespace {
 
 // Longer texts are shown as chord strings.
 constexpr double kMostBeatsOfText = 1e6;
-
-// Steps on the line of fifths from C, F is -1 and Bb is -2.
-int FifthsOf(const CKeyEnh& note) {
-    const int natural = FoldIntoOctave(note.mKeyNr - EnhToSemitone(note.mEnh));
-    // F C G D A E B are -1 to 5.
-    return (natural * 7 + 1) % 12 - 1 + 7 * EnhToSemitone(note.mEnh);
-}
-
-// The place of a root as people type it: no Fb, no B# and no double signs, and Cb and E# only in
-// keys that have them.
-int TypedFifths(int fifths, int firstOfKey) {
-    constexpr int kCFlat = -7;
-    constexpr int kESharp = 11;
-    const bool isOfKey = fifths >= firstOfKey && fifths < firstOfKey + 7;
-    if (fifths < kCFlat || (fifths == kCFlat && !isOfKey)) return fifths + 12;
-    if (fifths > kESharp || (fifths == kESharp && !isOfKey)) return fifths - 12;
-    return fifths;
-}
-
-// The root of a key number on the twelve steps of the line of fifths from `first` on.
-CKeyEnh RootInKey(int keyNr, int first, int firstOfKey) {
-    const int fifths = TypedFifths(first + FoldIntoOctave(keyNr * 7 - first), firstOfKey);
-    const int natural = (fifths + 1 + 70) % 7 - 1;
-    return {FoldIntoOctave(keyNr), static_cast<TEnh>(TEnh_n + (fifths - natural) / 7)};
-}
 
 CHarmAnlsChords ChordsOf(MarkovSequenceView sequence) {
     CHarmAnlsChords chords;
@@ -104,21 +78,15 @@ private:
 
 }  // namespace
 
-CMarkovSpelling::CMarkovSpelling(MarkovSequenceView sequence)
-    : mKey(FindKeys(ChordsOf(sequence)).mKey) {}
-
-CChordLite CMarkovSpelling::Spelled(const CChordLite& chord) const {
-    if (mKey.IsUndef() || chord.mRootKeyEnh.IsUndef()) return chord;
-    // A minor key has its leading tone, and a major key the leading tone of its fifth.
-    const bool isMinor = mKey.mSignKeyType == TSignKeyType_Minor;
-    const int tonic = FifthsOf(mKey.mRootKeyEnh);
-    CChordLite spelled = chord;
-    spelled.mRootKeyEnh =
-        RootInKey(chord.mRootKeyEnh.mKeyNr, tonic - (isMinor ? 6 : 5), tonic - (isMinor ? 4 : 1));
-    if (!chord.HasBassNote()) return spelled;
-    const int intvl = FoldIntoOctave(chord.mBassKeyEnh.mKeyNr - chord.mRootKeyEnh.mKeyNr);
-    spelled.mBassKeyEnh = ToneAboveRoot(spelled, intvl);
-    return spelled;
+CMarkovSpelling::CMarkovSpelling(MarkovSequenceView sequence, MarkovSequenceView beside)
+    : mKey(FindKeys(ChordsOf(sequence)).mKey) {
+    std::vector<CChordLite> chords;
+    for (const MarkovSequenceView view : {sequence, beside}) {
+        for (const MarkovIterator symbol : view) {
+            if (symbol->HasBeats()) chords.push_back(symbol->mChord);
+        }
+    }
+    mNames = CProgressionSpelling(mKey, chords);
 }
 
 std::string CMarkovSpelling::SymbolOf(const CMarkovObject& object) const {

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "brindle/chords/CProgressionSpelling.h"
 #include "brindle/markov/VariableLengthMarkovModel.h"
 #include "brindle/theory/CSignKeyLite.h"
 
@@ -10,26 +11,27 @@ namespace brindle {
 
 /// How the chords of a sequence are spelled: all in one key, that of the sequence, so that no Ab7
 /// goes to F#7. Learned chords keep the spelling of the songs that they come from, which differ.
-///
-/// Roots are those of the line of fifths around the tonic: in C from Db to F#, in A minor from Eb
-/// to G#. But nobody types Fb, B# or double signs: in Ab it is E, and Cb and E# are for keys that
-/// have them. A bass is spelled from its root, as in D/F#. Without a key chords stay as they are.
+/// The names are those of CProgressionSpelling. Without a key chords stay as they are.
 class CMarkovSpelling {
 public:
-    /// Spells in the key that FindKeys finds for the sequence.
-    explicit CMarkovSpelling(MarkovSequenceView sequence);
+    /// Spells in the key that FindKeys finds for the sequence; what is shown beside it has the same
+    /// names.
+    explicit CMarkovSpelling(MarkovSequenceView sequence, MarkovSequenceView beside = {});
     /// Spells in a key; an undefined one changes nothing.
-    explicit CMarkovSpelling(const CSignKeyLite& key) : mKey(key) {}
+    explicit CMarkovSpelling(const CSignKeyLite& key) : mKey(key), mNames(key) {}
 
     /// Undefined for a sequence without chords.
     [[nodiscard]] const CSignKeyLite& Key() const { return mKey; }
     /// The same keys with the spelling of this one.
-    [[nodiscard]] CChordLite Spelled(const CChordLite& chord) const;
+    [[nodiscard]] CChordLite Spelled(const CChordLite& chord) const {
+        return mNames.Spelled(chord);
+    }
     /// A chord as people type it, "U" for a gap, "start" and "end", "#3" for an indexed symbol.
     [[nodiscard]] std::string SymbolOf(const CMarkovObject& object) const;
 
 private:
     CSignKeyLite mKey;
+    CProgressionSpelling mNames;
 };
 
 /// The chord string of a sequence, as it is typed: "(4,C);(2,G7)".

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/song/WriteSong.h"
 
+#include "brindle/chords/CProgressionSpelling.h"
 #include "brindle/chords/WriteChordSymbol.h"
 #include "brindle/song/internal/SongPlan.h"
 #include "brindle/song/internal/WriteStretch.h"
@@ -101,8 +102,17 @@ void AddChords(const CWrittenChords& chords, const CSignKeyLite& home, double& p
         const CSignKeyLite key = KeyAbove(home, written.mTonic, written.mChord.mIsMinorKey);
         const CChordLite chord = ChordInKey(written.mChord, key);
         song.mChords.emplace_back(chord, position);
-        song.mSymbols.push_back(WriteChordSymbol(chord));
         position += written.mBeats;
+    }
+}
+
+/// Gives the chords of all keys of a song the names of its own, and their symbols.
+void SpellChords(CSong& song) {
+    const std::vector<CChordLite> chords(song.mChords.begin(), song.mChords.end());
+    const CProgressionSpelling spelling(*song.mStatedKey, chords);
+    for (CHarmAnlsChordWithPos& chord : song.mChords) {
+        static_cast<CChordLite&>(chord) = spelling.Spelled(chord);
+        song.mSymbols.push_back(WriteChordSymbol(chord));
     }
 }
 
@@ -125,6 +135,7 @@ CSong SongOf(const std::vector<CWrittenChords>& parts, const CSongPlan& plan,
         }
         AddChords(parts[ix], options.mKey, position, song);
     }
+    SpellChords(song);
     song.mChords.emplace_back(CChordLite_Undef, position);
     for (std::size_t bar = 0; bar < options.mBars; ++bar) {
         song.mBars.push_back({fmt::format("{}", bar + 1),

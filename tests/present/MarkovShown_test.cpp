@@ -48,6 +48,21 @@ TEST_CASE("A sequence is spelled in its key, whatever songs its chords come from
           "(4,F);(2,Bb);(2,D/F#);(4,Gm);(4,C7);(8,F)");
 }
 
+TEST_CASE("A sequence has one name for each key, also behind a slash") {
+    // Foreign to the chord, so that it is no raised ninth.
+    CHECK(Spelled("(4,Bb);(4,F7/G#);(4,Eb);(4,Bb)") == "(4,Bb);(4,F7/Ab);(4,Eb);(4,Bb)");
+    CHECK(Spelled("(4,Ab);(4,Db/B);(4,Eb7);(4,Ab)") == "(4,Ab);(4,Db/Cb);(4,Eb7);(4,Ab)");
+    // The third of A, but beside a Db it has the name of that.
+    CHECK(Spelled("(4,C);(4,A7/Db);(4,Dm);(4,G7);(4,C)") == "(4,C);(4,A7/C#);(4,Dm);(4,G7);(4,C)");
+    CHECK(Spelled("(4,C);(4,A7/C#);(4,Dm);(4,C#7);(4,C)") ==
+          "(4,C);(4,A7/Db);(4,Dm);(4,Db7);(4,C)");
+    // Diminished chords lead upwards.
+    CHECK(Spelled("(4,C);(4,Dbdim7);(4,Dm);(4,G7);(4,C)") ==
+          "(4,C);(4,C#dim7);(4,Dm);(4,G7);(4,C)");
+    CHECK(Spelled("(4,C);(4,C#dim7);(4,C#7);(4,G7);(4,C)") ==
+          "(4,C);(4,Dbdim7);(4,Db7);(4,G7);(4,C)");
+}
+
 TEST_CASE("Roots of keys with many signs are those that people type") {
     const auto rootsIn = [](const char* key) {
         const CMarkovSpelling spelling{CSignKeyLite(key)};
@@ -65,7 +80,9 @@ TEST_CASE("Roots of keys with many signs are those that people type") {
     CHECK(rootsIn("Eb major") == "C Db D Eb E F Gb G Ab A Bb B");
     CHECK(rootsIn("Ab major") == "C Db D Eb E F Gb G Ab A Bb B");
     CHECK(rootsIn("Gb major") == "C Db D Eb E F Gb G Ab A Bb Cb");
-    CHECK(rootsIn("Ab minor") == "C Db D Eb E F Gb G Ab A Bb Cb");
+    CHECK(rootsIn("Ab minor") == "C Db D Eb Fb F Gb G Ab A Bb Cb");
+    CHECK(rootsIn("Cb major") == "C Db D Eb Fb F Gb G Ab A Bb Cb");
+    CHECK(rootsIn("C# major") == "B# C# D D# E E# F# G G# A A# B");
     CHECK(rootsIn("E major") == "C C# D D# E F F# G G# A A# B");
     CHECK(rootsIn("F# major") == "C C# D D# E E# F# G G# A A# B");
     CHECK(rootsIn("D# minor") == "C C# D D# E E# F# G G# A A# B");

@@ -2,6 +2,7 @@
 #include "brindle/song/WriteSong.h"
 
 #include "brindle/analysis/RomanNumeral.h"
+#include "brindle/chords/ReadChordText.h"
 #include "brindle/chords/WriteChordSymbol.h"
 #include "brindle/song/BuiltInSongs.h"
 #include "brindle/song/ReadSong.h"
@@ -87,7 +88,59 @@ double LongestQuoteByHand(const CSongModel& model, const CSong& song) {
     return static_cast<double>(longest) / kTicksPerBar;
 }
 
+/// The names of roots and basses by key number; a second one for a key is an error.
+void CheckOneNameForEachKey(const CSong& song) {
+    std::map<int, CKeyEnh> names;
+    for (std::size_t ix = 0; ix + 1 < song.mChords.size(); ++ix) {
+        const CChordLite& chord = song.mChords[ix];
+        CAPTURE(song.mSymbols[ix]);
+        for (const CKeyEnh& key : {chord.mRootKeyEnh, chord.mBassKeyEnh}) {
+            if (key.IsUndef()) continue;
+            CHECK(names.try_emplace(key.mKeyNr, key).first->second == key);
+        }
+        const CChordTextReading read = ReadChordText(song.mSymbols[ix]);
+        REQUIRE(read.mKind == TChordText_Chord);
+        CHECK(read.mChord.mRootKeyEnh == chord.mRootKeyEnh);
+        CHECK(read.mChord.mBassKeyEnh == chord.mBassKeyEnh);
+        CHECK(read.mChord.mSemitones.Mask() % 4096 == chord.mSemitones.Mask() % 4096);
+    }
+}
+
+/// All twelve roots, and basses of all kinds, in songs that change between far keys.
+CSongModel ChromaticModel() {
+    std::vector<CTaughtSong> songs;
+    for (const char* const text :
+         {"C | Dbmaj7 | C#dim7 | Dm | A7/C# | Abm | E7/G# | F7/Ab | G7 | C",
+          "C | Ebm7 | Ab7 | F#7 | Db | Dbmaj7 | F# | B7 | E | A | D#dim7 | Em | G7 | C",
+          "Db | C#m9 | F#7b9 | B6 | G#m | C#m | Ab7 | Db | Db/Cb | Gb | Cb | Ab7 | Db"}) {
+        songs.push_back(TeachSong(ReadSong(text)));
+    }
+    return CSongModel(std::move(songs));
+}
+
 }  // namespace
+
+TEST_CASE("A written song has one name for each key, and its symbols read back") {
+    const CSongModel chromatic = ChromaticModel();
+    for (const char* const key :
+         {"C major",  "G major",  "D major",  "A major",  "E major",  "B major",
+          "F# major", "C# major", "F major",  "Bb major", "Eb major", "Ab major",
+          "Db major", "Gb major", "Cb major", "A minor",  "E minor",  "C# minor",
+          "D# minor", "D minor",  "F minor",  "Bb minor", "Ab minor"}) {
+        for (std::uint64_t seed = 1; seed <= 10; ++seed) {
+            CAPTURE(key);
+            CAPTURE(seed);
+            CWriteSongOptions options = OptionsOf("", 16, seed);
+            options.mKey = KeyOf(key);
+            options.mMostQuotedBars = 0.0;
+            for (const CSongModel* const model : {&BuiltIn(), &chromatic}) {
+                const CWrittenSong written = WriteSong(*model, options);
+                if (!written.mFault.empty()) continue;
+                CheckOneNameForEachKey(written.mSong);
+            }
+        }
+    }
+}
 
 TEST_CASE("A written song fills its bars, ends on its tonic and is the same for the same seed") {
     for (const char* const key : {"C major", "Eb major", "F# minor", "A minor"}) {
