@@ -98,8 +98,7 @@ public:
             for (CChordGrid& grid : grids) grid.mName = name;
         }
         if (!grids.empty()) return grids;
-        return Fail(TStatus::BadInput,
-                    fmt::format("no fingering of {} for {}", symbol, TuningText(mTuning)));
+        return FailWithoutFingering(symbol, mTuning);
     }
 
 private:

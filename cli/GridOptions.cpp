@@ -6,6 +6,8 @@
 
 #include "brindle/present/ChordGrid.h"
 
+#include <fmt/format.h>
+
 namespace brindle::cli {
 
 void CFingeringOptionsOfUser::AddTo(CCommand& command) {
@@ -56,6 +58,18 @@ std::optional<GChShortTuning> ReadTuningOption(const std::string& text) {
                                     "lowest string, as in DADGAD, or pitches, as in E2A2D3G3B3E4");
     }
     return tuning;
+}
+
+TStatus FailWithoutFingering(const std::string& symbol, const GChShortTuning& tuning) {
+    const int strings = GChNumberOfStringsInShortTuning(tuning);
+    if (strings <= kFingeringMostStrings) {
+        return Fail(TStatus::BadInput,
+                    fmt::format("no fingering of {} for {}", symbol, TuningText(tuning)));
+    }
+    return Fail(
+        TStatus::BadInput,
+        fmt::format("no fingering of {}: they are searched on at most {} strings, not on {}",
+                    symbol, kFingeringMostStrings, strings));
 }
 
 }  // namespace brindle::cli

@@ -3,6 +3,7 @@
 
 #include "brindle/guitarchords/FindFingerings.h"
 #include "brindle/present/CGridStyle.h"
+#include "cli/Output.h"
 
 #include <optional>
 #include <string>
@@ -32,5 +33,8 @@ private:
 
 /// The tuning of an option; nothing if it is none, and then the error has been printed.
 [[nodiscard]] std::optional<GChShortTuning> ReadTuningOption(const std::string& text);
+
+/// Prints that a chord has no fingering on a tuning, and why.
+TStatus FailWithoutFingering(const std::string& symbol, const GChShortTuning& tuning);
 
 }  // namespace brindle::cli

@@ -85,6 +85,9 @@ TStatus GridsFor(const CGridsForOptions& options) {
     if (contradiction) return Fail(TStatus::BadUsage, *contradiction);
     const auto tuning = ReadTuningOption(options.mTuning);
     if (!tuning) return TStatus::BadUsage;
+    if (GChNumberOfStringsInShortTuning(*tuning) > kFingeringMostStrings) {
+        return FailWithoutFingering("a song", *tuning);
+    }
     return options.mSongs.Print(options.mFormat.Format(), [&](const CTypedSong& song) {
         return GridsOf(song, *tuning, options);
     });

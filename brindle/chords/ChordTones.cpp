@@ -17,18 +17,31 @@ bool HasDiminishedSeventh(TToneMask tones) {
     return (tones & kAsked) == kAsked && (tones & kForeign) == 0;
 }
 
+TToneMask ToneMaskOf(const CChordLite& chord) {
+    return static_cast<TToneMask>(chord.mSemitones.Mask() & kTonesOfOctave);
+}
+
+CChordDegree DegreeIn(const CSpelledOutChord& spelled, TToneMask tones, int tone) {
+    const bool isSeventh = tone == 9 && HasDiminishedSeventh(tones);
+    return isSeventh ? CChordDegree{7, -2} : spelled.DegreeOf(tone);
+}
+
 }  // namespace
+
+CChordDegree DegreeOfTone(const CChordLite& chord, int intvl) {
+    const TToneMask tones = ToneMaskOf(chord);
+    const bool isTone = intvl >= 0 && intvl < 12 && HasTone(tones, intvl);
+    return isTone ? DegreeIn(CSpelledOutChord(tones), tones, intvl) : CChordDegree();
+}
 
 std::vector<CKeyEnh> ChordTones(const CChordLite& chord) {
     if (chord.IsUndef()) return {};
-    const auto tones = static_cast<TToneMask>(chord.mSemitones.Mask() & kTonesOfOctave);
+    const TToneMask tones = ToneMaskOf(chord);
     const CSpelledOutChord spelled(tones);
     std::vector<CKeyEnh> keys;
     for (int tone = 0; tone < 12; ++tone) {
         if (!HasTone(tones, tone)) continue;
-        const bool isSeventh = tone == 9 && HasDiminishedSeventh(tones);
-        const CChordDegree degree = isSeventh ? CChordDegree{7, -2} : spelled.DegreeOf(tone);
-        const CKeyEnh key = degree.KeyOver(chord.mRootKeyEnh);
+        const CKeyEnh key = DegreeIn(spelled, tones, tone).KeyOver(chord.mRootKeyEnh);
         keys.push_back(key.IsUndef() ? chord.mRootKeyEnh + tone : key);
     }
     return keys;

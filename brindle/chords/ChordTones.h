@@ -2,6 +2,7 @@
 #pragma once
 
 #include "brindle/chords/CChordLite.h"
+#include "brindle/chords/ChordDegree.h"
 #include "brindle/theory/CKeyEnh.h"
 
 #include <vector>
@@ -15,5 +16,9 @@ namespace brindle {
 
 /// The tone 0 to 11 semitones above the root, spelled as if the chord had it: Bb for 10 above Cm.
 [[nodiscard]] CKeyEnh ToneAboveRoot(const CChordLite& chord, int intvl);
+
+/// The degree as which a chord has one of its tones, 0 to 11 semitones above its root: the D of Cm9
+/// is its 9, that of Csus2 its 2. No degree for what is none of its tones.
+[[nodiscard]] CChordDegree DegreeOfTone(const CChordLite& chord, int intvl);
 
 }  // namespace brindle

@@ -20,6 +20,14 @@ std::vector<int> PitchesOf(const GChChord& chord, int capo) {
     return pitches;
 }
 
+int HighestFretOfGrid(const GChBasicChord& grid) {
+    int highest = 0;
+    for (const GChChordElem& elem : grid.chordElems()) {
+        highest = std::max(highest, elem.absFretIndex() + 1);
+    }
+    return highest;
+}
+
 /// Whether a library tells a bass, and the same as the chord.
 bool HasBassOf(const GChChord& grid, const CChordLite& chord, int capo) {
     const int bass = grid.bassNote(capo);
@@ -64,7 +72,9 @@ std::vector<CFoundGrid> LookUpChord(const GChDatabase& database, const CChordLit
         }
     }
     std::stable_sort(found.begin(), found.end(), [](const CFoundGrid& a, const CFoundGrid& b) {
-        return a.mOmitted.size() < b.mOmitted.size();
+        const int more = a.mOmitted.size() - b.mOmitted.size();
+        if (more != 0) return more < 0;
+        return HighestFretOfGrid(*a.mGrid) < HighestFretOfGrid(*b.mGrid);
     });
     return found;
 }

@@ -24,7 +24,8 @@ struct CFoundGrid {
                                                      const CChordLite& chord);
 
 /// The fingerings of a tuning that stand over the root of the chord and sound it under the
-/// capodaster: whole ones first, otherwise in the order of the database. A chord without a slash is
+/// capodaster: whole ones first, then those that lie lower, otherwise in the order of the
+/// database. A chord without a slash is
 /// not found where a library tells a bass. The tuning counts up to whole octaves.
 [[nodiscard]] std::vector<CFoundGrid> LookUpChord(const GChDatabase& database,
                                                   const CChordLite& chord,

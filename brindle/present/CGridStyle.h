@@ -9,7 +9,7 @@ namespace brindle {
 enum class TGridDots : std::uint8_t {
     Fingers,    ///< 1 index to 4 little finger
     Notes,      ///< "F#"
-    Intervals,  ///< degrees above the root of the name, "b3"
+    Intervals,  ///< degrees as the chord names them, "b3", "9"
 };
 
 /// How chord grids are drawn.

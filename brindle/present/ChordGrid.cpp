@@ -124,21 +124,22 @@ std::string StoredName(const GChChord& chord, int root, int capo) {
     return stored.IsUndef() ? Printable(chord.chordName(capo)) : WriteChordSymbol(stored);
 }
 
-/// The degree of a tone above a root as guitarists count it.
-std::string DegreeOnDot(int tone) {
+/// The degree of a tone above a root as the chord names it; of any other tone as guitarists count.
+std::string DegreeOnDot(const CChordLite& chord, int tone) {
     static constexpr auto kDegrees = std::to_array<std::string_view>(
         {"1", "b2", "2", "b3", "3", "4", "b5", "5", "#5", "6", "b7", "7"});
-    return std::string(kDegrees[static_cast<std::size_t>(FoldIntoOctave(tone))]);
+    const CChordDegree degree = DegreeOfTone(chord, tone);
+    if (!degree.IsUndef()) return degree.Name();
+    return std::string(kDegrees[static_cast<std::size_t>(tone)]);
 }
 
 /// Degrees that a chord leaves out, by the numbers of its name.
-std::vector<std::string> OmittedDegrees(CSemitones omitted) {
+std::vector<std::string> OmittedDegrees(const CChordLite& chord, CSemitones omitted) {
     // Ninths and elevenths stand behind what lies within the octave.
     static constexpr auto kOrder = std::to_array({0, 1, 3, 4, 6, 7, 8, 9, 10, 11, 2, 5});
     std::vector<std::string> degrees;
     for (const int tone : kOrder) {
-        if (!omitted.HasIntvl(tone)) continue;
-        degrees.push_back(tone == 2 ? "9" : tone == 5 ? "11" : DegreeOnDot(tone));
+        if (omitted.HasIntvl(tone)) degrees.push_back(DegreeOnDot(chord, tone));
     }
     return degrees;
 }
@@ -202,7 +203,8 @@ std::string DotText(const CChordGrid& grid, std::size_t string, TGridDots dots) 
         if (!key.IsUndef()) return WriteNoteName(key);
         return std::string(GChOctPitchDefaultName(FoldIntoOctave(pitch)));
     }
-    return grid.mRoot < 0 ? std::string() : DegreeOnDot(pitch - grid.mRoot);
+    if (grid.mRoot < 0) return {};
+    return DegreeOnDot(grid.mChord, FoldIntoOctave(pitch - grid.mRoot));
 }
 
 std::string TuningTitle(const CChordGrid& grid) {
@@ -321,7 +323,7 @@ CChordGrid GridOfFingering(std::string_view symbol, const CFingering& fingering,
     }
     grid.mRoot = chord.mRootKeyEnh.mKeyNr;
     grid.mChord = chord;
-    grid.mOmitted = OmittedDegrees(fingering.mOmitted);
+    grid.mOmitted = OmittedDegrees(chord, fingering.mOmitted);
     grid.mDifficulty = fingering.mDifficulty;
     return grid;
 }
@@ -342,7 +344,7 @@ std::vector<CChordGrid> GridsForChord(const GChDatabase& database, std::string_v
     for (const CFoundGrid& found : LookUpChord(database, chord, tuning, options.mCapo)) {
         grids.push_back(GridOfChord(symbol, *GChChord::make(found.mGrid, 0), options.mCapo));
         grids.back().mChord = chord;
-        grids.back().mOmitted = OmittedDegrees(found.mOmitted);
+        grids.back().mOmitted = OmittedDegrees(chord, found.mOmitted);
     }
     return grids.empty() ? FoundGrids(symbol, chord, tuning, options) : grids;
 }

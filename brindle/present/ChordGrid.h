@@ -69,7 +69,7 @@ struct CFretWindow {
 /// "Eb4". Empty for a muted string.
 [[nodiscard]] std::string NoteText(const CChordGrid& grid, std::size_t string);
 
-/// What a string says at its fret: its note, "F#", or its degree above the root of the name, "b3".
+/// What a string says at its fret: its note, "F#", or its degree as its chord names it, "b3", "9".
 /// Empty for a muted string, for a finger, and for a degree without a root.
 [[nodiscard]] std::string DotText(const CChordGrid& grid, std::size_t string, TGridDots dots);
 

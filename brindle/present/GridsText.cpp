@@ -22,6 +22,16 @@ char MarkOf(const GChChordElem& elem) {
     return elem.fingerNumber() == 0 ? '*' : static_cast<char>('0' + elem.fingerNumber());
 }
 
+/// From a string to the next one, with room for what stands on them.
+std::size_t GapOfStrings(const CChordGrid& grid, TGridDots dots) {
+    if (dots == TGridDots::Fingers) return 2;
+    std::size_t longest = 2;
+    for (std::size_t i = 0; i < grid.mFrets.size(); ++i) {
+        longest = std::max(longest, DotText(grid, i, dots).size());
+    }
+    return longest + 1;
+}
+
 /// Draws the frets of one diagram. The lowest string stands on the left, or on the right for the
 /// left hand; strings stand as far apart as what is written on them asks for.
 class CTextGrid {
@@ -30,7 +40,7 @@ public:
         : mGrid(grid),
           mStyle(style),
           mStrings(grid.mFrets.size()),
-          mGap(style.mDots == TGridDots::Fingers ? 2 : 3) {}
+          mGap(GapOfStrings(grid, style.mDots)) {}
 
     [[nodiscard]] std::size_t Width() const { return mGap * (mStrings - 1) + 1; }
 

@@ -214,6 +214,9 @@ TEST_CASE("What a player minds lies behind what he does not") {
              {"G", "320003", "3x0003", "no string is muted inside"},
              {"B7", "x21202", "x2120x", "an open string need not be muted"},
              {"E6", "022120", "02212x", "nothing is muted"},
+             {"Cm13", "x33345", "111213", "a thirteenth stands on its root"},
+             {"C11", "x33333", "132333", "the eleventh rubs on the third"},
+             {"C7", "x32310", "012010", "a fifth is missed less than the root below"},
          }) {
         CFingeringOptions options;
         options.mLimit = 1000;

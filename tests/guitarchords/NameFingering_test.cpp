@@ -37,6 +37,14 @@ TEST_CASE("Fingerings of a guitar are named over the root that guitarists hear")
              {{x, 3, 2, 0, 1, 0}, "C"},
              {{x, 3, 2, 3, 1, 0}, "C7"},
              {{x, x, 0, 2, 3, 3}, "Dsus4"},
+             {{x, 0, 2, 4, 5, 3}, "Em/A"},
+             {{4, x, 3, 5, 4, 3}, "Fm9/Ab"},
+             {{x, 4, 4, 6, 4, 4}, "Dbsus24"},
+             {{8, x, 8, 9, 10, x}, "C13"},
+             {{x, 3, 2, 3, 3, 5}, "C13"},
+             {{x, 2, 0, 2, 0, 1}, "Bm7b5"},
+             {{x, 0, 2, 0, 3, 0}, "A7sus4"},
+             {{x, 0, 2, 2, 1, 3}, "Am7"},
              {{x, x, x, x, x, x}, ""},
          }) {
         CHECK(NameOf(row.mFrets, kGChStandardGuitar) == row.mSymbol);
@@ -49,6 +57,7 @@ TEST_CASE("The lowest note of a re-entrant tuning is no bass") {
     CHECK(NameOf({0, 0, 0, 0}, kUkulele) == "C6");  // as the tuning is called
     CHECK(NameOf({0, 0, 0, 3}, kUkulele) == "C");
     CHECK(NameOf({0, 2, 3, 2}, kUkulele) == "G");
+    CHECK(NameOf({2, 2, 1, 2}, kUkulele) == "Dm6");
 }
 
 TEST_CASE("The net doubts least the root of a triad, in all keys and inversions") {

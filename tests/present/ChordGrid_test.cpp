@@ -112,6 +112,37 @@ TEST_CASE("Notes are spelled by their chord, and their octave is that of their l
     }
 }
 
+TEST_CASE("Dots and omissions have the degrees of the chord's name") {
+    struct CCase {
+        const char* mSymbol;
+        std::vector<int> mFrets;
+        const char* mDegrees;
+    };
+    for (const auto& [symbol, frets, degrees] : std::vector<CCase>{
+             {"C13", {-1, 3, 2, 3, 3, 5}, " 1 3 b7 9 13"},
+             {"C6/9", {-1, 3, 2, 2, 3, 3}, " 1 3 6 9 5"},
+             {"Cadd9", {-1, 3, 2, 0, 3, 0}, " 1 3 5 9 3"},
+             {"Csus2", {-1, 3, 0, 0, 3, 3}, " 1 2 5 2 5"},
+             {"Cm11", {-1, 3, 1, 3, 1, 1}, " 1 b3 b7 1 11"},
+             {"E7#9", {0, 2, 0, 1, 3, 3}, " 1 5 b7 3 b7 #9"},
+             {"Cdim7", {-1, 3, 4, 2, 4, -1}, " 1 b5 bb7 b3"},
+             {"D/F#", {2, 0, 0, 2, 3, 2}, " 3 5 1 5 1 3"},
+             {"C/D", {-1, -1, 0, 0, 1, 0}, " 2 5 1 3"},
+         }) {
+        const auto held = FingeringOfFrets(frets, kGChStandardGuitar);
+        REQUIRE(held);
+        const CChordGrid grid = GridOfFingering(symbol, *held, ReadChordText(symbol).mChord);
+        std::string told;
+        for (std::size_t i = 0; i < frets.size(); ++i) {
+            const std::string dot = DotText(grid, i, TGridDots::Intervals);
+            if (!dot.empty()) told += " " + dot;
+        }
+        const std::string logged(symbol);
+        INFO(logged);
+        CHECK(told == degrees);
+    }
+}
+
 TEST_CASE("For the left hand the lowest string stands on the right") {
     CGridStyle left;
     left.mLeftHanded = true;

@@ -24,13 +24,20 @@ constexpr int kCostOfPosition = 55;    // each fret from the nut to the lowest f
 constexpr int kCostOfHighFret = 85;    // each fret beyond the third
 constexpr int kCostOfFarOpen = 280;    // each fret beyond the fourth above open strings
 constexpr int kCostOfOpenString = 40;  // it rings on when the hand moves
+constexpr int kCostOfAnyOpen = 10;     // the shape cannot be moved
 
 // Tones.
 constexpr int kCostOfOmittedTone = 230;
 constexpr int kCostOfOmittedRoot = 600;
-constexpr int kCostOfOtherBass = 380;
+constexpr int kCostOfOtherBass = 340;
 constexpr int kCostOfAnyBass = 200;      // where each tone may be the root
-constexpr int kCostOfDoubledTone = 120;  // that is no root, third or fifth
+constexpr int kCostOfDoubledTone = 125;  // that is no root, third or fifth
+// Elevenths and thirteenths have nearly a whole scale, more than a hand holds, and are told apart
+// only by their bass; the eleventh rubs on a major third.
+constexpr int kTonesOfScale = 6;
+constexpr int kCostOfTonesOutOfScale = 60;
+constexpr int kCostOfOtherBassOfScale = 900;
+constexpr int kCostOfRubbingEleventh = 300;
 constexpr int kCostOfDoubledBass = 150;  // that is foreign to its chord, beside that
 
 // Strings that do not sound.
@@ -48,6 +55,7 @@ constexpr int kCostOfMutedBass = 160;    // it is the bass
 
 constexpr int kMinorThird = 3;
 constexpr int kMajorThird = 4;
+constexpr int kEleventh = 5;
 constexpr int kPerfectFifth = 7;
 
 CShapeCounts CountsOf(std::span<const std::int8_t> frets) {
@@ -123,12 +131,25 @@ int CostOfDoubledTones(const CFingering& fingering, const CFingeringTask& task) 
     return cost;
 }
 
-int CostOfTones(const CFingering& fingering, const CFingeringTask& task) {
-    int cost = kCostOfOmittedTone * fingering.mOmitted.size();
-    if (fingering.mOmitted.HasIntvl(0)) cost += kCostOfOmittedRoot - kCostOfOmittedTone;
-    if (!task.mBassCounts || fingering.mBassIsLowest) return cost;
+int CostOfOtherBass(const CFingeringTask& task) {
+    if (task.mSemitones.size() >= kTonesOfScale) return kCostOfOtherBassOfScale;
     const bool isAnyBass = task.mBass == task.mRoot && task.mIsSymmetric;
-    return cost + (isAnyBass ? kCostOfAnyBass : kCostOfOtherBass);
+    return isAnyBass ? kCostOfAnyBass : kCostOfOtherBass;
+}
+
+int CostOfOmissions(const CFingering& fingering, const CFingeringTask& task) {
+    const bool isRootOut = fingering.mOmitted.HasIntvl(0);
+    const int others = fingering.mOmitted.size() - (isRootOut ? 1 : 0);
+    const int cost = isRootOut ? kCostOfOmittedRoot : 0;
+    if (task.mSemitones.size() < kTonesOfScale) return cost + kCostOfOmittedTone * others;
+    const bool isRubbing =
+        task.mSemitones.HasIntvl(kMajorThird) && !fingering.mOmitted.HasIntvl(kEleventh);
+    return cost + kCostOfTonesOutOfScale * others + (isRubbing ? kCostOfRubbingEleventh : 0);
+}
+
+int CostOfTones(const CFingering& fingering, const CFingeringTask& task) {
+    const bool isOverBass = !task.mBassCounts || fingering.mBassIsLowest;
+    return CostOfOmissions(fingering, task) + (isOverBass ? 0 : CostOfOtherBass(task));
 }
 
 }  // namespace
@@ -139,8 +160,8 @@ int LeastCostOf(const CShapeCounts& shape) {
                kCostOfFinger * shape.mFingers + kCostOfSilentBass * shape.mSilentBass +
                kCostOfThinChord * std::max(0, shape.mSilentBass - 2) +
                kCostOfSilentInside * shape.mSilentInside;
-    if (shape.mOpen > 0) cost += kCostOfFarOpen * std::max(0, shape.mHighest - 4);
-    return cost;
+    if (shape.mOpen == 0) return cost;
+    return cost + kCostOfAnyOpen + kCostOfFarOpen * std::max(0, shape.mHighest - 4);
 }
 
 int CostOfSoundAndPlace(const CFingering& fingering, const CFingeringTask& task) {
