@@ -19,8 +19,9 @@ constexpr int kUpTheNeck = 7;
 constexpr int kFewestSounding = 3;
 // A guitar needs some thousands in a position; 12 strings have millions of ways.
 constexpr int kMostStepsInPosition = 40'000;
-// The best of those that were found are kept at times rather than after each.
-constexpr std::size_t kFewestKept = 64;
+// The best of those that were found are kept each time a quarter more has come. What is worse is
+// left early then, so few wanted ones are found soon.
+constexpr std::size_t kFewestKept = 16;
 
 /// What can be done with a string in a position: at most each fret under the hand, open, muted.
 struct CStringWays {
@@ -138,9 +139,9 @@ private:
     [[nodiscard]] bool CanBecomeChord(const CShapeState& state, int stringsLeft) const {
         return state.mCounts.mFingers <= kHandFingers &&
                state.mCounts.mSilentInside <= mTask.mOptions.mMostInnerMutes &&
-               LeastCostOf(state.mCounts) <= mWorstCost &&
                state.mSounding + stringsLeft >= mFewestSounding &&
-               std::popcount(mTask.mNeededKeys & ~state.mKeys) <= stringsLeft;
+               std::popcount(mTask.mNeededKeys & ~state.mKeys) <= stringsLeft &&
+               LeastCostOf(state.mCounts) <= mWorstCost;
     }
 
     void Keep(const CShapeState& state) {
@@ -162,7 +163,7 @@ private:
         fingering.mFingerCount = hand->mCount;
         fingering.mDifficulty = DifficultyOf(*hand);
         mFound.push_back(fingering);
-        if (mFound.size() == 2 * mKept) KeepBest();
+        if (mFound.size() == mKept + mKept / 4) KeepBest();
     }
 
     /// False when the lowest note or a pitch is not what it has to be.
