@@ -18,7 +18,8 @@ constexpr std::size_t kGridsPerLine = 6;
 constexpr double kNameSize = 15.0;
 constexpr double kSizeOfLabels = 10.0;
 constexpr double kDotTextSize = 8.0;  // of two letters on a dot
-constexpr double kLabelRoom = 26.0;   // left of the strings, for the number of the first fret
+constexpr double kDotLetters = 2.0;
+constexpr double kLabelRoom = 26.0;  // left of the strings, for the number of the first fret
 
 constexpr std::string_view kWire = "#999999";
 constexpr std::string_view kPaper = "#ffffff";
@@ -110,11 +111,18 @@ private:
         if (SaysMore()) {
             for (std::size_t i = first; i <= last; ++i) {
                 const bool sounds = mGrid.mFrets[i] == elem.absFretIndex() + 1;
-                if (sounds) Say(elem, i, y, DotText(mGrid, i, mStyle.mDots), kDotTextSize);
+                if (sounds) SayTone(elem, i, y);
             }
         } else if (elem.fingerNumber() > 0 && mStringGap >= kGridStringGap) {
             Say(elem, first, y, fmt::format("{}", elem.fingerNumber()), kSizeOfLabels);
         }
+    }
+
+    /// A third letter makes all of them smaller.
+    void SayTone(const GChChordElem& elem, std::size_t string, double y) {
+        const std::string text = DotText(mGrid, string, mStyle.mDots);
+        const double letters = std::max(kDotLetters, static_cast<double>(text.size()));
+        Say(elem, string, y, text, kDotTextSize * kDotLetters / letters);
     }
 
     void Say(const GChChordElem& elem, std::size_t string, double y, std::string_view text,

@@ -143,6 +143,19 @@ TEST_CASE("Dots and omissions have the degrees of the chord's name") {
     }
 }
 
+TEST_CASE("Degrees of three letters have room") {
+    const std::vector<int> frets{-1, 3, 4, 2, 0, 0};
+    const auto held = FingeringOfFrets(frets, kGChStandardGuitar);
+    REQUIRE(held);
+    const CGridStyle style{.mDots = TGridDots::Intervals};
+    const std::vector grids{GridOfFingering("Cmaj13#11", *held, ReadChordText("Cmaj13#11").mChord)};
+    const std::string text = GridsText(grids, CPaint(false), style);
+    CHECK(text.find("|   |   #11 |") != std::string::npos);
+    const std::string svg = GridsSvg(grids, "C", style);
+    CHECK(svg.find("font-size=\"5.3") != std::string::npos);
+    CHECK(svg.find("font-size=\"8\" ") != std::string::npos);
+}
+
 TEST_CASE("For the left hand the lowest string stands on the right") {
     CGridStyle left;
     left.mLeftHanded = true;
