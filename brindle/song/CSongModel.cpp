@@ -12,6 +12,30 @@ std::int32_t TickInBar(std::int32_t tick) {
     return ((tick % kTicksPerBar) + kTicksPerBar) % kTicksPerBar;
 }
 
+/// A chord of a song at a place of the bar.
+struct CHeard {
+    std::int32_t mId;
+    std::int32_t mSong;
+    TBarPlace mBarPlace;
+};
+
+/// Adds up what was heard, song by song, in ascending order of chords.
+template <typename TSharesOf>
+void ShareHeard(std::vector<CHeard>& heard, const TSharesOf& sharesOf) {
+    const auto songOf = [](const CHeard& chord) { return std::pair(chord.mId, chord.mSong); };
+    std::sort(heard.begin(), heard.end(),
+              [&](const CHeard& a, const CHeard& b) { return songOf(a) < songOf(b); });
+    for (std::size_t begin = 0; begin < heard.size();) {
+        std::array<std::uint32_t, kBarPlaceCount> times{};
+        std::size_t end = begin;
+        for (; end < heard.size() && songOf(heard[end]) == songOf(heard[begin]); ++end) {
+            ++times[heard[end].mBarPlace];
+        }
+        sharesOf(heard[begin].mId).AddSong(times);
+        begin = end;
+    }
+}
+
 }  // namespace
 
 TBarPlace BarPlaceOf(std::int32_t tick) {
@@ -22,11 +46,20 @@ TBarPlace BarPlaceOf(std::int32_t tick) {
     return static_cast<TBarPlace>(((bar % 4) + 4) % 4);
 }
 
+void CSongShares::AddSong(const std::array<std::uint32_t, kBarPlaceCount>& times) {
+    for (std::size_t place = 0; place < kBarPlaceCount; ++place) {
+        mAt[place] += std::sqrt(static_cast<float>(times[place]));
+    }
+    const std::uint32_t all = std::accumulate(times.begin(), times.end(), 0U);
+    mAll += std::sqrt(static_cast<float>(all));
+}
+
 CSongModel::CSongModel(std::vector<CTaughtSong> songs) : mSongs(std::move(songs)) {
     std::erase_if(mSongs, [](const CTaughtSong& song) { return song.mChords.empty(); });
     for (std::size_t index = 0; index < mSongs.size(); ++index) AddSong(index);
     SortHistories();
     CountPlaces();
+    ShareTriples();
     CountSuccessors();
     CountLengths();
     CountKinds();
@@ -88,12 +121,9 @@ void CSongModel::SortHistories() {
 }
 
 void CSongModel::CountPlaces() {
-    mPlaceCounts.resize(mVocabulary.size());
     mChordBegins.assign(mVocabulary.size() + 1, 0);
     for (const CPlace& place : mPlaces) {
-        if (place.mId < 0) continue;
-        ++mPlaceCounts[static_cast<std::size_t>(place.mId)][place.mBarPlace];
-        ++mChordBegins[static_cast<std::size_t>(place.mId) + 1];
+        if (place.mId >= 0) ++mChordBegins[static_cast<std::size_t>(place.mId) + 1];
     }
     std::partial_sum(mChordBegins.begin(), mChordBegins.end(), mChordBegins.begin());
     mByChord.resize(mByHistory.size());
@@ -113,29 +143,57 @@ void CSongModel::CountPlaces() {
     }
 }
 
+void CSongModel::ShareTriples() {
+    mTripleShares.resize(mPlaces.size());
+    using TTriple = std::array<std::int32_t, 3>;
+    const auto tripleAt = [this](std::size_t place) {
+        return TTriple{IdAhead(place, 2), IdAhead(place, 1), mPlaces[place].mId};
+    };
+    std::vector<TTriple> triples;
+    for (std::size_t begin = 0; begin < mPlaces.size();) {
+        // What stands before the song, and its chords.
+        const std::size_t end =
+            begin + 1 + mSongs[static_cast<std::size_t>(mPlaces[begin].mSong)].mChords.size();
+        triples.clear();
+        for (std::size_t place = begin; place < end; ++place) triples.push_back(tripleAt(place));
+        std::sort(triples.begin(), triples.end());
+        for (std::size_t place = begin; place < end; ++place) {
+            const auto [first, last] =
+                std::equal_range(triples.begin(), triples.end(), tripleAt(place));
+            mTripleShares[place] = 1.0F / std::sqrt(static_cast<float>(last - first));
+        }
+        begin = end;
+    }
+}
+
 void CSongModel::CountSuccessors() {
+    mChordShares.resize(mVocabulary.size());
     mSuccessorBegins.assign(1, 0);
-    std::vector<std::uint64_t> followers;
+    std::vector<CHeard> heard;
+    const auto hear = [&](std::uint32_t place) {
+        const CPlace& at = mPlaces[place];
+        heard.push_back({at.mId, at.mSong, at.mBarPlace});
+    };
     const auto count = static_cast<std::int32_t>(mVocabulary.size());
     // In the order of SuccessorsOf: both starts, then the chords.
     for (std::int32_t id = -3; id < count; ++id) {
         if (id == -1) continue;
         const CRange range = Narrowed({0, mByHistory.size()}, id, 1);
-        followers.clear();
-        for (std::size_t ix = range.mBegin; ix < range.mEnd; ++ix) {
-            const CPlace& place = mPlaces[mByHistory[ix]];
-            followers.push_back(static_cast<std::uint64_t>(place.mId) << 8U | place.mBarPlace);
-        }
-        std::sort(followers.begin(), followers.end());
-        for (std::size_t ix = 0; ix < followers.size(); ++ix) {
-            const bool isNew = ix == 0 || followers[ix] >> 8U != followers[ix - 1] >> 8U;
-            if (isNew)
-                mSuccessors.push_back({static_cast<std::int32_t>(followers[ix] >> 8U), 0, {}});
-            ++mSuccessors.back().mCount;
-            ++mSuccessors.back().mCountsAt[followers[ix] & 0xFFU];
-        }
+        heard.clear();
+        for (std::size_t ix = range.mBegin; ix < range.mEnd; ++ix) hear(mByHistory[ix]);
+        ShareHeard(heard, [&](std::int32_t next) -> CSongShares& {
+            const bool isNew =
+                mSuccessors.size() == mSuccessorBegins.back() || mSuccessors.back().mId != next;
+            if (isNew) mSuccessors.push_back({next, {}});
+            return mSuccessors.back().mShares;
+        });
         mSuccessorBegins.push_back(mSuccessors.size());
     }
+    heard.clear();
+    for (const std::uint32_t place : mByChord) hear(place);
+    ShareHeard(heard, [&](std::int32_t id) -> CSongShares& {
+        return mChordShares[static_cast<std::size_t>(id)];
+    });
 }
 
 void CSongModel::CountLengths() {

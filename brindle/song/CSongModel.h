@@ -28,6 +28,17 @@ inline constexpr std::size_t kBarPlaceCount = 6;  ///< as many as TBarPlace has
 /// Of a tick from the first bar line, kTicksPerBar to the bar; negative in an upbeat.
 [[nodiscard]] TBarPlace BarPlaceOf(std::int32_t tick);
 
+/// How much something was heard, all in all and by its TBarPlace. Each song adds the square root of
+/// how often it plays it: songs repeat themselves, so that a passage that one of them plays eight
+/// times says less about other songs than one that eight of them play.
+struct CSongShares {
+    float mAll = 0.0F;                        ///< at any place of the bar
+    std::array<float, kBarPlaceCount> mAt{};  ///< the same by its TBarPlace
+
+    /// Adds a song that plays it so often at each place.
+    void AddSong(const std::array<std::uint32_t, kBarPlaceCount>& times);
+};
+
 /// Which lengths followed at a place of the bar, and how often; in ticks.
 using CLengthCounts = std::vector<std::pair<std::int32_t, std::uint32_t>>;
 
@@ -35,8 +46,9 @@ using CLengthCounts = std::vector<std::pair<std::int32_t, std::uint32_t>>;
 /// of songs end. A value; it keeps the songs, so that a file of it is a list of songs.
 ///
 /// A chord is predicted by interpolation: from how common chords are up to the longest history that
-/// was heard, each level gives a part of each count to the level below (absolute discounting). What
-/// is common and the histories of one and two chords count once more with the place in the bar.
+/// was heard, each level leaves the more to the level below, the more different chords followed
+/// (Witten and Bell's method); what was heard counts as CSongShares tells. What is common and the
+/// histories of one and two chords count once more with the place in the bar.
 /// Histories are looked up in an array of all places in the songs, sorted by what stands before
 /// them: building takes n log n, a query a few binary searches and as many steps as the history of
 /// two chords was heard.
@@ -84,11 +96,10 @@ public:
                                        std::span<const std::int32_t> history, TBarPlace place,
                                        std::size_t order) const;
 
-    /// How often each chord came behind a chord; the chords in ascending order.
+    /// A chord that came behind another; successors stand in ascending order of chords.
     struct CSuccessor {
-        std::int32_t mId;                                     ///< of the second chord
-        std::uint32_t mCount;                                 ///< how often it came
-        std::array<std::uint32_t, kBarPlaceCount> mCountsAt;  ///< the same by its TBarPlace
+        std::int32_t mId;     ///< of the second chord
+        CSongShares mShares;  ///< how much it came
     };
     /// What followed a chord or a StartId, by number.
     [[nodiscard]] std::span<const CSuccessor> SuccessorsOf(std::int32_t id) const;
@@ -122,6 +133,7 @@ private:
     void AddSong(std::size_t index);
     void SortHistories();
     void CountPlaces();
+    void ShareTriples();
     void CountSuccessors();
     void CountLengths();
     void CountKinds();
@@ -142,7 +154,10 @@ private:
     std::vector<CSuccessor> mSuccessors;
     /// For each chord and both starts.
     std::vector<std::size_t> mSuccessorBegins;
-    std::vector<std::array<std::uint32_t, kBarPlaceCount>> mPlaceCounts;
+    /// Of each chord.
+    std::vector<CSongShares> mChordShares;
+    /// Of each place what its chord, behind the two before it, adds to the share of its song.
+    std::vector<float> mTripleShares;
     /// What Predict gives without a history, for each place in the bar.
     std::array<std::vector<double>, kBarPlaceCount> mAlone;
     std::vector<std::uint32_t> mEndCounts;

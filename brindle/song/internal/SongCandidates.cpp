@@ -82,9 +82,9 @@ void CSongCandidates::AddSteps(const CSongModel& model) {
         double total = 0.0;
         std::array<double, kBarPlaceCount> totals{};
         for (const CSongModel::CSuccessor& successor : successors) {
-            total += successor.mCount;
+            total += successor.mShares.mAll;
             for (std::size_t place = 0; place < kBarPlaceCount; ++place) {
-                totals[place] += successor.mCountsAt[place];
+                totals[place] += successor.mShares.mAt[place];
             }
         }
         for (const CSongModel::CSuccessor& successor : successors) {
@@ -93,9 +93,9 @@ void CSongCandidates::AddSteps(const CSongModel& model) {
             CStep step{static_cast<std::size_t>(to), {}};
             for (std::size_t place = 0; place < kBarPlaceCount; ++place) {
                 const double atPlace =
-                    totals[place] > 0.0 ? successor.mCountsAt[place] / totals[place] : 0.0;
+                    totals[place] > 0.0 ? successor.mShares.mAt[place] / totals[place] : 0.0;
                 step.mWeights[place] =
-                    static_cast<float>(0.5 * successor.mCount / total + 0.5 * atPlace);
+                    static_cast<float>(0.5 * successor.mShares.mAll / total + 0.5 * atPlace);
             }
             mSteps[index].push_back(step);
         }
