@@ -50,7 +50,7 @@ constexpr CCommandHelp kAnalyseHelp{
     "through its repeats, endings and jumps.\n",
 };
 
-constexpr int kLastCapo = 12;
+constexpr int kHighestCapo = 12;
 
 struct CAnalyseOptions {
     CTypedSongs mSongs;
@@ -195,6 +195,9 @@ std::string Present(const CAnalysedSong& analysed, const CAnalyseOptions& option
         case TFormat::Svg: {
             CShownSong song = SongOf(analysed, options);
             song.mCopies = MakeSongCopies(analysed.mAnalyse, *analysed.mSymbols);
+            if (!analysed.mSong.mChords.empty()) {
+                song.mKeys = MakeSongKeys(analysed.mSong, analysed.mReading);
+            }
             return Picture(analysed, song, options);
         }
         case TFormat::Text:
@@ -331,7 +334,7 @@ void AddAnalyse(CCommand& program) {
                     "Draw a guitar fingering under each chord of the picture");
     command
         .AddOption("--capo", "N", options->mCapo, "Fret of a capodaster for --grids (default: 0)")
-        .InRange(0, kLastCapo);
+        .InRange(0, kHighestCapo);
     command.AddFlag("--left", options->mIsLeftHanded, "Draw the grids for the left hand");
     options->mSheetPicture.AddTo(command);
     options->mFormat.AddTo(command, {"text", "json", "native", "svg"});

@@ -24,6 +24,8 @@ std::optional<std::string> CSheetPicture::Contradiction() const {
     if (!(mOptions.mWidth >= 200.0 && mOptions.mWidth <= 4000.0)) {
         return "--width takes 200 to 4000 pixels";
     }
+    const bool hasPaper = mPage != "endless" || mTheme != "auto";
+    if (IsAxis() && hasPaper) return "--page and --theme are for the lead sheet, --picture sheet";
     return std::nullopt;
 }
 
