@@ -78,6 +78,11 @@ TAnalyse RouteOf(const std::string& name) {
     return name == "weights" ? TAnalyse_CenterWeights : TAnalyse_None;
 }
 
+// Readings and grids are drawn over the time axis alone.
+bool IsSheetWanted(const CAnalyseOptions& options) {
+    return !options.mSheetPicture.IsAxis() && !options.mReadings && !options.mGrids;
+}
+
 // What is wrong with options that are fine one by one.
 std::optional<std::string> Contradiction(const CAnalyseOptions& options) {
     if (auto songs = options.mSongs.Contradiction(options.mFormat.Format())) return songs;
@@ -98,7 +103,7 @@ std::optional<std::string> Contradiction(const CAnalyseOptions& options) {
     if ((options.mCapo > 0 || options.mIsLeftHanded) && !options.mGrids) {
         return "--capo and --left are for --grids";
     }
-    return options.mSheetPicture.Contradiction();
+    return options.mSheetPicture.Contradiction(!IsSheetWanted(options));
 }
 
 /// A song that has been analysed, and what its presentations need beside that.
@@ -151,10 +156,8 @@ std::string Picture(const CAnalysedSong& analysed, const CShownSong& song,
     return AnalysisSvg(song, &grids, {.mLeftHanded = options.mIsLeftHanded});
 }
 
-// Readings and grids are drawn over the time axis alone.
 bool IsLeadSheet(const CAnalyseOptions& options) {
-    return options.mFormat.Format() == TFormat::Svg && !options.mSheetPicture.IsAxis() &&
-           !options.mReadings && !options.mGrids;
+    return options.mFormat.Format() == TFormat::Svg && IsSheetWanted(options);
 }
 
 /// Another route than the usual one is asked for to see its centers.

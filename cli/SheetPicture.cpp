@@ -17,7 +17,7 @@ void CSheetPicture::AddTo(CCommand& command) {
                       "Colors of the lead sheet; auto are those that the viewer prefers");
 }
 
-std::optional<std::string> CSheetPicture::Contradiction() const {
+std::optional<std::string> CSheetPicture::Contradiction(bool isAxis) const {
     if (mOptions.mBarsPerLine < 1 || mOptions.mBarsPerLine > 16) {
         return "--bars-per-line takes 1 to 16 bars";
     }
@@ -25,7 +25,9 @@ std::optional<std::string> CSheetPicture::Contradiction() const {
         return "--width takes 200 to 4000 pixels";
     }
     const bool hasPaper = mPage != "endless" || mTheme != "auto";
-    if (IsAxis() && hasPaper) return "--page and --theme are for the lead sheet, --picture sheet";
+    if (isAxis && hasPaper) {
+        return "--page and --theme are for the lead sheet, not for the time axis";
+    }
     return std::nullopt;
 }
 

@@ -225,7 +225,7 @@ private:
 
     void Draw(const CShownCenter& center) {
         Band(center.mRange, kCenterTop, kBandHeight, ColorOf(center.mHarmCenter, Shade_Center),
-             center.mName, {.mSize = kLabelSize, .mColor = kInk, .mBold = true});
+             "Center " + center.mName, {.mSize = kLabelSize, .mColor = kInk, .mBold = true});
         const std::string color = ColorOf(center.mHarmCenter, Shade_Chord);
         for (const CShownChord& chord : center.mChords) Draw(chord, color);
     }

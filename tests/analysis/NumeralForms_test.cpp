@@ -323,7 +323,7 @@ TEST_CASE("A fault tells what is wrong and where") {
         {"V7/x", noTarget, 3},
         {"V/Vx", noSign, 2},
         {"V[no3][ad4]", noGroup, 7},
-        {"V[add4][addd4]/V", noGroup, 12},
+        {"V[add4][addd4]/V", noGroup, 11},
         {"V[add44]", noGroup, 5},
         {"V[omit3][add]", noGroup, 12},
         {"V[no3", noGroup, 1},

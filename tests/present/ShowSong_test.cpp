@@ -5,6 +5,7 @@
 #include "brindle/platform/XmlDocument.h"
 #include "brindle/present/AnalysisSvg.h"
 #include "brindle/present/KeysSvg.h"
+#include "brindle/present/MakeSongKeys.h"
 #include "brindle/song/AnalyseSong.h"
 #include "brindle/song/ReadSong.h"
 #include "brindle/song/SheetTimes.h"

@@ -94,7 +94,7 @@ private:
         const bool isSubstitute = At(dominant).mRelation == TChordRelation_SubstituteDominant;
         std::string text = isSubstitute ? "ii subV" : "ii V";
         std::ptrdiff_t last = dominant;
-        const std::ptrdiff_t goal = At(dominant).mResolvesTo;
+        const std::ptrdiff_t goal = GoalOf(dominant);
         const bool arrives = goal >= 0 && !IsDominant(At(goal)) &&
                              mAround.Root(goal) == FoldIntoOctave(key.mRootKeyEnh.mKeyNr) &&
                              IsOneCadence(dominant, goal);
@@ -103,6 +103,18 @@ private:
             last = goal;
         }
         Note(text + " of " + key.NameLong(NamePrefs()), ix, static_cast<std::size_t>(last));
+    }
+
+    // Behind the other forms of the dominant: of G7sus4 in G7sus4 G7 C that is C.
+    [[nodiscard]] std::ptrdiff_t GoalOf(std::ptrdiff_t dominant) const {
+        std::ptrdiff_t goal = At(dominant).mResolvesTo;
+        for (std::size_t count = 0; count < kMostDelays; ++count) {
+            const bool isForm =
+                goal >= 0 && IsDominant(At(goal)) && At(goal).mServes == At(dominant).mServes;
+            if (!isForm) break;
+            goal = At(goal).mResolvesTo;
+        }
+        return goal;
     }
 
     // Whether all between a dominant and its goal is more of the same: Dm7 G7 or G7sus4. A tonic
