@@ -50,7 +50,7 @@ constexpr CCommandHelp kAnalyseHelp{
     "through its repeats, endings and jumps.\n",
 };
 
-constexpr int kLastCapo = 12;
+constexpr int kHighestCapo = 12;
 
 struct CAnalyseOptions {
     CTypedSongs mSongs;
@@ -78,6 +78,11 @@ TAnalyse RouteOf(const std::string& name) {
     return name == "weights" ? TAnalyse_CenterWeights : TAnalyse_None;
 }
 
+// Readings and grids are drawn over the time axis alone.
+bool IsSheetWanted(const CAnalyseOptions& options) {
+    return !options.mSheetPicture.IsAxis() && !options.mReadings && !options.mGrids;
+}
+
 // What is wrong with options that are fine one by one.
 std::optional<std::string> Contradiction(const CAnalyseOptions& options) {
     if (auto songs = options.mSongs.Contradiction(options.mFormat.Format())) return songs;
@@ -98,7 +103,7 @@ std::optional<std::string> Contradiction(const CAnalyseOptions& options) {
     if ((options.mCapo > 0 || options.mIsLeftHanded) && !options.mGrids) {
         return "--capo and --left are for --grids";
     }
-    return options.mSheetPicture.Contradiction();
+    return options.mSheetPicture.Contradiction(!IsSheetWanted(options));
 }
 
 /// A song that has been analysed, and what its presentations need beside that.
@@ -151,10 +156,8 @@ std::string Picture(const CAnalysedSong& analysed, const CShownSong& song,
     return AnalysisSvg(song, &grids, {.mLeftHanded = options.mIsLeftHanded});
 }
 
-// Readings and grids are drawn over the time axis alone.
 bool IsLeadSheet(const CAnalyseOptions& options) {
-    return options.mFormat.Format() == TFormat::Svg && !options.mSheetPicture.IsAxis() &&
-           !options.mReadings && !options.mGrids;
+    return options.mFormat.Format() == TFormat::Svg && IsSheetWanted(options);
 }
 
 /// Another route than the usual one is asked for to see its centers.
@@ -195,6 +198,9 @@ std::string Present(const CAnalysedSong& analysed, const CAnalyseOptions& option
         case TFormat::Svg: {
             CShownSong song = SongOf(analysed, options);
             song.mCopies = MakeSongCopies(analysed.mAnalyse, *analysed.mSymbols);
+            if (!analysed.mSong.mChords.empty()) {
+                song.mKeys = MakeSongKeys(analysed.mSong, analysed.mReading);
+            }
             return Picture(analysed, song, options);
         }
         case TFormat::Text:
@@ -331,7 +337,7 @@ void AddAnalyse(CCommand& program) {
                     "Draw a guitar fingering under each chord of the picture");
     command
         .AddOption("--capo", "N", options->mCapo, "Fret of a capodaster for --grids (default: 0)")
-        .InRange(0, kLastCapo);
+        .InRange(0, kHighestCapo);
     command.AddFlag("--left", options->mIsLeftHanded, "Draw the grids for the left hand");
     options->mSheetPicture.AddTo(command);
     options->mFormat.AddTo(command, {"text", "json", "native", "svg"});

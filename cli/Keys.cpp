@@ -106,12 +106,16 @@ std::optional<CSongWithKeys> SongOfScore(const CTypedSong& typed, const CKeysOpt
 std::string Present(const CSongWithKeys& song, const CSongReading& reading,
                     const CKeysOptions& options) {
     const TFormat format = options.mFormat.Format();
-    if (format == TFormat::Svg) return KeysSvg(song.mShown);
     const CReadSong read{song.mSong, reading};
     if (format == TFormat::Json) return KeysJson(song.mShown.mKeys, &read);
     // The numerals of a reading are those of theory text. Others are asked for by options.
-    return RegionsText(song.mSong, WithNumerals(reading, song.mSong.mChords, options.mNumerals),
-                       {.mWidth = WidthOfOutput()}, PaintOfOutput());
+    const CSongReading styled = WithNumerals(reading, song.mSong.mChords, options.mNumerals);
+    if (format == TFormat::Svg) {
+        CShownSong shown = song.mShown;
+        shown.mKeys = MakeSongKeys(song.mSong, styled);
+        return KeysSvg(shown);
+    }
+    return RegionsText(song.mSong, styled, {.mWidth = WidthOfOutput()}, PaintOfOutput());
 }
 
 TSongOutput KeysOf(const CTypedSong& typed, const CReadingOptions& readingOptions,

@@ -17,12 +17,16 @@ void CSheetPicture::AddTo(CCommand& command) {
                       "Colors of the lead sheet; auto are those that the viewer prefers");
 }
 
-std::optional<std::string> CSheetPicture::Contradiction() const {
+std::optional<std::string> CSheetPicture::Contradiction(bool isAxis) const {
     if (mOptions.mBarsPerLine < 1 || mOptions.mBarsPerLine > 16) {
         return "--bars-per-line takes 1 to 16 bars";
     }
     if (!(mOptions.mWidth >= 200.0 && mOptions.mWidth <= 4000.0)) {
         return "--width takes 200 to 4000 pixels";
+    }
+    const bool hasPaper = mPage != "endless" || mTheme != "auto";
+    if (isAxis && hasPaper) {
+        return "--page and --theme are for the lead sheet, not for the time axis";
     }
     return std::nullopt;
 }

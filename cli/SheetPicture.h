@@ -21,8 +21,8 @@ class CSheetPicture {
 public:
     void AddTo(CCommand& command);
 
-    /// What is wrong with the options.
-    [[nodiscard]] std::optional<std::string> Contradiction() const;
+    /// What is wrong with the options; `isAxis` where the time axis is drawn for whatever reason.
+    [[nodiscard]] std::optional<std::string> Contradiction(bool isAxis) const;
 
     /// Whether the time axis with the centers is wanted instead.
     [[nodiscard]] bool IsAxis() const { return mPicture == "axis"; }

@@ -167,8 +167,9 @@ CChordOfNumeral Failed(std::string_view fault, std::string_view piece) {
 bool ApplyGroups(const CFoldedNumeral& text, const CNumeralRoot& root, CReadTones& tones,
                  CChordOfNumeral& chord) {
     for (std::size_t i = 0; i < text.GroupCount(); ++i) {
-        if (ApplyGroup(text.Group(i), root, tones)) continue;
-        chord = Failed(kNoGroup, text.Group(i));
+        std::string_view group = text.Group(i);
+        if (ApplyGroup(group, root, tones)) continue;
+        chord = Failed(kNoGroup, group);
         return false;
     }
     return true;
@@ -362,8 +363,7 @@ CNumeralReading ReadNumeral(std::string_view typed, const CSignKeyLite& key,
         return {CChordLite_Undef, kNoDegree, 0};
     if (typed.size() > CFoldedNumeral::kLongest) return {CChordLite_Undef, kTooLong, 0};
     const CFoldedNumeral text(typed);
-    if (!text.IsWhole())
-        return {CChordLite_Undef, kNoGroup, std::min(typed.find('['), typed.size())};
+    if (!text.IsWhole()) return {CChordLite_Undef, kNoGroup, text.OffsetOfWrongBracket()};
     const CNumeralPieces pieces = PiecesOf(text.Text());
     if (!pieces.mFault.empty()) return Fault(pieces.mFault, pieces.mFaultPiece, text);
     CSignKeyLite keyOfTarget = key;

@@ -37,6 +37,7 @@ std::vector<TSeventhSpelling> SeventhsOf(const CHarmAnlsChords& chords,
                                          std::span<const TSeventhSpelling> stated) {
     std::vector<TSeventhSpelling> sevenths(heard.size(), TSeventhSpelling_Undef);
     for (std::size_t i = 0; i < heard.size(); ++i) {
+        if (stated.empty() && !heard[i].mHasBass) continue;
         const std::size_t end = EndOf(heard, i, chords.size());
         for (std::size_t ix = heard[i].mBegin; ix < end; ++ix) {
             sevenths[i] = ix < stated.size() ? stated[ix] : TSeventhSpelling_Undef;
@@ -53,21 +54,17 @@ std::vector<TSeventhSpelling> SeventhsOf(const CHarmAnlsChords& chords,
 std::vector<CChordReading> ReadChords(std::size_t count, std::span<const CKeyChord> heard,
                                       const CSongKeys& keys, const CKeySpeller& speller,
                                       std::span<const TSeventhSpelling> sevenths) {
-    const std::vector<std::ptrdiff_t> under = HarmonyChain(heard, keys.mKinds, keys.mTraits.mHome);
+    std::vector<std::ptrdiff_t> targets = HarmonyChain(heard, keys.mKinds, keys.mTraits.mHome);
     std::vector<CChordReading> readings(count);
-    for (std::size_t i = 0; i < heard.size(); ++i) {
-        CChordReading& reading = readings[heard[i].mBegin];
-        reading.mKey = speller.SignKeyOf(keys.mKeys[i]);
-        reading.mUnder = under[i];
-        reading.mResolvesTo = under[i];
-    }
-    NameHarmonies({heard, keys.mKeys, sevenths, keys.mTraits, readings});
+    NameHarmonies({heard, keys.mKeys, sevenths, keys.mTraits, speller, targets, readings});
     return readings;
 }
 
 // Gives chords that are written again the same reading.
 void Spread(const CHarmAnlsChords& chords, std::span<const CKeyChord> heard,
             std::vector<CChordReading>& readings) {
+    const std::size_t written = chords.size() - (chords.back().IsUndef() ? 1 : 0);
+    if (heard.size() == written) return;
     for (std::size_t i = 0; i < heard.size(); ++i) {
         const std::size_t end = EndOf(heard, i, chords.size());
         for (std::size_t ix = heard[i].mBegin + 1; ix < end; ++ix) {

@@ -100,13 +100,13 @@ struct CChordReading {
     /// The degree that it prepares or stands for: I for G7 in C major, ii for A7 before Dm. A
     /// related second serves what its dominant serves, in the key of that.
     CServedDegree mServes;
+    /// A dominant of the tonic that is followed by vi or VI instead.
+    bool mDeceptive = false;
     /// The chord that it leads to.
     std::ptrdiff_t mResolvesTo = -1;
     /// The later chord that it stands under in the tree of the song; -1 for a chord that prepares
     /// nothing. The arcs of two chords never cross.
     std::ptrdiff_t mUnder = -1;
-    /// A dominant of the tonic that is followed by vi or VI instead.
-    bool mDeceptive = false;
 
     friend bool operator==(const CChordReading&, const CChordReading&) = default;
 };

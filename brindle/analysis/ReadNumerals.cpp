@@ -10,6 +10,13 @@
 #include <algorithm>
 
 namespace brindle {
+namespace {
+
+bool IsWordOfNoChord(std::string_view word) {
+    return ReadChordText(word).mKind == TChordText_NoChord;
+}
+
+}  // namespace
 
 std::vector<CNumeralWord> NumeralWords(std::string_view text) {
     std::vector<CNumeralWord> words;
@@ -49,7 +56,7 @@ CNumeralsReading ReadNumerals(std::string_view text, const CSignKeyLite& key,
         if (word.IsMark()) continue;
         const CNumeralReading numeral = ReadNumeral(word.mText, key, options);
         word.mChord = numeral.mChord;
-        if (numeral.mFault.empty()) continue;
+        if (numeral.mFault.empty() || IsWordOfNoChord(word.mText)) continue;
         const auto before = std::string_view(word.mText).substr(0, numeral.mFaultOffset);
         reading.mFaults.push_back(
             {word.mLine, word.mColumn + CountUtf8Characters(before), std::string(numeral.mFault)});
@@ -60,7 +67,7 @@ CNumeralsReading ReadNumerals(std::string_view text, const CSignKeyLite& key,
 CNumeralsReading ReadChordWords(std::string_view text) {
     CNumeralsReading reading{NumeralWords(text), {}};
     for (CNumeralWord& word : reading.mWords) {
-        if (word.IsMark()) continue;
+        if (word.IsMark() || IsWordOfNoChord(word.mText)) continue;
         word.mChord = ReadChordText(word.mText).mChord;
         if (word.mChord.IsUndef()) {
             reading.mFaults.push_back({word.mLine, word.mColumn, "this is no chord"});
@@ -71,9 +78,12 @@ CNumeralsReading ReadChordWords(std::string_view text) {
 
 bool BeginsWithNumeral(std::string_view text, const CSignKeyLite& key) {
     const std::vector<CNumeralWord> words = NumeralWords(text);
-    const auto first = std::find_if(words.begin(), words.end(),
-                                    [](const CNumeralWord& word) { return !word.IsMark(); });
-    return first != words.end() && ChordFromNumeral(first->mText, key).has_value();
+    for (const CNumeralWord& word : words) {
+        if (word.IsMark()) continue;
+        if (ChordFromNumeral(word.mText, key)) return true;
+        if (!IsWordOfNoChord(word.mText)) return false;
+    }
+    return false;
 }
 
 }  // namespace brindle

@@ -18,7 +18,7 @@ struct CNumeralWord {
     std::size_t mLine = 0;
     /// The column in characters, not bytes, from 1.
     std::size_t mColumn = 0;
-    /// Undefined for a mark and for what is not understood.
+    /// Undefined for a mark, for a word such as "N.C.", and for what is not understood.
     CChordLite mChord;
 
     /// A bar line or a hold: `|`, `||`, `.`
@@ -43,6 +43,7 @@ struct CNumeralsReading {
 /// Reads a text of Roman numerals or Nashville numbers with bar lines and holds: `ii7 V7 | I^7`.
 ///
 /// A word that is not understood is a fault and has no chord; the others are read all the same.
+/// "N.C." and its like have no chord either and are no faults.
 /// Time is linear in the length of the text.
 [[nodiscard]] CNumeralsReading ReadNumerals(std::string_view text, const CSignKeyLite& key,
                                             const CNumeralOptions& options = {});
@@ -50,7 +51,8 @@ struct CNumeralsReading {
 /// Reads a text of chord symbols with bar lines in the same way.
 [[nodiscard]] CNumeralsReading ReadChordWords(std::string_view text);
 
-/// Whether the first word that is no mark is a numeral; no chord symbol begins as one.
+/// Whether the first word that is no mark and no "N.C." is a numeral; no chord symbol begins as
+/// one.
 [[nodiscard]] bool BeginsWithNumeral(std::string_view text, const CSignKeyLite& key);
 
 }  // namespace brindle

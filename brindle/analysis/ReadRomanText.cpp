@@ -56,6 +56,17 @@ bool BeginsWithNumeral(std::string_view line) {
            !ReadNumeral(word, anyKey, kNumeralsOfRomanText).mChord.IsUndef();
 }
 
+// "E flat", "f# minor"; small letters without a word for the mode are minor, as in all of
+// RomanText.
+std::optional<CSignKeyLite> KeyInWords(std::string_view name) {
+    const CKeyText read = ReadKeyText(name);
+    if (!read.mError.empty()) return std::nullopt;
+    CSignKeyLite key = read.mSignKey;
+    const bool saysMajor = name.find("maj") != name.npos || name.find("dur") != name.npos;
+    if (Ascii::IsSmallLetter(name.front()) && !saysMajor) key.mSignKeyType = TSignKeyType_Minor;
+    return key;
+}
+
 bool IsWordForNoChord(std::string_view word) {
     return word == "NC" || word == "N.C." || word == "NC.";
 }
@@ -154,8 +165,11 @@ void CRomanTextReader::ReadHeader(std::size_t colon) {
     if (name == "Analyst") return set(mReading.mAnalyst);
     if (name == "Time Signature" || name == "Time signature") return ReadTime(value);
     if (name == "Pedal") return Fail("pedals are left out", name, true);
-    // "E flat: I V" is meant as music.
-    if (ReadKeyText(name).mError.empty()) Fail("a key is written as in Eb: or f#:", name);
+    // Another header says nothing of the music; "E flat: I V" does.
+    const auto key = KeyInWords(name);
+    if (!key) return;
+    mKey = key;
+    ReadTypedLine(Ascii::TrimmedInFront(std::string_view(mLine).substr(colon + 1)));
 }
 
 void CRomanTextReader::ReadTime(std::string_view value) {

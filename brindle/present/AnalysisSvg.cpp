@@ -122,6 +122,7 @@ public:
                       {.mSize = kSymbolSize, .mColor = kFaintInk});
             return;
         }
+        DrawKeyNotes(mSvg, mSong.mKeys, kMargin, KeyNotesTop(), kLineWidth);
         DrawBarLines(mSvg, mAxis, mPlaces, kFunctionTop);
         DrawScore();
         DrawSignKeys();
@@ -163,6 +164,10 @@ private:
         return kCopiesTop + GridRoom() + (mSong.mCopies.empty() ? 0.0 : kReadingPitch);
     }
 
+    [[nodiscard]] double KeyNotesTop() const {
+        return mSong.mScore.mTitle.empty() ? kMargin : kMargin + kTitleHeight;
+    }
+
     // Each line is as high as the readings on it need.
     void PlaceLines() {
         std::vector<std::size_t> lanes(mAxis.LineCount(), 0);
@@ -172,7 +177,7 @@ private:
                 lanes[segment.mLine] = std::max(lanes[segment.mLine], mLanes.LaneOf(i) + 1);
             }
         }
-        mBottom = mSong.mScore.mTitle.empty() ? kMargin : kMargin + kTitleHeight;
+        mBottom = KeyNotesTop() + HeightOfKeyNotes(mSong.mKeys);
         for (const std::size_t count : lanes) {
             mPlaces.mTops.push_back(mBottom);
             mBottom += ReadingsTop() + static_cast<double>(count) * kReadingPitch + kLineGap;
@@ -220,7 +225,7 @@ private:
 
     void Draw(const CShownCenter& center) {
         Band(center.mRange, kCenterTop, kBandHeight, ColorOf(center.mHarmCenter, Shade_Center),
-             center.mName, {.mSize = kLabelSize, .mColor = kInk, .mBold = true});
+             "Center " + center.mName, {.mSize = kLabelSize, .mColor = kInk, .mBold = true});
         const std::string color = ColorOf(center.mHarmCenter, Shade_Chord);
         for (const CShownChord& chord : center.mChords) Draw(chord, color);
     }

@@ -48,11 +48,12 @@ public:
     explicit CKeysPicture(const CShownSong& song)
         : mKeys(song.mKeys), mAxis(song, kWidthOfKeys, WidestChord(song.mKeys)) {
         for (std::size_t line = 0; line < mAxis.LineCount(); ++line) {
-            mPlaces.mTops.push_back(kMarginOfKeys + kKeysTitleHeight +
+            mPlaces.mTops.push_back(kMarginOfKeys + kKeysTitleHeight + HeightOfKeyNotes(mKeys) +
                                     static_cast<double>(line) * (kKeysLineHeight + kKeysLineGap));
         }
         mSvg.Text(kMarginOfKeys, kMarginOfKeys + kKeysTitleSize, Title(),
                   {.mSize = kKeysTitleSize, .mColor = kInk, .mBold = true});
+        DrawKeyNotes(mSvg, mKeys, kMarginOfKeys, kMarginOfKeys + kKeysTitleHeight, kWidthOfKeys);
         if (mKeys.mRegions.empty()) return;
         DrawBarLines(mSvg, mAxis, mPlaces, kNumeralTop);
         DrawKeyRegions(mSvg, mAxis, mPlaces, mKeys, kRibbonTop, kRibbonHeight);

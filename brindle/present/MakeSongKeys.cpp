@@ -3,8 +3,43 @@
 
 #include "brindle/present/CChordSymbols.h"
 #include "brindle/present/ShownNames.h"
+#include "brindle/present/internal/ReadingNotes.h"
+
+#include <algorithm>
 
 namespace brindle {
+namespace {
+
+CShownKeyRegion ShownRegion(const CSong& song, const CSongReading& reading,
+                            const CKeyRegion& region) {
+    CShownKeyRegion shown{region.mKey,
+                          region.mKey.NameLong(NamePrefs()),
+                          {region.mPosition, region.mEndPosition},
+                          {}};
+    const std::size_t end = std::min(region.mEnd, song.mSymbols.size());
+    for (std::size_t i = region.mBegin; i < end; ++i) {
+        const bool isLast = i + 1 == song.mChords.size();
+        shown.mChords.push_back({{song.mChords[i].mPosition,
+                                  isLast ? region.mEndPosition : song.mChords[i + 1].mPosition},
+                                 song.mSymbols[i],
+                                 reading.mChords[i].mNumeral});
+    }
+    return shown;
+}
+
+}  // namespace
+
+CShownKeys MakeSongKeys(const CSong& song, const CSongReading& reading) {
+    CShownKeys keys;
+    keys.mKey = reading.mKey;
+    if (!reading.mKey.IsUndef()) keys.mName = reading.mKey.NameLong(NamePrefs());
+    keys.mConfidence = reading.mConfidence;
+    for (const CKeyRegion& region : reading.mRegions) {
+        keys.mRegions.push_back(ShownRegion(song, reading, region));
+    }
+    keys.mNotes = KeyContradictions(song, reading);
+    return keys;
+}
 
 CShownKeys MakeSongKeys(const CHarmAnlsChords& chords, const CChordSymbols& symbols,
                         const CKeyOptions& options, const CNumeralOptions& numeralOptions) {

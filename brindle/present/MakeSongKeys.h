@@ -4,7 +4,9 @@
 #include "brindle/present/MakeSong.h"
 
 #include "brindle/analysis/CKeyOfSong.h"
+#include "brindle/analysis/ReadHarmony.h"
 #include "brindle/analysis/RomanNumeral.h"
+#include "brindle/song/CSong.h"
 
 namespace brindle {
 
@@ -12,5 +14,9 @@ namespace brindle {
 [[nodiscard]] CShownKeys MakeSongKeys(const CHarmAnlsChords& chords, const CChordSymbols& symbols,
                                       const CKeyOptions& options,
                                       const CNumeralOptions& numeralOptions = {});
+
+/// Prepares the keys and numerals of a reading for the eye, with what is to be said of keys that
+/// contradict each other. It has no points of keys.
+[[nodiscard]] CShownKeys MakeSongKeys(const CSong& song, const CSongReading& reading);
 
 }  // namespace brindle

@@ -102,6 +102,8 @@ struct CShownKeys {
     double mConfidence = kPosUndef;         ///< 0 to 1, see CKeyOfSong; kPosUndef without a key
     std::array<double, 24> mScores{};       ///< the points of C to B major, then C to B minor
     std::vector<CShownKeyRegion> mRegions;  ///< by time
+    /// Sentences on where the key contradicts what is stated or found otherwise; mostly empty.
+    std::vector<std::string> mNotes;
 };
 
 /// An analysis prepared for the eye: named, with the length of each chord, each chord once, and

@@ -17,6 +17,7 @@ constexpr double kChordHeight = 34.0;
 constexpr double kNarrowestChord = 40.0;
 // From the middle of a line of text to its base, in parts of the font's size.
 constexpr double kBaseLine = 0.36;
+constexpr double kKeyNoteHeight = 18.0;
 constexpr std::string_view kInkOfBarLines = "#c8c8c8";
 
 double WidthInside(const CTimeSegment& segment) {
@@ -62,6 +63,18 @@ void DrawKeyRegions(CSvg& svg, const CTimeAxis& axis, const CLinePlaces& places,
     }
 }
 
+double HeightOfKeyNotes(const CShownKeys& keys) {
+    return kKeyNoteHeight * static_cast<double>(keys.mNotes.size());
+}
+
+void DrawKeyNotes(CSvg& svg, const CShownKeys& keys, double left, double top, double width) {
+    for (const std::string& note : keys.mNotes) {
+        svg.TextCut(left, top + kLabelSize, width, note,
+                    {.mSize = kLabelSize, .mColor = kFaintInk});
+        top += kKeyNoteHeight;
+    }
+}
+
 void DrawChord(CSvg& svg, const CTimeAxis& axis, const CLinePlaces& places, const CTimeRange& range,
                const CChordBox& box) {
     const std::vector<CTimeSegment> segments = axis.SegmentsOf(range);
@@ -89,6 +102,8 @@ double WidthOfChord(std::string_view symbol, std::string_view caption, double ca
 std::string DescriptionOf(std::string_view picture, const CShownKeys& keys) {
     constexpr std::size_t kMostCharacters = 600;
     std::string text(picture);
+    // Without the full stop at their end.
+    for (const std::string& note : keys.mNotes) text += ". " + note.substr(0, note.size() - 1);
     for (const CShownKeyRegion& region : keys.mRegions) {
         text += fmt::format(". {}:", region.mName);
         for (const CShownNumeral& chord : region.mChords) {

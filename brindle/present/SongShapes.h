@@ -44,6 +44,12 @@ void DrawBand(CSvg& svg, const CTimeAxis& axis, const CLinePlaces& places, const
 void DrawKeyRegions(CSvg& svg, const CTimeAxis& axis, const CLinePlaces& places,
                     const CShownKeys& keys, double top, double height);
 
+/// What DrawKeyNotes needs below its top, in pixels.
+[[nodiscard]] double HeightOfKeyNotes(const CShownKeys& keys);
+
+/// Writes what is to be said of keys that contradict each other, a line each.
+void DrawKeyNotes(CSvg& svg, const CShownKeys& keys, double left, double top, double width);
+
 /// What a screen reader tells of such a picture: what it is, then the keys with their chords. No
 /// longer than anybody listens.
 [[nodiscard]] std::string DescriptionOf(std::string_view picture, const CShownKeys& keys);

@@ -50,6 +50,8 @@ struct CSongBar {
     TSongSign mSign = TSongSign_None;
     /// What stands at its end: "To Coda", "Fine", "D.C. al Fine".
     std::string mWords = {};
+    /// The bracket of an ending stops at its end.
+    bool mEndsEnding = false;
 
     friend bool operator==(const CSongBar&, const CSongBar&) = default;
 };

@@ -10,6 +10,7 @@
 #include "brindle/theory/internal/GermanKeyText.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace brindle {
 namespace {
@@ -45,6 +46,19 @@ std::string WithAsciiSigns(std::string_view typed) {
     return text;
 }
 
+// "E flat minor" as "Eb minor"; other texts as they are.
+std::string WithSignsForWords(const std::string& text) {
+    const bool hasGap = text.size() > 2 && (text[1] == ' ' || text[1] == '-');
+    if (!hasGap) return text;
+    const std::string behind = SetFromStringHelper::ToLowercase(std::string_view(text).substr(2));
+    for (const auto& [word, sign] : {std::pair("flat", 'b'), std::pair("sharp", '#')}) {
+        const std::size_t end = std::string_view(word).size();
+        if (!behind.starts_with(word) || (behind.size() > end && behind[end] != ' ')) continue;
+        return text.substr(0, 1) + sign + text.substr(2 + end);
+    }
+    return text;
+}
+
 // Whether a reader that moved from the word's begin to `position` has read all of the text.
 bool IsReadToItsEnd(std::string_view text, int position) {
     return text.find_first_not_of(' ', static_cast<std::size_t>(position)) == text.npos;
@@ -64,14 +78,15 @@ const CScaleRow* ScaleOfName(std::string_view name) {
 
 CKeyText ReadKeyText(std::string_view typed) {
     const std::string plain = WithAsciiSigns(typed);
-    const std::string text = EnglishKeyText(plain).value_or(plain);
+    const std::string text = WithSignsForWords(EnglishKeyText(plain).value_or(plain));
     const CTypedRoot root = ReadRoot(text);
     if (root.mRoot.IsUndef()) return {{}, "a key begins with a letter A to H, as in \"Bb minor\""};
     int position = root.mConsumed;
     const TSignKeyType type = _SignKeyTypeFromString(text, position);
     if (!IsReadToItsEnd(text, position)) {
-        return {
-            {}, "behind the key stands major or minor, or nothing", TypedColumn(typed, root.mWord)};
+        return {{},
+                "behind the key stands major or minor, or nothing",
+                TypedColumn(typed, root.mWord + std::max(plain.size(), text.size()) - text.size())};
     }
     return {{root.mRoot, type}, {}, 0};
 }

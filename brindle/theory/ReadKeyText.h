@@ -21,8 +21,9 @@ struct CKeyText {
     std::size_t mColumn = 0;
 };
 
-/// Reads "F# minor", "Bb", "am" with accidentals in # and b or as the signs U+266F and U+266D, and
-/// German names: "fis-Moll", "B-Dur" (B flat major), "h moll" (B minor), "Es".
+/// Reads "F# minor", "Bb", "am" with accidentals in # and b, as the signs U+266F and U+266D or as
+/// words ("E flat minor"), and German names: "fis-Moll", "B-Dur" (B flat major), "h moll" (B
+/// minor), "Es".
 [[nodiscard]] CKeyText ReadKeyText(std::string_view text);
 
 /// A scale that was typed, or what is wrong with it and where.

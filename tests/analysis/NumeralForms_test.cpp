@@ -323,7 +323,12 @@ TEST_CASE("A fault tells what is wrong and where") {
         {"V7/x", noTarget, 3},
         {"V/Vx", noSign, 2},
         {"V[no3][ad4]", noGroup, 7},
+        {"V[add4][addd4]/V", noGroup, 11},
+        {"V[add44]", noGroup, 5},
+        {"V[omit3][add]", noGroup, 12},
         {"V[no3", noGroup, 1},
+        {"V[no3][add4", noGroup, 6},
+        {"V[no3]add4]", noGroup, 10},
         {"I[no1no3no5]", "nothing is left of the chord", 0},
     });
     for (const CFaultCase& row : cases) {

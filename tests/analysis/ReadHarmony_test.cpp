@@ -164,6 +164,9 @@ TEST_CASE("What is written again or as no chord keeps the places in the list") {
           "C: ii7~related second>3 ii7~related second>3 V7~dominant>6 I~tonic I~tonic");
     CHECK(again.mChords[0] == CChordReading{});
     CHECK(again.mChords[4] == CChordReading{});
+    CHarmAnlsChords unclosed = BarsOf("C C");
+    unclosed.pop_back();
+    CHECK(ReadingText(ReadHarmony(unclosed)) == "C: I~tonic I~tonic");
     REQUIRE(again.mRegions.size() == 1);
     CHECK(again.mRegions[0].mBegin == 1);
     CHECK(again.mRegions[0].mEnd == 8);

@@ -120,8 +120,11 @@ TEST_CASE("A typed line needs no measure") {
     const CRomanTextReading doubleBar = ReadRomanText("C: I | V || I");
     CHECK(doubleBar.mDoubleBars == std::vector<double>{8.0});
     CHECK(FaultsText(ReadRomanText("C: I X77 V").mFaults) == "1:6 this is no degree");
-    CHECK(FaultsText(ReadRomanText("C major: I V").mFaults) ==
-          "1:1 a key is written as in Eb: or f#:");
+    CHECK(ChordsText(ReadRomanText("C major: I V")) == "0+1 C I; 1+3 C V");
+    CHECK(ChordsText(ReadRomanText("E flat: I V\nf sharp: i V")) ==
+          "0+1 Eb I; 1+3 Eb V; 4+1 F#m i; 5+3 F#m V");
+    CHECK(FaultsText(ReadRomanText("E flat: I\nf sharp minor: i X").mFaults) ==
+          "2:18 this is no degree");
     CHECK(ReadRomanText("Form: binary\nNote: I think so\nPiece: V\n").mFaults.empty());
 }
 

@@ -293,6 +293,17 @@ TEST_CASE("Written endings stand as they are, however long they are") {
     const CSheet sheet = MakeSheet(EvenSong("|: C | [1 D | D | D :| [2 E | |: F | G :| A"));
     CHECK(sheet.mBars[4].mIsInEnding);
     CHECK(!sheet.mBars[5].mIsInEnding);
+    // It ends where the song says so, else it is as long as the first.
+    const auto barsOfLastEnding = [](std::size_t told) {
+        CSong song = EvenSong("|: C | [1 D | D :| [2 E | E | E | F | G");
+        for (CSongBar& bar : song.mBars) bar.mEndsEnding = told > 0 && bar.mWritten == 2 + told;
+        std::size_t count = 0;
+        for (const CSheetBar& bar : MakeSheet(song).mBars) count += bar.mIsInEnding ? 1 : 0;
+        return count - 2;
+    };
+    CHECK(barsOfLastEnding(0) == 2);
+    CHECK(barsOfLastEnding(1) == 1);
+    CHECK(barsOfLastEnding(3) == 3);
 }
 
 TEST_CASE("A long rest is one bar, and bars are counted where a song has none") {
@@ -301,6 +312,32 @@ TEST_CASE("A long rest is one bar, and bars are counted where a song has none") 
     CHECK(Shown(ReadSong("C F G", prefs)) == "| C F | G ");
     CHECK(Shown(ReadSong("(48,C);(4,F)")) == "| C | (11) | F ");
     CHECK(Shown(ReadSong("(4000000000,C);(4,F)")).size() < 60);
+}
+
+// Whether a chord is written like the one before it in its bar.
+bool GoesOnInBar(const CSheetScore& score, std::size_t chord) {
+    const auto beginsBar = [&](const CSheetBar& bar) { return bar.mBegin == chord; };
+    const auto& bars = score.mSheet.mBars;
+    return chord > 0 && std::none_of(bars.begin(), bars.end(), beginsBar) &&
+           score.mTexts[chord].mSymbol == score.mTexts[chord - 1].mSymbol &&
+           score.mTexts[chord].mNumeral == score.mTexts[chord - 1].mNumeral;
+}
+
+TEST_CASE("Equal neighbours in a bar are written once, and arrows leave from where they stand") {
+    const CSheetScore score = ScoreOf(EvenSong("C C G7 G7 | C C/E C C | C G7 G7 G7"), 700.0);
+    std::string drawn;
+    for (const CPlacedBar& bar : score.mLines.mLines.at(0).mBars) {
+        for (const CPlacedChord& chord : bar.mChords) drawn += fmt::format("{} ", chord.mChord);
+        drawn += "| ";
+    }
+    CHECK(drawn == "0 2 | 4 5 6 | 8 9 | ");
+    for (const std::size_t again : {1U, 3U, 7U, 10U, 11U}) {
+        CHECK(score.mLines.mPlaces[again].mLine == 0);
+        CHECK(score.mLines.mPlaces[again].mX == score.mLines.mPlaces[again - 1].mX);
+    }
+    REQUIRE(score.mMarks.at(0).mArrows.size() == 1);
+    CHECK(score.mMarks[0].mArrows[0].mBegin > score.mLines.mPlaces[2].mX);
+    CHECK(score.mMarks[0].mArrows[0].mBegin < score.mLines.mPlaces[4].mX);
 }
 
 TEST_CASE("Every chord stands once, between its bar lines, and no two texts touch") {
@@ -327,7 +364,8 @@ TEST_CASE("Every chord stands once, between its bar lines, and no two texts touc
             CHECK(std::is_sorted(drawn.begin(), drawn.end()));
             for (std::size_t i = 0; i < score.mTexts.size(); ++i) {
                 const auto place = std::equal_range(drawn.begin(), drawn.end(), i);
-                CHECK(place.second - place.first == (score.mSheet.mDrawnAs[i] == i ? 1 : 0));
+                const bool isDrawn = score.mSheet.mDrawnAs[i] == i && !GoesOnInBar(score, i);
+                CHECK(place.second - place.first == (isDrawn ? 1 : 0));
             }
         }
     }

@@ -81,6 +81,13 @@ TEST_CASE("Notes tell ii V I with all its places") {
     CHECK(Has(shown, "  bars 2 to 3, bars 5 to 6: ii V I of C Major\n"));
 }
 
+TEST_CASE("A tonic that comes behind other chords is not noted with its ii V") {
+    const std::string shown = Shown("C6 A7 | Dm7 G7 | Em7 A7 | Dm7 G7 | C6 |");
+    CHECK(Has(shown, "  bar 2: ii V of C Major\n"));
+    CHECK(Has(shown, "  bars 4 to 5: ii V I of C Major\n"));
+    CHECK(Has(Shown("C | Dm7 G7sus4 | G7 | C |"), "  bars 2 to 4: ii V I of C Major\n"));
+}
+
 TEST_CASE("Of seconds and dominants that lead to one tonic the last ones are noted") {
     const std::string shown = Shown("Gm7 C7 | Gm7 C7 | Gm7 C7 | F | Dm7 | Db7 C7 Db7 C7 | F |");
     CHECK(Has(shown, "  bars 3 to 4: ii V I of F Major\n"));

@@ -5,6 +5,7 @@
 #include "brindle/platform/XmlDocument.h"
 #include "brindle/present/AnalysisSvg.h"
 #include "brindle/present/KeysSvg.h"
+#include "brindle/present/MakeSongKeys.h"
 #include "brindle/song/AnalyseSong.h"
 #include "brindle/song/ReadSong.h"
 #include "brindle/song/SheetTimes.h"
@@ -109,6 +110,17 @@ TEST_CASE("The pictures of a song tell a screen reader what they show") {
         CHECK(svg.find("<svg xmlns=\"http://www.w3.org/2000/svg\" role=\"img\" ") != svg.npos);
         CHECK(svg.find("</title>\n<desc>") != svg.npos);
         CHECK(svg.find(" in time. C Major: Dm7 G7 C C</desc>") != svg.npos);
+    }
+    CSong stated = ReadSong("Dm7 G7 | C C");
+    stated.mStatedKey = CSignKeyLite({4, TEnh_n}, TSignKeyType_Minor);
+    CShownSong contradicting = Shown(stated);
+    contradicting.mKeys =
+        MakeSongKeys(stated, ReadHarmony(stated.mChords, {.mStatedKey = *stated.mStatedKey}));
+    CHECK(contradicting.mKeys.mName == "E Minor");
+    for (const std::string& svg : {AnalysisSvg(contradicting), KeysSvg(contradicting)}) {
+        const std::string_view word = "E Minor is the stated key; the chords alone would show";
+        CHECK(svg.find(word, svg.find("</desc>")) != svg.npos);
+        CHECK(svg.find(word) < svg.find("</desc>"));
     }
     std::string text;
     for (int i = 0; i < 2000; ++i) text += "C7 F | ";

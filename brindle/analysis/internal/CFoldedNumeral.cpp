@@ -110,7 +110,10 @@ void CFoldedNumeral::CutGroups() {
         if (open == end) break;
         const auto close = std::find(open, end, ']');
         mIsWhole = close != end && mGroupCount < kMostGroups;
-        if (!mIsWhole) return;
+        if (!mIsWhole) {
+            mWrongBracket = mOffsets[static_cast<std::size_t>(open - begin)];
+            return;
+        }
         // The group goes behind all that is left, so that the groups before it move to the left.
         const auto length = static_cast<std::size_t>(close + 1 - open);
         const auto whole = static_cast<std::ptrdiff_t>(mFoldedSize);
@@ -125,7 +128,9 @@ void CFoldedNumeral::CutGroups() {
         }
         mGroups[mGroupCount++] = {mFoldedSize - length + 1, mFoldedSize - 1};
     }
-    mIsWhole = Text().find(']') == std::string_view::npos;
+    const std::size_t alone = Text().find(']');
+    mIsWhole = alone == std::string_view::npos;
+    if (!mIsWhole) mWrongBracket = mOffsets[alone];
 }
 
 std::string_view CFoldedNumeral::Group(std::size_t ix) const {

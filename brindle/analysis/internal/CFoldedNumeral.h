@@ -28,6 +28,8 @@ public:
     [[nodiscard]] std::size_t OffsetOf(std::string_view piece) const;
     /// The brackets match and are not too many.
     [[nodiscard]] bool IsWhole() const { return mIsWhole; }
+    /// Where the bracket is that has no other, or is one too many; 0 if they match.
+    [[nodiscard]] std::size_t OffsetOfWrongBracket() const { return mWrongBracket; }
 
 private:
     struct CGroup {
@@ -46,6 +48,7 @@ private:
     std::array<CGroup, kMostGroups> mGroups{};
     std::size_t mGroupCount = 0;
     bool mIsWhole = true;
+    std::size_t mWrongBracket = 0;
 };
 
 }  // namespace brindle

@@ -36,7 +36,7 @@ int CChordInSong::EffectiveDegree(std::ptrdiff_t ix) const {
 std::ptrdiff_t CChordInSong::Goal(int up) const {
     if (mNext < 0) return kNoChord;
     if (mUpToNext == up) return mNext;
-    const std::ptrdiff_t goal = ReadingAt(mNext).mResolvesTo;
+    const std::ptrdiff_t goal = TargetOf(mNext);
     if (goal < 0 || FoldIntoOctave(EffectiveDegree(goal) - mDegree) != up) return kNoChord;
     return IsHeardThrough(goal) ? goal : kNoChord;
 }

@@ -3,6 +3,7 @@
 
 #include "brindle/analysis/ReadHarmony.h"
 #include "brindle/analysis/internal/KeyNumbers.h"
+#include "brindle/analysis/internal/SongKeys.h"
 #include "brindle/analysis/internal/SongTraits.h"
 
 #include <cstddef>
@@ -19,8 +20,11 @@ struct CSongToName {
     std::span<const std::uint8_t> mKeys;
     std::span<const TSeventhSpelling> mSevenths;
     CSongTraits mTraits;
-    /// By places in the list. Those of the later chords are done. `mResolvesTo` is the chord that
-    /// the rules lead one to, and first the one that it stands under.
+    const CKeySpeller& mSpeller;
+    /// The chord that each is led to: by a rule, and before that the one that it stands under. A
+    /// chord may resolve nowhere and be led all the same.
+    std::span<std::ptrdiff_t> mTargets;
+    /// By places in the list. Those of the later chords are done.
     std::span<CChordReading> mReadings;
 
     [[nodiscard]] CChordReading& ReadingOf(std::size_t ix) const {
@@ -77,8 +81,11 @@ public:
     [[nodiscard]] int KeyAt(std::ptrdiff_t ix) const {
         return mSong.mKeys[static_cast<std::size_t>(ix)];
     }
+    [[nodiscard]] std::ptrdiff_t TargetOf(std::ptrdiff_t ix) const {
+        return mSong.mTargets[static_cast<std::size_t>(ix)];
+    }
     /// The chord that it stands under, or that a rule has led it to.
-    [[nodiscard]] std::ptrdiff_t Target() const { return ReadingAt(mIx).mResolvesTo; }
+    [[nodiscard]] std::ptrdiff_t Target() const { return TargetOf(mIx); }
     [[nodiscard]] int DegreeBehind() const { return mDegreeBehind; }
 
     /// The degree that a chord stands for: V for a tonic six-four chord, else that of its root.

@@ -63,7 +63,7 @@ bool IsDeceptive(const CChordInSong& chord, const CChordReading& reading) {
 
 std::ptrdiff_t Resolution(const CChordInSong& chord, const CChordName& name) {
     const CChordReading& reading = name.mReading;
-    const std::ptrdiff_t target = reading.mResolvesTo;
+    const std::ptrdiff_t target = name.mTarget;
     if (IsAtRest(reading)) return kNoChord;
     if (name.mIsLed || target < 0 || target == chord.Next()) return target;
     if (chord.KeyAt(target) != chord.Key()) return kNoChord;
@@ -112,27 +112,30 @@ void Apply(const CChordInSong& chord, std::string_view prefix, int target, std::
     WriteServingNumeral(chord, prefix, reading);
 }
 
-// A rule reads the targets of later chords as the rules have left them, so the resolutions, which
-// leave some of them out, come last.
+namespace {
+
+void NameChord(const CChordInSong& chord, CChordName& name) {
+    name.Be(TChordRelation_None, FunctionOf(chord.Degree(), chord.IsInMajor()));
+    WriteOwnNumeral(chord, name.mReading);
+    const bool isNamed = NameChordAtRest(chord, name) || NamePredominant(chord, name) ||
+                         NameDominant(chord, name) || NameDiminished(chord, name) ||
+                         NameRelatedSecond(chord, name);
+    if (!isNamed) NameChordOfKey(chord, name);
+}
+
+}  // namespace
+
+// A rule reads the targets of later chords as the rules have left them; the resolutions leave some
+// of them out.
 void NameHarmonies(const CSongToName& song) {
-    std::vector<bool> isLed(song.mChords.size());
     for (std::size_t i = song.mChords.size(); i-- > 0;) {
         const CChordInSong chord(song, i);
-        CChordName name{song.ReadingOf(i)};
-        name.Be(TChordRelation_None, FunctionOf(chord.Degree(), chord.IsInMajor()));
-        WriteOwnNumeral(chord, name.mReading);
-        const bool isNamed = NameChordAtRest(chord, name) || NamePredominant(chord, name) ||
-                             NameDominant(chord, name) || NameDiminished(chord, name) ||
-                             NameRelatedSecond(chord, name);
-        if (!isNamed) NameChordOfKey(chord, name);
-        isLed[i] = name.mIsLed;
-    }
-    for (std::size_t i = 0; i < song.mChords.size(); ++i) {
-        const CChordInSong chord(song, i);
-        CChordReading& reading = song.ReadingOf(i);
-        reading.mDeceptive = IsDeceptive(chord, reading);
-        reading.mResolvesTo = song.PlaceOf(Resolution(chord, {reading, isLed[i]}));
-        reading.mUnder = song.PlaceOf(reading.mUnder);
+        CChordName name{song.ReadingOf(i), song.mTargets[i]};
+        name.mReading.mKey = song.mSpeller.SignKeyOf(chord.Key());
+        name.mReading.mUnder = song.PlaceOf(chord.Target());
+        NameChord(chord, name);
+        name.mReading.mDeceptive = IsDeceptive(chord, name.mReading);
+        name.mReading.mResolvesTo = song.PlaceOf(Resolution(chord, name));
     }
 }
 

@@ -14,6 +14,8 @@ inline constexpr int kSemitoneDown = 11;
 /// The name that a rule gives to a chord.
 struct CChordName {
     CChordReading& mReading;
+    /// The chord that it is led to.
+    std::ptrdiff_t& mTarget;
     /// The rule tells the chord that it leads to.
     bool mIsLed = false;
 
@@ -24,7 +26,7 @@ struct CChordName {
     /// No chord changes nothing.
     void LeadTo(std::ptrdiff_t ix) {
         if (ix < 0) return;
-        mReading.mResolvesTo = ix;
+        mTarget = ix;
         mIsLed = true;
     }
 };
@@ -49,8 +51,8 @@ void Apply(const CChordInSong& chord, std::string_view prefix, int target, std::
 /// Names what no other rule does.
 void NameChordOfKey(const CChordInSong& chord, CChordName& name);
 
-/// Names all chords of a song. In the end `mResolvesTo` is the chord that each resolves to, and
-/// this and `mUnder` are places in the list.
+/// Names all chords of a song, in one go: a long song does not fit into the caches, and each way
+/// through its readings waits for memory.
 void NameHarmonies(const CSongToName& song);
 
 }  // namespace brindle

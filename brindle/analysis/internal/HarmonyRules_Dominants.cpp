@@ -54,7 +54,7 @@ bool NameBackdoor(const CChordInSong& chord, CChordName& name) {
 
 // The later dominant on the same root that this one is but a first go at: D7 in D7 Am7 D7 G.
 std::ptrdiff_t SameDominantLater(const CChordInSong& chord) {
-    for (const std::ptrdiff_t later : {chord.Next(), chord.ReadingAt(chord.Next()).mResolvesTo}) {
+    for (const std::ptrdiff_t later : {chord.Next(), chord.TargetOf(chord.Next())}) {
         if (later < 0 || chord.DegreeOf(later) != chord.Degree()) continue;
         const TKeyChordClass laterClass = chord.ChordAt(later).mClass;
         if (laterClass == TKeyChordClass_Dom || laterClass == TKeyChordClass_Triad) return later;
@@ -75,7 +75,7 @@ bool NameFirstGo(const CChordInSong& chord, CChordName& name) {
     name.Be(reading.mRelation, reading.mFunction);
     name.mReading.mServes = reading.mServes;
     WriteServingNumeral(chord, isSubstitute ? "subV" : "V", name.mReading);
-    name.LeadTo(reading.mResolvesTo);
+    name.LeadTo(chord.TargetOf(later));
     return true;
 }
 

@@ -38,12 +38,20 @@ std::size_t StepRow(const CKeyChord& from, const CKeyChord& to) {
            static_cast<std::size_t>(FoldIntoOctave(to.mRoot - from.mRoot));
 }
 
-void AddSteps(std::span<const CKeyChord> chords, std::array<TByRoot, 36>& steps) {
+// The steps are counted here and made parts by DivideSteps.
+void AddChord(const CKeyChord& chord, const CKeyChord* before, double total, CSumsByRoot& sums) {
+    const auto root = static_cast<std::size_t>(chord.mRoot);
+    const double part = chord.mBeats / total;
+    sums.mTime[chord.mClass][root] += part;
+    sums.mBass[static_cast<std::size_t>(chord.mBass)] += part;
+    if (before == nullptr || IsSameKind(*before, chord)) return;
+    sums.mSteps[StepRow(*before, chord)][root] += 1.0;
+}
+
+void DivideSteps(std::array<TByRoot, 36>& steps) {
     double count = 0.0;
-    for (std::size_t i = 1; i < chords.size(); ++i) {
-        if (IsSameKind(chords[i - 1], chords[i])) continue;
-        steps[StepRow(chords[i - 1], chords[i])][static_cast<std::size_t>(chords[i].mRoot)] += 1.0;
-        count += 1.0;
+    for (const TByRoot& row : steps) {
+        for (const double part : row) count += part;
     }
     if (count == 0.0) return;
     for (TByRoot& row : steps) {
@@ -55,12 +63,12 @@ CSumsByRoot SumsByRoot(std::span<const CKeyChord> chords) {
     double total = 0.0;
     for (const CKeyChord& chord : chords) total += chord.mBeats;
     CSumsByRoot sums;
+    const CKeyChord* before = nullptr;
     for (const CKeyChord& chord : chords) {
-        const double part = chord.mBeats / total;
-        sums.mTime[chord.mClass][static_cast<std::size_t>(chord.mRoot)] += part;
-        sums.mBass[static_cast<std::size_t>(chord.mBass)] += part;
+        AddChord(chord, before, total, sums);
+        before = &chord;
     }
-    AddSteps(chords, sums.mSteps);
+    DivideSteps(sums.mSteps);
     return sums;
 }
 

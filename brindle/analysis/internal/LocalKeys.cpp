@@ -15,7 +15,9 @@
 
 #include <algorithm>
 #include <array>
+#include <bit>
 #include <cmath>
+#include <limits>
 #include <utility>
 
 namespace brindle {
@@ -44,6 +46,13 @@ constexpr std::size_t PlaceOnCircle(int keyNr) {
 /// The place of the signature of a key on the circle: C major and A minor are 0.
 constexpr std::size_t SignatureOf(int key) {
     return PlaceOnCircle(TonicOfKey(key) + 3 * ModeOfKey(key));
+}
+
+/// The key whose points stand there: the major keys by their signatures, then the minor ones.
+constexpr int KeyAtPlace(int place) {
+    const int signature = FoldIntoOctave(7 * place);
+    return place < static_cast<int>(kFifths) ? signature
+                                             : FoldIntoOctave(signature - 3) + kKeyCount / 2;
 }
 
 /// Points of the keys, by the places of their signatures on the circle.
@@ -86,21 +95,43 @@ private:
 };
 
 /// The costs of a change, by the steps between the signatures, and to the parallel key.
-struct CChangeCosts {
+class CChangeCosts {
+public:
     explicit CChangeCosts(double base) : mParallel(base + kParallelCost) {
         for (std::size_t steps = 0; steps <= kMostFifths; ++steps) {
             mBySteps[steps] = base + kFifthCost * static_cast<double>(steps);
         }
+        for (std::size_t i = 0; i < 2 * kFifths; ++i) {
+            const std::size_t up = i % kFifths;
+            mSameMode[i] = up == 0 ? kNoChange : mBySteps[StepsOf(up)];
+            mToMajor[i] = up == kMinorOfParallel ? mParallel : mBySteps[StepsOf(up)];
+            mToMinor[i] = up == kFifths - kMinorOfParallel ? mParallel : mBySteps[StepsOf(up)];
+        }
     }
 
-    [[nodiscard]] double Between(int a, int b) const {
-        if (TonicOfKey(a) == TonicOfKey(b)) return mParallel;
-        const std::size_t up = (SignatureOf(a) + kFifths - SignatureOf(b)) % kFifths;
-        return mBySteps[std::min({up, kFifths - up, kMostFifths})];
+    /// The costs of a change into a key from the major and from the minor keys, each in the order
+    /// of the circle.
+    [[nodiscard]] std::pair<const double*, const double*> Into(int key) const {
+        const std::size_t begin = kFifths - SignatureOf(key);
+        const double* same = mSameMode.data() + begin;
+        return IsMinorKey(key) ? std::pair(mToMinor.data() + begin, same)
+                               : std::pair(same, mToMajor.data() + begin);
     }
 
     std::array<double, kMostFifths + 1> mBySteps;
     double mParallel;
+
+private:
+    // The signature of the parallel minor key has three signs less.
+    static constexpr std::size_t kMinorOfParallel = kFifths - 3;
+    static constexpr double kNoChange = std::numeric_limits<double>::infinity();
+
+    static std::size_t StepsOf(std::size_t up) { return std::min({up, kFifths - up, kMostFifths}); }
+
+    // By how far the signature that is left lies up from the one that is entered.
+    TTwiceFifths mSameMode;
+    TTwiceFifths mToMajor;
+    TTwiceFifths mToMinor;
 };
 
 double LargestPoints(const TFifths& points) {
@@ -277,16 +308,22 @@ private:
     }
 
     // The key from which the best way leads into `key`, and of equal ones that itself, or the
-    // lowest.
+    // lowest. All keys are compared at once, since no branch could be foreseen.
     [[nodiscard]] int KeyBefore(int key, const CWay& way) const {
         const double changed = way.mChanged.Of(key);
         if (!(changed > way.mBest.Of(key))) return key;
-        for (int from = 0; from < kKeyCount; ++from) {
-            if (from != key && way.mBest.Of(from) - mCosts.Between(from, key) == changed) {
-                return from;
-            }
+        const auto [fromMajor, fromMinor] = mCosts.Into(key);
+        std::uint32_t found = 0;
+        for (std::size_t i = 0; i < kFifths; ++i) {
+            const bool isMajor = way.mBest.mMajor[i] - fromMajor[i] == changed;
+            const bool isMinor = way.mBest.mMinor[i] - fromMinor[i] == changed;
+            found |= std::uint32_t{isMajor} << i | std::uint32_t{isMinor} << (i + kFifths);
         }
-        return key;
+        int before = found == 0 ? key : kKeyCount;
+        for (; found != 0; found &= found - 1) {
+            before = std::min(before, KeyAtPlace(std::countr_zero(found)));
+        }
+        return before;
     }
 
     std::span<const CKeyChord> mChords;
@@ -329,6 +366,14 @@ std::vector<std::uint8_t> LocalKeys(std::span<const CKeyChord> chords,
     std::vector<std::uint8_t> keys = CKeyPath(chords, kinds, traits, options).Find();
     MovePivots(chords, keys);
     return keys;
+}
+
+std::size_t CountRuns(std::span<const std::uint8_t> keys) {
+    std::size_t count = keys.empty() ? 0 : 1;
+    for (std::size_t i = 1; i < keys.size(); ++i) {
+        if (keys[i] != keys[i - 1]) ++count;
+    }
+    return count;
 }
 
 }  // namespace brindle

@@ -5,6 +5,7 @@
 #include "brindle/analysis/internal/KeyChordKinds.h"
 #include "brindle/analysis/internal/SongTraits.h"
 
+#include <cstddef>
 #include <cstdint>
 #include <span>
 #include <vector>
@@ -16,6 +17,9 @@ namespace brindle {
                                                   std::span<const TKeyChordKind> kinds,
                                                   const CSongTraits& traits,
                                                   const CKeyOptions& options);
+
+/// The number of passages that are in one key each.
+[[nodiscard]] std::size_t CountRuns(std::span<const std::uint8_t> keys);
 
 /// Gives short passages and the ends of passages to the key around them, where their chords are at
 /// home there: a tonicization of the second degree, a borrowed chord behind a cadence.

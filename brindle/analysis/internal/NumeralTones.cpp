@@ -341,13 +341,16 @@ CReadTones TonesOfTail(std::string_view tail, const CNumeralRoot& given,
     return {TonesOfSymbol(tail, root.mIsSmall)};
 }
 
-bool ApplyGroup(std::string_view group, const CNumeralRoot& root, CReadTones& tones) {
+bool ApplyGroup(std::string_view& group, const CNumeralRoot& root, CReadTones& tones) {
     while (!group.empty()) {
         const bool isOmitted = Ascii::TakePrefix(group, "no");
         const bool isAdded = !isOmitted && Ascii::TakePrefix(group, "add");
-        const int accidental = TakeAccidentals(group);
-        const int number = TakeNumber(group);
-        if (number == 0 || (isOmitted && accidental != 0)) return false;
+        std::string_view rest = group;
+        const int accidental = TakeAccidentals(rest);
+        const int number = TakeNumber(rest);
+        const bool isNumber = number > 0 && (isAdded || isOmitted || number <= 13) &&
+                              (rest.empty() || !Ascii::IsDigit(rest.front()));
+        if (!isNumber || (isOmitted && accidental != 0)) return false;
         const int step = StepOfNumber(number);
         const int present = SemitoneOfStep(tones.mSemitones, step);
         if (isOmitted) {
@@ -358,9 +361,9 @@ bool ApplyGroup(std::string_view group, const CNumeralRoot& root, CReadTones& to
             tones.mSemitones.SetSemitone(present, false);
             tones.mSemitones.AddIntvl(present + accidental);
         } else {
-            if (number > 13) return false;
             tones.mSemitones.AddIntvl(SemitonesOfNumber(number, accidental));
         }
+        group = rest;
         while (Ascii::TakePrefix(group, ",") || Ascii::TakePrefix(group, " ")) {
         }
     }

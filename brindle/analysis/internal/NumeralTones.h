@@ -29,8 +29,8 @@ struct CReadTones {
                                      const CNumeralOptions& options);
 
 /// Changes the tones by what stands in square brackets: `no5`, `add4`, `b3`. The tones that are
-/// added are those of the key. False if it is not understood.
-[[nodiscard]] bool ApplyGroup(std::string_view group, const CNumeralRoot& root, CReadTones& tones);
+/// added are those of the key. False if it is not understood; then `group` begins with what is not.
+[[nodiscard]] bool ApplyGroup(std::string_view& group, const CNumeralRoot& root, CReadTones& tones);
 
 /// The interval from the root of a numeral to the tone of the key so many steps above it, 1 for the
 /// root.

@@ -95,6 +95,7 @@ std::vector<CKeyRegion> KeyRegionsOf(const CHarmAnlsChords& chords,
                                      const CKeySpeller& speller) {
     std::vector<CKeyRegion> regions;
     if (heard.empty()) return regions;
+    regions.reserve(CountRuns(keys));
     for (std::size_t i = 0; i < heard.size(); ++i) {
         if (i > 0 && keys[i] == keys[i - 1]) continue;
         const std::size_t begin = heard[i].mBegin;

@@ -23,6 +23,7 @@ struct CRun {
 
 std::vector<CRun> RunsOf(const std::vector<std::uint8_t>& keys) {
     std::vector<CRun> runs;
+    runs.reserve(CountRuns(keys));
     for (std::size_t i = 0; i < keys.size(); ++i) {
         if (runs.empty() || runs.back().mKey != keys[i]) runs.push_back({i, i, keys[i]});
         runs.back().mEnd = i + 1;

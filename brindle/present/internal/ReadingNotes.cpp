@@ -16,6 +16,8 @@ namespace brindle {
 namespace {
 
 constexpr std::size_t kMostPlaces = 6;
+/// Chords between a dominant and its tonic in one cadence.
+constexpr std::size_t kMostDelays = 4;
 /// Dominants in a row that are worth a word.
 constexpr std::size_t kShortestChain = 3;
 
@@ -92,14 +94,42 @@ private:
         const bool isSubstitute = At(dominant).mRelation == TChordRelation_SubstituteDominant;
         std::string text = isSubstitute ? "ii subV" : "ii V";
         std::ptrdiff_t last = dominant;
-        const std::ptrdiff_t goal = At(dominant).mResolvesTo;
+        const std::ptrdiff_t goal = GoalOf(dominant);
         const bool arrives = goal >= 0 && !IsDominant(At(goal)) &&
-                             mAround.Root(goal) == FoldIntoOctave(key.mRootKeyEnh.mKeyNr);
+                             mAround.Root(goal) == FoldIntoOctave(key.mRootKeyEnh.mKeyNr) &&
+                             IsOneCadence(dominant, goal);
         if (arrives) {
             text += key.mSignKeyType == TSignKeyType_Minor ? " i" : " I";
             last = goal;
         }
         Note(text + " of " + key.NameLong(NamePrefs()), ix, static_cast<std::size_t>(last));
+    }
+
+    // Behind the other forms of the dominant: of G7sus4 in G7sus4 G7 C that is C.
+    [[nodiscard]] std::ptrdiff_t GoalOf(std::ptrdiff_t dominant) const {
+        std::ptrdiff_t goal = At(dominant).mResolvesTo;
+        for (std::size_t count = 0; count < kMostDelays; ++count) {
+            const bool isForm =
+                goal >= 0 && IsDominant(At(goal)) && At(goal).mServes == At(dominant).mServes;
+            if (!isForm) break;
+            goal = At(goal).mResolvesTo;
+        }
+        return goal;
+    }
+
+    // Whether all between a dominant and its goal is more of the same: Dm7 G7 or G7sus4. A tonic
+    // that comes later, behind other chords, is not heard with it.
+    [[nodiscard]] bool IsOneCadence(std::ptrdiff_t dominant, std::ptrdiff_t goal) const {
+        std::ptrdiff_t between = dominant;
+        for (std::size_t count = 0; count <= kMostDelays; ++count) {
+            between = mAround.Next(static_cast<std::size_t>(between));
+            if (between == goal) return true;
+            const bool isSame =
+                between >= 0 && At(between).mServes == At(dominant).mServes &&
+                (IsDominant(At(between)) || At(between).mRelation == TChordRelation_RelatedSecond);
+            if (!isSame) return false;
+        }
+        return false;
     }
 
     // E7 A7 D7 G7: told where it begins, so that each chord is looked at once.

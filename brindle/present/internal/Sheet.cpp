@@ -82,6 +82,7 @@ std::vector<CSheetBar> GivenBars(const CSong& song) {
         bar.mSign = given.mSign;
         bar.mWords = given.mWords;
         bar.mWritten = given.mWritten;
+        bar.mEndsEnding = given.mEndsEnding;
         if (!given.mTime.IsUndef() && !(given.mTime == time)) bar.mTime = time = given.mTime;
     }
     const double usual = bars.size() > 1 ? bars[1].mLength : 0.0;

@@ -48,8 +48,9 @@ struct CSheetBar {
     /// Where jumps lead to, and at the end of the bar the words for them.
     TSongSign mSign = TSongSign_None;
     std::string mWords;
-    /// As in the song.
+    /// As in the song, both.
     std::size_t mWritten = CSongBar::kNotWritten;
+    bool mEndsEnding = false;
 };
 
 struct CSheet {

@@ -86,8 +86,16 @@ private:
         part.mFixed = LeftPadding(bar) + RightPadding(bar);
         part.mShare = bar.mIsUpbeat ? kUpbeatPart : 1.0;
         if (bar.mHeld != kNone) AddChord(part, {bar.mHeld, 0.0, true});
-        for (std::size_t i = bar.mBegin; i < bar.mEnd; ++i) AddChord(part, {i});
+        for (std::size_t i = bar.mBegin; i < bar.mEnd; ++i) {
+            if (!GoesOnInBar(bar, i)) AddChord(part, {i});
+        }
         return part;
+    }
+
+    // Equal neighbours in a bar are written once.
+    [[nodiscard]] bool GoesOnInBar(const CSheetBar& bar, std::size_t chord) const {
+        return chord > bar.mBegin && mTexts[chord].mSymbol == mTexts[chord - 1].mSymbol &&
+               mTexts[chord].mNumeral == mTexts[chord - 1].mNumeral;
     }
 
     void AddChord(CPart& part, const CPlacedChord& chord) const {
@@ -229,12 +237,18 @@ private:
         return std::clamp((mSheet.mPositions[chord] - begin) / (end - begin), 0.0, 1.0);
     }
 
-    static void TellPlaces(CSheetLines& lines) {
+    // A chord that goes on in its bar has the place of the one that it goes on from.
+    void TellPlaces(CSheetLines& lines) const {
         for (std::size_t i = 0; i < lines.mLines.size(); ++i) {
             for (const CPlacedBar& bar : lines.mLines[i].mBars) {
                 for (const CPlacedChord& chord : bar.mChords) {
                     if (!chord.mIsHeld) lines.mPlaces[chord.mChord] = {i, chord.mX};
                 }
+            }
+        }
+        for (const CSheetBar& bar : mSheet.mBars) {
+            for (std::size_t i = bar.mBegin; i < bar.mEnd; ++i) {
+                if (GoesOnInBar(bar, i)) lines.mPlaces[i] = lines.mPlaces[i - 1];
             }
         }
     }

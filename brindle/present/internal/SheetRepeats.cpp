@@ -261,8 +261,8 @@ private:
         return true;
     }
 
-    // The last ending is as long as the first, as the song does not tell where it ends, and ends
-    // before a section, a repeat or a jump.
+    // The last ending ends where the song says so, else it is as long as the first; in any case it
+    // ends before a section, a repeat or a jump.
     void FindEnd(CPassage& passage) const {
         const std::size_t last = passage.mAgain.back();
         if (passage.mIsWhole.back()) {
@@ -270,9 +270,13 @@ private:
             return;
         }
         const std::size_t begin = last + passage.mCommon;
-        const std::size_t most = std::min(mBars.size(), last + passage.mLength);
-        passage.mEnd = std::min(begin + 1, mBars.size());
-        while (passage.mEnd < most && !BeginsPart(passage.mEnd)) ++passage.mEnd;
+        std::size_t end = begin;
+        bool isTold = false;
+        while (end < mBars.size() && !isTold && (end == begin || !BeginsPart(end))) {
+            isTold = mBars[end++].mEndsEnding;
+        }
+        const std::size_t usual = std::max(begin + 1, last + passage.mLength);
+        passage.mEnd = isTold ? end : std::min(end, usual);
     }
 
     [[nodiscard]] bool BeginsPart(std::size_t bar) const {

@@ -24,6 +24,7 @@ void SetWritten(std::size_t written, const CPlayMarks& marks, CSongBar& bar) {
     bar.mWritten = written;
     if (marks.mSegno.mIsSet) bar.mSign = TSongSign_Segno;
     if (marks.mCoda.mIsSet) bar.mSign = TSongSign_Coda;
+    bar.mEndsEnding = marks.mEndingStops;
     if (marks.mToCoda.mIsSet) AddWords("To Coda", bar.mWords);
     if (marks.mFine) AddWords("Fine", bar.mWords);
     if (marks.Jumps()) AddWords(JumpWords(marks), bar.mWords);
