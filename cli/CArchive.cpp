@@ -94,8 +94,7 @@ bool CArchive::Next() {
         if (status == ARCHIVE_EOF) return false;
         if (status < ARCHIVE_WARN) return GiveUp(LibraryFault());
         if (!mBudget->Take(kHeadBytes)) return GiveUp(tooMuch);
-        if (archive_entry_filetype(mEntry) != AE_IFREG) continue;
-        if (archive_entry_hardlink(mEntry) != nullptr) continue;
+        if (archive_entry_filetype(mEntry) != AE_IFREG && !IsLink()) continue;
         const auto size =
             static_cast<std::uint64_t>(std::max<la_int64_t>(0, archive_entry_size(mEntry)));
         if (size > kMostBytesOfFile && !mBudget->Take(size)) return GiveUp(tooMuch);
@@ -105,7 +104,15 @@ bool CArchive::Next() {
     return false;
 }
 
+bool CArchive::IsLink() const {
+    return archive_entry_filetype(mEntry) == AE_IFLNK || archive_entry_hardlink(mEntry) != nullptr;
+}
+
 std::optional<std::string> CArchive::Read(std::string& reason) {
+    if (IsLink()) {
+        reason = "it is a link, and links in archives are not followed";
+        return std::nullopt;
+    }
     std::string bytes;
     std::array<char, kBlockBytes> buffer;
     while (true) {

@@ -56,14 +56,15 @@ public:
     CArchive& operator=(const CArchive&) = delete;
     ~CArchive() = default;
 
-    /// Goes to the next regular file. False at the end, or when the archive can be read no further;
+    /// Goes to the next file or link. False at the end, or when the archive can be read no further;
     /// then there is a fault.
     [[nodiscard]] bool Next();
     [[nodiscard]] const std::string& Fault() const { return mFault; }
 
     /// Of the file that it stands at.
     [[nodiscard]] const std::string& Name() const { return mName; }
-    /// Its bytes; nothing, with the reason, when they cannot be read or are too many.
+    /// Its bytes; nothing, with the reason, when they cannot be read or are too many. A link has
+    /// none: what it names may lie anywhere, or before it, and has then been read.
     [[nodiscard]] std::optional<std::string> Read(std::string& reason);
 
     /// Whether it is a score in a container instead of an archive of songs. Ends the archive.
@@ -77,6 +78,7 @@ private:
     };
 
     void Opened(int status);
+    [[nodiscard]] bool IsLink() const;
     [[nodiscard]] bool GiveUp(std::string_view fault);
     [[nodiscard]] std::string LibraryFault() const;
 

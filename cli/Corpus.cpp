@@ -38,11 +38,12 @@ struct CCorpusOptions {
     std::string mDoneFile;
 };
 
-CCorpusSongs SongsOf(const CCorpusOptions& options, std::optional<CDoneSongs> done) {
+CCorpusSongs SongsOf(const CCorpusOptions& options, std::optional<CDoneSongs> done,
+                     const CInterrupt& interrupt) {
     CSongOptions reading;
     reading.mLenient = options.mIsLenient;
     return CCorpusSongs(CCorpusFiles(options.mPaths, options.mTakesAll), reading, std::move(done),
-                        options.mTakesAll);
+                        options.mTakesAll, [&interrupt] { return interrupt.IsAsked(); });
 }
 
 /// Writes the lines until there are no more, the output cannot be written or the user wants an end.
@@ -87,8 +88,8 @@ TStatus Corpus(const CCorpusOptions& options) {
         done = CDoneSongs::Read(options.mDoneFile);
         if (!done) return TStatus::BadInput;
     }
-    CCorpusSongs songs = SongsOf(options, std::move(done));
     const CInterrupt interrupt;
+    CCorpusSongs songs = SongsOf(options, std::move(done), interrupt);
     CCorpusProgress progress;
     const TStatus written = WriteLines(songs, options, interrupt, progress);
     progress.Hide();

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "cli/CorpusSongs.h"
 
+#include "cli/InputStream.h"
+
 #include "brindle/platform/Ascii.h"
 #include "brindle/platform/AtomicFile.h"
 
@@ -56,11 +58,16 @@ std::shared_ptr<CUnpackingBudget> BudgetFor(std::uint64_t packedBytes) {
 }  // namespace
 
 CCorpusSongs::CCorpusSongs(CCorpusFiles files, CSongOptions reading, std::optional<CDoneSongs> done,
-                           bool takesAll)
-    : mFiles(std::move(files)), mReading(reading), mDone(std::move(done)), mTakesAll(takesAll) {}
+                           bool takesAll, std::function<bool()> isEndAsked)
+    : mFiles(std::move(files)),
+      mReading(reading),
+      mDone(std::move(done)),
+      mTakesAll(takesAll),
+      mIsEndAsked(std::move(isEndAsked)) {}
 
 std::optional<CSourceOfSong> CCorpusSongs::Next() {
     while (mSongs.empty()) {
+        if (mIsEndAsked()) return std::nullopt;
         if (!mArchives.empty()) {
             OpenMember();
         } else if (const auto file = mFiles.Next()) {
@@ -87,7 +94,10 @@ void CCorpusSongs::OpenFile(const CCorpusFile& file) {
         return;
     }
     if (IsDone({})) return;
-    auto bytes = ReadWholeFile(mPath == "-" ? "/dev/stdin" : mPath, kMostBytesOfFile);
+    auto bytes = isFile ? ReadWholeFile(mPath, kMostBytesOfFile)
+                        : ReadInputStream(mPath, kMostBytesOfFile, mIsEndAsked);
+    // A stream that the user did not wait for has no fault.
+    if (!bytes && mIsEndAsked()) return;
     bytes ? Take(std::move(*bytes), {}) : TakeFault(kTooLarge, {});
 }
 

@@ -8,6 +8,7 @@
 #include "brindle/present/SongLines.h"
 
 #include <cstddef>
+#include <functional>
 #include <memory>
 #include <optional>
 #include <string>
@@ -18,10 +19,12 @@ namespace brindle::cli {
 /// All songs of files, of folders and of archives in them, one by one, not yet read.
 class CCorpusSongs {
 public:
+    /// `isEndAsked` is called before each file, and several times a second as long as a stream is
+    /// waited for.
     CCorpusSongs(CCorpusFiles files, CSongOptions reading, std::optional<CDoneSongs> done,
-                 bool takesAll);
+                 bool takesAll, std::function<bool()> isEndAsked);
 
-    /// The next song, or what cannot be read; nothing at the end.
+    /// The next song, or what cannot be read; nothing at the end, or when that was asked for.
     [[nodiscard]] std::optional<CSourceOfSong> Next();
 
     /// Songs that were done before.
@@ -48,6 +51,7 @@ private:
     CSongOptions mReading;
     std::optional<CDoneSongs> mDone;
     bool mTakesAll;
+    std::function<bool()> mIsEndAsked;
     std::string mPath;  // of the file that is being read
     std::vector<COpenArchive> mArchives;
     std::vector<CSourceOfSong> mSongs;  // the next one last

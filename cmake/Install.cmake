@@ -6,7 +6,8 @@ include(CMakePackageConfigHelpers)
 set(package_dir ${CMAKE_INSTALL_LIBDIR}/cmake/Brindle)
 
 install(TARGETS brindle EXPORT BrindleTargets)
-install(TARGETS brindle_c EXPORT BrindleCTargets)
+install(TARGETS brindle_c EXPORT BrindleCTargets
+        LIBRARY COMPONENT library NAMELINK_COMPONENT dev)
 install(DIRECTORY ${PROJECT_SOURCE_DIR}/brindle DESTINATION ${CMAKE_INSTALL_INCLUDEDIR}
         FILES_MATCHING PATTERN "*.h" PATTERN internal EXCLUDE)
 install(EXPORT BrindleTargets NAMESPACE brindle:: DESTINATION ${package_dir})

@@ -1,12 +1,13 @@
 # Debian packages, made by cpack: `brindle` has the program with its data, translations, man pages
-# and completions, `libbrindle-dev` what hosts build with. tools/make_packages.sh makes and tries them.
+# and completions, `libbrindle0.1` the shared library, `libbrindle-dev` what hosts build with.
+# tools/make_packages.sh makes and tries them. The address is nobody's until the project has one.
 set(CPACK_GENERATOR DEB)
 set(CPACK_PACKAGE_NAME brindle)
 set(CPACK_PACKAGE_CONTACT "The Brindle authors <authors@brindle.invalid>")
 set(CPACK_PACKAGE_VERSION ${PROJECT_VERSION})
 set(CPACK_PACKAGING_INSTALL_PREFIX /usr)
 set(CPACK_STRIP_FILES ON)
-set(CPACK_COMPONENTS_ALL program dev)
+set(CPACK_COMPONENTS_ALL program library dev)
 set(CPACK_COMPONENTS_GROUPING IGNORE)
 set(CPACK_DEB_COMPONENT_INSTALL ON)
 set(CPACK_INSTALL_DEFAULT_DIRECTORY_PERMISSIONS
@@ -24,15 +25,33 @@ the function of each chord, what kind of chord it is there and where it leads.
 Songs are chord texts, lyrics with chords, packed charts or scores in MusicXML;
 results are text, JSON, pictures and MIDI.")
 
+# The name of the package is that of the library with the version that programs ask for.
+set(library_package libbrindle${PROJECT_VERSION_MAJOR}.${PROJECT_VERSION_MINOR})
+set(CPACK_DEBIAN_LIBRARY_PACKAGE_NAME ${library_package})
+set(CPACK_DEBIAN_LIBRARY_PACKAGE_SECTION libs)
+set(CPACK_DEBIAN_LIBRARY_PACKAGE_SHLIBDEPS ON)
+set(CPACK_DEBIAN_LIBRARY_PACKAGE_RECOMMENDS brindle)
+# What Debian's own tools write into packages of shared libraries.
+set(library_control ${PROJECT_BINARY_DIR}/package/library)
+file(WRITE ${library_control}/triggers "activate-noawait ldconfig\n")
+file(WRITE ${library_control}/shlibs "libbrindle ${PROJECT_VERSION_MAJOR}.${PROJECT_VERSION_MINOR} "
+    "${library_package} (>= ${PROJECT_VERSION})\n")
+set(CPACK_DEBIAN_LIBRARY_PACKAGE_CONTROL_EXTRA ${library_control}/triggers ${library_control}/shlibs)
+set(CPACK_COMPONENT_LIBRARY_DESCRIPTION
+"The library under the program brindle, with an interface in C: songs and their
+analyses, chord symbols, keys, names of notes, fingerings, models and scores.
+Its data come with the program.")
+
 # What the headers and the archive need of a host; keep in step with find_package in CMakeLists.txt.
 set(CPACK_DEBIAN_DEV_PACKAGE_NAME libbrindle-dev)
 set(CPACK_DEBIAN_DEV_PACKAGE_SECTION libdevel)
 set(CPACK_DEBIAN_DEV_PACKAGE_DEPENDS
-    "libboost-dev, libfmt-dev, nlohmann-json3-dev, libxml2-dev, libzip-dev, libplist-dev")
+    "${library_package} (= ${PROJECT_VERSION}-1), libboost-dev, libfmt-dev, nlohmann-json3-dev, libxml2-dev, libzip-dev, libplist-dev")
 set(CPACK_DEBIAN_DEV_PACKAGE_RECOMMENDS "brindle, pkg-config")
 set(CPACK_COMPONENT_DEV_DESCRIPTION
-"The library under the program brindle, for programs in C++: headers, archive,
-and what CMake and pkg-config need to find them. Its data come with the program.")
+"The library under the program brindle, for programs in C and C++: headers, an
+archive, and what CMake and pkg-config need to find them. Its data come with
+the program.")
 
 find_program(GZIP gzip)
 if(GZIP)
@@ -47,7 +66,7 @@ if(GZIP)
             OUTPUT_FILE ${PROJECT_BINARY_DIR}/package/${name}.gz)
     endforeach()
 endif()
-foreach(component program dev)
+foreach(component program library dev)
     string(TOUPPER ${component} upper)
     install(FILES ${PROJECT_SOURCE_DIR}/cmake/package/copyright
                   ${PROJECT_BINARY_DIR}/package/changelog.gz

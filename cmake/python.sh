@@ -45,26 +45,33 @@ fetch_packages() {
     printf '%s' "$wanted" >"$python_folder/packages"
 }
 
+# install_library BUILD PREFIX: what hosts build with, and what they run with.
+install_library() {
+    local component
+    for component in dev library; do
+        quietly install cmake --install "$1" --prefix "$2" --component "$component" || return 1
+    done
+}
+
 # The wheel, linked with the library that the release build has made, with the libraries of formats
 # bundled into it.
 build_wheel() {
     local tools="$python_folder/tools/bin"
     rm -rf "$python_folder/dist" "$python_folder/brindle"
     mkdir -p "$python_folder/dist"
-    quietly install cmake --install "$root/build/release" --prefix "$python_folder/brindle" \
-        --component dev || return 1
+    install_library "$root/build/release" "$python_folder/brindle" || return 1
     local config
     config=$(dirname "$(find "$python_folder/brindle" -name BrindleConfig.cmake)")
     quietly wheel env PATH="$tools:$PATH" "$tools/pip" --disable-pip-version-check wheel \
         --no-build-isolation --no-deps --wheel-dir "$python_folder/dist/plain" \
-        -C cmake.define.Brindle_DIR="$config" "$root/python" || return 1
+        --config-settings=cmake.define.Brindle_DIR="$config" "$root/python" || return 1
     quietly bundle env PATH="$tools:$PATH" "$tools/python" -m auditwheel repair \
         --wheel-dir "$python_folder/dist" "$python_folder"/dist/plain/*.whl
 }
 
-# test_python [ARGUMENT...]: builds and tests the wheel in a new environment; arguments go to pytest.
-test_python() {
-    local python
+# prepare_python: finds the Python that is used, which it sets as `python`, and fetches the packages; 77
+# when there is none, which it says.
+prepare_python() {
     mkdir -p "$python_folder"
     python=$(find_python) || { say "left out: Python's part, as there is no Python from 3.10 on"; return 77; }
     if ! can_build "$python" && [[ $python == /usr/bin/* ]]; then
@@ -74,17 +81,27 @@ test_python() {
         say "left out: Python's part, as $python has no headers or cannot make environments"
         return 77
     }
+    fetch_packages "$python"
+}
+
+# make_environment NAME WHEEL...: a new environment with these and with what the tests need.
+make_environment() {
+    rm -rf "$python_folder/$1"
+    quietly "environment-$1" "$python" -m venv "$python_folder/$1" || return 1
+    quietly "environment-$1" "$python_folder/$1/bin/pip" --disable-pip-version-check install \
+        --no-index --find-links "$python_folder/wheels" "${python_test_packages[@]}" "${@:2}"
+}
+
+# test_python [ARGUMENT...]: builds and tests the wheel in a new environment; arguments go to pytest.
+test_python() {
+    local python
+    prepare_python || return $?
     local options=(-DBRINDLE_TESTS=OFF -DBRINDLE_BENCH=OFF -DBRINDLE_FUZZ=OFF)
     if is_configured release; then options=(); fi
     build release brindle_c "${options[@]}"
-    fetch_packages "$python" || return 1
     say "building the wheel"
     build_wheel || return 1
-    rm -rf "$python_folder/test"
-    "$python" -m venv "$python_folder/test"
-    quietly environment "$python_folder/test/bin/pip" --disable-pip-version-check install --no-index \
-        --find-links "$python_folder/wheels" "$python_folder"/dist/*.whl \
-        "${python_test_packages[@]}" || return 1
+    make_environment test "$python_folder"/dist/*.whl || return 1
     (cd "$python_folder" && PYRIGHT_PYTHON_CACHE_DIR="$python_folder/pyright" \
         test/bin/python -m pytest -q -c "$root/python/pyproject.toml" -p no:cacheprovider \
         "$root/python/tests" "$@")

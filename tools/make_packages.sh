@@ -44,11 +44,12 @@ man brindle-markov-learn | grep -q "model"
 bash -c 'compopt() { :; }
     source /usr/share/bash-completion/completions/brindle
     COMP_WORDS=(brindle analyse --ro); COMP_CWORD=2; _brindle; [ "${COMPREPLY[0]}" = --route ]'
-apt-get install -qy --no-install-recommends ./libbrindle-dev_*.deb g++ cmake ninja-build pkg-config
+apt-get install -qy --no-install-recommends ./libbrindle*.deb g++ cmake ninja-build pkg-config
 cmake -G Ninja -S host -B host/build
 cmake --build host/build
 (cd host && build/host >told.txt && diff expected.txt told.txt)
-apt-get purge -qy brindle libbrindle-dev
+pkg-config --cflags --libs brindle-c
+apt-get purge -qy brindle 'libbrindle*'
 test ! -e /usr/bin/brindle -a ! -e /usr/include/brindle
 echo "the packages work"
 TRY

@@ -183,6 +183,16 @@ TEST_CASE("Links into a ring end, pipes of a folder are not waited for, and name
     CHECK_FALSE(fs::exists(folder.mFolder.File("../up.txt")));
 }
 
+TEST_CASE(
+    "Links in an archive are not followed, and those named as songs have a line that says so") {
+    const CCorpusFolder folder({{"a.txt", "C G7 | C"}});
+    (void)folder.Run(
+        "ln -s a.txt l.txt; ln a.txt h.txt; ln -s . up; tar cf s.tar a.txt h.txt l.txt up");
+    const std::string fault = " it is a link, and links in archives are not followed";
+    CHECK(Digest(folder.Lines("s.tar", 1)) ==
+          TDigest{"s.tar:a.txt C Major", "s.tar:h.txt" + fault, "s.tar:l.txt" + fault});
+}
+
 TEST_CASE("Archives that are made to fill a memory are given up") {
     const std::string zeros(65 << 20, ' ');
     const std::string large = PackedArchive("zip", {{"large.txt", zeros}, {"ok.txt", "C G7 | C"}});
@@ -246,6 +256,26 @@ TEST_CASE("Killed in the midst, a run goes on to the whole; asked to end, it lea
         (void)folder.Run("brindle corpus songs --skip-done out >>out 2>told");
         CHECK(folder.Read("out") == whole);
     }
+}
+
+TEST_CASE("One signal ends a run that waits for a pipe, behind a whole line") {
+    const CCorpusFolder folder({{"a.txt", "C G7 | C"}});
+    for (const std::string words : {"pipe", "- <pipe"}) {
+        CAPTURE(words);
+        // The shell holds the pipe open; what does not end is killed, with another exit status.
+        const std::string shown = folder.Run(
+            fmt::format("rm -f out pipe; mkfifo pipe; exec 3<>pipe; set -m; "
+                        "'{}' corpus --jobs 1 a.txt {} >out 2>told & run=$!; "
+                        "while ! test -s out; do sleep 0.01; done; sleep 0.1; kill -TERM $run; "
+                        "for i in $(seq 100); do kill -0 $run 2>told || break; sleep 0.1; done; "
+                        "kill -KILL $run 2>told; wait $run 2>told; echo $?",
+                        BRINDLE_PROGRAM, words));
+        CHECK(shown.starts_with("143"));
+        CHECK(Digest(folder.Read("out")) == TDigest{"a.txt C Major"});
+    }
+    CHECK(folder.Run("(sleep 0.2; echo 'F C7 | F' >pipe) & brindle corpus pipe >out; echo $?") ==
+          "0\n");
+    CHECK(Digest(folder.Read("out")) == TDigest{"pipe F Major"});
 }
 
 TEST_CASE("An output that takes no more ends the work") {
