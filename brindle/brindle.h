@@ -221,6 +221,7 @@
 #include "brindle/present/ReadingText.h"
 #include "brindle/present/RomanTextTable.h"
 #include "brindle/present/ScalesText.h"
+#include "brindle/present/SheetJson.h"
 #include "brindle/present/ShowSong.h"
 #include "brindle/present/ShownNames.h"
 #include "brindle/present/ShownSong.h"
