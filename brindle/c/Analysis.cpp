@@ -8,6 +8,7 @@
 #include "brindle/present/Explain.h"
 #include "brindle/present/LeadSheetSvg.h"
 #include "brindle/present/ReadingText.h"
+#include "brindle/present/SheetJson.h"
 #include "brindle/present/ShowSong.h"
 #include "brindle/present/SongSymbols.h"
 #include "brindle/present/internal/ReadingBars.h"
@@ -139,10 +140,10 @@ brindle::CLeadSheetOptions FromC(const brindle_sheet_options& options) {
     return result;
 }
 
-std::string SheetOf(const brindle_analysis& analysis, const brindle_sheet_options& options) {
+brindle::CSong NamedSong(const brindle_analysis& analysis, const brindle_sheet_options& options) {
     brindle::CSong song = analysis.mSong;
     song.mSymbols = SymbolsOf(analysis, options.naming, &options.style);
-    return LeadSheetSvg(song, analysis.mReading, FromC(options));
+    return song;
 }
 
 bool IsNaming(int naming) {
@@ -278,8 +279,19 @@ brindle_status brindle_analysis_sheet(const brindle_analysis* analysis,
     const auto used = options != nullptr ? *options : brindle_sheet_options_default();
     if (text != nullptr) *text = nullptr;
     if (!IsNaming(used.naming)) return Fail(BRINDLE_ERROR_ARGUMENT, "there is no such naming");
-    return GiveTextOf(analysis, text,
-                      [&](const brindle_analysis& from) { return SheetOf(from, used); });
+    return GiveTextOf(analysis, text, [&](const brindle_analysis& from) {
+        return LeadSheetSvg(NamedSong(from, used), from.mReading, FromC(used));
+    });
+}
+
+brindle_status brindle_analysis_sheet_json(const brindle_analysis* analysis,
+                                           const brindle_sheet_options* options, char** text) {
+    const auto used = options != nullptr ? *options : brindle_sheet_options_default();
+    if (text != nullptr) *text = nullptr;
+    if (!IsNaming(used.naming)) return Fail(BRINDLE_ERROR_ARGUMENT, "there is no such naming");
+    return GiveTextOf(analysis, text, [&](const brindle_analysis& from) {
+        return SheetJson(NamedSong(from, used), from.mReading);
+    });
 }
 
 brindle_status brindle_analysis_symbols(const brindle_analysis* analysis, int naming,

@@ -531,6 +531,11 @@ BRINDLE_API brindle_sheet_options brindle_sheet_options_default(void);
 BRINDLE_API brindle_status brindle_analysis_sheet(const brindle_analysis* analysis,
                                                   const brindle_sheet_options* options,
                                                   char** text);
+/** What that lead sheet shows, for hosts that draw it themselves, as strict JSON; of the options
+ * the naming alone counts. `options` may be NULL for the default. */
+BRINDLE_API brindle_status brindle_analysis_sheet_json(const brindle_analysis* analysis,
+                                                       const brindle_sheet_options* options,
+                                                       char** text);
 /** What stands for the chords, a line for each; `naming` is a brindle_chord_naming and `style`,
  * which may be NULL, that of BRINDLE_CHORDS_IN_STYLE. What sounds no chord keeps its symbol. */
 BRINDLE_API brindle_status brindle_analysis_symbols(const brindle_analysis* analysis, int naming,

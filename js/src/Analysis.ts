@@ -137,6 +137,15 @@ export class Analysis extends Handle {
     if (options.picture === "time-axis") {
       return native.givenText((out) => native.module._brindle_analysis_svg!(handle, 1, out));
     }
+    return this.#sheet("sheet", options);
+  }
+  /** What the lead sheet shows, for pages that draw it themselves; docs/json.md has the members. */
+  sheet(options: Pick<SheetOptions, "naming" | "unicode"> = {}): object {
+    return JSON.parse(this.#sheet("sheet_json", options)) as object;
+  }
+
+  #sheet(what: string, options: SheetOptions): string {
+    const { native } = this;
     return native.withRoom(32, (place) => {
       new Record(native, place)
         .putInt(namingCode(options.naming))
@@ -145,7 +154,8 @@ export class Analysis extends Handle {
         .putInt(options.barsPerLine ?? 4)
         .putInt(Math.max(0, themes.indexOf(options.theme ?? "auto")))
         .putDouble(options.width ?? 800);
-      return native.givenText((out) => native.module._brindle_analysis_sheet!(handle, place, out));
+      const draw = native.module[`_brindle_analysis_${what}`]!;
+      return native.givenText((out) => draw(this.handle, place, out));
     });
   }
 
