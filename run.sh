@@ -4,7 +4,7 @@
 set -euo pipefail
 source "$(dirname "$(readlink -f "${BASH_SOURCE[0]}")")/cmake/setup.sh"
 if [ "${1:-}" = page ]; then
-    source "$root/cmake/js.sh"
+    source "$root/cmake/javascript.sh"
     source "$root/cmake/web.sh"
     show_page "${@:2}"
 fi
