@@ -111,6 +111,7 @@ export function App() {
               onLeave={leaveChord}
             />
           )}
+          {sheet && !hasChords && <p class="no-chords">There is no chord in this song.</p>}
           <TakeAway canTake={hasChords} onFile={(form) => void takeFile(form)} onLink={() => void takeLink()} />
         </section>
         {chord && selected !== null && (

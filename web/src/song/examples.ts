@@ -1,6 +1,5 @@
 import type { Source } from "../engine/Types";
 import beautifulDreamer from "../../../examples/scores/beautiful-dreamer.musicxml?url";
-import preludeInC from "../../../examples/scores/prelude-in-c.musicxml?url";
 import afterYouveGone from "../../../examples/songs/after-youve-gone.txt?raw";
 import amazingGrace from "../../../examples/songs/amazing-grace.txt?raw";
 import auldLangSyne from "../../../examples/songs/auld-lang-syne.txt?raw";
@@ -35,5 +34,4 @@ export const examples: Example[] = [
   typed("Greensleeves", "Traditional", greensleeves),
   typed("House of the Rising Sun", "Traditional", risingSun),
   score("Beautiful Dreamer", "beautiful-dreamer.musicxml", beautifulDreamer),
-  score("Prelude in C", "prelude-in-c.musicxml", preludeInC),
 ];
