@@ -5,7 +5,7 @@ wasm_folder="$root/build/wasm"
 javascript_packages=(emscripten dpkg-dev)
 
 can_run_node() {
-    node -e 'process.exit(Number(process.versions.node.split(".")[0]) < 18)' 2>/dev/null && command -v npm >/dev/null
+    node -e 'process.exit(Number(process.versions.node.split(".")[0]) < 18 ? 1 : 0)' 2>/dev/null && command -v npm >/dev/null
 }
 
 # in_wasm_log LOG COMMAND...: with its output in a log, which is shown when it fails.
