@@ -1,16 +1,5 @@
 # libbrindle.so exports the C interface and nothing else: the linker hides what is not in its list, our
 # own symbols as those that templates of the standard and the JSON library bring.
-target_compile_features(brindle_c_objects PRIVATE cxx_std_20)
-target_include_directories(brindle_c_objects PRIVATE ${PROJECT_SOURCE_DIR})
-target_link_libraries(brindle_c_objects PRIVATE
-    Boost::headers nlohmann_json::nlohmann_json fmt::fmt brindle_warnings)
-target_compile_options(brindle_c_objects PRIVATE -ffp-contract=off)
-set_target_properties(brindle_c_objects PROPERTIES
-    CXX_VISIBILITY_PRESET hidden
-    VISIBILITY_INLINES_HIDDEN ON
-    POSITION_INDEPENDENT_CODE ON)
-brindle_harden(brindle_c_objects)
-
 add_library(brindle_c SHARED $<TARGET_OBJECTS:brindle_c_objects>)
 add_library(brindle::c ALIAS brindle_c)
 target_link_libraries(brindle_c PRIVATE $<BUILD_INTERFACE:brindle>)

@@ -70,7 +70,7 @@ void ForEachGroup(const CHarmAnlsCenterAlternatives& alternatives, Less less, Vi
     for (auto first = readings.begin(); first != readings.end();) {
         const auto last = std::find_if(
             first, readings.end(), [&](const CReading& reading) { return less(*first, reading); });
-        visit(std::span<const CReading>(first, last));
+        visit(std::span<const CReading>(&*first, static_cast<std::size_t>(last - first)));
         first = last;
     }
 }

@@ -8,7 +8,9 @@
 #include "brindle/present/Explain.h"
 #include "brindle/present/LeadSheetSvg.h"
 #include "brindle/present/ReadingText.h"
+#include "brindle/present/SheetJson.h"
 #include "brindle/present/ShowSong.h"
+#include "brindle/present/SongSymbols.h"
 #include "brindle/present/internal/ReadingBars.h"
 #include "brindle/song/AnalyseSong.h"
 #include "brindle/song/ReadSongHarmony.h"
@@ -116,6 +118,36 @@ brindle_status GiveTextOf(const brindle_analysis* analysis, char** text, const T
     *text = nullptr;
     if (analysis == nullptr) return FailForNull("analysis");
     return Guarded([&] { return GiveText(make(*analysis), text); });
+}
+
+constexpr int kLastNaming = BRINDLE_CHORDS_ROMAN;
+
+// What stands for the chords as a brindle_chord_naming tells, which is in its range.
+std::vector<std::string> SymbolsOf(const brindle_analysis& analysis, int naming,
+                                   const brindle_style* style) {
+    if (naming == BRINDLE_CHORDS_AS_WRITTEN) return analysis.mSong.mSymbols;
+    return SongSymbols(analysis.mSong, analysis.mReading,
+                       static_cast<brindle::TSongNaming>(naming - BRINDLE_CHORDS_IN_STYLE),
+                       FromC(style));
+}
+
+brindle::CLeadSheetOptions FromC(const brindle_sheet_options& options) {
+    brindle::CLeadSheetOptions result;
+    result.mBarsPerLine = options.bars_per_line;
+    result.mWidth = options.width;
+    if (options.theme == BRINDLE_THEME_LIGHT) result.mTheme = brindle::TSheetTheme_Light;
+    if (options.theme == BRINDLE_THEME_DARK) result.mTheme = brindle::TSheetTheme_Dark;
+    return result;
+}
+
+brindle::CSong NamedSong(const brindle_analysis& analysis, const brindle_sheet_options& options) {
+    brindle::CSong song = analysis.mSong;
+    song.mSymbols = SymbolsOf(analysis, options.naming, &options.style);
+    return song;
+}
+
+bool IsNaming(int naming) {
+    return naming >= BRINDLE_CHORDS_AS_WRITTEN && naming <= kLastNaming;
 }
 
 }  // namespace
@@ -230,5 +262,47 @@ brindle_status brindle_analysis_svg(const brindle_analysis* analysis, int pictur
     return GiveTextOf(analysis, text, [picture](const brindle_analysis& from) {
         return picture == BRINDLE_PICTURE_TIME_AXIS ? AnalysisSvg(ShowSong(from.mSong, from.mFound))
                                                     : LeadSheetSvg(from.mSong, from.mReading);
+    });
+}
+
+brindle_sheet_options brindle_sheet_options_default(void) {
+    const brindle::CLeadSheetOptions usual;
+    return {BRINDLE_CHORDS_AS_WRITTEN,
+            {BRINDLE_NAMING_LETTERS, 0},
+            usual.mBarsPerLine,
+            BRINDLE_THEME_AUTO,
+            usual.mWidth};
+}
+
+brindle_status brindle_analysis_sheet(const brindle_analysis* analysis,
+                                      const brindle_sheet_options* options, char** text) {
+    const auto used = options != nullptr ? *options : brindle_sheet_options_default();
+    if (text != nullptr) *text = nullptr;
+    if (!IsNaming(used.naming)) return Fail(BRINDLE_ERROR_ARGUMENT, "there is no such naming");
+    return GiveTextOf(analysis, text, [&](const brindle_analysis& from) {
+        return LeadSheetSvg(NamedSong(from, used), from.mReading, FromC(used));
+    });
+}
+
+brindle_status brindle_analysis_sheet_json(const brindle_analysis* analysis,
+                                           const brindle_sheet_options* options, char** text) {
+    const auto used = options != nullptr ? *options : brindle_sheet_options_default();
+    if (text != nullptr) *text = nullptr;
+    if (!IsNaming(used.naming)) return Fail(BRINDLE_ERROR_ARGUMENT, "there is no such naming");
+    return GiveTextOf(analysis, text, [&](const brindle_analysis& from) {
+        return SheetJson(NamedSong(from, used), from.mReading);
+    });
+}
+
+brindle_status brindle_analysis_symbols(const brindle_analysis* analysis, int naming,
+                                        const brindle_style* style, char** lines) {
+    if (lines != nullptr) *lines = nullptr;
+    if (!IsNaming(naming)) return Fail(BRINDLE_ERROR_ARGUMENT, "there is no such naming");
+    return GiveTextOf(analysis, lines, [&](const brindle_analysis& from) {
+        auto symbols = SymbolsOf(from, naming, style);
+        symbols.resize(ChordCountOf(from.mSong));
+        std::string text;
+        for (const std::string& symbol : symbols) text += symbol + '\n';
+        return text;
     });
 }

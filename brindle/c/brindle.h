@@ -359,6 +359,20 @@ BRINDLE_API size_t brindle_song_section_count(const brindle_song* song);
 BRINDLE_API brindle_status brindle_song_section(const brindle_song* song, size_t index,
                                                 brindle_section* section);
 
+/** The song so many semitones higher, or lower for a negative number, spelled for the key in which
+ * it then is, with new symbols. */
+BRINDLE_API brindle_status brindle_song_transpose(const brindle_song* song, int semitones,
+                                                  brindle_song** transposed);
+/** The same song with the symbols of its chords written in a style; `style` may be NULL. */
+BRINDLE_API brindle_status brindle_song_rename(const brindle_song* song, const brindle_style* style,
+                                               brindle_song** renamed);
+/** The song in ChordPro, its chords as a grid, as they are played; "" for a song without chords. */
+BRINDLE_API brindle_status brindle_song_chord_pro(const brindle_song* song, char** text);
+/** The chords and their bass as a Standard MIDI File of `midi_size` bytes; `tempo` is beats a
+ * minute, 1 to 1000, 0 for that of the song or 120. */
+BRINDLE_API brindle_status brindle_song_midi(const brindle_song* song, double tempo, char** midi,
+                                             size_t* midi_size);
+
 /* Analysis */
 
 /** What was found in a song. */
@@ -487,6 +501,46 @@ BRINDLE_API brindle_status brindle_analysis_text(const brindle_analysis* analysi
 BRINDLE_API brindle_status brindle_analysis_svg(const brindle_analysis* analysis, int picture,
                                                 char** text);
 
+/** What stands for the chords of a lead sheet. */
+typedef enum brindle_chord_naming {
+    BRINDLE_CHORDS_AS_WRITTEN = 0, /**< the symbols of the song */
+    BRINDLE_CHORDS_IN_STYLE = 1,   /**< symbols in a style */
+    BRINDLE_CHORDS_NASHVILLE = 2,  /**< numbers in the key of each passage: 2-7 57 1 */
+    BRINDLE_CHORDS_ROMAN = 3       /**< numerals in it: ii7 V7 I */
+} brindle_chord_naming;
+
+/** The colors of a lead sheet. */
+typedef enum brindle_theme {
+    BRINDLE_THEME_AUTO = 0, /**< those that the viewer prefers */
+    BRINDLE_THEME_LIGHT = 1,
+    BRINDLE_THEME_DARK = 2
+} brindle_theme;
+
+/** How a lead sheet is drawn. Numbers beyond their ranges count as the nearer end. */
+typedef struct brindle_sheet_options {
+    int naming;          /**< a brindle_chord_naming */
+    brindle_style style; /**< of BRINDLE_CHORDS_IN_STYLE */
+    int bars_per_line;   /**< 1 to 16; fewer where they do not fit */
+    int theme;           /**< a brindle_theme */
+    double width;        /**< 200 to 4000 pixels */
+} brindle_sheet_options;
+
+/** As written, 4 bars a line, the colors of the viewer, 800 pixels. */
+BRINDLE_API brindle_sheet_options brindle_sheet_options_default(void);
+/** The lead sheet, a file in SVG; `options` may be NULL for the default. */
+BRINDLE_API brindle_status brindle_analysis_sheet(const brindle_analysis* analysis,
+                                                  const brindle_sheet_options* options,
+                                                  char** text);
+/** What that lead sheet shows, for hosts that draw it themselves, as strict JSON; of the options
+ * the naming alone counts. `options` may be NULL for the default. */
+BRINDLE_API brindle_status brindle_analysis_sheet_json(const brindle_analysis* analysis,
+                                                       const brindle_sheet_options* options,
+                                                       char** text);
+/** What stands for the chords, a line for each; `naming` is a brindle_chord_naming and `style`,
+ * which may be NULL, that of BRINDLE_CHORDS_IN_STYLE. What sounds no chord keeps its symbol. */
+BRINDLE_API brindle_status brindle_analysis_symbols(const brindle_analysis* analysis, int naming,
+                                                    const brindle_style* style, char** lines);
+
 /* Fingerings of guitars and their like */
 
 /** Libraries of fingerings, to be searched. */
@@ -573,6 +627,36 @@ BRINDLE_API brindle_status brindle_markov_write_file(const brindle_markov* model
 BRINDLE_API brindle_status brindle_markov_generate(brindle_markov* model,
                                                    const brindle_markov_options* options,
                                                    char** chords);
+
+/* What may come next */
+
+/** What songs have in common: which chord follows which in a key. */
+typedef struct brindle_song_model brindle_song_model;
+
+/** What is asked of the next chord. */
+typedef struct brindle_next_options {
+    brindle_key key; /**< in which the chords are; undefined to find it */
+    size_t limit;    /**< most chords that are wanted */
+    int place;       /**< where it begins: 0 to 3 on the first beat of the first to fourth of four
+                          bars, 4 in the middle of a bar, 5 elsewhere */
+} brindle_next_options;
+
+/** A key to be found, 10 chords, the first beat of a first bar. */
+BRINDLE_API brindle_next_options brindle_next_options_default(void);
+/** The model of the songs that come with the library, all or those of a style ("Hymn"); `style` may
+ * be NULL. BRINDLE_ERROR_NOT_FOUND for a style that none of them has. */
+BRINDLE_API brindle_status brindle_song_model_built_in(const char* style,
+                                                       brindle_song_model** model);
+/** NULL is allowed. */
+BRINDLE_API void brindle_song_model_free(brindle_song_model* model);
+/** The chords that may come behind `count` chords, the likeliest first, with their probability,
+ * numeral and function; behind none, what a song in the key begins with. As strict JSON, the same
+ * as the program prints. `options` may be NULL for the default. A model may be asked by several
+ * threads. */
+BRINDLE_API brindle_status brindle_song_model_next_json(const brindle_song_model* model,
+                                                        const brindle_chord* chords, size_t count,
+                                                        const brindle_next_options* options,
+                                                        char** text);
 
 /* Scores in MusicXML, plain or compressed */
 

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/platform/ZipContainer.h"
 
+#include "brindle/platform/internal/FilePlace.h"
+
 #include <zip.h>
 
 #include <array>
@@ -12,9 +14,6 @@ namespace {
 
 using Archive = std::unique_ptr<zip_t, decltype(&zip_discard)>;
 using ZipFile = std::unique_ptr<zip_file_t, decltype(&zip_fclose)>;
-
-// Deep enough for any real container, shallow enough to unwind.
-constexpr int kMaxDepth = 64;
 
 Archive Open(std::string_view bytes) {
     zip_error_t error;
@@ -38,24 +37,6 @@ bool ReadEntry(zip_t* archive, zip_uint64_t index, std::uint64_t limit, std::str
         if (contents.size() + static_cast<std::uint64_t>(count) > limit) return false;
         contents.append(buffer.data(), static_cast<std::size_t>(count));
     }
-}
-
-// The place of "a/b/c" in the tree, its folders made; null for a path that is too deep.
-FileNode* PlaceFor(FileNode& root, std::string_view path) {
-    FileNode* node = &root;
-    for (int depth = 0; depth < kMaxDepth; ++depth) {
-        const std::size_t slash = path.find('/');
-        node->mIsFolder = true;
-        if (slash == 0) {
-            path.remove_prefix(1);
-            continue;
-        }
-        if (path.empty()) return node;
-        node = &node->mChildren[std::string(path.substr(0, slash))];
-        if (slash == std::string_view::npos) return node;
-        path.remove_prefix(slash + 1);
-    }
-    return nullptr;
 }
 
 }  // namespace

@@ -1,0 +1,19 @@
+export { load, type LoadOptions } from "./load.js";
+export { BrindleError, SongError, type Fault, type Status } from "./errors.js";
+export type { Brindle } from "./Brindle.js";
+export type { Chord, ChordReading } from "./Chord.js";
+export type { Bar, Format, ReadOptions, Section, Song, SongChord } from "./Song.js";
+export type {
+  AnalyseOptions,
+  Analysis,
+  ChordNaming,
+  ChordReadingInSong,
+  Region,
+  SheetOptions,
+} from "./Analysis.js";
+export type { Fingering, FingeringOptions, Fingerings } from "./Fingerings.js";
+export type { GenerateOptions, Markov } from "./Markov.js";
+export type { NamedChord, NamingOptions } from "./names.js";
+export type { NextChord, NextChords, NextOptions } from "./next.js";
+export type { Key, Naming, Scale, Style, Tone } from "./values.js";
+export type * from "./generated/schemas.js";

@@ -1,0 +1,40 @@
+import assert from "node:assert/strict";
+import { test } from "node:test";
+import { setImmediate } from "node:timers/promises";
+import { brindle } from "./support.mjs";
+
+/** Bytes of the memory of WebAssembly, which Node counts as array buffers. */
+const bytes = () => process.memoryUsage().arrayBuffers;
+
+function work(count) {
+  for (let i = 0; i < count; ++i) {
+    assert.equal(brindle.chord("F#m7/C#").tones.length, 4);
+    assert.throws(() => brindle.chord("Hq"));
+    if (i % 50 > 0) continue;
+    const song = brindle.read("Dm7 G7 | C . E7 . | Am . . .");
+    const analysis = song.analyse({ explain: true });
+    assert.equal(analysis.chords.length, 5);
+    if (i % 100 === 0) song.free(), analysis.free();
+  }
+}
+
+test("100,000 calls leave nothing behind, freed by hand or not", async () => {
+  work(2_000);
+  await setImmediate();
+  globalThis.gc?.();
+  const before = bytes();
+  for (let part = 0; part < 50; ++part) {
+    work(1_000);
+    globalThis.gc?.();
+    // What was collected is freed between two tasks.
+    await setImmediate();
+  }
+  assert.equal(bytes(), before);
+});
+
+test("what was freed cannot be used, and freeing again is nothing", () => {
+  const song = brindle.read("C");
+  song.free();
+  song.free();
+  assert.throws(() => song.title, /freed/);
+});

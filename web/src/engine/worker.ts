@@ -1,0 +1,137 @@
+// The library at work, beside the page. All music comes from it.
+
+import { load, SongError, type Analysis, type Brindle, type ChordNaming, type Song } from "brindle";
+import wasm from "brindle/brindle.wasm?url";
+import { midiNotes } from "../player/midiNotes";
+import { insertChord } from "./insertChord";
+import type { Answer, Call, Calls, ChordDetail, Export, Grid, Names, Sheet, Source } from "./Types";
+
+/** The key below the lowest note that a chord is shown with: the B below the C under middle C. */
+const belowPiano = 47;
+const mostGrids = 4;
+const mostNext = 8;
+
+let library: Promise<Brindle> | null = null;
+let kept: { source: Source; song: Song; analysis: Analysis } | null = null;
+
+function isSame(a: Source, b: Source): boolean {
+  if (a.kind === "text" || b.kind === "text") return a.kind === b.kind && (a as { text: string }).text === (b as { text: string }).text;
+  return a.bytes.length === b.bytes.length && a.bytes.every((byte, i) => byte === b.bytes[i]);
+}
+
+async function brindle(): Promise<Brindle> {
+  library ??= load({ wasm: new URL(wasm, self.location.href) });
+  return library;
+}
+
+/** The song of a source with its analysis; the last one is kept, as most calls ask for it again. */
+async function readSong(source: Source): Promise<{ song: Song; analysis: Analysis }> {
+  if (kept && isSame(kept.source, source)) return kept;
+  const library = await brindle();
+  const song = source.kind === "text" ? library.read(source.text, { lenient: true }) : library.readScore(source.bytes);
+  const analysis = song.analyse({ explain: true });
+  kept?.analysis.free();
+  kept?.song.free();
+  kept = { source, song, analysis };
+  return kept;
+}
+
+function namingOf(names: Names): { naming?: ChordNaming } {
+  return names === "typed" ? {} : { naming: names };
+}
+
+/** Tones one above the other, the bass lowest, as a hand could play them. */
+function stacked(tones: { pitchClass: number; name: string }[]): ChordDetail["notes"] {
+  let last = belowPiano;
+  return tones.map(({ pitchClass, name }) => {
+    last += ((pitchClass - last - 1 + 144) % 12) + 1;
+    return { Name: name, NoteNr: last };
+  });
+}
+
+const calls: Calls = {
+  async read(source, names) {
+    try {
+      const { song, analysis } = await readSong(source);
+      const sheet = analysis.sheet(namingOf(names)) as unknown as Sheet;
+      return { sheet, faults: song.faults, sentences: analysis.chords.map(({ explanation }) => explanation) };
+    } catch (error) {
+      if (error instanceof SongError && error.faults.length > 0) return { sheet: null, faults: error.faults, sentences: [] };
+      throw error;
+    }
+  },
+
+  async detail(source, chord) {
+    const { song } = await readSong(source);
+    const found = song.chords[chord]?.chord;
+    if (!found?.root) return { notes: [], grids: [] };
+    const { bass, tones } = found;
+    const low = bass ? [bass, ...tones.filter(({ pitchClass }) => pitchClass !== bass.pitchClass)] : tones;
+    const fingerings = (await brindle()).fingerings(found.symbol);
+    const grids = fingerings.json().Grids.slice(0, mostGrids) as unknown as Grid[];
+    fingerings.free();
+    return { notes: stacked(low), grids };
+  },
+
+  async next(source, chord) {
+    const { song, analysis } = await readSong(source);
+    const before = song.chords.slice(0, chord + 1).map(({ chord }) => chord);
+    const key = analysis.chords[chord]?.key?.name;
+    const found = (await brindle()).next(before, { count: mostNext, ...(key ? { key } : {}) });
+    return found.chords.map(({ symbol, probability, numeral, function: does }) => ({
+      Symbol: symbol, Probability: probability, Numeral: numeral, Function: does,
+    }));
+  },
+
+  async notes(source) {
+    return midiNotes((await readSong(source)).song.midi());
+  },
+
+  async transpose(source, semitones) {
+    const transposed = (await readSong(source)).song.transpose(semitones);
+    const text = transposed.chordPro();
+    transposed.free();
+    return text;
+  },
+
+  async insert(source, chord, symbol) {
+    const library = await brindle();
+    const readSymbols = (text: string) => {
+      const song = library.read(text, { lenient: true });
+      const symbols = song.chords.map((one) => one.symbol);
+      song.free();
+      return symbols;
+    };
+    const text = insertChord(await calls.text(source), chord, symbol, readSymbols);
+    if (text === null) throw new Error(`There is no place for ${symbol} behind this chord in the text.`);
+    return text;
+  },
+
+  async text(source) {
+    return source.kind === "text" ? source.text : (await readSong(source)).song.chordPro();
+  },
+
+  async file(source, form, names, tempo) {
+    const { song, analysis } = await readSong(source);
+    const makers: Record<Export, () => string | Uint8Array> = {
+      svg: () => analysis.svg(namingOf(names)),
+      midi: () => song.midi(tempo),
+      json: () => JSON.stringify(analysis.json(), null, 2),
+      chordpro: () => song.chordPro(),
+    };
+    const made = makers[form]();
+    return typeof made === "string" ? new TextEncoder().encode(made) : made;
+  },
+};
+
+self.onmessage = async ({ data }: MessageEvent<Call>) => {
+  const { id, name, args } = data;
+  let answer: Answer;
+  try {
+    const call = calls[name] as (...args: unknown[]) => Promise<unknown>;
+    answer = { id, value: await call(...args) };
+  } catch (error) {
+    answer = { id, error: (error as Error).message, isFatal: error instanceof WebAssembly.RuntimeError };
+  }
+  self.postMessage(answer);
+};

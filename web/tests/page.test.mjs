@@ -1,0 +1,188 @@
+// What a musician does on the page, in a real browser.
+
+import assert from "node:assert/strict";
+import { readFileSync } from "node:fs";
+import { after, before, test } from "node:test";
+import { openBrowser, Page } from "./browser.mjs";
+
+const example = (path) => readFileSync(new URL(`../../examples/${path}`, import.meta.url));
+
+let browser;
+before(async () => (browser = await openBrowser()));
+after(() => browser.close());
+
+/** A test on a page of its own, which has to stay free of errors. */
+function onPage(name, options, act) {
+  test(name, async () => {
+    const opened = await Page.open(browser, options);
+    await act(opened, opened.page);
+    await opened.close();
+  });
+}
+
+onPage("A typed song has its numerals, keys, arrows and brackets", {}, async (opened, page) => {
+  await opened.type("Dm7 | G7 | Cmaj7 | A7 | Dm7 | Db7 | Cmaj7 | Bb7", 8);
+  assert.deepEqual(await opened.symbols(), ["Dm7", "G7", "Cmaj7", "A7", "Dm7", "D\u266D7", "Cmaj7", "B\u266D7"]);
+  assert.deepEqual((await opened.numerals()).slice(0, 7), ["ii7", "V7", "Imaj7", "V7/ii", "ii7", "subV7/I", "Imaj7"]);
+  assert.match(await page.textContent(".key-of-song"), /in C major/);
+  assert.deepEqual(await opened.texts(".key"), ["C major"]);
+  // G7 to C; A7 to Dm7 over the end of the line, in two pieces; Db7 to C.
+  assert.equal(await page.locator(".music .link[marker-end]").count(), 3);
+  assert.equal(await page.locator(".music .link[marker-end].dotted").count(), 1);
+  // Under Dm7 G7, and a dotted one under Dm7 Db7.
+  assert.equal(await page.locator(".music .link:not([marker-end]):not(.dotted)").count(), 2);
+  assert.equal(await page.locator(".line").count(), 2);
+});
+
+onPage("A song has its title, parts, repeats and endings", {}, async (opened, page) => {
+  await opened.type("Down the Line\nby Some Body\n\n[Verse]\n|: C | F | G7 [1 C :| [2 Am |", 5);
+  assert.equal(await page.textContent(".title"), "Down the Line");
+  assert.equal(await page.title(), "Down the Line \u2013 Brindle");
+  assert.match(await page.textContent(".makers"), /Some Body/);
+  assert.deepEqual(await opened.texts(".ending-number"), ["1.", "2."]);
+  assert.equal(await page.locator(".begins-repeat").count(), 1);
+  assert.equal(await page.locator(".ends-repeat").count(), 1);
+});
+
+onPage("What is wrong is underlined where it is, and the rest is read", {}, async (opened, page) => {
+  await opened.type("C | Xyz9 F |\nG7 | C", 5);
+  assert.deepEqual(await opened.numerals(), ["I", "", "IV", "V7", "I"]);
+  assert.deepEqual(await opened.texts(".marks mark"), ["Xyz9"]);
+  const fault = page.locator(".faults button").first();
+  assert.match(await fault.textContent(), /Line 1.*Xyz9/);
+  await fault.click();
+  const selected = await page.$eval("#song", (area) => area.value.slice(area.selectionStart, area.selectionEnd));
+  assert.equal(selected, "Xyz9");
+});
+
+for (const [form, text, symbols] of [
+  ["ChordPro", "{title: Grace}\nA[G]mazing [C]grace how [D7]sweet the [G]sound", ["G", "C", "D7", "G"]],
+  ["chords above lyrics", "Title\nby Me\n\n[Verse]\nG        D7     G\nA line of song here", ["G", "D7", "G"]],
+  ["a link with a chart", "irealbook://Tune=Me=Swing=C=n={*AT44C^7 |A-7 |D-7 |G7 }", ["C^7", "A-7", "D-7", "G7"]],
+]) {
+  onPage(`A song comes as ${form}`, {}, async (opened) => {
+    await opened.type(text, symbols.length);
+    assert.deepEqual((await opened.symbols()).map((symbol) => symbol.replace("\u25B3", "^").replace("\u2212", "-")), symbols);
+  });
+}
+
+onPage("A chord is explained, on a piano and as fingerings", {}, async (opened, page) => {
+  await opened.type("Am | E7 | Am | Am7", 4);
+  await page.click("[data-chord='1']");
+  assert.equal(await page.textContent(".sentence"), "E7 is the dominant of A minor, which follows.");
+  assert.equal(await page.locator(".piano").getAttribute("aria-label"), "Piano: E, G\u266F, B, D");
+  assert.equal(await page.locator(".piano .down").count(), 4);
+  assert.ok((await page.locator(".grid").count()) >= 2);
+  await page.click("[data-chord='3']");
+  await page.waitForSelector(".grid[aria-label='Frets x 0 2 0 1 0']");
+});
+
+onPage("What could come next is ranked, and one is inserted behind its chord", {}, async (opened, page) => {
+  await opened.type("Dm7 . G7 . | C . . . | F | C", 5);
+  await page.click("[data-chord='1']");
+  await page.waitForSelector(".next button");
+  const names = await page.locator(".next button").evaluateAll((buttons) => buttons.map((button) => button.ariaLabel));
+  assert.ok(names.length >= 5);
+  assert.match(names[0], /^Insert C, I, tonic, \d+ %$/);
+  const percents = names.map((name) => (name.includes("<") ? 0 : Number(/(\d+) %/.exec(name)[1])));
+  assert.deepEqual(percents, [...percents].sort((a, b) => b - a));
+  await page.locator(".next button").first().click();
+  await opened.shows(6);
+  assert.deepEqual((await opened.symbols()).slice(0, 4), ["Dm7", "G7", "C", "C"]);
+  await page.click(".undo");
+  await opened.shows(5);
+});
+
+for (const [names, symbols] of [
+  ["german", ["B7", "H7", "F#m", "Eb"]],
+  ["solfege", ["Sib7", "Si7", "Fa#m", "Mib"]],
+  ["nashville", ["b77", "77", "#4-", "b3"]],
+  ["roman", ["bVII7", "V7/iii", "#iv", "bIII"]],
+]) {
+  onPage(`Chords have other names: ${names}`, {}, async (opened, page) => {
+    await opened.type("C | Bb7 | B7 | F#m | Eb | G7 | C", 7);
+    await page.selectOption(".names select", names);
+    await page.waitForFunction(() => document.querySelector("[data-chord='1'] .symbol").textContent !== "B\u266D7");
+    const shown = (await opened.symbols()).slice(1, 5).map((text) => text.replaceAll("\u266D", "b").replaceAll("\u266F", "#"));
+    assert.deepEqual(shown, symbols);
+  });
+}
+
+onPage("A song is transposed up, down and back to what was typed", {}, async (opened, page) => {
+  const typed = "Tune\nby Me\n\n[A]\nDm7 . G7 . | Cmaj7 . . . | Am . E7 . | Am . . .";
+  await opened.type(typed, 6);
+  await page.click("[aria-label='Up a semitone']");
+  await page.waitForFunction(() => document.querySelector(".key-of-song").textContent.includes("D\u266D major"));
+  assert.deepEqual(await opened.symbols(), ["E\u266Dm7", "A\u266D7", "D\u266Dmaj7", "B\u266Dm", "F7", "B\u266Dm"]);
+  assert.equal(await page.locator(".bar").count(), 4);
+  await page.click("[aria-label='Down a semitone']");
+  await page.waitForFunction((text) => document.querySelector("#song").value === text, typed);
+});
+
+onPage("A dropped score is read and can be written as chords", {}, async (opened, page) => {
+  await opened.drop("dream.musicxml", example("scores/beautiful-dreamer.musicxml"));
+  await page.waitForFunction(() => document.querySelector(".title")?.textContent === "Beautiful Dreamer");
+  assert.equal(await page.locator(".time").first().getAttribute("aria-label"), "3/4 time");
+  const symbols = await opened.symbols();
+  await page.getByRole("button", { name: "Write it as chords" }).click();
+  await page.waitForSelector("#song");
+  await page.waitForFunction(() => document.querySelectorAll("[data-chord]").length > 0);
+  assert.ok(symbols.length > 10);
+});
+
+onPage("A song plays: notes are sent, the clock moves and the bar is lit", {}, async (opened, page) => {
+  await opened.type("C . . . | F . . . | G7 . . . | C . . .", 4);
+  await page.fill(".tempo input", "240");
+  await page.getByRole("button", { name: "Play", exact: true }).click();
+  await page.waitForFunction(() => document.querySelector(".clock").textContent === "counting in");
+  await page.waitForFunction(() => document.querySelector(".clock").textContent === "bar 2 of 4");
+  assert.equal(await page.locator(".bar.lit [data-chord]").getAttribute("data-chord"), "1");
+  assert.ok((await page.evaluate(() => window.sent)) >= 6);
+  await page.getByRole("button", { name: "Stop" }).click();
+  await page.waitForFunction(() => document.querySelector(".clock").textContent === "");
+  assert.equal(await page.locator(".bar.lit").count(), 0);
+  const sent = await page.evaluate(() => window.sent);
+  await page.waitForTimeout(500);
+  assert.equal(await page.evaluate(() => window.sent), sent);
+});
+
+onPage("A song is taken away as SVG, MIDI, JSON and ChordPro", {}, async (opened) => {
+  await opened.type("My Tune\nby Me\n\n[A]\nDm7 | G7 | C | C", 4);
+  const svg = await opened.saves("SVG");
+  assert.equal(svg.name, "my-tune.svg");
+  assert.match(svg.bytes.toString(), /^<svg[^]*My Tune[^]*<\/svg>\s*$/);
+  assert.equal((await opened.saves("MIDI")).bytes.subarray(0, 4).toString(), "MThd");
+  const json = JSON.parse((await opened.saves("JSON")).bytes.toString());
+  assert.deepEqual(json.Reading.Chords.map(({ Numeral }) => Numeral), ["ii7", "V7", "I", "I"]);
+  const chordPro = (await opened.saves("ChordPro")).bytes.toString();
+  assert.match(chordPro, /\{title: ?My Tune\}/);
+  await opened.type(chordPro, 4);
+  assert.deepEqual(await opened.symbols(), ["Dm7", "G7", "C", "C"]);
+});
+
+onPage("A link holds the song, its names and tempo", {}, async (opened, page) => {
+  const typed = "Tune & <more>\nby Me\n\n[A]\nDm7 | G7 | C | C";
+  await opened.type(typed, 4);
+  await page.selectOption(".names select", "german");
+  await page.fill(".tempo input", "96");
+  await page.press(".tempo input", "Tab");
+  await page.getByRole("button", { name: "Link", exact: true }).click();
+  await page.waitForFunction(() => location.hash.startsWith("#song="));
+  const other = await Page.open(browser, { hash: new URL(page.url()).hash });
+  await other.shows(4);
+  assert.equal(await other.page.inputValue("#song"), typed);
+  assert.equal(await other.page.inputValue(".names select"), "german");
+  assert.equal(await other.page.inputValue(".tempo input"), "96");
+  await other.close();
+});
+
+onPage("The page works without a network once it is loaded", {}, async (opened, page) => {
+  await page.evaluate(() => navigator.serviceWorker.ready);
+  await page.waitForFunction(() => navigator.serviceWorker.controller !== null);
+  await opened.context.setOffline(true);
+  await page.reload();
+  await opened.type("Gm | D7 | Gm | Gm", 4);
+  assert.deepEqual(await opened.numerals(), ["i", "V7", "i", "i"]);
+  await page.getByRole("button", { name: "Play", exact: true }).click();
+  await page.waitForFunction(() => window.sent > 0);
+});
