@@ -68,7 +68,7 @@ struct XmlStreamParser::Callbacks {
             }
             if (self.mText.size() + self.mUnwantedLength <= kXmlMaxTextLength) return;
             self.mText.clear();
-            parse.Refuse("text too long");
+            parse.Refuse(xml::kXmlTextTooLong);
         });
     }
 };

@@ -1,11 +1,15 @@
 // SPDX-License-Identifier: MIT
 // What the program makes of scores, beside what the library makes of them.
 
+#include "tests/cli/Archives.h"
+#include "tests/support/ScratchFolder.h"
 #include "tests/support/Transcript.h"
 
 #include "brindle/analysis/CHarmonicAnalyse.h"
+#include "brindle/platform/AtomicFile.h"
 
 #include <doctest/doctest.h>
+#include <fmt/format.h>
 
 #include <sstream>
 #include <string>
@@ -34,6 +38,58 @@ TEST_CASE("The chord text of a score is read back as the same chords at the same
         "grep -oE '\"(Symbol|Position)\": *[^,]*'; }; "
         "chords $f >a; chords --file t --beats-per-bar 3 >b; test -s a && cmp a b";
     CHECK(RunCommand(compare).mShown == "");
+}
+
+TEST_CASE("A compressed score is read wherever its members stand, with or without a list of them") {
+    const CScratchFolder folder;
+    const std::string score =
+        ReadFile(BRINDLE_SOURCE_DIR "/examples/scores/frere-jacques.musicxml");
+    const std::string list =
+        "<container><rootfiles><rootfile full-path='a/b/song.xml'/></rootfiles></container>";
+    const std::string listName = "META-INF/container.xml";
+    const TMembers packings[] = {
+        {{listName, list}, {"a/b/song.xml", score}},
+        {{listName, list}, {"other.xml", "<score-partwise/>"}, {"a/b/song.xml", score}},
+        {{listName, "<container><rootfiles>"}, {"META-INF/x.xml", "<x/>"}, {"a/song.xml", score}},
+        {{"a/b/c/song.musicxml", score}},
+    };
+    const std::string commands[] = {"import", "import --json", "harmonies", "analyse"};
+    for (const std::string& command : commands) {
+        const std::string plain =
+            RunCommand("brindle " + command + " examples/scores/frere-jacques.musicxml").mShown;
+        for (const TMembers& members : packings) {
+            const std::string file = folder.File("song.mxl");
+            REQUIRE(WriteFileAtomically(file, PackedArchive("zip", members)));
+            INFO(command);
+            INFO(members.front().second);
+            CHECK(RunCommand("brindle " + command + " " + file).mShown == plain);
+        }
+    }
+}
+
+TEST_CASE("A fault of a score is told at its place, behind blanks and a byte order mark, too") {
+    const std::string commands[] = {"import", "harmonies", "analyse", "analyse --timing native"};
+    for (const std::string& command : commands) {
+        const auto told = [&](const std::string& bytes) {
+            return RunCommand("printf '" + bytes + "' | brindle " + command + " -").mShown;
+        };
+        const auto place = [&](int line, int column) {
+            const std::string shown = command == "import"
+                                          ? fmt::format("Line {}, column {}: ", line, column)
+                                          : fmt::format("{}:{}: ", line, column);
+            return "[stderr]\nbrindle: standard input: " + shown;
+        };
+        INFO(command);
+        const bool isLenient = command == "harmonies" || command == "analyse";
+        for (const std::string& mark : {std::string(), std::string("\\357\\273\\277")}) {
+            const std::string head = mark + "\\n  <?xml version=\"1.0\"?>";
+            // The readers of harmonies go on behind blanks.
+            const auto where = isLenient ? place(3, 21) : place(2, 8);
+            CHECK(told(head + "\\n<score-partwise></b></score-partwise>").starts_with(where));
+            const std::string odd = "<?xml version=\"1.0\" encoding=\"Klingon\"?>";
+            CHECK(told(mark + odd + "<score-partwise/>").starts_with(place(1, 39)));
+        }
+    }
 }
 
 TEST_CASE("A container that holds no score, or cannot be unpacked, is told as what it is") {

@@ -193,6 +193,52 @@ TEST_CASE("An element with thousands of attributes is refused with its place, at
     }
 }
 
+TEST_CASE("What is too long or too deep is told as that, with its place") {
+    const std::string longText(10'000'001, 'x');
+    const std::string longerText(11'000'000, 'x');
+    const std::string longName(50'001, 'n');
+    const auto nested = [](const std::string& open, int depth) {
+        return Repeated(depth, [&](int) { return open; });
+    };
+    struct CRow {
+        std::string mBytes;
+        const char* mDescription;
+    };
+    const CRow rows[] = {
+        {"<a>\n" + nested("<b>", 300), "elements inside each other more than 256 deep"},
+        {"<!DOCTYPE a [\n<!ELEMENT a " + nested("(", 200) + "b",
+         "document type with brackets inside each other more than 128 deep"},
+        {"<a>\n<b>" + longText + "</b></a>", "text longer than 10,000,000 bytes"},
+        {"<a>\n<![CDATA[" + longText + "]]></a>", "text longer than 10,000,000 bytes"},
+        {"<a>\n<b c='" + longText + "'/></a>", "attribute or entity longer than 10,000,000 bytes"},
+        {"<a>\n<b c='" + longerText + "'/></a>",
+         "attribute or entity longer than 10,000,000 bytes"},
+        {"<!DOCTYPE a [\n<!ENTITY e '" + longText + "'>]><a/>",
+         "attribute or entity longer than 10,000,000 bytes"},
+        {"<a>\n<?p " + longText + "?></a>", "processing instruction longer than 10,000,000 bytes"},
+        {"<a>\n<" + longName + "/></a>", "name longer than 50,000 bytes"},
+    };
+    for (const CRow& row : rows) {
+        INFO(row.mBytes.substr(0, 30));
+        for (const auto& error : {StreamError(row.mBytes), TreeError(row.mBytes)}) {
+            REQUIRE(error);
+            CHECK(error->mDescription == row.mDescription);
+            CHECK(error->mLine == 2);
+        }
+    }
+    CHECK(TreeError("<a>\n<!--" + longText + "--></a>")->mDescription ==
+          "comment longer than 10,000,000 bytes");
+}
+
+TEST_CASE("A fault inside an entity is told where the document has it") {
+    const std::string bytes =
+        "<!DOCTYPE a [<!ENTITY e '&f;'><!ENTITY f '&e;'>]>\n<a>\n<b/>some &e;</a>";
+    for (const auto& error : {StreamError(bytes), TreeError(bytes)}) {
+        REQUIRE(error);
+        CHECK(error->mLine == 3);
+    }
+}
+
 TEST_CASE("Namespaces and default attributes take no more time than the file is long") {
     const auto names = [](int n) { return " xmlns:a" + std::to_string(n) + "='1'"; };
     CHECK(StreamError("<a" + Repeated(1'001, names) + "/>"));

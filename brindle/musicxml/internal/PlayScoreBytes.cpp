@@ -14,8 +14,22 @@ namespace brindle {
 
 namespace {
 
-std::string_view WithoutLeadingWhite(std::string_view bytes) {
-    return bytes.substr(std::min(bytes.find_first_not_of(" \t\r\n"), bytes.size()));
+std::string_view WithoutByteOrderMark(std::string_view bytes) {
+    constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
+    if (bytes.starts_with(kByteOrderMark)) bytes.remove_prefix(kByteOrderMark.size());
+    return bytes;
+}
+
+std::string_view LeadingWhite(std::string_view bytes) {
+    return bytes.substr(0, bytes.find_first_not_of(" \t\r\n"));
+}
+
+/// The place of a fault that was found behind `white`.
+void MoveBehind(std::string_view white, XmlError& error) {
+    if (error.mLine <= 0) return;
+    const std::size_t lastLine = white.rfind('\n') + 1;  // 0 if there is none
+    if (error.mLine == 1) error.mColumn += static_cast<int>(white.size() - lastLine);
+    error.mLine += static_cast<int>(std::count(white.begin(), white.end(), '\n'));
 }
 
 // The bytes as UTF-8 if they are Latin-1 with letters that UTF-8 does not know.
@@ -43,12 +57,16 @@ std::optional<std::string> FromLatin1(std::string_view bytes) {
 
 // Some scores say UTF-8, or nothing, and are Latin-1.
 CScoreReading ReadScoreInAnyEncoding(std::string_view bytes) {
-    CScoreReading reading = ReadScore(WithoutLeadingWhite(bytes));
+    bytes = WithoutByteOrderMark(bytes);
+    const std::string_view white = LeadingWhite(bytes);
+    const std::string_view score = bytes.substr(white.size());
+    CScoreReading reading = ReadScore(score);
     if (!reading.mError) return reading;
-    if (const auto text = FromLatin1(WithoutLeadingWhite(bytes))) {
+    if (const auto text = FromLatin1(score)) {
         CScoreReading other = ReadScore(*text);
         if (!other.mError) return other;
     }
+    MoveBehind(white, *reading.mError);
     return reading;
 }
 

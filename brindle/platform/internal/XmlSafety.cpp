@@ -9,6 +9,8 @@
 #include <libxml/xmlerror.h>
 
 #include <algorithm>
+#include <array>
+#include <cstring>
 #include <mutex>
 #include <new>
 #include <string>
@@ -28,7 +30,48 @@ constexpr const char* kTooManyAttributes = "element with more than 1000 attribut
 
 constexpr int kOptions = XML_PARSE_NOENT | XML_PARSE_NONET | XML_PARSE_BIG_LINES;
 
+constexpr const char* kAttributeTooLong = "attribute or entity longer than 10,000,000 bytes";
+
+/// What the XML library says where a document is beyond one of its limits, which it tells as short
+/// memory or as an option that a program could set; and what that is for people.
+struct CLimitWords {
+    const char* mMessage;
+    const char* mWords;
+};
+
+constexpr auto kLimitWords = std::to_array<CLimitWords>({
+    {"Excessive depth", "elements inside each other more than 256 deep"},
+    {"ContentDecl : depth", "document type with brackets inside each other more than 128 deep"},
+    {"huge text node", kXmlTextTooLong},
+    {"CData section too big", kXmlTextTooLong},
+    {"AttValue length too long", kAttributeTooLong},
+    {"entity value too long", kAttributeTooLong},
+    {"Huge input lookup", kAttributeTooLong},
+    {"buffer error: text too long", kAttributeTooLong},
+    {"Comment too big", "comment longer than 10,000,000 bytes"},
+    {" too big found", "processing instruction longer than 10,000,000 bytes"},
+    {"Name too long", "name longer than 50,000 bytes"},
+});
+static_assert(XML_MAX_TEXT_LENGTH == 10'000'000 && XML_MAX_NAME_LENGTH == 50'000);
+
+/// Null for an error that is no limit.
+const char* WordsOfLimit(const char* message) {
+    if (message == nullptr) return nullptr;
+    const auto found =
+        std::find_if(kLimitWords.begin(), kLimitWords.end(), [message](const CLimitWords& row) {
+            return std::strstr(message, row.mMessage) != nullptr;
+        });
+    return found == kLimitWords.end() ? nullptr : found->mWords;
+}
+
+bool IsShortMemory(const xmlError& error) {
+    return error.code == XML_ERR_NO_MEMORY && WordsOfLimit(error.message) == nullptr;
+}
+
 XmlError ErrorFrom(const xmlError& error) {
+    if (const char* const words = WordsOfLimit(error.message)) {
+        return {XML_ERR_INTERNAL_ERROR, words, error.line, error.int2};
+    }
     std::string text = error.message == nullptr ? "unknown XML error" : error.message;
     std::replace(text.begin(), text.end(), '\n', ' ');
     while (!text.empty() && text.back() == ' ') text.pop_back();
@@ -58,7 +101,7 @@ CErrorListener::~CErrorListener() {
 }
 
 void CErrorListener::Hear(void* self, xmlErrorPtr error) {
-    if (error->code == XML_ERR_NO_MEMORY) static_cast<CErrorListener*>(self)->mWasShort = true;
+    if (IsShortMemory(*error)) static_cast<CErrorListener*>(self)->mWasShort = true;
 }
 
 CMemoryWatch::CMemoryWatch() : mListener((StartLibrary(), CErrorListener())) {}
@@ -121,8 +164,22 @@ struct CParse::Callbacks {
     // Only the first fault is kept, and only one that makes the text not well-formed.
     static void FaultFound(void* context, xmlErrorPtr error) {
         CParse& parse = Of(context);
-        if (error->code == XML_ERR_NO_MEMORY) parse.mWasMemoryShort = true;
-        if (error->level == XML_ERR_FATAL) parse.Guarded([&] { parse.Keep(ErrorFrom(*error)); });
+        const bool isLimit = WordsOfLimit(error->message) != nullptr;
+        if (isLimit) parse.mIsBeyondLimit = true;
+        // Behind a limit the library tells of short memory that it never asked for.
+        if (IsShortMemory(*error) && !parse.mIsBeyondLimit) parse.mWasMemoryShort = true;
+        if (error->level != XML_ERR_FATAL && !isLimit) return;
+        parse.Guarded([&] {
+            XmlError fault = ErrorFrom(*error);
+            // A fault inside an entity, which may have a context of its own, stands where the
+            // document has it.
+            if (context != &parse.Context() || parse.Context().inputNr > 1) {
+                const xmlParserInput& document = *parse.Context().inputTab[0];
+                fault.mLine = document.line;
+                fault.mColumn = document.col;
+            }
+            parse.Keep(std::move(fault));
+        });
     }
 };
 

@@ -17,6 +17,9 @@
 
 namespace brindle::xml {
 
+/// What a text is told that is longer than kXmlMaxTextLength.
+inline constexpr const char* kXmlTextTooLong = "text longer than 10,000,000 bytes";
+
 /// Starts the XML library once, before the first thread uses it.
 void StartLibrary();
 
@@ -108,6 +111,7 @@ private:
     int mLineOfLongTag = 0;
     int mColumnInLongTag = 0;
     bool mWasMemoryShort = false;
+    bool mIsBeyondLimit = false;  // of the XML library
     std::optional<XmlError> mError;
     std::exception_ptr mThrown;
 };
