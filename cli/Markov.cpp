@@ -43,6 +43,9 @@ std::optional<VariableLengthMarkovModel> ReadModel(const std::string& path) {
     }
     if (model.mMaxHistoryLength > kLongestOrder) return fail("has histories that are too long");
     if (model.mTransitionMap.empty()) return fail("is a model that has learned nothing");
+    if (!model.mTransitionMap.HasUsualCounts()) {
+        return fail("is a damaged model: a symbol follows 1 to 2147483647 times");
+    }
     return model;
 }
 

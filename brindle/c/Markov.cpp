@@ -45,6 +45,9 @@ brindle_status ReadModel(const std::string& text, brindle_markov** model) {
     if (order > kLongestOrder) {
         return Fail(BRINDLE_ERROR_INPUT, "the model has histories that are too long");
     }
+    if (!result->mModel.mTransitionMap.HasUsualCounts()) {
+        return Fail(BRINDLE_ERROR_INPUT, "the model has counts that are 0 or too large");
+    }
     *model = result.release();
     return BRINDLE_OK;
 }

@@ -177,6 +177,21 @@ std::vector<const CMarkovTransitions*> CMarkovTransitionMap::OfLength(std::size_
     return entries;
 }
 
+bool CMarkovTransitionMap::HasUsualCounts() const {
+    constexpr std::uint64_t most = std::numeric_limits<std::int32_t>::max();
+    const auto areUsual = [](const CEntry& entry) {
+        std::uint64_t sum = 0;
+        for (const auto& [symbol, count] : entry.mCounts) {
+            if (count == 0) return false;
+            sum += count;
+        }
+        return sum <= most;
+    };
+    return std::all_of(mEntries.begin(), mEntries.end(), [&](const std::vector<CEntry>& piece) {
+        return std::all_of(piece.begin(), piece.end(), areUsual);
+    });
+}
+
 CMarkovTransitionMap& CMarkovTransitionMap::operator=(CMarkovTransitionMap&& other) noexcept {
     CMarkovTransitionMap moved(std::move(other));
     Swap(moved);

@@ -55,6 +55,11 @@ public:
     /// The same without order.
     [[nodiscard]] std::vector<const CMarkovTransitions*> OfLength(std::size_t length) const;
 
+    /// Whether the counts are such as learning gives, which those of a file need not be: none is 0,
+    /// and those of no history add up to more than 2^31 - 1, as a sum that is negative would
+    /// follow.
+    [[nodiscard]] bool HasUsualCounts() const;
+
     /// Forgets all histories; what Find and InOrder gave is dead then.
     void Clear();
 

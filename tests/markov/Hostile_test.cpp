@@ -51,6 +51,34 @@ TEST_CASE("A model file cannot ask for histories without end") {
     CHECK(model.mTransitionMap.size() == 1);
 }
 
+TEST_CASE("Counts that learning does not give are read as they are, and told") {
+    struct CRow {
+        const char* mCounts;
+        const char* mRead;
+        bool mIsUsual;
+    };
+    const CRow rows[] = {
+        {"[[0,1],[1,3]]", "[[0,1],[1,3]]", true},
+        {"[[0,2147483647]]", "[[0,2147483647]]", true},
+        {"[[0,2147483647],[1,1]]", "[[0,2147483647],[1,1]]", false},
+        {"[[0,0],[1,3]]", "[[0,0],[1,3]]", false},
+        {"[[0,1],[1,-1]]", "[[0,1],[1,4294967295]]", false},
+        {"[[0,4294967295]]", "[[0,4294967295]]", false},
+        {"[[0,1.5],[1,\"3\"],[1,null]]", "[]", true},
+        {"[]", "[]", true},
+    };
+    for (const CRow& row : rows) {
+        INFO(row.mCounts);
+        const auto model =
+            Read(R"("CMarkovObjects":[{"Type":4},{"Type":5}],"TransitionMap":[[[1,0],)" +
+                 std::string(row.mCounts) + "]]");
+        const auto* const counts = model.mTransitionMap.Find(MarkovSequence{model.mObjects.At(0)});
+        REQUIRE(counts != nullptr);
+        CHECK(TableForm(*counts) == nlohmann::json::parse(row.mRead));
+        CHECK(model.mTransitionMap.HasUsualCounts() == row.mIsUsual);
+    }
+}
+
 TEST_CASE("A transition map that is no list is none") {
     CHECK(Read(R"("CMarkovObjects":[{"Type":4}],"TransitionMap":{"a":[[0],[[0,2]]]})")
               .mTransitionMap.empty());
