@@ -153,6 +153,7 @@
 #include "brindle/platform/Error.h"
 #include "brindle/platform/FileNode.h"
 #include "brindle/platform/FileTree.h"
+#include "brindle/platform/JsonString.h"
 #include "brindle/platform/Localization.h"
 #include "brindle/platform/LogWriter.h"
 #include "brindle/platform/PlainText.h"

@@ -3,6 +3,8 @@
 
 #include "cli/Output.h"
 
+#include "brindle/platform/JsonString.h"
+
 #include <fmt/format.h>
 #include <sys/stat.h>
 #include <unistd.h>
@@ -60,15 +62,9 @@ private:
     bool mHasHalfLine = false;
 };
 
-/// As its line tells it: JSON has no other bytes than those of UTF-8.
-std::string AsTold(std::string_view text) {
-    const nlohmann::json json = std::string(text);
-    return json.dump(-1, ' ', false, nlohmann::json::error_handler_t::replace);
-}
-
+// As its line tells it: no text of JSON has an end of line in it, or bytes that are no UTF-8.
 std::uint64_t KeyOfSource(std::string_view path, std::string_view member) {
-    // No text of JSON has an end of line in it.
-    return std::hash<std::string>{}(AsTold(path) + '\n' + AsTold(member));
+    return std::hash<std::string>{}(JsonString(path) + '\n' + JsonString(member));
 }
 
 // What a line has in front of the song, and no more of it: most of the line are its chords.

@@ -12,6 +12,7 @@
 #include "brindle/musicxml/ScoreContainer.h"
 #include "brindle/platform/Alerts.h"
 #include "brindle/platform/AtomicFile.h"
+#include "brindle/platform/JsonString.h"
 #include "brindle/present/ImportMidi.h"
 #include "brindle/present/ImportText.h"
 
@@ -119,14 +120,14 @@ std::string ResultLine(bool isOk, const Error& error) {
         line["code"] = error.code;
         line["description"] = error.description;
     }
-    return line.dump(-1, ' ', false, Json::error_handler_t::replace) + '\n';
+    return DumpJson(line) + '\n';
 }
 
 std::string HeadOf(const std::string& name, bool isFirst, const CImportOptions& options) {
     if (options.mFiles.size() == 1) return {};
     if (!options.IsNdjson()) return SongHead(name, isFirst);
     const Json line{{"call", "song"}, {"name", name}};
-    return line.dump(-1, ' ', false, Json::error_handler_t::replace) + '\n';
+    return DumpJson(line) + '\n';
 }
 
 // The file first: who reads the output may stop before its end.

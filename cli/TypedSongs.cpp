@@ -3,9 +3,9 @@
 
 #include "cli/CCommand.h"
 #include "cli/Input.h"
-#include "cli/Json.h"
 #include "cli/Progress.h"
 
+#include "brindle/platform/JsonString.h"
 #include "brindle/present/CJsonWriter.h"
 
 #include <fmt/format.h>
@@ -96,8 +96,7 @@ std::string SongHead(std::string_view name, bool isFirst) {
 }
 
 std::string JsonLine(std::string_view name, std::string_view json) {
-    const Json typed = std::string(name);
-    std::string line = "{\"Song\":" + typed.dump(-1, ' ', false, Json::error_handler_t::replace);
+    std::string line = "{\"Song\":" + JsonString(name);
     const std::size_t first = json.find('{') + 1;
     const bool isEmpty = json.find_first_not_of(" \n", first) == json.find('}', first);
     if (!isEmpty) line += ',';

@@ -1,11 +1,12 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/musicxml/MuxmlJson.h"
 
+#include "brindle/platform/JsonString.h"
+
 #include <fmt/format.h>
 
 #include <cmath>
 #include <iterator>
-#include <nlohmann/json.hpp>
 
 namespace brindle {
 
@@ -35,7 +36,7 @@ void CMuxmlJson::Append(std::string& text, double value) {
 }
 
 void CMuxmlJson::Append(std::string& text, std::string_view value) {
-    text += nlohmann::json(value).dump(-1, ' ', false, nlohmann::json::error_handler_t::replace);
+    text += JsonString(value);
 }
 
 }  // namespace brindle

@@ -85,7 +85,8 @@ void TNote::SetVelocities() {
     }
 }
 
-// Each note has the ties that are written at it.
+// Each note has the ties that are written at it. Its place and length are those of the event import
+// again behind this.
 void TNote::PlayAsWritten(std::int32_t ticks) {
     CMuxmlNote& note = EncounteredNote;
     note.mPositionAsMidiTicks = Context().WrittenChordPosAsMidiTicks;

@@ -21,14 +21,6 @@ std::uint32_t CodeByteAt(std::string_view bytes, std::size_t index) {
     return static_cast<unsigned char>(bytes[index]);
 }
 
-/// `length` is what Utf8Length told, not 0.
-std::uint32_t CodePoint(std::string_view text, std::size_t length) {
-    std::uint32_t code = CodeByteAt(text, 0);
-    if (length > 1) code &= 0x7Fu >> length;
-    for (std::size_t i = 1; i < length; ++i) code = code << 6 | (CodeByteAt(text, i) & 0x3F);
-    return code;
-}
-
 void AppendUnit(std::string& bytes, std::uint32_t unit) {
     bytes += static_cast<char>(unit >> 8 & 0xFF);
     bytes += static_cast<char>(unit & 0xFF);
@@ -59,7 +51,7 @@ std::optional<std::string> Utf16FromUtf8(std::string_view text) {
     while (!text.empty()) {
         const std::size_t length = Utf8Length(text);
         if (length == 0) return std::nullopt;
-        const std::uint32_t code = CodePoint(text, length);
+        const std::uint32_t code = CodePointOf(text.substr(0, length));
         if (code >= kFirstPair) {
             AppendUnit(bytes, kHighSurrogates + ((code - kFirstPair) >> 10));
             AppendUnit(bytes, kLowSurrogates + ((code - kFirstPair) & 0x3FF));

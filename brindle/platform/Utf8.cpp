@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/platform/Utf8.h"
 
+#include <algorithm>
 #include <array>
 
 namespace brindle {
@@ -28,6 +29,19 @@ constexpr auto kLeadBytes = std::to_array<CLeadByte>({
     {0xF4, 0xF4, 4, 0x80, 0x8F},
 });
 
+struct CCodeRange {
+    std::uint32_t mFirst;
+    std::uint32_t mLast;
+};
+
+constexpr auto kUnprintable = std::to_array<CCodeRange>({
+    {0x0000, 0x001F},
+    {0x007F, 0x009F},
+    {0x2028, 0x202E},
+    {0x2066, 0x2069},
+    {0xFFFE, 0xFFFF},
+});
+
 bool Fits(const CLeadByte& row, std::string_view text) {
     if (text.size() < row.mLength) return false;
     for (std::size_t i = 1; i < row.mLength; ++i) {
@@ -48,6 +62,22 @@ std::size_t Utf8Length(std::string_view text) {
         if (lead >= row.mFirst && lead <= row.mLast) return Fits(row, text) ? row.mLength : 0;
     }
     return 0;
+}
+
+std::uint32_t CodePointOf(std::string_view character) {
+    std::uint32_t code = static_cast<unsigned char>(character[0]);
+    if (character.size() > 1) code &= 0x7FU >> character.size();
+    for (const char byte : character.substr(1)) {
+        code = code << 6 | (static_cast<unsigned char>(byte) & 0x3FU);
+    }
+    return code;
+}
+
+bool IsUnprintable(std::string_view character) {
+    const std::uint32_t code = CodePointOf(character);
+    return std::any_of(kUnprintable.begin(), kUnprintable.end(), [code](const CCodeRange& range) {
+        return code >= range.mFirst && code <= range.mLast;
+    });
 }
 
 }  // namespace brindle

@@ -7,6 +7,7 @@
 #include "brindle/present/CJsonWriter.h"
 
 #include "brindle/analysis/Positions.h"
+#include "brindle/platform/JsonString.h"
 
 #include <fmt/format.h>
 
@@ -24,20 +25,11 @@ constexpr std::size_t kIndent = 2;
 // Whole numbers beyond have an exponent.
 constexpr double kLargestPlainNumber = 1e15;
 
-bool IsPlainInJson(char c) {
-    return c >= 0x20 && c < 0x7F && c != '"' && c != '\\';
-}
-
-std::string Quoted(std::string_view text) {
-    if (std::all_of(text.begin(), text.end(), IsPlainInJson)) return fmt::format("\"{}\"", text);
-    return nlohmann::json(text).dump(-1, ' ', false, nlohmann::json::error_handler_t::replace);
-}
-
 }  // namespace
 
 CJsonWriter& CJsonWriter::Key(std::string_view name) {
     BeginPart();
-    Append(Quoted(name));
+    Append(JsonString(name));
     Append(IsPending() ? ":" : ": ");
     if (IsPending()) mParts.back().mKeyEnd = mPending.size();
     mIsBehindKey = true;
@@ -57,7 +49,7 @@ CJsonWriter& CJsonWriter::Number(double value) {
 }
 
 CJsonWriter& CJsonWriter::String(std::string_view text) {
-    return Scalar(Quoted(text));
+    return Scalar(JsonString(text));
 }
 
 std::string CJsonWriter::Text() && {

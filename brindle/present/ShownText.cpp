@@ -12,15 +12,6 @@ namespace {
 
 constexpr std::string_view kReplacement = "\xEF\xBF\xBD";  // U+FFFD
 
-bool IsControl(std::string_view character) {
-    const auto lead = static_cast<unsigned char>(character[0]);
-    if (character.size() == 1) return lead < 0x20 || lead == 0x7F;
-    // U+0080 to U+009F, which some terminals obey.
-    if (lead == 0xC2) return static_cast<unsigned char>(character[1]) < 0xA0;
-    // U+FFFE and U+FFFF, which XML does not allow.
-    return character == "\xEF\xBF\xBE" || character == "\xEF\xBF\xBF";
-}
-
 }  // namespace
 
 std::string Printable(std::string_view text) {
@@ -29,7 +20,7 @@ std::string Printable(std::string_view text) {
     while (!text.empty()) {
         const std::size_t length = Utf8Length(text);
         const std::string_view character = text.substr(0, length == 0 ? 1 : length);
-        const bool isFine = length > 0 && !IsControl(character);
+        const bool isFine = length > 0 && !IsUnprintable(character);
         printable += isFine ? character : kReplacement;
         text.remove_prefix(character.size());
     }

@@ -10,8 +10,8 @@ namespace brindle {
 
 // Text as people see it: what is safe to show, and how wide it is. All of it is UTF-8.
 
-/// The text without what would disturb a terminal or an XML file: control characters and bytes that
-/// are no UTF-8 become U+FFFD.
+/// The text without what would disturb a terminal or an XML file: unprintable characters (see
+/// IsUnprintable) and bytes that are no UTF-8 become U+FFFD.
 [[nodiscard]] std::string Printable(std::string_view text);
 
 /// The number of characters of a text, which is its width in a fixed font.

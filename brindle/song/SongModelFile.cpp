@@ -2,6 +2,7 @@
 #include "brindle/song/SongModelFile.h"
 
 #include "brindle/chords/WriteChordSymbol.h"
+#include "brindle/platform/JsonString.h"
 #include "brindle/theory/ReadKeyText.h"
 
 #include <fmt/format.h>
@@ -62,11 +63,8 @@ std::string SumOf(const std::vector<CTaughtSong>& songs) {
 }
 
 void AppendSong(const CTaughtSong& song, std::string& text) {
-    const auto quoted = [](const std::string& value) {
-        return Json(value).dump(-1, ' ', false, Json::error_handler_t::replace);
-    };
     text += fmt::format(R"({{"Title":{},"Style":{},"Key":"{}","BeatsPerBar":{},"Begin":{},)",
-                        quoted(song.mTitle), quoted(song.mStyle), KeyNameOf(song.mKey),
+                        JsonString(song.mTitle), JsonString(song.mStyle), KeyNameOf(song.mKey),
                         song.mBeatsPerBar, song.mChords.front().mBegin);
     text += "\"Chords\":[";
     for (std::size_t ix = 0; ix < song.mChords.size(); ++ix) {
