@@ -40,6 +40,9 @@ TEST_CASE("Keys are read in English and in German") {
         {"D dorian", "error at 2"}, {"F♯ minor", "F# Minor"},
         {"B♭", "Bb Major"},         {"b♭m", "Bb Minor"},
         {"c♯ moll", "C# Minor"},    {"F♯ dorian", "error at 5"},
+        {"E flat", "Eb Major"},     {"F Sharp minor", "F# Minor"},
+        {"b-flat m", "Bb Minor"},   {"E flatter", "error at 2"},
+        {"A sharps", "error at 2"}, {"E flat dorian", "error at 7"},
     };
     for (const auto& row : rows) {
         INFO(std::string(row.mTyped));
