@@ -144,8 +144,10 @@ FileNode GChDatabase::writeLibrariesToDbPackageWrapper(bool onlyUserLibraries) c
 bool GChDatabase::writeLibraries(const std::vector<std::shared_ptr<GChLibrary>>& libraries,
                                  std::string_view toNewDbPackagePath) {
     const fs::path path = ExpandTilde(toNewDbPackagePath);
-    return PlaceAt(path) != TDestination::Foreign &&
-           WriteFolderAtomically(path, PackageOf(libraries));
+    const FileNode package = PackageOf(libraries);
+    // A build without property lists writes no packages, rather than damaged ones.
+    if (package.Child(kInfoName)->mContents.empty()) return false;
+    return PlaceAt(path) != TDestination::Foreign && WriteFolderAtomically(path, package);
 }
 
 bool GChDatabase::updateDatabaseFiles() {

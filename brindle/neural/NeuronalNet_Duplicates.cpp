@@ -57,7 +57,8 @@ std::vector<TIndexPair> Conflicts(const std::vector<training_pattern>& patterns)
         const auto end = std::find_if(begin, order.end(), [&](std::size_t index) {
             return patterns[index].mInputs != patterns[*begin].mInputs;
         });
-        AddConflicts(patterns, std::span(&*begin, static_cast<std::size_t>(end - begin)), conflicts);
+        AddConflicts(patterns, std::span(&*begin, static_cast<std::size_t>(end - begin)),
+                     conflicts);
         begin = end;
     }
     std::sort(conflicts.begin(), conflicts.end());

@@ -84,7 +84,8 @@ private:
 };
 
 /// A whole XML document as a tree. The same limits hold as for XmlStreamParser: nothing outside the
-/// bytes is read.
+/// bytes is read. In a library that was built with BRINDLE_SCORES=OFF every text is a fault, here
+/// and there.
 class XmlDocument {
 public:
     /// The tree of the bytes, or the first fault that makes them not well-formed.
