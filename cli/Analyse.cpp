@@ -100,6 +100,9 @@ std::optional<std::string> Contradiction(const CAnalyseOptions& options) {
     if (options.mGrids && options.mFormat.Format() != TFormat::Svg) {
         return "--grids belong into a picture, --format svg";
     }
+    if ((options.mGrids || options.mReadings) && options.mSheetPicture.IsSheetTold()) {
+        return "--grids and --readings are drawn over a time axis, --picture axis";
+    }
     if ((options.mCapo > 0 || options.mIsLeftHanded) && !options.mGrids) {
         return "--capo and --left are for --grids";
     }

@@ -120,6 +120,24 @@ std::string WordBehind(const CLI::App& app, const TTypedWords& words) {
     return depth < words.size() && !words[depth].starts_with("-") ? words[depth] : std::string();
 }
 
+std::string ValueNameOf(const CLI::Option& option) {
+    if (option.get_items_expected_max() == 0) return {};
+    const std::string& text = option.get_option_text();
+    return text.find_first_not_of(' ') == text.npos ? "VALUE" : text;
+}
+
+// What is missing behind an option, or the message of CLI11 for what else is wrong with their
+// count.
+std::string MissingValue(const CLI::App& app, const std::string& message) {
+    const std::string name = message.substr(0, message.find(": "));
+    if (!message.ends_with(" missing") || message.find(" required ") == message.npos) {
+        return message;
+    }
+    const CLI::Option* const option = app.get_option_no_throw(name);
+    if (option == nullptr) return message;
+    return fmt::format("{} needs a value behind it: {} {}", name, name, ValueNameOf(*option));
+}
+
 // CLI11 asks for help and version by exceptions, too; these end well.
 TStatus Report(const CLI::App& program, const CLI::ParseError& error, const TTypedWords& words) {
     if (error.get_exit_code() == static_cast<int>(CLI::ExitCodes::Success)) {
@@ -133,8 +151,14 @@ TStatus Report(const CLI::App& program, const CLI::ParseError& error, const TTyp
         if (!typed.empty()) return FailForCommand(app, typed);
         return FailForUnknown(app, words, error.what());
     }
-    const bool isUnknown = error.get_exit_code() == static_cast<int>(CLI::ExitCodes::ExtrasError);
-    return isUnknown ? FailForUnknown(app, words, error.what()) : FailWithHelp(app, error.what());
+    const auto isOfKind = [&](CLI::ExitCodes code) {
+        return error.get_exit_code() == static_cast<int>(code);
+    };
+    if (isOfKind(CLI::ExitCodes::ExtrasError)) return FailForUnknown(app, words, error.what());
+    if (isOfKind(CLI::ExitCodes::ArgumentMismatch)) {
+        return FailWithHelp(app, MissingValue(app, error.what()));
+    }
+    return FailWithHelp(app, error.what());
 }
 
 // One of some words, or the nearest of them in the message.
@@ -155,12 +179,6 @@ std::vector<std::string> NamesOf(const CLI::Option& option) {
     for (const std::string& name : option.get_snames()) names.push_back('-' + name);
     for (const std::string& name : option.get_lnames()) names.push_back("--" + name);
     return names;
-}
-
-std::string ValueNameOf(const CLI::Option& option) {
-    if (option.get_items_expected_max() == 0) return {};
-    const std::string& text = option.get_option_text();
-    return text.find_first_not_of(' ') == text.npos ? "VALUE" : text;
 }
 
 COptionPage PageOf(const CLI::Option& option) {
@@ -233,6 +251,7 @@ CCommand& CCommand::AddCommand(const CCommandHelp& help) {
 
 void CCommand::AlsoCalled(const std::string& name) {
     mApp->alias(name);
+    mOtherName = mName.substr(0, mName.rfind(' ') + 1) + name;
 }
 
 COption CCommand::AddArgument(const std::string& name, std::string& word,
@@ -303,7 +322,7 @@ void CCommand::OnCall(std::function<TStatus()> call) {
 }
 
 CCommandPage CCommand::Page() const {
-    CCommandPage page{mName, mApp->get_description(), mExamples, {}, {}};
+    CCommandPage page{mName, mOtherName, mApp->get_description(), mExamples, {}, {}};
     for (const CLI::Option* const option : mApp->get_options()) {
         page.mOptions.push_back(PageOf(*option));
         const auto choices = mChoices.find(option);

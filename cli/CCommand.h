@@ -109,6 +109,7 @@ private:
     std::shared_ptr<CLI::App> mApp;
     /// As it is called, with the names of the commands above.
     std::string mName;
+    std::string mOtherName;
     std::string mExamples;
     std::map<const CLI::Option*, std::vector<std::string>> mChoices;
     /// How the command that is called ends; one for the program and all its commands.

@@ -31,6 +31,8 @@ struct COptionPage {
 struct CCommandPage {
     /// As it is called, "brindle markov learn".
     std::string mName;
+    /// Another name that it has, "brindle analyze"; empty for none.
+    std::string mOtherName;
     std::string mPurpose;
     /// Calls that work, one a line, and behind a blank line what there is to know.
     std::string mExamples;

@@ -2,11 +2,16 @@
 #include "cli/GridOptions.h"
 
 #include "cli/CommandLine.h"
+#include "cli/DidYouMean.h"
 #include "cli/Input.h"
 
+#include "brindle/guitarchords/Tunings.h"
 #include "brindle/present/ChordGrid.h"
 
 #include <fmt/format.h>
+
+#include <string>
+#include <vector>
 
 namespace brindle::cli {
 
@@ -52,12 +57,16 @@ CGridStyle CFingeringOptionsOfUser::Style() const {
 
 std::optional<GChShortTuning> ReadTuningOption(const std::string& text) {
     const auto tuning = ReadTuning(text);
-    if (!tuning) {
-        Fail(TStatus::BadUsage, Printable(text) +
-                                    " is no tuning: a name, as drop-d or ukulele, letters from the "
-                                    "lowest string, as in DADGAD, or pitches, as in E2A2D3G3B3E4");
-    }
-    return tuning;
+    if (tuning) return tuning;
+    std::vector<std::string> names;
+    for (const CNamedTuning& named : NamedTunings()) names.emplace_back(named.mName);
+    const std::string meant = DidYouMean(text, names);
+    Fail(TStatus::BadUsage,
+         fmt::format("{} is no tuning{}", Printable(text),
+                     !meant.empty() ? meant
+                                    : ": a name, as drop-d or ukulele, letters from the lowest "
+                                      "string, as in DADGAD, or pitches, as in E2A2D3G3B3E4"));
+    return std::nullopt;
 }
 
 TStatus FailWithoutFingering(const std::string& symbol, const GChShortTuning& tuning) {

@@ -113,6 +113,16 @@ std::optional<bool> ImportFrom(const std::string& file, const MusicXmlParserDele
     return MusicXmlParser().parseURL(file, std::make_shared<MusicXmlParserDelegate>(host), &error);
 }
 
+/// The same, and a terminal shows how many bars of all parts have been read.
+std::optional<bool> ImportWithProgress(const std::string& file, MusicXmlParserDelegate host,
+                                       Error& error) {
+    CCountProgress progress(InputName(file), "bars");
+    host.didEncounterMeasureStart =
+        Both(std::move(host.didEncounterMeasureStart),
+             std::function<void(std::int32_t)>([&progress](std::int32_t) { progress.CountOne(); }));
+    return ImportFrom(file, host, error);
+}
+
 std::string ResultLine(bool isOk, const Error& error) {
     Json line{{"call", "result"}, {"ok", isOk}};
     if (!isOk) {
@@ -154,7 +164,7 @@ CImported ImportFile(const std::string& file, const CImportOptions& options) {
         methods = options.mMidiFile ? Both(lines, methods) : lines;
     }
     Error error;
-    const auto isOk = ImportFrom(file, methods, error);
+    const auto isOk = ImportWithProgress(file, std::move(methods), error);
     if (!isOk) return {};
     if (!*isOk) Fail(TStatus::BadInput, fmt::format("{}: {}", name, Printable(error.description)));
     if (*isOk && options.mMidiFile && WriteMidi(score, *options.mMidiFile) != TStatus::Success) {

@@ -89,6 +89,11 @@ bool IsNoChordButAFile(const std::string& word) {
     return LooksLikeFileName(word) && !ReadChordText(word).mFault.empty();
 }
 
+// What a song has between its symbols, and what is no symbol itself.
+bool IsBarLineOrHold(const std::string& word) {
+    return !word.empty() && (word == "." || word.find_first_not_of("|:") == word.npos);
+}
+
 std::optional<std::string> ReadInputs(const std::vector<std::string>& names) {
     std::string all;
     for (const std::string& name : names) {
@@ -152,10 +157,19 @@ std::vector<std::string> WordsOf(std::string_view text) {
 }
 
 std::optional<std::vector<std::string>> TypedSymbols(const std::vector<std::string>& words) {
-    if (!AreInputs(words)) return words;
-    const auto text = ReadInputs(words);
-    if (!text) return std::nullopt;
-    return WordsOf(*text);
+    std::vector<std::string> symbols = words;
+    if (AreInputs(words)) {
+        const auto text = ReadInputs(words);
+        if (!text) return std::nullopt;
+        symbols = WordsOf(*text);
+    }
+    std::erase_if(symbols, IsBarLineOrHold);
+    if (!symbols.empty()) return symbols;
+    const bool isOneFile = words.size() == 1 && AreInputs(words);
+    Fail(TStatus::BadInput,
+         fmt::format("{} no chord symbols",
+                     isOneFile ? InputName(words.front()) + " has" : std::string("there are")));
+    return std::nullopt;
 }
 
 }  // namespace brindle::cli

@@ -43,7 +43,8 @@ namespace brindle::cli {
 /// The pieces of a text between white space.
 [[nodiscard]] std::vector<std::string> WordsOf(std::string_view text);
 
-/// The words of a command line, or those of its inputs.
+/// The words of a command line, or those of its inputs, without bar lines and the "." of songs.
+/// Nothing when there are none, or when an input cannot be read; then the error has been printed.
 [[nodiscard]] std::optional<std::vector<std::string>> TypedSymbols(
     const std::vector<std::string>& words);
 

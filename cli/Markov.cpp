@@ -6,6 +6,7 @@
 
 #include "brindle/markov/ReadMarkovSequence.h"
 #include "brindle/platform/SeededRandom.h"
+#include "brindle/song/SongModelFile.h"
 
 #include <fmt/format.h>
 
@@ -32,12 +33,15 @@ std::optional<VariableLengthMarkovModel> ReadModel(const std::string& path) {
     using Helper = VariableLengthMarkovModel::JSONDeserialization_Helper;
     const auto text = ReadInput(path);
     if (!text) return std::nullopt;
-    VariableLengthMarkovModel model;
-    Helper::VariableLengthMarkovModelFromJSONString(*text, model);
     const auto fail = [&](std::string_view what) {
         Fail(TStatus::BadInput, fmt::format("{} {}", InputName(path), what));
         return std::nullopt;
     };
+    if (LooksLikeSongModel(*text)) {
+        return fail("is a model of songs and no plain one; brindle markov learn --plain makes one");
+    }
+    VariableLengthMarkovModel model;
+    Helper::VariableLengthMarkovModelFromJSONString(*text, model);
     if (model.mMaxHistoryLength == 0) {
         return fail("is no model file; brindle markov learn --plain makes one");
     }

@@ -12,8 +12,9 @@ namespace {
 constexpr CCommandHelp kMarkovFillHelp{
     "fill",
     "Put a chord into each gap of a sequence, by what the model knows of its neighbours",
-    "  brindle markov fill model.json \"(4,C);(4,U);(4,G7);(4,C)\"\n"
-    "  brindle markov fill model.json \"(2,Dm);(2,U);(4,C)\" --seed 1 --json\n",
+    "  brindle markov learn --plain -o plain.json songs/\n"
+    "  brindle markov fill plain.json \"(4,C);(4,U);(4,G7);(4,C)\"\n"
+    "  brindle markov fill plain.json \"(2,Dm);(2,U);(4,C)\" --seed 1 --json\n",
 };
 
 struct CFillOptions {
@@ -44,7 +45,7 @@ TStatus MarkovFill(const CFillOptions& options) {
 void AddMarkovFill(CCommand& markov) {
     CCommand& command = markov.AddCommand(kMarkovFillHelp);
     const auto options = std::make_shared<CFillOptions>();
-    command.AddArgument("MODEL", options->mModel, "Model file; - reads standard input").Required();
+    command.AddArgument("MODEL", options->mModel, "Plain model; - reads standard input").Required();
     command.AddArgument("SEQUENCE", options->mSequence, "Chords with their lengths; U is a gap")
         .Required();
     command.AddOption("--seed", "S", options->mSeed, "Repeats a run exactly");

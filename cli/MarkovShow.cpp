@@ -11,8 +11,9 @@ namespace {
 constexpr CCommandHelp kMarkovShowHelp{
     "show",
     "Show what a model has learned: its size, how sure it is, and what follows a history",
-    "  brindle markov show model.json\n"
-    "  brindle markov show model.json --history \"(4,Dm7);(4,G7)\"\n",
+    "  brindle markov learn --plain -o plain.json songs/\n"
+    "  brindle markov show plain.json\n"
+    "  brindle markov show plain.json --history \"(4,Dm7);(4,G7)\"\n",
 };
 
 struct CShowOptions {
@@ -50,7 +51,7 @@ TStatus MarkovShow(const CShowOptions& options) {
 void AddMarkovShow(CCommand& markov) {
     CCommand& command = markov.AddCommand(kMarkovShowHelp);
     const auto options = std::make_shared<CShowOptions>();
-    command.AddArgument("MODEL", options->mModel, "Model file; - reads standard input").Required();
+    command.AddArgument("MODEL", options->mModel, "Plain model; - reads standard input").Required();
     command.AddOption("--history", "CHORDS", options->mHistory,
                       "Show what follows these chords (default: the start of a sequence)");
     command.AddOption("--top", "N", options->mTop, "Continuations to show (default: 10)");

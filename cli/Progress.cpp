@@ -7,6 +7,7 @@
 #include <unistd.h>
 
 #include <cstdio>
+#include <utility>
 
 namespace brindle::cli {
 namespace {
@@ -17,6 +18,26 @@ constexpr std::size_t kNameWidth = 40;
 constexpr std::chrono::milliseconds kUnshown{500};
 
 }  // namespace
+
+CCountProgress::CCountProgress(std::string_view name, std::string unit)
+    : mName(FirstCharacters(Printable(name), kNameWidth)),
+      mUnit(std::move(unit)),
+      mIsTerminal(isatty(STDERR_FILENO) == 1),
+      mNextShow(TClock::now() + kUnshown) {}
+
+CCountProgress::~CCountProgress() {
+    if (mIsShown) fmt::print(stderr, "\r\x1B[K");
+}
+
+void CCountProgress::CountOne() {
+    constexpr std::chrono::milliseconds pause{100};
+    ++mCount;
+    if (!mIsTerminal || TClock::now() < mNextShow) return;
+    mNextShow = TClock::now() + pause;
+    mIsShown = true;
+    fmt::print(stderr, "\r\x1B[K{}: {} {}", mName, mCount, mUnit);
+    std::fflush(stderr);
+}
 
 CProgress::CProgress(std::size_t steps)
     : mSteps(steps), mIsTerminal(steps > 1 && isatty(STDERR_FILENO) == 1) {}

@@ -30,4 +30,26 @@ private:
     std::chrono::steady_clock::time_point mBegin = std::chrono::steady_clock::now();
 };
 
+/// The same for a work whose length nobody knows: a line that tells how much has been done.
+class CCountProgress {
+public:
+    /// `name` is what is worked on, `unit` what is counted: "bars".
+    CCountProgress(std::string_view name, std::string unit);
+    CCountProgress(const CCountProgress&) = delete;
+    CCountProgress& operator=(const CCountProgress&) = delete;
+    ~CCountProgress();
+
+    void CountOne();
+
+private:
+    using TClock = std::chrono::steady_clock;
+
+    std::string mName;
+    std::string mUnit;
+    std::size_t mCount = 0;
+    bool mIsTerminal;
+    bool mIsShown = false;
+    TClock::time_point mNextShow;
+};
+
 }  // namespace brindle::cli

@@ -8,6 +8,8 @@ namespace brindle::cli {
 void CSheetPicture::AddTo(CCommand& command) {
     command.AddChoice("--picture", mPicture, {"sheet", "axis"},
                       "Draw a lead sheet, or a time axis with the centers");
+    // Empty until it is told.
+    mPicture.clear();
     command.AddOption("--bars-per-line", "N", mOptions.mBarsPerLine,
                       "Bars on a line of the lead sheet (default: 4)");
     command.AddOption("--width", "PIXELS", mOptions.mWidth,

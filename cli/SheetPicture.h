@@ -27,6 +27,9 @@ public:
     /// Whether the time axis with the centers is wanted instead.
     [[nodiscard]] bool IsAxis() const { return mPicture == "axis"; }
 
+    /// Whether nothing but the lead sheet will do.
+    [[nodiscard]] bool IsSheetTold() const { return mPicture == "sheet"; }
+
     /// The picture of a song.
     [[nodiscard]] std::string Draw(const CSong& song, const CSongReading& reading) const;
 

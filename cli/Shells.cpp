@@ -3,6 +3,7 @@
 
 #include "cli/CommandLine.h"
 #include "cli/Completions.h"
+#include "cli/DidYouMean.h"
 #include "cli/ManPage.h"
 
 #include "brindle/Version.h"
@@ -53,12 +54,17 @@ TStatus WriteManPages(const CCommandPage& program, const std::filesystem::path& 
 
 TStatus Manual(const CCommandPage& program, const CManualOptions& options) {
     if (!options.mFolder.empty()) return WriteManPages(program, options.mFolder);
-    const std::string name = fmt::format("{}{}{}", program.mName, options.mWords.empty() ? "" : " ",
-                                         fmt::join(options.mWords, " "));
+    const std::string words = fmt::format("{}", fmt::join(options.mWords, " "));
+    const std::string name = program.mName + (words.empty() ? "" : " ") + words;
+    std::vector<std::string> names;
     for (const CCommandPage* const page : AllPages(program)) {
-        if (page->mName == name) return Print(ManPage(*page, program, BrindleVersionString));
+        if (page->mName == name || page->mOtherName == name) {
+            return Print(ManPage(*page, program, BrindleVersionString));
+        }
+        names.push_back(page->WordsBelow());
     }
-    return Fail(TStatus::BadUsage, fmt::format("there is no command {}", Printable(name)));
+    return Fail(TStatus::BadUsage,
+                fmt::format("there is no command {}{}", Printable(name), DidYouMean(words, names)));
 }
 
 }  // namespace

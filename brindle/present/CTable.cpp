@@ -12,13 +12,14 @@ namespace brindle {
 
 CTable::CTable(std::vector<std::string> columns) : mColumns(std::move(columns)) {
     for (std::string& column : mColumns) {
-        mIsRightAligned.push_back(column.front() == ' ');
+        mIsRightAligned.push_back(column.starts_with(' '));
         if (mIsRightAligned.back()) column.erase(0, 1);
         mWidths.push_back(CountCharacters(column));
     }
 }
 
 void CTable::AddRow(std::vector<std::string> cells) {
+    cells.resize(mColumns.size());
     for (std::size_t i = 0; i < mWidths.size(); ++i) {
         mWidths[i] = std::max(mWidths[i], CountCharacters(cells[i]));
     }

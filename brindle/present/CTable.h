@@ -13,10 +13,11 @@ namespace brindle {
 /// blank is not shown.
 class CTable {
 public:
-    /// The names of the columns, none of them empty.
+    /// The names of the columns.
     explicit CTable(std::vector<std::string> columns);
 
-    /// One cell for each column.
+    /// A cell for each column; those that are missing are empty, and what are too many are left
+    /// out.
     void AddRow(std::vector<std::string> cells);
 
     /// The line of the names, without an end of line.

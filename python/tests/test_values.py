@@ -95,6 +95,11 @@ ERRORS = [
     (lambda: brindle.Scale("D dorain"),        brindle.ScaleError),
     (lambda: brindle.name([60, 200]),          brindle.NoteError),
     (lambda: brindle.name([]),                 brindle.NoteError),
+    (lambda: brindle.name([60], before="Q"),   brindle.ChordError),
+    (lambda: brindle.names([60], after=7),     TypeError),
+    (lambda: brindle.fingerings(7),            TypeError),
+    (lambda: brindle.grids("C", tuning=7),     TypeError),
+    (lambda: brindle.read("C").analyse(key=7), TypeError),
     (lambda: brindle.Chord("C").name("tonic"), ValueError),
     (lambda: brindle.Chord.of(brindle.Note("C"), [12]), ValueError),
     (lambda: brindle.Chord(7),                 TypeError),
@@ -127,6 +132,10 @@ def test_notes_are_named():
     assert brindle.name([60, 64, 67, 70]) == "C7"
     assert brindle.name([57, 60, 64, 67]) == "Am7"
     assert brindle.name([61, 65, 68], key="F# major") == "C#"
+    assert brindle.name([64, 67, 69, 72]) == "Am7/E"
+    assert brindle.name([64, 67, 69, 72], before=brindle.Chord("Dm7"), after="G7") == "C6/E"
+    assert brindle.names([64, 67, 69, 72], before="Dm7", after="G7")[0].cost == 86
+    assert brindle.name([64, 67, 69, 72], before="N.C.") == "Am7/E"
     assert [name.symbol for name in brindle.names([60, 63, 66, 69], limit=1)] == ["Cdim7"]
     assert brindle.names([]) == []
 

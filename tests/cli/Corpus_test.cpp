@@ -185,7 +185,7 @@ TEST_CASE("Links into a ring end, pipes of a folder are not waited for, and name
 
 TEST_CASE(
     "Links in an archive are not followed, and those named as songs have a line that says so") {
-    const CCorpusFolder folder({{"a.txt", "C G7 | C"}});
+    const CCorpusFolder folder(TMembers{{"a.txt", "C G7 | C"}});
     (void)folder.Run(
         "ln -s a.txt l.txt; ln a.txt h.txt; ln -s . up; tar cf s.tar a.txt h.txt l.txt up");
     const std::string fault = " it is a link, and links in archives are not followed";
@@ -259,7 +259,7 @@ TEST_CASE("Killed in the midst, a run goes on to the whole; asked to end, it lea
 }
 
 TEST_CASE("One signal ends a run that waits for a pipe, behind a whole line") {
-    const CCorpusFolder folder({{"a.txt", "C G7 | C"}});
+    const CCorpusFolder folder(TMembers{{"a.txt", "C G7 | C"}});
     for (const std::string words : {"pipe", "- <pipe"}) {
         CAPTURE(words);
         // The shell holds the pipe open; what does not end is killed, with another exit status.
@@ -273,7 +273,7 @@ TEST_CASE("One signal ends a run that waits for a pipe, behind a whole line") {
         CHECK(shown.starts_with("143"));
         CHECK(Digest(folder.Read("out")) == TDigest{"a.txt C Major"});
     }
-    CHECK(folder.Run("(sleep 0.2; echo 'F C7 | F' >pipe) & brindle corpus pipe >out; echo $?") ==
+    CHECK(folder.Run("((sleep 0.2; echo 'F C7 | F' >pipe) & brindle corpus pipe >out; echo $?)") ==
           "0\n");
     CHECK(Digest(folder.Read("out")) == TDigest{"pipe F Major"});
 }

@@ -2,6 +2,7 @@
 #include "Errors.h"
 
 #include <new>
+#include <typeinfo>
 
 namespace brindle::python {
 namespace {
@@ -18,6 +19,9 @@ void RaiseFault(const std::exception_ptr& thrown, void* /*payload*/) {
         const nb::tuple arguments =
             nb::make_tuple(textOf(fault.mMessage), textOf(fault.mText), fault.mPosition);
         PyErr_SetObject(kind.ptr(), arguments.ptr());
+    } catch (const std::bad_cast&) {
+        // Arguments of several types are cast by hand.
+        PyErr_SetString(PyExc_TypeError, "an argument is of another type than this function takes");
     }
 }
 

@@ -31,27 +31,45 @@ std::vector<CNote> NotesOfNumbers(const std::vector<int>& numbers) {
     return notes;
 }
 
-CNamingOptions OptionsFor(const nb::object& key, std::string_view bass, std::size_t limit) {
+/// The root of a neighbour; undefined for None and for no chord.
+int RootOf(const nb::object& chordOrSymbol) {
+    if (chordOrSymbol.is_none()) return kKeyNrUndef;
+    return ChordOf(chordOrSymbol).mRootKeyEnh.mKeyNr;
+}
+
+/// What is known of the notes besides themselves.
+struct CSurroundings {
+    nb::object mKey;
+    nb::object mBefore;
+    nb::object mAfter;
+};
+
+CNamingOptions OptionsFor(const CSurroundings& around, std::string_view bass, std::size_t limit) {
     CNamingOptions options;
-    options.mKey = KeyOf(key);
+    options.mKey = KeyOf(around.mKey);
+    options.mPreviousRoot = RootOf(around.mBefore);
+    options.mNextRoot = RootOf(around.mAfter);
     options.mBass = ValueOfWord("bass", bass, kBassUses);
     options.mLimit = limit;
     return options;
 }
 
 nb::list NamesOf(const std::vector<int>& notes, const nb::object& key, std::string_view bass,
-                 std::size_t limit) {
+                 const nb::object& before, const nb::object& after, std::size_t limit) {
     const nb::object record = RecordType("NamedChord");
+    const CNamingOptions options = OptionsFor({key, before, after}, bass, limit);
     nb::list names;
-    for (const CNamedChord& name : NameNotes(NotesOfNumbers(notes), OptionsFor(key, bass, limit))) {
+    for (const CNamedChord& name : NameNotes(NotesOfNumbers(notes), options)) {
         names.append(record(name.mSymbol, name.mExactSymbol, name.mChord, name.mCost));
     }
     return names;
 }
 
 std::string LikeliestName(const std::vector<int>& notes, const nb::object& key,
-                          std::string_view bass) {
-    const auto names = NameNotes(NotesOfNumbers(notes), OptionsFor(key, bass, 1));
+                          std::string_view bass, const nb::object& before,
+                          const nb::object& after) {
+    const CNamingOptions options = OptionsFor({key, before, after}, bass, 1);
+    const auto names = NameNotes(NotesOfNumbers(notes), options);
     if (names.empty()) throw CFault("NoteError", "no notes have no name");
     return names.front().mSymbol;
 }
@@ -59,13 +77,15 @@ std::string LikeliestName(const std::vector<int>& notes, const nb::object& key,
 constexpr const char* kName = R"(The likeliest name of notes, which are MIDI numbers in any order.
 
 `key` is that of the piece; `bass` tells whether the lowest note is the bass as "usual", is "only"
-the bass, or says "none", as on a ukulele.
+the bass, or says "none", as on a ukulele. `before` and `after` are the chords around the notes.
 
 >>> import brindle
 >>> brindle.name([60, 64, 67, 70])
 'C7'
 >>> brindle.name([64, 67, 72])
-'C/E')";
+'C/E'
+>>> brindle.name([64, 67, 69, 72], before="Dm7", after="G7")
+'C6/E')";
 
 constexpr const char* kNames =
     R"(All names of notes, the likeliest first, at most one for each root.
@@ -80,15 +100,20 @@ C6/A 55)";
 
 void BindNames(nb::module_& module) {
     module.def("name", LikeliestName, nb::arg("notes"), nb::kw_only(), nb::arg("key") = nb::none(),
-               nb::arg("bass") = "usual", kName,
+               nb::arg("bass") = "usual", nb::arg("before") = nb::none(),
+               nb::arg("after") = nb::none(), kName,
                nb::sig("def name(notes: collections.abc.Sequence[int], *, key: Key | str | None = "
-                       "None, bass: typing.Literal['usual', 'only', 'none'] = 'usual') -> str"));
+                       "None, bass: typing.Literal['usual', 'only', 'none'] = 'usual', "
+                       "before: Chord | str | None = None, after: Chord | str | None = None) "
+                       "-> str"));
     module.def(
         "names", NamesOf, nb::arg("notes"), nb::kw_only(), nb::arg("key") = nb::none(),
-        nb::arg("bass") = "usual", nb::arg("limit") = 12, kNames,
+        nb::arg("bass") = "usual", nb::arg("before") = nb::none(), nb::arg("after") = nb::none(),
+        nb::arg("limit") = 12, kNames,
         nb::sig("def names(notes: collections.abc.Sequence[int], *, key: Key | str | None = None, "
-                "bass: typing.Literal['usual', 'only', 'none'] = 'usual', limit: int = 12) -> "
-                "list[brindle._records.NamedChord]"));
+                "bass: typing.Literal['usual', 'only', 'none'] = 'usual', "
+                "before: Chord | str | None = None, after: Chord | str | None = None, "
+                "limit: int = 12) -> list[brindle._records.NamedChord]"));
 }
 
 }  // namespace brindle::python
