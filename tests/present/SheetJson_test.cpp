@@ -41,7 +41,7 @@ TEST_CASE("A sheet as JSON has bars, chords in pieces, arrows and keys with thei
     CHECK(sheet["Chords"][1]["Numeral"] == "V7");
     CHECK(sheet["Brackets"][0] == nlohmann::json{{"From", 0}, {"To", 1}, {"IsDotted", false}});
     CHECK(sheet["Arrows"][0] == nlohmann::json{{"From", 1}, {"To", 2}, {"IsDotted", false}});
-    CHECK(sheet["Keys"][sheet["Chords"][0]["Key"].get<int>()]["Name"] == "C major");
+    CHECK(sheet["Keys"][sheet["Chords"][0]["Key"].get<std::size_t>()]["Name"] == "C major");
     CHECK(sheet["Keys"][0]["Paper"].get<std::string>().size() == 7);
 }
 
