@@ -163,7 +163,7 @@ bool CWishedChord::Fits(int root, int bass, std::uint64_t mask) const {
                (mask & kBothSevenths & ~mSevenths) == 0;
     }
     const int wishedBass = mChord.HasBassNote() ? FoldIntoOctave(mChord.mBassKeyEnh.mKeyNr) : root;
-    return bass == wishedBass && mask == mChord.mSemitones.Mask();
+    return (mAnyBass || bass == wishedBass) && mask == mChord.mSemitones.Mask();
 }
 
 CSongWishReading ReadSheetWishes(std::string_view text, int beatsPerBar) {
@@ -197,7 +197,9 @@ CSongWishReading ReadChordsWish(TSongWishKind kind, std::string_view text,
             return reading;
         }
         wish.mChords.push_back(*chord);
-        if (kind == TSongWish_Never) wish.mChords.back().mSevenths = CWishedChord::kBothSevenths;
+        if (kind != TSongWish_Never) continue;
+        wish.mChords.back().mSevenths = CWishedChord::kBothSevenths;
+        wish.mChords.back().mAnyBass = !chord->mChord.HasBassNote();
     }
     if (words.empty()) {
         reading.mFault = "there are no chords";

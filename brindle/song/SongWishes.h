@@ -20,6 +20,8 @@ struct CWishedChord {
     /// Bit 10 for a minor seventh and bit 11 for a major one.
     std::uint64_t mSevenths = kBothSevenths;
 
+    bool mAnyBass = false;  ///< `mChord` over whichever bass
+
     /// Any seventh.
     static constexpr std::uint64_t kBothSevenths = 0b110000000000;
 
@@ -33,7 +35,7 @@ enum TSongWishKind : std::uint8_t {
     TSongWish_Begin,     ///< the song begins with this chord
     TSongWish_End,       ///< the song ends on this chord
     TSongWish_Contains,  ///< these chords stand somewhere, one behind the other
-    TSongWish_Never,     ///< none of these chords, over whichever bass
+    TSongWish_Never,     ///< none of these chords; without a bass of its own over none at all
 };
 
 /// What somebody wants of a song.

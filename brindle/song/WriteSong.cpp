@@ -43,9 +43,8 @@ CWrittenChords FirstBeats(const CWrittenChords& chords, std::size_t beats) {
 /// Writes the stretches of a plan and copies what is the same.
 class CPlanWriter {
 public:
-    CPlanWriter(const CSongModel& model, const CWriteSongOptions& options, CSongPlan& plan,
-                SeededRandom& random)
-        : mModel(model), mOptions(options), mPlan(plan), mRandom(random) {}
+    CPlanWriter(const CSongModel& model, CSongPlan& plan, SeededRandom& random)
+        : mModel(model), mPlan(plan), mRandom(random) {}
 
     [[nodiscard]] TStretchEnd Write() {
         for (std::size_t part = 0; part < mPlan.mParts.size(); ++part) {
@@ -90,7 +89,6 @@ private:
     }
 
     const CSongModel& mModel;
-    const CWriteSongOptions& mOptions;
     CSongPlan& mPlan;
     SeededRandom& mRandom;
     std::vector<CWrittenChords> mParts;
@@ -195,7 +193,7 @@ CWrittenSong WriteSong(const CSongModel& model, const CWriteSongOptions& options
     CSongPlan plan = PlanSong(model, options, wishes);
     SeededRandom random(options.mSeed);
     for (int tries = 0; tries < kMostTries; ++tries) {
-        CPlanWriter writer(model, options, plan, random);
+        CPlanWriter writer(model, plan, random);
         const TStretchEnd end = writer.Write();
         if (end == TStretch_Impossible)
             return RefusedSong("the songs of the model never come to rest in such a key");
