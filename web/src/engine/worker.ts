@@ -40,12 +40,17 @@ function namingOf(names: Names): { naming?: ChordNaming } {
   return names === "typed" ? {} : { naming: names };
 }
 
+/** "G#" with the sign that is printed. */
+function printed(name: string): string {
+  return name.charAt(0) + name.slice(1).replaceAll("#", "\u266F").replaceAll("b", "\u266D");
+}
+
 /** Tones one above the other, the bass lowest, as a hand could play them. */
 function stacked(tones: { pitchClass: number; name: string }[]): ChordDetail["notes"] {
   let last = belowPiano;
   return tones.map(({ pitchClass, name }) => {
     last += ((pitchClass - last - 1 + 144) % 12) + 1;
-    return { Name: name, NoteNr: last };
+    return { Name: printed(name), NoteNr: last };
   });
 }
 
