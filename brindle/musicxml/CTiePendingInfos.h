@@ -31,12 +31,13 @@ struct CTiePendingInfo {
 
 /// What the notes of a tie have in common: their pitch as it is written, on one staff in one voice.
 struct CTiedPitch {
-    std::int32_t mStaff = 0;
-    std::int32_t mVoice = 0;  ///< as the file numbers it
-    TMuxmlEnum_Step mStep = TMuxmlEnum_Step_Undef;
-    float mAlteration = 0.0F;
-    std::int32_t mOctave = 0;
+    std::int32_t mStaff = 0;                        ///< from 0, the highest one
+    std::int32_t mVoice = 0;                        ///< as the file numbers it
+    TMuxmlEnum_Step mStep = TMuxmlEnum_Step_Undef;  ///< undefined for an unpitched note
+    float mAlteration = 0.0F;                       ///< in semitones
+    std::int32_t mOctave = 0;                       ///< as it is written
 
+    /// What a note would be tied by.
     [[nodiscard]] static CTiedPitch Of(const CMuxmlNote& note);
 
     friend auto operator<=>(const CTiedPitch&, const CTiedPitch&) = default;

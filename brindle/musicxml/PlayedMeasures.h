@@ -26,10 +26,11 @@ struct CWrittenMeasures {
 
 /// How much of a song is written or played.
 struct CPlayExtent {
-    std::size_t mMeasures = 0;
-    std::size_t mHarmonies = 0;
-    std::size_t mBytes = 0;  ///< the room that the harmonies take, about
+    std::size_t mMeasures = 0;   ///< each as often as it is played
+    std::size_t mHarmonies = 0;  ///< the same
+    std::size_t mBytes = 0;      ///< the room that the harmonies take, about
 
+    /// One harmony more.
     void Add(const TMusicXMLHarmony& harmony);
     /// Whether the harmonies are no more than in `limits`.
     [[nodiscard]] bool HasRoomIn(const CPlayExtent& limits) const {

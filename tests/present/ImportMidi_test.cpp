@@ -116,9 +116,8 @@ TEST_CASE("Of several instruments the first that tells a key plays drums that na
     const std::string notes = Drum("") + Drum("I99") + Drum("I36");
     const auto keys = [&](const std::string& instruments) {
         std::vector<int> all;
-        for (const CMidiNote& note : MidiPieceOf(Import(instruments, notes)).mTracks[0].mNotes) {
-            all.push_back(note.mNoteNr);
-        }
+        const CMidiPiece piece = MidiPieceOf(Import(instruments, notes));
+        for (const CMidiNote& note : piece.mTracks[0].mNotes) all.push_back(note.mNoteNr);
         return all;
     };
     CHECK(keys(silent + Instrument("I42", 42) + Instrument("I36", 36)) ==
