@@ -79,7 +79,10 @@ def analyse_batch(
 def _large_binary(arrow: Any, texts: Any) -> Any:
     if arrow.types.is_dictionary(texts.type):
         texts = texts.dictionary_decode()
-    return texts.cast(arrow.large_binary())
+    try:
+        return texts.cast(arrow.large_binary())
+    except arrow.ArrowNotImplementedError:
+        raise TypeError(f"texts are an array of {texts.type}, not of strings") from None
 
 
 def _processors() -> int:
