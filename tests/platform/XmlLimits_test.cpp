@@ -217,6 +217,7 @@ TEST_CASE("What is too long or too deep is told as that, with its place") {
          "attribute or entity longer than 10,000,000 bytes"},
         {"<a>\n<?p " + longText + "?></a>", "processing instruction longer than 10,000,000 bytes"},
         {"<a>\n<" + longName + "/></a>", "name longer than 50,000 bytes"},
+        {"<!DOCTYPE a [\n<!ENTITY e '<b/>'>]><a>&e;</a>", "entity with elements inside"},
     };
     for (const CRow& row : rows) {
         INFO(row.mBytes.substr(0, 30));

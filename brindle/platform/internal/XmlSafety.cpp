@@ -146,13 +146,19 @@ struct CParse::Callbacks {
         parse.Guarded([&] { parse.Refuse("document type with more than 1000 attributes"); });
     }
 
-    // An external entity is never declared, so that a reference to it finds nothing to load.
+    // An external entity is never declared, so that a reference to it finds nothing to load. One
+    // with elements inside, which no score has, is copied into the tree wherever it is named: ten
+    // kilobytes become gigabytes.
     static void DeclareInternalEntity(void* context, const xmlChar* name, int type,
                                       const xmlChar* publicId, const xmlChar* systemId,
                                       xmlChar* content) {
         const bool isInternal =
             type == XML_INTERNAL_GENERAL_ENTITY || type == XML_INTERNAL_PARAMETER_ENTITY;
-        if (isInternal) xmlSAX2EntityDecl(context, name, type, publicId, systemId, content);
+        if (!isInternal) return;
+        xmlSAX2EntityDecl(context, name, type, publicId, systemId, content);
+        if (type == XML_INTERNAL_PARAMETER_ENTITY || xmlStrchr(content, '<') == nullptr) return;
+        CParse& parse = Of(context);
+        parse.Guarded([&] { parse.Refuse("entity with elements inside"); });
     }
 
     static void IgnoreExternalSubset(void*, const xmlChar*, const xmlChar*, const xmlChar*) {}
