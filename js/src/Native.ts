@@ -31,7 +31,8 @@ export class Native {
 
   /** The memory as it is now: it is another one after it has grown. */
   get view(): DataView {
-    if (this.#view.byteLength === 0) this.#view = new DataView(this.module.HEAPU8.buffer);
+    const { buffer } = this.module.HEAPU8;
+    if (this.#view.buffer !== buffer) this.#view = new DataView(buffer);
     return this.#view;
   }
 

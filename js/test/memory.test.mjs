@@ -1,6 +1,7 @@
 import assert from "node:assert/strict";
 import { test } from "node:test";
 import { setImmediate } from "node:timers/promises";
+import { load } from "../dist/index.js";
 import { brindle } from "./support.mjs";
 
 /** Bytes of the memory of WebAssembly, which Node counts as array buffers. */
@@ -37,4 +38,13 @@ test("what was freed cannot be used, and freeing again is nothing", () => {
   song.free();
   song.free();
   assert.throws(() => song.title, /freed/);
+});
+
+test("a song that needs more memory than there was is read, and what comes after it", async () => {
+  const fresh = await load();
+  const song = fresh.read("Dm7 | G7 | Cmaj7 | A7 | ".repeat(750));
+  const analysis = song.analyse();
+  assert.equal(analysis.sheet().Bars.length, 3000);
+  assert.equal(analysis.chords[1].numeral, "V7");
+  assert.equal(fresh.chord("F#m7/C#").symbol, "F#m7/C#");
 });
