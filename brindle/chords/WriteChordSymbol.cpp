@@ -52,6 +52,9 @@ constexpr auto kWholeChordRows = std::to_array<CSuffixRow>({
     {TonesOfKind("aug"), "aug"},
     {TonesOfKind("5"), "5"},
     {TonesOfKind("sus24"), "sus24"},
+    {TonesOfKind("13b9"), "13b9"},
+    {TonesOfKind("13#9"), "13#9"},
+    {TonesOfKind("13b9#11"), "13b9#11"},
 });
 
 struct CNumberRow {
