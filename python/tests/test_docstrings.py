@@ -37,14 +37,6 @@ def test_what_the_documents_show_holds(page, source_folder):
     assert doctest.DocTestRunner(optionflags=FLAGS).run(examples).failed == 0
 
 
-def test_what_the_page_of_engines_shows_is_python(source_folder):
-    text = (source_folder / "docs/engines.md").read_text(encoding="utf-8")
-    blocks = re.findall(r"^```python\n(.*?)^```", text, re.DOTALL | re.MULTILINE)
-    assert blocks
-    for block in blocks:
-        compile(block, "docs/engines.md", "exec")
-
-
 @pytest.mark.parametrize("name", OBJECTS)
 def test_what_is_public_has_an_example_that_holds(name):
     text = inspect.getdoc(OBJECTS[name])

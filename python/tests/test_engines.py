@@ -2,8 +2,10 @@
 
 import multiprocessing
 import os
+import re
 import shutil
 import signal
+import subprocess
 import sys
 
 import brindle
@@ -27,6 +29,19 @@ def analyse(songs):
     return brindle.analyse_batch(songs, threads=1)
 
 
+def run_script_of_page(page, source_folder, folder):
+    """Runs the script that a page of the documents shows; gives what it prints."""
+    text = (source_folder / "docs" / page).read_text(encoding="utf-8")
+    script = folder / "script.py"
+    script.write_text(re.search(r"^```python\n(.*?)^```", text, re.DOTALL | re.MULTILINE)[1])
+    environment = {**os.environ, "PYSPARK_PYTHON": sys.executable, "SPARK_LOCAL_IP": "127.0.0.1"}
+    done = subprocess.run(
+        [sys.executable, script], cwd=folder, env=environment, capture_output=True, text=True
+    )
+    assert done.returncode == 0, done.stderr
+    return done.stdout
+
+
 @pytest.mark.parametrize("method", ["fork", "spawn"])
 def test_multiprocessing(method):
     parts = [SONGS[start : start + 100] for start in range(0, len(SONGS), 100)]
@@ -38,24 +53,22 @@ def test_multiprocessing(method):
     assert [song.title for song in songs] == ["0", "1", "2", "3", "4"]
 
 
-def test_duckdb_over_parquet(tmp_path):
-    duckdb = pytest.importorskip("duckdb")
+def test_multiprocessing_as_the_page_shows_it(source_folder, tmp_path):
+    (tmp_path / "songs").mkdir()
+    for number in range(3):
+        (tmp_path / f"songs/{number}.txt").write_text("Dm7 G7 | C\n\nAm | E7 | Am\n")
+    printed = run_script_of_page("multiprocessing.md", source_folder, tmp_path)
+    assert printed.splitlines() == ["tonic 9", "dominant 6", "subdominant 3"]
+
+
+def test_duckdb_as_the_page_shows_it(source_folder, tmp_path):
+    pytest.importorskip("duckdb")
     parquet = pytest.importorskip("pyarrow.parquet")
     parquet.write_table(arrow.table({"text": SONGS}), tmp_path / "songs.parquet")
-    with duckdb.connect() as database:
-        songs = database.sql(f"select text from '{tmp_path}/songs.parquet'")
-        # Older releases have it by another name.
-        read = getattr(songs, "to_arrow_reader", None) or songs.fetch_record_batch
-        table = arrow.Table.from_batches(
-            brindle.analyse_batch(batch.column("text")) for batch in read(100)
-        )
-        assert keys_of(table) == EXPECTED
-        parquet.write_table(table, tmp_path / "analyses.parquet")
-        functions = database.sql(
-            f"select c.function, count(*) from (select unnest(chords) as c from "
-            f"'{tmp_path}/analyses.parquet') group by all order by all"
-        ).fetchall()
-    assert functions == [("dominant", 399), ("subdominant", 399), ("tonic", 399)]
+    printed = run_script_of_page("duckdb.md", source_folder, tmp_path)
+    for function in ["dominant", "subdominant", "tonic"]:
+        assert re.search(rf"\b{function}\b.*\b399\b", printed)
+    assert keys_of(parquet.read_table(tmp_path / "analyses.parquet")) == EXPECTED
 
 
 @pytest.fixture(scope="module")
@@ -106,3 +119,12 @@ def test_spark(spark, tmp_path, is_killed):
         (title, key or "") for title, key in EXPECTED
     )
     assert marker.exists() == is_killed
+
+
+def test_spark_as_the_page_shows_it(spark, source_folder, tmp_path):
+    parquet = pytest.importorskip("pyarrow.parquet")
+    parquet.write_table(arrow.table({"text": SONGS}), tmp_path / "songs.parquet")
+    printed = run_script_of_page("spark.md", source_folder, tmp_path)
+    assert re.search(r"C Major\|\s*399\|", printed)
+    rows = parquet.read_table(tmp_path / "analyses.parquet")
+    assert sorted(keys_of(rows), key=str) == sorted(EXPECTED, key=str)

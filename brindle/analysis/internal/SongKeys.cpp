@@ -73,10 +73,13 @@ double ConfidenceOf(const std::array<double, kKeyCount>& scores, int key) {
 CKeySpeller::CKeySpeller(const CHarmAnlsChords& chords, const CSignKeyLite& statedKey) {
     std::array<TEnh, 12> enhs;
     enhs.fill(TEnh_Undef);
-    for (const CHarmAnlsChord& chord : chords) {
-        if (chord.IsUndef()) continue;
-        TEnh& enh = enhs[static_cast<std::size_t>(FoldIntoOctave(chord.mRootKeyEnh.mKeyNr))];
-        if (enh == TEnh_Undef) enh = chord.mRootKeyEnh.mEnh;
+    std::size_t missing = enhs.size();
+    for (auto chord = chords.begin(); chord != chords.end() && missing > 0; ++chord) {
+        if (chord->IsUndef()) continue;
+        TEnh& enh = enhs[static_cast<std::size_t>(FoldIntoOctave(chord->mRootKeyEnh.mKeyNr))];
+        if (enh != TEnh_Undef || chord->mRootKeyEnh.mEnh == TEnh_Undef) continue;
+        enh = chord->mRootKeyEnh.mEnh;
+        --missing;
     }
     for (int key = 0; key < kKeyCount; ++key) {
         const int tonic = TonicOfKey(key);
