@@ -10,7 +10,7 @@ build="$root/build/package"
 need_packages "${program_packages[@]}" lintian dpkg-dev ${1:+debootstrap}
 
 say "building (log: build/package.log)"
-cmake -S . -B "$build" -G Ninja -DCMAKE_BUILD_TYPE=Release -DCMAKE_INSTALL_PREFIX=/usr \
+cmake --preset release -B "$build" -DCMAKE_INSTALL_PREFIX=/usr \
     -DBRINDLE_TESTS=OFF -DBRINDLE_BENCH=OFF -DBRINDLE_FUZZ=OFF ${BRINDLE_CMAKE_OPTIONS:-} \
     >"$root/build/package.log"
 cmake --build "$build" >>"$root/build/package.log"
@@ -28,6 +28,7 @@ if [ ! -e "$bare/etc/debian_version" ]; then
     say "setting up a bare Debian (log: build/debootstrap.log)"
     debootstrap --variant=minbase "$codename" "$bare" "$mirror" >"$root/build/debootstrap.log"
 fi
+rm -rf "$bare/tmp/"*
 cp "$build"/*.deb "$bare/tmp/"
 cp -r examples/host "$bare/tmp/"
 cat >"$bare/tmp/try.sh" <<'TRY'
@@ -56,4 +57,6 @@ TRY
 # The completion of bash reads from /dev/fd.
 mount -t proc proc "$bare/proc"
 trap 'umount "$bare/proc"' EXIT
-chroot "$bare" bash /tmp/try.sh
+# A bare Debian knows nothing of how this one builds.
+env -u CMAKE_CXX_COMPILER_LAUNCHER -u CMAKE_C_COMPILER_LAUNCHER -u CC -u CXX -u CXXFLAGS \
+    chroot "$bare" bash /tmp/try.sh
