@@ -294,6 +294,13 @@ brindle_status brindle_analysis_sheet_json(const brindle_analysis* analysis,
     });
 }
 
+brindle_status brindle_text_runs_json(const char* symbol, int is_numeral, char** text) {
+    if (text == nullptr) return FailForNull("text");
+    *text = nullptr;
+    if (symbol == nullptr) return FailForNull("symbol");
+    return Guarded([&] { return GiveText(brindle::TextRunsJson(symbol, is_numeral != 0), text); });
+}
+
 brindle_status brindle_analysis_symbols(const brindle_analysis* analysis, int naming,
                                         const brindle_style* style, char** lines) {
     if (lines != nullptr) *lines = nullptr;

@@ -536,6 +536,9 @@ BRINDLE_API brindle_status brindle_analysis_sheet(const brindle_analysis* analys
 BRINDLE_API brindle_status brindle_analysis_sheet_json(const brindle_analysis* analysis,
                                                        const brindle_sheet_options* options,
                                                        char** text);
+/** How a lead sheet sets a chord symbol, or a numeral if `is_numeral` is not 0, for hosts that draw
+ * it themselves: a JSON array of pieces, [text, size, base line above that of the whole], in em. */
+BRINDLE_API brindle_status brindle_text_runs_json(const char* symbol, int is_numeral, char** text);
 /** What stands for the chords, a line for each; `naming` is a brindle_chord_naming and `style`,
  * which may be NULL, that of BRINDLE_CHORDS_IN_STYLE. What sounds no chord keeps its symbol. */
 BRINDLE_API brindle_status brindle_analysis_symbols(const brindle_analysis* analysis, int naming,

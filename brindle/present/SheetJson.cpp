@@ -187,8 +187,8 @@ void WritePlayedBars(CJsonWriter& json, const CSong& song, const CSheet& sheet) 
     json.EndArray();
 }
 
-void WriteRuns(CJsonWriter& json, std::string_view name, const CTextRuns& runs) {
-    json.Key(name).BeginArray();
+void WriteRuns(CJsonWriter& json, const CTextRuns& runs) {
+    json.BeginArray();
     for (const CTextRun& run : runs) {
         json.BeginArray().String(run.mText).Number(run.mSize).Number(run.mRaise).EndArray();
     }
@@ -202,9 +202,9 @@ void WriteSheetChords(CJsonWriter& json, const CSong& song, const CSongReading& 
     for (std::size_t i = 0; i < sheet.mPositions.size(); ++i) {
         json.BeginObject().Key("Position").Number(sheet.mPositions[i]);
         json.Key("Symbol").String(JoinRuns(texts[i].mSymbol));
-        WriteRuns(json, "Runs", texts[i].mSymbol);
+        WriteRuns(json.Key("Runs"), texts[i].mSymbol);
         json.Key("Numeral").String(JoinRuns(texts[i].mNumeral));
-        WriteRuns(json, "NumeralRuns", texts[i].mNumeral);
+        WriteRuns(json.Key("NumeralRuns"), texts[i].mNumeral);
         WriteSheetIndex(json, "Key", keys.KeyOf(i));
         json.EndObject();
     }
@@ -242,6 +242,12 @@ std::string SheetJson(const CSong& song, const CSongReading& reading) {
     WriteLinks(json, "Arrows", links.mArrows);
     WriteLinks(json, "Brackets", links.mBrackets);
     json.EndObject();
+    return std::move(json).Text();
+}
+
+std::string TextRunsJson(std::string_view text, bool isNumeral) {
+    CJsonWriter json;
+    WriteRuns(json, isNumeral ? SetNumeral(text) : SetSymbol(text));
     return std::move(json).Text();
 }
 

@@ -51,11 +51,15 @@ CTypedHistory HistoryOf(const CSongModel& model, std::span<const CChordLite> cho
     return history;
 }
 
-/// The chord behind the others as a teacher reads it.
+// More than any passage gains by a key of its own.
+constexpr double kAlwaysHome = 1000.0;
+
+/// The chord behind the others as a teacher reads it, in the one key that the whole list is in.
 void SetReading(std::vector<CChordLite> chords, const CSignKeyLite& key, CNextChord& next) {
     chords.push_back(next.mChord);
     CReadingOptions options;
     options.mStatedKey = key;
+    options.mKeys.mHomeBonus = kAlwaysHome;
     const CSongReading reading = ReadHarmony(ListOf(chords), options);
     const CChordReading& last = reading.mChords[chords.size() - 1];
     next.mNumeral = last.mNumeral;

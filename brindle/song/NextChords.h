@@ -17,7 +17,7 @@ struct CNextChord {
     CChordLite mChord;
     /// Of all chords that may come, 0 to 1.
     double mProbability = 0.0;
-    /// What it is behind the chords before, "V7/ii".
+    /// What it is behind the chords before in the key that all are told in, "V7/ii".
     std::string mNumeral;
     THarmFunction mFunction = THarmFunction_Undef;  ///< what it does there
 };

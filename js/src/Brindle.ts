@@ -11,6 +11,9 @@ import { keyOf, rawKeyOfText, scaleOf, type Key, type Scale } from "./values.js"
 
 const usualOrder = 4;
 
+/** A piece of a text in one size: text, size in em, base line above that of the whole in em. */
+export type TextRun = [text: string, size: number, raise: number];
+
 /** The library; load() gives it. */
 export class Brindle {
   readonly #native: Native;
@@ -69,6 +72,14 @@ export class Brindle {
   /** What may come behind chords, by the songs that come with the library. */
   next(chords: readonly (Chord | string)[], options: NextOptions = {}): NextChords {
     return this.#next.ask(chords, options);
+  }
+  /** How a lead sheet sets a chord symbol or a numeral, for pages that draw it themselves. */
+  typeset(text: string, what: "symbol" | "numeral" = "symbol"): TextRun[] {
+    const native = this.#native;
+    const json = native.withText(text, (place) =>
+      native.givenText((out) => native.module._brindle_text_runs_json!(place, what === "numeral" ? 1 : 0, out)),
+    );
+    return JSON.parse(json) as TextRun[];
   }
   /** All notes of a score as a Standard MIDI File. */
   scoreMidi(bytes: Uint8Array): Uint8Array {

@@ -50,10 +50,12 @@ export class Native {
   text(place: number): string {
     if (place === 0) return "";
     const bytes = this.module.HEAPU8;
+    // Most are short and ASCII, for which a loop is quickest.
+    const near = place + 64;
     let end = place;
     let ascii = 0;
-    for (; bytes[end] !== 0; ++end) ascii |= bytes[end]!;
-    if (ascii > 127 || end - place > 64) return decoder.decode(bytes.subarray(place, end));
+    for (; end < near && bytes[end] !== 0; ++end) ascii |= bytes[end]!;
+    if (ascii > 127 || end === near) return decoder.decode(bytes.subarray(place, bytes.indexOf(0, end)));
     let text = "";
     for (let at = place; at < end; ++at) text += String.fromCharCode(bytes[at]!);
     return text;

@@ -1,6 +1,6 @@
 export { load, type LoadOptions } from "./load.js";
 export { BrindleError, SongError, type Fault, type Status } from "./errors.js";
-export type { Brindle } from "./Brindle.js";
+export type { Brindle, TextRun } from "./Brindle.js";
 export type { Chord, ChordReading } from "./Chord.js";
 export type { Bar, Format, ReadOptions, Section, Song, SongChord } from "./Song.js";
 export type {

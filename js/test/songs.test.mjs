@@ -39,6 +39,29 @@ test("scores are read, plain and compressed, and nothing else is one", () => {
   assert.ok(brindle.scoreEvents(readFileSync(scores[0])).length > 10);
 });
 
+test("a compressed score that is damaged is told, wherever the damage is", () => {
+  const whole = readFileSync(songs.find((file) => file.endsWith(".mxl")));
+  const titleOf = (bytes) => {
+    const song = brindle.readScore(bytes);
+    const told = JSON.stringify(song.chords.map(({ position, symbol }) => [position, symbol])) + song.title;
+    song.free();
+    return told;
+  };
+  const expected = titleOf(whole);
+  let refused = 0;
+  for (let at = 60; at < whole.length; at += 97) {
+    const damaged = Uint8Array.from(whole);
+    damaged[at] ^= 1 << at % 8;
+    try {
+      assert.equal(titleOf(damaged), expected, `byte ${at}`);
+    } catch (error) {
+      assert.match(error.name, /^(Song|Brindle)Error$/, error.message);
+      refused += 1;
+    }
+  }
+  assert.ok(refused > whole.length / 97 / 2, `${refused} of ${whole.length} bytes`);
+});
+
 test("a song tells its chords, bars and parts", () => {
   const song = brindle.read("{title: One}\n{key: C}\n{tempo: 96}\n{comment: Verse}\n[C]la [G7]la\n");
   assert.deepEqual([song.title, song.format, song.tempo, song.statedKey.name], ["One", "chord-pro", 96, "C Major"]);

@@ -59,6 +59,13 @@ test("notes have the names that players give them", () => {
   assert.deepEqual(brindle.name([]), []);
 });
 
+test("symbols and numerals are set in pieces", () => {
+  assert.deepEqual(brindle.typeset("Bb").map(([text]) => text), ["B", "\u266D"]);
+  const [degree, figure, rest] = brindle.typeset("V7/ii", "numeral");
+  assert.deepEqual([degree, rest], [["V", 1, 0], ["/", 1, 0]]);
+  assert.ok(figure[0] === "7" && figure[1] < 1 && figure[2] > 0, `${figure}`);
+});
+
 test("errors tell their place", () => {
   const cases = [
     [() => brindle.chord("Hq7"), "input", 2],

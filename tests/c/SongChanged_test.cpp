@@ -107,5 +107,16 @@ TEST_CASE("What may come next is ranked in the key that is asked for") {
           "[a place is 0 to 5]");
 }
 
+TEST_CASE("A host sets symbols and numerals as the sheet does") {
+    const auto runs = [](const char* text, int isNumeral) {
+        return nlohmann::json::parse(TextOf(brindle_text_runs_json, text, isNumeral));
+    };
+    CHECK(runs("Ger6", 1).front()[0] == "Ger");
+    CHECK(runs("Gm7", 0).front()[0] == "G");
+    char* text = nullptr;
+    CHECK(brindle_text_runs_json(nullptr, 0, &text) == BRINDLE_ERROR_ARGUMENT);
+    CHECK(text == nullptr);
+}
+
 }  // namespace
 }  // namespace brindle::test

@@ -45,6 +45,19 @@ TEST_CASE("A sheet as JSON has bars, chords in pieces, arrows and keys with thei
     CHECK(sheet["Keys"][0]["Paper"].get<std::string>().size() == 7);
 }
 
+TEST_CASE("A symbol by itself is set as on a sheet, and a numeral as that") {
+    const nlohmann::json sheet = SheetOf("Cmaj7 | Bb7 | A7 | Dm7 | G7#9 | Am7/G | Bm7b5 | Db7/Cb");
+    const CSong song = ReadSong("Cmaj7 | Bb7 | A7 | Dm7 | G7#9 | Am7/G | Bm7b5 | Db7/Cb");
+    const CSongReading reading = ReadHarmony(song.mChords);
+    for (std::size_t i = 0; i < reading.mChords.size() && i < sheet["Chords"].size(); ++i) {
+        const auto& chord = sheet["Chords"][i];
+        CHECK(nlohmann::json::parse(TextRunsJson(song.mSymbols[i], false)) == chord["Runs"]);
+        CHECK(nlohmann::json::parse(TextRunsJson(reading.mChords[i].mNumeral, true)) ==
+              chord["NumeralRuns"]);
+    }
+    CHECK(nlohmann::json::parse(TextRunsJson("", true)) == nlohmann::json::array());
+}
+
 TEST_CASE("A sheet as JSON tells for each played bar which drawn one it is") {
     struct CCase {
         std::string_view mText;

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/song/CSongModel.h"
 
+#include "brindle/analysis/RomanNumeral.h"
 #include "brindle/chords/ReadChordText.h"
 #include "brindle/chords/WriteChordSymbol.h"
 #include "brindle/song/BuiltInSongs.h"
@@ -90,6 +91,24 @@ TEST_CASE("What followed in the songs is the likeliest") {
     CHECK(next.mChords[0].mFunction == THarmFunction_Tonic);
     CHECK(next.mChords[0].mProbability > 0.5);
     CHECK(next.mChords[1].mProbability < next.mChords[0].mProbability);
+}
+
+TEST_CASE("All that may come is told in one key, also where a passage seems to leave it") {
+    const CSongModel model = BuiltInSongModel();
+    const std::vector<std::vector<CChordLite>> histories = {
+        {Chord("C"), Chord("A7")}, {Chord("C"), Chord("E7")},  {Chord("C"), Chord("F")},
+        {Chord("Am"), Chord("E")}, {Chord("C"), Chord("Bb7")}, {Chord("C")}};
+    for (const auto& chords : histories) {
+        const CSignKeyLite home("C major");
+        const CNextChords all = NextChords(model, chords, {home, 20});
+        REQUIRE(all.mChords.size() == 20);
+        for (const CNextChord& next : all.mChords) {
+            const auto read = ChordFromNumeral(next.mNumeral, home);
+            const std::string told = WriteChordSymbol(next.mChord) + " " + next.mNumeral;
+            REQUIRE_MESSAGE(read.has_value(), told);
+            CHECK_MESSAGE(read->mRootKeyEnh.mKeyNr == next.mChord.mRootKeyEnh.mKeyNr, told);
+        }
+    }
 }
 
 TEST_CASE("A file of a model reads back, and a damaged one is refused") {
