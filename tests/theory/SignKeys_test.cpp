@@ -332,6 +332,31 @@ TEST_CASE("Any number of signs ends on a key") {
     }
 }
 
+TEST_CASE(
+    "Each sign is one fifth from the key with one sign less, past the end of the circle, too") {
+    struct CRow {
+        TSignKeyTypeNoUndef mType;
+        CKeyEnh mWithoutSigns;
+        int mFifth;
+    };
+    const CRow rows[] = {{TSignKeyTypeNoUndef_Major, CKeyEnh_C, 7},
+                         {TSignKeyTypeNoUndef_Major, CKeyEnh_C, -7},
+                         {TSignKeyTypeNoUndef_Minor, CKeyEnh_A, 7},
+                         {TSignKeyTypeNoUndef_Minor, CKeyEnh_A, -7}};
+    for (const CRow& row : rows) {
+        CKeyEnh root = row.mWithoutSigns;
+        for (int signs = 0; signs < 200; ++signs, root.AddToThis(row.mFifth)) {
+            CAPTURE(signs);
+            CSignKeyHeavy signKey;
+            signKey.SetFromSignsCountAndType(row.mFifth < 0 ? -signs : signs, row.mType);
+            CHECK(signKey.RootKeyEnh() == CSignKeyHeavy(root, row.mType).RootKeyEnh());
+        }
+    }
+    CSignKeyHeavy signKey;
+    signKey.SetFromSignsCountAndType(31, TSignKeyTypeNoUndef_Major);
+    CHECK(signKey.RootKeyEnh() == CKeyEnh_Cis);  // as 7 and 19 fifths lead there, too
+}
+
 TEST_CASE("A word that is no type means major, and a sign in UTF-8 reads as it looks") {
     struct CRow {
         const char* mText;
