@@ -94,12 +94,9 @@ std::string_view TakeFigureWithSlashes(std::string_view& text) {
 }
 
 const CAugmentedSixth* TakeAugmentedSixth(std::string_view& text) {
-    for (const CAugmentedSixth& chord : kAugmentedSixths) {
-        if (!text.starts_with(chord.mWord)) continue;
-        text.remove_prefix(chord.mWord.size());
-        return &chord;
-    }
-    return nullptr;
+    const CAugmentedSixth* const chord = AugmentedSixthOf(text);
+    if (chord != nullptr) text.remove_prefix(chord->mWord.size());
+    return chord;
 }
 
 bool IsSubstitute(std::string_view text) {

@@ -3,6 +3,7 @@
 
 #include "brindle/analysis/CHarmAnlsChords.h"
 #include "brindle/analysis/CKeyOfSong.h"
+#include "brindle/analysis/internal/AugmentedSixths.h"
 #include "brindle/analysis/internal/KeyChords.h"
 #include "brindle/analysis/internal/NumeralDegree.h"
 #include "brindle/analysis/internal/NumeralSign.h"
@@ -273,7 +274,9 @@ std::string NumeralInStyle(std::string_view numeral, const CChordLite& chord,
                            const CSignKeyLite& key, const CNumeralOptions& options) {
     if (chord.IsUndef() || key.IsUndef()) return {};
     if (options.mNashville) return RomanNumeral(chord, key, nullptr, options);
-    if (!ReadDegree(numeral).IsRead()) return std::string(numeral);
+    // It6 would be read as a I.
+    const bool isName = AugmentedSixthOf(numeral) != nullptr || !ReadDegree(numeral).IsRead();
+    if (isName) return std::string(numeral);
     const CChordLite rooted = OnRootOfNumeral(chord, numeral, key, options);
     const CWrittenDegree degree = DegreeOfNumeral(numeral, rooted, key, options);
     const CTail tail = TailOf(rooted, degree, key, options);

@@ -291,6 +291,7 @@ TEST_CASE("Other signs for numerals do not change what was read") {
          "Id7 IVd7 Id7 Id7 IVd7 IVd7 Id7 Id7 V7 IVd7 Id7 V7"},
         {"Dm7 | Db7 | Cmaj7", "ii7 subV7/I I^7", "ii7 subV7/I I^7"},
         {"C | A7/C# | Dm | G7/B | C", "I V65/ii ii V65 I", "I V7/ii/^#1 ii V7/^7 I"},
+        {"C | Ab7no5 | G | C", "I It6 V I", "I It6 V I"},
     };
     for (const CRow& row : rows) {
         INFO(std::string(row.mSong));

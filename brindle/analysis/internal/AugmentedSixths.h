@@ -29,6 +29,14 @@ inline constexpr auto kAugmentedSixths = std::to_array<CAugmentedSixth>({
 });
 // clang-format on
 
+/// The chord whose name a numeral begins with, as in Ger65 and It6/V; none for other numerals.
+[[nodiscard]] constexpr const CAugmentedSixth* AugmentedSixthOf(std::string_view numeral) {
+    for (const CAugmentedSixth& chord : kAugmentedSixths) {
+        if (numeral.starts_with(chord.mWord)) return &chord;
+    }
+    return nullptr;
+}
+
 /// A figure of such a chord: the tone that it puts into the bass, in semitones above the root.
 struct CAugmentedSixthFigure {
     std::string_view mText;

@@ -24,11 +24,8 @@ void AppendChord(const CChordLite& chord, double position, CSong& song) {
 TSeventhSpelling SeventhOf(const CRomanTextChord& chord) {
     constexpr int seventh = 10;
     if (!chord.mChord.mSemitones.HasIntvl(seventh)) return TSeventhSpelling_Undef;
-    const bool isSixth =
-        std::any_of(kAugmentedSixths.begin(), kAugmentedSixths.end(), [&](const auto& sixth) {
-            return sixth.mRoot.mNumber == 6 &&
-                   chord.mNumeral.compare(0, sixth.mWord.size(), sixth.mWord) == 0;
-        });
+    const CAugmentedSixth* const sixth = AugmentedSixthOf(chord.mNumeral);
+    const bool isSixth = sixth != nullptr && sixth->mRoot.mNumber == 6;
     return isSixth ? TSeventhSpelling_AugmentedSixth : TSeventhSpelling_MinorSeventh;
 }
 
