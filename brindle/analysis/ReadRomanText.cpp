@@ -5,7 +5,6 @@
 #include "brindle/analysis/internal/RomanTextWords.h"
 #include "brindle/platform/Ascii.h"
 #include "brindle/platform/Utf8.h"
-#include "brindle/theory/ReadKeyText.h"
 
 #include <algorithm>
 #include <array>
@@ -47,24 +46,13 @@ bool HasBeats(std::string_view line) {
 
 constexpr CNumeralOptions kNumeralsOfRomanText{.mFigures = true, .mByKey = true};
 
-// Headers have a colon, too, "Form: binary". Those of one letter are keys.
+// Headers have a colon, too, "Form: binary". Those that name a key are the key.
 bool BeginsWithNumeral(std::string_view line) {
     const std::string_view word = TakeWord(line);
     if (BeatOf(word) || KeyOf(word)) return true;
     const CSignKeyLite anyKey({0, TEnh_n}, TSignKeyType_Major);
     return word.find(':') == word.npos &&
            !ReadNumeral(word, anyKey, kNumeralsOfRomanText).mChord.IsUndef();
-}
-
-// "E flat", "f# minor"; small letters without a word for the mode are minor, as in all of
-// RomanText.
-std::optional<CSignKeyLite> KeyInWords(std::string_view name) {
-    const CKeyText read = ReadKeyText(name);
-    if (!read.mError.empty()) return std::nullopt;
-    CSignKeyLite key = read.mSignKey;
-    const bool saysMajor = name.find("maj") != name.npos || name.find("dur") != name.npos;
-    if (Ascii::IsSmallLetter(name.front()) && !saysMajor) key.mSignKeyType = TSignKeyType_Minor;
-    return key;
 }
 
 bool IsWordForNoChord(std::string_view word) {
@@ -147,6 +135,7 @@ void CRomanTextReader::ReadLine() {
     std::string_view line = Ascii::Trimmed(mLine);
     if (line.empty()) return;
     if (const auto range = TakeMeasures(line)) return ReadMeasureLine(line, *range);
+    if (LooksLikeMeasure(line)) return Fail("a measure is written m1, m1a or m1-4", line);
     if (BeginsWithNumeral(line)) return ReadTypedLine(line);
     const std::size_t colon = mLine.find(':');
     if (colon != mLine.npos) return ReadHeader(colon);
@@ -165,11 +154,7 @@ void CRomanTextReader::ReadHeader(std::size_t colon) {
     if (name == "Analyst") return set(mReading.mAnalyst);
     if (name == "Time Signature" || name == "Time signature") return ReadTime(value);
     if (name == "Pedal") return Fail("pedals are left out", name, true);
-    // Another header says nothing of the music; "E flat: I V" does.
-    const auto key = KeyInWords(name);
-    if (!key) return;
-    mKey = key;
-    ReadTypedLine(Ascii::TrimmedInFront(std::string_view(mLine).substr(colon + 1)));
+    // Another header says nothing of the music.
 }
 
 void CRomanTextReader::ReadTime(std::string_view value) {

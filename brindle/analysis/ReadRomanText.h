@@ -80,8 +80,9 @@ struct CRomanTextReading {
 ///
 /// A line may have no measure, as people type it. With beats it is the next measure,
 /// `C: I b3 V65/V`; without them each numeral has a beat, in as many measures as that takes, and
-/// `|`, `||` and `.` are bar lines and holds: `C: I V | vi . a: i`. Such a line may begin with a
-/// key in words, `E flat: I V`.
+/// `|`, `||` and `.` are bar lines and holds: `C: I V | vi . a: i`.
+///
+/// Keys may be in words, `m1 E flat: I b3 a minor: V`.
 ///
 /// `key` is that of the numerals before the first key that the text states; if it is undefined,
 /// they are faults.

@@ -125,6 +125,10 @@ TEST_CASE("A typed line needs no measure") {
           "0+1 Eb I; 1+3 Eb V; 4+1 F#m i; 5+3 F#m V");
     CHECK(FaultsText(ReadRomanText("E flat: I\nf sharp minor: i X").mFaults) ==
           "2:18 this is no degree");
+    CHECK(ChordsText(ReadRomanText("m1 E flat: I b3 a minor: V | f sharp: i b3 Am: i")) ==
+          "0+2 Eb I; 2+2 Am V; 4+2 F#m i; 6+2 Am i");
+    CHECK(ChordsText(ReadRomanText("C: I | e flat major: I b: i")) ==
+          "0+4 C I; 4+1 Eb I; 5+3 Bm i");
     CHECK(ReadRomanText("Form: binary\nNote: I think so\nPiece: V\n").mFaults.empty());
 }
 
@@ -155,6 +159,8 @@ TEST_CASE("Beats are those of the time signature") {
              CBeatCase{"9/8", "I b2 V b3.66 I", "0+1.5 C I; 1.5+2.5 C V; 4+0.5 C I"},
              CBeatCase{"3/2", "I b3 V", "0+4 C I; 4+2 C V"},
              CBeatCase{"C", "I b1.25 V b4.75 I", "0+0.25 C I; 0.25+3.5 C V; 3.75+0.25 C I"},
+             CBeatCase{"2/4", "I b1.66.5 V b2.5.5 I",
+                       "0+0.8333 C I; 0.8333+0.9167 C V; 1.75+0.25 C I"},
              CBeatCase{"5/8", "I b4 V", "0+1.5 C I; 1.5+1 C V"},
          }) {
         INFO(std::string(row.mTime));
@@ -194,6 +200,14 @@ TEST_CASE("What is wrong is told with its line and column, and the rest is read"
           "8:1 the number of the measure is not higher than the one before; "
           "9:17 this is no time signature; "
           "11:1 this is neither a measure nor a header");
+    CHECK(!ReadRomanText("m1 C: I b1.5.5.5 V").mFaults.empty());
+    CHECK(!ReadRomanText("m1 C: I b1.2.5 V").mFaults.empty());
+    CHECK(FaultsText(
+              ReadRomanText("m1 C: I\nM2 C: I\nm3. V: C\nm9999999 C: V\nm7-5 C: I\n").mFaults) ==
+          "2:1 a measure is written m1, m1a or m1-4; "
+          "3:1 a measure is written m1, m1a or m1-4; "
+          "4:1 a measure is written m1, m1a or m1-4; "
+          "5:1 a measure is written m1, m1a or m1-4");
     CHECK(FaultsText(reading.mNotes) ==
           "3:1 another reading of the measure is left out; 10:1 pedals are left out");
 }

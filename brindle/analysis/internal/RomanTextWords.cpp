@@ -3,6 +3,7 @@
 
 #include "brindle/platform/Ascii.h"
 #include "brindle/theory/CChordNamePrefs.h"
+#include "brindle/theory/ReadKeyText.h"
 
 #include <algorithm>
 #include <array>
@@ -27,23 +28,72 @@ std::optional<int> TakeWhole(std::string_view& text, int most) {
     return number;
 }
 
+/// A part of a beat: so many whole parts of it, of mParts; 0 parts if it is no usual one.
+struct CPartOfBeat {
+    double mValue = 0.0;
+    int mParts = 0;
+};
+
 // The fraction that was meant: .33 is a third. One digit is exact but for thirds.
-double FractionOf(std::string_view digits) {
+CPartOfBeat PartOfBeat(std::string_view digits) {
     double fraction = 0.0;
     double unit = 0.1;
     for (const char c : digits) {
         fraction += unit * (c - '0');
         unit /= 10.0;
     }
-    if (digits == "3") return 1.0 / 3.0;
-    if (digits == "6" || digits == "7") return 2.0 / 3.0;
-    if (digits.size() < 2) return fraction;
-    constexpr double tolerance = 0.0075;
+    if (digits == "3") return {1.0 / 3.0, 3};
+    if (digits == "6" || digits == "7") return {2.0 / 3.0, 3};
+    const double tolerance = digits.size() < 2 ? 1e-9 : 0.0075;
     for (const int parts : {1, 2, 4, 3, 8, 6, 16, 12}) {
         const double near = std::round(fraction * parts) / parts;
-        if (std::abs(fraction - near) < tolerance) return near;
+        if (std::abs(fraction - near) < tolerance) return {near, parts};
     }
-    return fraction;
+    return {fraction, 0};
+}
+
+// Digits behind a point; nothing, and nothing taken, if there are none or too many.
+std::optional<CPartOfBeat> TakePart(std::string_view& text) {
+    constexpr std::size_t mostDigits = 9;
+    std::string_view rest = text;
+    if (!Ascii::TakePrefix(rest, ".")) return std::nullopt;
+    const std::string_view digits = rest.substr(0, rest.find('.'));
+    const bool isNumber = !digits.empty() && digits.size() <= mostDigits &&
+                          std::all_of(digits.begin(), digits.end(), Ascii::IsDigit);
+    if (!isNumber) return std::nullopt;
+    text = rest.substr(digits.size());
+    return PartOfBeat(digits);
+}
+
+// "E flat", "f# minor", "fis": a word for the mode, or else the size of the letter, as in all of
+// RomanText.
+std::optional<CSignKeyLite> KeyInWords(std::string_view name) {
+    const CKeyText read = ReadKeyText(name);
+    if (!read.mError.empty()) return std::nullopt;
+    CSignKeyLite key = read.mSignKey;
+    const bool saysMajor = name.find("maj") != name.npos || name.find("dur") != name.npos;
+    if (Ascii::IsSmallLetter(name.front()) && !saysMajor) key.mSignKeyType = TSignKeyType_Minor;
+    return key;
+}
+
+std::string_view TakePlainWord(std::string_view& text) {
+    text = Ascii::TrimmedInFront(text);
+    const std::string_view word = text.substr(0, text.find_first_of(Ascii::kWhiteSpace));
+    text.remove_prefix(word.size());
+    return word;
+}
+
+// "E flat minor:" at the beginning of a text; empty if no key of several words stands there.
+std::string_view WordsOfKey(std::string_view text) {
+    constexpr int most = 3;
+    const char* const begin = text.data();
+    for (int count = 1; count <= most; ++count) {
+        const std::string_view word = TakePlainWord(text);
+        if (word.empty() || BeatOf(word)) return {};
+        const std::string_view words(begin, static_cast<std::size_t>(text.data() - begin));
+        if (word.find(':') != word.npos) return count > 1 && KeyOf(words) ? words : "";
+    }
+    return {};
 }
 
 bool IsCompound(const CTimeSignature& time) {
@@ -52,6 +102,11 @@ bool IsCompound(const CTimeSignature& time) {
 }
 
 }  // namespace
+
+bool LooksLikeMeasure(std::string_view line) {
+    const bool hasLetter = line.starts_with('m') || line.starts_with('M');
+    return hasLetter && line.size() > 1 && Ascii::IsDigit(line[1]);
+}
 
 std::optional<CMeasureRange> TakeMeasures(std::string_view& text) {
     std::string_view rest = text;
@@ -84,17 +139,20 @@ std::optional<double> BeatOf(std::string_view word) {
     const auto beat = TakeWhole(word, kLastBeatNr);
     if (!beat || *beat < 1) return std::nullopt;
     if (word.empty()) return *beat;
-    if (!Ascii::TakePrefix(word, ".") || word.empty() || word.size() > 9) return std::nullopt;
-    if (!std::all_of(word.begin(), word.end(), Ascii::IsDigit)) return std::nullopt;
-    return *beat + FractionOf(word);
+    const auto part = TakePart(word);
+    if (!part) return std::nullopt;
+    const double place = *beat + part->mValue;
+    if (word.empty()) return place;
+    const auto partOfPart = TakePart(word);
+    if (!partOfPart || !word.empty() || part->mParts == 0) return std::nullopt;
+    return place + partOfPart->mValue / part->mParts;
 }
 
 std::optional<CSignKeyLite> KeyOf(std::string_view word) {
     if (word.size() < 2 || word.back() != ':') return std::nullopt;
     word.remove_suffix(1);
     const bool isMinor = word.front() >= 'a' && word.front() <= 'g';
-    if (!isMinor && (word.front() < 'A' || word.front() > 'G')) return std::nullopt;
-    constexpr std::size_t longest = 16;
+    constexpr std::size_t longest = 24;
     if (word.size() > longest) return std::nullopt;
     std::string name(word);
     if (isMinor) name.front() = static_cast<char>(name.front() - 'a' + 'A');
@@ -102,7 +160,7 @@ std::optional<CSignKeyLite> KeyOf(std::string_view word) {
     CKeyEnh root;
     int consumed = 0;
     root.SetFromString(name, &consumed, ChordNamePrefsNonUTF8);
-    if (static_cast<std::size_t>(consumed) != name.size()) return std::nullopt;
+    if (static_cast<std::size_t>(consumed) != name.size()) return KeyInWords(word);
     return CSignKeyLite(root, isMinor ? TSignKeyType_Minor : TSignKeyType_Major);
 }
 
@@ -131,9 +189,10 @@ std::optional<CTimeSignature> TimeSignatureOf(std::string_view text) {
 
 std::string_view TakeWord(std::string_view& text) {
     text = Ascii::TrimmedInFront(text);
-    const std::string_view word = text.substr(0, text.find_first_of(Ascii::kWhiteSpace));
-    text.remove_prefix(word.size());
-    return word;
+    const std::string_view key = WordsOfKey(text);
+    if (key.empty()) return TakePlainWord(text);
+    text.remove_prefix(key.size());
+    return key;
 }
 
 }  // namespace brindle
