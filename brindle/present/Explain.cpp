@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/present/Explain.h"
 
+#include "brindle/analysis/internal/NumeralText.h"
 #include "brindle/platform/Localization.h"
 #include "brindle/present/CTable.h"
 #include "brindle/present/ShownText.h"
@@ -22,6 +23,7 @@ namespace {
 enum TWay : std::uint8_t {
     TWay_Untold,
     TWay_Followed,
+    TWay_OtherThird,
     TWay_Later,
     TWay_OfDominant,
     TWay_Elsewhere,
@@ -59,11 +61,9 @@ private:
     [[nodiscard]] bool IsTargetTonic() const {
         return HasTarget() && mAround.Root(Target()) == Tonic();
     }
-    [[nodiscard]] bool NumeralBeginsWith(std::string_view begin) const {
-        return mReading.mNumeral.compare(0, begin.size(), begin) == 0;
-    }
 
     [[nodiscard]] TWay Way() const;
+    [[nodiscard]] TWay WayToServed() const;
     [[nodiscard]] TSentence Leading(TSentence plain) const {
         return static_cast<TSentence>(static_cast<int>(plain) + Way());
     }
@@ -81,14 +81,20 @@ private:
     CSignKeyLite mServed;
 };
 
+// To the next chord, which has the root that is served: C or Cm behind G7.
+TWay CChordToExplain::WayToServed() const {
+    const bool isDominant =
+        IsAtTarget(TChordRelation_Dominant) || IsAtTarget(TChordRelation_SubstituteDominant);
+    if (IsTargetNext() && isDominant) return TWay_OfDominant;
+    const TKeyChordClass next = mAround.Class(Next());
+    const bool isMinorServed = mServed.mSignKeyType == TSignKeyType_Minor;
+    const bool hasOtherThird = next != TKeyChordClass_Open && IsSmallNumeral(next) != isMinorServed;
+    return hasOtherThird ? TWay_OtherThird : TWay_Followed;
+}
+
 TWay CChordToExplain::Way() const {
     const bool isNextServed = Next() >= 0 && mAround.Root(Next()) == ServedRoot();
-    if (IsTargetNext() && isNextServed) {
-        const bool isDominant =
-            IsAtTarget(TChordRelation_Dominant) || IsAtTarget(TChordRelation_SubstituteDominant);
-        return isDominant ? TWay_OfDominant : TWay_Followed;
-    }
-    if (isNextServed) return TWay_Followed;
+    if (isNextServed) return WayToServed();
     if (IsTargetNext()) return TWay_Elsewhere;
     if (HasTarget()) return mAround.Root(Target()) == ServedRoot() ? TWay_Later : TWay_Untold;
     return mReading.mServes.IsTonic() ? TWay_Untold : TWay_Unresolved;
@@ -142,11 +148,13 @@ TSentence CChordToExplain::Plagal() const {
 }
 
 TSentence CChordToExplain::AugmentedSixth() const {
-    if (NumeralBeginsWith("Fr")) {
-        return HasTarget() ? TSentence_FrenchSixthTo : TSentence_FrenchSixth;
-    }
-    if (NumeralBeginsWith("It")) {
-        return HasTarget() ? TSentence_ItalianSixthTo : TSentence_ItalianSixth;
+    switch (mAround.SixthChord(mIx)) {
+        case TSixthChord_French:
+            return HasTarget() ? TSentence_FrenchSixthTo : TSentence_FrenchSixth;
+        case TSixthChord_Italian:
+            return HasTarget() ? TSentence_ItalianSixthTo : TSentence_ItalianSixth;
+        case TSixthChord_German:
+            break;
     }
     return HasTarget() ? TSentence_GermanSixthTo : TSentence_GermanSixth;
 }
@@ -188,7 +196,8 @@ TSentence CChordToExplain::Sentence() const {
         case TChordRelation_ChromaticMediant:
             return TSentence_ChromaticMediant;
         case TChordRelation_Neapolitan:
-            return mReading.mNumeral == "N6" ? TSentence_NeapolitanSixth : TSentence_Neapolitan;
+            return mAround.IsNeapolitanSixth(mIx) ? TSentence_NeapolitanSixth
+                                                  : TSentence_Neapolitan;
         case TChordRelation_AugmentedSixth:
             return AugmentedSixth();
         case TChordRelation_Blues:

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/present/ReadingText.h"
 
+#include "brindle/present/Explain.h"
 #include "brindle/present/ShownText.h"
 #include "brindle/song/ReadSong.h"
 #include "brindle/song/ReadSongHarmony.h"
@@ -92,6 +93,32 @@ TEST_CASE("Of seconds and dominants that lead to one tonic the last ones are not
     const std::string shown = Shown("Gm7 C7 | Gm7 C7 | Gm7 C7 | F | Dm7 | Db7 C7 Db7 C7 | F |");
     CHECK(Has(shown, "  bars 3 to 4: ii V I of F Major\n"));
     CHECK(Has(shown, "  bar 6: Db7 is a substitute dominant, subV7/V of F Major\n"));
+}
+
+TEST_CASE("Chains of dominants are noted without other forms of one of them") {
+    CHECK(Has(Shown("C E7 | A7 D7 | G7 C |"),
+              "  bars 1 to 3: E7 A7 D7 G7: each the dominant of the next\n"));
+    CHECK(!Has(Shown("C D7 | G7sus4 G7 | C |"), "each the dominant"));
+    CHECK(Has(Shown("Cmaj7 Eb7 | D7 Db7 | Cmaj7 |"),
+              "  bars 1 to 2: Eb7 D7 Db7: each the dominant of the next, or its substitute\n"));
+}
+
+TEST_CASE("Chords with a name of their own are noted by it, in numbers, too") {
+    const CSong song =
+        ReadSong("C | D7b5/Ab | G | C | Ab7no5 | G | C | Ab7 | G | C | Db/F | G | Db | G | C");
+    const CSongReading plain = ReadSongHarmony(song);
+    for (const CNumeralOptions& options :
+         {CNumeralOptions{}, CNumeralOptions{.mNashville = true}}) {
+        const CSongReading reading = WithNumerals(plain, song.mChords, options);
+        const std::string shown = ReadingText(song, reading, {}, CPaint(false));
+        CHECK(Has(shown, "D7b5/Ab is the French sixth of C Major\n"));
+        CHECK(Has(shown, "Ab7no5 is the Italian sixth of C Major\n"));
+        CHECK(Has(shown, "Ab7 is the German sixth of C Major\n"));
+        CHECK(Has(shown, "Db/F is the Neapolitan sixth of C Major\n"));
+        CHECK(Has(shown, "Db is the Neapolitan chord of C Major\n"));
+        CHECK(Explain(song, reading)[1] ==
+              "D7b5/Ab is the French sixth of C major and opens to G.");
+    }
 }
 
 TEST_CASE("Regions show all their numerals, on as many lines as these take") {

@@ -2,6 +2,7 @@
 #include "brindle/present/internal/CChordsAround.h"
 
 #include "brindle/analysis/internal/NumeralDegree.h"
+#include "brindle/theory/KeyIntervals.h"
 
 #include <algorithm>
 
@@ -51,6 +52,27 @@ int CChordsAround::Root(std::ptrdiff_t ix) const {
 int CChordsAround::Bass(std::ptrdiff_t ix) const {
     const CKeyChord* chord = ChordAt(ix);
     return chord == nullptr ? kKeyNrUndef : chord->mBass;
+}
+
+TKeyChordClass CChordsAround::Class(std::ptrdiff_t ix) const {
+    const CKeyChord* chord = ChordAt(ix);
+    return chord == nullptr ? TKeyChordClass_Open : chord->mClass;
+}
+
+TSixthChord CChordsAround::SixthChord(std::size_t ix) const {
+    const CKeyChord* chord = ChordAt(static_cast<std::ptrdiff_t>(ix));
+    if (chord == nullptr) return TSixthChord_German;
+    constexpr int secondDegree = 2;
+    constexpr int fifth = 7;
+    const int served = ServedKey(Reading(ix)).mRootKeyEnh.mKeyNr;
+    if (FoldIntoOctave(chord->mRoot - served) == secondDegree) return TSixthChord_French;
+    return chord->Has(fifth) ? TSixthChord_German : TSixthChord_Italian;
+}
+
+bool CChordsAround::IsNeapolitanSixth(std::size_t ix) const {
+    constexpr int third = 4;
+    const auto place = static_cast<std::ptrdiff_t>(ix);
+    return FoldIntoOctave(Bass(place) - Root(place)) == third;
 }
 
 CSignKeyLite ServedKey(const CChordReading& reading) {

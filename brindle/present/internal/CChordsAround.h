@@ -6,10 +6,17 @@
 #include "brindle/song/CSong.h"
 
 #include <cstddef>
+#include <cstdint>
 #include <string>
 #include <vector>
 
 namespace brindle {
+
+enum TSixthChord : std::uint8_t {
+    TSixthChord_German,
+    TSixthChord_Italian,
+    TSixthChord_French,
+};
 
 /// No chord.
 inline constexpr std::ptrdiff_t kNoneAround = -1;
@@ -35,6 +42,13 @@ public:
     /// Pitch classes; `kKeyNrUndef` for none.
     [[nodiscard]] int Root(std::ptrdiff_t ix) const;
     [[nodiscard]] int Bass(std::ptrdiff_t ix) const;
+    /// TKeyChordClass_Open for none.
+    [[nodiscard]] TKeyChordClass Class(std::ptrdiff_t ix) const;
+    /// Which augmented sixth a chord of that relation is. By its tones, as numerals in another
+    /// style do not tell it: b67.
+    [[nodiscard]] TSixthChord SixthChord(std::size_t ix) const;
+    /// Whether a Neapolitan chord has its third in the bass.
+    [[nodiscard]] bool IsNeapolitanSixth(std::size_t ix) const;
 
 private:
     [[nodiscard]] std::ptrdiff_t Beside(std::size_t ix, std::ptrdiff_t step) const;

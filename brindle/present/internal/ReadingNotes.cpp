@@ -132,26 +132,32 @@ private:
         return false;
     }
 
-    // E7 A7 D7 G7: told where it begins, so that each chord is looked at once.
+    // E7 A7 D7 G7, without the G7 behind a G7sus4: told where it begins, so that each chord is
+    // looked at once.
     void NoteChain(std::size_t ix) {
         if (ix < mChainEnd || !IsDominant(mReading.mChords[ix])) return;
         std::string text = Symbol(ix);
         std::size_t count = 1;
         std::size_t last = ix;
+        bool hasSubstitutes = false;
         for (std::ptrdiff_t next = NextInChain(last); next >= 0; next = NextInChain(last)) {
+            hasSubstitutes |= mReading.mChords[last].mRelation != TChordRelation_Dominant;
             last = static_cast<std::size_t>(next);
             if (++count <= 2 * kMostPlaces) text += ' ' + Symbol(last);
         }
         mChainEnd = last + 1;
         if (count < kShortestChain) return;
         if (count > 2 * kMostPlaces) text += " ...";
-        Note(text + ": each the dominant of the next", ix, last);
+        text += ": each the dominant of the next";
+        if (hasSubstitutes) text += ", or its substitute";
+        Note(std::move(text), ix, last);
     }
 
     [[nodiscard]] std::ptrdiff_t NextInChain(std::size_t ix) const {
         const std::ptrdiff_t next = mAround.Next(ix);
         const bool isIn = next >= 0 && mReading.mChords[ix].mResolvesTo == next &&
                           IsDominant(At(next)) &&
+                          mAround.Root(next) != mAround.Root(static_cast<std::ptrdiff_t>(ix)) &&
                           mAround.Root(next) != mReading.mKey.mRootKeyEnh.mKeyNr;
         return isIn ? next : kNoneAround;
     }
@@ -163,11 +169,12 @@ private:
             Note("deceptive cadence to " + mAround.Symbol(next), ix,
                  next < 0 ? ix : static_cast<std::size_t>(next));
         }
-        const std::string text = ColorOf(chord);
+        const std::string text = ColorOf(ix);
         if (!text.empty()) Note(Symbol(ix) + ' ' + text, ix, ix);
     }
 
-    [[nodiscard]] static std::string ColorOf(const CChordReading& chord) {
+    [[nodiscard]] std::string ColorOf(std::size_t ix) const {
+        const CChordReading& chord = mReading.mChords[ix];
         const std::string key = chord.mKey.NameLong(NamePrefs());
         switch (chord.mRelation) {
             case TChordRelation_Borrowed:
@@ -179,13 +186,29 @@ private:
                            ? "is the backdoor dominant of " + key
                            : std::string();
             case TChordRelation_Neapolitan:
+                return (mAround.IsNeapolitanSixth(ix) ? "is the Neapolitan sixth of "
+                                                      : "is the Neapolitan chord of ") +
+                       key;
             case TChordRelation_AugmentedSixth:
-                return "is " + chord.mNumeral + " of " + key;
+                return SixthName(mAround.SixthChord(ix)) + " of " +
+                       ServedKey(chord).NameLong(NamePrefs());
             case TChordRelation_Blues:
                 return "has the seventh of the blues";
             default:
                 return {};
         }
+    }
+
+    [[nodiscard]] static std::string SixthName(TSixthChord chord) {
+        switch (chord) {
+            case TSixthChord_German:
+                return "is the German sixth";
+            case TSixthChord_Italian:
+                return "is the Italian sixth";
+            case TSixthChord_French:
+                return "is the French sixth";
+        }
+        return {};
     }
 
     [[nodiscard]] static std::string ParallelName(CSignKeyLite key) {
