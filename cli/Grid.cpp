@@ -7,6 +7,7 @@
 #include "cli/TypedChords.h"
 
 #include "brindle/chords/NameNotes.h"
+#include "brindle/platform/Ascii.h"
 #include "brindle/present/GridsJson.h"
 #include "brindle/present/GridsSvg.h"
 #include "brindle/present/GridsText.h"
@@ -59,8 +60,10 @@ TGrids GridsOfFrets(const std::string& word, const std::vector<int>& frets,
                     const GChShortTuning& tuning, const CGridOptions& options) {
     const auto strings = static_cast<std::size_t>(GChNumberOfStringsInShortTuning(tuning));
     if (frets.size() != strings) {
-        return Fail(TStatus::BadInput, fmt::format("{} has {} strings, the tuning {} has {}", word,
-                                                   frets.size(), TuningText(tuning), strings));
+        const std::string_view unit = frets.size() == 1 ? "string" : "strings";
+        return Fail(TStatus::BadInput,
+                    fmt::format("{} has {} {}, the tuning {} has {}", word, frets.size(), unit,
+                                TuningText(tuning), strings));
     }
     auto grid = GridOfFrets(word, frets, tuning, options.mCapo, options.mNaming.ToldPrefs());
     if (!grid)
@@ -77,7 +80,7 @@ public:
     }
 
     TGrids GridsOf(const std::string& word) {
-        const std::string symbol = Printable(word);
+        const std::string symbol = Printable(Ascii::Trimmed(word));
         const bool beginsAsFrets = word.find_first_of("0123456789") == 0;
         const auto chord = beginsAsFrets ? CChordLite() : mReading.ReadSymbol(word);
         if (!chord) return TStatus::BadInput;
@@ -95,7 +98,10 @@ public:
                          : GridsForChord(*mDatabase, symbol, *chord, mTuning, fingering);
         if (const auto style = mOptions.mNaming.ToldPrefs()) {
             const std::string name = Printable(ChordSymbolInStyle(*chord, *style));
-            for (CChordGrid& grid : grids) grid.mName = name;
+            for (CChordGrid& grid : grids) {
+                grid.mName = name;
+                grid.mStyle = style;
+            }
         }
         if (!grids.empty()) return grids;
         return FailWithoutFingering(symbol, mTuning);

@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: MIT
-#include "brindle/c/internal/Border.h"
+#include "brindle/c/internal/Grids.h"
 
-#include "brindle/chords/ReadChordText.h"
 #include "brindle/guitarchords/GChDatabase.h"
 #include "brindle/platform/Resources.h"
 #include "brindle/present/ChordGrid.h"
@@ -13,7 +12,6 @@
 
 #include <algorithm>
 #include <memory>
-#include <optional>
 #include <string>
 #include <vector>
 
@@ -23,35 +21,9 @@ struct brindle_grid_package {
     brindle::GChDatabase mDatabase;
 };
 
-struct brindle_grids {
-    std::vector<brindle::CChordGrid> mGrids;
-};
-
 namespace {
 
 static_assert(BRINDLE_MAX_STRINGS == brindle::kGChMaxStrings);
-
-constexpr int kMostCapo = 24;
-
-// Checks a tuning and a capo as they were handed in, and reads the tuning.
-brindle_status ReadStrings(const char* tuning, int capo, brindle::GChShortTuning& strings) {
-    if (capo < 0 || capo > kMostCapo) {
-        return Fail(BRINDLE_ERROR_ARGUMENT, "a capo is a fret of 0 to 24");
-    }
-    const auto read = tuning == nullptr ? std::optional(brindle::kGChStandardGuitar)
-                                        : brindle::ReadTuning(tuning);
-    if (!read) {
-        return Fail(BRINDLE_ERROR_INPUT, "a tuning is written as DADGAD or E2A2D3G3B3E4", 1);
-    }
-    strings = *read;
-    return BRINDLE_OK;
-}
-
-void Give(std::vector<brindle::CChordGrid> found, brindle_grids** grids) {
-    auto result = std::make_unique<brindle_grids>();
-    result->mGrids = std::move(found);
-    *grids = result.release();
-}
 
 void Fill(const std::vector<int>& numbers, int* out) {
     std::fill_n(out, BRINDLE_MAX_STRINGS, -1);
@@ -92,16 +64,13 @@ brindle_status brindle_grids_find(brindle_grid_package* package, const char* sym
         brindle::GChShortTuning strings{};
         const brindle_status status = ReadStrings(tuning, capo, strings);
         if (status != BRINDLE_OK) return status;
-        const auto reading = brindle::ReadChordText(symbol);
-        if (reading.mKind != brindle::TChordText_Chord) {
-            const std::string fault = reading.mFault.empty() ? "no chord" : reading.mFault;
-            return Fail(BRINDLE_ERROR_INPUT, fault,
-                        static_cast<std::size_t>(std::max(reading.mFaultPos, 1)));
-        }
+        brindle::CChordLite chord;
+        const brindle_status read = ReadSoundingChord(symbol, chord);
+        if (read != BRINDLE_OK) return read;
         brindle::CFingeringOptions options;
         options.mCapo = capo;
-        Give(brindle::GridsForChord(package->mDatabase, brindle::Printable(symbol), reading.mChord,
-                                    strings, options),
+        Give(brindle::GridsForChord(package->mDatabase, brindle::Printable(symbol), chord, strings,
+                                    options),
              grids);
         return BRINDLE_OK;
     });
@@ -170,5 +139,20 @@ brindle_status brindle_grids_svg(const brindle_grids* grids, const char* title, 
     if (title == nullptr) return FailForNull("title");
     return Guarded([&] {
         return GiveText(brindle::GridsSvg(grids->mGrids, brindle::Printable(title)), text);
+    });
+}
+
+brindle_status brindle_grids_draw(const brindle_grids* grids, const char* title, int dots,
+                                  int left_handed, char** text) {
+    if (text == nullptr) return FailForNull("text");
+    *text = nullptr;
+    if (grids == nullptr) return FailForNull("grids");
+    if (title == nullptr) return FailForNull("title");
+    if (dots < BRINDLE_DOTS_FINGERS || dots > BRINDLE_DOTS_INTERVALS) {
+        return Fail(BRINDLE_ERROR_ARGUMENT, "dots are one of brindle_dots");
+    }
+    return Guarded([&] {
+        const brindle::CGridStyle style{static_cast<brindle::TGridDots>(dots), left_handed != 0};
+        return GiveText(brindle::GridsSvg(grids->mGrids, brindle::Printable(title), style), text);
     });
 }

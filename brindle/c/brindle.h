@@ -583,11 +583,60 @@ BRINDLE_API size_t brindle_grids_count(const brindle_grids* grids);
 /** The fingering at an index from 0. */
 BRINDLE_API brindle_status brindle_grids_get(const brindle_grids* grids, size_t index,
                                              brindle_grid* grid);
+
+/** What the lowest note of a searched fingering has to be. */
+typedef enum brindle_lowest {
+    BRINDLE_LOWEST_USUAL = 0,    /**< what stands behind a slash, else preferably the root */
+    BRINDLE_LOWEST_REQUIRED = 1, /**< what stands behind a slash, else the root */
+    BRINDLE_LOWEST_FREE = 2      /**< any tone of the chord */
+} brindle_lowest;
+
+/** What stands on the dots of a diagram. */
+typedef enum brindle_dots {
+    BRINDLE_DOTS_FINGERS = 0,  /**< 1 index to 4 little finger */
+    BRINDLE_DOTS_NOTES = 1,    /**< "F#" */
+    BRINDLE_DOTS_INTERVALS = 2 /**< degrees as the chord names them, "b3" */
+} brindle_dots;
+
+/** What a hand and its player allow. */
+typedef struct brindle_fingering_options {
+    const char* tuning; /**< as for brindle_grids_find, or a name, "drop d"; NULL for the guitar */
+    int capo;           /**< a fret of 0 to 24; frets are counted from it */
+    int highest_fret;   /**< last fret of the neck, 1 to 24 */
+    int span;           /**< frets under the hand, 2 to 6; one more from the seventh fret on */
+    int lowest;         /**< a brindle_lowest */
+    int whole;          /**< not 0: nothing is left out */
+    int rootless;       /**< not 0: the root may be left to a bass player */
+    size_t limit;       /**< most fingerings of a chord, 1 to 1000 */
+} brindle_fingering_options;
+
+/** Standard guitar without a capo, fret 15, span 4, usual bass, 10 fingerings. */
+BRINDLE_API brindle_fingering_options brindle_fingering_options_default(void);
+/** Searches the fingerings of a chord symbol, the best first, without a package. `options` may be
+ * NULL for the default, here and below. That there are none is no error. */
+BRINDLE_API brindle_status brindle_grids_search(const char* symbol,
+                                                const brindle_fingering_options* options,
+                                                brindle_grids** grids);
+/** The fingerings of a song that are easy and near each other, each different one once. With a
+ * `highest_capo` of 0 to 12 the capo lies where the song is easiest up to that fret; with -1 at the
+ * fret of the options. The names are those of the shapes under the capo. */
+BRINDLE_API brindle_status brindle_grids_of_song(const brindle_song* song,
+                                                 const brindle_fingering_options* options,
+                                                 int highest_capo, brindle_grids** grids);
+/** The same as strict JSON, with what each fret of the capo makes of the song and the fingering of
+ * each chord, as the program prints it. */
+BRINDLE_API brindle_status brindle_song_grids_json(const brindle_song* song,
+                                                   const brindle_fingering_options* options,
+                                                   int highest_capo, char** text);
+
 /** As strict JSON, the same as the program prints for fingerings. */
 BRINDLE_API brindle_status brindle_grids_json(const brindle_grids* grids, char** text);
 /** A sheet of diagrams under a title, a file in SVG. */
 BRINDLE_API brindle_status brindle_grids_svg(const brindle_grids* grids, const char* title,
                                              char** text);
+/** The same with a brindle_dots on the dots, and for the left hand if that is not 0. */
+BRINDLE_API brindle_status brindle_grids_draw(const brindle_grids* grids, const char* title,
+                                              int dots, int left_handed, char** text);
 
 /* Markov models of chord sequences */
 

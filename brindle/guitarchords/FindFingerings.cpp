@@ -1,7 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/guitarchords/FindFingerings.h"
 
-#include "brindle/guitarchords/NameFingering.h"
+#include "brindle/guitarchords/Tunings.h"
+#include "brindle/guitarchords/internal/FingeringCost.h"
 #include "brindle/guitarchords/internal/FingeringSearch.h"
 #include "brindle/guitarchords/internal/HandOf.h"
 #include "brindle/theory/KeyIntervals.h"
@@ -12,7 +13,6 @@ namespace brindle {
 namespace {
 
 constexpr int kRootTone = 0;
-constexpr int kMostCapo = 12;
 constexpr std::size_t kMostFingerings = 1000;
 
 /// Bits of key numbers from bits above a root.
@@ -41,44 +41,39 @@ CSemitones MayBeOmitted(CSemitones semitones, int strings, const CFingeringOptio
     return tones;
 }
 
-}  // namespace
+bool IsSearchable(const CChordLite& chord, const GChShortTuning& tuning) {
+    return !chord.IsUndef() && !chord.mSemitones.IsEmpty() && GChIsValidShortTuning(tuning) &&
+           GChNumberOfStringsInShortTuning(tuning) <= kFingeringMostStrings;
+}
 
-std::vector<CFingering> FindFingerings(const CChordLite& chord, const GChShortTuning& tuning,
-                                       const CFingeringOptions& options) {
-    const int strings = GChNumberOfStringsInShortTuning(tuning);
-    if (chord.IsUndef() || chord.mSemitones.IsEmpty() || !GChIsValidShortTuning(tuning) ||
-        strings > kFingeringMostStrings) {
-        return {};
-    }
+CFingeringTask TaskOf(const CChordLite& chord, const GChShortTuning& tuning,
+                      const CFingeringOptions& options) {
     const int root = FoldIntoOctave(chord.mRootKeyEnh.mKeyNr);
     const bool hasBass = chord.IsSlashChord();
     CFingeringTask task;
     task.mTuning = tuning;
-    task.mStrings = strings;
-    task.mCapo = std::clamp(options.mCapo, 0, kMostCapo);
+    task.mStrings = GChNumberOfStringsInShortTuning(tuning);
+    task.mHasShortString = HasShortString(tuning);
+    task.mCapo = std::clamp(options.mCapo, 0, kFingeringMostFrets);
     task.mRoot = root;
     task.mBass = hasBass ? FoldIntoOctave(chord.mBassKeyEnh.mKeyNr) : root;
     task.mSemitones = chord.mSemitones;
-    task.mMayBeOmitted = MayBeOmitted(chord.mSemitones, strings, options);
-    const bool isReentrant = IsReentrant(tuning);
+    task.mMayBeOmitted = MayBeOmitted(chord.mSemitones, task.mStrings, options);
     const bool isUsual = options.mBass == TFingeringBass::Usual;
     task.mBassIsRequired =
-        options.mBass == TFingeringBass::Required || (isUsual && hasBass && !isReentrant);
-    task.mBassCounts = options.mBass != TFingeringBass::Free && !(isUsual && isReentrant);
+        options.mBass == TFingeringBass::Required || (isUsual && hasBass && !IsReentrant(tuning));
+    task.mBassCounts = options.mBass == TFingeringBass::Required || (isUsual && BearsBass(tuning));
     task.mKeys = KeysOf(chord.mSemitones, root) | 1U << task.mBass;
     task.mNeededKeys = KeysOf(chord.mSemitones - task.mMayBeOmitted, root);
     if (hasBass) task.mNeededKeys |= 1U << task.mBass;
     task.mIsSymmetric = IsSymmetric(chord.mSemitones);
     task.mOptions = options;
     task.mOptions.mLimit = std::min(options.mLimit, kMostFingerings);
-    std::vector<CFingering> found = SearchFingerings(task);
-    std::sort(found.begin(), found.end(), IsBetterFingering);
-    found.resize(std::min(task.mOptions.mLimit, found.size()));
-    return found;
+    return task;
 }
 
-std::optional<CFingering> FingeringOfFrets(std::span<const int> frets, const GChShortTuning& tuning,
-                                           int capo) {
+/// Frets without fingers.
+std::optional<CFingering> Laid(std::span<const int> frets, const GChShortTuning& tuning, int capo) {
     const int strings = GChNumberOfStringsInShortTuning(tuning);
     if (static_cast<int>(frets.size()) != strings || strings == 0) return std::nullopt;
     CFingering fingering;
@@ -89,11 +84,41 @@ std::optional<CFingering> FingeringOfFrets(std::span<const int> frets, const GCh
         const int fret = std::clamp(frets[i], kMutedString, kGChFrets);
         fingering.mFrets[i] = static_cast<std::int8_t>(fret);
     }
-    const auto hand = HandOf(fingering.Frets());
+    return fingering;
+}
+
+}  // namespace
+
+std::vector<CFingering> FindFingerings(const CChordLite& chord, const GChShortTuning& tuning,
+                                       const CFingeringOptions& options) {
+    if (!IsSearchable(chord, tuning)) return {};
+    const CFingeringTask task = TaskOf(chord, tuning, options);
+    std::vector<CFingering> found = SearchFingerings(task);
+    std::sort(found.begin(), found.end(), IsBetterFingering);
+    found.resize(std::min(task.mOptions.mLimit, found.size()));
+    return found;
+}
+
+std::optional<CFingering> FingeringOfFrets(std::span<const int> frets, const GChShortTuning& tuning,
+                                           int capo) {
+    auto fingering = Laid(frets, tuning, capo);
+    const auto hand = fingering ? HandOf(fingering->Frets()) : std::nullopt;
     if (!hand) return std::nullopt;
-    fingering.mFingers = hand->mPlaces;
-    fingering.mFingerCount = hand->mCount;
-    fingering.mDifficulty = DifficultyOf(*hand);
+    SetHand(*fingering, *hand);
+    return fingering;
+}
+
+std::optional<CFingering> FingeringForChord(std::span<const int> frets, const CChordLite& chord,
+                                            const GChShortTuning& tuning,
+                                            const CFingeringOptions& options) {
+    if (!IsSearchable(chord, tuning)) return std::nullopt;
+    const CFingeringTask task = TaskOf(chord, tuning, options);
+    auto fingering = Laid(frets, tuning, task.mCapo);
+    if (!fingering || !SetSound(*fingering, task)) return std::nullopt;
+    const auto hand = HandOf(fingering->Frets());
+    if (!hand) return std::nullopt;
+    SetHand(*fingering, *hand);
+    fingering->mCost = CostOfSoundAndPlace(*fingering, task) + CostOfHand(*hand);
     return fingering;
 }
 

@@ -14,8 +14,9 @@ namespace brindle {
 
 /// What the lowest note of a fingering has to be.
 enum class TFingeringBass : std::uint8_t {
-    /// The tone behind a slash, if there is one; otherwise the root is preferred. On a re-entrant
-    /// tuning, as that of the ukulele, as if it were Free.
+    /// The tone behind a slash, if there is one; otherwise the root is preferred where the tuning
+    /// bears a bass (see BearsBass). On a re-entrant tuning, as that of the ukulele, as if it were
+    /// Free.
     Usual,
     Required,  ///< the tone behind the slash, else the root
     Free,      ///< any tone of the chord
@@ -28,7 +29,7 @@ inline constexpr int kFingeringMostStrings = 12;
 
 /// What a hand and its player allow. Values out of their ranges are taken as the nearest.
 struct CFingeringOptions {
-    /// Fret of the capodaster, 0 to 12; frets are counted from it.
+    /// Fret of the capodaster, 0 to kFingeringMostFrets; frets are counted from it.
     int mCapo = 0;
     /// The last fret of the neck, not counted from the capodaster. 1 to kFingeringMostFrets.
     int mHighestFret = 15;
@@ -62,6 +63,7 @@ struct CFingeringOptions {
 /// The search goes through all positions of the hand and in each from string to string, and leaves
 /// a way as soon as it needs a fifth finger or too few strings remain for the tones that are
 /// missing. On many strings it may leave out shapes: it looks at a limited number in each position.
+/// The short string of a banjo is open or muted.
 [[nodiscard]] std::vector<CFingering> FindFingerings(const CChordLite& chord,
                                                      const GChShortTuning& tuning,
                                                      const CFingeringOptions& options = {});
@@ -71,6 +73,13 @@ struct CFingeringOptions {
 [[nodiscard]] std::optional<CFingering> FingeringOfFrets(std::span<const int> frets,
                                                          const GChShortTuning& tuning,
                                                          int capo = 0);
+
+/// The same with all that FindFingerings tells of a fingering of this chord, its place in the order
+/// of a player among it. What sounds is not checked against the chord.
+[[nodiscard]] std::optional<CFingering> FingeringForChord(std::span<const int> frets,
+                                                          const CChordLite& chord,
+                                                          const GChShortTuning& tuning,
+                                                          const CFingeringOptions& options = {});
 
 /// The tones of a chord that players leave out: the perfect fifth of a chord of four tones and
 /// more, the ninth and eleventh below a thirteenth, the eleventh above a major third, and of a

@@ -6,6 +6,8 @@
 #include "brindle/theory/KeyIntervals.h"
 
 #include <algorithm>
+#include <limits>
+#include <vector>
 
 namespace brindle {
 namespace {
@@ -20,12 +22,16 @@ std::vector<int> PitchesOf(const GChChord& chord, int capo) {
     return pitches;
 }
 
-int HighestFretOfGrid(const GChBasicChord& grid) {
-    int highest = 0;
-    for (const GChChordElem& elem : grid.chordElems()) {
-        highest = std::max(highest, elem.absFretIndex() + 1);
+/// The place of a grid in the order of FindFingerings; what one hand cannot hold stands behind.
+int CostForPlayer(const GChChord& grid, const CChordLite& chord, int capo) {
+    std::vector<int> frets;
+    for (int i = 0; i < grid.numberOfStrings(); ++i) {
+        frets.push_back(grid.maxAbsFretIndexPlusOneForStringIndex(i));
     }
-    return highest;
+    CFingeringOptions options;
+    options.mCapo = capo;
+    const auto held = FingeringForChord(frets, chord, grid.basicChord()->shortTuning(), options);
+    return held ? held->mCost : std::numeric_limits<int>::max();
 }
 
 /// Whether a library tells a bass, and the same as the chord.
@@ -68,14 +74,13 @@ std::vector<CFoundGrid> LookUpChord(const GChDatabase& database, const CChordLit
             if (grid.rootNote(capo) != chord.mRootKeyEnh.mKeyNr) continue;
             if (!HasBassOf(grid, chord, capo)) continue;
             const auto omitted = TonesLeftOut(PitchesOf(grid, capo), chord);
-            if (omitted) found.push_back({basicChord, *omitted});
+            if (omitted) {
+                found.push_back({basicChord, *omitted, CostForPlayer(grid, chord, capo)});
+            }
         }
     }
-    std::stable_sort(found.begin(), found.end(), [](const CFoundGrid& a, const CFoundGrid& b) {
-        const int more = a.mOmitted.size() - b.mOmitted.size();
-        if (more != 0) return more < 0;
-        return HighestFretOfGrid(*a.mGrid) < HighestFretOfGrid(*b.mGrid);
-    });
+    std::stable_sort(found.begin(), found.end(),
+                     [](const CFoundGrid& a, const CFoundGrid& b) { return a.mCost < b.mCost; });
     return found;
 }
 

@@ -16,6 +16,8 @@ struct CFoundGrid {
     std::shared_ptr<GChBasicChord> mGrid;  ///< as the library has it; never null
     /// Tones of the chord that it leaves out, above the root.
     CSemitones mOmitted;
+    /// Its place in the order of a player, as CFingering has it: less is better.
+    int mCost = 0;
 };
 
 /// What pitches leave out of a chord; nothing if they sound another one, lack more than players
@@ -24,9 +26,8 @@ struct CFoundGrid {
                                                      const CChordLite& chord);
 
 /// The fingerings of a tuning that stand over the root of the chord and sound it under the
-/// capodaster: whole ones first, then those that lie lower, otherwise in the order of the
-/// database. A chord without a slash is
-/// not found where a library tells a bass. The tuning counts up to whole octaves.
+/// capodaster, in the order of FindFingerings: low ones with open strings first. A chord without a
+/// slash is not found where a library tells a bass. The tuning counts up to whole octaves.
 [[nodiscard]] std::vector<CFoundGrid> LookUpChord(const GChDatabase& database,
                                                   const CChordLite& chord,
                                                   const GChShortTuning& tuning, int capo);

@@ -1,5 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/guitarchords/NameFingering.h"
+
+#include "brindle/guitarchords/Tunings.h"
 #include "brindle/neural/RootCostsByNet.h"
 #include "brindle/theory/KeyIntervals.h"
 
@@ -21,7 +23,7 @@ bool IsTurned(const CChordLite& chord) {
     return chord.mSemitones.HasIntvl(FoldIntoOctave(up));
 }
 
-int CostForPlayers(const CNamedChord& name, bool isReentrant) {
+int CostForPlayers(const CNamedChord& name, bool bearsBass) {
     const auto has = [&](int tone) { return name.mChord.mSemitones.HasIntvl(tone); };
     const bool hasThird = has(3) || has(4);
     const bool isTurned = IsTurned(name.mChord);
@@ -30,17 +32,12 @@ int CostForPlayers(const CNamedChord& name, bool isReentrant) {
         cost += kCostOfSecondBelowSeventh;
     }
     if (!hasThird && (has(2) || has(5)) && isTurned) cost += kCostOfTurnedSuspension;
-    if (isReentrant && has(3) && has(6) && has(10)) cost += kCostOfUnstableRoot;
+    if (!bearsBass && has(3) && has(6) && has(10)) cost += kCostOfUnstableRoot;
     const auto omissions = static_cast<int>(name.mOmitted.size());
     return cost + kCostOfFurtherOmission * std::max(0, omissions - 1);
 }
 
 }  // namespace
-
-bool IsReentrant(const GChShortTuning& tuning) {
-    const std::vector<int> pitches = GChPitchArrayFromShortTuning(tuning);
-    return !std::is_sorted(pitches.begin(), pitches.end());
-}
 
 std::vector<CNamedChord> NameFingering(std::span<const int> pitches, const GChShortTuning& tuning) {
     std::vector<CNote> notes;
@@ -49,10 +46,10 @@ std::vector<CNamedChord> NameFingering(std::span<const int> pitches, const GChSh
     }
     CNamingOptions options;
     options.mRootCosts = RootCostsByNet(notes);
-    const bool isReentrant = IsReentrant(tuning);
-    if (isReentrant) options.mBass = TBassUse::None;
+    const bool bearsBass = BearsBass(tuning);
+    if (!bearsBass) options.mBass = TBassUse::None;
     std::vector<CNamedChord> names = NameNotes(notes, options);
-    for (CNamedChord& name : names) name.mCost += CostForPlayers(name, isReentrant);
+    for (CNamedChord& name : names) name.mCost += CostForPlayers(name, bearsBass);
     std::stable_sort(names.begin(), names.end(),
                      [](const CNamedChord& a, const CNamedChord& b) { return a.mCost < b.mCost; });
     return names;

@@ -9,14 +9,11 @@
 
 namespace brindle {
 
-/// Whether a string is tuned higher than the one behind it, as the G of a ukulele is.
-[[nodiscard]] bool IsReentrant(const GChShortTuning& tuning);
-
 /// Names what the strings of a fingering sound as a guitarist would: x02010 is Am7 and 200232 D/F#.
 /// `pitches` are MIDI numbers from the string with the lowest index, negative for a muted string.
 /// NameNotes and the net that hears roots judge together, and what players mind in a name: whole
-/// chords before ones that lack several tones, Em/A before A7sus2. On a re-entrant tuning the
-/// lowest note is no bass and no name has a slash. Without a string that sounds there is no name.
+/// chords before ones that lack several tones, Em/A before A7sus2. On a tuning that bears no bass
+/// (see BearsBass) no name has a slash. Without a string that sounds there is no name.
 [[nodiscard]] std::vector<CNamedChord> NameFingering(std::span<const int> pitches,
                                                      const GChShortTuning& tuning);
 

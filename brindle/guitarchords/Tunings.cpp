@@ -5,7 +5,9 @@
 
 #include <algorithm>
 #include <array>
+#include <cstdint>
 #include <string>
+#include <vector>
 
 namespace brindle {
 namespace {
@@ -65,6 +67,31 @@ std::optional<GChShortTuning> TuningOfName(std::string_view name) {
         }
     }
     return std::nullopt;
+}
+
+bool IsReentrant(const GChShortTuning& tuning) {
+    const std::vector<int> pitches = GChPitchArrayFromShortTuning(tuning);
+    return !std::is_sorted(pitches.begin(), pitches.end());
+}
+
+bool BearsBass(const GChShortTuning& tuning) {
+    constexpr int kFewStrings = 4;
+    constexpr int kC2 = 48;
+    constexpr int kFourth = 5;
+    if (IsReentrant(tuning)) return false;
+    const int strings = GChNumberOfStringsInShortTuning(tuning);
+    if (strings > kFewStrings || tuning[0] < kC2) return true;
+    const auto* const end = tuning.begin() + strings;
+    return std::adjacent_find(tuning.begin(), end,
+                              [](int low, int high) { return high - low != kFourth; }) == end;
+}
+
+bool HasShortString(const GChShortTuning& tuning) {
+    constexpr int kStringsOfBanjo = 5;
+    const auto* const first = tuning.begin();
+    return GChNumberOfStringsInShortTuning(tuning) == kStringsOfBanjo &&
+           std::all_of(first + 1, first + kStringsOfBanjo,
+                       [&](std::uint8_t pitch) { return pitch < *first; });
 }
 
 std::string_view TitleOfTuning(const GChShortTuning& tuning) {

@@ -31,4 +31,17 @@ struct CNamedTuning {
 /// The title of exactly this tuning; empty if it has none.
 [[nodiscard]] std::string_view TitleOfTuning(const GChShortTuning& tuning);
 
+/// Whether a string is tuned higher than the one behind it, as the G of a ukulele is.
+[[nodiscard]] bool IsReentrant(const GChShortTuning& tuning);
+
+/// Whether the lowest note of a chord is heard as its bass. It is not on a re-entrant tuning, nor
+/// on up to four strings that are no bass guitar, which lies below C2 or has fourths from string to
+/// string: what a guitarist would call inversions are the usual shapes of mandolin, cavaquinho and
+/// baritone ukulele.
+[[nodiscard]] bool BearsBass(const GChShortTuning& tuning);
+
+/// Whether the first of five strings is the short one of a banjo, which sounds above all others and
+/// begins at the fifth fret: it is left open or does not sound.
+[[nodiscard]] bool HasShortString(const GChShortTuning& tuning);
+
 }  // namespace brindle

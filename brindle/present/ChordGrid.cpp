@@ -13,6 +13,7 @@
 #include "brindle/guitarchords/LookUpChord.h"
 #include "brindle/guitarchords/NameFingering.h"
 #include "brindle/guitarchords/Tunings.h"
+#include "brindle/platform/Ascii.h"
 #include "brindle/present/ShownText.h"
 #include "brindle/theory/KeyIntervals.h"
 #include "brindle/theory/KeyNames.h"
@@ -32,7 +33,7 @@ constexpr int kMuted = -1;
 constexpr int kLowestOpenString = 48;
 
 bool IsFretsText(std::string_view text) {
-    return text.find_first_not_of("0123456789xX-,.") == text.npos &&
+    return text.find_first_not_of("0123456789xX-,. ") == text.npos &&
            text.find_first_of("0123456789xX") != text.npos;
 }
 
@@ -47,10 +48,19 @@ std::optional<int> ReadFret(std::string_view word) {
     return fret <= kGChFrets ? std::optional(fret) : std::nullopt;
 }
 
+/// Whether a letter is followed by a sign. Behind small letters in a row b is a note, as in
+/// "eadgbe", but not in "eb ab db" and "eb2ab2".
+bool IsSigned(std::string_view text, bool beginsPiece) {
+    if (text.size() < 2 || (text[1] != '#' && text[1] != 'b')) return false;
+    if (text[1] == '#' || Ascii::IsCapital(text[0])) return true;
+    const std::string_view behind = text.substr(2);
+    const bool endsPiece = behind.empty() || behind[0] == ' ' || behind[0] == ',';
+    return endsPiece ? beginsPiece : behind[0] == '-' || Ascii::IsDigit(behind[0]);
+}
+
 /// Takes a letter with its sign from the start of a text.
-std::string_view TakeKeyName(std::string_view& text) {
-    const bool isSigned = text.size() > 1 && (text[1] == '#' || text[1] == 'b');
-    const std::string_view name = text.substr(0, isSigned ? 2 : 1);
+std::string_view TakeKeyName(std::string_view& text, bool beginsPiece) {
+    const std::string_view name = text.substr(0, IsSigned(text, beginsPiece) ? 2 : 1);
     text.remove_prefix(name.size());
     return name;
 }
@@ -144,14 +154,37 @@ std::vector<std::string> OmittedDegrees(const CChordLite& chord, CSemitones omit
     return degrees;
 }
 
-/// The bass behind a slash stands as it is written, other notes as tones of the chord. Undefined
-/// without a chord that spells.
+/// Whether a fingering of a library is one that the options allow.
+bool IsWithin(const CFoundGrid& found, const CFingeringOptions& options) {
+    constexpr int kUpTheNeck = 7;
+    if (!options.mMayOmitTones && !found.mOmitted.IsEmpty()) return false;
+    const auto& elems = found.mGrid->chordElems();
+    if (elems.empty()) return true;
+    const auto [low, high] = std::minmax_element(
+        elems.begin(), elems.end(),
+        [](const auto& a, const auto& b) { return a.absFretIndex() < b.absFretIndex(); });
+    const int position = low->absFretIndex() + 1;
+    const int span = position >= kUpTheNeck ? options.mSpanUpTheNeck : options.mSpan;
+    return high->absFretIndex() + 1 + options.mCapo <= options.mHighestFret &&
+           high->absFretIndex() - low->absFretIndex() < span;
+}
+
+/// The bass behind a slash stands as it is written, other notes as tones of the chord, and as they
+/// are usually called without a chord that spells.
 CKeyEnh SpelledKey(const CChordLite& chord, int pitch) {
-    if (chord.IsUndef() || chord.mRootKeyEnh.mEnh == TEnh_Undef) return {};
     const int keyNr = FoldIntoOctave(pitch);
+    if (chord.IsUndef() || chord.mRootKeyEnh.mEnh == TEnh_Undef) {
+        const std::string_view usual = GChOctPitchDefaultName(keyNr);
+        return {keyNr, usual.ends_with('#') ? TEnh_s : usual.ends_with('b') ? TEnh_b : TEnh_n};
+    }
     const CKeyEnh& bass = chord.mBassKeyEnh;
     if (chord.HasBassNote() && bass.mKeyNr == keyNr && bass.mEnh != TEnh_Undef) return bass;
     return ToneAboveRoot(chord, FoldIntoOctave(keyNr - chord.mRootKeyEnh.mKeyNr));
+}
+
+std::string KeyText(const CChordGrid& grid, const CKeyEnh& key) {
+    return grid.mStyle ? Printable(KeyNrAndEnhToName(key.mKeyNr, key.mEnh, *grid.mStyle))
+                       : WriteNoteName(key);
 }
 
 }  // namespace
@@ -189,20 +222,15 @@ std::string NoteText(const CChordGrid& grid, std::size_t string) {
     const int pitch = grid.mPitches[string];
     if (pitch < 0) return {};
     const CKeyEnh key = SpelledKey(grid.mChord, pitch);
-    if (key.IsUndef()) return GChMidiPitchDefaultName(pitch);
     // B# lies in the octave below the C that it sounds as, and Cb in the one above.
     const int natural = pitch - EnhToSemitone(key.mEnh);
-    return fmt::format("{}{}", WriteNoteName(key), natural / 12 + kOctaveOfMidiZero);
+    return fmt::format("{}{}", KeyText(grid, key), natural / 12 + kOctaveOfMidiZero);
 }
 
 std::string DotText(const CChordGrid& grid, std::size_t string, TGridDots dots) {
     const int pitch = grid.mPitches[string];
     if (pitch < 0 || dots == TGridDots::Fingers) return {};
-    if (dots == TGridDots::Notes) {
-        const CKeyEnh key = SpelledKey(grid.mChord, pitch);
-        if (!key.IsUndef()) return WriteNoteName(key);
-        return std::string(GChOctPitchDefaultName(FoldIntoOctave(pitch)));
-    }
+    if (dots == TGridDots::Notes) return KeyText(grid, SpelledKey(grid.mChord, pitch));
     if (grid.mRoot < 0) return {};
     return DegreeOnDot(grid.mChord, FoldIntoOctave(pitch - grid.mRoot));
 }
@@ -214,11 +242,13 @@ std::string TuningTitle(const CChordGrid& grid) {
 }
 
 std::optional<std::vector<int>> ReadFrets(std::string_view text) {
+    constexpr std::string_view kBetween = "-,. ";
+    text = Ascii::Trimmed(text);
     if (!IsFretsText(text)) return std::nullopt;
-    const bool isLong = text.find_first_of("-,.") != text.npos;
+    const bool isLong = text.find_first_of(kBetween) != text.npos;
     std::vector<int> frets;
     while (!text.empty()) {
-        const std::size_t length = isLong ? std::min(text.find_first_of("-,."), text.size()) : 1;
+        const std::size_t length = isLong ? std::min(text.find_first_of(kBetween), text.size()) : 1;
         const auto fret = ReadFret(text.substr(0, length));
         if (!fret) return std::nullopt;
         frets.push_back(*fret);
@@ -235,9 +265,11 @@ std::optional<GChShortTuning> ReadTuning(std::string_view text) {
     std::vector<int> keyNrs;
     std::vector<int> pitches;
     while (true) {
-        rest.remove_prefix(std::min(rest.find_first_not_of(" ,"), rest.size()));
+        const std::size_t gap = std::min(rest.find_first_not_of(" ,"), rest.size());
+        const bool beginsPiece = gap > 0 || rest.size() == folded.size();
+        rest.remove_prefix(gap);
         if (rest.empty()) break;
-        const std::string name(TakeKeyName(rest));
+        const std::string name(TakeKeyName(rest, beginsPiece));
         const std::string octave(TakeOctave(rest));
         // An octave that is missing may be any: the key is the same in all.
         const int pitch = GChMidiPitchForPitchString(name + (octave.empty() ? "0" : octave));
@@ -279,11 +311,13 @@ std::optional<CChordGrid> GridOfFrets(std::string_view symbol, const std::vector
     grid.mCapo = capo;
     grid.mElems = chord.chordElems();
     grid.mFrets = frets;
+    grid.mStyle = style;
     for (std::size_t i = 0; i < frets.size(); ++i) {
         grid.mPitches.push_back(chord.pitchForStringIndex1(static_cast<int>(i), tuningDescr));
     }
     SetNames(grid, style);
     if (const auto held = FingeringOfFrets(frets, tuning, capo)) {
+        grid.mElems = held->Elems();
         grid.mDifficulty = held->mDifficulty;
     }
     return grid;
@@ -342,6 +376,8 @@ std::vector<CChordGrid> GridsForChord(const GChDatabase& database, std::string_v
                                       const CFingeringOptions& options) {
     std::vector<CChordGrid> grids;
     for (const CFoundGrid& found : LookUpChord(database, chord, tuning, options.mCapo)) {
+        if (grids.size() == options.mLimit) break;
+        if (!IsWithin(found, options)) continue;
         grids.push_back(GridOfChord(symbol, *GChChord::make(found.mGrid, 0), options.mCapo));
         grids.back().mChord = chord;
         grids.back().mOmitted = OmittedDegrees(chord, found.mOmitted);

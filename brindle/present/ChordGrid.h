@@ -34,6 +34,8 @@ struct CChordGrid {
     std::vector<int> mFrets;
     /// Of each string: -1 muted.
     std::vector<int> mPitches;
+    /// How its notes are written; without one as people type them.
+    std::optional<CChordNamePrefs> mStyle;
     /// The chord that spells its notes: Eb of Cm9, not D#. Undefined if it has no name.
     CChordLite mChord;
     /// The key that the name stands on, 0 to 11.
@@ -62,11 +64,12 @@ struct CFretWindow {
 /// "x32010"; frets of two digits stand between dashes: "x-10-12-12-11-10".
 [[nodiscard]] std::string FretsText(const CChordGrid& grid);
 
-/// The frets of a text in one of these forms; nothing if it has another.
+/// The frets of a text in one of these forms, or with commas, points or blanks between the strings;
+/// nothing if it has another.
 [[nodiscard]] std::optional<std::vector<int>> ReadFrets(std::string_view text);
 
-/// The note that a string sounds with its octave, as guitarists write it, spelled by the chord:
-/// "Eb4". Empty for a muted string.
+/// The note that a string sounds with its octave, as guitarists write it, spelled by the chord and
+/// in the style of the grid: "Eb4". Empty for a muted string.
 [[nodiscard]] std::string NoteText(const CChordGrid& grid, std::size_t string);
 
 /// What a string says at its fret: its note, "F#", or its degree as its chord names it, "b3", "9".
@@ -78,15 +81,16 @@ struct CFretWindow {
 
 /// A tuning as people write it: its name (see TuningOfName), letters from the lowest string,
 /// "DADGAD", or pitches with octaves, "E2A2D3G3B3E4". Six letters lie as near to the standard
-/// guitar as they can; others ascend, the first in the octave of C2. Nothing for any other text and
-/// for less than three strings.
+/// guitar as they can; others ascend, the first in the octave of C2. Letters may be small,
+/// "eadgbe". Nothing for any other text and for less than three strings.
 [[nodiscard]] std::optional<GChShortTuning> ReadTuning(std::string_view text);
 
 /// "E2 A2 D3 G3 B3 E4"
 [[nodiscard]] std::string TuningText(const GChShortTuning& tuning);
 
-/// Frets without fingers, named as NameFingering does, in a style if one is given. Nothing if there
-/// are more fretted strings than a fingering has elements.
+/// Frets with the fingers of FingeringOfFrets, named as NameFingering does, in a style if one is
+/// given; dots without fingers if one hand cannot hold them. Nothing if there are more fretted
+/// strings than a fingering has elements.
 [[nodiscard]] std::optional<CChordGrid> GridOfFrets(
     std::string_view symbol, const std::vector<int>& frets, const GChShortTuning& tuning, int capo,
     const std::optional<CChordNamePrefs>& style = {});
@@ -99,8 +103,9 @@ struct CFretWindow {
 [[nodiscard]] CChordGrid GridOfFingering(std::string_view symbol, const CFingering& fingering,
                                          const CChordLite& chord);
 
-/// The fingerings of a chord as people type it: those of the database, or if it has none the best
-/// ones that FindFingerings finds, as many as the options want.
+/// The fingerings of a chord as people type it: those of the database that lie within the options
+/// (what may be left out, the last fret, the span), or if it has none the best ones that
+/// FindFingerings finds; as many as the options want.
 [[nodiscard]] std::vector<CChordGrid> GridsForChord(const GChDatabase& database,
                                                     std::string_view symbol,
                                                     const CChordLite& chord,

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/present/GridsSvg.h"
 
+#include "brindle/present/ShownText.h"
 #include "brindle/present/SongShapes.h"
 
 #include <fmt/format.h>
@@ -121,7 +122,7 @@ private:
     /// A third letter makes all of them smaller.
     void SayTone(const GChChordElem& elem, std::size_t string, double y) {
         const std::string text = DotText(mGrid, string, mStyle.mDots);
-        const double letters = std::max(kDotLetters, static_cast<double>(text.size()));
+        const double letters = std::max(kDotLetters, static_cast<double>(CountCharacters(text)));
         Say(elem, string, y, text, kDotTextSize * kDotLetters / letters);
     }
 

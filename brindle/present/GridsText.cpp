@@ -27,10 +27,33 @@ std::size_t GapOfStrings(const CChordGrid& grid, TGridDots dots) {
     if (dots == TGridDots::Fingers) return 2;
     std::size_t longest = 2;
     for (std::size_t i = 0; i < grid.mFrets.size(); ++i) {
-        longest = std::max(longest, DotText(grid, i, dots).size());
+        longest = std::max(longest, CountCharacters(DotText(grid, i, dots)));
     }
     return longest + 1;
 }
+
+/// A line by its characters, since signs take several bytes each.
+class CCharacterRow {
+public:
+    explicit CCharacterRow(std::size_t width) : mCharacters(width, " ") {}
+
+    void Write(std::size_t at, std::string_view text) {
+        for (; at < mCharacters.size() && !text.empty(); ++at) {
+            mCharacters[at] = FirstCharacters(text, 1);
+            text.remove_prefix(mCharacters[at].size());
+        }
+    }
+
+    /// Without the blanks behind it.
+    [[nodiscard]] std::string Text() const {
+        std::string text = fmt::format("{}", fmt::join(mCharacters, ""));
+        text.erase(text.find_last_not_of(' ') + 1);
+        return text;
+    }
+
+private:
+    std::vector<std::string> mCharacters;
+};
 
 /// Draws the frets of one diagram. The lowest string stands on the left, or on the right for the
 /// left hand; strings stand as far apart as what is written on them asks for.
@@ -45,22 +68,22 @@ public:
     [[nodiscard]] std::size_t Width() const { return mGap * (mStrings - 1) + 1; }
 
     [[nodiscard]] std::string StringMarks() const {
-        std::string marks(mGap * mStrings, ' ');
+        CCharacterRow marks(mGap * mStrings);
         for (std::size_t i = 0; i < mStrings; ++i) {
             const int fret = mGrid.mFrets[i];
             const std::string said = fret == 0 ? DotText(mGrid, i, mStyle.mDots) : std::string();
-            if (fret <= 0) Write(marks, At(i), fret < 0 ? "x" : said.empty() ? "o" : said);
+            if (fret <= 0) marks.Write(At(i), fret < 0 ? "x" : said.empty() ? "o" : said);
         }
-        return marks;
+        return marks.Text();
     }
 
     [[nodiscard]] std::string Fret(int fret) const {
-        std::string row(mGap * mStrings, ' ');
-        for (std::size_t i = 0; i < mStrings; ++i) row[At(i)] = '|';
+        CCharacterRow row(mGap * mStrings);
+        for (std::size_t i = 0; i < mStrings; ++i) row.Write(At(i), "|");
         for (const GChChordElem& elem : mGrid.mElems) {
             if (elem.absFretIndex() == fret) Draw(elem, row);
         }
-        return row.substr(0, row.find_last_not_of(' ') + 1);
+        return row.Text();
     }
 
 private:
@@ -68,21 +91,17 @@ private:
         return mGap * (mStyle.mLeftHanded ? mStrings - 1 - string : string);
     }
 
-    static void Write(std::string& row, std::size_t at, std::string_view text) {
-        row.replace(at, text.size(), text);
-    }
-
-    void Draw(const GChChordElem& elem, std::string& row) const {
+    void Draw(const GChChordElem& elem, CCharacterRow& row) const {
         const auto first = static_cast<std::size_t>(elem.coveredMinStr());
         const auto last = std::min(static_cast<std::size_t>(elem.coveredMaxStr()), mStrings - 1);
         if (first >= mStrings) return;
         const std::size_t left = std::min(At(first), At(last));
         const std::size_t right = std::max(At(first), At(last));
-        for (std::size_t at = left; at <= right; ++at) row[at] = '-';
-        row[left] = row[right] = MarkOf(elem);
+        row.Write(left, std::string(right - left + 1, '-'));
+        for (const std::size_t end : {left, right}) row.Write(end, std::string(1, MarkOf(elem)));
         for (std::size_t i = first; i <= last; ++i) {
             const std::string said = DotText(mGrid, i, mStyle.mDots);
-            if (mGrid.mFrets[i] == elem.absFretIndex() + 1) Write(row, At(i), said);
+            if (mGrid.mFrets[i] == elem.absFretIndex() + 1) row.Write(At(i), said);
         }
     }
 

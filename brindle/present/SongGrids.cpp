@@ -15,18 +15,23 @@
 namespace brindle {
 namespace {
 
-std::string ShapeName(const CChordLite& chord, std::string_view symbol, int capo) {
-    return capo == 0 ? std::string(symbol) : WriteChordSymbol(ShapeUnderCapo(chord, capo));
+/// What the hand plays of each chord, by name; without a capodaster as the song writes it.
+std::vector<std::string> ShapeNames(std::span<const CChordLite> chords,
+                                    std::span<const std::string> symbols, int capo) {
+    std::vector<std::string> names(symbols.begin(), symbols.end());
+    if (capo == 0) return names;
+    const std::vector<CChordLite> shapes = ShapesUnderCapo(chords, capo);
+    for (std::size_t i = 0; i < shapes.size(); ++i) names[i] = WriteChordSymbol(shapes[i]);
+    return names;
 }
 
-CShownCapo ShownCapo(std::span<const CChordLite> chords, std::span<const std::string> symbols,
+CShownCapo ShownCapo(std::span<const CChordLite> chords, std::span<const std::string> names,
                      const CSongFingerings& song) {
     CShownCapo shown{song.mCapo, song.mCost, song.mDifficulty, song.mHoles, {}};
     std::set<std::string> seen;
     for (std::size_t i = 0; i < chords.size(); ++i) {
-        if (chords[i].IsUndef()) continue;
-        const std::string name = ShapeName(chords[i], symbols[i], song.mCapo);
-        if (seen.insert(name).second) shown.mShapes.push_back(name);
+        if (chords[i].IsUndef() || !seen.insert(names[i]).second) continue;
+        shown.mShapes.push_back(names[i]);
     }
     return shown;
 }
@@ -35,7 +40,10 @@ constexpr std::size_t kShownCapos = 3;
 
 std::string CapoText(const CShownCapo& capo) {
     const std::string holes =
-        capo.mHoles == 0 ? "" : fmt::format(", {} chords cannot be held", capo.mHoles);
+        capo.mHoles == 0 ? ""
+                         : fmt::format(", {} cannot be held",
+                                       capo.mHoles == 1 ? std::string("1 chord")
+                                                        : fmt::format("{} chords", capo.mHoles));
     return fmt::format("{}: {} (difficulty {:.1f}{})",
                        capo.mCapo == 0 ? "no capo" : fmt::format("capo {}", capo.mCapo),
                        fmt::join(capo.mShapes, " "), capo.mDifficulty, holes);
@@ -58,21 +66,36 @@ CShownSongGrids MakeSongGrids(std::span<const CChordLite> chords,
     shown.mSymbols.assign(symbols.begin(), symbols.end());
     shown.mGridOfChord.resize(chords.size());
     for (const CSongFingerings& song : songs) {
-        shown.mCapos.push_back(ShownCapo(chords, symbols, song));
+        const auto names = ShapeNames(chords, symbols, song.mCapo);
+        shown.mCapos.push_back(ShownCapo(chords, names, song));
     }
     if (songs.empty()) return shown;
+    const std::vector<std::string> names = ShapeNames(chords, symbols, songs.front().mCapo);
     std::map<std::pair<std::string, std::vector<int>>, std::size_t> gridOf;
     for (std::size_t i = 0; i < chords.size(); ++i) {
         const CFingering& fingering = songs.front().mFingerings[i];
         if (fingering.mStringCount == 0) continue;
         CChordGrid grid = GridOfFingering(symbols[i], fingering, chords[i]);
-        grid.mName = ShapeName(chords[i], symbols[i], songs.front().mCapo);
+        grid.mName = names[i];
         const auto [row, isNew] =
             gridOf.try_emplace({symbols[i], grid.mFrets}, shown.mGrids.size());
         if (isNew) shown.mGrids.push_back(std::move(grid));
         shown.mGridOfChord[i] = row->second;
     }
     return shown;
+}
+
+CShownSongGrids MakeSongGrids(const CSong& song, const GChShortTuning& tuning,
+                              const CSongFingeringOptions& options, TSongCapo capo) {
+    const std::size_t count = song.mChords.empty() ? 0 : song.mChords.size() - 1;
+    const std::vector<CChordLite> chords(song.mChords.begin(),
+                                         song.mChords.begin() + static_cast<std::ptrdiff_t>(count));
+    std::vector<std::string> symbols = song.mSymbols;
+    symbols.resize(count);
+    const auto found = capo == TSongCapo::Easiest
+                           ? CompareCapos(chords, tuning, options)
+                           : std::vector{ChooseFingerings(chords, tuning, options)};
+    return MakeSongGrids(chords, symbols, found);
 }
 
 TChordGrids GridsBySymbol(const CShownSongGrids& song) {

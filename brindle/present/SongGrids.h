@@ -3,8 +3,10 @@
 
 #include "brindle/present/CPaint.h"
 #include "brindle/present/ChordGrid.h"
+#include "brindle/song/CSong.h"
 #include "brindle/song/SongFingerings.h"
 
+#include <cstdint>
 #include <optional>
 #include <span>
 #include <string>
@@ -40,6 +42,16 @@ struct CShownSongGrids {
 [[nodiscard]] CShownSongGrids MakeSongGrids(std::span<const CChordLite> chords,
                                             std::span<const std::string> symbols,
                                             std::span<const CSongFingerings> songs);
+
+/// Where the capodaster of a song lies.
+enum class TSongCapo : std::uint8_t {
+    Told,     ///< at the fret of the options
+    Easiest,  ///< where the song is easiest, up to the highest fret of the options
+};
+
+/// The same for a song as it was read.
+[[nodiscard]] CShownSongGrids MakeSongGrids(const CSong& song, const GChShortTuning& tuning,
+                                            const CSongFingeringOptions& options, TSongCapo capo);
 
 /// The grid that each symbol has most often.
 [[nodiscard]] TChordGrids GridsBySymbol(const CShownSongGrids& song);

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/song/SongFingerings.h"
 
+#include "brindle/song/internal/CSpelledInterval.h"
 #include "brindle/theory/KeyIntervals.h"
 #include "brindle/theory/MakeSensefulEnh.h"
 
@@ -8,6 +9,7 @@
 #include <cstdlib>
 #include <limits>
 #include <map>
+#include <optional>
 
 namespace brindle {
 namespace {
@@ -118,6 +120,33 @@ void SumUp(CSongFingerings& song, long long cost, std::size_t changes) {
     if (held > 0) song.mDifficulty /= static_cast<double>(held);
 }
 
+/// Signs of the scale that a chord is the first step of, as far as it has a spelling.
+int SignsOf(const CChordLite& chord, const CSpelledInterval& interval) {
+    constexpr int kFifthsToRelativeMajor = 3;
+    const CKeyEnh& root = chord.mRootKeyEnh;
+    if (chord.IsUndef() || !IsSensefulEnhForKeyNr(root.mKeyNr, root.mEnh)) return 0;
+    const bool isMinor = chord.mSemitones.HasIntvl(3) && !chord.mSemitones.HasIntvl(4);
+    return std::abs(FifthOf(root) + interval.mFifths - (isMinor ? kFifthsToRelativeMajor : 0));
+}
+
+/// Of the intervals to the same keys the one after which all chords together have the fewest signs;
+/// of two the one with sharps.
+CSpelledInterval EasiestToRead(std::span<const CChordLite> chords, int semitones) {
+    constexpr int kFifthsToEnharmonic = 12;
+    const int fifths = FoldIntoOctave(std::int64_t{semitones} * 7);
+    std::optional<CSpelledInterval> best;
+    long long fewest = 0;
+    for (const int turns : {1, 0, -1, -2}) {
+        const CSpelledInterval interval{semitones, fifths + kFifthsToEnharmonic * turns};
+        long long signs = 0;
+        for (const CChordLite& chord : chords) signs += SignsOf(chord, interval);
+        if (best && signs >= fewest) continue;
+        best = interval;
+        fewest = signs;
+    }
+    return *best;
+}
+
 }  // namespace
 
 CSongFingerings ChooseFingerings(std::span<const CChordLite> chords, const GChShortTuning& tuning,
@@ -161,20 +190,19 @@ std::vector<CSongFingerings> CompareCapos(std::span<const CChordLite> chords,
     return songs;
 }
 
+std::vector<CChordLite> ShapesUnderCapo(std::span<const CChordLite> chords, int capo) {
+    std::vector<CChordLite> shapes(chords.begin(), chords.end());
+    const int down = FoldIntoOctave(-std::int64_t{capo});
+    if (down == 0) return shapes;
+    const CSpelledInterval interval = EasiestToRead(shapes, down);
+    for (CChordLite& shape : shapes) {
+        if (!shape.IsUndef()) interval.Move(shape);
+    }
+    return shapes;
+}
+
 CChordLite ShapeUnderCapo(const CChordLite& chord, int capo) {
-    if (chord.IsUndef() || FoldIntoOctave(capo) == 0) return chord;
-    const bool isMinor = chord.mSemitones.HasIntvl(3) && !chord.mSemitones.HasIntvl(4);
-    const auto moved = [&](const CKeyEnh& key) {
-        const int keyNr = FoldIntoOctave(key.mKeyNr - capo);
-        // C#m and G#m, but Db and Ab.
-        return CKeyEnh{keyNr, isMinor ? MakeSensefulEnhForKeyNrAssumingCMajor(keyNr, TEnh_Undef)
-                                      : MakeSensefulEnhForKeyNrMajorScaleRootWithLeastSigns(
-                                            keyNr, TEnh_Undef)};
-    };
-    CChordLite shape = chord;
-    shape.mRootKeyEnh = moved(chord.mRootKeyEnh);
-    if (chord.HasBassNote()) shape.mBassKeyEnh = moved(chord.mBassKeyEnh);
-    return shape;
+    return ShapesUnderCapo({&chord, 1}, capo).front();
 }
 
 }  // namespace brindle

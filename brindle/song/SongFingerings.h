@@ -47,8 +47,11 @@ struct CSongFingerings {
                                                         const GChShortTuning& tuning,
                                                         const CSongFingeringOptions& options = {});
 
-/// What a hand plays under a capodaster so that the chord sounds: G for Bb at fret 3, with the
-/// usual spelling.
+/// What a hand plays under a capodaster so that the chords sound: G for Bb at fret 3. All move by
+/// one interval, that with the fewest signs, so that C and E7 at fret 3 are A and C#7.
+[[nodiscard]] std::vector<CChordLite> ShapesUnderCapo(std::span<const CChordLite> chords, int capo);
+
+/// The same for one chord.
 [[nodiscard]] CChordLite ShapeUnderCapo(const CChordLite& chord, int capo);
 
 }  // namespace brindle

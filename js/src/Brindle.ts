@@ -1,6 +1,13 @@
 import { chordOfSymbol, readingFlags, type Chord, type ChordReading } from "./Chord.js";
 import { BrindleError } from "./errors.js";
-import { findFingerings, fingeringOfFrets, type FingeringOptions, type Fingerings } from "./Fingerings.js";
+import {
+  findFingerings,
+  fingeringOfFrets,
+  searchFingerings,
+  type FingeringOptions,
+  type Fingerings,
+  type SearchOptions,
+} from "./Fingerings.js";
 import type { ImportLineJson } from "./generated/schemas.js";
 import { markovOf, type Markov } from "./Markov.js";
 import { namesOfNotes, type NamedChord, type NamingOptions } from "./names.js";
@@ -60,6 +67,10 @@ export class Brindle {
   /** The fingerings of a chord symbol, the best first. */
   fingerings(symbol: string, options: FingeringOptions = {}): Fingerings {
     return findFingerings(this.#native, this.#gridPackage(), symbol, options);
+  }
+  /** The same without those that come with the library, as a hand and its player allow. */
+  searchFingerings(symbol: string, options: SearchOptions = {}): Fingerings {
+    return searchFingerings(this.#native, symbol, options);
   }
   /** The fingering that frets are, "x32010" or "x-10-12-12-11-10", with its name. */
   fingeringsOf(frets: string, options: FingeringOptions = {}): Fingerings {

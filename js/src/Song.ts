@@ -1,6 +1,13 @@
 import { analyse, type Analysis, type AnalyseOptions, type SheetOptions } from "./Analysis.js";
 import { Chord, readChord, readingFlags, type ChordReading } from "./Chord.js";
 import { SongError, type Fault } from "./errors.js";
+import {
+  songFingerings,
+  songFingeringsJson,
+  type Fingerings,
+  type SongFingeringOptions,
+} from "./Fingerings.js";
+import type { GridsForJson } from "./generated/schemas.js";
 import { Handle } from "./Handle.js";
 import type { Native } from "./Native.js";
 import { Record } from "./Record.js";
@@ -146,6 +153,15 @@ export class Song extends Handle {
     } finally {
       analysis.free();
     }
+  }
+  /** Easy fingerings of its chords that are near each other, each different one once; without a capo
+   * in the options under the one that makes it easiest. Names are those of the shapes. */
+  fingerings(options: SongFingeringOptions = {}): Fingerings {
+    return songFingerings(this.native, this.handle, options);
+  }
+  /** The same with the fingering of each chord, and what each capo makes of the song. */
+  fingeringsJson(options: SongFingeringOptions = {}): GridsForJson {
+    return songFingeringsJson(this.native, this.handle, options);
   }
   /** The song so many semitones higher, spelled for its new key. */
   transpose(semitones: number): Song {

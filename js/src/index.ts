@@ -11,7 +11,14 @@ export type {
   Region,
   SheetOptions,
 } from "./Analysis.js";
-export type { Fingering, FingeringOptions, Fingerings } from "./Fingerings.js";
+export type {
+  Fingering,
+  FingeringOptions,
+  Fingerings,
+  GridStyle,
+  SearchOptions,
+  SongFingeringOptions,
+} from "./Fingerings.js";
 export type { GenerateOptions, Markov } from "./Markov.js";
 export type { NamedChord, NamingOptions } from "./names.js";
 export type { NextChord, NextChords, NextOptions } from "./next.js";

@@ -132,6 +132,24 @@ test("what comes next is ranked", () => {
   assert.throws(() => brindle.next([], { style: "polka" }), { status: "not-found" });
 });
 
+test("fingerings are searched by options, and chosen for a song with its easiest capo", () => {
+  const first = (symbol, options) => brindle.searchFingerings(symbol, options).list[0].frets;
+  assert.deepEqual(first("C", { tuning: "ukulele" }), [0, 0, 0, 3]);
+  assert.deepEqual(first("C", { capo: 3 }), [-1, 0, 2, 2, 2, 0]);
+  assert.equal(brindle.searchFingerings("Am7", { limit: 2 }).length, 2);
+  assert.equal(brindle.searchFingerings("F#m", { highestFret: 1 }).length, 0);
+  assert.throws(() => brindle.searchFingerings("C", { span: 7 }), /a span is 2 to 6 frets/);
+  const song = brindle.read("Bb F | Gm Eb");
+  const names = (options) => song.fingerings(options).list.map(({ name, capo }) => `${capo} ${name}`);
+  assert.deepEqual(names(), ["3 G", "3 D", "3 Em", "3 C"]);
+  assert.deepEqual(names({ capo: 1 }), ["1 A", "1 E", "1 F#m", "1 D"]);
+  const told = song.fingeringsJson({ highestCapo: 4 });
+  assert.deepEqual([told.Capos.length, told.Capos[0].Capo, told.Chords.length], [5, 3, 4]);
+  const grids = brindle.fingerings("F");
+  assert.notEqual(grids.svg("F", { leftHanded: true }), grids.svg("F"));
+  assert.ok(grids.svg("F", { dots: "notes" }).includes(">A<"));
+});
+
 test("fingerings are found, named and drawn", () => {
   const found = brindle.fingerings("Am7");
   assert.ok(found.length > 0 && [...found].every(({ frets }) => frets.length === 6));

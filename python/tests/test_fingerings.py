@@ -1,5 +1,6 @@
 """Fingerings, grids and models."""
 
+import json
 import pickle
 import xml.etree.ElementTree as ElementTree
 
@@ -40,6 +41,9 @@ ERRORS = [
     (lambda: brindle.fingerings("Am7", tuning="XYZ"),      brindle.FingeringError),
     (lambda: brindle.fingerings("Am7", capo=25),           ValueError),
     (lambda: brindle.fingerings("Am7", bass="low"),        ValueError),
+    (lambda: brindle.song_fingerings(brindle.read("C"), highest_capo=13), ValueError),
+    (lambda: brindle.song_fingerings(brindle.read("C"), tuning="XYZ"), brindle.FingeringError),
+    (lambda: brindle.song_fingerings("C"),                 TypeError),
     (lambda: brindle.fingerings("Amy"),                    brindle.ChordError),
     (lambda: brindle.fingerings("N.C."),                   brindle.ChordError),
     (lambda: brindle.fingerings(7),                        (TypeError, RuntimeError)),
@@ -54,6 +58,27 @@ ERRORS = [
 def test_what_makes_no_sense_raises(call, error):
     with pytest.raises(error):
         call()
+
+
+#   song               options                  capo  shapes
+SONGS = [
+    ("Bb F | Gm Eb",   {},                      3,    ["G", "D", "Em", "C"]),
+    ("Bb F | Gm Eb",   {"capo": 0},             0,    ["Bb", "F", "Gm", "Eb"]),
+    ("Bb F | Gm Eb",   {"capo": 1},             1,    ["A", "E", "F#m", "D"]),
+    ("Bb F | Gm Eb",   {"highest_capo": 0},     0,    ["Bb", "F", "Gm", "Eb"]),
+    ("C E7 Am C",      {"capo": 3},             3,    ["A", "C#7", "F#m"]),
+]
+
+
+@pytest.mark.parametrize("text, options, capo, shapes", SONGS)
+def test_a_song_has_fingerings_under_a_capo(text, options, capo, shapes):
+    song = brindle.read(text)
+    grids = brindle.song_fingerings(song, **options)
+    assert [grid.name for grid in grids] == shapes
+    assert {grid.capo for grid in grids} == {capo}
+    told = json.loads(brindle.song_fingerings_json(song, **options))
+    assert told["Capos"][0]["Shapes"] == shapes
+    assert [row["Symbol"] for row in told["Chords"]] == [chord.symbol for chord in song]
 
 
 def test_fingerings_are_pickled_and_drawn():

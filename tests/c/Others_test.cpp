@@ -96,6 +96,85 @@ TEST_CASE("Fingerings are found and typed ones named") {
     CHECK(grid.frets[2] == 2);
 }
 
+TEST_CASE("Fingerings are searched as a hand and its player allow") {
+    const auto first = [](const char* symbol, const brindle_fingering_options& options) {
+        brindle_grids* found = nullptr;
+        REQUIRE(brindle_grids_search(symbol, &options, &found) == BRINDLE_OK);
+        const TGrids grids(found);
+        CHECK(brindle_grids_count(found) <= options.limit);
+        brindle_grid grid;
+        if (brindle_grids_get(found, 0, &grid) != BRINDLE_OK) return std::string("none");
+        std::string frets;
+        for (std::size_t i = 0; i < grid.string_count; ++i) {
+            frets += grid.frets[i] < 0 ? "x" : std::to_string(grid.frets[i]);
+        }
+        return frets;
+    };
+    const auto with = [](auto change) {
+        brindle_fingering_options options = brindle_fingering_options_default();
+        change(options);
+        return options;
+    };
+    using O = brindle_fingering_options;
+    CHECK(first("C", with([](O&) {})) == "x32010");
+    CHECK(first("C", with([](O& o) { o.tuning = "ukulele"; })) == "0003");
+    CHECK(first("C", with([](O& o) { o.capo = 3; })) == "x02220");
+    CHECK(first("C7", with([](O& o) { o.whole = 1; })) != first("C7", with([](O&) {})));
+    CHECK(first("F#m", with([](O& o) { o.highest_fret = 1; })) == "none");
+    CHECK(first("F", with([](O& o) { o.span = 2; })) != first("F", with([](O&) {})));
+    CHECK(first("G", with([](O& o) {
+                    o.lowest = BRINDLE_LOWEST_REQUIRED;
+                    o.tuning = "ukulele-low-g";
+                })) == "0232");
+    O options = brindle_fingering_options_default();
+    options.limit = 3;
+    options.rootless = 1;
+    CHECK(first("C9", options) != "none");
+    brindle_grids* found = nullptr;
+    for (const auto& wrong : {with([](O& o) { o.capo = 25; }), with([](O& o) { o.span = 7; }),
+                              with([](O& o) { o.highest_fret = 0; }),
+                              with([](O& o) { o.limit = 0; }), with([](O& o) { o.lowest = 3; })}) {
+        CHECK(brindle_grids_search("C", &wrong, &found) == BRINDLE_ERROR_ARGUMENT);
+    }
+    CHECK(brindle_grids_search("N.C.", nullptr, &found) == BRINDLE_ERROR_INPUT);
+    CHECK(found == nullptr);
+}
+
+TEST_CASE("A song has fingerings under the capo that makes it easiest") {
+    const TSong song = ReadSongOf("Bb F | Gm Eb");
+    const auto shapes = [&](const brindle_fingering_options* options, int highest) {
+        brindle_grids* found = nullptr;
+        REQUIRE(brindle_grids_of_song(song.get(), options, highest, &found) == BRINDLE_OK);
+        const TGrids grids(found);
+        std::string names;
+        brindle_grid grid;
+        for (std::size_t i = 0; brindle_grids_get(found, i, &grid) == BRINDLE_OK; ++i) {
+            names += std::to_string(grid.capo) + grid.name + " ";
+        }
+        return names;
+    };
+    CHECK(shapes(nullptr, 7) == "3G 3D 3Em 3C ");
+    CHECK(shapes(nullptr, -1) == "0Bb 0F 0Gm 0Eb ");
+    brindle_fingering_options options = brindle_fingering_options_default();
+    options.capo = 1;
+    CHECK(shapes(&options, -1) == "1A 1E 1F#m 1D ");
+    const auto json =
+        nlohmann::json::parse(TextOf(brindle_song_grids_json, song.get(), &options, 7));
+    CHECK(json["Capos"].size() == 8);
+    CHECK(json["Capos"][0]["Capo"] == 3);
+    CHECK(json["Chords"].size() == 4);
+    brindle_grids* found = nullptr;
+    CHECK(brindle_grids_of_song(song.get(), nullptr, 13, &found) == BRINDLE_ERROR_ARGUMENT);
+    REQUIRE(brindle_grids_of_song(song.get(), nullptr, 0, &found) == BRINDLE_OK);
+    const TGrids grids(found);
+    const std::string plain = TextOf(brindle_grids_draw, found, "Song", BRINDLE_DOTS_FINGERS, 0);
+    CHECK(plain == TextOf(brindle_grids_svg, found, "Song"));
+    CHECK(plain != TextOf(brindle_grids_draw, found, "Song", BRINDLE_DOTS_FINGERS, 1));
+    CHECK(TextOf(brindle_grids_draw, found, "Song", BRINDLE_DOTS_NOTES, 0).find(">Bb<") !=
+          std::string::npos);
+    CHECK(TextOf(brindle_grids_draw, found, "Song", 3, 0) == "[dots are one of brindle_dots]");
+}
+
 TEST_CASE("Faults of fingerings are told") {
     brindle_grids* found = nullptr;
     CHECK(brindle_grids_of_frets("x0201", nullptr, 0, &found) == BRINDLE_ERROR_INPUT);
@@ -176,6 +255,10 @@ TEST_CASE("NULL is an error and never a crash") {
         brindle_grids_get(nullptr, 0, nullptr),
         brindle_grids_json(nullptr, &text),
         brindle_grids_svg(nullptr, "", &text),
+        brindle_grids_draw(nullptr, "", 0, 0, &text),
+        brindle_grids_search(nullptr, nullptr, nullptr),
+        brindle_grids_of_song(nullptr, nullptr, 0, nullptr),
+        brindle_song_grids_json(nullptr, nullptr, 0, &text),
         brindle_markov_new(1, nullptr),
         brindle_markov_learn(nullptr, nullptr),
         brindle_markov_read(nullptr, nullptr),

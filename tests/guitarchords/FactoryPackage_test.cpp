@@ -4,6 +4,7 @@
 #include "brindle/chords/ReadChordText.h"
 #include "brindle/guitarchords/FindFingerings.h"
 #include "brindle/guitarchords/GChDatabase.h"
+#include "brindle/guitarchords/LookUpChord.h"
 
 #include <doctest/doctest.h>
 
@@ -15,14 +16,18 @@ using namespace brindle;
 
 namespace {
 
-std::vector<GChChord> FactoryChords() {
+const GChDatabase& FactoryPackage() {
     static GChDatabase database;
     if (database.tunings().empty()) {
         database.readFromDbPackageAtPath(BRINDLE_SOURCE_DIR "/data/" +
                                          std::string(kGChFactoryPackagePath));
     }
+    return database;
+}
+
+std::vector<GChChord> FactoryChords() {
     std::vector<GChChord> chords;
-    for (const auto& library : database.allLibrariesForAnyTuning()) {
+    for (const auto& library : FactoryPackage().allLibrariesForAnyTuning()) {
         for (const auto& chord : library->basicChords()) {
             chords.push_back(*GChChord::make(chord, 0));
         }
@@ -155,5 +160,40 @@ TEST_CASE("Above fret 12 stands only what cannot be held below it") {
         const CKeyEnh root{high.rootNote(0), TEnh_n};
         const CChordLite chord(root, CKeyEnh_Undef, StatedTonesOf(high));
         CHECK(FindFingerings(chord, kGChStandardGuitar, below).empty());
+    }
+}
+
+TEST_CASE("Who looks a chord up sees first what books print first") {
+    struct CRow {
+        const char* mSymbol;
+        std::vector<int> mFrets;
+    };
+    constexpr int x = -1;
+    for (const auto& [symbol, frets] : std::vector<CRow>{
+             {"C", {x, 3, 2, 0, 1, 0}},
+             {"F", {x, x, 3, 2, 1, 1}},
+             {"C7", {x, 3, 2, 3, 1, 0}},
+             {"Bb6", {x, 1, 3, 3, 3, 3}},
+             {"Em9", {0, 2, 0, 0, 0, 2}},
+             {"C7#9", {x, 3, 2, 3, 4, x}},
+             {"Dm7b5", {x, x, 0, 1, 1, 1}},
+             {"Am9", {x, 0, 2, 4, 1, 3}},
+             {"Bm6", {x, 2, 0, 1, 0, 2}},
+             {"Fadd9", {x, x, 3, 2, 1, 3}},
+             {"Ebm6", {x, x, 1, 3, 1, 2}},
+             {"Ab", {4, 6, 6, 5, 4, 4}},
+         }) {
+        const auto found =
+            LookUpChord(FactoryPackage(), ReadChordText(symbol).mChord, kGChStandardGuitar, 0);
+        const std::string logged(symbol);
+        INFO(logged);
+        REQUIRE_FALSE(found.empty());
+        const GChChord first = *GChChord::make(found.front().mGrid, 0);
+        std::vector<int> told;
+        for (int i = 0; i < 6; ++i) told.push_back(first.maxAbsFretIndexPlusOneForStringIndex(i));
+        CHECK(told == frets);
+        for (std::size_t i = 1; i < found.size(); ++i) {
+            CHECK(found[i - 1].mCost <= found[i].mCost);
+        }
     }
 }

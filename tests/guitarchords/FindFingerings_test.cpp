@@ -169,6 +169,8 @@ TEST_CASE("The first fingering and its fingers are those of the books") {
              {"Cmaj7", "x32000", ""},
              {"Fmaj7", "xx3210", ""},
              {"Bm7b5", "x20201", ""},
+             {"F", "xx3211", "--3211"},      // the index lies over two strings
+             {"Esus4", "022200", "-123--"},  // and not where an open one sounds above
              {"C/E", "032010", ""},
          }) {
         const auto found = FindFingerings(ChordOf(row.mSymbol), kGChStandardGuitar);
@@ -177,6 +179,79 @@ TEST_CASE("The first fingering and its fingers are those of the books") {
         CHECK(Text(found.front()) == row.mFrets);
         if (row.mFingers[0] != '\0') CHECK(FingersText(found.front()) == row.mFingers);
     }
+}
+
+TEST_CASE("Other instruments are played as their books show") {
+    struct CRow {
+        const char* mTuning;
+        const char* mSymbol;
+        const char* mFrets;
+        const char* mFingers;
+    };
+    for (const CRow& row : std::vector<CRow>{
+             // What a guitarist would call inversions are the usual shapes of small instruments.
+             {"ukulele-low-g", "C", "0003", "---1"},
+             {"ukulele", "Bb", "3211", "3211"},
+             {"baritone-ukulele", "G", "0003", ""},
+             {"baritone-ukulele", "C/E", "2010", ""},
+             {"mandolin", "D", "2002", ""},
+             {"cavaquinho", "G", "0000", ""},
+             // A bass stands on its root.
+             {"bass", "C", "x320", ""},
+             {"EADG", "C", "x320", ""},
+             // The short string of a banjo begins at the fifth fret.
+             {"banjo", "A", "x2222", "-1111"},
+             {"banjo", "E", "x2102", ""},
+             {"banjo", "G", "00000", ""},
+             {"gdgbd", "Em", "02002", ""},
+         }) {
+        auto tuning = TuningOfName(row.mTuning);
+        if (!tuning) tuning = GChShortTuning{52, 57, 62, 67};
+        const auto found = FindFingerings(ChordOf(row.mSymbol), *tuning);
+        INFO(row.mTuning << " " << row.mSymbol);
+        REQUIRE_FALSE(found.empty());
+        CHECK(Text(found.front()) == row.mFrets);
+        if (row.mFingers[0] != '\0') CHECK(FingersText(found.front()) == row.mFingers);
+        if (!HasShortString(*tuning)) continue;
+        for (const CFingering& fingering : found) CHECK(fingering.mFrets[0] <= 0);
+    }
+}
+
+TEST_CASE("A tuning tells whether it bears a bass and has a short string") {
+    struct CRow {
+        const char* mTuning;
+        bool mBearsBass;
+        bool mHasShortString;
+    };
+    for (const auto& [name, bearsBass, hasShortString] : std::vector<CRow>{
+             {"standard", true, false},
+             {"7-string", true, false},
+             {"bass", true, false},
+             {"5-string-bass", true, false},
+             {"ukulele", false, false},
+             {"ukulele-low-g", false, false},
+             {"mandolin", false, false},
+             {"tenor-banjo", false, false},
+             {"banjo", false, true},
+         }) {
+        const std::string logged(name);
+        INFO(logged);
+        CHECK(BearsBass(*TuningOfName(name)) == bearsBass);
+        CHECK(HasShortString(*TuningOfName(name)) == hasShortString);
+    }
+}
+
+TEST_CASE("A fingering that is handed in has the place that the search gives it") {
+    for (const char* symbol : {"C", "F", "C13", "D/F#", "Am7"}) {
+        for (const CFingering& found : FindFingerings(ChordOf(symbol), kGChStandardGuitar)) {
+            const std::vector<int> frets(found.Frets().begin(), found.Frets().end());
+            CHECK(FingeringForChord(frets, ChordOf(symbol), kGChStandardGuitar) == found);
+        }
+    }
+    const std::vector<int> c{-1, 3, 2, 0, 1, 0};
+    CHECK_FALSE(FingeringForChord(c, ChordOf("C/E"), kGChStandardGuitar));
+    CHECK_FALSE(FingeringForChord(c, CChordLite_Undef, kGChStandardGuitar));
+    CHECK_FALSE(FingeringForChord({c.data(), 5}, ChordOf("C"), kGChStandardGuitar));
 }
 
 TEST_CASE("The best few are the first of many") {

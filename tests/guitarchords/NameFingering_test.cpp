@@ -1,5 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/guitarchords/NameFingering.h"
+
+#include "brindle/guitarchords/Tunings.h"
 #include "brindle/neural/RootCostsByNet.h"
 
 #include <doctest/doctest.h>
@@ -51,13 +53,16 @@ TEST_CASE("Fingerings of a guitar are named over the root that guitarists hear")
     }
 }
 
-TEST_CASE("The lowest note of a re-entrant tuning is no bass") {
+TEST_CASE("The lowest note of a re-entrant tuning and of a small instrument is no bass") {
     CHECK(IsReentrant(kUkulele));
     CHECK_FALSE(IsReentrant(kGChStandardGuitar));
     CHECK(NameOf({0, 0, 0, 0}, kUkulele) == "C6");  // as the tuning is called
     CHECK(NameOf({0, 0, 0, 3}, kUkulele) == "C");
     CHECK(NameOf({0, 2, 3, 2}, kUkulele) == "G");
     CHECK(NameOf({2, 2, 1, 2}, kUkulele) == "Dm6");
+    CHECK(NameOf({0, 0, 0, 3}, *TuningOfName("ukulele-low-g")) == "C");
+    CHECK(NameOf({0, 2, 3, 0}, *TuningOfName("mandolin")) == "C");
+    CHECK(NameOf({0, 3, 2, 0}, *TuningOfName("bass")) == "C/E");
 }
 
 TEST_CASE("The net doubts least the root of a triad, in all keys and inversions") {

@@ -2,6 +2,7 @@
 #include "brindle/present/ChordGrid.h"
 
 #include "brindle/chords/ReadChordText.h"
+#include "brindle/guitarchords/GChDatabase.h"
 #include "brindle/guitarchords/GChPitches.h"
 #include "brindle/guitarchords/GChTuningDescr.h"
 #include "brindle/present/GridsJson.h"
@@ -68,6 +69,36 @@ TEST_CASE("A letter a tritone away from the usual string is tuned down to") {
     CHECK_FALSE(ReadTuning("E2 A"));
 }
 
+TEST_CASE("Tunings and frets are read as people type them") {
+    struct CCase {
+        const char* mText;
+        const char* mTuning;
+    };
+    const CCase cases[] = {
+        {"eadgbe", "E2 A2 D3 G3 B3 E4"},
+        {"e a d g b e", "E2 A2 D3 G3 B3 E4"},
+        {"eb ab db gb bb eb", "D#2 G#2 C#3 F#3 Bb3 D#4"},
+        {"e2a2d3gb3b3e4", "E2 A2 D3 F#3 B3 E4"},
+        {"bead", "B2 E3 A3 D4"},
+        {"EBbDGBE", "E2 Bb2 D3 G3 B3 E4"},
+    };
+    for (const auto& [text, tuning] : cases) {
+        const std::string logged(text);
+        INFO(logged);
+        const auto read = ReadTuning(text);
+        REQUIRE(read);
+        CHECK(TuningText(*read) == tuning);
+    }
+    const std::vector<int> c{-1, 3, 2, 0, 1, 0};
+    for (const char* text :
+         {"x32010", "X32010", "x-3-2-0-1-0", "x,3,2,0,1,0", "x 3 2 0 1 0", " x32010 "}) {
+        CHECK(ReadFrets(text) == c);
+    }
+    for (const char* text : {"", " ", "x  3", "x-3--2", "x3201O", "Am"}) {
+        CHECK_FALSE(ReadFrets(text));
+    }
+}
+
 TEST_CASE("A diagram is drawn from the nut to the last fret of its window") {
     CHECK(GridsText({GridOf("x35553")}, CPaint(false)) ==
           "C\n"
@@ -75,10 +106,34 @@ TEST_CASE("A diagram is drawn from the nut to the last fret of its window") {
           "C3 G3 C4 E4 G4\n"
           "x\n"
           "-----------\n"
-          "| * | | | * 3fr\n"
+          "| 1-------1 3fr\n"
           "| | | | | |\n"
-          "| | * * * |\n"
+          "| | 2 3 4 |\n"
           "| | | | | |\n");
+    // Five fingers would be needed.
+    CHECK(GridsText({GridOf("143212")}, CPaint(false)).find("* | | | * |\n") != std::string::npos);
+}
+
+TEST_CASE("A package gives what the options allow, and the finder where it has nothing") {
+    GChDatabase database;
+    database.readFromDbPackageAtPath(BRINDLE_SOURCE_DIR "/data/" +
+                                     std::string(kGChFactoryPackagePath));
+    const auto textsOf = [&](const char* symbol, const CFingeringOptions& options) {
+        std::string texts;
+        for (const CChordGrid& grid : GridsForChord(database, symbol, ReadChordText(symbol).mChord,
+                                                    kGChStandardGuitar, options)) {
+            texts +=
+                (texts.empty() ? "" : " ") + FretsText(grid) + (grid.mLibrary.empty() ? "?" : "");
+        }
+        return texts;
+    };
+    CHECK(textsOf("C7", {}) == "x32310 x35353 8-10-8-9-8-8 x-x-10-12-11-12");
+    CHECK(textsOf("C7", {.mLimit = 2}) == "x32310 x35353");
+    CHECK(textsOf("C7", {.mMayOmitTones = false, .mLimit = 1}) == "x35353");
+    CHECK(textsOf("C7", {.mHighestFret = 5}) == "x32310 x35353");
+    CHECK(textsOf("C7", {.mCapo = 2, .mHighestFret = 5, .mLimit = 1}) == "x13131");
+    CHECK(textsOf("F", {.mSpan = 2, .mSpanUpTheNeck = 2, .mLimit = 1}).back() == '?');
+    CHECK(textsOf("Cm13", {.mLimit = 1}) == "x33345?");
 }
 
 TEST_CASE("Notes are spelled by their chord, and their octave is that of their letter") {
@@ -141,6 +196,23 @@ TEST_CASE("Dots and omissions have the degrees of the chord's name") {
         INFO(logged);
         CHECK(told == degrees);
     }
+}
+
+TEST_CASE("Notes are written in the style of the grid, and stand apart") {
+    CChordNamePrefs german;
+    german.mGermanNames = true;
+    const std::vector<int> frets{2, 4, 4, 2, 2, 2};
+    const auto grid = GridOfFrets("F#m", frets, kGChStandardGuitar, 0, german);
+    REQUIRE(grid);
+    CHECK(NoteText(*grid, 0) == "Fis2");
+    const CGridStyle notes{.mDots = TGridDots::Notes};
+    CHECK(GridsText({*grid}, CPaint(false), notes).find("Fis---------A---Cis-Fis\n") !=
+          std::string::npos);
+    const auto withSigns = GridOfFrets("F#m", frets, kGChStandardGuitar, 0, CChordNamePrefs());
+    REQUIRE(withSigns);
+    CHECK(
+        GridsText({*withSigns}, CPaint(false), notes).find("F\u266F-------A--C\u266F-F\u266F\n") !=
+        std::string::npos);
 }
 
 TEST_CASE("Degrees of three letters have room") {

@@ -104,6 +104,31 @@ TEST_CASE("Shapes under a capo are spelled as players call them") {
     CHECK(shapeOf("A", 1) == std::pair(CKeyEnh{8, TEnh_b}, CKeyEnh_Undef));
     CHECK(shapeOf("Am", 1) == std::pair(CKeyEnh{8, TEnh_s}, CKeyEnh_Undef));
     CHECK(shapeOf("C/E", 12) == std::pair(CKeyEnh{0, TEnh_n}, CKeyEnh{4, TEnh_n}));
+    CHECK(shapeOf("C7/E", 3) == std::pair(CKeyEnh{9, TEnh_n}, CKeyEnh{1, TEnh_s}));
+    CHECK(shapeOf("G", 1) == std::pair(CKeyEnh{6, TEnh_s}, CKeyEnh_Undef));
+}
+
+TEST_CASE("The shapes of a song move by one interval") {
+    struct CRow {
+        const char* mSong;
+        int mCapo;
+        std::vector<CKeyEnh> mRoots;
+    };
+    for (const auto& [song, capo, roots] : std::vector<CRow>{
+             {"C E7 Am F#7", 3, {{9, TEnh_n}, {1, TEnh_s}, {6, TEnh_s}, {3, TEnh_s}}},
+             {"Bb Gm Eb D7", 3, {{7, TEnh_n}, {4, TEnh_n}, {0, TEnh_n}, {11, TEnh_n}}},
+             {"G C D N.C. Am", 2, {{5, TEnh_n}, {10, TEnh_b}, {0, TEnh_n}, {}, {7, TEnh_n}}},
+             {"F# C# D#m B", 4, {{2, TEnh_n}, {9, TEnh_n}, {11, TEnh_n}, {7, TEnh_n}}},
+             {"Gb Db Ebm Cb", 4, {{2, TEnh_n}, {9, TEnh_n}, {11, TEnh_n}, {7, TEnh_n}}},
+         }) {
+        std::vector<CKeyEnh> told;
+        for (const CChordLite& shape : ShapesUnderCapo(ChordsOf(song), capo)) {
+            told.push_back(shape.IsUndef() ? CKeyEnh() : shape.mRootKeyEnh);
+        }
+        const std::string logged(song);
+        INFO(logged);
+        CHECK(told == roots);
+    }
 }
 
 }  // namespace

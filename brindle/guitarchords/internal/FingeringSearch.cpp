@@ -99,7 +99,7 @@ private:
     void GoOn(int string, const CShapeState& state) {
         if (++mSteps > kMostStepsInPosition) return;
         if (string == mTask.mStrings) {
-            Keep(state);
+            Keep();
             return;
         }
         const CStringWays& ways = mWays[static_cast<std::size_t>(string)];
@@ -144,7 +144,7 @@ private:
                LeastCostOf(state.mCounts) <= mWorstCost;
     }
 
-    void Keep(const CShapeState& state) {
+    void Keep() {
         const std::span<const std::int8_t> frets(mFrets.data(),
                                                  static_cast<std::size_t>(mTask.mStrings));
         CFingering fingering;
@@ -152,34 +152,16 @@ private:
         fingering.mCapo = mTask.mCapo;
         fingering.mStringCount = mTask.mStrings;
         std::copy(frets.begin(), frets.end(), fingering.mFrets.begin());
-        if (!SetSound(fingering, state.mKeys)) return;
+        if (!SetSound(fingering, mTask)) return;
         const int cost = CostOfSoundAndPlace(fingering, mTask);
         if (cost > mWorstCost) return;
         const auto hand = HandOf(frets);
         if (!hand) return;
         fingering.mCost = cost + CostOfHand(*hand);
         if (fingering.mCost > mWorstCost) return;
-        fingering.mFingers = hand->mPlaces;
-        fingering.mFingerCount = hand->mCount;
-        fingering.mDifficulty = DifficultyOf(*hand);
+        SetHand(fingering, *hand);
         mFound.push_back(fingering);
         if (mFound.size() == mKept + mKept / 4) KeepBest();
-    }
-
-    /// False when the lowest note or a pitch is not what it has to be.
-    bool SetSound(CFingering& fingering, std::uint32_t keys) const {
-        int lowest = kHighestMidi + 1;
-        for (int string = 0; string < mTask.mStrings; ++string) {
-            const int pitch = fingering.Pitch(string);
-            if (pitch > kHighestMidi) return false;
-            if (pitch >= 0) lowest = std::min(lowest, pitch);
-        }
-        fingering.mBassIsLowest = lowest % 12 == mTask.mBass;
-        for (int tone = 0; tone < 12; ++tone) {
-            const bool isMissing = (keys >> (mTask.mRoot + tone) % 12 & 1U) == 0;
-            if (isMissing && mTask.mSemitones.HasIntvl(tone)) fingering.mOmitted.AddIntvl(tone);
-        }
-        return fingering.mBassIsLowest || !mTask.mBassIsRequired;
     }
 
     void KeepBest() {
@@ -204,6 +186,27 @@ private:
 };
 
 }  // namespace
+
+bool SetSound(CFingering& fingering, const CFingeringTask& task) {
+    int lowest = kHighestMidi + 1;
+    CSemitones sounding;
+    for (int string = 0; string < fingering.mStringCount; ++string) {
+        const int pitch = fingering.Pitch(string);
+        if (pitch > kHighestMidi) return false;
+        if (pitch < 0) continue;
+        lowest = std::min(lowest, pitch);
+        sounding.AddIntvl(pitch - task.mRoot);
+    }
+    fingering.mBassIsLowest = lowest % 12 == task.mBass;
+    fingering.mOmitted = task.mSemitones - sounding;
+    return fingering.mBassIsLowest || !task.mBassIsRequired;
+}
+
+void SetHand(CFingering& fingering, const CHand& hand) {
+    fingering.mFingers = hand.mPlaces;
+    fingering.mFingerCount = hand.mCount;
+    fingering.mDifficulty = DifficultyOf(hand);
+}
 
 bool IsBetterFingering(const CFingering& a, const CFingering& b) {
     return a.mCost != b.mCost ? a.mCost < b.mCost : a.mFrets < b.mFrets;

@@ -2,6 +2,7 @@
 #pragma once
 
 #include "brindle/guitarchords/FindFingerings.h"
+#include "brindle/guitarchords/internal/HandOf.h"
 
 #include <cstdint>
 #include <vector>
@@ -22,6 +23,8 @@ struct CFingeringTask {
     bool mBassIsRequired = false;
     /// Whether the lowest note matters for the order.
     bool mBassCounts = true;
+    /// The first string is left open or muted.
+    bool mHasShortString = false;
     /// The tones of the chord are the same above more than one of them.
     bool mIsSymmetric = false;
     std::uint32_t mKeys = 0;
@@ -34,9 +37,17 @@ struct CFingeringTask {
     }
     /// Whether a string at a fret sounds a tone of the chord or its bass.
     [[nodiscard]] bool Allows(int string, int fret) const {
-        return (mKeys >> KeyAt(string, fret) & 1U) != 0;
+        const bool isThere = fret == 0 || string > 0 || !mHasShortString;
+        return isThere && (mKeys >> KeyAt(string, fret) & 1U) != 0;
     }
 };
+
+/// Writes down what sounds: the omitted tones and whether the bass is lowest. False when the lowest
+/// note is not what it has to be, or a pitch is none.
+[[nodiscard]] bool SetSound(CFingering& fingering, const CFingeringTask& task);
+
+/// Writes down the fingers and how hard they are.
+void SetHand(CFingering& fingering, const CHand& hand);
 
 /// Less cost first; of equal ones the order of frets, so that the result is always the same.
 [[nodiscard]] bool IsBetterFingering(const CFingering& a, const CFingering& b);

@@ -19,6 +19,10 @@ constexpr int kEffortOfStretch = 90;       // each fret that lies between two ne
 constexpr int kEffortOfWideHand = 100;     // each fret beyond three under the hand
 constexpr int kEffortOfInnerMute = 90;
 constexpr int kWideBarre = 4;
+// Where four fingers hold four strings and more, the index lies across neighbours at the lowest
+// fret rather than taking a second finger there, as in xx3211, unless it would damp an open string.
+constexpr int kSavedByIndex = 70;
+constexpr int kManyPressed = 4;
 constexpr int kNarrowFrets = 7;  // from here on a stretch is half as wide
 
 /// Strings at the same fret that one finger may cover.
@@ -176,6 +180,20 @@ int EffortOf(const CHand& hand, std::span<const std::int8_t> frets) {
     return effort;
 }
 
+bool IsIndexBarreOfMany(const CHand& hand, std::span<const std::int8_t> frets) {
+    const CFingerPlace& index = hand.mPlaces[0];
+    if (hand.mCount == 0 || !index.IsBarre()) return false;
+    const auto pressed =
+        std::count_if(frets.begin(), frets.end(), [](int fret) { return fret > 0; });
+    const auto above = frets.subspan(static_cast<std::size_t>(index.mMaxString) + 1);
+    return pressed >= kManyPressed && (above.empty() || above.front() != 0);
+}
+
+/// By which of the ways to hold the same frets one is chosen.
+int ChoiceOf(const CHand& hand, std::span<const std::int8_t> frets) {
+    return hand.mEffort - (IsIndexBarreOfMany(hand, frets) ? kSavedByIndex : 0);
+}
+
 constexpr int kEffortOfStep = 60;
 constexpr int kHardest = 9;
 
@@ -192,6 +210,7 @@ std::optional<CHand> HandOf(std::span<const std::int8_t> frets) {
     if (rows.mCount > kHandFingers) return std::nullopt;
     const bool hasOpen = std::find(frets.begin(), frets.end(), 0) != frets.end();
     std::optional<CHand> easiest;
+    int best = 0;
     for (unsigned barres = 0; barres < 1U << rows.mCount; ++barres) {
         CHand hand;
         bool isHeld = true;
@@ -206,7 +225,10 @@ std::optional<CHand> HandOf(std::span<const std::int8_t> frets) {
         MeasureReach(hand);
         MeasureBarres(hand, frets);
         hand.mEffort = EffortOf(hand, frets);
-        if (!easiest || hand.mEffort < easiest->mEffort) easiest = hand;
+        const int choice = ChoiceOf(hand, frets);
+        if (easiest && choice >= best) continue;
+        easiest = hand;
+        best = choice;
     }
     return easiest;
 }

@@ -395,6 +395,169 @@ export interface Element {
 }
 export type GridJson = GridJsonSchema.GridJson;
 
+export namespace GridsForJsonSchema {
+/**
+ * Pitches from the lowest string on.
+ *
+ * @minItems 3
+ * @maxItems 16
+ */
+export type OpenStrings =
+  | [number, number, number]
+  | [number, number, number, number]
+  | [number, number, number, number, number]
+  | [number, number, number, number, number, number]
+  | [number, number, number, number, number, number, number]
+  | [number, number, number, number, number, number, number, number]
+  | [number, number, number, number, number, number, number, number, number]
+  | [number, number, number, number, number, number, number, number, number, number]
+  | [number, number, number, number, number, number, number, number, number, number, number]
+  | [number, number, number, number, number, number, number, number, number, number, number, number]
+  | [
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number
+    ]
+  | [
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number
+    ]
+  | [
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number
+    ]
+  | [
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number,
+      number
+    ];
+export type Grids = {
+  Symbol: string;
+  Name: string;
+  OtherNames: string[];
+  /**
+   * Degrees of the chord that do not sound, such as 5 and 11.
+   */
+  Omitted: string[];
+  RootKeyNr: number | null;
+  /**
+   * Of each string; null for a muted one.
+   */
+  Frets: (number | null)[];
+  Pitches: (number | null)[];
+  PitchNames: (string | null)[];
+  Elements: Element[];
+  OpenStrings: OpenStrings;
+  Capo: number;
+  /**
+   * How hard it is to hold; null if one hand cannot.
+   */
+  Difficulty: number | null;
+  Library: string | null;
+}[];
+
+export interface GridsForJson {
+  /**
+   * Places of the capodaster, the easiest first; the grids are those of the first.
+   */
+  Capos: {
+    Capo: number;
+    /**
+     * Less is easier.
+     */
+    Cost: number;
+    /**
+     * Mean of the chords that can be held.
+     */
+    Difficulty: number;
+    /**
+     * How many chords cannot be held.
+     */
+    Holes: number;
+    /**
+     * The different chords by the names of their shapes under the capodaster.
+     */
+    Shapes: string[];
+  }[];
+  /**
+   * The chords of the song, each with the index of its grid; null for a rest and a chord that cannot be held.
+   */
+  Chords: {
+    Symbol: string;
+    Grid: number | null;
+  }[];
+  /**
+   * Whether the strings are drawn from the highest on the left. The values count them alike.
+   */
+  LeftHanded: boolean;
+  Grids: Grids;
+}
+/**
+ * A finger that is put down.
+ */
+export interface Element {
+  Finger: number;
+  Fret: number;
+  /**
+   * The lowest and the highest string, from 0.
+   *
+   * @minItems 2
+   * @maxItems 2
+   */
+  Strings: [number, number];
+  Optional: boolean;
+}
+}
+export type GridsForJson = GridsForJsonSchema.GridsForJson;
+
 export namespace MarkovNextJsonSchema {
 export interface MarkovNextJson {
   Key: string;

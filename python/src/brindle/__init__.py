@@ -41,6 +41,8 @@ from brindle._native import (
     fretted,
     name,
     names,
+    song_fingerings,
+    song_fingerings_json,
 )
 from brindle._records import (
     Bar,
@@ -92,6 +94,8 @@ __all__ = [
     "read",
     "score_json_lines",
     "score_midi",
+    "song_fingerings",
+    "song_fingerings_json",
 ]
 
 # Tracebacks name errors and records as users do.

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "Arguments.h"
 #include "Bind.h"
+#include "SourceSong.h"
 
 #include "brindle/guitarchords/FindFingerings.h"
 #include "brindle/guitarchords/GChDatabase.h"
@@ -9,7 +10,9 @@
 #include "brindle/present/GridsJson.h"
 #include "brindle/present/GridsSvg.h"
 #include "brindle/present/ShownText.h"
+#include "brindle/present/SongGrids.h"
 
+#include <nanobind/stl/optional.h>
 #include <nanobind/stl/shared_ptr.h>
 #include <nanobind/stl/string.h>
 #include <nanobind/stl/string_view.h>
@@ -17,6 +20,8 @@
 
 #include <memory>
 #include <mutex>
+#include <optional>
+#include <utility>
 
 namespace brindle::python {
 namespace {
@@ -59,23 +64,46 @@ std::vector<CGridPtr> Shared(std::vector<CChordGrid> grids) {
     return shared;
 }
 
-std::vector<CGridPtr> Find(const nb::object& chord, const nb::object& tuning, int capo,
-                           std::size_t limit, int highestFret, int span, bool mayOmitTones,
-                           bool mayOmitRoot, std::string_view bass) {
-    const GChShortTuning strings = TuningOf(tuning, capo);
-    const CChordLite sought = SoundingChordOf(chord);
-    const std::string symbol = Printable(SymbolOf(chord));
+CFingeringOptions OptionsOf(int capo, int highestFret, int span, bool mayOmitTones,
+                            bool mayOmitRoot, std::string_view bass) {
     CFingeringOptions options;
     options.mCapo = capo;
-    options.mLimit = limit;
     options.mHighestFret = highestFret;
     options.mSpan = span;
     options.mSpanUpTheNeck = span + 1;
     options.mMayOmitTones = mayOmitTones;
     options.mMayOmitRoot = mayOmitRoot;
     options.mBass = ValueOfWord("bass", bass, kBasses);
+    return options;
+}
+
+std::vector<CGridPtr> Find(const nb::object& chord, const nb::object& tuning, int capo,
+                           std::size_t limit, int highestFret, int span, bool mayOmitTones,
+                           bool mayOmitRoot, std::string_view bass) {
+    const GChShortTuning strings = TuningOf(tuning, capo);
+    const CChordLite sought = SoundingChordOf(chord);
+    const std::string symbol = Printable(SymbolOf(chord));
+    CFingeringOptions options = OptionsOf(capo, highestFret, span, mayOmitTones, mayOmitRoot, bass);
+    options.mLimit = limit;
     const nb::gil_scoped_release released;
     return Shared(FoundGrids(symbol, sought, strings, options));
+}
+
+CShownSongGrids ChosenForSong(const CSourceSongPtr& song, const nb::object& tuning,
+                              std::optional<int> capo, int highestCapo, int highestFret, int span,
+                              bool mayOmitTones, bool mayOmitRoot, std::string_view bass) {
+    constexpr int kMostCapoOfSong = 12;
+    const GChShortTuning strings = TuningOf(tuning, capo.value_or(0));
+    if (highestCapo < 0 || highestCapo > kMostCapoOfSong) {
+        throw nb::value_error("the highest capo is a fret of 0 to 12");
+    }
+    CSongFingeringOptions options;
+    options.mFingering =
+        OptionsOf(capo.value_or(0), highestFret, span, mayOmitTones, mayOmitRoot, bass);
+    options.mHighestCapo = highestCapo;
+    const nb::gil_scoped_release released;
+    return MakeSongGrids(song->mSong, strings, options,
+                         capo ? TSongCapo::Told : TSongCapo::Easiest);
 }
 
 CGridPtr OfFrets(const std::string& frets, const nb::object& tuning, int capo) {
@@ -195,6 +223,27 @@ preferably the root), "required" or "free". Works for 3 to 12 strings.
 'x02010'
 >>> str(brindle.fingerings("G", tuning="ukulele")[0])
 '0232')";
+
+constexpr const char* kSongFingerings =
+    R"(Easy fingerings of a song that are near each other, each different one once.
+
+Without a `capo` it lies where the song is easiest, up to the `highest_capo`; names are those of the
+shapes under it, symbols those of the song.
+
+>>> import brindle
+>>> grids = brindle.song_fingerings(brindle.read("Bb F | Gm Eb"))
+>>> grids[0].capo, [grid.name for grid in grids]
+(3, ['G', 'D', 'Em', 'C'])
+>>> [str(grid) for grid in brindle.song_fingerings(brindle.read("C F"), tuning="ukulele", capo=0)]
+['0003', '2010'])";
+
+constexpr const char* kSongFingeringsJson =
+    R"(The same as strict JSON, with the fingering of each chord and what each capo makes of the song.
+
+>>> import brindle, json
+>>> advice = json.loads(brindle.song_fingerings_json(brindle.read("Bb F | Gm Eb")))
+>>> advice["Capos"][0]["Capo"], advice["Capos"][0]["Shapes"]
+(3, ['G', 'D', 'Em', 'C']))";
 
 constexpr const char* kFretted = R"(The fingering of typed frets, named by what sounds.
 
@@ -317,6 +366,31 @@ True)");
     });
 }
 
+/// A function of a song that gives what `resultOf` makes of its grids.
+template <class TResultOf>
+void BindForSong(nb::module_& module, const char* name, const char* doc, TResultOf resultOf,
+                 const std::string& type) {
+    const std::string signature =
+        "def " + std::string(name) +
+        "(song: Song, *, tuning: str | None = None, capo: int | None = None, highest_capo: int = "
+        "7, "
+        "highest_fret: int = 15, span: int = 4, omit_tones: bool = True, omit_root: bool = False, "
+        "bass: typing.Literal['usual', 'required', 'free'] = 'usual') -> " +
+        type;
+    module.def(
+        name,
+        [resultOf](const CSourceSongPtr& song, const nb::object& tuning, std::optional<int> capo,
+                   int highestCapo, int highestFret, int span, bool mayOmitTones, bool mayOmitRoot,
+                   std::string_view bass) {
+            return resultOf(ChosenForSong(song, tuning, capo, highestCapo, highestFret, span,
+                                          mayOmitTones, mayOmitRoot, bass));
+        },
+        nb::arg("song"), nb::kw_only(), nb::arg("tuning") = nb::none(),
+        nb::arg("capo") = nb::none(), nb::arg("highest_capo") = 7, nb::arg("highest_fret") = 15,
+        nb::arg("span") = 4, nb::arg("omit_tones") = true, nb::arg("omit_root") = false,
+        nb::arg("bass") = "usual", doc, nb::sig(signature.c_str()));
+}
+
 }  // namespace
 
 void BindFingerings(nb::module_& module) {
@@ -334,6 +408,12 @@ void BindFingerings(nb::module_& module) {
                        "= 0, limit: int = 10, highest_fret: int = 15, span: int = 4, omit_tones: "
                        "bool = True, omit_root: bool = False, bass: typing.Literal['usual', "
                        "'required', 'free'] = 'usual') -> list[Fingering]"));
+    BindForSong(
+        module, "song_fingerings", kSongFingerings,
+        [](CShownSongGrids chosen) { return Shared(std::move(chosen.mGrids)); }, "list[Fingering]");
+    BindForSong(
+        module, "song_fingerings_json", kSongFingeringsJson,
+        [](const CShownSongGrids& chosen) { return SongGridsJson(chosen); }, "str");
     module.def("fretted", OfFrets, nb::arg("frets"), nb::kw_only(), nb::arg("tuning") = nb::none(),
                nb::arg("capo") = 0, kFretted,
                nb::sig("def fretted(frets: str, *, tuning: str | None = None, capo: int = 0) -> "
