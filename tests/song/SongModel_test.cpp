@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/song/CSongModel.h"
 
+#include "brindle/analysis/RomanNumeral.h"
 #include "brindle/chords/ReadChordText.h"
 #include "brindle/chords/WriteChordSymbol.h"
 #include "brindle/song/BuiltInSongs.h"
@@ -90,6 +91,44 @@ TEST_CASE("What followed in the songs is the likeliest") {
     CHECK(next.mChords[0].mFunction == THarmFunction_Tonic);
     CHECK(next.mChords[0].mProbability > 0.5);
     CHECK(next.mChords[1].mProbability < next.mChords[0].mProbability);
+}
+
+TEST_CASE("What may come is told in the key, and in minor it is what songs in minor have") {
+    const CSongModel model = BuiltInSongModel();
+    struct CRow {
+        const char* mKey;
+        std::vector<const char*> mChords;
+    };
+    const CRow rows[] = {{"A minor", {"Am", "F"}},    {"C minor", {}},
+                         {"A minor", {"Dm7", "G7"}},  {"C minor", {"G7sus4", "Ebmaj7#11"}},
+                         {"Bb major", {"Dm7", "G7"}}, {"C major", {}},
+                         {"C major", {"Dm7", "G7"}},  {"F# minor", {"C#7"}},
+                         {"Eb minor", {"Abm", "Bb7"}}};
+    for (const CRow& row : rows) {
+        std::vector<CChordLite> chords;
+        for (const char* const symbol : row.mChords) chords.push_back(Chord(symbol));
+        const CSignKeyLite key(row.mKey);
+        const CNextChords next = NextChords(model, chords, {key, 8});
+        REQUIRE(next.mChords.size() == 8);
+        CHECK(next.mKey == key);
+        const bool isMinor = key.mSignKeyType == TSignKeyType_Minor;
+        // A tonic in the mode of the key is likelier than the other one.
+        double inMode = 0.0;
+        double inOther = 0.0;
+        for (const CNextChord& chord : next.mChords) {
+            INFO(std::string(row.mKey), " ", chord.mNumeral);
+            const auto read = ChordFromNumeral(chord.mNumeral, key);
+            REQUIRE(read);
+            CHECK(read->mRootKeyEnh.mKeyNr == chord.mChord.mRootKeyEnh.mKeyNr);
+            CHECK((chord.mChord.mRootKeyEnh.mKeyNr == key.mRootKeyEnh.mKeyNr) ==
+                  (read->mRootKeyEnh.mKeyNr == key.mRootKeyEnh.mKeyNr));
+            if (chord.mChord.mRootKeyEnh.mKeyNr != key.mRootKeyEnh.mKeyNr) continue;
+            const bool isMinorChord = (chord.mChord.mSemitones.Mask() & 0b11000U) == 0b1000U;
+            (isMinorChord == isMinor ? inMode : inOther) += chord.mProbability;
+        }
+        INFO(std::string(row.mKey));
+        CHECK(inMode > inOther);
+    }
 }
 
 TEST_CASE("A file of a model reads back, and a damaged one is refused") {
