@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/song/CSongModel.h"
 
+#include "brindle/theory/KeyIntervals.h"
+
 #include <algorithm>
 #include <cmath>
 #include <numeric>
@@ -10,6 +12,17 @@ namespace {
 
 std::int32_t TickInBar(std::int32_t tick) {
     return ((tick % kTicksPerBar) + kTicksPerBar) % kTicksPerBar;
+}
+
+/// How a chord and the one before it sound, in whatever key. Longer chords than 2^14 ticks, more
+/// than 600 bars, are all alike.
+std::uint64_t PairNumber(const CSoundingChord& before, const CSoundingChord& chord) {
+    const auto word = [](const CSoundingChord& one) {
+        return std::uint64_t{one.mMask} | std::uint64_t{one.mBass} << 12U |
+               static_cast<std::uint64_t>(std::min(one.mLength, 0x3FFF)) << 16U;
+    };
+    const int step = FoldIntoOctave(chord.mRoot - before.mRoot);
+    return word(before) << 34U | word(chord) << 4U | static_cast<std::uint64_t>(step);
 }
 
 /// A chord of a song at a place of the bar.
@@ -58,6 +71,7 @@ CSongModel::CSongModel(std::vector<CTaughtSong> songs) : mSongs(std::move(songs)
     std::erase_if(mSongs, [](const CTaughtSong& song) { return song.mChords.empty(); });
     for (std::size_t index = 0; index < mSongs.size(); ++index) AddSong(index);
     SortHistories();
+    SortPairs();
     CountPlaces();
     ShareTriples();
     CountSuccessors();
@@ -70,18 +84,32 @@ void CSongModel::AddSong(std::size_t index) {
     const CTaughtSong& song = mSongs[index];
     const auto songNumber = static_cast<std::int32_t>(index);
     mPlaces.push_back(
-        {StartId(song.mKey.mSignKeyType == TSignKeyType_Minor), 0, songNumber, TBarPlace_Weak});
+        {StartId(song.mKey.mSignKeyType == TSignKeyType_Minor), 0, songNumber, TBarPlace_Weak, 0});
+    int tonic = 0;
     for (const CTaughtChord& chord : song.mChords) {
+        tonic = FoldIntoOctave(tonic + chord.mChord.mShift);
         const auto next = static_cast<std::int32_t>(mVocabulary.size());
         const auto [known, isNew] = mIds.try_emplace(chord.mChord.Code(), next);
         if (isNew) mVocabulary.push_back(chord.mChord);
-        mPlaces.push_back({known->second, chord.mLength, songNumber, BarPlaceOf(chord.mBegin)});
+        const auto root = static_cast<std::uint8_t>(FoldIntoOctave(tonic + chord.mChord.mRoot));
+        mPlaces.push_back(
+            {known->second, chord.mLength, songNumber, BarPlaceOf(chord.mBegin), root});
     }
 }
 
 std::int32_t CSongModel::IdOf(const CRelativeChord& chord) const {
     const auto known = mIds.find(chord.Code());
     return known == mIds.end() ? -1 : known->second;
+}
+
+std::int32_t CSongModel::HistoryIdOf(const CRelativeChord& chord) const {
+    const std::int32_t id = IdOf(chord);
+    return id >= 0 ? id : UnknownId(chord.mIsMinorKey);
+}
+
+bool CSongModel::IsInMinor(std::int32_t historyId) const {
+    if (historyId >= 0) return Chord(historyId).mIsMinorKey;
+    return historyId == UnknownId(true) || historyId == StartId(true);
 }
 
 /// The chord `back` places before a place; that before the start of a song is -1.
@@ -120,26 +148,57 @@ void CSongModel::SortHistories() {
     for (const CKeyed& entry : keyed) mByHistory.push_back(entry.mPlace);
 }
 
-void CSongModel::CountPlaces() {
-    mChordBegins.assign(mVocabulary.size() + 1, 0);
-    for (const CPlace& place : mPlaces) {
-        if (place.mId >= 0) ++mChordBegins[static_cast<std::size_t>(place.mId) + 1];
+CSoundingChord CSongModel::SoundAt(std::size_t place) const {
+    const CPlace& at = mPlaces[place];
+    const CRelativeChord& chord = Chord(at.mId);
+    return {at.mRoot, chord.mBass, chord.mMask, at.mLength};
+}
+
+/// A number for the pair that ends at a place, which must have a chord before it.
+std::uint64_t CSongModel::PairAt(std::size_t place) const {
+    return PairNumber(SoundAt(place - 1), SoundAt(place));
+}
+
+void CSongModel::SortPairs() {
+    std::vector<std::pair<std::uint64_t, std::uint32_t>> pairs;
+    pairs.reserve(mPlaces.size());
+    for (std::size_t place = 1; place < mPlaces.size(); ++place) {
+        if (mPlaces[place].mId < 0 || mPlaces[place - 1].mId < 0) continue;
+        pairs.emplace_back(PairAt(place), static_cast<std::uint32_t>(place));
     }
-    std::partial_sum(mChordBegins.begin(), mChordBegins.end(), mChordBegins.begin());
-    mByChord.resize(mByHistory.size());
-    std::vector<std::size_t> next(mChordBegins.begin(), mChordBegins.end() - 1);
-    for (std::size_t place = 0; place < mPlaces.size(); ++place) {
-        if (mPlaces[place].mId < 0) continue;
-        mByChord[next[static_cast<std::size_t>(mPlaces[place].mId)]++] =
-            static_cast<std::uint32_t>(place);
+    std::sort(pairs.begin(), pairs.end());
+    mByPair.reserve(pairs.size());
+    for (const auto& [number, place] : pairs) mByPair.push_back(place);
+}
+
+std::span<const std::uint32_t> CSongModel::PlacesOfPair(const CSoundingChord& before,
+                                                        const CSoundingChord& chord) const {
+    const std::uint64_t number = PairNumber(before, chord);
+    const auto first =
+        std::partition_point(mByPair.begin(), mByPair.end(),
+                             [&](std::uint32_t place) { return PairAt(place) < number; });
+    const auto last = std::partition_point(
+        first, mByPair.end(), [&](std::uint32_t place) { return PairAt(place) == number; });
+    return {first, last};
+}
+
+void CSongModel::CountPlaces() {
+    mCounts.assign(mVocabulary.size(), 0);
+    for (const CPlace& place : mPlaces) {
+        if (place.mId >= 0) ++mCounts[static_cast<std::size_t>(place.mId)];
     }
     mEndCounts.assign(mVocabulary.size(), 0);
+    mFinalCounts.assign(mVocabulary.size(), 0);
     std::size_t place = 0;
     for (const CTaughtSong& song : mSongs) {
         ++place;
         for (const CTaughtChord& chord : song.mChords) {
-            mEndCounts[static_cast<std::size_t>(mPlaces[place++].mId)] += chord.mEndsSection;
+            const CPlace& at = mPlaces[place++];
+            mEndCounts[static_cast<std::size_t>(at.mId)] += chord.mEndsSection;
+            ++mPlaceCounts[at.mBarPlace];
+            mRestCounts[at.mBarPlace] += chord.mEndsSection && chord.mChord.mRoot == 0;
         }
+        ++mFinalCounts[static_cast<std::size_t>(mPlaces[place - 1].mId)];
     }
 }
 
@@ -189,11 +248,22 @@ void CSongModel::CountSuccessors() {
         });
         mSuccessorBegins.push_back(mSuccessors.size());
     }
+    const auto share = [&heard](std::vector<CSongShares>& shares) {
+        ShareHeard(heard, [&](std::int32_t id) -> CSongShares& {
+            return shares[static_cast<std::size_t>(id)];
+        });
+    };
     heard.clear();
-    for (const std::uint32_t place : mByChord) hear(place);
-    ShareHeard(heard, [&](std::int32_t id) -> CSongShares& {
-        return mChordShares[static_cast<std::size_t>(id)];
-    });
+    for (const std::uint32_t place : mByHistory) hear(place);
+    share(mChordShares);
+    for (const bool isMinor : {false, true}) {
+        mModeShares[isMinor].resize(mVocabulary.size());
+        heard.clear();
+        for (const std::uint32_t place : mByHistory) {
+            if (IsInMinor(mPlaces[place - 1].mId) == isMinor) hear(place);
+        }
+        share(mModeShares[isMinor]);
+    }
 }
 
 void CSongModel::CountLengths() {
@@ -212,21 +282,30 @@ void CSongModel::CountLengths() {
 }
 
 std::uint32_t CSongModel::CountOf(std::int32_t id) const {
-    return static_cast<std::uint32_t>(PlacesOf(id).size());
+    return mCounts[static_cast<std::size_t>(id)];
 }
 
 std::uint32_t CSongModel::EndCountOf(std::int32_t id) const {
     return mEndCounts[static_cast<std::size_t>(id)];
 }
 
-std::span<const std::uint32_t> CSongModel::PlacesOf(std::int32_t id) const {
-    const auto index = static_cast<std::size_t>(id);
-    return std::span(mByChord).subspan(mChordBegins[index],
-                                       mChordBegins[index + 1] - mChordBegins[index]);
+std::uint32_t CSongModel::FinalCountOf(std::int32_t id) const {
+    return mFinalCounts[static_cast<std::size_t>(id)];
+}
+
+double CSongModel::RestRatioAt(TBarPlace place) const {
+    // The first beats of bars are alike: which of four is the last one is a matter of length.
+    const auto shareOf = [place](const std::array<std::uint32_t, kBarPlaceCount>& counts) {
+        const auto first = std::min<std::size_t>(place, TBarPlace_Middle);
+        const double onFirstBeats = std::accumulate(counts.begin(), counts.begin() + 4, 0.5);
+        const double all = std::accumulate(counts.begin() + 4, counts.end(), onFirstBeats + 1.0);
+        return (first < TBarPlace_Middle ? onFirstBeats : counts[place] + 0.5) / all;
+    };
+    return shareOf(mRestCounts) / shareOf(mPlaceCounts);
 }
 
 std::span<const CSongModel::CSuccessor> CSongModel::SuccessorsOf(std::int32_t id) const {
-    if (id == -1 || mSuccessorBegins.empty()) return {};
+    if (id == UnknownId(false) || id == UnknownId(true) || mSuccessorBegins.empty()) return {};
     const auto index = static_cast<std::size_t>(id < 0 ? id + 3 : id + 2);
     return std::span(mSuccessors)
         .subspan(mSuccessorBegins[index], mSuccessorBegins[index + 1] - mSuccessorBegins[index]);

@@ -120,18 +120,35 @@ CSongModel::CRange CSongModel::Narrowed(CRange range, std::int32_t id, std::size
             static_cast<std::size_t>(last - mByHistory.begin())};
 }
 
-/// How common each chord is, at such a place of the bar.
+bool CSongModel::HasBothModes() const {
+    const auto hasAny = [](const std::vector<CSongShares>& shares) {
+        return std::any_of(shares.begin(), shares.end(),
+                           [](const CSongShares& of) { return of.mAll > 0.0F; });
+    };
+    return hasAny(mModeShares[0]) && hasAny(mModeShares[1]);
+}
+
+/// How common each chord is behind a chord in a mode, at such a place of the bar.
 void CSongModel::PredictAlone() {
     std::vector<double> kinds;
     for (const CRelativeChord& chord : mVocabulary) kinds.push_back(KindProbability(chord));
     const auto idOf = [](std::size_t ix) { return ix; };
-    MixShares(
-        kinds.size(), idOf, [&](std::size_t id) { return mChordShares[id].mAll; }, kinds);
-    for (std::size_t place = 0; place < kBarPlaceCount; ++place) {
-        mAlone[place] = kinds;
+    // What is common in songs of one mode is said by that mode, and not twice.
+    if (HasBothModes()) {
         MixShares(
-            kinds.size(), idOf, [&](std::size_t id) { return mChordShares[id].mAt[place]; },
-            mAlone[place]);
+            kinds.size(), idOf, [&](std::size_t id) { return mChordShares[id].mAll; }, kinds);
+    }
+    for (std::size_t mode = 0; mode < mAlone.size(); ++mode) {
+        const std::vector<CSongShares>& shares = mModeShares[mode];
+        std::vector<double> inMode = kinds;
+        MixShares(
+            kinds.size(), idOf, [&](std::size_t id) { return shares[id].mAll; }, inMode);
+        for (std::size_t place = 0; place < kBarPlaceCount; ++place) {
+            mAlone[mode][place] = inMode;
+            MixShares(
+                kinds.size(), idOf, [&](std::size_t id) { return shares[id].mAt[place]; },
+                mAlone[mode][place]);
+        }
     }
 }
 
@@ -167,13 +184,13 @@ void CSongModel::MixRange(CRange range, const TBarPlace* barPlace,
 
 void CSongModel::Predict(std::span<const std::int32_t> history, TBarPlace barPlace,
                          std::size_t order, std::vector<double>& probabilities) const {
-    probabilities = mAlone[barPlace];
+    probabilities = mAlone[!history.empty() && IsInMinor(history.back())][barPlace];
     CRange range{0, mByHistory.size()};
     const std::size_t longest = std::min({order, history.size(), kLongestHistory});
     for (std::size_t back = 1; back <= longest; ++back) {
         const std::int32_t id = history[history.size() - back];
         // A chord that was never heard ends what is known of the history.
-        if (id == -1) return;
+        if (id == UnknownId(false) || id == UnknownId(true)) return;
         range = Narrowed(range, id, back);
         if (range.mBegin == range.mEnd) return;
         if (back == 1) {

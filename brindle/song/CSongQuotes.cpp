@@ -6,10 +6,6 @@
 namespace brindle {
 namespace {
 
-bool IsAt(const CSongModel::CPlace& place, const CQuotedChord& chord) {
-    return place.mId == chord.mId && place.mLength == chord.mLength;
-}
-
 /// The tick at which a place of a song begins.
 std::int32_t TickOfPlace(const CSongModel& model, std::uint32_t place) {
     const auto places = model.Places();
@@ -22,36 +18,27 @@ std::int32_t TickOfPlace(const CSongModel& model, std::uint32_t place) {
 
 }  // namespace
 
-bool CSongQuotes::GoesOn(const CMatch& match, const CQuotedChord& chord) const {
-    const auto places = mModel->Places();
-    const std::size_t next = match.mPlace + std::size_t{1};
-    return next < places.size() && places[next].mSong == places[match.mPlace].mSong &&
-           IsAt(places[next], chord);
-}
-
-std::int32_t CSongQuotes::LengthWith(const CQuotedChord& chord) const {
+std::int32_t CSongQuotes::Length() const {
     std::int32_t longest = 0;
-    for (const CMatch& match : mMatches) {
-        if (match.mLength + chord.mLength > longest && GoesOn(match, chord)) {
-            longest = match.mLength + chord.mLength;
-        }
-    }
-    return longest;
+    for (const CMatch& match : mMatches) longest = std::max(longest, match.mLength);
+    return longest > mWished ? longest : 0;
 }
 
 void CSongQuotes::Add(const CQuotedChord& chord) {
     std::vector<CMatch> matches;
-    if (chord.mId >= 0) {
-        auto before = mMatches.begin();
-        for (const std::uint32_t place : mModel->PlacesOf(chord.mId)) {
-            if (!IsAt(mModel->Places()[place], chord)) continue;
+    const std::int32_t ofPair = mLast.mLength + chord.mChord.mLength;
+    auto before = mMatches.begin();
+    if (mLast.mLength > 0) {
+        for (const std::uint32_t place : mModel->PlacesOfPair(mLast, chord.mChord)) {
             // Both lists are by place.
             while (before != mMatches.end() && before->mPlace + 1 < place) ++before;
             const bool goesOn = before != mMatches.end() && before->mPlace + 1 == place;
-            matches.push_back({place, chord.mLength + (goesOn ? before->mLength : 0)});
+            matches.push_back({place, goesOn ? before->mLength + chord.mChord.mLength : ofPair});
         }
     }
     mMatches = std::move(matches);
+    mLast = chord.mChord;
+    mWished = chord.mIsWished ? mWished + chord.mChord.mLength : 0;
 }
 
 CSongQuote LongestQuote(const CSongModel& model, std::span<const CQuotedChord> chords) {
@@ -61,7 +48,7 @@ CSongQuote LongestQuote(const CSongModel& model, std::span<const CQuotedChord> c
     std::int32_t tick = 0;
     for (const CQuotedChord& chord : chords) {
         quotes.Add(chord);
-        tick += chord.mLength;
+        tick += chord.mChord.mLength;
         for (const CSongQuotes::CMatch& match : quotes.mMatches) {
             if (match.mLength <= longest.mLength) continue;
             longest.mLength = match.mLength;
@@ -74,6 +61,16 @@ CSongQuote LongestQuote(const CSongModel& model, std::span<const CQuotedChord> c
     longest.mSong = places[place].mSong;
     longest.mSourceTick = TickOfPlace(model, place) + places[place].mLength - longest.mLength;
     return longest;
+}
+
+bool QuotesMoreThan(std::int32_t ticks, const CSongModel& model,
+                    std::span<const CQuotedChord> chords) {
+    CSongQuotes quotes(model);
+    for (const CQuotedChord& chord : chords) {
+        quotes.Add(chord);
+        if (quotes.Length() > ticks) return true;
+    }
+    return false;
 }
 
 }  // namespace brindle

@@ -13,6 +13,10 @@ namespace {
 
 // What stands further back says nothing about the next chord, and little about the key.
 constexpr std::size_t kMostChords = 16;
+// Nor does it tell what the next chord does.
+constexpr std::size_t kReadChords = 3;
+// No passage gains so many points by leaving the key.
+constexpr double kStayInKey = 1e6;
 
 CHarmAnlsChords ListOf(std::span<const CChordLite> chords) {
     CHarmAnlsChords list;
@@ -46,20 +50,20 @@ CTypedHistory HistoryOf(const CSongModel& model, std::span<const CChordLite> cho
         history.mIds.push_back(CSongModel::StartId(key.mSignKeyType == TSignKeyType_Minor));
     }
     for (const CChordLite& chord : chords) {
-        history.mIds.push_back(model.IdOf(RelativeChordOf(chord, key, key.mRootKeyEnh.mKeyNr)));
+        history.mIds.push_back(
+            model.HistoryIdOf(RelativeChordOf(chord, key, key.mRootKeyEnh.mKeyNr)));
     }
     return history;
 }
 
-// More than any passage gains by a key of its own.
-constexpr double kAlwaysHome = 1000.0;
-
-/// The chord behind the others as a teacher reads it, in the one key that the whole list is in.
-void SetReading(std::vector<CChordLite> chords, const CSignKeyLite& key, CNextChord& next) {
+/// The chord behind the others as a teacher reads it who stays in the key.
+void SetReading(std::span<const CChordLite> before, const CSignKeyLite& key, CNextChord& next) {
+    std::vector<CChordLite> chords(before.last(std::min(before.size(), kReadChords)).begin(),
+                                   before.end());
     chords.push_back(next.mChord);
     CReadingOptions options;
     options.mStatedKey = key;
-    options.mKeys.mHomeBonus = kAlwaysHome;
+    options.mKeys.mHomeBonus = kStayInKey;
     const CSongReading reading = ReadHarmony(ListOf(chords), options);
     const CChordReading& last = reading.mChords[chords.size() - 1];
     next.mNumeral = last.mNumeral;

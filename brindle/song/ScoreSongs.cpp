@@ -21,7 +21,7 @@ CSongScore ScoreOf(const CSongModel& model, const CTaughtSong& song, std::size_t
             model.ProbabilityOf(chord.mChord, history, BarPlaceOf(chord.mBegin), order);
         score.mBits -= std::log2(std::max(probability, 1e-300));
         ++score.mChords;
-        history.push_back(model.IdOf(chord.mChord));
+        history.push_back(model.HistoryIdOf(chord.mChord));
     }
     return score;
 }

@@ -3,6 +3,7 @@
 
 #include "brindle/chords/CProgressionSpelling.h"
 #include "brindle/chords/WriteChordSymbol.h"
+#include "brindle/song/internal/QuotedRow.h"
 #include "brindle/song/internal/SongPlan.h"
 #include "brindle/song/internal/WriteStretch.h"
 
@@ -144,12 +145,7 @@ CSong SongOf(const std::vector<CWrittenChords>& parts, const CSongPlan& plan,
     return song;
 }
 
-CWrittenQuote QuoteOf(const CSongModel& model, const CWrittenChords& chords,
-                      const CWriteSongOptions& options) {
-    std::vector<CQuotedChord> row;
-    for (const CWrittenChord& chord : chords) {
-        row.push_back({chord.mId, chord.mBeats * kTicksPerBar / options.mBeatsPerBar});
-    }
+CWrittenQuote QuoteOf(const CSongModel& model, std::span<const CQuotedChord> row) {
     const CSongQuote quote = LongestQuote(model, row);
     if (quote.mSong < 0) return {};
     const auto bars = [](std::int32_t ticks) { return static_cast<double>(ticks) / kTicksPerBar; };
@@ -198,11 +194,12 @@ CWrittenSong WriteSong(const CSongModel& model, const CWriteSongOptions& options
         if (end == TStretch_Impossible)
             return RefusedSong("the songs of the model never come to rest in such a key");
         if (end != TStretch_Written) continue;
-        result.mLongestQuote = QuoteOf(model, Joined(writer.Parts()), options);
-        // Copies of parts may join to more than either, and what was wished for may be a quote.
-        const bool quotesTooMuch =
-            options.mMostQuotedBars > 0.0 && result.mLongestQuote.mBars > options.mMostQuotedBars;
-        if (quotesTooMuch && (options.mWishes.empty() || tries + 1 < kMostTries)) continue;
+        const std::vector<CQuotedChord> row =
+            QuotedRowOf(Joined(writer.Parts()), 0, options.mBeatsPerBar);
+        // Copies of parts may join to more than either.
+        const std::int32_t most = MostQuotedTicks(options);
+        if (most > 0 && QuotesMoreThan(most, model, row)) continue;
+        result.mLongestQuote = QuoteOf(model, row);
         result.mSong = SongOf(writer.Parts(), plan, options);
         return result;
     }

@@ -21,7 +21,7 @@ CSongCandidates::CSongCandidates(const CSongModel& model, const CSongStretch& st
     : mModel(model), mHomeTonic(stretch.mHome.mRootKeyEnh.mKeyNr) {
     AddCommon(model);
     AddWished(stretch);
-    AddSteps(model);
+    AddSteps(model, CSongModel::StartId(stretch.mHome.mSignKeyType == TSignKeyType_Minor));
 }
 
 std::ptrdiff_t CSongCandidates::IndexOf(std::int32_t id) const {
@@ -64,12 +64,12 @@ void CSongCandidates::AddWish(const CSongStretch& stretch, const CWishedChord& w
     mCandidates.push_back({chord, id});
 }
 
-void CSongCandidates::AddSteps(const CSongModel& model) {
+void CSongCandidates::AddSteps(const CSongModel& model, std::int32_t start) {
     mSteps.resize(size());
     std::vector<double> alone;
     mAlone.resize(size());
     for (std::size_t place = 0; place < kBarPlaceCount; ++place) {
-        model.Predict({}, static_cast<TBarPlace>(place), 0, alone);
+        model.Predict(std::array{start}, static_cast<TBarPlace>(place), 0, alone);
         for (std::size_t index = 0; index < size(); ++index) {
             const std::int32_t id = mCandidates[index].mId;
             mAlone[index][place] =

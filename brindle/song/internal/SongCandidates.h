@@ -53,7 +53,7 @@ private:
     void AddCommon(const CSongModel& model);
     void AddWished(const CSongStretch& stretch);
     void AddWish(const CSongStretch& stretch, const CWishedChord& wish);
-    void AddSteps(const CSongModel& model);
+    void AddSteps(const CSongModel& model, std::int32_t start);
 
     const CSongModel& mModel;
     int mHomeTonic;

@@ -19,7 +19,7 @@ std::vector<CFormPart> PartsOfForm(const std::string& form, std::size_t bars) {
     for (std::size_t ix = 0; ix < letters.size(); ++ix) {
         const bool isLast = ix + 1 == letters.size();
         const bool isSecond = ix > 0 && letters[ix] == letters[ix - 1];
-        CFormPart part{letters[ix], 0, bars / letters.size(), false, -1, -1};
+        CFormPart part{letters[ix], 0, bars / letters.size(), false, false, -1, -1};
         part.mFirstBar = ix * part.mBars;
         part.mIsClosed = isLast || (isSecond && letters[ix] != letters[ix + 1]);
         for (std::size_t before = ix; before-- > 0;) {
@@ -29,6 +29,10 @@ std::vector<CFormPart> PartsOfForm(const std::string& form, std::size_t bars) {
             part.mIsLike = static_cast<std::ptrdiff_t>(before);
         }
         parts.push_back(part);
+    }
+    for (CFormPart& part : parts) {
+        const bool isDoubled = letters.find(std::string(2, part.mLetter)) != std::string::npos;
+        part.mStaysOpen = isDoubled && !part.mIsClosed;
     }
     return parts;
 }

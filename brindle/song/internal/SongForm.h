@@ -14,6 +14,8 @@ struct CFormPart {
     std::size_t mBars = 0;
     /// It comes to rest: the last part, and the second of two of one letter before another one.
     bool mIsClosed = false;
+    /// It does not: the first of two parts of one letter, and those that are like it.
+    bool mStaysOpen = false;
     /// The parts before it that begin as it does, and that end as it does, too; -1 for none. It is
     /// written anew, or its last bars are, where there is none.
     std::ptrdiff_t mBeginsLike = -1;

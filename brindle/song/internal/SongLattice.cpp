@@ -12,11 +12,19 @@ constexpr std::uint64_t kMajorThird = 1U << 4U;
 constexpr std::uint64_t kTriadTones = 0b10011001;
 constexpr std::uint64_t kThirds = 0b11000;
 // A chord that never ended a part in the songs may still end one.
-constexpr double kRareEnd = 0.05;
+constexpr double kRareEnd = 1e-3;
+// What was heard so often or less says little about how often it ends a part.
+constexpr double kFewTimes = 10.0;
+// Somebody may wish for a first part that comes to rest.
+constexpr double kRestInOpenPart = 1e-6;
 
 /// Whether a song comes to rest on the chord: a triad, with a sixth or a major seventh or a ninth.
 bool IsAtRest(std::uint64_t mask) {
     return std::popcount(mask & kTriadTones) == 3 && std::popcount(mask & kThirds) == 1;
+}
+
+bool IsDominant(std::uint64_t mask) {
+    return (mask & kMajorThird) != 0 && (mask & kMinorSeventh) != 0;
 }
 
 }  // namespace
@@ -96,6 +104,18 @@ TBarPlace CSongLattice::PlaceAt(std::size_t beat) const {
     return BarPlaceOf(place * kTicksPerBar / mStretch.mBeatsPerBar);
 }
 
+/// Whether a song may end on it: a chord on the tonic, which in minor may be major. One with a
+/// minor seventh is at rest only where somebody wishes for it or songs end on it, as in a blues.
+bool CSongLattice::IsFinal(const CSongCandidates::CCandidate& candidate) const {
+    const CRelativeChord& chord = candidate.mChord;
+    const bool isMinor = mStretch.mHome.mSignKeyType == TSignKeyType_Minor;
+    const bool isTonic = chord.mRoot == 0 && chord.mBass == 0 && chord.mIsMinorKey == isMinor &&
+                         IsAtRest(chord.mMask) && (isMinor || (chord.mMask & kMajorThird) != 0);
+    if (!isTonic || !IsDominant(chord.mMask)) return isTonic;
+    const bool isWished = !mStretch.mWishes.empty() && !mStretch.mWishes.back().empty();
+    return isWished || (candidate.mId >= 0 && mModel.FinalCountOf(candidate.mId) > 0);
+}
+
 double CSongLattice::EndWeight(std::size_t slot) const {
     const CSongCandidates::CCandidate& candidate = mCandidates[slot / kTonicCount];
     const CRelativeChord& chord = candidate.mChord;
@@ -103,19 +123,17 @@ double CSongLattice::EndWeight(std::size_t slot) const {
     // Parts end in the key of the song, so that any other can come behind.
     if (mStretch.mEndsSection && tonic != 0) return 0.0;
     double weight = 1.0;
-    if (mStretch.mEndsOnTonic) {
-        const bool isHome =
-            chord.mRoot == 0 && chord.mBass == 0 &&
-            chord.mIsMinorKey == (mStretch.mHome.mSignKeyType == TSignKeyType_Minor);
-        if (!isHome || !IsAtRest(chord.mMask)) return 0.0;
-        // A seventh is at rest in a blues.
-        const std::uint64_t dominant = kMajorThird | kMinorSeventh;
-        if ((chord.mMask & dominant) == dominant) weight = 0.1;
-    } else if (mStretch.mEndsSection) {
-        const double ends = candidate.mId < 0 ? 0.0 : mModel.EndCountOf(candidate.mId);
-        const double count = candidate.mId < 0 ? 1.0 : mModel.CountOf(candidate.mId);
-        weight = (ends + kRareEnd) / (count + 1.0);
+    if (candidate.mId < 0) {
+        weight = kRareEnd;
+    } else if (mStretch.mEndsOnTonic || mStretch.mEndsSection) {
+        const double ends = mStretch.mEndsOnTonic ? mModel.FinalCountOf(candidate.mId)
+                                                  : mModel.EndCountOf(candidate.mId);
+        weight = kRareEnd + ends / (mModel.CountOf(candidate.mId) + kFewTimes);
     }
+    if (mStretch.mEndsOnTonic && !IsFinal(candidate)) return 0.0;
+    // A seventh on the tonic leads on.
+    const bool isTonic = tonic == 0 && chord.mRoot == 0 && !IsDominant(chord.mMask);
+    if (mStretch.mStaysOpen && isTonic) weight *= kRestInOpenPart;
     if (mStretch.mBehind.empty()) return weight;
     const CWrittenChord& next = mStretch.mBehind.front();
     if (CSongCandidates::TonicAfter(tonic, next.mChord) != static_cast<std::size_t>(next.mTonic)) {
@@ -125,6 +143,15 @@ double CSongLattice::EndWeight(std::size_t slot) const {
     const bool isStep =
         to >= 0 && mCandidates.HasStep(slot / kTonicCount, static_cast<std::size_t>(to));
     return weight * (isStep ? 1.0 : 1e-4);
+}
+
+/// A song comes to rest on a strong beat, as often as songs do.
+double CSongLattice::EndingWeight(std::size_t beat, std::size_t length) const {
+    const bool isEnding = beat + length == mStretch.mBeats && mStretch.mEndsOnTonic;
+    if (!isEnding) return 1.0;
+    // Twice, since the limit of quotes takes the plain ends away that many songs have.
+    const double ratio = mModel.RestRatioAt(PlaceAt(beat));
+    return ratio * ratio;
 }
 
 void CSongLattice::SumEnd() {
@@ -139,7 +166,7 @@ double CSongLattice::FromWithLength(std::size_t beat, std::size_t slot, std::siz
     for (std::size_t at = beat; at < beat + length; ++at) {
         if (!IsAllowed(at, slot)) return 0.0;
     }
-    return mEnds[beat + length][slot * mProgressCount + progress] *
+    return EndingWeight(beat, length) * mEnds[beat + length][slot * mProgressCount + progress] *
            std::exp(mScales[beat + length] - mScales[beat]);
 }
 
@@ -153,7 +180,8 @@ void CSongLattice::SumBegins(std::size_t beat) {
     }
     std::vector<double>& begins = mBegins[beat];
     for (std::size_t length = 1; length <= longest; ++length) {
-        const double factor = weights[length - 1] * std::exp(mScales[beat + length] - base);
+        const double factor = weights[length - 1] * EndingWeight(beat, length) *
+                              std::exp(mScales[beat + length] - base);
         const std::vector<double>& ends = mEnds[beat + length];
         for (std::size_t slot = 0; slot < mCandidates.SlotCount(); ++slot) {
             bool isAllowed = true;

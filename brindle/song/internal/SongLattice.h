@@ -55,7 +55,9 @@ private:
         return mAllowed[mAllowedRow[beat]][slot] != 0;
     }
     void SumEnd();
+    [[nodiscard]] bool IsFinal(const CSongCandidates::CCandidate& candidate) const;
     [[nodiscard]] double EndWeight(std::size_t slot) const;
+    [[nodiscard]] double EndingWeight(std::size_t beat, std::size_t length) const;
     void SumBegins(std::size_t beat);
     void SumSteps(std::size_t beat);
 

@@ -7,9 +7,9 @@ namespace brindle {
 namespace {
 
 constexpr int kLongestChordInBars = 4;
-constexpr double kLeastWeight = 1e-4;
+constexpr double kLeastWeight = 1e-6;
 // What is rarer among the lengths at a place is a slip, or belongs to a rhythm of its own.
-constexpr double kRareShare = 0.03;
+constexpr double kRareShare = 0.05;
 // How much the rhythm of a song stays as it is.
 constexpr double kSameRhythm = 0.7;
 

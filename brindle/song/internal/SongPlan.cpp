@@ -22,7 +22,8 @@ CSongStretch StretchOf(const CWriteSongOptions& options, const CFormPart& part, 
     stretch.mEndsOnTonic = part.mIsClosed && (!isLastPart || options.mEndsOnTonic);
     stretch.mEndsSection = true;
     stretch.mOrder = options.mOrder;
-    stretch.mMostQuoted = static_cast<std::int32_t>(options.mMostQuotedBars * kTicksPerBar + 0.5);
+    stretch.mStaysOpen = part.mStaysOpen;
+    stretch.mMostQuoted = MostQuotedTicks(options);
     return stretch;
 }
 
@@ -140,6 +141,13 @@ bool ArePossible(const CSongModel& model, const CWriteSongOptions& options,
 }
 
 }  // namespace
+
+std::int32_t MostQuotedTicks(const CWriteSongOptions& options) {
+    const double bars = options.mMostQuotedBars;
+    if (!(bars > 0.0)) return 0;
+    // No song is longer.
+    return std::max(1, static_cast<std::int32_t>(std::min(bars, 1000.0) * kTicksPerBar + 0.5));
+}
 
 CSongPlan PlanSong(const CSongModel& model, const CWriteSongOptions& options,
                    const std::vector<std::size_t>& wishes) {

@@ -26,6 +26,9 @@ struct CSongPlan {
     bool mHasRoomForRows = true;
 };
 
+/// The longest quote that is allowed, in ticks; 0 for any.
+[[nodiscard]] std::int32_t MostQuotedTicks(const CWriteSongOptions& options);
+
 /// `wishes` are indices of the wishes of the options that count.
 [[nodiscard]] CSongPlan PlanSong(const CSongModel& model, const CWriteSongOptions& options,
                                  const std::vector<std::size_t>& wishes);

@@ -20,6 +20,8 @@ struct CWrittenChord {
     /// The tonic of its key above that of the song, 0 to 11.
     std::int32_t mTonic = 0;
     std::int32_t mBeats = 0;
+    /// Just this chord was wished for, on all of its beats.
+    bool mIsWished = false;
 };
 
 /// A part of a song that is to be written in one go, and all that is known of it.
@@ -38,6 +40,8 @@ struct CSongStretch {
     std::vector<CWishedChord> mNever;
     std::vector<std::vector<CWishedChord>> mContains;
     bool mEndsOnTonic = false;
+    /// The first of two parts of one letter, which rather does not.
+    bool mStaysOpen = false;
     /// A part ends with it.
     bool mEndsSection = false;
     std::size_t mOrder = CSongModel::kLongestHistory;

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/song/internal/WriteStretch.h"
 
+#include "brindle/song/internal/QuotedRow.h"
 #include "brindle/song/internal/SongLattice.h"
 
 #include <algorithm>
@@ -46,12 +47,14 @@ public:
         : mModel(model), mStretch(stretch), mRandom(random), mLattice(model, stretch) {
         const bool isMinor = stretch.mHome.mSignKeyType == TSignKeyType_Minor;
         mHistory = {CSongModel::StartId(isMinor)};
-        CSongQuotes quotes(model);
         for (const CWrittenChord& chord : stretch.mBefore) {
-            mHistory.push_back(chord.mId);
-            quotes.Add(QuotedOf(chord));
+            mHistory.push_back(model.HistoryIdOf(chord.mChord));
+            mBeatsBefore += static_cast<std::size_t>(chord.mBeats);
         }
-        mQuotes.push_back(std::move(quotes));
+        mQuotes.emplace_back(model);
+        for (const CQuotedChord& chord : QuotedRowOf(stretch.mBefore, 0, stretch.mBeatsPerBar)) {
+            mQuotes.back().Add(chord);
+        }
     }
 
     [[nodiscard]] TStretchEnd Write(std::vector<CWrittenChord>& chords) {
@@ -62,9 +65,6 @@ public:
     }
 
 private:
-    [[nodiscard]] CQuotedChord QuotedOf(const CWrittenChord& chord) const {
-        return {chord.mId, chord.mBeats * kTicksPerBar / mStretch.mBeatsPerBar};
-    }
     [[nodiscard]] std::size_t TonicNow() const {
         return mWritten.empty() ? mLattice.TonicBefore()
                                 : static_cast<std::size_t>(mWritten.back().mTonic);
@@ -82,8 +82,8 @@ private:
             const CSongCandidates::CCandidate& candidate = mLattice.Candidates()[choice];
             const std::size_t tonic = CSongCandidates::TonicAfter(TonicNow(), candidate.mChord);
             mWritten.push_back(
-                {candidate.mChord, candidate.mId, static_cast<std::int32_t>(tonic), 0});
-            mHistory.push_back(candidate.mId);
+                {candidate.mChord, candidate.mId, static_cast<std::int32_t>(tonic), 0, false});
+            mHistory.push_back(mModel.HistoryIdOf(candidate.mChord));
             const std::size_t slot = choice * kTonicCount + tonic;
             if (WriteLength(beat, slot, mLattice.ProgressWith(progress, slot))) return true;
             mWritten.pop_back();
@@ -99,14 +99,16 @@ private:
         while (mSteps < kMostSteps) {
             const std::size_t choice = choices.Draw(mRandom);
             if (choice == choices.size()) return false;
-            mWritten.back().mBeats = static_cast<std::int32_t>(choice) + 1;
             const std::size_t end = beat + choice + 1;
-            if (!QuotesTooMuch(beat, end)) {
-                mQuotes.push_back(mQuotes.back());
-                mQuotes.back().Add(QuotedOf(mWritten.back()));
-                if (end == mStretch.mBeats || WriteChord(end, progress)) return true;
-                mQuotes.pop_back();
+            mWritten.back().mBeats = static_cast<std::int32_t>(choice) + 1;
+            mWritten.back().mIsWished = IsWished(beat, end);
+            mQuotes.push_back(mQuotes.back());
+            mQuotes.back().Add(
+                QuotedChordOf(mWritten.back(), mBeatsBefore + beat, mStretch.mBeatsPerBar));
+            if (!QuotesTooMuch(end) && (end == mStretch.mBeats || WriteChord(end, progress))) {
+                return true;
             }
+            mQuotes.pop_back();
             choices[choice] = 0.0;
         }
         return false;
@@ -163,25 +165,26 @@ private:
         return choices;
     }
 
-    /// What was wished for as a whole is no quote of ours.
-    [[nodiscard]] bool QuotesTooMuch(std::size_t beat, std::size_t end) const {
-        if (mStretch.mMostQuoted <= 0) return false;
-        bool isWished = true;
-        for (std::size_t at = beat; isWished && at < end; ++at) {
-            isWished = at < mStretch.mWishes.size() && !mStretch.mWishes[at].empty() &&
-                       !mStretch.mWishes[at].front().mIsKind;
+    /// Whether somebody wished for just the chords on these beats.
+    [[nodiscard]] bool IsWished(std::size_t beat, std::size_t end) const {
+        for (std::size_t at = beat; at < end; ++at) {
+            const bool isWished = at < mStretch.mWishes.size() && !mStretch.mWishes[at].empty() &&
+                                  !mStretch.mWishes[at].front().mIsKind;
+            if (!isWished) return false;
         }
-        if (isWished) return false;
-        const CQuotedChord last = QuotedOf(mWritten.back());
-        if (mQuotes.back().LengthWith(last) > mStretch.mMostQuoted) return true;
-        if (end < mStretch.mBeats || mStretch.mBehind.empty()) return false;
+        return true;
+    }
+
+    [[nodiscard]] bool QuotesTooMuch(std::size_t end) const {
+        if (mStretch.mMostQuoted <= 0) return false;
+        if (mQuotes.back().Length() > mStretch.mMostQuoted) return true;
+        if (end < mStretch.mBeats) return false;
         CSongQuotes quotes = mQuotes.back();
-        quotes.Add(last);
-        for (const CWrittenChord& chord : mStretch.mBehind) {
-            const std::int32_t length = quotes.LengthWith(QuotedOf(chord));
-            if (length == 0) return false;
-            if (length > mStretch.mMostQuoted) return true;
-            quotes.Add(QuotedOf(chord));
+        for (const CQuotedChord& chord :
+             QuotedRowOf(mStretch.mBehind, mBeatsBefore + end, mStretch.mBeatsPerBar)) {
+            quotes.Add(chord);
+            if (quotes.Length() == 0) return false;
+            if (quotes.Length() > mStretch.mMostQuoted) return true;
         }
         return false;
     }
@@ -191,6 +194,7 @@ private:
     SeededRandom& mRandom;
     CSongLattice mLattice;
     std::vector<std::int32_t> mHistory;
+    std::size_t mBeatsBefore = 0;
     std::vector<CWrittenChord> mWritten;
     /// Before each chord, and behind the last.
     std::vector<CSongQuotes> mQuotes;
