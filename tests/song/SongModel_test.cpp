@@ -120,8 +120,6 @@ TEST_CASE("What may come is told in the key, and in minor it is what songs in mi
             const auto read = ChordFromNumeral(chord.mNumeral, key);
             REQUIRE(read);
             CHECK(read->mRootKeyEnh.mKeyNr == chord.mChord.mRootKeyEnh.mKeyNr);
-            CHECK((chord.mChord.mRootKeyEnh.mKeyNr == key.mRootKeyEnh.mKeyNr) ==
-                  (read->mRootKeyEnh.mKeyNr == key.mRootKeyEnh.mKeyNr));
             if (chord.mChord.mRootKeyEnh.mKeyNr != key.mRootKeyEnh.mKeyNr) continue;
             const bool isMinorChord = (chord.mChord.mSemitones.Mask() & 0b11000U) == 0b1000U;
             (isMinorChord == isMinor ? inMode : inOther) += chord.mProbability;
