@@ -94,9 +94,12 @@ std::optional<std::string> Contradiction(const CAnalyseOptions& options) {
     if (options.mExplain && !isText && options.mFormat.Format() != TFormat::Json) {
         return "--explain has words for --format text and json";
     }
-    if (options.mReadings && options.mFormat.Format() == TFormat::Native) {
+    const bool isNative = options.mFormat.Format() == TFormat::Native;
+    if (options.mReadings && isNative) {
         return "--readings has no native form; --format json shows them";
     }
+    if (options.mNumerals != CNumeralOptions{} && isNative)
+        return "the native form has no numerals";
     if (options.mGrids && options.mFormat.Format() != TFormat::Svg) {
         return "--grids belong into a picture, --format svg";
     }
@@ -106,7 +109,8 @@ std::optional<std::string> Contradiction(const CAnalyseOptions& options) {
     if ((options.mCapo > 0 || options.mIsLeftHanded) && !options.mGrids) {
         return "--capo and --left are for --grids";
     }
-    return options.mSheetPicture.Contradiction(!IsSheetWanted(options));
+    const bool isPicture = options.mFormat.Format() == TFormat::Svg;
+    return options.mSheetPicture.Contradiction(isPicture, !IsSheetWanted(options));
 }
 
 /// A song that has been analysed, and what its presentations need beside that.

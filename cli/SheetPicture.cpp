@@ -19,23 +19,37 @@ void CSheetPicture::AddTo(CCommand& command) {
                       "Colors of the lead sheet; auto are those that the viewer prefers");
 }
 
-std::optional<std::string> CSheetPicture::Contradiction(bool isAxis) const {
+std::optional<std::string> CSheetPicture::Contradiction(bool isPicture, bool isAxis) const {
     if (mOptions.mBarsPerLine < 1 || mOptions.mBarsPerLine > 16) {
         return "--bars-per-line takes 1 to 16 bars";
     }
     if (!(mOptions.mWidth >= 200.0 && mOptions.mWidth <= 4000.0)) {
         return "--width takes 200 to 4000 pixels";
     }
-    const bool hasPaper = mPage != "endless" || mTheme != "auto";
-    if (isAxis && hasPaper) {
-        return "--page and --theme are for the lead sheet, not for the time axis";
+    if (!isPicture && (HasLayout() || !mPicture.empty())) {
+        return "--picture, --bars-per-line, --width, --page and --theme are for pictures, "
+               "--format svg";
     }
+    if (isAxis && HasLayout()) {
+        return "--bars-per-line, --width, --page and --theme are for the lead sheet, not for the "
+               "time axis";
+    }
+    if (HasPaper() && HasWidth()) return "--page a4 is as wide as its paper; leave --width out";
     return std::nullopt;
+}
+
+bool CSheetPicture::HasWidth() const {
+    return mOptions.mWidth != CLeadSheetOptions().mWidth;
+}
+
+bool CSheetPicture::HasLayout() const {
+    return HasPaper() || HasWidth() || mTheme != "auto" ||
+           mOptions.mBarsPerLine != CLeadSheetOptions().mBarsPerLine;
 }
 
 std::string CSheetPicture::Draw(const CSong& song, const CSongReading& reading) const {
     CLeadSheetOptions options = mOptions;
-    options.mPage = mPage == "a4" ? TSheetPage_A4 : TSheetPage_Endless;
+    options.mPage = HasPaper() ? TSheetPage_A4 : TSheetPage_Endless;
     if (mTheme != "auto") options.mTheme = mTheme == "dark" ? TSheetTheme_Dark : TSheetTheme_Light;
     return LeadSheetSvg(song, reading, options);
 }

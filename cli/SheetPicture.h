@@ -22,7 +22,8 @@ public:
     void AddTo(CCommand& command);
 
     /// What is wrong with the options; `isAxis` where the time axis is drawn for whatever reason.
-    [[nodiscard]] std::optional<std::string> Contradiction(bool isAxis) const;
+    /// Without a picture they are wrong when they are told.
+    [[nodiscard]] std::optional<std::string> Contradiction(bool isPicture, bool isAxis) const;
 
     /// Whether the time axis with the centers is wanted instead.
     [[nodiscard]] bool IsAxis() const { return mPicture == "axis"; }
@@ -34,6 +35,11 @@ public:
     [[nodiscard]] std::string Draw(const CSong& song, const CSongReading& reading) const;
 
 private:
+    [[nodiscard]] bool HasPaper() const { return mPage == "a4"; }
+    [[nodiscard]] bool HasWidth() const;
+    /// Whether anything differs from the usual lead sheet.
+    [[nodiscard]] bool HasLayout() const;
+
     std::string mPicture = "sheet";
     std::string mPage = "endless";
     std::string mTheme = "auto";
