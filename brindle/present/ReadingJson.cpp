@@ -3,6 +3,7 @@
 
 #include "brindle/present/JsonValues.h"
 #include "brindle/present/internal/ReadingBars.h"
+#include "brindle/present/internal/ReadingNotes.h"
 
 namespace brindle {
 namespace {
@@ -20,6 +21,12 @@ void WriteServed(CJsonWriter& json, const CServedDegree& served) {
     }
     json.BeginObject().Key("Degree").String(served.Name());
     json.Key("Semitones").Integer(served.mSemitones).EndObject();
+}
+
+void WriteNotes(CJsonWriter& json, const CReadSong& song) {
+    json.Key("Notes").BeginArray();
+    for (const std::string& note : KeyContradictions(song.mSong, song.mReading)) json.String(note);
+    json.EndArray();
 }
 
 void WriteRegions(CJsonWriter& json, const CSongReading& reading) {
@@ -58,6 +65,7 @@ void WriteReading(CJsonWriter& json, const CReadSong& song) {
     json.Key("Reading").BeginObject();
     WriteSignKey(json.Key("SignKey"), song.mReading.mKey);
     json.Key("Confidence").Number(song.mReading.mConfidence);
+    WriteNotes(json, song);
     WriteRegions(json, song.mReading);
     json.Key("Chords").BeginArray();
     for (std::size_t ix = 0; ix < ChordCountOf(song.mSong); ++ix) WriteChord(json, song, ix);
