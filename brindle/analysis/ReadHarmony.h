@@ -135,8 +135,8 @@ struct CSongReading {
                                        const CReadingOptions& options = {});
 
 /// The same reading with its numerals written by other options, see NumeralInStyle: what a chord is
-/// applied to stays as it was read. The default options change nothing. `chords` are those of the
-/// reading.
+/// applied to stays as it was read. The default options change nothing, and printed signs alone
+/// change nothing but the signs. `chords` are those of the reading.
 [[nodiscard]] CSongReading WithNumerals(CSongReading reading, const CHarmAnlsChords& chords,
                                         const CNumeralOptions& options);
 

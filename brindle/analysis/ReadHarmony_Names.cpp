@@ -14,13 +14,37 @@ std::string CServedDegree::Name() const {
     return name;
 }
 
+namespace {
+
+// viih7 and io7 as viiÃ¸7 and iÂ°7; no sign stands but behind a small degree.
+std::string InPrintedSigns(std::string_view numeral) {
+    std::string printed;
+    char before = 0;
+    for (const char c : numeral) {
+        const bool isSign = before == 'i' || before == 'v';
+        if (isSign && c == 'h') {
+            printed += "\xC3\xB8";
+        } else if (isSign && c == 'o') {
+            printed += "\xC2\xB0";
+        } else {
+            printed += c;
+        }
+        before = c;
+    }
+    return printed;
+}
+
+}  // namespace
+
 CSongReading WithNumerals(CSongReading reading, const CHarmAnlsChords& chords,
                           const CNumeralOptions& options) {
     if (options == CNumeralOptions{}) return reading;
     const std::size_t count = std::min(chords.size(), reading.mChords.size());
     for (std::size_t ix = 0; ix < count; ++ix) {
         CChordReading& chord = reading.mChords[ix];
-        chord.mNumeral = NumeralInStyle(chord.mNumeral, chords[ix], chord.mKey, options);
+        chord.mNumeral = options == CNumeralOptions{.mPrintedSigns = true}
+                             ? InPrintedSigns(chord.mNumeral)
+                             : NumeralInStyle(chord.mNumeral, chords[ix], chord.mKey, options);
     }
     return reading;
 }

@@ -274,7 +274,6 @@ TEST_CASE("A seventh chord written with an augmented sixth is a German sixth, al
 
 constexpr auto kStyles = std::to_array<CNumeralOptions>({
     {.mFigures = true},
-    {.mPrintedSigns = true},
     {.mByKey = true},
     {.mFigures = true, .mByKey = true},
 });
@@ -284,14 +283,23 @@ TEST_CASE("Other signs for numerals do not change what was read") {
         const char* mSong;
         const char* mFigures;
         const char* mByKey;
+        const char* mPrintedSigns;
     };
     const CRow rows[] = {
         {"C7 | F7 | C7 | C7 | F7 | F7 | C7 | C7 | G7 | F7 | C7 | G7",
          "I7 IV7 I7 I7 IV7 IV7 I7 I7 V7 IV7 I7 V7",
-         "Id7 IVd7 Id7 Id7 IVd7 IVd7 Id7 Id7 V7 IVd7 Id7 V7"},
-        {"Dm7 | Db7 | Cmaj7", "ii7 subV7/I I^7", "ii7 subV7/I I^7"},
-        {"C | A7/C# | Dm | G7/B | C", "I V65/ii ii V65 I", "I V7/ii/^#1 ii V7/^7 I"},
-        {"C | Ab7no5 | G | C", "I It6 V I", "I It6 V I"},
+         "Id7 IVd7 Id7 Id7 IVd7 IVd7 Id7 Id7 V7 IVd7 Id7 V7",
+         "I7 IV7 I7 I7 IV7 IV7 I7 I7 V7 IV7 I7 V7"},
+        {"Dm7 | Db7 | Cmaj7", "ii7 subV7/I I^7", "ii7 subV7/I I^7", "ii7 subV7/I I^7"},
+        {"C | A7/C# | Dm | G7/B | C", "I V65/ii ii V65 I", "I V7/ii/^#1 ii V7/^7 I",
+         "I V7/ii ii V7 I"},
+        {"C | Ab7no5 | G | C", "I It6 V I", "I It6 V I", "I It6 V I"},
+        {"C | F | C#o7/E | Dm | Em7b5 | A7b9 | Dm | G7 | Bo | C",
+         "I IV viio65/ii ii iih7/ii V7b9/ii ii V7 viio I",
+         "I IV viio7/ii/^3 ii iih7/ii V7b9/ii ii V7 viio I",
+         "I IV vii\xC2\xB0"
+         "7/ii ii ii\xC3\xB8"
+         "7/ii V7/ii ii V7 vii\xC2\xB0 I"},
     };
     for (const CRow& row : rows) {
         INFO(std::string(row.mSong));
@@ -305,6 +313,7 @@ TEST_CASE("Other signs for numerals do not change what was read") {
         };
         CHECK(numerals({.mFigures = true}) == row.mFigures);
         CHECK(numerals({.mByKey = true}) == row.mByKey);
+        CHECK(numerals({.mPrintedSigns = true}) == row.mPrintedSigns);
     }
 }
 
