@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/present/Explain.h"
 
-#include "brindle/analysis/internal/NumeralText.h"
 #include "brindle/platform/Localization.h"
 #include "brindle/present/CTable.h"
 #include "brindle/present/ShownText.h"
@@ -13,6 +12,7 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
 #include <string_view>
 
 namespace brindle {
@@ -86,10 +86,7 @@ TWay CChordToExplain::WayToServed() const {
     const bool isDominant =
         IsAtTarget(TChordRelation_Dominant) || IsAtTarget(TChordRelation_SubstituteDominant);
     if (IsTargetNext() && isDominant) return TWay_OfDominant;
-    const TKeyChordClass next = mAround.Class(Next());
-    const bool isMinorServed = mServed.mSignKeyType == TSignKeyType_Minor;
-    const bool hasOtherThird = next != TKeyChordClass_Open && IsSmallNumeral(next) != isMinorServed;
-    return hasOtherThird ? TWay_OtherThird : TWay_Followed;
+    return mAround.HasOtherThird(Next(), mServed) ? TWay_OtherThird : TWay_Followed;
 }
 
 TWay CChordToExplain::Way() const {
@@ -257,7 +254,9 @@ std::vector<std::string> Explain(const CSong& song, const CSongReading& reading)
 
 std::string ExplanationsText(const CSong& song, const std::vector<std::string>& sentences,
                              const CPaint& paint) {
-    if (sentences.empty()) return {};
+    const bool hasAny = std::any_of(sentences.begin(), sentences.end(),
+                                    [](const std::string& sentence) { return !sentence.empty(); });
+    if (!hasAny) return {};
     const CBars bars = BarsOfSong(song);
     CTable table({" bar", "what each chord does"});
     std::string_view before;

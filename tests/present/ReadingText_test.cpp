@@ -89,6 +89,12 @@ TEST_CASE("A tonic that comes behind other chords is not noted with its ii V") {
     CHECK(Has(Shown("C | Dm7 G7sus4 | G7 | C |"), "  bars 2 to 4: ii V I of C Major\n"));
 }
 
+TEST_CASE("A tonic with the other third is noted by its name") {
+    CHECK(Has(Shown("C | Dm7 G7 | Cm | F | G7 | C |"), "  bars 2 to 3: ii V of C Major, to Cm\n"));
+    CHECK(Has(Shown("Am | Bm7b5 E7 | Am | Bm7b5 E7 | A |"),
+              "  bars 4 to 5: ii V of A Minor, to A\n"));
+}
+
 TEST_CASE("Of seconds and dominants that lead to one tonic the last ones are noted") {
     const std::string shown = Shown("Gm7 C7 | Gm7 C7 | Gm7 C7 | F | Dm7 | Db7 C7 Db7 C7 | F |");
     CHECK(Has(shown, "  bars 3 to 4: ii V I of F Major\n"));

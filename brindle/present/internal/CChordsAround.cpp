@@ -2,6 +2,7 @@
 #include "brindle/present/internal/CChordsAround.h"
 
 #include "brindle/analysis/internal/NumeralDegree.h"
+#include "brindle/analysis/internal/NumeralText.h"
 #include "brindle/theory/KeyIntervals.h"
 
 #include <algorithm>
@@ -54,9 +55,10 @@ int CChordsAround::Bass(std::ptrdiff_t ix) const {
     return chord == nullptr ? kKeyNrUndef : chord->mBass;
 }
 
-TKeyChordClass CChordsAround::Class(std::ptrdiff_t ix) const {
+bool CChordsAround::HasOtherThird(std::ptrdiff_t ix, const CSignKeyLite& key) const {
     const CKeyChord* chord = ChordAt(ix);
-    return chord == nullptr ? TKeyChordClass_Open : chord->mClass;
+    if (chord == nullptr || chord->mClass == TKeyChordClass_Open) return false;
+    return IsSmallNumeral(chord->mClass) != (key.mSignKeyType == TSignKeyType_Minor);
 }
 
 TSixthChord CChordsAround::SixthChord(std::size_t ix) const {

@@ -42,8 +42,8 @@ public:
     /// Pitch classes; `kKeyNrUndef` for none.
     [[nodiscard]] int Root(std::ptrdiff_t ix) const;
     [[nodiscard]] int Bass(std::ptrdiff_t ix) const;
-    /// TKeyChordClass_Open for none.
-    [[nodiscard]] TKeyChordClass Class(std::ptrdiff_t ix) const;
+    /// Whether the third of a chord is not that of the tonic of a key: Cm for C major.
+    [[nodiscard]] bool HasOtherThird(std::ptrdiff_t ix, const CSignKeyLite& key) const;
     /// Which augmented sixth a chord of that relation is. By its tones, as numerals in another
     /// style do not tell it: b67.
     [[nodiscard]] TSixthChord SixthChord(std::size_t ix) const;

@@ -83,7 +83,7 @@ private:
         places.push_back(place);
     }
 
-    // ii V I, of which the I may be missing.
+    // ii V I, of which the I may be missing or have the other third.
     void NoteSecond(std::size_t ix) {
         const CChordReading& second = mReading.mChords[ix];
         const std::ptrdiff_t dominant = second.mResolvesTo;
@@ -98,11 +98,14 @@ private:
         const bool arrives = goal >= 0 && !IsDominant(At(goal)) &&
                              mAround.Root(goal) == FoldIntoOctave(key.mRootKeyEnh.mKeyNr) &&
                              IsOneCadence(dominant, goal);
-        if (arrives) {
+        const bool hasOtherThird = arrives && mAround.HasOtherThird(goal, key);
+        if (arrives) last = goal;
+        if (arrives && !hasOtherThird) {
             text += key.mSignKeyType == TSignKeyType_Minor ? " i" : " I";
-            last = goal;
         }
-        Note(text + " of " + key.NameLong(NamePrefs()), ix, static_cast<std::size_t>(last));
+        text += " of " + key.NameLong(NamePrefs());
+        if (hasOtherThird) text += ", to " + mAround.Symbol(goal);
+        Note(std::move(text), ix, static_cast<std::size_t>(last));
     }
 
     // Behind the other forms of the dominant: of G7sus4 in G7sus4 G7 C that is C.
