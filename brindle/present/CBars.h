@@ -23,7 +23,7 @@ public:
     /// The number of the bar, from 1; 0 and less before the first one.
     [[nodiscard]] long BarOf(double position) const {
         if (!mStarts.empty()) return StartsUpTo(position);
-        return std::lround(std::floor(position / mBeatsPerBar)) + 1;
+        return WholeBars(std::floor(position / mBeatsPerBar)) + 1;
     }
     /// 1 up to, not including, the length of a bar plus 1.
     [[nodiscard]] double BeatOf(double position) const {
@@ -38,10 +38,16 @@ public:
         if (!mStarts.empty()) {
             return std::lower_bound(mStarts.begin(), mStarts.end(), end) - mStarts.begin();
         }
-        return std::lround(std::ceil(end / mBeatsPerBar));
+        return WholeBars(std::ceil(end / mBeatsPerBar));
     }
 
 private:
+    // Far beyond all songs, so that numbers of bars can be added without overflow.
+    static long WholeBars(double bars) {
+        constexpr double most = 1e15;
+        return std::lround(std::fmin(std::fmax(bars, -most), most));
+    }
+
     [[nodiscard]] long StartsUpTo(double position) const {
         return std::upper_bound(mStarts.begin(), mStarts.end(), position) - mStarts.begin();
     }

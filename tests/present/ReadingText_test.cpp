@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/present/ReadingText.h"
 
+#include "brindle/present/CBars.h"
 #include "brindle/present/Explain.h"
 #include "brindle/present/ShownText.h"
 #include "brindle/song/ReadSong.h"
@@ -24,6 +25,16 @@ std::string Shown(std::string_view text, const CReadingTextOptions& options = {}
 
 bool Has(const std::string& text, std::string_view part) {
     return text.find(part) != text.npos;
+}
+
+TEST_CASE("Bars beyond all songs are counted without overflow") {
+    CSong song = ReadSong("C F G C");
+    song.mBeatsPerBar = 5e-324;
+    CHECK(Shown(song).find("I  ") != std::string::npos);
+    const CBars bars(song.mBeatsPerBar);
+    CHECK(bars.BarOf(1e9) > 1'000'000);
+    CHECK(bars.BarOf(-1e9) < -1'000'000);
+    CHECK(bars.LastBarBefore(1e9) == bars.BarOf(1e9) - 1);
 }
 
 TEST_CASE("A song stands four bars a line, chords over numerals, keys where they change") {
