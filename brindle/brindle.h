@@ -254,6 +254,7 @@
 #include "brindle/song/SheetTimes.h"
 #include "brindle/song/SongFingerings.h"
 #include "brindle/song/SongModelFile.h"
+#include "brindle/song/SongRequest.h"
 #include "brindle/song/SongStyles.h"
 #include "brindle/song/SongWishes.h"
 #include "brindle/song/SplitSongs.h"

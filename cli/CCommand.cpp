@@ -7,6 +7,7 @@
 
 #include <CLI/CLI.hpp>
 #include <algorithm>
+#include <cmath>
 #include <filesystem>
 #include <optional>
 #include <sstream>
@@ -212,6 +213,12 @@ COption& COption::InRange(std::uint64_t least, std::uint64_t most) {
 
 COption& COption::InRange(double least, double most) {
     mOption->check(CLI::Range(least, most));
+    // What is no number is neither below nor above.
+    mOption->check([](const std::string& text) {
+        double value = 0.0;
+        const bool isNumber = !CLI::detail::lexical_cast(text, value) || !std::isnan(value);
+        return isNumber ? std::string() : text + " is no number";
+    });
     return *this;
 }
 

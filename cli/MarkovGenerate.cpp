@@ -125,12 +125,12 @@ TStatus MarkovGenerate(const CGenerateOptions& options) {
         return Fail(TStatus::BadUsage, "options for songs have no effect with a plain model");
     }
     if (options.mModel.empty()) return Fail(TStatus::BadUsage, "--plain needs a model file");
-    if (const auto contradiction = Contradiction(options)) {
-        return Fail(TStatus::BadUsage, *contradiction);
-    }
     if (options.mMidi == "") return Fail(TStatus::BadUsage, "--midi needs the name of a file");
     auto model = ReadModel(options.mModel);
     if (!model) return TStatus::BadInput;
+    if (const auto contradiction = Contradiction(options)) {
+        return Fail(TStatus::BadUsage, *contradiction);
+    }
     SetSeed(*model, options.mSeed);
     model->SetSearchLimits({options.mAttempts, kMostSteps});
     const auto generateOptions = OptionsFor(*model, options);

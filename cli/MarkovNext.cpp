@@ -53,6 +53,7 @@ TStatus MarkovNext(const CNextOptions& options) {
     const auto model = ReadSongModelFile(options.mModel, options.mStyle);
     if (!model) return TStatus::BadInput;
     const CNextChords next = NextChords(*model, *chords, asked);
+    if (model->IsEmpty()) return Fail(TStatus::BadInput, "the model has learned nothing");
     if (next.mKey.IsUndef()) {
         return Fail(TStatus::BadUsage, "without a chord --key is needed");
     }
@@ -70,7 +71,8 @@ void AddMarkovNext(CCommand& markov) {
                       "Model file of songs (default: the built-in one)");
     command.AddOption("--style", "STYLE", options->mStyle, "Only from songs of this style");
     command.AddOption("--key", "KEY", options->mKey, "Key of the chords (default: found)");
-    command.AddOption("--top", "N", options->mCount, "Chords to show (default: 10)");
+    command.AddOption("--top", "N", options->mCount, "Chords to show (default: 10)")
+        .InRange(std::uint64_t{1}, std::uint64_t{1000});
     command.AddOption("--order", "N", options->mOrder, "Longest history, in chords (default: 5)")
         .InRange(std::uint64_t{1}, std::uint64_t{CSongModel::kLongestHistory});
     options->mReading.AddTo(command);

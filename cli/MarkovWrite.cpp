@@ -8,7 +8,8 @@
 #include "brindle/present/LeadSheetSvg.h"
 #include "brindle/present/WrittenSongText.h"
 #include "brindle/song/ReadSongHarmony.h"
-#include "brindle/song/WriteSong.h"
+#include "brindle/song/SongRequest.h"
+#include "brindle/song/SongStyles.h"
 
 #include <fmt/format.h>
 
@@ -17,97 +18,42 @@
 namespace brindle::cli {
 namespace {
 
-constexpr const char* kBluesForm = "blues";
-constexpr std::uint64_t kUsualBars = 32;
-constexpr std::uint64_t kBluesBars = 12;
 constexpr std::uint64_t kMostWrittenBars = 256;
 
-/// Puts the wishes of an option to the others. False if it cannot be read; then the error has been
-/// printed.
-bool TakeWishes(const char* option, CSongWishReading reading, CWriteSongOptions& options) {
-    if (!reading.mFault.empty()) {
-        Fail(TStatus::BadUsage, fmt::format("{}: {}", option, Printable(reading.mFault)));
-        return false;
-    }
-    for (CSongWish& wish : reading.mWishes) {
-        wish.mText = fmt::format("{} {}", option, Printable(wish.mText));
-        options.mWishes.push_back(std::move(wish));
-    }
-    return true;
-}
-
-bool TakeChords(const char* option, TSongWishKind kind, const std::string& typed,
-                CWriteSongOptions& options) {
-    const std::string text = FoldAccidentals(typed);
-    for (std::size_t at = 0; at < text.size();) {
-        const std::size_t end = std::min(text.find(';', at), text.size());
-        const std::string one = text.substr(at, end - at);
-        if (!TakeWishes(option, ReadChordsWish(kind, one, options.mKey), options)) return false;
-        at = end + 1;
-    }
-    return true;
-}
-
-bool TakeSheet(const CWriteOptions& written, CWriteSongOptions& options) {
-    if (written.mSheet.empty()) return true;
-    CSongWishReading sheet = ReadSheetWishes(FoldAccidentals(written.mSheet), options.mBeatsPerBar);
-    if (sheet.mBars > options.mBars && sheet.mFault.empty()) {
-        sheet.mFault =
-            fmt::format("{} bars are more than the {} of the song", sheet.mBars, options.mBars);
-    }
-    return TakeWishes("--sheet", std::move(sheet), options);
-}
-
-/// The bars that were asked for, or those of the sheet, or the usual ones.
-std::uint64_t BarsOf(const CWriteOptions& written, int beatsPerBar) {
-    if (written.mBars > 0) return written.mBars;
-    if (written.mForm == kBluesForm) return kBluesBars;
-    const CSongWishReading sheet = ReadSheetWishes(written.mSheet, beatsPerBar);
-    return sheet.mBars > 0 && written.mForm.empty() ? sheet.mBars : kUsualBars;
-}
-
-std::string FormOf(const CWriteOptions& written, std::uint64_t bars) {
-    if (written.mForm == kBluesForm) return {};
-    if (!written.mForm.empty() || !written.mSheet.empty()) return written.mForm;
-    return bars == kUsualBars ? "AABA" : "";
-}
-
-std::optional<CWriteSongOptions> WriteOptionsOf(const CWriteOptions& written,
-                                                const CWriteSettings& settings) {
-    CWriteSongOptions options;
+/// What was asked for. Nothing if it cannot be read; then the error has been printed.
+std::optional<CSongRequestReading> ReadRequest(const CWriteOptions& written,
+                                               const CWriteSettings& settings) {
     const auto key = ReadKeyOption(written.mKey);
     if (!key) return std::nullopt;
-    options.mKey = *key;
-    options.mBeatsPerBar = settings.mBeatsPerBar;
-    options.mBars = BarsOf(written, settings.mBeatsPerBar);
-    options.mForm = FormOf(written, options.mBars);
-    options.mMostQuotedBars = written.mMostQuoted;
-    options.mOrder = std::min<std::uint64_t>(settings.mOrder, CSongModel::kLongestHistory);
-    options.mSeed = settings.mSeed ? *settings.mSeed : RandomBits();
-    if (written.mForm == kBluesForm) {
-        if (options.mBars != kBluesBars) {
-            Fail(TStatus::BadUsage, "--form blues has 12 bars");
-            return std::nullopt;
-        }
-        for (CSongWish& wish : BluesWishes(*key, settings.mBeatsPerBar)) {
-            wish.mText = "--form blues: " + wish.mText;
-            options.mWishes.push_back(std::move(wish));
-        }
+    CSongRequestReading reading = ReadSongRequest(
+        {*key, written.mForm, written.mBars, settings.mBeatsPerBar, FoldAccidentals(written.mSheet),
+         FoldAccidentals(written.mBegins), FoldAccidentals(written.mEnds),
+         FoldAccidentals(written.mContains), FoldAccidentals(written.mNever)});
+    if (!reading.mFault.empty()) {
+        // Its parts are called as the options are.
+        Fail(TStatus::BadUsage, "--" + Printable(reading.mFault));
+        return std::nullopt;
     }
-    const bool isTaken = TakeSheet(written, options) &&
-                         TakeChords("--begins", TSongWish_Begin, written.mBegins, options) &&
-                         TakeChords("--ends", TSongWish_End, written.mEnds, options) &&
-                         TakeChords("--contains", TSongWish_Contains, written.mContains, options) &&
-                         TakeChords("--never", TSongWish_Never, written.mNever, options);
-    return isTaken ? std::optional(options) : std::nullopt;
+    reading.mOptions.mMostQuotedBars = written.mMostQuoted;
+    reading.mOptions.mOrder = std::min<std::uint64_t>(settings.mOrder, CSongModel::kLongestHistory);
+    reading.mOptions.mSeed = settings.mSeed ? *settings.mSeed : RandomBits();
+    return reading;
+}
+
+/// The model that was asked for, or the songs in it that suit the request.
+std::optional<CSongModel> ReadWriterModel(const CWriteOptions& written, const std::string& style) {
+    auto model = ReadSongModelFile(written.mModel, written.mStyle);
+    if (!model || !written.mStyle.empty() || style.empty()) return model;
+    auto ofStyle = ModelOfStyle(*model, style);
+    return ofStyle ? ofStyle : model;
 }
 
 std::string FaultText(const CWrittenSong& song) {
     if (song.mContradiction.empty()) return song.mFault;
-    return fmt::format("{}: {}",
+    return fmt::format("{}: --{}",
                        song.mContradiction.size() == 1 ? "this wish cannot be met"
                                                        : "these wishes cannot be met together",
-                       fmt::join(song.mContradiction, "; "));
+                       Printable(fmt::format("{}", fmt::join(song.mContradiction, "; --"))));
 }
 
 std::string SongText(const CWrittenSong& song, const CWriteOptions& written,
@@ -139,10 +85,14 @@ void CWriteOptions::AddTo(CCommand& command) {
         .InGroup(group);
     command.AddOption("--key", "KEY", mKey, "Key of the song (default: C major)").InGroup(group);
     command
-        .AddOption("--form", "FORM", mForm,
-                   "A letter for each part, such as AABA, or blues (default: AABA for 32 bars)")
+        .AddOption(
+            "--form", "FORM", mForm,
+            "A letter for each part, such as AABA, or blues, after songs of that style (default: "
+            "AABA for 32 bars)")
         .InGroup(group);
-    command.AddOption("--bars", "N", mBars, "Bars of the song (default: 32, those of --sheet)")
+    command
+        .AddOption("--bars", "N", mBars,
+                   "Bars of the song (default: 32, those of --sheet, 12 of a blues)")
         .InRange(std::uint64_t{1}, kMostWrittenBars)
         .InGroup(group);
     command
@@ -168,18 +118,18 @@ void CWriteOptions::AddTo(CCommand& command) {
 }
 
 TStatus MarkovWrite(const CWriteOptions& written, const CWriteSettings& settings) {
-    const auto options = WriteOptionsOf(written, settings);
-    if (!options) return TStatus::BadUsage;
-    const auto model = ReadSongModelFile(written.mModel, written.mStyle);
+    const auto request = ReadRequest(written, settings);
+    if (!request) return TStatus::BadUsage;
+    const auto model = ReadWriterModel(written, request->mStyle);
     if (!model) return TStatus::BadInput;
-    const CWrittenSong song = WriteSong(*model, *options);
+    const CWrittenSong song = WriteSong(*model, request->mOptions);
     if (!song.mFault.empty()) return Fail(TStatus::BadUsage, FaultText(song));
     if (settings.mMidi &&
         !WriteFileAtomically(*settings.mMidi,
                              MidiFileBytes(MidiPieceOfSong(song.mSong, settings.mTempo)))) {
         return FailToWrite(*settings.mMidi);
     }
-    return Print(SongText(song, written, *options, settings.mFormat));
+    return Print(SongText(song, written, request->mOptions, settings.mFormat));
 }
 
 }  // namespace brindle::cli

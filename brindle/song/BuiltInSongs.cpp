@@ -2,6 +2,7 @@
 #include "brindle/song/BuiltInSongs.h"
 
 #include "brindle/song/ReadSong.h"
+#include "brindle/song/SongStyles.h"
 #include "brindle/song/internal/BuiltInSongs_Table.h"
 #include "brindle/theory/ReadKeyText.h"
 
@@ -42,7 +43,8 @@ std::vector<std::string> BuiltInStyles() {
 CSongModel BuiltInSongModel(std::string_view style) {
     std::vector<CTaughtSong> songs;
     for (const CBuiltInSongRow& row : BuiltInSongRows()) {
-        if (style.empty() || style == row.mStyle) songs.push_back(TeachSong(BuiltInSong(row)));
+        if (style.empty() || IsSameStyle(style, row.mStyle))
+            songs.push_back(TeachSong(BuiltInSong(row)));
     }
     return CSongModel(std::move(songs));
 }

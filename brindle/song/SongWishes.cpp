@@ -209,26 +209,28 @@ CSongWishReading ReadChordsWish(TSongWishKind kind, std::string_view text,
     return reading;
 }
 
-std::vector<CSongWish> BluesWishes(const CSignKeyLite& key, int beatsPerBar) {
+std::vector<CSongWish> BluesWishes(const CSignKeyLite& key, int beatsPerBar, std::size_t choruses) {
     struct CBluesBar {
         std::size_t mBar;
         const char* mMajor;
         const char* mMinor;
     };
+    constexpr std::size_t chorus = 12;
     constexpr auto bars = std::to_array<CBluesBar>(
         {{0, "I", "i"}, {4, "IV", "iv"}, {6, "I", "i"}, {8, "V", "V"}, {10, "I", "i"}});
+    const bool isMinor = key.mSignKeyType == TSignKeyType_Minor;
     std::vector<CSongWish> wishes;
-    for (const CBluesBar& bar : bars) {
-        const bool isMinor = key.mSignKeyType == TSignKeyType_Minor;
-        const auto chord = WishedNumeral(isMinor ? bar.mMinor : bar.mMajor, key);
+    for (std::size_t ix = 0; ix < choruses * bars.size(); ++ix) {
+        const CBluesBar& row = bars[ix % bars.size()];
+        const char* const numeral = isMinor ? row.mMinor : row.mMajor;
+        const std::size_t bar = ix / bars.size() * chorus + row.mBar;
+        const auto chord = WishedNumeral(numeral, key);
         if (!chord) continue;
-        const std::size_t first = bar.mBar * static_cast<std::size_t>(beatsPerBar);
         wishes.push_back({TSongWish_Bars,
-                          fmt::format("a blues has {} in bar {}", isMinor ? bar.mMinor : bar.mMajor,
-                                      bar.mBar + 1),
+                          fmt::format("a blues has {} in bar {}", numeral, bar + 1),
                           {*chord},
                           {0},
-                          first});
+                          bar * static_cast<std::size_t>(beatsPerBar)});
     }
     return wishes;
 }

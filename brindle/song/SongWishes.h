@@ -67,7 +67,8 @@ struct CSongWishReading {
 [[nodiscard]] CSongWishReading ReadChordsWish(TSongWishKind kind, std::string_view text,
                                               const CSignKeyLite& key);
 
-/// The wishes of a blues of twelve bars: I, IV and V where every blues has them.
-[[nodiscard]] std::vector<CSongWish> BluesWishes(const CSignKeyLite& key, int beatsPerBar);
+/// The wishes of a blues, twelve bars a chorus: I, IV and V where every blues has them.
+[[nodiscard]] std::vector<CSongWish> BluesWishes(const CSignKeyLite& key, int beatsPerBar,
+                                                 std::size_t choruses = 1);
 
 }  // namespace brindle
