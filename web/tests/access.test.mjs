@@ -58,7 +58,7 @@ test("The sheet is walked, opened and left with the keyboard alone", async () =>
   assert.equal(await focused(), "2");
   await page.keyboard.press("Enter");
   await page.waitForSelector(".chord-panel");
-  assert.equal(await page.textContent(".sentence"), "C is the tonic of C major.");
+  assert.equal(await page.textContent(".sentence"), "C is the tonic of C major: I");
   await page.keyboard.press("Escape");
   await page.waitForSelector(".chord-panel", { state: "detached" });
   assert.equal(await focused(), "2");

@@ -39,7 +39,7 @@ export class Page {
   /** What went wrong without being asked for: errors, breaches of the policy, requests to others. */
   wrong = [];
 
-  static async open({ address, browser }, { hash = "", ...options } = {}) {
+  static async open({ address, browser }, { hash = "", without, ...options } = {}) {
     const context = await browser.newContext({ viewport: { width: 1280, height: 900 }, ...options });
     const opened = new Page();
     opened.context = context;
@@ -51,6 +51,7 @@ export class Page {
       const isOwn = request.url().startsWith(address) || /^(blob|data):/.test(request.url());
       if (!isOwn) opened.wrong.push(`asked ${request.url()}`);
     });
+    if (without) await context.route(without, (route) => route.abort());
     await opened.page.addInitScript(watch);
     await opened.page.goto(address + hash);
     await opened.page.waitForSelector("#song, .score-note");

@@ -69,7 +69,7 @@ for (const [form, text, symbols] of [
 onPage("A chord is explained, on a piano and as fingerings", {}, async (opened, page) => {
   await opened.type("Am | E7 | Am | Am7", 4);
   await page.click("[data-chord='1']");
-  assert.equal(await page.textContent(".sentence"), "E7 is the dominant of A minor, which follows.");
+  assert.equal(await page.textContent(".sentence"), "E7 is the dominant of A minor, which follows: V7");
   assert.equal(await page.locator(".piano").getAttribute("aria-label"), "Piano: E, G\u266F, B, D");
   assert.equal(await page.locator(".piano .down").count(), 4);
   assert.ok((await page.locator(".grid").count()) >= 2);
@@ -86,11 +86,24 @@ onPage("What could come next is ranked, and one is inserted behind its chord", {
   assert.match(names[0], /^Insert C, I, tonic, \d+ %$/);
   const percents = names.map((name) => (name.includes("<") ? 0 : Number(/(\d+) %/.exec(name)[1])));
   assert.deepEqual(percents, [...percents].sort((a, b) => b - a));
+  assert.equal(await page.textContent(".next h3"), "What could come next, in C major");
+  // Figures are raised as on the sheet.
+  const raised = page.locator(".next-numeral .run", { hasText: /^7/ }).first();
+  assert.ok((await raised.evaluate((run) => parseFloat(getComputedStyle(run).verticalAlign))) > 0);
   await page.locator(".next button").first().click();
   await opened.shows(6);
   assert.deepEqual((await opened.symbols()).slice(0, 4), ["Dm7", "G7", "C", "C"]);
   await page.click(".undo");
   await opened.shows(5);
+});
+
+onPage("What could come next is told in the key of the passage, not in one that it hints at", {}, async (opened, page) => {
+  await opened.type("C | A7 | Dm | G7 | C", 5);
+  await page.click("[data-chord='1']");
+  assert.equal(await page.textContent(".sentence"), "A7 is the dominant of D minor, which follows: V7/ii");
+  await page.waitForSelector(".next button");
+  const told = await page.locator(".next button").evaluateAll((buttons) => buttons.map((button) => button.ariaLabel.split(", ").slice(0, 3)));
+  assert.deepEqual(told.find(([insert]) => insert === "Insert Dm"), ["Insert Dm", "ii", "subdominant"]);
 });
 
 for (const [names, symbols] of [

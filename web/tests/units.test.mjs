@@ -10,7 +10,7 @@ let units;
 before(async () => {
   const root = fileURLToPath(new URL("..", import.meta.url));
   vite = await createServer({ root, configFile: false, appType: "custom", logLevel: "error", server: { middlewareMode: true, hmr: false, ws: false }, optimizeDeps: { noDiscovery: true } });
-  const names = ["editor/faultMarks", "engine/insertChord", "player/midiNotes", "sheet/lines", "sheet/linkPaths", "song/files", "song/link", "song/save"];
+  const names = ["editor/faultMarks", "engine/Engine", "engine/insertChord", "engine/sentence", "player/midiNotes", "sheet/lines", "sheet/linkPaths", "song/files", "song/link", "song/save"];
   units = Object.assign({}, ...(await Promise.all(names.map((name) => vite.ssrLoadModule(`/src/${name}.ts`)))));
 });
 after(() => vite.close());
@@ -88,7 +88,7 @@ test("The notes of a MIDI file have the beats of their events", () => {
 /** A sheet of bars with one chord each, of that many letters. */
 function sheetOf(lengths, bars = {}) {
   const Chords = lengths.map((length) => ({ Runs: [["C".repeat(length), 1, 0]], NumeralRuns: [["I", 1, 0]] }));
-  const Bars = lengths.map((_, i) => ({ Begin: i, End: i + 1, Held: null, Sign: null, ...bars[i] }));
+  const Bars = lengths.map((_, i) => ({ Begin: i, End: i + 1, Held: null, Sign: null, Remark: "", ...bars[i] }));
   return { Chords, Bars };
 }
 
@@ -99,7 +99,9 @@ test("Bars stand in lines of four, two or one, and a line ends before a part", (
     ["two", plain.slice(0, 5), {}, 330, [2, 2, 1]],
     ["one", plain.slice(0, 3), {}, 200, [1, 1, 1]],
     ["a part", plain, { 3: { BeginsSection: true } }, 800, [3, 4, 3]],
-    ["a sign", plain.slice(0, 6), { 5: { Sign: "coda" } }, 800, [4, 1, 1]],
+    ["a coda", plain.slice(0, 6), { 5: { Sign: "coda" } }, 800, [4, 1, 1]],
+    ["a segno, which stands where it stands", plain.slice(0, 6), { 1: { Sign: "segno" } }, 800, [4, 2]],
+    ["a passage that is played again", plain.slice(0, 6), { 2: { Remark: "as bars 1 to 2" } }, 800, [2, 4]],
     ["an upbeat", plain.slice(0, 6), { 0: { IsUpbeat: true } }, 800, [5, 1]],
     ["a full line", [20, 20, 2, 2, 2], {}, 600, [1, 1, 2, 1]],
     ["a bar wider than all", [200, 2], {}, 600, [1, 1]],
@@ -113,8 +115,8 @@ test("Bars stand in lines of four, two or one, and a line ends before a part", (
 
 test("Arrows have a piece on each line, a head at the end, and room above shorter ones", () => {
   const lines = [0, 100, 200].map((top) => ({ left: 10, right: 510, top: top + 40, bottom: top + 90 }));
-  const place = (line, left) => ({ ...lines[line], line, left, right: left + 30 });
-  const places = [place(0, 20), place(0, 200), place(0, 400), place(2, 20)];
+  const place = (line, left) => ({ ...lines[line], line, left, right: left + 30, back: lines[line].right });
+  const places = [place(0, 20), place(0, 200), { ...place(0, 300), back: 390 }, place(2, 20)];
   const paths = units.arrowPaths(
     [{ From: 0, To: 1, IsDotted: false }, { From: 0, To: 2, IsDotted: true }, { From: 2, To: 3, IsDotted: false }, { From: 2, To: null, IsDotted: false }, { From: 0, To: 9, IsDotted: false }],
     places,
@@ -122,6 +124,10 @@ test("Arrows have a piece on each line, a head at the end, and room above shorte
   );
   assert.deepEqual(paths.map(({ hasHead }) => hasHead), [true, true, false, false, true, true]);
   assert.deepEqual(paths.map(({ isDotted }) => isDotted), [false, true, false, false, false, false]);
+  // The one that leads back ends at the repeat sign, not at the end of the line.
+  const endOf = ({ d }) => d.match(/[\d.]+(?= [\d.]+$)/)[0];
+  assert.deepEqual([...paths.slice(2, 3), ...paths.slice(4)].map(endOf), ["514", "28", "390"]);
+  assert.deepEqual(paths.map(({ line }) => line), [0, 0, 0, 1, 2, 0]);
   const heights = paths.slice(0, 2).map(({ d }) => Math.min(...d.match(/-?[\d.]+ -?[\d.]+/g).map((pair) => Number(pair.split(" ")[1]))));
   assert.ok(heights[1] < heights[0], `${heights}`);
   assert.ok(paths.every(({ d }) => !d.includes("NaN")));
@@ -133,6 +139,71 @@ test("A bracket goes from a second to the end of its dominant, over lines if nee
   const places = [place(0, 20), place(0, 200), place(1, 20)];
   const paths = units.bracketPaths([{ From: 0, To: 1, IsDotted: false }, { From: 1, To: 2, IsDotted: true }], places, lines);
   assert.deepEqual(paths.map(({ d }) => d), ["M20 53v6H230v-6", "M200 53v6H514", "M2 159H50v-6"]);
+});
+
+test("A sentence has the numeral where it tells it, or behind it, and printed signs", () => {
+  for (const [explanation, numeral, told] of [
+    ["E7 is the dominant of A minor, which follows.", "V7/vi", "E7 is the dominant of A minor, which follows: *"],
+    ["Fmaj7 is IV^7 in C major, with the function of a subdominant.", "IV^7", "Fmaj7 is * in C major, with the function of a subdominant."],
+    ["Bb7 is the backdoor dominant of C major.", "bVII7", "B\u266D7 is the backdoor dominant of C major: *"],
+    ["F#m7b5 is #ivh7 in Eb major, borrowed from Eb minor.", "#ivh7", "F\u266Fm7b5 is * in E\u266D major, borrowed from E\u266D minor."],
+    ["C is I in C major.", "", "C is I in C major."],
+    ["", "", ""],
+  ]) {
+    const { before, numeral: hasNumeral, after } = units.sentenceAround(explanation, numeral);
+    assert.equal(before + (hasNumeral ? "*" : "") + after, told);
+  }
+  for (const [text, printed] of [
+    ["Abm, Bbb, Dbmaj7/Ab", "A\u266Dm, B\u266D\u266D, D\u266Dmaj7/A\u266D"],
+    ["before Ebdim and Gbsus4", "before E\u266Ddim and G\u266Dsus4"],
+    ["Abbey, Bob, #1 and Cab", "Abbey, Bob, #1 and Cab"],
+    ["bVII and #iv", "\u266DVII and \u266Fiv"],
+  ]) {
+    assert.equal(units.printedNames(text), printed);
+  }
+});
+
+test("A worker that stops, is silent or does not load is replaced, and its calls are told why", async (context) => {
+  const workers = [];
+  class FakeWorker {
+    calls = [];
+    constructor() {
+      workers.push(this);
+    }
+    postMessage(call) {
+      this.calls.push(call);
+    }
+    terminate() {
+      this.isGone = true;
+    }
+  }
+  context.mock.timers.enable({ apis: ["setTimeout"] });
+  Object.assign(globalThis, { Worker: FakeWorker, window: globalThis });
+  const engine = new units.Engine();
+  const answer = (worker, value) => worker.onmessage({ data: { id: worker.calls.shift().id, ...value } });
+
+  const refused = engine.call("text", {});
+  answer(workers[0], { error: "no song" });
+  await assert.rejects(refused, { message: "no song" });
+  assert.equal(workers.length, 1, "a song that cannot be read is no reason for a new worker");
+
+  const both = [engine.call("text", {}), engine.call("notes", {})];
+  answer(workers[0], { error: "out of memory", isFatal: true });
+  for (const call of both) await assert.rejects(call, { message: "out of memory" });
+  assert.ok(workers[0].isGone);
+
+  const silent = engine.call("text", {});
+  context.mock.timers.tick(20_001);
+  await assert.rejects(silent, { message: "This takes too long." });
+  const unloaded = engine.call("text", {});
+  workers[2].onerror({ message: "" });
+  await assert.rejects(unloaded, { message: "the library did not load" });
+
+  const good = engine.call("text", {});
+  answer(workers[3], { value: "C" });
+  assert.equal(await good, "C");
+  context.mock.timers.tick(60_000);
+  assert.ok(!workers[3].isGone, "an answered call waits no more");
 });
 
 test("A file is a score or a text by what it holds, and is refused if neither", async () => {

@@ -1,6 +1,6 @@
 import { useEffect, useState } from "preact/hooks";
-import type { ChordDetail, NextChord, SheetChord } from "../engine/Types";
-import { Runs } from "../sheet/Runs";
+import type { ChordDetail, NextChords as Next, Sentence, SheetChord } from "../engine/Types";
+import { Runs, Signs } from "../sheet/Runs";
 import { GridView } from "./GridView";
 import { NextChords } from "./NextChords";
 import { Piano } from "./Piano";
@@ -8,39 +8,45 @@ import { Piano } from "./Piano";
 interface ChordPanelProps {
   chord: SheetChord;
   index: number;
-  sentence: string;
+  sentence: Sentence | undefined;
   loadDetail(chord: number): Promise<ChordDetail>;
-  loadNext(chord: number): Promise<NextChord[]>;
+  loadNext(chord: number): Promise<Next>;
   onHear(notes: number[]): void;
   onPlayFrom(position: number): void;
   onInsert(symbol: string): void;
   onClose(): void;
 }
 
-/** What a promise gives, once it does; nothing while another one is awaited. */
-function useLoaded<Value>(load: () => Promise<Value>, inputs: unknown[]): Value | null {
-  const [value, setValue] = useState<Value | null>(null);
+/** What a promise gives, once it does, or why it does not; nothing while another one is awaited. */
+function useLoaded<Value>(load: () => Promise<Value>, inputs: unknown[]): { value: Value | null; error: string } {
+  const [state, setState] = useState<{ value: Value | null; error: string }>({ value: null, error: "" });
   useEffect(() => {
     let isWanted = true;
-    setValue(null);
-    load().then((loaded) => isWanted && setValue(loaded), () => undefined);
+    const tell = (value: Value | null, error = "") => isWanted && setState({ value, error });
+    tell(null);
+    load().then((value) => tell(value), (error: Error) => tell(null, error.message));
     return () => {
       isWanted = false;
     };
   }, inputs);
-  return value;
+  return state;
 }
 
 /** What a chord is: a sentence, its notes on a piano, its fingerings, and what could follow. */
 export function ChordPanel(props: ChordPanelProps) {
   const { chord, index, sentence } = props;
-  const detail = useLoaded(() => props.loadDetail(index), [chord, index]);
-  const next = useLoaded(() => props.loadNext(index), [chord, index]);
+  const { value: detail, error } = useLoaded(() => props.loadDetail(index), [chord, index]);
+  const { value: next, error: nextError } = useLoaded(() => props.loadNext(index), [chord, index]);
   return (
     <aside class="chord-panel" aria-label={`Chord ${chord.Symbol}`}>
       <button type="button" class="close" aria-label="Close" onClick={props.onClose}>×</button>
       <h2 class="symbol"><Runs runs={chord.Runs} /></h2>
-      <p class="sentence" role="status">{sentence}</p>
+      <p class="sentence" role="status">
+        {sentence && <Signs text={sentence.before} />}
+        {sentence?.numeral && <span class="numeral"><Runs runs={chord.NumeralRuns} /></span>}
+        {sentence && <Signs text={sentence.after} />}
+      </p>
+      {(error || nextError) && <p class="message" role="alert">{error || nextError}</p>}
       {detail && detail.notes.length > 0 && (
         <>
           <Piano notes={detail.notes} />
@@ -56,7 +62,7 @@ export function ChordPanel(props: ChordPanelProps) {
           <div class="grids">{detail.grids.map((grid, i) => <GridView key={i} grid={grid} />)}</div>
         </section>
       )}
-      {next && next.length > 0 && <NextChords chords={next} onInsert={props.onInsert} />}
+      {next && next.chords.length > 0 && <NextChords next={next} onInsert={props.onInsert} />}
     </aside>
   );
 }

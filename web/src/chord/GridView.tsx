@@ -3,7 +3,7 @@ import type { Grid } from "../engine/Types";
 const step = 13;
 const fretHeight = 16;
 const top = 24;
-const left = 18;
+const left = 22;
 
 /** The frets that are drawn: from the nut if the fingering allows it. */
 function windowOf(frets: (number | null)[]): { first: number; count: number } {
@@ -34,7 +34,7 @@ export function GridView({ grid }: { grid: Grid }) {
       {Array.from({ length: count + 1 }, (_, fret) => (
         <line key={fret} class={fret === 0 && first === 1 ? "nut" : undefined} x1={left} x2={right} y1={top + fret * fretHeight} y2={top + fret * fretHeight} />
       ))}
-      {first > 1 && <text class="fret" x={left - 6} y={y(first) + 4} text-anchor="end">{first}</text>}
+      {first > 1 && <text class="fret" x={left - 9} y={y(first) + 4} text-anchor="end">{first}</text>}
       {grid.Frets.map((fret, string) =>
         fret === null ? (
           <path key={string} class="muted" d={`M${x(string) - 3} ${top - 10}l6 6m0-6l-6 6`} />

@@ -4,6 +4,8 @@ const blacks: [semitone: number, place: number][] = [[1, 1], [3, 2], [6, 4], [8,
 const keyWidth = 22;
 const height = 92;
 const blackHeight = 56;
+/** Above the keys, for the names of the black ones, which are too narrow for theirs. */
+const nameHeight = 17;
 
 interface PianoProps {
   notes: { Name: string; NoteNr: number }[];
@@ -19,7 +21,7 @@ export function Piano({ notes }: PianoProps) {
   const width = octaves * 7 * keyWidth;
   const each = Array.from({ length: octaves }, (_, octave) => octave);
   return (
-    <svg class="piano" viewBox={`-1 -1 ${width + 2} ${height + 2}`} role="img" aria-label={`Piano: ${notes.map(({ Name }) => Name).join(", ")}`}>
+    <svg class="piano" viewBox={`-1 ${-nameHeight} ${width + 2} ${height + nameHeight + 1}`} role="img" aria-label={`Piano: ${notes.map(({ Name }) => Name).join(", ")}`}>
       {each.flatMap((octave) =>
         whites.map((semitone, i) => (
           <Key key={`${octave}-${semitone}`} name={names.get((first + octave) * 12 + semitone)} x={(octave * 7 + i) * keyWidth} width={keyWidth} height={height} kind="white" />
@@ -47,7 +49,7 @@ function Key({ name, x, width, height, kind }: KeyProps) {
     <g class={`${kind}-key${name ? " down" : ""}`}>
       <rect x={x} y="0" width={width} height={height} rx="2" />
       {name && (
-        <text x={x + width / 2} y={height - 8} text-anchor="middle">
+        <text x={x + width / 2} y={kind === "white" ? height - 8 : -5} text-anchor="middle">
           {name}
         </text>
       )}

@@ -90,8 +90,15 @@ export interface Fault {
 export interface Reading {
   sheet: Sheet | null;
   faults: Fault[];
-  /** Of each chord what it does, as a sentence. */
-  sentences: string[];
+  /** Of each chord what it does. */
+  sentences: Sentence[];
+}
+
+/** A sentence with the numeral of its chord at its place. */
+export interface Sentence {
+  before: string;
+  numeral: boolean;
+  after: string;
 }
 
 export interface Note {
@@ -116,9 +123,18 @@ export interface ChordDetail {
 
 export interface NextChord {
   Symbol: string;
+  /** As a publisher sets the symbol and the numeral. */
+  Runs: Run[];
+  NumeralRuns: Run[];
   Probability: number;
   Numeral: string;
   Function: string;
+}
+
+/** What may come, and the key in which its numerals are. */
+export interface NextChords {
+  key: string;
+  chords: NextChord[];
 }
 
 export type Export = "svg" | "midi" | "json" | "chordpro";
@@ -127,7 +143,7 @@ export type Export = "svg" | "midi" | "json" | "chordpro";
 export interface Calls {
   read(source: Source, names: Names): Promise<Reading>;
   detail(source: Source, chord: number): Promise<ChordDetail>;
-  next(source: Source, chord: number): Promise<NextChord[]>;
+  next(source: Source, chord: number): Promise<NextChords>;
   notes(source: Source): Promise<Note[]>;
   transpose(source: Source, semitones: number): Promise<string>;
   insert(source: Source, chord: number, symbol: string): Promise<string>;

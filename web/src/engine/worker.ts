@@ -1,9 +1,10 @@
 // The library at work, beside the page. All music comes from it.
 
-import { load, SongError, type Analysis, type Brindle, type ChordNaming, type Song } from "brindle";
+import { load, SongError, type Analysis, type Brindle, type ChordNaming, type Key, type Song } from "brindle";
 import wasm from "brindle/brindle.wasm?url";
 import { midiNotes } from "../player/midiNotes";
 import { insertChord } from "./insertChord";
+import { printedNames, sentenceAround } from "./sentence";
 import type { Answer, Call, Calls, ChordDetail, Export, Grid, Names, Sheet, Source } from "./Types";
 
 /** The key below the lowest note that a chord is shown with: the B below the C under middle C. */
@@ -19,8 +20,12 @@ function isSame(a: Source, b: Source): boolean {
   return a.bytes.length === b.bytes.length && a.bytes.every((byte, i) => byte === b.bytes[i]);
 }
 
+/** The library; where it could not be fetched, the next call tries again. */
 async function brindle(): Promise<Brindle> {
-  library ??= load({ wasm: new URL(wasm, self.location.href) });
+  library ??= load({ wasm: new URL(wasm, self.location.href) }).catch((error: Error) => {
+    library = null;
+    throw new Error(`The library could not be loaded: ${error.message}. Reload the page to try again.`);
+  });
   return library;
 }
 
@@ -36,13 +41,13 @@ async function readSong(source: Source): Promise<{ song: Song; analysis: Analysi
   return kept;
 }
 
-function namingOf(names: Names): { naming?: ChordNaming } {
-  return names === "typed" ? {} : { naming: names };
+/** "E\u266D major" */
+function keyName(key: Key): string {
+  return `${printedNames(key.tonic.name)} ${key.mode}`;
 }
 
-/** "G#" with the sign that is printed. */
-function printed(name: string): string {
-  return name.charAt(0) + name.slice(1).replaceAll("#", "\u266F").replaceAll("b", "\u266D");
+function namingOf(names: Names): { naming?: ChordNaming } {
+  return names === "typed" ? {} : { naming: names };
 }
 
 /** Tones one above the other, the bass lowest, as a hand could play them. */
@@ -50,7 +55,7 @@ function stacked(tones: { pitchClass: number; name: string }[]): ChordDetail["no
   let last = belowPiano;
   return tones.map(({ pitchClass, name }) => {
     last += ((pitchClass - last - 1 + 144) % 12) + 1;
-    return { Name: printed(name), NoteNr: last };
+    return { Name: printedNames(name), NoteNr: last };
   });
 }
 
@@ -59,7 +64,8 @@ const calls: Calls = {
     try {
       const { song, analysis } = await readSong(source);
       const sheet = analysis.sheet(namingOf(names)) as unknown as Sheet;
-      return { sheet, faults: song.faults, sentences: analysis.chords.map(({ explanation }) => explanation) };
+      const sentences = analysis.chords.map(({ explanation, numeral }) => sentenceAround(explanation, numeral));
+      return { sheet, faults: song.faults, sentences };
     } catch (error) {
       if (error instanceof SongError && error.faults.length > 0) return { sheet: null, faults: error.faults, sentences: [] };
       throw error;
@@ -81,11 +87,18 @@ const calls: Calls = {
   async next(source, chord) {
     const { song, analysis } = await readSong(source);
     const before = song.chords.slice(0, chord + 1).map(({ chord }) => chord);
+    const library = await brindle();
     const key = analysis.chords[chord]?.key?.name;
-    const found = (await brindle()).next(before, { count: mostNext, ...(key ? { key } : {}) });
-    return found.chords.map(({ symbol, probability, numeral, function: does }) => ({
-      Symbol: symbol, Probability: probability, Numeral: numeral, Function: does,
+    const found = library.next(before, { count: mostNext, ...(key ? { key } : {}) });
+    const chords = found.chords.map(({ symbol, probability, numeral, function: does }) => ({
+      Symbol: symbol,
+      Runs: library.typeset(symbol),
+      Probability: probability,
+      Numeral: numeral,
+      NumeralRuns: library.typeset(numeral, "numeral"),
+      Function: does,
     }));
+    return { key: found.key === null ? "" : keyName(found.key), chords };
   },
 
   async notes(source) {
@@ -129,6 +142,12 @@ const calls: Calls = {
   },
 };
 
+/** What went wrong, in words for people. Behind a trap of WebAssembly the library is of no more use. */
+function failure(id: number, error: Error): Answer {
+  if (!(error instanceof WebAssembly.RuntimeError || error instanceof RangeError)) return { id, error: error.message };
+  return { id, error: `This song is too much for the library (${error.message}).`, isFatal: true };
+}
+
 self.onmessage = async ({ data }: MessageEvent<Call>) => {
   const { id, name, args } = data;
   let answer: Answer;
@@ -136,7 +155,7 @@ self.onmessage = async ({ data }: MessageEvent<Call>) => {
     const call = calls[name] as (...args: unknown[]) => Promise<unknown>;
     answer = { id, value: await call(...args) };
   } catch (error) {
-    answer = { id, error: (error as Error).message, isFatal: error instanceof WebAssembly.RuntimeError };
+    answer = failure(id, error as Error);
   }
   self.postMessage(answer);
 };

@@ -118,7 +118,7 @@ export function App() {
           <ChordPanel
             chord={chord}
             index={selected}
-            sentence={reading?.sentences[selected] ?? ""}
+            sentence={reading?.sentences[selected]}
             loadDetail={(index) => song.engine.call("detail", song.source, index)}
             loadNext={(index) => song.engine.call("next", song.source, index)}
             onHear={(notes) => void player.hear(notes)}

@@ -1,4 +1,5 @@
 import type { Sheet, SheetBar } from "../engine/Types";
+import { writtenChords } from "./lines";
 import { Runs, Signs } from "./Runs";
 
 /** What the bars of a sheet share. */
@@ -33,16 +34,16 @@ function spoken(sheet: Sheet, bar: SheetBar, index: number): string {
   return `Bar ${bar.Number}: ${chord.Symbol}${numeral}`;
 }
 
-function Chord({ state, bar, index, isHeld }: ChordProps) {
-  const { sheet } = state;
+function Chord({ state, bar, index, end, length, isHeld }: ChordProps) {
+  const { sheet, soundingChord } = state;
   const chord = sheet.Chords[index]!;
-  const isSounding = state.soundingChord === index;
+  const isSounding = soundingChord !== null && soundingChord >= index && soundingChord < end;
   return (
     <button
       type="button"
       class={`chord${isHeld ? " held" : ""}${isSounding ? " sounds" : ""}`}
       data-chord={isHeld ? undefined : index}
-      style={{ flexGrow: Math.max(0.01, chordLength(sheet, bar, index, isHeld)), ...keyColors(sheet, chord.Key) }}
+      style={{ flexGrow: Math.max(0.01, length), ...keyColors(sheet, chord.Key) }}
       tabIndex={!isHeld && state.entry === index ? 0 : -1}
       aria-pressed={state.selected === index}
       aria-label={spoken(sheet, bar, index)}
@@ -62,15 +63,11 @@ interface ChordProps {
   state: SheetState;
   bar: SheetBar;
   index: number;
+  /** Behind the last of the equal chords that it is written for. */
+  end: number;
+  /** In beats, up to the next chord of the bar or its end. */
+  length: number;
   isHeld: boolean;
-}
-
-/** In beats, up to the next chord of the bar or its end. */
-function chordLength(sheet: Sheet, bar: SheetBar, index: number, isHeld: boolean): number {
-  const from = isHeld ? bar.Position : sheet.Chords[index]!.Position;
-  const next = isHeld ? bar.Begin : index + 1;
-  const to = next < bar.End ? sheet.Chords[next]!.Position : bar.Position + bar.Length;
-  return to - from;
 }
 
 /** Above the chords of a bar: its part, ending and signs, and the key that begins. */
@@ -113,42 +110,53 @@ function barClass(state: SheetState, index: number, isLast: boolean): string {
   return classes.join(" ");
 }
 
-function Rest({ bar, sheet }: { bar: SheetBar; sheet: Sheet }) {
+/** Where no chord begins: the one before goes on, for so many beats. */
+function Rest({ bar, sheet, length }: { bar: SheetBar; sheet: Sheet; length: number }) {
   const before = bar.Begin > 0 ? sheet.Chords[bar.Begin - 1]! : null;
   return (
-    <span class="rest" style={keyColors(sheet, before?.Key ?? null)}>
+    <span class="rest" style={{ flexGrow: Math.max(0.01, length), ...keyColors(sheet, before?.Key ?? null) }}>
       <span class="unseen">{before ? `${before.Symbol} goes on` : "no chord"}</span>
       {bar.BarCount > 1 && <span class="rest-count">{bar.BarCount}</span>}
     </span>
   );
 }
 
+/** The beats of a bar before anything is written in it. */
+function lateness(sheet: Sheet, bar: SheetBar): number {
+  if (bar.Held !== null) return 0;
+  return bar.Begin < bar.End ? sheet.Chords[bar.Begin]!.Position - bar.Position : bar.Length;
+}
+
 /** A bar of the sheet. */
 export function Bar({ state, index, isFirstOfLine }: { state: SheetState; index: number; isFirstOfLine: boolean }) {
   const { sheet } = state;
   const bar = sheet.Bars[index]!;
-  const chords = Array.from({ length: bar.End - bar.Begin }, (_, i) => bar.Begin + i);
+  const chords = writtenChords(sheet, bar);
+  const positionOf = (chord: number) => (chord < bar.End ? sheet.Chords[chord]!.Position : bar.Position + bar.Length);
   const isLast = index === sheet.Bars.length - 1;
+  const late = lateness(sheet, bar);
+  const firstKey = sheet.Chords[bar.Held ?? (late > 0.01 ? bar.Begin - 1 : bar.Begin)]?.Key ?? null;
   return (
     <li class={barClass(state, index, isLast)} aria-current={state.soundingBar === index ? "true" : undefined}>
       <Above state={state} bar={bar} />
+      {isFirstOfLine && <span class="bar-number" aria-hidden="true">{bar.Number}</span>}
       <div class="chords">
-        {isFirstOfLine && <span class="bar-number" aria-hidden="true">{bar.Number}</span>}
-        {bar.Time && <Time time={bar.Time} />}
-        {bar.Held !== null && <Chord state={state} bar={bar} index={bar.Held} isHeld={true} />}
-        {chords.map((chord) => (
-          <Chord key={chord} state={state} bar={bar} index={chord} isHeld={false} />
-        ))}
-        {chords.length === 0 && bar.Held === null && <Rest bar={bar} sheet={sheet} />}
+        {bar.Time && <Time time={bar.Time} colors={keyColors(sheet, firstKey)} />}
+        {late > 0.01 && <Rest bar={bar} sheet={sheet} length={late} />}
+        {bar.Held !== null && <Chord state={state} bar={bar} index={bar.Held} end={bar.Held + 1} length={positionOf(bar.Begin) - bar.Position} isHeld={true} />}
+        {chords.map((chord, i) => {
+          const end = chords[i + 1] ?? bar.End;
+          return <Chord key={chord} state={state} bar={bar} index={chord} end={end} length={positionOf(end) - positionOf(chord)} isHeld={false} />;
+        })}
       </div>
     </li>
   );
 }
 
-function Time({ time }: { time: string }) {
+function Time({ time, colors }: { time: string; colors: Record<string, string> }) {
   const [above, below] = time.split("/");
   return (
-    <span class="time" role="img" aria-label={`${time} time`}>
+    <span class="time" style={colors} role="img" aria-label={`${time} time`}>
       <span aria-hidden="true">{above}</span>
       <span aria-hidden="true">{below}</span>
     </span>

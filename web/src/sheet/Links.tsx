@@ -5,9 +5,9 @@ import type { Line } from "./lines";
 import { arrowPaths, bracketPaths, type LinePlace, type LinkPath, type Place } from "./linkPaths";
 
 /** Measures where the chords and lines of a sheet stand. */
-function measure(root: HTMLElement, count: number): [(Place | null)[], LinePlace[]] {
+function measure(root: HTMLElement, sheet: Sheet): [(Place | null)[], LinePlace[]] {
   const origin = root.getBoundingClientRect();
-  const places: (Place | null)[] = new Array(count).fill(null);
+  const places: (Place | null)[] = new Array(sheet.Chords.length).fill(null);
   const lines = Array.from(root.querySelectorAll<HTMLElement>(".line"), (line, number) => {
     const bands = line.querySelectorAll<HTMLElement>(".chords");
     const first = bands[0]!.getBoundingClientRect();
@@ -18,18 +18,41 @@ function measure(root: HTMLElement, count: number): [(Place | null)[], LinePlace
       top: first.top - origin.top,
       bottom: Math.max(first.bottom, last.bottom) - origin.top,
     };
-    for (const chord of line.querySelectorAll<HTMLElement>("[data-chord]")) {
-      const symbol = chord.querySelector(".symbol")!.getBoundingClientRect();
-      places[Number(chord.dataset.chord)] = {
-        ...place,
-        line: number,
-        left: symbol.left - origin.left,
-        right: symbol.right - origin.left,
-      };
+    let back = place.right;
+    // From the end, so that each chord knows the next repeat sign of its line.
+    for (const bar of [...line.children].reverse()) {
+      if (bar.classList.contains("ends-repeat")) back = bar.getBoundingClientRect().right - origin.left - 6;
+      for (const chord of bar.querySelectorAll<HTMLElement>("[data-chord]")) {
+        const symbol = chord.querySelector(".symbol")!.getBoundingClientRect();
+        const [left, right] = [symbol.left - origin.left, symbol.right - origin.left];
+        places[Number(chord.dataset.chord)] = { ...place, line: number, left, right, back };
+      }
     }
     return place;
   });
+  fillPlaces(sheet, places);
   return [places, lines];
+}
+
+/** A chord that is not written has the place of the one before, which goes on. */
+function fillPlaces(sheet: Sheet, places: (Place | null)[]): void {
+  for (const bar of sheet.Bars) {
+    for (let chord = bar.Begin + 1; chord < bar.End; ++chord) places[chord] ??= places[chord - 1]!;
+  }
+}
+
+/** Makes room for the arrows of each line; tells whether that moved anything. */
+function lift(root: HTMLElement, arrows: LinkPath[]): boolean {
+  const levels: number[] = [];
+  for (const { line, level } of arrows) levels[line] = Math.max(levels[line] ?? 0, level);
+  let isMoved = false;
+  root.querySelectorAll<HTMLElement>(".line").forEach((line, number) => {
+    const wanted = `${levels[number] ?? 0}`;
+    if (line.style.getPropertyValue("--levels") === wanted) return;
+    line.style.setProperty("--levels", wanted);
+    isMoved = true;
+  });
+  return isMoved;
 }
 
 /** The arrows and brackets of a sheet, drawn over its lines once these are laid out. */
@@ -39,7 +62,11 @@ export function Links({ sheet, lines, root }: { sheet: Sheet; lines: Line[]; roo
   useLayoutEffect(() => {
     const draw = () => {
       if (!root.current) return;
-      const [places, linePlaces] = measure(root.current, sheet.Chords.length);
+      let [places, linePlaces] = measure(root.current, sheet);
+      // Room is made up and down, so that the levels stay as they are.
+      if (lift(root.current, arrowPaths(sheet.Arrows, places, linePlaces))) {
+        [places, linePlaces] = measure(root.current, sheet);
+      }
       setArrows(arrowPaths(sheet.Arrows, places, linePlaces));
       setBrackets(bracketPaths(sheet.Brackets, places, linePlaces));
     };

@@ -1,10 +1,12 @@
 import type { Run } from "../engine/Types";
 
+const classes: Record<string, string> = { "\u266D": "flat", "\u00B0": "degree" };
+
 /** A text whose accidentals come from the music font, where they hang around a line of a staff. */
 export function Signs({ text }: { text: string }) {
   return (
     <>
-      {text.split(/([\u266D\u266F\u266E])/).map((part, i) => (i % 2 === 1 ? <span key={i} class={part === "\u266D" ? "flat" : "sharp"}>{part}</span> : part))}
+      {text.split(/([\u266D\u266F\u266E\u00B0])/).map((part, i) => (i % 2 === 1 ? <span key={i} class={classes[part] ?? "sharp"}>{part}</span> : part))}
     </>
   );
 }

@@ -1,8 +1,8 @@
-import { useEffect, useMemo, useRef, useState } from "preact/hooks";
+import { useEffect, useLayoutEffect, useMemo, useRef, useState } from "preact/hooks";
 import type { Sheet } from "../engine/Types";
 import { Bar, type SheetState } from "./Bar";
 import { Legend } from "./Legend";
-import { breakLines } from "./lines";
+import { breakLines, type Line } from "./lines";
 import { Links } from "./Links";
 import { Signs } from "./Runs";
 
@@ -17,8 +17,11 @@ interface SheetProps extends Omit<SheetState, "entry"> {
 function useWidth(): [(element: HTMLElement | null) => void, number] {
   const [element, setElement] = useState<HTMLElement | null>(null);
   const [width, setWidth] = useState(800);
-  useEffect(() => {
+  useLayoutEffect(() => {
     if (!element) return;
+    // At once, so that nothing is drawn wider than the screen before.
+    const { paddingLeft, paddingRight } = getComputedStyle(element);
+    setWidth(element.clientWidth - parseFloat(paddingLeft) - parseFloat(paddingRight));
     const observer = new ResizeObserver(([entry]) => setWidth(entry!.contentRect.width));
     observer.observe(element);
     return () => observer.disconnect();
@@ -81,7 +84,7 @@ export function SheetView(props: SheetProps) {
       <Head sheet={sheet} />
       <div class="music" ref={music} onKeyDown={(event) => (event.key === "Escape" ? props.onLeave() : moveFocus(event))}>
         {lines.map((line) => (
-          <ol key={line.bars[0]!.index} class={line.isTooFull ? "line too-full" : "line"} style={{ gridTemplateColumns: columnsOf(line.columns, line.bars[0]!.bar.IsUpbeat) }} start={line.bars[0]!.index + 1}>
+          <ol key={line.bars[0]!.index} class={line.isTooFull ? "line too-full" : "line"} style={{ gridTemplateColumns: columnsOf(line) }} start={line.bars[0]!.index + 1}>
             {line.bars.map(({ index }, i) => (
               <Bar key={index} state={state} index={index} isFirstOfLine={i === 0} />
             ))}
@@ -99,7 +102,9 @@ export function SheetView(props: SheetProps) {
   );
 }
 
-function columnsOf(columns: number, hasUpbeat: boolean): string {
+function columnsOf({ columns, bars, isTooFull }: Line): string {
+  if (isTooFull) return "minmax(0, 1fr)";
+  const hasUpbeat = bars[0]!.bar.IsUpbeat;
   const rest = `repeat(${hasUpbeat ? columns - 1 : columns}, minmax(max-content, 1fr))`;
   return hasUpbeat && columns > 1 ? `minmax(max-content, 0.4fr) ${rest}` : rest;
 }

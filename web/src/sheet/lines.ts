@@ -1,4 +1,4 @@
-import type { Run, Sheet, SheetBar } from "../engine/Types";
+import type { Run, Sheet, SheetBar, SheetChord } from "../engine/Types";
 
 /** A bar of a line, by its index in the sheet. */
 export interface LineBar {
@@ -30,8 +30,18 @@ function widthOf(runs: Run[], size: number): number {
   return runs.reduce((sum, [text, part]) => sum + text.length * part, 0) * size * 0.58;
 }
 
+function isSame(a: SheetChord, b: SheetChord): boolean {
+  return a.Symbol === b.Symbol && a.Numeral === b.Numeral;
+}
+
+/** The chords that are written in a bar, by their indices: equal neighbours once. */
+export function writtenChords(sheet: Sheet, bar: SheetBar): number[] {
+  const all = Array.from({ length: bar.End - bar.Begin }, (_, i) => bar.Begin + i);
+  return all.filter((chord, i) => i === 0 || !isSame(sheet.Chords[chord - 1]!, sheet.Chords[chord]!));
+}
+
 function barWidth(sheet: Sheet, bar: SheetBar, sizes: LineSizes): number {
-  const chords = sheet.Chords.slice(bar.Begin, bar.End);
+  const chords = writtenChords(sheet, bar).map((chord) => sheet.Chords[chord]!);
   if (bar.Held !== null && sheet.Chords[bar.Held]) chords.push(sheet.Chords[bar.Held]!);
   const signs = (bar.BeginsRepeat ? 14 : 0) + (bar.EndsRepeat ? 14 : 0) + (bar.Time ? 20 : 0);
   const texts = chords.map((chord) =>
@@ -47,8 +57,9 @@ function barsPerLine(width: number): number {
   return bars;
 }
 
+/** A segno stands where it stands; the eye looks for a coda at the begin of a line. */
 function beginsLine(bar: SheetBar): boolean {
-  return bar.BeginsSection || bar.Sign !== null;
+  return bar.BeginsSection || bar.Remark !== "" || bar.Sign === "coda";
 }
 
 /** The bars in lines. A line ends before a part; one that is too full is halved. */

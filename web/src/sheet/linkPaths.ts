@@ -8,6 +8,8 @@ export interface Place {
   /** Of the symbol. */
   left: number;
   right: number;
+  /** Of the repeat sign behind it, or of its line. */
+  back: number;
   /** Of the band with the chords of its line. */
   top: number;
   bottom: number;
@@ -23,6 +25,9 @@ export interface LinePlace {
 
 /** A curve to be drawn; the last piece of an arrow has its head. */
 export interface LinkPath {
+  line: number;
+  /** How many others an arrow has below it. */
+  level: number;
   d: string;
   isDotted: boolean;
   hasHead: boolean;
@@ -40,8 +45,8 @@ const arrowGap = 4;
 const bracketGap = 3;
 
 /** A link as its pieces, one a line. */
-function piecesOf(from: Place, to: Place | null, lines: LinePlace[], startX: number, endX: number): Piece[] {
-  const last = to?.line ?? from.line;
+function piecesOf(from: Place, to: Place, lines: LinePlace[], startX: number, endX: number): Piece[] {
+  const last = to.line;
   const pieces: Piece[] = [];
   for (let line = from.line; line <= last; ++line) {
     const isFirst = line === from.line;
@@ -49,7 +54,7 @@ function piecesOf(from: Place, to: Place | null, lines: LinePlace[], startX: num
     pieces.push({
       line,
       from: isFirst ? startX : lines[line]!.left - 8,
-      to: isLast && to ? endX : lines[line]!.right + 4,
+      to: isLast ? endX : lines[line]!.right + 4,
       comesFromBefore: !isFirst,
       goesOn: !isLast,
     });
@@ -95,15 +100,18 @@ export function arrowPaths(links: SheetLink[], places: (Place | null)[], lines: 
   const all: { piece: Piece; link: SheetLink; isLast: boolean }[] = [];
   for (const link of links) {
     const from = places[link.From];
-    const to = link.To === null ? null : places[link.To];
-    if (!from || (link.To !== null && !to)) continue;
+    const to = link.To === null ? from : places[link.To];
+    if (!from || !to) continue;
     const startX = from.left + Math.min(18, (from.right - from.left) * 0.6);
-    const endX = to ? to.left + Math.min(8, (to.right - to.left) / 3) : 0;
-    const pieces = piecesOf(from, to ?? null, lines, startX, endX);
+    // What leads back ends at the sign that leads back.
+    const endX = link.To === null ? Math.max(from.back, startX + 8) : to.left + Math.min(8, (to.right - to.left) / 3);
+    const pieces = piecesOf(from, to, lines, startX, endX);
     pieces.forEach((piece, i) => all.push({ piece, link, isLast: i === pieces.length - 1 }));
   }
   const levels = levelsOf(all.map(({ piece }) => piece));
   return all.map(({ piece, link, isLast }, i) => ({
+    line: piece.line,
+    level: levels[i]!,
     d: arrowCurve(piece, lines[piece.line]!.top - arrowGap, levels[i]!),
     isDotted: link.IsDotted,
     hasHead: isLast,
@@ -121,7 +129,7 @@ export function bracketPaths(links: SheetLink[], places: (Place | null)[], lines
       const y = lines[piece.line]!.bottom + bracketGap;
       const begin = piece.comesFromBefore ? `M${piece.from} ${y + 6}` : `M${piece.from} ${y}v6`;
       const end = piece.goesOn ? `H${piece.to}` : `H${piece.to}v-6`;
-      paths.push({ d: begin + end, isDotted: link.IsDotted, hasHead: false });
+      paths.push({ line: piece.line, level: 0, d: begin + end, isDotted: link.IsDotted, hasHead: false });
     }
   }
   return paths;
