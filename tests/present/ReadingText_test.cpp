@@ -72,6 +72,25 @@ TEST_CASE("A line has as many bars as its width holds, and no line is wider") {
     }
 }
 
+TEST_CASE("A crowded bar narrows no other line") {
+    const std::string shown =
+        Shown("C | F | G7 | C | Am E7/G# Am/G D7/F# F6 C/E | Dm7 | G7 | C | F | G7 | C | C |",
+              {.mWidth = 40});
+    CHECK(Has(shown,
+              " 1 | C  | F  | G7 | C |\n"
+              "   | I  | IV | V7 | I |\n"
+              "\n"
+              " 5 | Am  E7/G#  Am/G  D7/F#  F6   C/E |\n"
+              "   | vi  V7/vi  vi    V7/V   IV6  I   |\n"
+              "\n"
+              " 6 | Dm7                              |\n"
+              "   | ii7                              |\n"
+              "\n"
+              " 7 | G7 | C |\n"));
+    CHECK(Has(shown, "\n 9 | F  | G7 | C  | C |\n"));
+    CHECK(Has(Shown("C C C C | F F G G | C . C G7 |"), "1 | C | F   G | C  G7 |\n"));
+}
+
 TEST_CASE("What repeats is told in whole bars") {
     const std::string shown =
         Shown("C | Am | F | G | C | Am | Dm | E7 | C | Am | F | G | C | Am | Dm | E7 | Am |");

@@ -7,12 +7,13 @@
 #include <fmt/format.h>
 
 #include <algorithm>
-#include <array>
+#include <map>
+#include <utility>
 
 namespace brindle {
 namespace {
 
-constexpr std::array<std::size_t, 3> kBarsPerLineTried{4, 2, 1};
+constexpr std::size_t kBarsPerLine = 4;
 constexpr std::string_view kGapOfBars = "  ";
 /// A chord that was there before, as people type it.
 constexpr std::string_view kChordHeld = ".";
@@ -41,6 +42,10 @@ struct CReadingLine {
     std::size_t mBegin = 0;
     std::size_t mEnd = 0;
     std::string mName;
+    /// Bars that lines of this kind have at most: four, or two or one of lines that are too wide.
+    std::size_t mMost = kBarsPerLine;
+    /// Of its bars, and of those that a longer line of this kind has.
+    std::vector<std::size_t> mWidths = {};
 };
 
 class CLineWriter {
@@ -57,10 +62,8 @@ public:
     }
 
     [[nodiscard]] std::string Write() {
-        for (const std::size_t barsPerLine : kBarsPerLineTried) {
-            Break(barsPerLine);
-            if (LineWidth() <= mLines.mWidth) break;
-        }
+        for (CReadingLine& line : FourBarsALine()) AddLine(std::move(line));
+        Align();
         std::string text;
         for (const CReadingLine& line : mBroken) WriteLine(line, text);
         return text;
@@ -91,9 +94,17 @@ private:
         for (std::size_t ix = bar.mBegin; ix < bar.mEnd; ++ix) {
             std::string symbol = ix < mSong.mSymbols.size() ? Printable(mSong.mSymbols[ix]) : "";
             if (symbol.empty()) symbol = "-";
+            if (ix > bar.mBegin && IsSameAsBefore(ix)) continue;
             cells.push_back({mKeys[ix], std::move(symbol), mReading.mChords[ix].mNumeral});
         }
         return cells;
+    }
+
+    [[nodiscard]] bool IsSameAsBefore(std::size_t ix) const {
+        const bool isNamedAlike =
+            ix < mSong.mSymbols.size() && mSong.mSymbols[ix] == mSong.mSymbols[ix - 1];
+        const auto& chords = mReading.mChords;
+        return isNamedAlike && mKeys[ix].empty() && chords[ix].mNumeral == chords[ix - 1].mNumeral;
     }
 
     // A part begins at the bar in which its place is.
@@ -114,30 +125,56 @@ private:
         return bar == 0 && bars.size() > 1 && bars[0].mLength < bars[1].mLength;
     }
 
-    void Break(std::size_t barsPerLine) {
-        mBroken.clear();
+    [[nodiscard]] std::vector<CReadingLine> FourBarsALine() const {
+        std::vector<CReadingLine> lines;
         std::size_t section = 0;
         for (std::size_t bar = 0; bar < mCells.size(); ++bar) {
             std::string name;
             const bool isPart = BeginsPart(mLines.mBars[bar], section, name);
             const bool isFull =
-                bar == 0 || bar - mBroken.back().mBegin >= barsPerLine || IsUpbeat(bar - 1);
-            if (isPart || isFull) mBroken.push_back({bar, bar, std::move(name)});
-            mBroken.back().mEnd = bar + 1;
+                bar == 0 || bar - lines.back().mBegin >= kBarsPerLine || IsUpbeat(bar - 1);
+            if (isPart || isFull) lines.push_back({bar, bar, std::move(name)});
+            lines.back().mEnd = bar + 1;
         }
-        mWidths.assign(barsPerLine, 0);
+        return lines;
+    }
+
+    // In halves where it is too wide, so that a crowded bar narrows no other line.
+    void AddLine(CReadingLine line) {
+        for (std::size_t bar = line.mBegin; bar < line.mEnd; ++bar) {
+            line.mWidths.push_back(WidthOfBar(mCells[bar]));
+        }
+        const bool fits = WidthOf(line.mWidths) <= mLines.mWidth;
+        if (fits || line.mMost == 1) {
+            mBroken.push_back(std::move(line));
+            return;
+        }
+        const std::size_t most = line.mMost / 2;
+        const std::size_t middle = std::min(line.mBegin + most, line.mEnd);
+        AddLine({line.mBegin, middle, std::move(line.mName), most});
+        if (middle < line.mEnd) AddLine({middle, line.mEnd, {}, most});
+    }
+
+    // Bars stand below each other where the lines of a kind have the room.
+    void Align() {
+        std::map<std::size_t, std::vector<std::size_t>> widest;
         for (const CReadingLine& line : mBroken) {
-            for (std::size_t bar = line.mBegin; bar < line.mEnd; ++bar) {
-                std::size_t& width = mWidths[bar - line.mBegin];
-                width = std::max(width, WidthOfBar(mCells[bar]));
+            std::vector<std::size_t>& widths = widest[line.mMost];
+            widths.resize(line.mMost);
+            for (std::size_t bar = 0; bar < line.mWidths.size(); ++bar) {
+                widths[bar] = std::max(widths[bar], line.mWidths[bar]);
             }
+        }
+        for (CReadingLine& line : mBroken) {
+            const std::vector<std::size_t>& widths = widest[line.mMost];
+            if (WidthOf(widths) <= mLines.mWidth) line.mWidths = widths;
         }
     }
 
-    [[nodiscard]] std::size_t LineWidth() const {
+    [[nodiscard]] std::size_t WidthOf(const std::vector<std::size_t>& bars) const {
         constexpr std::size_t around = 3;
         std::size_t width = mLabelWidth + 2;
-        for (const std::size_t bar : mWidths) width += bar + around;
+        for (const std::size_t bar : bars) width += bar + around;
         return width;
     }
 
@@ -177,7 +214,7 @@ private:
             if (!row.empty()) row += kGapOfBars;
             row += PadRight(cell.*part, cell.Width());
         }
-        return PadRight(row, mWidths[bar - line.mBegin]);
+        return PadRight(row, line.mWidths[bar - line.mBegin]);
     }
 
     const CSong& mSong;
@@ -188,7 +225,6 @@ private:
     std::vector<std::string> mKeys;
     std::vector<TBarCells> mCells;
     std::vector<CReadingLine> mBroken;
-    std::vector<std::size_t> mWidths;
     std::size_t mLabelWidth = 1;
 };
 
