@@ -151,6 +151,7 @@
 #include "brindle/platform/CTextFault.h"
 #include "brindle/platform/DictionaryValues.h"
 #include "brindle/platform/Error.h"
+#include "brindle/platform/FileNames.h"
 #include "brindle/platform/FileNode.h"
 #include "brindle/platform/FileTree.h"
 #include "brindle/platform/JsonString.h"
