@@ -253,6 +253,7 @@
 #include "brindle/song/ReadSongHarmony.h"
 #include "brindle/song/ScoreSongs.h"
 #include "brindle/song/SheetTimes.h"
+#include "brindle/song/SongBeats.h"
 #include "brindle/song/SongFingerings.h"
 #include "brindle/song/SongModelFile.h"
 #include "brindle/song/SongStyles.h"

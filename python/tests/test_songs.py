@@ -99,6 +99,8 @@ OPTIONS = [
     ({"beats_per_bar": 0},        ValueError),
     ({"beats_per_bar": "4"},      TypeError),
     ({"beats_per_chord": float("nan")}, ValueError),
+    ({"beats_per_chord": 1e308},  ValueError),
+    ({"beats_per_bar": 1e-300},   ValueError),
     ({"format": "tape"},          ValueError),
 ]
 

@@ -5,6 +5,7 @@
 
 #include "brindle/platform/FileNames.h"
 #include "brindle/present/PrintableSong.h"
+#include "brindle/song/SongBeats.h"
 
 #include <nanobind/stl/optional.h>
 #include <nanobind/stl/shared_ptr.h>
@@ -12,7 +13,6 @@
 #include <nanobind/stl/string_view.h>
 
 #include <algorithm>
-#include <cmath>
 
 namespace brindle::python {
 namespace {
@@ -41,9 +41,8 @@ std::string_view FormatWord(TSongFormat format) {
 
 CSongOptions OptionsFor(std::string_view format, double beatsPerBar, double beatsPerChord,
                         bool isEven, bool isLenient) {
-    const auto areBeats = [](double beats) { return std::isfinite(beats) && beats > 0.0; };
-    if (!areBeats(beatsPerBar) || !areBeats(beatsPerChord)) {
-        throw nb::value_error("beats are numbers above 0");
+    if (!AreSongBeats(beatsPerBar) || !AreSongBeats(beatsPerChord)) {
+        throw nb::value_error("beats are numbers of 1/1024 to 1024");
     }
     CSongOptions options;
     options.mFormat = ValueOfWord("format", format, kFormats);
