@@ -1,16 +1,10 @@
 // SPDX-License-Identifier: MIT
 #include "cli/ChordTextOptions.h"
 
+#include "brindle/song/SongBeats.h"
 #include "cli/CCommand.h"
 
 namespace brindle::cli {
-namespace {
-
-// A step or a bar this short or long is a slip of the finger.
-constexpr double kFewestBeats = 1.0 / 1024;
-constexpr double kMostBeats = 1024.0;
-
-}  // namespace
 
 void AddBeats(CCommand& command, double& beatsPerBar, double& beatsPerChord) {
     command.AddOption("--beats-per-bar", "BEATS", beatsPerBar,
@@ -21,7 +15,7 @@ void AddBeats(CCommand& command, double& beatsPerBar, double& beatsPerChord) {
 
 std::optional<std::string> BeatsContradiction(double beatsPerBar, double beatsPerChord) {
     for (const double beats : {beatsPerBar, beatsPerChord}) {
-        if (beats >= kFewestBeats && beats <= kMostBeats) continue;
+        if (AreSongBeats(beats)) continue;
         return "--beats-per-bar and --beats-per-chord take 1/1024 to 1024 beats";
     }
     return std::nullopt;

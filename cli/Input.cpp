@@ -2,7 +2,7 @@
 #include "cli/Input.h"
 
 #include "brindle/chords/ReadChordText.h"
-#include "brindle/platform/Ascii.h"
+#include "brindle/platform/FileNames.h"
 #include "brindle/theory/KeyNames.h"
 
 #include <fmt/format.h>
@@ -63,25 +63,6 @@ std::vector<std::string> TrimmedLines(std::string_view text) {
         lines.push_back(line.substr(begin, line.find_last_not_of(kWhiteSpace) + 1 - begin));
     }
     return lines;
-}
-
-// song.txt, My Song.TXT, songs/blues.musicxml, but no link and no "C.".
-bool HasFileEnding(std::string_view word) {
-    constexpr std::size_t shortest = 2;
-    constexpr std::size_t longest = 8;
-    const std::size_t dot = word.rfind('.');
-    if (dot == word.npos || dot == 0 || word.find("://") != word.npos) return false;
-    const std::string_view ending = word.substr(dot + 1);
-    return ending.size() >= shortest && ending.size() <= longest &&
-           std::all_of(ending.begin(), ending.end(), Ascii::IsLetter);
-}
-
-bool LooksLikeFileName(const std::string& word) {
-    if (word.find_first_of("|\n") != word.npos) return false;
-    for (const char* const start : {"/", "./", "../", "~/"}) {
-        if (word.starts_with(start)) return true;
-    }
-    return HasFileEnding(word);
 }
 
 // Of a command that takes no songs: a file there may have the name of a chord.

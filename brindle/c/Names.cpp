@@ -18,10 +18,18 @@ namespace {
 // No keyboard has more notes.
 constexpr int kHighestNote = 127;
 
+bool IsRootOrNone(int root) {
+    return root == BRINDLE_NONE || (root >= 0 && root < 12);
+}
+
+// What is wrong with options; null if nothing is.
+const char* FaultOf(const brindle_naming_options& options) {
+    if (IsRootOrNone(options.previous_root) && IsRootOrNone(options.next_root)) return nullptr;
+    return "a root is 0 to 11, or BRINDLE_NONE";
+}
+
 brindle::CNamingOptions FromC(const brindle_naming_options& options) {
-    const auto rootOf = [](int root) {
-        return root >= 0 && root < 12 ? root : brindle::kKeyNrUndef;
-    };
+    const auto rootOf = [](int root) { return root == BRINDLE_NONE ? brindle::kKeyNrUndef : root; };
     brindle::CNamingOptions result;
     result.mKey = brindle::border::FromC(options.key);
     result.mPreviousRoot = rootOf(options.previous_root);
@@ -56,13 +64,14 @@ brindle_status brindle_names_of_notes(const int* notes, size_t count,
     *names = nullptr;
     if (notes == nullptr && count > 0) return FailForNull("notes");
     return Guarded([&] {
+        const auto used = options != nullptr ? *options : brindle_naming_options_default();
+        if (const char* const fault = FaultOf(used)) return Fail(BRINDLE_ERROR_ARGUMENT, fault);
         std::vector<brindle::CNote> read;
         if (!ReadNotes(notes, count, read)) {
             return Fail(BRINDLE_ERROR_ARGUMENT, "a note is a number of 0 to 127");
         }
         auto result = std::make_unique<brindle_names>();
-        result->mNames = NameNotes(
-            read, FromC(options != nullptr ? *options : brindle_naming_options_default()));
+        result->mNames = NameNotes(read, FromC(used));
         *names = result.release();
         return BRINDLE_OK;
     });

@@ -6,8 +6,8 @@
 #include "brindle/present/PrintableSong.h"
 #include "brindle/present/internal/ReadingBars.h"
 #include "brindle/song/ReadSong.h"
+#include "brindle/song/SongBeats.h"
 
-#include <cmath>
 #include <memory>
 #include <string>
 #include <vector>
@@ -19,17 +19,14 @@ namespace {
 constexpr int kLastFormat = BRINDLE_FORMAT_ROMAN_TEXT;
 static_assert(kLastFormat == brindle::TSongFormat_RomanText);
 
-bool AreBeats(double beats) {
-    return std::isfinite(beats) && beats > 0.0;
-}
-
 // What is wrong with options; null if nothing is.
 const char* FaultOf(const brindle_song_options& options) {
     if (options.format < BRINDLE_FORMAT_AUTO || options.format > kLastFormat) {
         return "there is no such format";
     }
-    const bool areBeats = AreBeats(options.beats_per_bar) && AreBeats(options.beats_per_chord);
-    return areBeats ? nullptr : "beats are numbers above 0";
+    const bool areBeats = brindle::AreSongBeats(options.beats_per_bar) &&
+                          brindle::AreSongBeats(options.beats_per_chord);
+    return areBeats ? nullptr : "beats are numbers of 1/1024 to 1024";
 }
 
 brindle::CSongOptions FromC(const brindle_song_options& options) {

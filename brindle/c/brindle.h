@@ -265,8 +265,8 @@ typedef enum brindle_format {
 /** How a song is read. */
 typedef struct brindle_song_options {
     int format;             /**< a brindle_format */
-    double beats_per_bar;   /**< of a text that does not tell; above 0 */
-    double beats_per_chord; /**< how far a chord moves on in such a text; above 0 */
+    double beats_per_bar;   /**< of a text that does not tell; 1/1024 to 1024 */
+    double beats_per_chord; /**< how far a chord moves on in such a text; 1/1024 to 1024 */
     int even;               /**< not 0: the chords of a bar without holds share it evenly */
     int lenient;          /**< not 0: what is not understood is left out, and all faults are told */
     unsigned chord_flags; /**< BRINDLE_READ_... */

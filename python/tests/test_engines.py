@@ -61,14 +61,21 @@ def test_multiprocessing_as_the_page_shows_it(source_folder, tmp_path):
     assert printed.splitlines() == ["tonic 9", "dominant 6", "subdominant 3"]
 
 
-def test_duckdb_as_the_page_shows_it(source_folder, tmp_path):
-    pytest.importorskip("duckdb")
+def test_duckdb_as_the_page_shows_it(source_folder, tmp_path, monkeypatch):
+    duckdb = pytest.importorskip("duckdb")
     parquet = pytest.importorskip("pyarrow.parquet")
-    parquet.write_table(arrow.table({"text": SONGS}), tmp_path / "songs.parquet")
+    years = [1960 + number % 2 for number in range(len(SONGS))]
+    songs = arrow.table({"text": SONGS, "year": years})
+    parquet.write_table(songs, tmp_path / "songs.parquet")
     printed = run_script_of_page("duckdb.md", source_folder, tmp_path)
     for function in ["dominant", "subdominant", "tonic"]:
         assert re.search(rf"\b{function}\b.*\b399\b", printed)
     assert keys_of(parquet.read_table(tmp_path / "analyses.parquet")) == EXPECTED
+    monkeypatch.chdir(tmp_path)
+    page = (source_folder / "docs/duckdb.md").read_text(encoding="utf-8")
+    (question,) = re.findall(r"^```sql\n(.*?)^```", page, re.DOTALL | re.MULTILINE)
+    rows = duckdb.sql(question).fetchall()  # song 7 is of 1961 and is none
+    assert rows == [(1960, "C Major", 200), (1961, "C Major", 199), (1961, None, 1)]
 
 
 @pytest.fixture(scope="module")

@@ -2,6 +2,7 @@
 
 import json
 import pickle
+import sys
 import xml.etree.ElementTree as ElementTree
 
 import brindle
@@ -51,6 +52,8 @@ ERRORS = [
     (lambda: brindle.fretted("hello"),                     brindle.FingeringError),
     (lambda: brindle.GridPackage("no such package"),       brindle.FingeringError),
     (lambda: brindle.fingerings_svg([1]),                  TypeError),
+    (lambda: brindle.fingerings_svg([None]),               TypeError),
+    (lambda: brindle.fingerings_json([brindle.fretted("x32010"), None]), TypeError),
 ]
 
 
@@ -86,6 +89,7 @@ def test_fingerings_are_pickled_and_drawn():
     again = pickle.loads(pickle.dumps(fingering))
     assert again == fingering and hash(again) == hash(fingering)
     assert again.svg() == fingering.svg() and again != brindle.fretted("x32010")
+    assert again != None and again != "x02010"  # noqa: E711
     assert ElementTree.fromstring(fingering._repr_svg_().encode()).tag.endswith("svg")
     assert fingering.svg(left_handed=True) != fingering.svg()
 
@@ -131,7 +135,11 @@ def test_a_model_refuses():
         (lambda: model.add("C what"), brindle.SongError),
         (lambda: model.add(""), brindle.SongError),
         (lambda: model.generate(beats=0), brindle.ModelError),
-        (lambda: model.generate(seed=-1), TypeError),
+        (lambda: model.generate(seed=-1), ValueError),
+        (lambda: model.generate(seed=2**64), ValueError),
+        (lambda: model.generate(samples=-1), ValueError),
+        (lambda: brindle.MarkovModel.learn("C F G C"), TypeError),
+        (lambda: brindle.MarkovModel.load(sys.executable), brindle.ModelError),
         (lambda: brindle.MarkovModel().generate(), brindle.ModelError),
     ]:
         with pytest.raises(error):

@@ -93,9 +93,11 @@ def test_any_source_is_a_song_with_or_without_faults(source):
         source = source.encode("utf-8", "surrogatepass")
     for lenient in (False, True):
         song = brindle.read(source, lenient=lenient)
+        if song.has_fault and not lenient:
+            assert len(song) == 0
+            continue
         analysis = song.analyse(explain=True)
-        assert len(analysis.chords) == len(song)
-        assert song.has_fault or analysis.to_json()
+        assert len(analysis.chords) == len(song) and analysis.to_json()
 
 
 def test_damaged_files_are_songs_too(source_folder):
@@ -106,8 +108,7 @@ def test_damaged_files_are_songs_too(source_folder):
         for _ in range(chance.randint(1, 8)):
             place = chance.randrange(len(content))
             content[place : place + chance.randint(0, 3)] = chance.randbytes(chance.randint(0, 3))
-        song = brindle.read(bytes(content))
-        song.analyse().svg()
+        brindle.read(bytes(content), lenient=True).analyse().svg()
         try:
             brindle.score_midi(bytes(content))
         except brindle.ScoreError:

@@ -32,10 +32,66 @@ def test_faults_are_values():
     song = brindle.read("C what | G huh")
     assert song.has_fault and len(song) == 0
     assert (song.faults[0].line, song.faults[0].column) == (1, 3)
-    assert song.analyse().key is None and song.analyse().confidence is None
+    with pytest.raises(brindle.SongError, match="^line 1, column 3: what: a chord begins") as raised:
+        song.analyse()
+    assert (raised.value.text, raised.value.position) == ("C what | G huh", 3)
+    assert repr(song) == "<Song of 0 chords, with a fault>"
     lenient = brindle.read("C what | G huh", lenient=True)
     assert [fault.column for fault in lenient.faults] == [3, 13]
     assert [chord.symbol for chord in lenient if chord.chord.root] == ["C", "G"]
+
+
+def test_the_line_of_a_fault_is_told():
+    with pytest.raises(brindle.SongError) as raised:
+        brindle.read(b"C G |\r\nAm | \xc3\xa9 x\r\nF", format="chord-text").analyse()
+    assert (raised.value.text, raised.value.position) == ("Am | é x", 6)
+
+
+def test_a_song_without_chords_has_no_key():
+    for nothing in ("", "N.C.", "<score-partwise/>"):
+        analysis = brindle.read(nothing).analyse()
+        assert analysis.key is None and analysis.confidence is None
+
+
+#   source                       what it is taken for
+NAMES = [
+    ("nosuch.txt",               FileNotFoundError),
+    ("songs/nosuch.musicxml",    FileNotFoundError),
+    ("./nosuch",                 FileNotFoundError),
+    ("nosuch song.cho",          FileNotFoundError),
+    ("what",                     None),
+    ("C what.Hm | G",            None),
+    ("nosuch.txt\n",             None),
+    ("https://nosuch.invalid/a.txt", None),
+]
+
+
+@pytest.mark.parametrize("source, error", NAMES)
+def test_a_string_that_is_meant_as_a_file_is_no_wrong_chord(source, error):
+    if error is None:
+        assert brindle.read(source).has_fault
+        return
+    for read in (brindle.read, brindle.score_midi, lambda name: brindle.MarkovModel.learn([name])):
+        with pytest.raises(error, match="No such file") as raised:
+            read(source)
+        assert raised.value.filename == source
+
+
+def test_a_song_and_its_analysis_are_sequences():
+    song = brindle.read("Dm7 G7 | C A7")
+    for sequence in (song, song.analyse()):
+        assert [sequence[i] for i in range(len(sequence))] == list(sequence)
+        assert sequence[-1].symbol == "A7" and [c.symbol for c in sequence[1:3]] == ["G7", "C"]
+        assert sequence.chords is sequence.chords  # made once, so that a loop with an index is linear
+        with pytest.raises(IndexError):
+            sequence[4]
+        with pytest.raises(TypeError):
+            sequence["Dm7"]
+
+
+def test_bytes_of_any_kind_are_read():
+    for source in (b"C G", bytearray(b"C G"), memoryview(b"xC Gx")[1:-1]):
+        assert [chord.symbol for chord in brindle.read(source)] == ["C", "G"]
 
 
 #   options                       error
@@ -43,6 +99,8 @@ OPTIONS = [
     ({"beats_per_bar": 0},        ValueError),
     ({"beats_per_bar": "4"},      TypeError),
     ({"beats_per_chord": float("nan")}, ValueError),
+    ({"beats_per_chord": 1e308},  ValueError),
+    ({"beats_per_bar": 1e-300},   ValueError),
     ({"format": "tape"},          ValueError),
 ]
 

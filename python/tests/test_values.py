@@ -102,6 +102,12 @@ ERRORS = [
     (lambda: brindle.read("C").analyse(key=7), TypeError),
     (lambda: brindle.Chord("C").name("tonic"), ValueError),
     (lambda: brindle.Chord.of(brindle.Note("C"), [12]), ValueError),
+    (lambda: brindle.Chord.of("X", [0]),       brindle.NoteError),
+    (lambda: brindle.Chord.of(None, [0]),      TypeError),
+    (lambda: brindle.Chord.of("C", "047"),     TypeError),
+    (lambda: brindle.name([60.5]),             TypeError),
+    (lambda: brindle.name("abc"),              TypeError),
+    (lambda: brindle.name(60),                 TypeError),
     (lambda: brindle.Chord(7),                 TypeError),
     (lambda: brindle.Chord("C\ud800"),         (ValueError, TypeError)),
 ]
@@ -138,6 +144,8 @@ def test_notes_are_named():
     assert brindle.name([64, 67, 69, 72], before="N.C.") == "Am7/E"
     assert [name.symbol for name in brindle.names([60, 63, 66, 69], limit=1)] == ["Cdim7"]
     assert brindle.names([]) == []
+    for notes in ({67, 60, 64}, iter([60, 64, 67]), range(60, 68, 12), (n for n in (60, 64, 67))):
+        assert brindle.name(notes) == "C"
 
 
 def test_states_that_make_no_sense_are_refused():

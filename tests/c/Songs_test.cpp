@@ -5,6 +5,7 @@
 #include <fmt/format.h>
 #include <nlohmann/json.hpp>
 
+#include <cmath>
 #include <fstream>
 #include <string>
 
@@ -68,9 +69,16 @@ TEST_CASE("Faults are told with their places, and a lenient reading goes on") {
     brindle_song_options options = brindle_song_options_default();
     options.lenient = 1;
     CHECK(brindle_song_chord_count(ReadSongOf("C F\nG xyz C", &options).get()) == 5);
-    options.beats_per_bar = 0.0;
     brindle_song* made = nullptr;
-    CHECK(brindle_song_read("C", 1, &options, &made) == BRINDLE_ERROR_ARGUMENT);
+    // The largest is a number, but twice as many beats are none.
+    for (const double beats : {0.0, -1.0, 1e-300, 1e308, std::nan("")}) {
+        options = brindle_song_options_default();
+        options.beats_per_bar = beats;
+        CHECK(brindle_song_read("C", 1, &options, &made) == BRINDLE_ERROR_ARGUMENT);
+        options = brindle_song_options_default();
+        options.beats_per_chord = beats;
+        CHECK(brindle_song_read("C", 1, &options, &made) == BRINDLE_ERROR_ARGUMENT);
+    }
     options = brindle_song_options_default();
     options.format = 99;
     CHECK(brindle_song_read("C", 1, &options, &made) == BRINDLE_ERROR_ARGUMENT);

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "Interface.h"
 
+#include <climits>
 #include <string>
 
 namespace brindle::test {
@@ -156,6 +157,15 @@ TEST_CASE("Notes are named, the likeliest name first") {
     REQUIRE(brindle_names_of_notes(notes, 4, &options, &made) == BRINDLE_OK);
     const TNames one(made);
     CHECK(brindle_names_count(made) == 1);
+
+    for (const int root : {-2, 12, INT_MAX}) {
+        options = brindle_naming_options_default();
+        options.previous_root = root;
+        CHECK(brindle_names_of_notes(notes, 4, &options, &made) == BRINDLE_ERROR_ARGUMENT);
+        options = brindle_naming_options_default();
+        options.next_root = root;
+        CHECK(brindle_names_of_notes(notes, 4, &options, &made) == BRINDLE_ERROR_ARGUMENT);
+    }
 
     const int none[] = {-1};
     CHECK(brindle_names_of_notes(none, 1, nullptr, &made) == BRINDLE_ERROR_ARGUMENT);

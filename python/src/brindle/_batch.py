@@ -47,8 +47,8 @@ def analyse_batch(
 ) -> pyarrow.RecordBatch:
     """Reads the harmony of many songs and gives a row for each.
 
-    `texts` are the songs themselves, in any form that `read` knows: strings or bytes, a list or an
-    array of pyarrow. A row of None is null. A song that is not understood gives a row with its faults
+    `texts` are the songs themselves, in any form that `read` knows: strings or bytes, a list or a
+    column of pyarrow, pandas or NumPy. A row of None is null. A song that is not understood gives a row with its faults
     and without chords. The work is shared by `threads`, as many as there are processors without it.
 
     Columns: `title`, `key` ("A Minor", null without chords), `confidence`, `chords` (a list of
@@ -66,17 +66,40 @@ def analyse_batch(
     count = _processors() if threads is None else threads
     if count < 1:
         raise ValueError("threads are at least 1")
-    if isinstance(texts, arrow.ChunkedArray):
-        texts = texts.combine_chunks()
-    if isinstance(texts, arrow.Array):
-        binary = _large_binary(arrow, texts)
-        capsules = _native._analyse_arrow(binary.__arrow_c_array__()[1], count, lenient)
+    if isinstance(texts, (str, bytes, bytearray)):
+        raise TypeError("texts are many songs; for a single one, [text]")
+    column = _column(arrow, texts)
+    if column is None:
+        capsules = _analyse_list(list(texts), count, lenient)
     else:
-        capsules = _native._analyse_list(list(texts), count, lenient)
+        binary = _large_binary(arrow, column)
+        capsules = _native._analyse_arrow(binary.__arrow_c_array__()[1], count, lenient)
     return arrow.record_batch(_Capsules(capsules))
 
 
+def _column(arrow: Any, texts: Any) -> Any:
+    """Texts as a column of pyarrow, if they are one of any package; else None."""
+    if isinstance(texts, (arrow.Array, arrow.ChunkedArray)):
+        return texts
+    if hasattr(texts, "__arrow_c_stream__"):
+        return arrow.chunked_array(texts)
+    if hasattr(texts, "__array__"):  # of NumPy, or of pandas with its missing values
+        return arrow.array(texts, from_pandas=True)
+    return None
+
+
+def _analyse_list(texts: list[Any], threads: int, lenient: bool) -> tuple[Any, Any]:
+    try:
+        return _native._analyse_list(texts, threads, lenient)
+    except UnicodeEncodeError:  # half a character is a fault of its song, as in `read`
+        encoded = [t.encode("utf-8", "surrogatepass") if isinstance(t, str) else t for t in texts]
+        return _native._analyse_list(encoded, threads, lenient)
+
+
 def _large_binary(arrow: Any, texts: Any) -> Any:
+    if isinstance(texts, arrow.ChunkedArray):
+        chunks = [_large_binary(arrow, chunk) for chunk in texts.chunks]
+        return arrow.concat_arrays(chunks) if chunks else arrow.array([], arrow.large_binary())
     if arrow.types.is_dictionary(texts.type):
         texts = texts.dictionary_decode()
     try:

@@ -73,13 +73,15 @@ class ScaleError(BrindleError):
 
 
 class SongError(BrindleError):
-    """A song that cannot be used as it was asked for: to learn from a song with faults, say.
+    """A song that was not understood and is to be analysed or learned from.
+
+    `text` is the line of its first fault, and `position` a character of it.
 
     >>> import brindle
-    >>> brindle.MarkovModel.learn([brindle.read("C what G")])
+    >>> brindle.read("C G | Amm").analyse()
     Traceback (most recent call last):
     ...
-    brindle.SongError: the song has a fault
+    brindle.SongError: line 1, column 9: Amm: "m" at 3 is not understood
     """
 
 

@@ -9,7 +9,7 @@ from typing import Union
 
 from brindle import _native
 from brindle._native import Song
-from brindle._songs import Source, bytes_of, read
+from brindle._songs import Source, bytes_of, read, refuse_missing_file
 
 
 class MarkovModel:
@@ -34,6 +34,8 @@ class MarkovModel:
         >>> brindle.MarkovModel.learn([brindle.read("C F | G C")], order=2).order
         2
         """
+        if isinstance(songs, (str, bytes, os.PathLike)):
+            raise TypeError("songs are many songs; for a single one, [song]")
         model = cls(order)
         for song in songs:
             model.add(song)
@@ -86,6 +88,10 @@ class MarkovModel:
         >>> sum(chord.length for chord in brindle.read(chords))
         8.0
         """
+        if not 0 <= seed < 2**64:
+            raise ValueError("a seed is 0 to 2**64 - 1")
+        if order < 0 or samples < 0:
+            raise ValueError("orders and samples are not below 0")
         return self._model.generate(seed, beats, order, samples)
 
     def dumps(self) -> str:
@@ -125,7 +131,10 @@ class MarkovModel:
     @classmethod
     def load(cls, path: Union[str, "os.PathLike[str]"]) -> MarkovModel:
         """Reads a model file. See `save`."""
-        return cls.loads(Path(path).read_text(encoding="utf-8"))
+        return cls.loads(Path(path).read_text(encoding="utf-8", errors="replace"))
+
+    def __repr__(self) -> str:
+        return f"<MarkovModel of order {self.order} with {self.symbol_count} symbols>"
 
     def __reduce__(self) -> tuple[object, tuple[str]]:
         return (MarkovModel.loads, (self.dumps(),))
@@ -140,7 +149,7 @@ def score_json_lines(source: Source) -> str:
     ...
     brindle.ScoreError: ...
     """
-    return _native._score_json_lines(bytes_of(source))
+    return _native._score_json_lines(_score_bytes(source))
 
 
 def score_midi(source: Source) -> bytes:
@@ -150,4 +159,9 @@ def score_midi(source: Source) -> bytes:
     >>> brindle.score_midi(b"<score-partwise/>")[:4]
     b'MThd'
     """
-    return _native._score_midi(bytes_of(source))
+    return _native._score_midi(_score_bytes(source))
+
+
+def _score_bytes(source: Source) -> bytes:
+    refuse_missing_file(source)  # no score looks like one
+    return bytes_of(source)

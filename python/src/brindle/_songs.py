@@ -2,6 +2,7 @@
 
 from __future__ import annotations
 
+import errno
 import os
 from pathlib import Path
 from typing import Any, Literal, Union
@@ -18,7 +19,7 @@ def analyse_again(song: Song, *arguments: Any) -> Analysis:
     return song.analyse(*arguments)
 
 
-Source = Union[str, bytes, "os.PathLike[str]"]
+Source = Union[str, bytes, bytearray, memoryview, "os.PathLike[str]"]
 Format = Literal[
     "auto",
     "chord-text",
@@ -45,11 +46,22 @@ def _names_file(text: str) -> bool:
 
 def bytes_of(source: Source) -> bytes:
     """The bytes of a file or of a text."""
-    if isinstance(source, bytes):
-        return source
+    if isinstance(source, (bytes, bytearray, memoryview)):
+        return bytes(source)
     if isinstance(source, str) and not _names_file(source):
         return source.encode("utf-8", "surrogatepass")
     return Path(source).read_bytes()
+
+
+def refuse_missing_file(source: object) -> None:
+    """FileNotFoundError for a string that is no music, but looks like the name of a file."""
+    if isinstance(source, str) and not _names_file(source):
+        try:
+            is_name = _native._looks_like_file_name(source)
+        except TypeError:  # of half characters
+            return
+        if is_name:
+            raise FileNotFoundError(errno.ENOENT, os.strerror(errno.ENOENT), source)
 
 
 def read(
@@ -64,8 +76,9 @@ def read(
     """Reads a song in any form: chord text, ChordPro, charts, Roman numerals, MusicXML.
 
     `source` is a path, the bytes of a song or its text; a string that is the name of a file is read
-    as that file. What is wrong in a song is in its `faults` and never raised; a file that cannot be
-    read is an `OSError`. `beats_per_bar` and `beats_per_chord` are of a text that does not tell;
+    as that file. What is wrong in a song is in its `faults` and not raised before the song is used; a
+    file that cannot be read is an `OSError`, and so is a string that is no song and looks like the name
+    of a file. `beats_per_bar` and `beats_per_chord` are of a text that does not tell;
     `even` lets the chords of a bar without holds share it; a `lenient` reading leaves out what is not
     understood.
 
@@ -76,6 +89,9 @@ def read(
     >>> brindle.read("C what G", lenient=True).chords[2].symbol
     'G'
     """
-    return _native._read(
+    song = _native._read(
         bytes_of(source), format, beats_per_bar, beats_per_chord, even, lenient
     )
+    if song.has_fault:
+        refuse_missing_file(source)
+    return song

@@ -55,6 +55,7 @@ public:
     CSongReading mReading;
     std::vector<std::string> mExplanations;
     bool mIsExplained;
+    CLazyTuple mChords;
 
 private:
     // The key counts for the song, too.
@@ -76,6 +77,7 @@ using CAnalysisPtr = std::shared_ptr<CAnalysis>;
 
 CAnalysisPtr Analyse(const CSourceSongPtr& song, const nb::object& key, bool hasAlternatives,
                      bool hasCopies, bool isExplained) {
+    CheckUnderstood(*song);
     const CSignKeyLite stated = KeyOf(key);
     const nb::gil_scoped_release released;
     return std::make_shared<CAnalysis>(song, stated, hasAlternatives, hasCopies, isExplained);
@@ -97,13 +99,17 @@ nb::object ChordAt(const CAnalysis& analysis, std::size_t index, const nb::objec
                   index < sentences.size() ? sentences[index] : "");
 }
 
-nb::tuple ChordsOf(const CAnalysis& analysis) {
+nb::tuple MadeChordsOf(const CAnalysis& analysis) {
     const nb::object record = RecordType("ChordReading");
     nb::list chords;
     for (std::size_t i = 0; i < ChordCount(analysis.Song()); ++i) {
         chords.append(ChordAt(analysis, i, record));
     }
     return nb::tuple(chords);
+}
+
+const nb::object& ChordsOf(const CAnalysis& analysis) {
+    return analysis.mChords.Get([&] { return MadeChordsOf(analysis); });
 }
 
 nb::tuple RegionsOf(const CAnalysis& analysis) {
@@ -171,7 +177,7 @@ Key('C Major')
 
 constexpr const char* kAnalyse = R"(Reads the harmony of the song.
 
-`key` states its key instead of what the song says. `alternatives` and `copies` add other readings and
+A song that was not understood is a `SongError`, unless it was read leniently. `key` states its key instead of what the song says. `alternatives` and `copies` add other readings and
 repeated passages to the JSON and the time axis; both take longer. `explain` gives each chord a sentence.
 
 >>> import brindle
@@ -235,9 +241,7 @@ void BindAnalyses(nb::module_& module) {
     nb::class_<CAnalysis> analysis(module, "Analysis", kAnalysis);
     BindFindings(analysis);
     analysis.def("__len__", [](const CAnalysis& self) { return ChordCount(self.Song()); });
-    analysis.def(
-        "__iter__", [](const CAnalysis& self) { return nb::iter(ChordsOf(self)); },
-        nb::sig("def __iter__(self) -> collections.abc.Iterator[brindle._records.ChordReading]"));
+    BindSequence(analysis, "ChordReading", ChordsOf);
     analysis.def("to_json", JsonOf, R"(The analysis as strict JSON, the same as the program prints.
 
 >>> import brindle

@@ -2,6 +2,7 @@
 #include "Arguments.h"
 
 #include "brindle/chords/ReadChordText.h"
+#include "brindle/present/ShownNames.h"
 #include "brindle/theory/KeyNames.h"
 #include "brindle/theory/ReadKeyText.h"
 
@@ -66,6 +67,38 @@ CSignKeyLite KeyOf(const nb::object& keyOrText) {
         return KeyOfText(nb::cast<std::string_view>(keyOrText));
     }
     return nb::cast<CSignKeyLite>(keyOrText);
+}
+
+std::vector<int> NumbersOf(const char* name, const nb::iterable& numbers) {
+    std::vector<int> result;
+    for (const nb::handle number : numbers) {
+        int value = 0;
+        if (!nb::try_cast(number, value)) {
+            throw nb::type_error((std::string(name) + " are whole numbers").c_str());
+        }
+        result.push_back(value);
+    }
+    return result;
+}
+
+CKeyEnh NoteOfText(std::string_view text) {
+    std::string typed(text);
+    ConvertUtf8SharpAndFlatToAscii(typed);
+    CKeyEnh note;
+    int consumed = 0;
+    note.SetFromString(typed, &consumed, NamePrefs());
+    if (note.IsUndef() || static_cast<std::size_t>(consumed) != typed.size()) {
+        throw CFault("NoteError", "a note is a letter of A to H with # or b behind it",
+                     std::string(text), static_cast<std::size_t>(consumed) + 1);
+    }
+    return note;
+}
+
+CKeyEnh NoteOf(const nb::object& noteOrText) {
+    if (nb::isinstance<nb::str>(noteOrText)) {
+        return NoteOfText(nb::cast<std::string_view>(noteOrText));
+    }
+    return nb::cast<CKeyEnh>(noteOrText);
 }
 
 nb::tuple IntervalsOf(CSemitones semitones) {

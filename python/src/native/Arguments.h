@@ -48,6 +48,13 @@ TValue ValueOfWord(std::string_view name, std::string_view word,
 [[nodiscard]] CSignKeyLite KeyOf(const nb::object& keyOrText);
 [[nodiscard]] CSignKeyLite KeyOfText(std::string_view text);
 
+/// Numbers of a list, a set, an array; TypeError, which names the argument, if one is none.
+[[nodiscard]] std::vector<int> NumbersOf(const char* name, const nb::iterable& numbers);
+
+/// A note, or the one that a text names; NoteError if it names none.
+[[nodiscard]] CKeyEnh NoteOf(const nb::object& noteOrText);
+[[nodiscard]] CKeyEnh NoteOfText(std::string_view text);
+
 /// A tuple of what `make` gives for each element.
 template <class TList, class TMake>
 nb::tuple TupleOf(const TList& list, const TMake& make) {

@@ -13,6 +13,7 @@
 #include <nanobind/stl/string.h>
 
 #include <algorithm>
+#include <chrono>
 #include <optional>
 #include <string_view>
 #include <vector>
@@ -152,6 +153,23 @@ void AddNoSong(CArrowColumn& table) {
     table.AddRecord();
 }
 
+// Ends the work when somebody has pressed Ctrl-C; asked a few times a second, since Python's lock
+// may have to be waited for.
+class CInterruption {
+public:
+    bool MayGoOn() {
+        const auto now = std::chrono::steady_clock::now();
+        if (now < mNext) return true;
+        mNext = now + std::chrono::milliseconds(100);
+        const nb::gil_scoped_acquire held;
+        if (PyErr_CheckSignals() != 0) throw nb::python_error();
+        return true;
+    }
+
+private:
+    std::chrono::steady_clock::time_point mNext{};
+};
+
 // What a row holds until it is written, about.
 std::size_t WeightOf(const std::optional<CSongRow>& row) {
     constexpr std::size_t kBytesOfChord = 512;
@@ -173,6 +191,8 @@ CArrowColumn TableOf(const CTexts& texts, std::size_t threadCount, const CSongOp
     // The texts are there anyhow.
     steps.mWeightOfPiece = [](std::size_t) { return std::size_t{1}; };
     steps.mWeightOfResult = WeightOf;
+    CInterruption interruption;
+    steps.mPulse = [&] { return interruption.MayGoOn(); };
     WorkInParallel(steps, {.mJobs = std::min(threadCount, kMostThreads)});
     return table;
 }
@@ -209,6 +229,11 @@ CTexts TextsOfList(const nb::list& list) {
         } else if (nb::isinstance<nb::bytes>(element)) {
             const auto bytes = nb::borrow<nb::bytes>(element);
             texts.push_back(std::string_view(bytes.c_str(), bytes.size()));
+        } else if (!nb::isinstance<nb::str>(element)) {
+            const std::string type = nb::inst_name(element).c_str();
+            throw nb::type_error(("texts[" + std::to_string(texts.size()) + "] is of type " + type +
+                                  ", not str, bytes or None")
+                                     .c_str());
         } else {
             Py_ssize_t size = 0;
             const char* const text = PyUnicode_AsUTF8AndSize(element.ptr(), &size);

@@ -7,21 +7,20 @@
 
 #include <nanobind/stl/string.h>
 #include <nanobind/stl/string_view.h>
-#include <nanobind/stl/vector.h>
 
 #include <vector>
 
 namespace brindle::python {
 namespace {
 
-CChordLite ChordOfIntervals(const CKeyEnh& root, const std::vector<int>& intervals,
+CChordLite ChordOfIntervals(const nb::object& root, const nb::iterable& intervals,
                             const nb::object& bass) {
     CSemitones semitones;
-    for (const int interval : intervals) {
+    for (const int interval : NumbersOf("intervals", intervals)) {
         if (interval < 0 || interval > 11) throw nb::value_error("an interval is 0 to 11");
         semitones.SetSemitone(interval, true);
     }
-    return {root, bass.is_none() ? CKeyEnh() : nb::cast<CKeyEnh>(bass), semitones};
+    return {NoteOf(root), bass.is_none() ? CKeyEnh() : NoteOf(bass), semitones};
 }
 
 nb::tuple NotesOf(const CChordLite& chord) {
@@ -59,8 +58,8 @@ True)";
 constexpr const char* kChordOf = R"(The chord with these semitones above a root.
 
 >>> import brindle
->>> brindle.Chord.of(brindle.Note("E"), [0, 3, 7, 10])
-Chord('Em7'))";
+>>> brindle.Chord.of("E", [0, 3, 7, 10], bass=brindle.Note("G"))
+Chord('Em7/G'))";
 
 constexpr const char* kChordName = R"(The symbol as people type it; it reads back as the same chord.
 
@@ -101,8 +100,8 @@ void BindChords(nb::module_& module) {
         nb::arg("symbol"));
     chord.def_static("of", ChordOfIntervals, nb::arg("root"), nb::arg("intervals"),
                      nb::arg("bass") = nb::none(), kChordOf,
-                     nb::sig("def of(root: Note, intervals: collections.abc.Sequence[int], "
-                             "bass: Note | None = None) -> Chord"));
+                     nb::sig("def of(root: Note | str, intervals: collections.abc.Iterable[int], "
+                             "bass: Note | str | None = None) -> Chord"));
     chord.def_prop_ro(
         "root", [](const CChordLite& self) { return OrNone(self.mRootKeyEnh); },
         nb::sig("def root(self, /) -> Note | None"),

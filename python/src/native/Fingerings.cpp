@@ -148,10 +148,19 @@ private:
     std::mutex mMutex;
 };
 
+// A list of shared values takes None for a missing one.
+std::vector<CChordGrid> Plain(const std::vector<CGridPtr>& grids) {
+    std::vector<CChordGrid> plain;
+    for (const CGridPtr& grid : grids) {
+        if (grid == nullptr) throw nb::type_error("None is no Fingering");
+        plain.push_back(*grid);
+    }
+    return plain;
+}
+
 std::string SvgOf(const std::vector<CGridPtr>& grids, const std::string& title,
                   std::string_view dots, bool isLeftHanded) {
-    std::vector<CChordGrid> plain;
-    for (const CGridPtr& grid : grids) plain.push_back(*grid);
+    const std::vector<CChordGrid> plain = Plain(grids);
     CGridStyle style;
     style.mDots = ValueOfWord("dots", dots, kDots);
     style.mLeftHanded = isLeftHanded;
@@ -159,9 +168,7 @@ std::string SvgOf(const std::vector<CGridPtr>& grids, const std::string& title,
 }
 
 std::string JsonOf(const std::vector<CGridPtr>& grids) {
-    std::vector<CChordGrid> plain;
-    for (const CGridPtr& grid : grids) plain.push_back(*grid);
-    return GridsJson(plain);
+    return GridsJson(Plain(grids));
 }
 
 nb::tuple NumbersOf(const std::vector<int>& numbers) {
@@ -336,7 +343,8 @@ True)");
 '')");
     grid.def("__str__", [](const CChordGrid& self) { return FretsText(self); });
     grid.def("__repr__", [](const CChordGrid& self) {
-        return "<Fingering " + FretsText(self) + " of " + self.mName + ">";
+        const std::string name = self.mName.empty() ? "no chord" : self.mName;
+        return "<Fingering " + FretsText(self) + " of " + name + ">";
     });
     grid.def(
         "svg",
@@ -354,10 +362,12 @@ True)");
     grid.def(
         "_repr_svg_", [](const CGridPtr& self) { return SvgOf({self}, "", "fingers", false); },
         "What a notebook shows.");
-    grid.def("__eq__", [](const CChordGrid& self, const nb::object& other) {
-        const CChordGrid* grid = nullptr;
-        return nb::try_cast(other, grid) && StateOf(self).equal(StateOf(*grid));
-    });
+    grid.def(
+        "__eq__",
+        [](const CChordGrid& self, const CChordGrid& other) {
+            return StateOf(self).equal(StateOf(other));
+        },
+        nb::is_operator(), nb::sig("def __eq__(self, other: object, /) -> bool"));
     grid.def("__hash__",
              [](const CChordGrid& self) { return nb::hash(nb::cast(FretsText(self))); });
     grid.def("__getstate__", StateOf);

@@ -55,6 +55,7 @@ CModelPtr ModelOfText(const std::string& text) {
 }
 
 void Learn(const CModel& model, const CSourceSong& source) {
+    CheckUnderstood(source);
     brindle_song_options options = brindle_song_options_default();
     options.format = source.mOptions.mFormat;
     options.beats_per_bar = source.mOptions.mBeatsPerBar;

@@ -6,7 +6,6 @@
 
 #include <nanobind/stl/string.h>
 #include <nanobind/stl/string_view.h>
-#include <nanobind/stl/vector.h>
 
 #include <vector>
 
@@ -19,10 +18,9 @@ constexpr CWord<TBassUse> kBassUses[] = {
     {"none", TBassUse::None},
 };
 
-std::vector<CNote> NotesOfNumbers(const std::vector<int>& numbers) {
+std::vector<CNote> NotesOfNumbers(const nb::iterable& numbers) {
     std::vector<CNote> notes;
-    notes.reserve(numbers.size());
-    for (const int number : numbers) {
+    for (const int number : NumbersOf("notes", numbers)) {
         if (number < 0 || number > 127) {
             throw CFault("NoteError", "a note is a number of 0 to 127", std::to_string(number));
         }
@@ -54,7 +52,7 @@ CNamingOptions OptionsFor(const CSurroundings& around, std::string_view bass, st
     return options;
 }
 
-nb::list NamesOf(const std::vector<int>& notes, const nb::object& key, std::string_view bass,
+nb::list NamesOf(const nb::iterable& notes, const nb::object& key, std::string_view bass,
                  const nb::object& before, const nb::object& after, std::size_t limit) {
     const nb::object record = RecordType("NamedChord");
     const CNamingOptions options = OptionsFor({key, before, after}, bass, limit);
@@ -65,9 +63,8 @@ nb::list NamesOf(const std::vector<int>& notes, const nb::object& key, std::stri
     return names;
 }
 
-std::string LikeliestName(const std::vector<int>& notes, const nb::object& key,
-                          std::string_view bass, const nb::object& before,
-                          const nb::object& after) {
+std::string LikeliestName(const nb::iterable& notes, const nb::object& key, std::string_view bass,
+                          const nb::object& before, const nb::object& after) {
     const CNamingOptions options = OptionsFor({key, before, after}, bass, 1);
     const auto names = NameNotes(NotesOfNumbers(notes), options);
     if (names.empty()) throw CFault("NoteError", "no notes have no name");
@@ -102,7 +99,7 @@ void BindNames(nb::module_& module) {
     module.def("name", LikeliestName, nb::arg("notes"), nb::kw_only(), nb::arg("key") = nb::none(),
                nb::arg("bass") = "usual", nb::arg("before") = nb::none(),
                nb::arg("after") = nb::none(), kName,
-               nb::sig("def name(notes: collections.abc.Sequence[int], *, key: Key | str | None = "
+               nb::sig("def name(notes: collections.abc.Iterable[int], *, key: Key | str | None = "
                        "None, bass: typing.Literal['usual', 'only', 'none'] = 'usual', "
                        "before: Chord | str | None = None, after: Chord | str | None = None) "
                        "-> str"));
@@ -110,7 +107,7 @@ void BindNames(nb::module_& module) {
         "names", NamesOf, nb::arg("notes"), nb::kw_only(), nb::arg("key") = nb::none(),
         nb::arg("bass") = "usual", nb::arg("before") = nb::none(), nb::arg("after") = nb::none(),
         nb::arg("limit") = 12, kNames,
-        nb::sig("def names(notes: collections.abc.Sequence[int], *, key: Key | str | None = None, "
+        nb::sig("def names(notes: collections.abc.Iterable[int], *, key: Key | str | None = None, "
                 "bass: typing.Literal['usual', 'only', 'none'] = 'usual', "
                 "before: Chord | str | None = None, after: Chord | str | None = None, "
                 "limit: int = 12) -> list[brindle._records.NamedChord]"));

@@ -3,9 +3,6 @@
 #include "Bind.h"
 #include "Values.h"
 
-#include "brindle/present/ShownNames.h"
-#include "brindle/theory/KeyNames.h"
-
 #include <nanobind/stl/optional.h>
 #include <nanobind/stl/string.h>
 #include <nanobind/stl/string_view.h>
@@ -14,19 +11,6 @@
 
 namespace brindle::python {
 namespace {
-
-CKeyEnh NoteOfText(std::string_view text) {
-    std::string typed(text);
-    ConvertUtf8SharpAndFlatToAscii(typed);
-    CKeyEnh note;
-    int consumed = 0;
-    note.SetFromString(typed, &consumed, NamePrefs());
-    if (note.IsUndef() || static_cast<std::size_t>(consumed) != typed.size()) {
-        throw CFault("NoteError", "a note is a letter of A to H with # or b behind it",
-                     std::string(text), static_cast<std::size_t>(consumed) + 1);
-    }
-    return note;
-}
 
 std::string NameOfNote(const CKeyEnh& note, std::string_view style, bool isUnicode) {
     return WriteNoteName(note, StyleOf(style, isUnicode));

@@ -3,14 +3,16 @@
 #include "Bind.h"
 #include "SourceSong.h"
 
+#include "brindle/platform/FileNames.h"
 #include "brindle/present/PrintableSong.h"
+#include "brindle/song/SongBeats.h"
 
 #include <nanobind/stl/optional.h>
 #include <nanobind/stl/shared_ptr.h>
 #include <nanobind/stl/string.h>
 #include <nanobind/stl/string_view.h>
 
-#include <cmath>
+#include <algorithm>
 
 namespace brindle::python {
 namespace {
@@ -39,9 +41,8 @@ std::string_view FormatWord(TSongFormat format) {
 
 CSongOptions OptionsFor(std::string_view format, double beatsPerBar, double beatsPerChord,
                         bool isEven, bool isLenient) {
-    const auto areBeats = [](double beats) { return std::isfinite(beats) && beats > 0.0; };
-    if (!areBeats(beatsPerBar) || !areBeats(beatsPerChord)) {
-        throw nb::value_error("beats are numbers above 0");
+    if (!AreSongBeats(beatsPerBar) || !AreSongBeats(beatsPerChord)) {
+        throw nb::value_error("beats are numbers of 1/1024 to 1024");
     }
     CSongOptions options;
     options.mFormat = ValueOfWord("format", format, kFormats);
@@ -63,7 +64,7 @@ CSourceSongPtr Read(const nb::bytes& source, std::string_view format, double bea
     return song;
 }
 
-nb::tuple ChordsOf(const CSourceSong& source) {
+nb::tuple MadeChordsOf(const CSourceSong& source) {
     const nb::object record = RecordType("SongChord");
     const CSong& song = source.mSong;
     nb::list chords;
@@ -73,6 +74,10 @@ nb::tuple ChordsOf(const CSourceSong& source) {
                              CChordLite(chord)));
     }
     return nb::tuple(chords);
+}
+
+const nb::object& ChordsOf(const CSourceSong& source) {
+    return source.mChords.Get([&] { return MadeChordsOf(source); });
 }
 
 nb::tuple FaultsOf(const CSourceSong& source) {
@@ -111,7 +116,19 @@ nb::tuple PickleOf(const CSourceSong& song) {
 std::string ReprOf(const CSourceSong& song) {
     const std::size_t count = ChordCount(song.mSong);
     const std::string title = song.mSong.mTitle.empty() ? "" : " \"" + song.mSong.mTitle + "\"";
-    return "<Song" + title + " of " + std::to_string(count) + (count == 1 ? " chord>" : " chords>");
+    return "<Song" + title + " of " + std::to_string(count) + (count == 1 ? " chord" : " chords") +
+           (song.mSong.HasFault() ? ", with a fault>" : ">");
+}
+
+// A line of a source, from 1, as far as there is one.
+std::string LineOf(std::string_view source, std::size_t number) {
+    for (; number > 1; --number) {
+        const std::size_t end = source.find('\n');
+        if (end == source.npos) return "";
+        source.remove_prefix(end + 1);
+    }
+    const std::string_view line = source.substr(0, source.find('\n'));
+    return std::string(line.ends_with('\r') ? line.substr(0, line.size() - 1) : line);
 }
 
 constexpr const char* kSong =
@@ -220,17 +237,31 @@ True)");
 
 }  // namespace
 
+void CheckUnderstood(const CSourceSong& source) {
+    if (source.mOptions.mLenient || !source.mSong.HasFault()) return;
+    const auto& faults = source.mSong.mFaults;
+    const auto fault = std::find_if(faults.begin(), faults.end(),
+                                    [](const CSongFault& each) { return !each.mIsNote; });
+    if (fault == faults.end() || fault->mLine == 0) {
+        throw CFault("SongError", fault == faults.end() ? "the song has a fault" : fault->mText);
+    }
+    throw CFault("SongError",
+                 "line " + std::to_string(fault->mLine) + ", column " +
+                     std::to_string(fault->mColumn) + ": " + fault->mText,
+                 LineOf(source.mSource, fault->mLine), fault->mColumn);
+}
+
 void BindSongs(nb::module_& module) {
     nb::class_<CSourceSong> song(module, "Song", kSong);
     BindFacts(song);
     BindLists(song);
     song.def("__len__", [](const CSourceSong& self) { return ChordCount(self.mSong); });
-    song.def(
-        "__iter__", [](const CSourceSong& self) { return nb::iter(ChordsOf(self)); },
-        nb::sig("def __iter__(self) -> collections.abc.Iterator[brindle._records.SongChord]"));
+    BindSequence(song, "SongChord", ChordsOf);
     song.def("__repr__", ReprOf);
     song.def("__reduce__", PickleOf,
              nb::sig("def __reduce__(self) -> tuple[typing.Any, tuple[typing.Any, ...]]"));
+    module.def("_looks_like_file_name", LooksLikeFileName, nb::arg("word"),
+               "Whether a word is meant as the name of a file.");
     module.def("_read", Read, nb::arg("source"), nb::arg("format"), nb::arg("beats_per_bar"),
                nb::arg("beats_per_chord"), nb::arg("even"), nb::arg("lenient"),
                "Reads the bytes of a song.");
