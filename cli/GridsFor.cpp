@@ -8,7 +8,6 @@
 #include "cli/TypedSongs.h"
 
 #include "brindle/analysis/TChordStringParse.h"
-#include "brindle/present/GridsSvg.h"
 #include "brindle/present/SongGrids.h"
 
 #include <memory>
@@ -71,7 +70,7 @@ TSongOutput GridsOf(const CTypedSong& typed, const GChShortTuning& tuning,
         case TFormat::Json:
             return SongGridsJson(shown, style);
         case TFormat::Svg:
-            return GridsSvg(shown.mGrids, "Chord grids", style);
+            return SongGridsSvg(shown, "Chord grids", style);
         default:
             return SongGridsText(shown, PaintOfOutput(), style);
     }

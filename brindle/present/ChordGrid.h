@@ -24,6 +24,8 @@ struct CChordGrid {
     std::string mSymbol;
     /// Told from what sounds.
     std::string mName;
+    /// The chord that sounds, where the name is that of the shape under a capodaster; else empty.
+    std::string mSounds;
     /// Other names that are nearly as likely.
     std::vector<std::string> mOtherNames;
     GChShortTuning mTuning{};  ///< of the open strings, from the lowest on

@@ -8,6 +8,7 @@
 
 #include <algorithm>
 #include <cstddef>
+#include <sstream>
 
 namespace brindle {
 namespace {
@@ -18,8 +19,12 @@ constexpr std::size_t kGridsPerLine = 6;
 // A full diagram, from its top left corner.
 constexpr double kNameSize = 15.0;
 constexpr double kSizeOfLabels = 10.0;
-constexpr double kDotTextSize = 8.0;  // of two letters on a dot
-constexpr double kDotLetters = 2.0;
+constexpr double kDotTextSize = 8.0;    // of two letters on a dot
+constexpr double kSmallestOnDot = 5.5;  // "Sol" with its sign just fits
+constexpr double kSizeOfThreeOnDot = 6.4;
+constexpr double kHeadSize = 12.0;
+constexpr double kLinesOfHead = 1.5;  // from line to line, in sizes
+constexpr double kNarrowestHead = 480.0;
 constexpr double kLabelRoom = 26.0;  // left of the strings, for the number of the first fret
 
 constexpr std::string_view kWire = "#999999";
@@ -119,11 +124,13 @@ private:
         }
     }
 
-    /// A third letter makes all of them smaller.
     void SayTone(const GChChordElem& elem, std::size_t string, double y) {
         const std::string text = DotText(mGrid, string, mStyle.mDots);
-        const double letters = std::max(kDotLetters, static_cast<double>(CountCharacters(text)));
-        Say(elem, string, y, text, kDotTextSize * kDotLetters / letters);
+        const std::size_t letters = CountCharacters(text);
+        Say(elem, string, y, text,
+            letters <= 2   ? kDotTextSize
+            : letters == 3 ? kSizeOfThreeOnDot
+                           : kSmallestOnDot);
     }
 
     void Say(const GChChordElem& elem, std::size_t string, double y, std::string_view text,
@@ -149,6 +156,7 @@ private:
 std::string SmallText(const CChordGrid& grid) {
     std::string text = FretsText(grid);
     if (grid.mCapo > 0) text += fmt::format(", capo {}", grid.mCapo);
+    if (!grid.mSounds.empty()) text += ", sounds " + grid.mSounds;
     const std::string tuning = TuningTitle(grid);
     return tuning.empty() ? text : text + ", " + tuning;
 }
@@ -171,6 +179,36 @@ CGridPlace CellFor(const std::vector<CChordGrid>& grids) {
     return {cell.mWidth + 24.0, cell.mHeight + 72.0};
 }
 
+/// A text in lines of at most that width; a longer word has a line of its own.
+std::vector<std::string> BrokenLines(const std::string& text, double width, double size) {
+    std::vector<std::string> lines(1);
+    std::istringstream words(text);
+    for (std::string word; words >> word;) {
+        std::string& line = lines.back();
+        const std::string longer = line.empty() ? word : line + ' ' + word;
+        if (line.empty() || TextWidth(longer, size) <= width) {
+            line = longer;
+        } else {
+            lines.push_back(word);
+        }
+    }
+    return lines;
+}
+
+/// Draws what stands above the diagrams, its first text in bold, and gives where these begin.
+double DrawHead(CSvg& svg, const std::vector<std::string>& head, double width) {
+    double y = kMarginOfGrids;
+    for (std::size_t i = 0; i < head.size(); ++i) {
+        const std::string_view color = i == 0 ? kInk : kFaintInk;
+        for (const std::string& line : BrokenLines(head[i], width, kHeadSize)) {
+            svg.Text(kMarginOfGrids, y + kHeadSize, line,
+                     {.mSize = kHeadSize, .mColor = color, .mBold = i == 0});
+            y += kHeadSize * kLinesOfHead;
+        }
+    }
+    return head.empty() ? y : y + kHeadSize;
+}
+
 }  // namespace
 
 void DrawGrid(CSvg& svg, const CChordGrid& grid, double left, double top, double scale,
@@ -179,12 +217,17 @@ void DrawGrid(CSvg& svg, const CChordGrid& grid, double left, double top, double
 }
 
 std::string GridsSvg(const std::vector<CChordGrid>& grids, std::string_view title,
-                     const CGridStyle& style) {
+                     const CGridStyle& style, const std::vector<std::string>& head) {
     const CGridPlace cell = CellFor(grids);
+    const std::size_t count = std::max<std::size_t>(grids.size(), 1);
+    const double columns = static_cast<double>(std::min(count, kGridsPerLine));
+    const double rows = static_cast<double>((count + kGridsPerLine - 1) / kGridsPerLine);
+    const double width = std::max(cell.mWidth * columns, head.empty() ? 0.0 : kNarrowestHead);
     CSvg svg;
+    const double begin = DrawHead(svg, head, width);
     for (std::size_t i = 0; i < grids.size(); ++i) {
         const double left = kMarginOfGrids + cell.mWidth * static_cast<double>(i % kGridsPerLine);
-        const double top = kMarginOfGrids + cell.mHeight * static_cast<double>(i / kGridsPerLine);
+        const double top = begin + cell.mHeight * static_cast<double>(i / kGridsPerLine);
         const double neck = left + kLabelRoom;
         svg.Text(neck, top + kNameSize, NamesText(grids[i]),
                  {.mSize = kNameSize, .mColor = kInk, .mBold = true});
@@ -192,11 +235,8 @@ std::string GridsSvg(const std::vector<CChordGrid>& grids, std::string_view titl
                  {.mSize = kSizeOfLabels, .mColor = kFaintInk});
         DrawGrid(svg, grids[i], neck, top + kNameSize + 36, 1.0, style);
     }
-    const std::size_t count = std::max<std::size_t>(grids.size(), 1);
-    const auto columns = static_cast<double>(std::min(count, kGridsPerLine));
-    const auto rows = static_cast<double>((count + kGridsPerLine - 1) / kGridsPerLine);
-    return svg.File(cell.mWidth * columns + 2 * kMarginOfGrids,
-                    cell.mHeight * rows + 2 * kMarginOfGrids, title);
+    return svg.File(width + 2 * kMarginOfGrids, begin + cell.mHeight * rows + kMarginOfGrids,
+                    title);
 }
 
 }  // namespace brindle

@@ -21,8 +21,10 @@ inline constexpr double kGridFretGap = 20.0;
 void DrawGrid(CSvg& svg, const CChordGrid& grid, double left, double top, double scale,
               const CGridStyle& style = {});
 
-/// A sheet of diagrams.
+/// A sheet of diagrams. Above them stand the lines of `head`, broken where the sheet ends; the
+/// title is read out and not drawn.
 [[nodiscard]] std::string GridsSvg(const std::vector<CChordGrid>& grids, std::string_view title,
-                                   const CGridStyle& style = {});
+                                   const CGridStyle& style = {},
+                                   const std::vector<std::string>& head = {});
 
 }  // namespace brindle

@@ -125,6 +125,7 @@ TBlock HeadOf(const CChordGrid& grid) {
     const std::string tuning = TuningTitle(grid);
     if (!tuning.empty()) head.push_back(tuning);
     if (grid.mCapo > 0) head.push_back(fmt::format("capo {}", grid.mCapo));
+    if (!grid.mSounds.empty()) head.push_back("sounds " + grid.mSounds);
     return head;
 }
 

@@ -2,6 +2,7 @@
 #include "brindle/present/SongGrids.h"
 
 #include "brindle/chords/WriteChordSymbol.h"
+#include "brindle/present/GridsSvg.h"
 #include "brindle/present/GridsText.h"
 #include "brindle/present/internal/GridValues.h"
 
@@ -49,6 +50,15 @@ std::string CapoText(const CShownCapo& capo) {
                        fmt::join(capo.mShapes, " "), capo.mDifficulty, holes);
 }
 
+/// The places of the capodaster that are told, the best one first.
+std::vector<std::string> CapoTexts(const CShownSongGrids& song) {
+    std::vector<std::string> texts;
+    for (std::size_t i = 0; i < std::min(song.mCapos.size(), kShownCapos); ++i) {
+        texts.push_back(CapoText(song.mCapos[i]));
+    }
+    return texts;
+}
+
 Json CapoToJson(const CShownCapo& capo) {
     return {{"Capo", capo.mCapo},
             {"Cost", capo.mCost},
@@ -77,6 +87,7 @@ CShownSongGrids MakeSongGrids(std::span<const CChordLite> chords,
         if (fingering.mStringCount == 0) continue;
         CChordGrid grid = GridOfFingering(symbols[i], fingering, chords[i]);
         grid.mName = names[i];
+        if (grid.mCapo > 0) grid.mSounds = symbols[i];
         const auto [row, isNew] =
             gridOf.try_emplace({symbols[i], grid.mFrets}, shown.mGrids.size());
         if (isNew) shown.mGrids.push_back(std::move(grid));
@@ -116,13 +127,16 @@ TChordGrids GridsBySymbol(const CShownSongGrids& song) {
 std::string SongGridsText(const CShownSongGrids& song, const CPaint& paint,
                           const CGridStyle& style) {
     std::string text;
-    const std::size_t count = std::min(song.mCapos.size(), kShownCapos);
-    for (std::size_t i = 0; i < count; ++i) {
-        const std::string line = CapoText(song.mCapos[i]);
-        text += (i == 0 ? paint.Strong(line) : paint.Faint(line)) + '\n';
+    for (const std::string& line : CapoTexts(song)) {
+        text += (text.empty() ? paint.Strong(line) : paint.Faint(line)) + '\n';
     }
     if (song.mGrids.empty()) return text;
     return text + '\n' + GridsText(song.mGrids, paint, style);
+}
+
+std::string SongGridsSvg(const CShownSongGrids& song, std::string_view title,
+                         const CGridStyle& style) {
+    return GridsSvg(song.mGrids, title, style, CapoTexts(song));
 }
 
 std::string SongGridsJson(const CShownSongGrids& song, const CGridStyle& style) {

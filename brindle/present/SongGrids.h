@@ -10,6 +10,7 @@
 #include <optional>
 #include <span>
 #include <string>
+#include <string_view>
 #include <vector>
 
 namespace brindle {
@@ -59,6 +60,9 @@ enum class TSongCapo : std::uint8_t {
 /// The capo and what it makes easier, the way of the chords, and the diagrams.
 [[nodiscard]] std::string SongGridsText(const CShownSongGrids& song, const CPaint& paint,
                                         const CGridStyle& style);
+/// The same as a picture.
+[[nodiscard]] std::string SongGridsSvg(const CShownSongGrids& song, std::string_view title,
+                                       const CGridStyle& style = {});
 /// The same as JSON, with all places of the capo.
 [[nodiscard]] std::string SongGridsJson(const CShownSongGrids& song, const CGridStyle& style = {});
 

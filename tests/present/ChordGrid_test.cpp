@@ -8,6 +8,8 @@
 #include "brindle/present/GridsJson.h"
 #include "brindle/present/GridsSvg.h"
 #include "brindle/present/GridsText.h"
+#include "brindle/present/SongGrids.h"
+#include "brindle/song/ReadSong.h"
 
 #include <doctest/doctest.h>
 
@@ -225,8 +227,31 @@ TEST_CASE("Degrees of three letters have room") {
     const std::string text = GridsText(grids, CPaint(false), style);
     CHECK(text.find("|   |   #11 |") != std::string::npos);
     const std::string svg = GridsSvg(grids, "C", style);
-    CHECK(svg.find("font-size=\"5.3") != std::string::npos);
+    CHECK(svg.find("font-size=\"6.4\" ") != std::string::npos);
     CHECK(svg.find("font-size=\"8\" ") != std::string::npos);
+}
+
+TEST_CASE("A song tells above its diagrams where the capo lies, and what its shapes sound") {
+    const CSong song = ReadSong("Bb F | Gm Eb");
+    const auto shown = MakeSongGrids(song, kGChStandardGuitar, {}, TSongCapo::Easiest);
+    const std::string text = SongGridsText(shown, CPaint(false), {});
+    CHECK(text.find("capo 3: G D Em C (difficulty 1.8)\n") == 0);
+    CHECK(text.find("\nsounds Bb ") != std::string::npos);
+    const std::string svg = SongGridsSvg(shown, "Song");
+    CHECK(svg.find(">capo 3: G D Em C (difficulty 1.8)<") != std::string::npos);
+    CHECK(svg.find(">022000, capo 3, sounds Gm<") != std::string::npos);
+    // Lines are broken where the sheet ends.
+    std::string many;
+    for (const char* root : {"C", "D", "Eb", "E", "F", "F#", "G", "Ab", "A", "Bb", "B"}) {
+        for (const char* kind : {" ", "m7 ", "maj7 ", "7 "}) many += std::string(root) + kind;
+    }
+    const auto all = MakeSongGrids(ReadSong(many), kGChStandardGuitar, {}, TSongCapo::Told);
+    const std::string sheet = SongGridsSvg(all, "Song");
+    const std::size_t first = sheet.find(">no capo: C Cm7 ");
+    REQUIRE(first != std::string::npos);
+    CHECK(sheet.find("Bmaj7 B7 (difficulty") > sheet.find("<text", first));
+    const auto plain = MakeSongGrids(song, kGChStandardGuitar, {}, TSongCapo::Told);
+    CHECK(SongGridsText(plain, CPaint(false), {}).find("sounds") == std::string::npos);
 }
 
 TEST_CASE("For the left hand the lowest string stands on the right") {
