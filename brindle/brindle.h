@@ -212,6 +212,7 @@
 #include "brindle/present/MarkovSequencesText.h"
 #include "brindle/present/MarkovText.h"
 #include "brindle/present/MidiFile.h"
+#include "brindle/present/ModelSongsText.h"
 #include "brindle/present/NamedChordsText.h"
 #include "brindle/present/NamesOfNotes.h"
 #include "brindle/present/NetText.h"

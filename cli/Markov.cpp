@@ -74,6 +74,7 @@ void AddMarkov(CCommand& program) {
     AddMarkovShow(markov);
     AddMarkovNext(markov);
     AddMarkovScore(markov);
+    AddMarkovListSongs(markov);
 }
 
 }  // namespace brindle::cli

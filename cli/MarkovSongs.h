@@ -76,5 +76,6 @@ struct CTaughtFiles {
 
 void AddMarkovNext(CCommand& markov);
 void AddMarkovScore(CCommand& markov);
+void AddMarkovListSongs(CCommand& markov);
 
 }  // namespace brindle::cli

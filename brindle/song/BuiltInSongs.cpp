@@ -40,6 +40,13 @@ std::vector<std::string> BuiltInStyles() {
     return {styles.begin(), styles.end()};
 }
 
+std::string_view BuiltInMakersOf(std::string_view title, std::string_view style) {
+    for (const CBuiltInSongRow& row : BuiltInSongRows()) {
+        if (title == row.mTitle && style == row.mStyle) return row.mMakers;
+    }
+    return {};
+}
+
 CSongModel BuiltInSongModel(std::string_view style) {
     std::vector<CTaughtSong> songs;
     for (const CBuiltInSongRow& row : BuiltInSongRows()) {

@@ -18,6 +18,10 @@ namespace brindle {
 /// The styles of the built-in songs, in alphabetic order.
 [[nodiscard]] std::vector<std::string> BuiltInStyles();
 
+/// Who made a built-in song, with years, "Scott Joplin (1868-1917), 1901"; empty for a song that is
+/// not built in.
+[[nodiscard]] std::string_view BuiltInMakersOf(std::string_view title, std::string_view style);
+
 /// A model of the built-in songs of a style, of all without one; empty for a style that is none.
 [[nodiscard]] CSongModel BuiltInSongModel(std::string_view style = {});
 

@@ -62,6 +62,7 @@ MORE_COMMANDS = [
     "markov learn --json -o {folder}/songs.json examples/songs leadsheets",
     "markov generate --seed 1 --json",
     'markov next "Dm7 G7" --json',
+    "markov songs --json",
     "markov score built-in --json",
     "corpus examples/songs examples/scores leadsheets",
     "corpus examples/songs no-such-file examples/scores/SOURCE.txt",

@@ -126,9 +126,6 @@ constexpr auto kBuiltInSongs = std::to_array<CBuiltInSongRow>({
      "G | G6 E7 | Am7 | D7 | G | C7 | Bm7 E7 | Am7 D7 | G | G7 | C | Cm6 | Em | A7 | Am7 | "
      "D7 | B7 | B7 | Em | Em | A7 | A7 | D7 | D7 | G | G6 E7 | Am7 | D7 | G7 | C Cm6 | G "
      "D7 | G"},
-    {"early jazz", "Squeeze Me", "Fats Waller (1904-1943), 1925", "F major", 4, 0,
-     "F | F | G7 | G7 | C7 | C7 | F | C7 | F | F7 | Bb | Bbm6 | F D7 | G7 C7 | F D7 | Gm7 "
-     "C7"},
     {"early jazz", "Limehouse Blues", "Philip Braham (1881-1934), 1921", "Ab major", 4, 0,
      "Db7 | Db7 | Db7 | Db7 | Bb7 | Bb7 | Bb7 | Bb7 | Ab | Ab | C7 | Fm | Bb7 | Bb7 | Eb7 "
      "| Eb7 | Db7 | Db7 | Db7 | Db7 | Bb7 | Bb7 | Bb7 | Bb7 | Ab | F7 | Bbm | Bbm | Bb7 | "
@@ -157,7 +154,7 @@ constexpr auto kBuiltInSongs = std::to_array<CBuiltInSongRow>({
      "E | B7 | A | A | E B7 | E A | E | B7"},
     {"blues", "Eight Bars with a Diminished Chord", "Traditional", "G major", 4, 0,
      "G | B7 | C7 | C#o7 | G E7 | A7 D7 | G C7 | G D7"},
-    {"blues", "Good Morning Blues", "Traditional", "G major", 4, 0,
+    {"blues", "Twelve Bars in Sevenths", "Traditional", "G major", 4, 0,
      "G7 | C7 | G7 | G7 | C7 | C7 | G7 | G7 | D7 | C7 | G7 C7 | G7 D7"},
     {"hymn", "Amazing Grace", "Traditional", "", 4, 1,
      "G | G7/B | C | G | G | Em | A7 | D7 | G | G7/B | C | G/D | Em | D7 | G | G"},
