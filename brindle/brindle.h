@@ -249,6 +249,7 @@
 #include "brindle/song/HarmonySymbols.h"
 #include "brindle/song/LearnSong.h"
 #include "brindle/song/NextChords.h"
+#include "brindle/song/ParseSong.h"
 #include "brindle/song/ReadSheetSong.h"
 #include "brindle/song/ReadSong.h"
 #include "brindle/song/ReadSongHarmony.h"

@@ -19,6 +19,7 @@
 #include "brindle/present/ReadingText.h"
 #include "brindle/present/ShownNames.h"
 #include "brindle/present/SongGrids.h"
+#include "brindle/song/AnalyseSong.h"
 #include "brindle/song/ReadSongHarmony.h"
 #include "brindle/song/SheetTimes.h"
 
@@ -115,14 +116,14 @@ std::optional<std::string> Contradiction(const CAnalyseOptions& options) {
 
 /// A song that has been analysed, and what its presentations need beside that.
 struct CAnalysedSong {
-    CHarmonicAnalyse mAnalyse;
-    CHarmAnlsCenters mReadings;
-    std::optional<CChordSymbols> mSymbols;
-    std::optional<TMusicXMLDoc> mSheet;
-    double mBeatsPerBar = 4.0;
-    /// As it is played; without chords for a score in another timing.
+    /// As it is played.
     CSong mSong;
     CSongReading mReading;
+    CHarmonicAnalyse mAnalyse;
+    CChordSymbols mSymbols;
+    CHarmAnlsCenters mReadings;
+    /// Of a score, in the timing that is asked for.
+    std::optional<TMusicXMLDoc> mSheet;
     /// Empty if they were not asked for.
     std::vector<std::string> mExplanations;
 };
@@ -130,16 +131,16 @@ struct CAnalysedSong {
 CShownSong SongOf(const CAnalysedSong& analysed, const CAnalyseOptions& options) {
     const CHarmAnlsCenters* readings = options.mReadings ? &analysed.mReadings : nullptr;
     if (analysed.mSheet) {
-        return MakeSong(analysed.mAnalyse, readings, *analysed.mSymbols, *analysed.mSheet);
+        return MakeSong(analysed.mAnalyse, readings, analysed.mSymbols, *analysed.mSheet);
     }
-    return MakeSong(analysed.mAnalyse, readings, *analysed.mSymbols, analysed.mBeatsPerBar);
+    return MakeSong(analysed.mAnalyse, readings, analysed.mSymbols, analysed.mSong.mBeatsPerBar);
 }
 
 CShownKeys KeysOf(const CAnalysedSong& analysed, const CNumeralOptions& numerals) {
     const double beatsPerBar =
-        analysed.mSheet ? BeatsPerBarOf(*analysed.mSheet) : analysed.mBeatsPerBar;
-    return MakeSongKeys(analysed.mAnalyse.mChords, *analysed.mSymbols,
-                        {.mBeatsPerBar = beatsPerBar}, numerals);
+        analysed.mSheet ? BeatsPerBarOf(*analysed.mSheet) : analysed.mSong.mBeatsPerBar;
+    return MakeSongKeys(analysed.mAnalyse.mChords, analysed.mSymbols, {.mBeatsPerBar = beatsPerBar},
+                        numerals);
 }
 
 /// The fingerings of a guitar that are near each other, for each symbol.
@@ -148,7 +149,7 @@ TChordGrids GridsOf(const CAnalysedSong& analysed, int capo) {
     std::vector<std::string> symbols;
     for (const CHarmAnlsChordWithPos& chord : analysed.mAnalyse.mChords) {
         chords.push_back(chord);
-        symbols.push_back(analysed.mSymbols->SymbolOf(chord));
+        symbols.push_back(analysed.mSymbols.SymbolOf(chord));
     }
     CSongFingeringOptions choice;
     choice.mFingering.mCapo = capo;
@@ -187,7 +188,7 @@ std::string AnalysedJson(const CAnalysedSong& analysed, const CAnalyseOptions& o
     return AnalysisJson(
         analysed.mAnalyse, options.mReadings ? &analysed.mReadings : nullptr,
         [&](const CHarmAnlsChordWithPos& chord) -> const std::string& {
-            return analysed.mSymbols->SymbolOf(chord);
+            return analysed.mSymbols.SymbolOf(chord);
         },
         KeysOf(analysed, options.mNumerals), analysed.mSheet ? &*analysed.mSheet : nullptr,
         isPlayed ? &read : nullptr);
@@ -204,7 +205,7 @@ std::string Present(const CAnalysedSong& analysed, const CAnalyseOptions& option
         }
         case TFormat::Svg: {
             CShownSong song = SongOf(analysed, options);
-            song.mCopies = MakeSongCopies(analysed.mAnalyse, *analysed.mSymbols);
+            song.mCopies = MakeSongCopies(analysed.mAnalyse, analysed.mSymbols);
             if (!analysed.mSong.mChords.empty()) {
                 song.mKeys = MakeSongKeys(analysed.mSong, analysed.mReading);
             }
@@ -217,7 +218,7 @@ std::string Present(const CAnalysedSong& analysed, const CAnalyseOptions& option
     return Text(analysed, options);
 }
 
-TStatus AnalyseText(const CTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
+TStatus AnalyseText(const CTypedSong& typed, const CSignKeyLite& key,
                     const CAnalyseOptions& options, CAnalysedSong& analysed) {
     TChordStringParse parse;
     parse.mBeatsPerBar = options.mBeatsPerBar;
@@ -225,14 +226,13 @@ TStatus AnalyseText(const CTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
     parse.mChordNamePrefs = NamePrefs();
     CTypedChords reading = options.mReading;
     if (options.mFormat.Format() == TFormat::Native) reading.UseNative();
-    if (!signKeys.empty()) reading.UseKey(signKeys.front().mSignKey);
-    const auto song = reading.ReadSongOrFail(typed, parse);
+    reading.UseKey(key);
+    auto song = reading.ReadSongOrFail(typed, parse);
     if (!song) return TStatus::BadInput;
-    analysed.mAnalyse.AnalyseFromChords(
-        song->mChords, signKeys.empty() ? song->mStatedKeys : signKeys, RouteOf(options.mRoute));
-    analysed.mSymbols = song->mSymbols;
-    analysed.mBeatsPerBar = song->mBeatsPerBar;
-    analysed.mSong = song->mSong;
+    StateKey(key, *song);
+    analysed.mSong = std::move(*song);
+    analysed.mAnalyse = FindCenters(analysed.mSong, RouteOf(options.mRoute));
+    analysed.mSymbols = CChordSymbols(analysed.mSong.mSymbols, analysed.mSong.mChords);
     return TStatus::Success;
 }
 
@@ -247,7 +247,7 @@ void ReadScore(const CTypedSong& typed, const CAnalyseOptions& options, CAnalyse
     }
 }
 
-TStatus AnalyseScore(const CTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
+TStatus AnalyseScore(const CTypedSong& typed, const CSignKeyLite& key,
                      const CAnalyseOptions& options, CAnalysedSong& analysed) {
     ReadScore(typed, options, analysed);
     if (!analysed.mSheet) return TStatus::BadInput;
@@ -260,22 +260,18 @@ TStatus AnalyseScore(const CTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
                         "them",
                         Printable(typed.mName)));
     }
-    if (!signKeys.empty()) sheet.HarmSignKeys = signKeys;
+    StateKey(key, analysed.mSong);
+    if (!key.IsUndef()) sheet.HarmSignKeys = analysed.mSong.mStatedKeys;
     CHarmonicAnalyse& analyse = analysed.mAnalyse;
     analyse.AnalyseFromMusicXMLDoc(sheet, RouteOf(options.mRoute));
     analyse.mChords = WithRests(analyse.mChords, sheet);
-    analysed.mSymbols.emplace(sheet, analyse.mChords);
+    analysed.mSymbols = CChordSymbols(sheet, analyse.mChords);
     return TStatus::Success;
 }
 
-void ReadHarmonyOf(CAnalysedSong& analysed, const CHarmAnlsSignKeys& signKeys,
+void ReadHarmonyOf(CAnalysedSong& analysed, const CSignKeyLite& key,
                    const CAnalyseOptions& options) {
-    CReadingOptions reading;
-    if (!signKeys.empty()) {
-        reading.mStatedKey = signKeys.front().mSignKey;
-        analysed.mSong.mStatedKey = reading.mStatedKey;
-    }
-    analysed.mReading = ReadSongHarmony(analysed.mSong, reading);
+    analysed.mReading = ReadSongHarmony(analysed.mSong, {.mStatedKey = key});
     if (options.mExplain) analysed.mExplanations = Explain(analysed.mSong, analysed.mReading);
     // In JSON the keys have other numerals, and the reading stays as it is described.
     if (options.mFormat.Format() == TFormat::Json) return;
@@ -283,13 +279,13 @@ void ReadHarmonyOf(CAnalysedSong& analysed, const CHarmAnlsSignKeys& signKeys,
         WithNumerals(std::move(analysed.mReading), analysed.mSong.mChords, options.mNumerals);
 }
 
-TSongOutput AnalysisOf(const CTypedSong& typed, const CHarmAnlsSignKeys& signKeys,
+TSongOutput AnalysisOf(const CTypedSong& typed, const CSignKeyLite& key,
                        const CAnalyseOptions& options) {
     CAnalysedSong analysed;
-    const TStatus status = typed.mIsScore ? AnalyseScore(typed, signKeys, options, analysed)
-                                          : AnalyseText(typed, signKeys, options, analysed);
+    const TStatus status = typed.mIsScore ? AnalyseScore(typed, key, options, analysed)
+                                          : AnalyseText(typed, key, options, analysed);
     if (status != TStatus::Success) return status;
-    ReadHarmonyOf(analysed, signKeys, options);
+    ReadHarmonyOf(analysed, key, options);
     if (IsLeadSheet(options)) {
         return options.mSheetPicture.Draw(analysed.mSong, analysed.mReading);
     }
@@ -304,17 +300,14 @@ TStatus Analyse(const CAnalyseOptions& options) {
     if (const auto contradiction = Contradiction(options)) {
         return Fail(TStatus::BadUsage, *contradiction);
     }
-    CHarmAnlsSignKeys signKeys;
+    CSignKeyLite key;
     if (!options.mKey.empty()) {
-        const auto key = ReadKeyOption(options.mKey);
-        if (!key) return TStatus::BadUsage;
-        CHarmAnlsSignKey given;
-        given.mPosition = 0.0;
-        given.mSignKey = *key;
-        signKeys.push_back(given);
+        const auto typed = ReadKeyOption(options.mKey);
+        if (!typed) return TStatus::BadUsage;
+        key = *typed;
     }
     return options.mSongs.Print(options.mFormat.Format(), [&](const CTypedSong& song) {
-        return AnalysisOf(song, signKeys, options);
+        return AnalysisOf(song, key, options);
     });
 }
 

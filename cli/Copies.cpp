@@ -6,6 +6,7 @@
 
 #include "brindle/analysis/TChordStringParse.h"
 #include "brindle/present/AnalysisSvg.h"
+#include "brindle/present/CChordSymbols.h"
 #include "brindle/present/CopiesText.h"
 #include "brindle/present/MakeSongCopies.h"
 #include "brindle/present/ShownNames.h"
@@ -45,12 +46,13 @@ TSongOutput CopiesOf(const CTypedSong& typed, const CCopiesOptions& options) {
     const auto song = options.mReading.ReadSongOrFail(typed, parse);
     if (!song) return TStatus::BadInput;
     const TFormat format = options.mFormat.Format();
-    if (format == TFormat::Text) return RepeatsText(song->mSong, PaintOfOutput());
+    if (format == TFormat::Text) return RepeatsText(*song, PaintOfOutput());
     CHarmonicAnalyse chordsOnly;
     chordsOnly.mChords = song->mChords;
-    std::vector<CShownCopy> copies = MakeSongCopies(chordsOnly, song->mSymbols);
-    if (format == TFormat::Json) return CopiesJson(copies, song->mSong);
-    CShownSong shown = MakeSong(chordsOnly, nullptr, song->mSymbols, song->mBeatsPerBar);
+    const CChordSymbols symbols(song->mSymbols, song->mChords);
+    std::vector<CShownCopy> copies = MakeSongCopies(chordsOnly, symbols);
+    if (format == TFormat::Json) return CopiesJson(copies, *song);
+    CShownSong shown = MakeSong(chordsOnly, nullptr, symbols, song->mBeatsPerBar);
     shown.mCopies = std::move(copies);
     return AnalysisSvg(shown);
 }

@@ -62,7 +62,7 @@ TSongOutput GridsOf(const CTypedSong& typed, const GChShortTuning& tuning,
     std::vector<std::string> symbols;
     for (std::size_t i = 0; i + 1 < song->mChords.size(); ++i) {
         chords.push_back(song->mChords[i]);
-        symbols.push_back(song->mSymbols.SymbolOf(song->mChords[i]));
+        symbols.push_back(i < song->mSymbols.size() ? Printable(song->mSymbols[i]) : "");
     }
     const CShownSongGrids shown = MakeSongGrids(chords, symbols, SongsOf(chords, tuning, options));
     const CGridStyle style = options.mFingering.Style();

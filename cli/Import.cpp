@@ -19,7 +19,6 @@
 #include <fmt/format.h>
 
 #include <algorithm>
-#include <functional>
 #include <memory>
 #include <optional>
 #include <string>
@@ -68,37 +67,6 @@ private:
     int mCount = 0;
 };
 
-/// One method that calls two.
-template <class... Arguments>
-std::function<void(Arguments...)> Both(std::function<void(Arguments...)> first,
-                                       std::function<void(Arguments...)> second) {
-    if (!first || !second) return first ? first : second;
-    return [first = std::move(first), second = std::move(second)](Arguments... arguments) {
-        first(arguments...);
-        second(arguments...);
-    };
-}
-
-// The methods that an imported score has are called beside those that write lines.
-MusicXmlParserDelegate Both(const MusicXmlParserDelegate& lines,
-                            const MusicXmlParserDelegate& score) {
-    MusicXmlParserDelegate both = lines;
-    const auto join = [&](auto method) { both.*method = Both(lines.*method, score.*method); };
-    join(&MusicXmlParserDelegate::didEncounterPartStart);
-    join(&MusicXmlParserDelegate::didEncounterPartEnd);
-    join(&MusicXmlParserDelegate::didEncounterMeasureEnd);
-    join(&MusicXmlParserDelegate::didEncounterSignTime);
-    join(&MusicXmlParserDelegate::didEncounterSignKey);
-    join(&MusicXmlParserDelegate::didEncounterClef);
-    join(&MusicXmlParserDelegate::didEncounterTranspose);
-    join(&MusicXmlParserDelegate::didEncounterTempoChange);
-    join(&MusicXmlParserDelegate::didEncounterDirection);
-    join(&MusicXmlParserDelegate::didEncounterNote);
-    join(&MusicXmlParserDelegate::didPlayNote);
-    join(&MusicXmlParserDelegate::didLeaveTieOpen);
-    return both;
-}
-
 // False with an error; nothing when standard input cannot be read.
 std::optional<bool> ImportFrom(const std::string& file, const MusicXmlParserDelegate& host,
                                Error& error) {
@@ -114,23 +82,12 @@ std::optional<bool> ImportFrom(const std::string& file, const MusicXmlParserDele
 }
 
 /// The same, and a terminal shows how many bars of all parts have been read.
-std::optional<bool> ImportWithProgress(const std::string& file, MusicXmlParserDelegate host,
+std::optional<bool> ImportWithProgress(const std::string& file, const MusicXmlParserDelegate& host,
                                        Error& error) {
     CCountProgress progress(InputName(file), "bars");
-    host.didEncounterMeasureStart =
-        Both(std::move(host.didEncounterMeasureStart),
-             std::function<void(std::int32_t)>([&progress](std::int32_t) { progress.CountOne(); }));
-    return ImportFrom(file, host, error);
-}
-
-std::string ResultLine(bool isOk, const Error& error) {
-    Json line{{"call", "result"}, {"ok", isOk}};
-    if (!isOk) {
-        line["domain"] = error.domain;
-        line["code"] = error.code;
-        line["description"] = error.description;
-    }
-    return DumpJson(line) + '\n';
+    MusicXmlParserDelegate counter;
+    counter.didEncounterMeasureStart = [&progress](std::int32_t) { progress.CountOne(); };
+    return ImportFrom(file, TellBoth(host, counter), error);
 }
 
 std::string HeadOf(const std::string& name, bool isFirst, const CImportOptions& options) {
@@ -161,17 +118,17 @@ CImported ImportFile(const std::string& file, const CImportOptions& options) {
     if (options.IsNdjson()) {
         const auto lines = MuxmlJsonLines(
             TMuxmlEnumForm_Word, [&output](const std::string& line) { output += line + '\n'; });
-        methods = options.mMidiFile ? Both(lines, methods) : lines;
+        methods = options.mMidiFile ? TellBoth(lines, methods) : lines;
     }
     Error error;
-    const auto isOk = ImportWithProgress(file, std::move(methods), error);
+    const auto isOk = ImportWithProgress(file, methods, error);
     if (!isOk) return {};
     if (!*isOk) Fail(TStatus::BadInput, fmt::format("{}: {}", name, Printable(error.description)));
     if (*isOk && options.mMidiFile && WriteMidi(score, *options.mMidiFile) != TStatus::Success) {
         return {};
     }
     const TStatus status = *isOk && alerts.Count() == 0 ? TStatus::Success : TStatus::BadInput;
-    if (options.IsNdjson()) return {status, output + ResultLine(*isOk, error)};
+    if (options.IsNdjson()) return {status, output + MuxmlResultLine(*isOk, error) + '\n'};
     if (!*isOk) return {};
     return {status, ImportText(score, PaintOfOutput())};
 }

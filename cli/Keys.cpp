@@ -2,20 +2,19 @@
 #include "cli/ChordTextOptions.h"
 #include "cli/CommandLine.h"
 #include "cli/KeyText.h"
-#include "cli/LeadSheet.h"
 #include "cli/TypedChords.h"
 #include "cli/TypedSongs.h"
 
-#include "brindle/analysis/CHarmonicAnalyse.h"
 #include "brindle/analysis/TChordStringParse.h"
 #include "brindle/present/CChordSymbols.h"
 #include "brindle/present/KeysJson.h"
 #include "brindle/present/KeysSvg.h"
 #include "brindle/present/MakeSongKeys.h"
 #include "brindle/present/ReadingText.h"
+#include "brindle/present/ShowSong.h"
 #include "brindle/present/ShownNames.h"
+#include "brindle/song/AnalyseSong.h"
 #include "brindle/song/ReadSongHarmony.h"
-#include "brindle/song/SheetTimes.h"
 
 #include <memory>
 #include <optional>
@@ -62,69 +61,42 @@ std::optional<std::string> Contradiction(const CKeysOptions& options) {
     return std::nullopt;
 }
 
-/// A song, and its keys made ready for the eye.
-struct CSongWithKeys {
-    CSong mSong;
-    CShownSong mShown;
-};
-
-// Nothing when the text is not understood; then the error has been printed.
-std::optional<CSongWithKeys> SongOfText(const CTypedSong& typed, const CSignKeyLite& key,
-                                        const CKeysOptions& options) {
+// Nothing when it cannot be read; then the error has been printed.
+std::optional<CSong> SongOf(const CTypedSong& typed, const CSignKeyLite& key,
+                            const CKeysOptions& options) {
+    if (typed.mIsScore) return ReadScore(typed);
     TChordStringParse parse;
     parse.mBeatsPerBar = options.mKeys.mBeatsPerBar;
     parse.mBeatsPerChord = options.mBeatsPerChord;
     parse.mChordNamePrefs = NamePrefs();
     CTypedChords reading = options.mReading;
     reading.UseKey(key);
-    auto read = reading.ReadSongOrFail(typed, parse);
-    if (!read) return std::nullopt;
-    CHarmonicAnalyse chordsOnly;
-    chordsOnly.mChords = std::move(read->mChords);
-    CShownSong song = MakeSong(chordsOnly, nullptr, read->mSymbols, read->mBeatsPerBar);
-    CKeyOptions keyOptions = options.mKeys;
-    keyOptions.mBeatsPerBar = read->mBeatsPerBar;
-    song.mKeys = MakeSongKeys(chordsOnly.mChords, read->mSymbols, keyOptions, options.mNumerals);
-    return CSongWithKeys{std::move(read->mSong), std::move(song)};
+    return reading.ReadSongOrFail(typed, parse);
 }
 
-std::optional<CSongWithKeys> SongOfScore(const CTypedSong& typed, const CKeysOptions& options) {
-    auto read = ReadPlayedSheet(typed);
-    if (!read) return std::nullopt;
-    const TMusicXMLDoc& sheet = read->mSheet;
-    CHarmonicAnalyse chordsOnly;
-    chordsOnly.AnalyseFromMusicXMLDoc(sheet, TAnalyse_None);
-    chordsOnly.mChords = WithRests(chordsOnly.mChords, sheet);
-    const CChordSymbols symbols(sheet, chordsOnly.mChords);
-    CShownSong song = MakeSong(chordsOnly, nullptr, symbols, sheet);
-    CKeyOptions keyOptions = options.mKeys;
-    keyOptions.mBeatsPerBar = BeatsPerBarOf(sheet);
-    song.mKeys = MakeSongKeys(chordsOnly.mChords, symbols, keyOptions, options.mNumerals);
-    return CSongWithKeys{std::move(read->mSong), std::move(song)};
+std::string AsJson(const CSong& song, const CSongReading& reading, const CKeysOptions& options) {
+    CKeyOptions keys = options.mKeys;
+    keys.mBeatsPerBar = song.mBeatsPerBar;
+    const CReadSong read{song, reading};
+    const CChordSymbols symbols(song.mSymbols, song.mChords);
+    return KeysJson(MakeSongKeys(song.mChords, symbols, keys, options.mNumerals), &read);
 }
 
-std::string Present(const CSongWithKeys& song, const CSongReading& reading,
-                    const CKeysOptions& options) {
+std::string Present(const CSong& song, const CSongReading& reading, const CKeysOptions& options) {
     const TFormat format = options.mFormat.Format();
-    const CReadSong read{song.mSong, reading};
-    if (format == TFormat::Json) return KeysJson(song.mShown.mKeys, &read);
+    if (format == TFormat::Json) return AsJson(song, reading, options);
     // The numerals of a reading are those of theory text. Others are asked for by options.
-    const CSongReading styled = WithNumerals(reading, song.mSong.mChords, options.mNumerals);
-    if (format == TFormat::Svg) {
-        CShownSong shown = song.mShown;
-        shown.mKeys = MakeSongKeys(song.mSong, styled);
-        return KeysSvg(shown);
-    }
-    return RegionsText(song.mSong, styled, {.mWidth = WidthOfOutput()}, PaintOfOutput());
+    const CSongReading styled = WithNumerals(reading, song.mChords, options.mNumerals);
+    if (format == TFormat::Svg) return KeysSvg(ShowKeys(song, styled));
+    return RegionsText(song, styled, {.mWidth = WidthOfOutput()}, PaintOfOutput());
 }
 
 TSongOutput KeysOf(const CTypedSong& typed, const CReadingOptions& readingOptions,
                    const CKeysOptions& options) {
-    auto song = typed.mIsScore ? SongOfScore(typed, options)
-                               : SongOfText(typed, readingOptions.mStatedKey, options);
+    auto song = SongOf(typed, readingOptions.mStatedKey, options);
     if (!song) return TStatus::BadInput;
-    if (!options.mKey.empty()) song->mSong.mStatedKey = readingOptions.mStatedKey;
-    return Present(*song, ReadSongHarmony(song->mSong, readingOptions), options);
+    StateKey(readingOptions.mStatedKey, *song);
+    return Present(*song, ReadSongHarmony(*song, readingOptions), options);
 }
 
 TStatus Keys(const CKeysOptions& options) {

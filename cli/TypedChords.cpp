@@ -8,11 +8,13 @@
 
 #include "brindle/analysis/TChordStringParse.h"
 #include "brindle/present/ShownNames.h"
+#include "brindle/song/ParseSong.h"
 
 #include <fmt/format.h>
 
 #include <algorithm>
 #include <array>
+#include <utility>
 
 namespace brindle::cli {
 namespace {
@@ -68,6 +70,11 @@ void PrintFault(std::string_view text, const CSongFault& fault, bool isWarning,
 
 }  // namespace
 
+std::optional<CSong> ReadScore(const CTypedSong& typed) {
+    auto read = ReadPlayedSheet(typed);
+    return read ? std::optional(std::move(read->mSong)) : std::nullopt;
+}
+
 void PrintFaults(std::string_view text, std::span<const CTextFault> faults, bool areWarnings,
                  std::string_view name) {
     const std::size_t count = std::min(faults.size(), kMostWarnings);
@@ -93,11 +100,6 @@ void CTypedChords::AddTo(CCommand& command, const std::string& fromPurpose) {
                       {"auto", "plain", "lyrics", "chordpro", "ireal", "strings", "romantext"},
                       fromPurpose);
     command.AddFlag("--even", mIsEven, "The chords of a bar without holds share it evenly");
-}
-
-bool CChordSong::HasFault() const {
-    return std::any_of(mFaults.begin(), mFaults.end(),
-                       [](const CSongFault& fault) { return !fault.mIsNote; });
 }
 
 std::optional<std::vector<CChordLite>> CTypedChords::ReadSymbols(
@@ -141,35 +143,8 @@ std::optional<CChordLite> CTypedChords::ReadSymbol(const std::string& symbol) co
     return chords->front();
 }
 
-CChordSong CTypedChords::ReadSong(std::string_view text, const TChordStringParse& parse) const {
-    CChordSong song;
-    if (IsNative()) {
-        song.mChords.ParseStringIntoChords(FoldAccidentals(text), parse);
-        song.mSymbols = CChordSymbols(text, parse, song.mChords);
-        song.mBeatsPerBar = parse.mBeatsPerBar;
-        song.mSong.mChords = song.mChords;
-        song.mSong.mBeatsPerBar = parse.mBeatsPerBar;
-        for (const CHarmAnlsChordWithPos& chord : song.mChords) {
-            song.mSong.mSymbols.push_back(song.mSymbols.SymbolOf(chord));
-        }
-        return song;
-    }
-    song.mSong = ReadSource(text, parse);
-    song.mChords = song.mSong.mChords;
-    song.mSymbols = CChordSymbols(song.mSong.mSymbols, song.mChords);
-    song.mBeatsPerBar = song.mSong.mBeatsPerBar;
-    song.mStatedKeys = song.mSong.mStatedKeys;
-    song.mFaults = song.mSong.mFaults;
-    return song;
-}
-
 CSong CTypedChords::ReadSource(std::string_view bytes, const TChordStringParse& parse) const {
-    if (IsNative() && !HasScoreBytes(bytes)) {
-        CSong song;
-        song.mChords.ParseStringIntoChords(FoldAccidentals(bytes), parse);
-        song.mBeatsPerBar = parse.mBeatsPerBar;
-        return song;
-    }
+    if (IsNative() && !HasScoreBytes(bytes)) return ParseSong(bytes, parse);
     CSongOptions prefs;
     prefs.mFormat = HasScoreBytes(bytes) ? TSongFormat_Auto : FormatOf(mForm, bytes);
     prefs.mBeatsPerBar = parse.mBeatsPerBar;
@@ -180,12 +155,18 @@ CSong CTypedChords::ReadSource(std::string_view bytes, const TChordStringParse& 
     return brindle::ReadSong(bytes, prefs);
 }
 
-std::optional<CChordSong> CTypedChords::ReadSongOrFail(const CTypedSong& typed,
-                                                       const TChordStringParse& parse) const {
-    CChordSong song = ReadSong(typed.mText, parse);
+std::optional<CSong> CTypedChords::ReadText(const CTypedSong& typed,
+                                            const TChordStringParse& parse) const {
+    CSong song = ReadSource(typed.mText, parse);
     PrintFaults(typed.mText, song.mFaults, mIsLenient, typed.mName);
     if (song.HasFault() && !mIsLenient) return std::nullopt;
-    if (song.mChords.size() > 1) return song;
+    return song;
+}
+
+std::optional<CSong> CTypedChords::ReadSongOrFail(const CTypedSong& typed,
+                                                  const TChordStringParse& parse) const {
+    auto song = typed.mIsScore ? ReadScore(typed) : ReadText(typed, parse);
+    if (!song || song->mChords.size() > 1) return song;
     Fail(TStatus::BadInput, fmt::format("{} has no chords",
                                         typed.mName.empty() ? "the song" : Printable(typed.mName)));
     return std::nullopt;

@@ -1,8 +1,6 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "brindle/analysis/CHarmAnlsChords.h"
-#include "brindle/present/CChordSymbols.h"
 #include "brindle/song/ReadSong.h"
 
 #include <optional>
@@ -20,23 +18,9 @@ namespace brindle::cli {
 class CCommand;
 struct CTypedSong;
 
-/// A song as somebody typed it.
-struct CChordSong {
-    /// With the end marker.
-    CHarmAnlsChords mChords;
-    CChordSymbols mSymbols;
-    /// That of the song, or of the options if the song does not tell.
-    double mBeatsPerBar = 4.0;
-    /// Empty if the song does not tell.
-    CHarmAnlsSignKeys mStatedKeys;
-    /// All of it.
-    CSong mSong;
-    /// What is not understood or was left out. Without --lenient a fault that is no note is the
-    /// last one, and then there are no chords.
-    std::vector<CSongFault> mFaults;
-
-    [[nodiscard]] bool HasFault() const;
-};
+/// The song of a score, as it is played. Nothing when it cannot be read; then the error has been
+/// printed.
+[[nodiscard]] std::optional<CSong> ReadScore(const CTypedSong& typed);
 
 /// Prints faults with their lines and carets under the places, a score of them at most. `name` is
 /// that of the file, empty for what was typed.
@@ -64,18 +48,18 @@ public:
         const std::vector<std::string>& symbols) const;
     [[nodiscard]] std::optional<CChordLite> ReadSymbol(const std::string& symbol) const;
 
-    /// Reads a typed song and leaves its faults to the caller. The beats are those of `parse`.
-    [[nodiscard]] CChordSong ReadSong(std::string_view text, const TChordStringParse& parse) const;
+    /// The song of a source of any form, a score or a text, with its faults left to the caller. The
+    /// beats are those of `parse`.
+    [[nodiscard]] CSong ReadSource(std::string_view bytes, const TChordStringParse& parse) const;
     /// The same with the faults printed: as warnings with --lenient, else as an error, and then
     /// there is no song.
-    [[nodiscard]] std::optional<CChordSong> ReadSongOrFail(const CTypedSong& typed,
-                                                           const TChordStringParse& parse) const;
-
-    /// The song of a source of any form, a score or a text.
-    [[nodiscard]] CSong ReadSource(std::string_view bytes, const TChordStringParse& parse) const;
+    [[nodiscard]] std::optional<CSong> ReadSongOrFail(const CTypedSong& typed,
+                                                      const TChordStringParse& parse) const;
 
 private:
     [[nodiscard]] bool IsNative() const { return mReader == "native"; }
+    [[nodiscard]] std::optional<CSong> ReadText(const CTypedSong& typed,
+                                                const TChordStringParse& parse) const;
     [[nodiscard]] bool TakeReading(const std::string& symbol, const CChordTextReading& reading,
                                    std::vector<CChordLite>& chords) const;
 

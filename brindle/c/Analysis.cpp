@@ -47,29 +47,14 @@ std::vector<brindle_center> CentersOf(const brindle::CHarmonicAnalyse& analyse) 
     return centers;
 }
 
-// The options with the stated key, which counts for the song, too.
-brindle::CAnalyseSongOptions OptionsFor(brindle::CSong& song,
-                                        const brindle_analysis_options& options) {
-    brindle::CAnalyseSongOptions result;
-    result.mReadings = (options.flags & BRINDLE_ANALYSE_ALTERNATIVES) != 0;
-    result.mCopies = (options.flags & BRINDLE_ANALYSE_COPIES) != 0;
-    brindle::CHarmAnlsSignKey stated;
-    stated.mSignKey = FromC(options.stated_key);
-    if (stated.IsUndef()) return result;
-    stated.mPosition = 0.0;
-    song.mStatedKey = stated.mSignKey;
-    result.mSignKeys.push_back(stated);
-    return result;
-}
-
 void Analyse(brindle_analysis& analysis, const brindle_analysis_options& options) {
-    const auto songOptions = OptionsFor(analysis.mSong, options);
-    analysis.mFound = AnalyseSong(analysis.mSong, songOptions);
-    brindle::CReadingOptions reading;
-    if (!songOptions.mSignKeys.empty()) {
-        reading.mStatedKey = songOptions.mSignKeys.front().mSignKey;
-    }
-    analysis.mReading = ReadSongHarmony(analysis.mSong, reading);
+    const brindle::CSignKeyLite key = FromC(options.stated_key);
+    StateKey(key, analysis.mSong);
+    brindle::CAnalyseSongOptions asked;
+    asked.mReadings = (options.flags & BRINDLE_ANALYSE_ALTERNATIVES) != 0;
+    asked.mCopies = (options.flags & BRINDLE_ANALYSE_COPIES) != 0;
+    analysis.mFound = AnalyseSong(analysis.mSong, asked);
+    analysis.mReading = ReadSongHarmony(analysis.mSong, {.mStatedKey = key});
     if ((options.flags & BRINDLE_ANALYSE_EXPLAIN) != 0) {
         analysis.mExplanations = Explain(analysis.mSong, analysis.mReading);
     }

@@ -99,4 +99,9 @@ struct MusicXmlParserDelegate {
         didEncounterCtrChangePrg;
 };
 
+/// A host that hands on what it is told to two others, first to `first`. It has the methods that
+/// one of them has.
+[[nodiscard]] MusicXmlParserDelegate TellBoth(const MusicXmlParserDelegate& first,
+                                              const MusicXmlParserDelegate& second);
+
 }  // namespace brindle

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/musicxml/MuxmlJsonLines.h"
 
+#include "brindle/platform/JsonString.h"
+
 #include <string_view>
 #include <tuple>
 #include <utility>
@@ -84,6 +86,12 @@ MusicXmlParserDelegate MuxmlJsonLines(TMuxmlEnumForm form,
     host.didEncounterCtrChangeBank = ofThree("didEncounterCtrChangeBank");
     host.didEncounterCtrChangePrg = ofThree("didEncounterCtrChangePrg");
     return host;
+}
+
+std::string MuxmlResultLine(bool isOk, const Error& error) {
+    if (isOk) return R"({"call":"result","ok":true})";
+    return R"({"call":"result","ok":false,"domain":)" + JsonString(error.domain) + R"(,"code":)" +
+           std::to_string(error.code) + R"(,"description":)" + JsonString(error.description) + '}';
 }
 
 }  // namespace brindle

@@ -3,6 +3,7 @@
 
 #include "brindle/musicxml/MusicXmlParserDelegate.h"
 #include "brindle/musicxml/MuxmlJson.h"
+#include "brindle/platform/Error.h"
 
 #include <functional>
 #include <string>
@@ -14,5 +15,8 @@ namespace brindle {
 /// see CMuxmlJson, or `in` with the values of a call without a record of named fields.
 [[nodiscard]] MusicXmlParserDelegate MuxmlJsonLines(TMuxmlEnumForm form,
                                                     std::function<void(const std::string&)> write);
+
+/// The line behind these that tells how the import ended: `ok`, and without it the error.
+[[nodiscard]] std::string MuxmlResultLine(bool isOk, const Error& error);
 
 }  // namespace brindle

@@ -1,8 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/present/CChordSymbols.h"
 
-#include "brindle/analysis/ParseStringIntoHarmAnlsChords.h"
-#include "brindle/analysis/TChordStringParse.h"
 #include "brindle/musicxml/TMusicXMLDoc.h"
 #include "brindle/present/ShownText.h"
 #include "brindle/song/HarmonySymbols.h"
@@ -10,33 +8,6 @@
 #include <algorithm>
 
 namespace brindle {
-namespace {
-
-// What the reader of chord texts leaves out before it looks for tokens.
-constexpr std::string_view kLeftOut = "{}-";
-
-bool Contains(const std::vector<std::string>& list, const std::string& token) {
-    return std::find(list.begin(), list.end(), token) != list.end();
-}
-
-// The chord tokens of a text, one for each chord that the library reads from it.
-std::vector<std::string> ChordTokens(std::string_view text, const TChordStringParse& parse) {
-    std::string kept(text);
-    std::erase_if(kept, [](char c) { return kLeftOut.find(c) != kLeftOut.npos; });
-    std::vector<std::string> tokens = parse.mSeparator.Split(kept);
-    ParseStringIntoHarmAnlsChords::_CorrectTokenizationOf(tokens);
-    std::erase_if(tokens, [&](const std::string& token) {
-        return token.empty() || Contains(parse.mBarTokens, token) ||
-               Contains(parse.mHoldTokens, token);
-    });
-    return tokens;
-}
-
-}  // namespace
-
-CChordSymbols::CChordSymbols(std::string_view text, const TChordStringParse& parse,
-                             const CHarmAnlsChords& chords)
-    : CChordSymbols(ChordTokens(text, parse), chords) {}
 
 CChordSymbols::CChordSymbols(const std::vector<std::string>& symbols,
                              const CHarmAnlsChords& chords) {

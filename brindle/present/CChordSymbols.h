@@ -4,12 +4,10 @@
 #include "brindle/analysis/CHarmAnlsChords.h"
 
 #include <string>
-#include <string_view>
 #include <vector>
 
 namespace brindle {
 
-struct TChordStringParse;
 struct TMusicXMLDoc;
 
 /// The symbol that stands for a chord of an analysis: what the user typed at its position. Every
@@ -19,11 +17,6 @@ public:
     CChordSymbols() = default;
     /// The symbol of each chord but the end marker.
     CChordSymbols(const std::vector<std::string>& symbols, const CHarmAnlsChords& chords);
-    /// What CHarmAnlsChords::ParseStringIntoChords reads: `text` is the chord text and `chords`
-    /// what it read from it.
-    CChordSymbols(std::string_view text, const TChordStringParse& parse,
-                  const CHarmAnlsChords& chords);
-
     /// `chords` are those of the score, with rests.
     CChordSymbols(const TMusicXMLDoc& sheet, const CHarmAnlsChords& chords);
 

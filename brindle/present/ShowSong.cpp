@@ -21,6 +21,14 @@ bool AreBarsEqual(const CSong& song) {
                        [&](const CSongBar& bar) { return bar.mLength == song.mBeatsPerBar; });
 }
 
+/// Empty for a text whose bars are all equal.
+std::vector<double> BarStartsOf(const CSong& song) {
+    std::vector<double> starts;
+    if (!IsScore(song.mFormat) && AreBarsEqual(song)) return starts;
+    for (const CSongBar& bar : song.mBars) starts.push_back(bar.mPosition);
+    return starts;
+}
+
 CShownScore ScoreOf(const CSong& song) {
     CShownScore score;
     score.mTitle = Printable(song.mTitle);
@@ -62,10 +70,17 @@ CShownSong ShowSong(const CSong& song, const CSongAnalysis& found) {
     const CChordSymbols symbols(song.mSymbols, song.mChords);
     CShownSong shown = MakeSong(found.mAnalyse, ReadingsOf(found), symbols, song.mBeatsPerBar);
     shown.mScore = ScoreOf(song);
-    if (!AreBarsEqual(song)) {
-        for (const CSongBar& bar : song.mBars) shown.mBarStarts.push_back(bar.mPosition);
-    }
+    shown.mBarStarts = BarStartsOf(song);
     if (!found.mCopies.empty()) shown.mCopies = MakeSongCopies(found.mAnalyse, symbols);
+    return shown;
+}
+
+CShownSong ShowKeys(const CSong& song, const CSongReading& reading) {
+    const CChordSymbols symbols(song.mSymbols, song.mChords);
+    CShownSong shown =
+        MakeSong(FindCenters(song, TAnalyse_None), nullptr, symbols, song.mBeatsPerBar);
+    shown.mBarStarts = BarStartsOf(song);
+    shown.mKeys = MakeSongKeys(song, reading);
     return shown;
 }
 

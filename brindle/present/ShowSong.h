@@ -17,6 +17,9 @@ struct CSongReading;
 /// For AnalysisSvg and AnalysisText, with the readings and copies that were asked for.
 [[nodiscard]] CShownSong ShowSong(const CSong& song, const CSongAnalysis& found);
 
+/// The chords of a song and the keys of its reading, for KeysSvg.
+[[nodiscard]] CShownSong ShowKeys(const CSong& song, const CSongReading& reading);
+
 /// As strict JSON, see docs/json.md.
 [[nodiscard]] std::string AnalysisJson(const CSong& song, const CSongAnalysis& found);
 /// The same with the reading of the song; `explanations` is a sentence for each chord, or empty.

@@ -4,6 +4,7 @@
 #include "brindle/analysis/CAnalyseHarmCenterAlternatives.h"
 #include "brindle/analysis/RomanNumeral.h"
 #include "brindle/musicxml/internal/PlaceChordsOfScore.h"
+#include "brindle/song/internal/StatedKey.h"
 
 #include <cstddef>
 
@@ -26,16 +27,26 @@ void AnalyseScore(const CSong& song, TAnalyse route, CHarmonicAnalyse& analyse) 
 
 }  // namespace
 
+void StateKey(const CSignKeyLite& key, CSong& song) {
+    if (key.IsUndef()) return;
+    song.mStatedKeys.clear();
+    AppendStatedKey(key, 0.0, song);
+}
+
+CHarmonicAnalyse FindCenters(const CSong& song, TAnalyse route) {
+    CHarmonicAnalyse analyse;
+    if (IsScore(song.mFormat)) {
+        analyse.mSignKeys = song.mStatedKeys;
+        AnalyseScore(song, route, analyse);
+    } else {
+        analyse.AnalyseFromChords(song.mChords, song.mStatedKeys, route);
+    }
+    return analyse;
+}
+
 CSongAnalysis AnalyseSong(const CSong& song, const CAnalyseSongOptions& options) {
     CSongAnalysis found;
-    const bool isGiven = !options.mSignKeys.empty();
-    const CHarmAnlsSignKeys& signKeys = isGiven ? options.mSignKeys : song.mStatedKeys;
-    if (IsScore(song.mFormat)) {
-        found.mAnalyse.mSignKeys = signKeys;
-        AnalyseScore(song, options.mRoute, found.mAnalyse);
-    } else {
-        found.mAnalyse.AnalyseFromChords(song.mChords, signKeys, options.mRoute);
-    }
+    found.mAnalyse = FindCenters(song, options.mRoute);
     if (options.mReadings) {
         found.mReadings = CAnalyseHarmCenterAlternatives(song.mChords).BestResults();
     }

@@ -14,8 +14,6 @@ namespace brindle {
 /// What is to be found in a song.
 struct CAnalyseSongOptions {
     TAnalyse mRoute = TAnalyse_TonicProgressions;  ///< how centers are looked for
-    /// Instead of the keys that the song states; empty for those.
-    CHarmAnlsSignKeys mSignKeys;
     /// All readings that progressions to a tonic allow.
     bool mReadings = false;
     /// Passages that repeat earlier ones.
@@ -34,6 +32,13 @@ struct CSongAnalysis {
     /// Of each chord in the key of its region; empty for one that has none.
     std::vector<std::string> mNumerals;
 };
+
+/// States the key of a song from its begin, instead of the keys that it states itself; an undefined
+/// key states nothing. To be believed even of a score, it also goes to ReadSongHarmony.
+void StateKey(const CSignKeyLite& key, CSong& song);
+
+/// The centers of a song alone, searched in one way. Its `mChords` are those of the song.
+[[nodiscard]] CHarmonicAnalyse FindCenters(const CSong& song, TAnalyse route);
 
 /// Finds centers and functions, the key and the local keys of a song, its readings and copies.
 [[nodiscard]] CSongAnalysis AnalyseSong(const CSong& song, const CAnalyseSongOptions& options = {});

@@ -40,6 +40,21 @@ TEST_CASE("The chord text of a score is read back as the same chords at the same
     CHECK(RunCommand(compare).mShown == "");
 }
 
+TEST_CASE("A score is read as a score by all commands for songs, however chord texts are read") {
+    for (const std::string command : {"copies --json", "keys --json", "grids for --json"}) {
+        INFO(command);
+        const std::string all =
+            RunCommand("brindle " + command + " leadsheets/jingle_bells.mxl").mShown;
+        CHECK(all.find("DOCTYPE") == all.npos);
+        CHECK(RunCommand("brindle " + command + " leadsheets/jingle_bells.mxl --symbols native")
+                  .mShown == all);
+    }
+    for (const std::string command : {"analyse", "keys", "copies", "grids for"}) {
+        CHECK(RunCommand("echo no >no.xml; brindle " + command + " no.xml").mShown ==
+              "[stderr]\nbrindle: no.xml: 1:1: Start tag expected, '<' not found\n[status 1]\n");
+    }
+}
+
 TEST_CASE("A compressed score is read wherever its members stand, with or without a list of them") {
     const CScratchFolder folder;
     const std::string score =

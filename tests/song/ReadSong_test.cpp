@@ -1,8 +1,10 @@
 // SPDX-License-Identifier: MIT
 #include "SongForms.h"
 
+#include "brindle/analysis/TChordStringParse.h"
 #include "brindle/musicxml/TMusicXMLDoc.h"
 #include "brindle/song/AnalyseSong.h"
+#include "brindle/song/ParseSong.h"
 #include "brindle/song/ReadSongHarmony.h"
 #include "brindle/song/internal/ChartLinks.h"
 
@@ -327,6 +329,21 @@ TEST_CASE("Bars tell what is written about jumps, each time that they are played
     CHECK(words.starts_with("27: D.C. al Coda; "));
 }
 
+TEST_CASE("A parsed song has the chords that hosts get and the symbols that were typed") {
+    TChordStringParse parse;
+    parse.mBeatsPerBar = 3.0;
+    const CSong song = ParseSong("B♭ E♭/G . | {x} Dm-7 (C) |", parse);
+    CHECK(song.mSymbols == std::vector<std::string>{"B♭", "E♭/G", "x", "Dm7", "(C)"});
+    REQUIRE(song.mChords.size() == 6);
+    CHECK(song.mChords[0].mRootKeyEnh == CKeyEnh_Bb);
+    CHECK(song.mChords[1].mBassKeyEnh == CKeyEnh_G);
+    CHECK(song.mChords[2].IsUndef());
+    CHECK(song.mChords[3].mPosition == 4.0);
+    CHECK(song.mChords[5].mPosition == 6.0);
+    CHECK(song.mBeatsPerBar == 3.0);
+    CHECK(song.mFaults.empty());
+}
+
 TEST_CASE("What cannot be read is a fault and no song") {
     CHECK(Faults(ReadSongFile("/no/such/file")) == "0:0: there is no such file");
     CHECK(ReadSongFile("/no/such/file").mFormat == TSongFormat_ChordText);
@@ -370,7 +387,7 @@ TEST_CASE("A song of a score is analysed as the score itself is") {
 }
 
 TEST_CASE("A song is analysed in the key that it states, or in the one that is given") {
-    const CSong song = ReadSong("{key: A minor}\n[Am] [Dm] [E7] [Am] [Am] [Dm] [E7] [Am]");
+    CSong song = ReadSong("{key: A minor}\n[Am] [Dm] [E7] [Am] [Am] [Dm] [E7] [Am]");
     CAnalyseSongOptions options;
     options.mReadings = options.mCopies = true;
     const CSongAnalysis stated = AnalyseSong(song, options);
@@ -380,8 +397,10 @@ TEST_CASE("A song is analysed in the key that it states, or in the one that is g
     CHECK(stated.mNumerals[2] == "V7");
     CHECK(stated.mCopies.size() == 1);
     CHECK_FALSE(stated.mReadings.empty());
-    options.mSignKeys.emplace_back().mSignKey = CSignKeyLite("E major");
-    options.mSignKeys[0].mPosition = 0.0;
+    StateKey(CSignKeyLite_Undef, song);
+    CHECK(song.mStatedKey == CSignKeyLite("A minor"));
+    StateKey(CSignKeyLite("E major"), song);
+    CHECK(song.mStatedKey == CSignKeyLite("E major"));
     CHECK(AnalyseSong(song, options).mAnalyse.mSignKeys[0].mSignKey == CSignKeyLite("E major"));
     CHECK(AnalyseSong(CSong()).mNumerals.empty());
 }

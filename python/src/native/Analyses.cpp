@@ -31,10 +31,11 @@ public:
         : mSource(std::move(source)), mKey(key), mIsExplained(isExplained) {
         mOptions.mReadings = hasAlternatives;
         mOptions.mCopies = hasCopies;
-        if (!key.IsUndef()) State(key);
-        CReadingOptions reading;
-        reading.mStatedKey = key;
-        mReading = ReadSongHarmony(Song(), reading);
+        if (!key.IsUndef()) {
+            mStated = std::make_unique<CSong>(mSource->mSong);
+            StateKey(key, *mStated);
+        }
+        mReading = ReadSongHarmony(Song(), {.mStatedKey = key});
         if (isExplained) mExplanations = Explain(Song(), mReading);
     }
 
@@ -58,16 +59,6 @@ public:
     CLazyTuple mChords;
 
 private:
-    // The key counts for the song, too.
-    void State(const CSignKeyLite& key) {
-        CHarmAnlsSignKey stated;
-        stated.mSignKey = key;
-        stated.mPosition = 0.0;
-        mOptions.mSignKeys.push_back(stated);
-        mStated = std::make_unique<CSong>(mSource->mSong);
-        mStated->mStatedKey = key;
-    }
-
     std::unique_ptr<CSong> mStated;
     mutable std::once_flag mOnce;
     mutable CSongAnalysis mFound;
