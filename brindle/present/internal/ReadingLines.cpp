@@ -13,7 +13,7 @@
 namespace brindle {
 namespace {
 
-constexpr std::size_t kBarsPerLine = 4;
+constexpr std::size_t kReadingBarsPerLine = 4;
 constexpr std::string_view kGapOfBars = "  ";
 /// A chord that was there before, as people type it.
 constexpr std::string_view kChordHeld = ".";
@@ -43,7 +43,7 @@ struct CReadingLine {
     std::size_t mEnd = 0;
     std::string mName;
     /// Bars that lines of this kind have at most: four, or two or one of lines that are too wide.
-    std::size_t mMost = kBarsPerLine;
+    std::size_t mMost = kReadingBarsPerLine;
     /// Of its bars, and of those that a longer line of this kind has.
     std::vector<std::size_t> mWidths = {};
 };
@@ -132,7 +132,7 @@ private:
             std::string name;
             const bool isPart = BeginsPart(mLines.mBars[bar], section, name);
             const bool isFull =
-                bar == 0 || bar - lines.back().mBegin >= kBarsPerLine || IsUpbeat(bar - 1);
+                bar == 0 || bar - lines.back().mBegin >= kReadingBarsPerLine || IsUpbeat(bar - 1);
             if (isPart || isFull) lines.push_back({bar, bar, std::move(name)});
             lines.back().mEnd = bar + 1;
         }
