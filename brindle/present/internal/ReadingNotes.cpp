@@ -156,13 +156,15 @@ private:
         Note(std::move(text), ix, last);
     }
 
+    // A tonic ends a chain, also as the six-four chord of a cadence.
     [[nodiscard]] std::ptrdiff_t NextInChain(std::size_t ix) const {
         const std::ptrdiff_t next = mAround.Next(ix);
-        const bool isIn = next >= 0 && mReading.mChords[ix].mResolvesTo == next &&
-                          IsDominant(At(next)) &&
-                          mAround.Root(next) != mAround.Root(static_cast<std::ptrdiff_t>(ix)) &&
-                          mAround.Root(next) != mReading.mKey.mRootKeyEnh.mKeyNr;
-        return isIn ? next : kNoneAround;
+        if (next < 0 || mReading.mChords[ix].mResolvesTo != next) return kNoneAround;
+        const int root = mAround.Root(next);
+        const bool isTonic = root == mReading.mKey.mRootKeyEnh.mKeyNr ||
+                             root == FoldIntoOctave(At(next).mKey.mRootKeyEnh.mKeyNr);
+        const bool isOtherForm = root == mAround.Root(static_cast<std::ptrdiff_t>(ix));
+        return IsDominant(At(next)) && !isTonic && !isOtherForm ? next : kNoneAround;
     }
 
     void NoteColor(std::size_t ix) {
