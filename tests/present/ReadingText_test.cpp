@@ -146,6 +146,7 @@ TEST_CASE("Chains of dominants are noted without other forms of one of them") {
         !Has(Shown("G | D7 | G | D7 | G | G | Em | D#dim7 | Em | Am | C7 B | B7 | F#7/C# Em/B B7 | "
                    "Em | B7 | Em | D7 | G | D7 | G |"),
              "each the dominant"));
+    CHECK(!Has(Shown("C | G D7 | G7 C | F | G7 | C |"), "each the dominant"));
     CHECK(Has(Shown("Cmaj7 Eb7 | D7 Db7 | Cmaj7 |"),
               "  bars 1 to 2: Eb7 D7 Db7: each the dominant of the next, or its substitute\n"));
 }

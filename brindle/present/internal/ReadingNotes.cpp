@@ -163,8 +163,9 @@ private:
         const int root = mAround.Root(next);
         const bool isTonic = root == mReading.mKey.mRootKeyEnh.mKeyNr ||
                              root == FoldIntoOctave(At(next).mKey.mRootKeyEnh.mKeyNr);
-        const bool isOtherForm = root == mAround.Root(static_cast<std::ptrdiff_t>(ix));
-        return IsDominant(At(next)) && !isTonic && !isOtherForm ? next : kNoneAround;
+        const int up = FoldIntoOctave(root - mAround.Root(static_cast<std::ptrdiff_t>(ix)));
+        const bool isLedTo = up == 5 || up == 11;
+        return IsDominant(At(next)) && !isTonic && isLedTo ? next : kNoneAround;
     }
 
     void NoteColor(std::size_t ix) {
