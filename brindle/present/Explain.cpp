@@ -140,7 +140,8 @@ TSentence CChordToExplain::Passing() const {
 }
 
 TSentence CChordToExplain::Plagal() const {
-    if (!IsTargetTonic()) return TSentence_Subdominant;
+    // Over a cadential six-four chord the dominant is there already.
+    if (!IsTargetTonic() || IsAtTarget(TChordRelation_Dominant)) return TSentence_Subdominant;
     return IsTargetNext() ? TSentence_Plagal : TSentence_PlagalLater;
 }
 

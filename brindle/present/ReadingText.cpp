@@ -28,6 +28,15 @@ std::string KeyDetails(const CSong& song, const CSongReading& reading) {
     return text;
 }
 
+/// Whether the source numbers its bars otherwise: with an upbeat as 0, or where bars are repeated.
+bool AreCountedAnew(const CSong& song) {
+    for (std::size_t ix = 0; ix < song.mBars.size(); ++ix) {
+        const std::string& number = song.mBars[ix].mNumber;
+        if (!number.empty() && number != fmt::format("{}", ix + 1)) return true;
+    }
+    return false;
+}
+
 /// "32 bars of 3/4"; the time only where all bars have one.
 std::string BarsText(const CSong& song) {
     if (song.mBars.empty()) return {};
@@ -38,7 +47,7 @@ std::string BarsText(const CSong& song) {
     if (isOneTime && !time.IsUndef()) {
         text += fmt::format(" of {}/{}", time.mNumerator, time.mDenominator);
     }
-    return text;
+    return AreCountedAnew(song) ? text + ", counted from 1 as they are played" : text;
 }
 
 std::string Head(const CSong& song, const CSongReading& reading, const CPaint& paint) {

@@ -63,12 +63,15 @@ bool IsMeasureNumber(std::string_view word) {
     return word.size() > 1 && word[0] == 'm' && std::all_of(word.begin() + 1, word.end(), IsDigit);
 }
 
-/// `C:`, `f#:`
+/// `C:`, `f#:`, or the last word of `E flat:`
 bool IsKeyMark(std::string_view word) {
     if (word.size() < 2 || word.back() != ':') return false;
+    word.remove_suffix(1);
+    constexpr auto lastWords = std::to_array<std::string_view>({"flat", "sharp", "major", "minor"});
+    if (std::find(lastWords.begin(), lastWords.end(), word) != lastWords.end()) return true;
     const char letter = word[0];
     const bool isNote = (letter >= 'A' && letter <= 'G') || (letter >= 'a' && letter <= 'g');
-    return isNote && word.substr(1, word.size() - 2).find_first_not_of("#b-") == word.npos;
+    return isNote && word.substr(1).find_first_not_of("#b-") == word.npos;
 }
 
 std::string_view TakeWord(std::string_view& line) {

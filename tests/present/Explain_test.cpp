@@ -76,6 +76,7 @@ constexpr auto kExplained = std::to_array<CExplained>({
     {"Cmaj7 Fm7 Bb7 Cmaj7 Dm7 G7 Cmaj7", 1, "Fm7 is the minor fourth degree of C major and prepares the backdoor dominant Bb7."},
     {"Cmaj7 Fm7 Bb7 Cmaj7 Dm7 G7 Cmaj7", 2, "Bb7 is the backdoor dominant of C major, on the lowered seventh degree, and goes to Cmaj7."},
     {"C G7 C F C", 3, "F is the subdominant of C major and moves to the tonic C without a dominant: a plagal step."},
+    {"Dm A7 Dm Gm Dm/A A7 Dm", 3, "Gm is the subdominant of D minor."},
     {"C F Fm C G7 C", 2, "Fm is iv in C major, borrowed from C minor."},
     {"Am Dm Bb/D E7 Am", 2, "Bb/D is the Neapolitan sixth chord of A minor."},
     {"Cm Ab7 G7 Cm", 1, "Ab7 is the German sixth of C minor and opens to G7."},

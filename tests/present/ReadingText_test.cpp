@@ -97,6 +97,13 @@ TEST_CASE("What repeats is told in whole bars") {
     CHECK(Has(shown, "  bars 9 to 16 repeat bars 1 to 8\n"));
 }
 
+TEST_CASE("Bars that have other numbers in their source are said to be counted anew") {
+    const std::string_view word = "counted from 1 as they are played";
+    CHECK(!Has(Shown("C | F | G7 | C |"), word));
+    CHECK(Has(Shown("|: C | F :| G7 | C |"), "6 bars, counted from 1 as they are played\n"));
+    CHECK(Has(Shown("m0 b4 C: V\nm1 I\n"), "2 bars of 4/4, counted from 1 as they are played\n"));
+}
+
 TEST_CASE("Bars that hold a chord show it, and a long row of them its number") {
     const std::string held = Shown("C | . | F G | . Am | C |");
     CAPTURE(held);
@@ -135,6 +142,11 @@ TEST_CASE("Chains of dominants are noted without other forms of one of them") {
     CHECK(Has(Shown("C E7 | A7 D7 | G7 C |"),
               "  bars 1 to 3: E7 A7 D7 G7: each the dominant of the next\n"));
     CHECK(!Has(Shown("C D7 | G7sus4 G7 | C |"), "each the dominant"));
+    CHECK(
+        !Has(Shown("G | D7 | G | D7 | G | G | Em | D#dim7 | Em | Am | C7 B | B7 | F#7/C# Em/B B7 | "
+                   "Em | B7 | Em | D7 | G | D7 | G |"),
+             "each the dominant"));
+    CHECK(!Has(Shown("C | G D7 | G7 C | F | G7 | C |"), "each the dominant"));
     CHECK(Has(Shown("Cmaj7 Eb7 | D7 Db7 | Cmaj7 |"),
               "  bars 1 to 2: Eb7 D7 Db7: each the dominant of the next, or its substitute\n"));
 }

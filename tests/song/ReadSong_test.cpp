@@ -61,6 +61,7 @@ TEST_CASE("A source is read as what it looks like") {
         {TSongFormat_ChordText, "(9) C, F"},
         {TSongFormat_RomanText, "Composer: Somebody\n\nm1 C: I b3 V\nm2 I"},
         {TSongFormat_RomanText, "m0 b4 f#: V7\nm1 i"},
+        {TSongFormat_RomanText, "m1 E flat: I b3 V"},
         {TSongFormat_ChordText, "m1 C F\nm2 G"},
         {TSongFormat_ChordPro, "{title: x}\nC"},
         {TSongFormat_ChordPro, "{Meta: artist x}\nOh [C]my"},

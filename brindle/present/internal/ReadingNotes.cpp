@@ -156,13 +156,16 @@ private:
         Note(std::move(text), ix, last);
     }
 
+    // A tonic ends a chain, also as the six-four chord of a cadence.
     [[nodiscard]] std::ptrdiff_t NextInChain(std::size_t ix) const {
         const std::ptrdiff_t next = mAround.Next(ix);
-        const bool isIn = next >= 0 && mReading.mChords[ix].mResolvesTo == next &&
-                          IsDominant(At(next)) &&
-                          mAround.Root(next) != mAround.Root(static_cast<std::ptrdiff_t>(ix)) &&
-                          mAround.Root(next) != mReading.mKey.mRootKeyEnh.mKeyNr;
-        return isIn ? next : kNoneAround;
+        if (next < 0 || mReading.mChords[ix].mResolvesTo != next) return kNoneAround;
+        const int root = mAround.Root(next);
+        const bool isTonic = root == mReading.mKey.mRootKeyEnh.mKeyNr ||
+                             root == FoldIntoOctave(At(next).mKey.mRootKeyEnh.mKeyNr);
+        const int up = FoldIntoOctave(root - mAround.Root(static_cast<std::ptrdiff_t>(ix)));
+        const bool isLedTo = up == 5 || up == 11;
+        return IsDominant(At(next)) && !isTonic && isLedTo ? next : kNoneAround;
     }
 
     void NoteColor(std::size_t ix) {
