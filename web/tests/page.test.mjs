@@ -66,6 +66,32 @@ for (const [form, text, symbols] of [
   });
 }
 
+/** A chart as such links hold it: of each block of fifty characters the ends are swapped. */
+function scrambled(chart) {
+  const text = [...chart];
+  for (let begin = 0; begin + 52 <= text.length; begin += 50) {
+    for (const i of [0, 1, 2, 3, 4, ...Array.from({ length: 14 }, (_, at) => 10 + at)]) {
+      [text[begin + i], text[begin + 49 - i]] = [text[begin + 49 - i], text[begin + i]];
+    }
+  }
+  return text.join("");
+}
+
+onPage("A scrambled link is a chart with its parts, endings, tempo and style", {}, async (opened, page) => {
+  const chart = "*A{T44C^7   |A-7 D7  |D-7 G7  |N1E-7 A7  }            |N2C6   Z";
+  const song = `Two Ends=Writer Some==Medium Swing=C==1r34LbKcu7${scrambled(chart)}==140=1`;
+  await opened.type(`irealb://${encodeURIComponent(song)}`, 8);
+  assert.equal(await page.textContent(".title"), "Two Ends");
+  assert.equal(await page.textContent(".makers"), "Medium Swing, \u2669 = 140Writer Some");
+  assert.deepEqual(await opened.symbols(), ["C\u25B37", "A\u22127", "D7", "D\u22127", "G7", "E\u22127", "A7", "C6"]);
+  assert.deepEqual((await opened.numerals()).slice(0, 5), ["Imaj7", "vi7", "V7/V", "ii7", "V7"]);
+  assert.deepEqual(await opened.texts(".ending-number"), ["1.", "2."]);
+  assert.deepEqual(await opened.texts(".part"), ["A"]);
+  assert.equal(await page.inputValue(".tempo input"), "140");
+  const { bytes } = await opened.saves("ChordPro");
+  assert.match(bytes.toString(), /Two Ends/);
+});
+
 onPage("A chord is explained, on a piano and as fingerings", {}, async (opened, page) => {
   await opened.type("Am | E7 | Am | Am7", 4);
   await page.click("[data-chord='1']");
@@ -137,6 +163,12 @@ onPage("A dropped score is read and can be written as chords", {}, async (opened
   await page.waitForFunction(() => document.querySelector(".title")?.textContent === "Beautiful Dreamer");
   assert.equal(await page.locator(".time").first().getAttribute("aria-label"), "3/4 time");
   const symbols = await opened.symbols();
+  // Transposed it is a text; back in its key it is the score again, with its repeats.
+  await page.click("[aria-label='Up a semitone']");
+  await page.waitForSelector("#song");
+  await page.click("[aria-label='Down a semitone']");
+  await page.waitForSelector(".score-note");
+  await page.waitForFunction((count) => document.querySelectorAll("[data-chord]").length === count, symbols.length);
   await page.getByRole("button", { name: "Write it as chords" }).click();
   await page.waitForSelector("#song");
   await page.waitForFunction(() => document.querySelectorAll("[data-chord]").length > 0);

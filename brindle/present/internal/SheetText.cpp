@@ -116,6 +116,8 @@ std::size_t LengthOfNote(std::string_view text) {
     for (const std::string_view syllable : {"Do", "Re", "Mi", "Sol", "La", "Si"}) {
         if (text.starts_with(syllable)) return syllable.size();
     }
+    // Fa7, but Fadd9 and Faug are on F.
+    if (text.starts_with("Fa") && !text.starts_with("Fadd") && !text.starts_with("Faug")) return 2;
     if (text.empty() || text[0] < 'A' || text[0] > 'H') return 0;
     const std::string_view rest = text.substr(1);
     if (rest.starts_with("is") || rest.starts_with("es")) return 3;
@@ -159,7 +161,7 @@ std::string NumeralFigures(std::string_view text) {
     return Figures(text);
 }
 
-// The letters of a degree, or the name of a sixth chord.
+// The letters of a degree, its number in Nashville, or the name of a sixth chord.
 std::string TakeDegree(std::string_view& text) {
     for (const std::string_view name : {"Ger", "It", "Fr", "Cad", "N"}) {
         if (TakeWord(text, name)) return std::string(name);
@@ -168,7 +170,21 @@ std::string TakeDegree(std::string_view& text) {
     const std::size_t length = std::min(text.find_first_not_of("IViv"), text.size());
     degree += text.substr(0, length);
     text.remove_prefix(length);
+    if (!degree.empty() || text.empty() || text[0] < '1' || text[0] > '7') return degree;
+    degree = text[0];
+    text.remove_prefix(1);
     return degree;
+}
+
+// Whether a text without the name of a note is a degree that stands for a chord, bVII7 or 2-7, and
+// no word.
+bool IsDegree(std::string_view text) {
+    TakeSigns(text);
+    if (TakeDegree(text).empty()) return false;
+    constexpr std::string_view kFigures = "0123456789^+-/(#b";
+    if (text.empty() || kFigures.find(text[0]) != kFigures.npos) return true;
+    if (!TakeQualitySign(text).empty()) return true;
+    return text.starts_with("sus") || text.starts_with("add") || text.starts_with("no");
 }
 
 // One part of a numeral with slashes.
@@ -177,6 +193,7 @@ void AddNumeralPart(CTextRuns& runs, std::string_view part) {
     const std::string degree = TakeDegree(part);
     Add(runs, degree);
     const bool isFigures = !degree.empty();
+    if (isFigures && Ascii::IsDigit(degree[0])) Add(runs, TakeMinorMark(part), kMarkSize);
     Add(runs, NumeralFigures(part), isFigures ? kFigureSize : 1.0, isFigures ? kFigureRaise : 0.0);
 }
 
@@ -184,7 +201,8 @@ void AddNumeralPart(CTextRuns& runs, std::string_view part) {
 
 CTextRuns SetSymbol(std::string_view symbol) {
     const std::string text = Shortened(symbol);
-    if (LengthOfNote(text) == 0 || text.starts_with("N.C")) return {{text}};
+    if (text.starts_with("N.C")) return {{text}};
+    if (LengthOfNote(text) == 0) return IsDegree(text) ? SetNumeral(text) : CTextRuns{{text}};
     CTextRuns runs;
     std::string_view rest = std::string_view(text).substr(0, BassPlace(text));
     std::string_view bass = std::string_view(text).substr(rest.size());

@@ -85,15 +85,15 @@ export function useSong(): SongState {
     return () => clearTimeout(timer);
   }, [source, names]);
 
-  const change = (text: string) => {
+  const replace = (by: Source) => {
     setBefore([...before, source].slice(-50));
-    setSource({ kind: "text", text });
+    setSource(by);
   };
   const transpose = async (by: number) => {
     const from = origin ?? { source, semitones: 0 };
     const semitones = ((from.semitones + by + 23) % 12) - 11;
-    if (semitones === 0 && from.source.kind === "text") change(from.source.text);
-    else change(await engine.call("transpose", from.source, semitones));
+    if (semitones === 0) replace(from.source);
+    else replace({ kind: "text", text: await engine.call("transpose", from.source, semitones) });
     setOrigin({ source: from.source, semitones });
   };
   return {
@@ -110,7 +110,7 @@ export function useSong(): SongState {
       setOrigin(null);
     },
     change: (text) => {
-      change(text);
+      replace({ kind: "text", text });
       setOrigin(null);
     },
     transpose,
