@@ -30,7 +30,7 @@ bool Has(const std::string& text, std::string_view part) {
 TEST_CASE("Bars beyond all songs are counted without overflow") {
     CSong song = ReadSong("C F G C");
     song.mBeatsPerBar = 5e-324;
-    CHECK(Shown(song).find("I  ") != std::string::npos);
+    CHECK(Has(Shown(song), "x 999999999999999 |"));
     const CBars bars(song.mBeatsPerBar);
     CHECK(bars.BarOf(1e9) > 1'000'000);
     CHECK(bars.BarOf(-1e9) < -1'000'000);
