@@ -15,10 +15,6 @@ using namespace brindle::border;
 
 namespace {
 
-constexpr double kUsualTempo = 120.0;
-constexpr double kSlowestTempo = 1.0;
-constexpr double kFastestTempo = 1000.0;
-
 // `change` gives a song for that of the handle.
 template <class TChange>
 brindle_status GiveSong(const brindle_song* song, brindle_song** changed, const TChange& change) {
@@ -68,10 +64,9 @@ brindle_status brindle_song_midi(const brindle_song* song, double tempo, char** 
     *midi = nullptr;
     *midi_size = 0;
     if (song == nullptr) return FailForNull("song");
-    const double used = tempo == 0.0 ? song->mSong.mTempo.value_or(kUsualTempo) : tempo;
+    const double used = tempo == 0.0 ? song->mSong.mTempo.value_or(brindle::kUsualTempo) : tempo;
     return Guarded([&] {
-        // Written so that what is no number is refused, too.
-        if (!(used >= kSlowestTempo && used <= kFastestTempo)) {
+        if (!brindle::IsPlayableTempo(used)) {
             return Fail(BRINDLE_ERROR_ARGUMENT, "a tempo is 1 to 1000 beats a minute");
         }
         return GiveText(MidiFileBytes(MidiPieceOfSong(song->mSong, used)), midi, midi_size);

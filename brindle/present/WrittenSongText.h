@@ -19,6 +19,14 @@ namespace brindle {
 [[nodiscard]] std::string WrittenSongJson(const CWrittenSong& written, const std::string& form,
                                           std::uint64_t seed);
 
+/// Beats a minute of a song that tells none.
+inline constexpr double kUsualTempo = 120.0;
+
+/// Whether a number will do as the tempo of a song that is played; false for what is no number.
+[[nodiscard]] constexpr bool IsPlayableTempo(double tempo) {
+    return tempo >= 1.0 && tempo <= 1000.0;
+}
+
 /// A song for two tracks, chords and bass. Each chord is laid so that its tones are near to those
 /// of the chord before, around the E above middle C. `tempo` is beats a minute.
 [[nodiscard]] CMidiPiece MidiPieceOfSong(const CSong& song, double tempo);

@@ -1,5 +1,6 @@
 """Songs and their analyses."""
 
+import copy
 import dataclasses
 import json
 import pickle
@@ -92,6 +93,39 @@ def test_a_song_and_its_analysis_are_sequences():
 def test_bytes_of_any_kind_are_read():
     for source in (b"C G", bytearray(b"C G"), memoryview(b"xC Gx")[1:-1]):
         assert [chord.symbol for chord in brindle.read(source)] == ["C", "G"]
+
+
+def test_a_song_is_transposed_and_travels():
+    song = brindle.read("{key: C}\n{tempo: 96}\n[Dm7]la [G7/B]la [N.C.]la [Cmaj7]la")
+    up = song.transpose(1).transpose(2)
+    symbols = ["Fm7", "Bb7/D", "N.C.", "Ebmaj7"]
+    for again in (up, pickle.loads(pickle.dumps(up)), copy.deepcopy(up)):
+        assert [chord.symbol for chord in again] == symbols
+        assert again.stated_key == brindle.Key("Eb") and again.tempo == 96
+        assert [chord.numeral for chord in again.analyse()] == ["ii7", "V7", "", "I^7"]
+    for _ in range(2000):  # as many as somebody may press a key
+        up = up.transpose(6)
+    assert [chord.symbol for chord in pickle.loads(pickle.dumps(up))] == symbols
+    learned = [brindle.MarkovModel.learn([each]).dumps() for each in (up, up.chord_pro(), song)]
+    assert learned[0] == learned[1] != learned[2]
+    assert up.transpose(-3).chords == brindle.read(song.chord_pro()).chords
+
+
+def test_a_transposed_song_keeps_its_faults():
+    wrong = brindle.read("C what G").transpose(2)
+    with pytest.raises(brindle.SongError, match="line 1, column 3"):
+        pickle.loads(pickle.dumps(wrong)).analyse()
+    with pytest.raises(brindle.SongError, match="line 1, column 3"):
+        brindle.song_fingerings(wrong)
+
+
+def test_a_song_is_midi():
+    song = brindle.read("Dm7 G7 | C . . .")
+    assert song.midi() == song.midi(120) != song.midi(tempo=60)
+    assert song.midi(tempo=60).count(b"\xff\x51\x03\x0f\x42\x40") == 1  # a second a beat
+    for tempo in (0, -1, 1001, float("nan"), float("inf")):
+        with pytest.raises(ValueError, match="1 to 1000"):
+            song.midi(tempo)
 
 
 #   options                       error

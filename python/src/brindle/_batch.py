@@ -48,8 +48,8 @@ def analyse_batch(
     """Reads the harmony of many songs and gives a row for each.
 
     `texts` are the songs themselves, in any form that `read` knows: strings or bytes, a list or a
-    column of pyarrow, pandas or NumPy. A row of None is null. A song that is not understood gives a row with its faults
-    and without chords. The work is shared by `threads`, as many as there are processors without it.
+    column of pyarrow, pandas or NumPy. A row of None is null. A song that is not understood gives a
+    row with its faults and without chords. The work is shared by `threads`, as many as there are processors without it.
 
     Columns: `title`, `key` ("A Minor", null without chords), `confidence`, `chords` (a list of
     records: `position` and `length` in beats, `symbol`, `root` 0 to 11, `mask` of the semitones above

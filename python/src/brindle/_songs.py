@@ -15,6 +15,12 @@ def read_again(*arguments: Any) -> Song:
     return _native._read(*arguments)
 
 
+def transpose_again(song: Song, steps: tuple[int, ...]) -> Song:
+    for semitones in steps:
+        song = song.transpose(semitones)
+    return song
+
+
 def analyse_again(song: Song, *arguments: Any) -> Analysis:
     return song.analyse(*arguments)
 

@@ -93,6 +93,7 @@ CShownSongGrids ChosenForSong(const CSourceSongPtr& song, const nb::object& tuni
                               std::optional<int> capo, int highestCapo, int highestFret, int span,
                               bool mayOmitTones, bool mayOmitRoot, std::string_view bass) {
     constexpr int kMostCapoOfSong = 12;
+    CheckUnderstood(*song);
     const GChShortTuning strings = TuningOf(tuning, capo.value_or(0));
     if (highestCapo < 0 || highestCapo > kMostCapoOfSong) {
         throw nb::value_error("the highest capo is a fret of 0 to 12");

@@ -7,6 +7,7 @@
 #include <nanobind/stl/string.h>
 
 #include <cstdint>
+#include <memory>
 #include <mutex>
 #include <string>
 
@@ -54,21 +55,34 @@ CModelPtr ModelOfText(const std::string& text) {
     return std::make_shared<CModel>(model);
 }
 
-void Learn(const CModel& model, const CSourceSong& source) {
-    CheckUnderstood(source);
+struct CFreeSong {
+    void operator()(brindle_song* song) const { brindle_song_free(song); }
+};
+using CSongHandle = std::unique_ptr<brindle_song, CFreeSong>;
+
+// The song for the C interface, read and transposed again.
+CSongHandle HandleOf(const CSourceSong& source) {
+    brindle_song* song = nullptr;
     brindle_song_options options = brindle_song_options_default();
     options.format = source.mOptions.mFormat;
     options.beats_per_bar = source.mOptions.mBeatsPerBar;
     options.beats_per_chord = source.mOptions.mBeatsPerChord;
     options.even = source.mOptions.mEven ? 1 : 0;
     options.lenient = source.mOptions.mLenient ? 1 : 0;
+    Check(brindle_song_read(source.mSource.data(), source.mSource.size(), &options, &song),
+          "SongError");
+    CSongHandle handle(song);
+    for (const int step : source.mSteps) {
+        Check(brindle_song_transpose(handle.get(), step, &song), "SongError");
+        handle.reset(song);
+    }
+    return handle;
+}
+
+void Learn(const CModel& model, const CSourceSong& source) {
+    CheckUnderstood(source);
     model.With([&](brindle_markov* handle) {
-        brindle_song* song = nullptr;
-        Check(brindle_song_read(source.mSource.data(), source.mSource.size(), &options, &song),
-              "SongError");
-        const brindle_status status = brindle_markov_learn(handle, song);
-        brindle_song_free(song);
-        Check(status, "SongError");
+        Check(brindle_markov_learn(handle, HandleOf(source).get()), "SongError");
     });
 }
 

@@ -4,8 +4,11 @@
 #include "SourceSong.h"
 
 #include "brindle/platform/FileNames.h"
+#include "brindle/present/ChordProText.h"
 #include "brindle/present/PrintableSong.h"
+#include "brindle/present/WrittenSongText.h"
 #include "brindle/song/SongBeats.h"
+#include "brindle/song/TransposeSong.h"
 
 #include <nanobind/stl/optional.h>
 #include <nanobind/stl/shared_ptr.h>
@@ -13,6 +16,7 @@
 #include <nanobind/stl/string_view.h>
 
 #include <algorithm>
+#include <optional>
 
 namespace brindle::python {
 namespace {
@@ -105,9 +109,39 @@ nb::tuple SectionsOf(const CSourceSong& source) {
     });
 }
 
+CSourceSongPtr Transposed(const CSourceSongPtr& from, int semitones) {
+    auto song = std::make_shared<CSourceSong>();
+    const nb::gil_scoped_release released;
+    song->mSong = TransposeSong(from->mSong, semitones);
+    song->mSource = from->mSource;
+    song->mOptions = from->mOptions;
+    song->mFrom = from->mFrom ? from->mFrom : from;
+    song->mSteps = from->mSteps;
+    song->mSteps.push_back(semitones);
+    return song;
+}
+
+nb::bytes MidiOf(const CSourceSong& source, std::optional<double> tempo) {
+    const double used = tempo.value_or(source.mSong.mTempo.value_or(kUsualTempo));
+    if (!IsPlayableTempo(used)) throw nb::value_error("a tempo is 1 to 1000 beats a minute");
+    std::string bytes;
+    {
+        const nb::gil_scoped_release released;
+        bytes = MidiFileBytes(MidiPieceOfSong(source.mSong, used));
+    }
+    return nb::bytes(bytes.data(), bytes.size());
+}
+
 nb::tuple PickleOf(const CSourceSong& song) {
+    const nb::module_ module = nb::module_::import_("brindle._songs");
+    if (song.mFrom) {
+        return nb::make_tuple(module.attr("transpose_again"),
+                              nb::make_tuple(song.mFrom, TupleOf(song.mSteps, [](int step) {
+                                                 return nb::int_(step);
+                                             })));
+    }
     const CSongOptions& options = song.mOptions;
-    return nb::make_tuple(nb::module_::import_("brindle._songs").attr("read_again"),
+    return nb::make_tuple(module.attr("read_again"),
                           nb::make_tuple(nb::bytes(song.mSource.data(), song.mSource.size()),
                                          FormatWord(options.mFormat), options.mBeatsPerBar,
                                          options.mBeatsPerChord, options.mEven, options.mLenient));
@@ -235,6 +269,34 @@ Key('E Minor'))");
 True)");
 }
 
+void BindChanges(nb::class_<CSourceSong>& song) {
+    song.def(
+        "transpose", Transposed, nb::arg("semitones"),
+        R"(The song so many semitones higher, or lower for a negative number, spelled for its new key.
+
+>>> import brindle
+>>> [chord.symbol for chord in brindle.read("Dmin7 G7/B | Cmaj7").transpose(3)]
+['Fm7', 'Bb7/D', 'Ebmaj7'])");
+    song.def(
+        "chord_pro", [](const CSourceSong& self) { return ChordProText(self.mSong); },
+        R"(The song in ChordPro, its chords as a grid as they are played; words are not kept.
+
+>>> import brindle
+>>> print(brindle.read("Dm7 G7 | C . . .").chord_pro(), end="")
+{time: 4/4}
+{start_of_grid}
+| Dm7 G7 . . | C . . . |
+{end_of_grid})");
+    song.def("midi", MidiOf, nb::arg("tempo") = nb::none(),
+             R"(The chords and their bass as a Standard MIDI File.
+
+`tempo` is beats a minute, 1 to 1000; without one that of the song, or 120.
+
+>>> import brindle
+>>> brindle.read("Dm7 G7 | C").midi(tempo=96)[:4]
+b'MThd')");
+}
+
 }  // namespace
 
 void CheckUnderstood(const CSourceSong& source) {
@@ -255,6 +317,7 @@ void BindSongs(nb::module_& module) {
     nb::class_<CSourceSong> song(module, "Song", kSong);
     BindFacts(song);
     BindLists(song);
+    BindChanges(song);
     song.def("__len__", [](const CSourceSong& self) { return ChordCount(self.mSong); });
     BindSequence(song, "SongChord", ChordsOf);
     song.def("__repr__", ReprOf);

@@ -9,6 +9,7 @@
 #include <cstddef>
 #include <memory>
 #include <string>
+#include <vector>
 
 namespace brindle::python {
 
@@ -25,15 +26,18 @@ private:
     mutable nanobind::object mTuple;
 };
 
+struct CSourceSong;
+using CSourceSongPtr = std::shared_ptr<CSourceSong>;
+
 /// A song with what it was read from, so that it can be sent to another process.
 struct CSourceSong {
     CSong mSong;
     std::string mSource;
     CSongOptions mOptions;
+    CSourceSongPtr mFrom;     ///< the song that was read, of one that was transposed; else null
+    std::vector<int> mSteps;  ///< semitones by which that was transposed, one call after the other
     CLazyTuple mChords;
 };
-
-using CSourceSongPtr = std::shared_ptr<CSourceSong>;
 
 /// SongError with the place of the first fault for a song that was not understood; one that was
 /// read leniently is used as it is.
