@@ -28,6 +28,11 @@ FileNode EmptyPackage() {
     return package;
 }
 
+/// A build without property lists writes no packages, rather than damaged ones.
+bool CanBeWritten(const FileNode& package) {
+    return !package.Child(kInfoName)->mContents.empty();
+}
+
 /// A library without content, as its tuning is gone, is left out.
 FileNode PackageOf(const std::vector<std::shared_ptr<GChLibrary>>& libraries) {
     FileNode package = EmptyPackage();
@@ -145,9 +150,8 @@ bool GChDatabase::writeLibraries(const std::vector<std::shared_ptr<GChLibrary>>&
                                  std::string_view toNewDbPackagePath) {
     const fs::path path = ExpandTilde(toNewDbPackagePath);
     const FileNode package = PackageOf(libraries);
-    // A build without property lists writes no packages, rather than damaged ones.
-    if (package.Child(kInfoName)->mContents.empty()) return false;
-    return PlaceAt(path) != TDestination::Foreign && WriteFolderAtomically(path, package);
+    return CanBeWritten(package) && PlaceAt(path) != TDestination::Foreign &&
+           WriteFolderAtomically(path, package);
 }
 
 bool GChDatabase::updateDatabaseFiles() {
@@ -167,9 +171,11 @@ bool GChCreateDbPackageAtPath(std::string_view path) {
     const fs::path packagePath = ExpandTilde(path);
     const TDestination place = PlaceAt(packagePath);
     if (place != TDestination::Free && place != TDestination::EmptyPackage) return false;
+    const FileNode package = EmptyPackage();
+    if (!CanBeWritten(package)) return false;
     std::error_code ignored;
     fs::create_directories(packagePath.parent_path(), ignored);
-    return WriteFolderAtomically(packagePath, EmptyPackage());
+    return WriteFolderAtomically(packagePath, package);
 }
 
 }  // namespace brindle

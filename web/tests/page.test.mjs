@@ -135,7 +135,7 @@ onPage("What could come next is told in the key of the passage, not in one that 
 for (const [names, symbols] of [
   ["german", ["B7", "H7", "F#m", "Eb"]],
   ["solfege", ["Sib7", "Si7", "Fa#m", "Mib"]],
-  ["nashville", ["b77", "77", "#4-", "b3"]],
+  ["nashville", ["b77", "77", "#4\u2212", "b3"]],
   ["roman", ["bVII7", "V7/iii", "#iv", "bIII"]],
 ]) {
   onPage(`Chords have other names: ${names}`, {}, async (opened, page) => {
