@@ -24,6 +24,8 @@ enum class TFingeringBass : std::uint8_t {
 
 /// Highest fret of a search.
 inline constexpr int kFingeringMostFrets = 24;
+/// The position from which on a hand spans mSpanUpTheNeck.
+inline constexpr int kFingeringUpTheNeck = 7;
 /// Most strings of a search.
 inline constexpr int kFingeringMostStrings = 12;
 

@@ -156,7 +156,6 @@ std::vector<std::string> OmittedDegrees(const CChordLite& chord, CSemitones omit
 
 /// Whether a fingering of a library is one that the options allow.
 bool IsWithin(const CFoundGrid& found, const CFingeringOptions& options) {
-    constexpr int kUpTheNeck = 7;
     if (!options.mMayOmitTones && !found.mOmitted.IsEmpty()) return false;
     const auto& elems = found.mGrid->chordElems();
     if (elems.empty()) return true;
@@ -164,7 +163,7 @@ bool IsWithin(const CFoundGrid& found, const CFingeringOptions& options) {
         elems.begin(), elems.end(),
         [](const auto& a, const auto& b) { return a.absFretIndex() < b.absFretIndex(); });
     const int position = low->absFretIndex() + 1;
-    const int span = position >= kUpTheNeck ? options.mSpanUpTheNeck : options.mSpan;
+    const int span = position >= kFingeringUpTheNeck ? options.mSpanUpTheNeck : options.mSpan;
     return high->absFretIndex() + 1 + options.mCapo <= options.mHighestFret &&
            high->absFretIndex() - low->absFretIndex() < span;
 }

@@ -196,7 +196,7 @@ std::vector<std::string> BrokenLines(const std::string& text, double width, doub
 }
 
 /// Draws what stands above the diagrams, its first text in bold, and gives where these begin.
-double DrawHead(CSvg& svg, const std::vector<std::string>& head, double width) {
+double DrawLinesAbove(CSvg& svg, const std::vector<std::string>& head, double width) {
     double y = kMarginOfGrids;
     for (std::size_t i = 0; i < head.size(); ++i) {
         const std::string_view color = i == 0 ? kInk : kFaintInk;
@@ -224,7 +224,7 @@ std::string GridsSvg(const std::vector<CChordGrid>& grids, std::string_view titl
     const double rows = static_cast<double>((count + kGridsPerLine - 1) / kGridsPerLine);
     const double width = std::max(cell.mWidth * columns, head.empty() ? 0.0 : kNarrowestHead);
     CSvg svg;
-    const double begin = DrawHead(svg, head, width);
+    const double begin = DrawLinesAbove(svg, head, width);
     for (std::size_t i = 0; i < grids.size(); ++i) {
         const double left = kMarginOfGrids + cell.mWidth * static_cast<double>(i % kGridsPerLine);
         const double top = begin + cell.mHeight * static_cast<double>(i / kGridsPerLine);

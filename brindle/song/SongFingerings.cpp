@@ -132,12 +132,12 @@ int SignsOf(const CChordLite& chord, const CSpelledInterval& interval) {
 /// Of the intervals to the same keys the one after which all chords together have the fewest signs;
 /// of two the one with sharps.
 CSpelledInterval EasiestToRead(std::span<const CChordLite> chords, int semitones) {
-    constexpr int kFifthsToEnharmonic = 12;
+    constexpr int kFifthsToSameKey = 12;
     const int fifths = FoldIntoOctave(std::int64_t{semitones} * 7);
     std::optional<CSpelledInterval> best;
     long long fewest = 0;
     for (const int turns : {1, 0, -1, -2}) {
-        const CSpelledInterval interval{semitones, fifths + kFifthsToEnharmonic * turns};
+        const CSpelledInterval interval{semitones, fifths + kFifthsToSameKey * turns};
         long long signs = 0;
         for (const CChordLite& chord : chords) signs += SignsOf(chord, interval);
         if (best && signs >= fewest) continue;

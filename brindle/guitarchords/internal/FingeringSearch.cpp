@@ -15,7 +15,6 @@ namespace brindle {
 namespace {
 
 constexpr int kMostSpan = 7;
-constexpr int kUpTheNeck = 7;
 constexpr int kFewestSounding = 3;
 // A guitar needs some thousands in a position; 12 strings have millions of ways.
 constexpr int kMostStepsInPosition = 40'000;
@@ -71,8 +70,8 @@ private:
         mPosition = position;
         mSteps = 0;
         const CFingeringOptions& options = mTask.mOptions;
-        const int span = std::clamp(position >= kUpTheNeck ? options.mSpanUpTheNeck : options.mSpan,
-                                    2, kMostSpan);
+        const int span = std::clamp(
+            position >= kFingeringUpTheNeck ? options.mSpanUpTheNeck : options.mSpan, 2, kMostSpan);
         const int last = std::min(mHighestFret, position + span - 1);
         for (int string = 0; string < mTask.mStrings; ++string) {
             CStringWays& ways = mWays[static_cast<std::size_t>(string)];
