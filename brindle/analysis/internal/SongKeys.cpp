@@ -43,6 +43,31 @@ int HomeOf(std::span<const CKeyChord> chords, int bestScored, int statedKey) {
     return vamp >= 0 ? vamp : bestScored;
 }
 
+CSignKeyLite CountedKeyWithLeastSigns(int key, TEnh enh) {
+    CSignKeyLite signKey({TonicOfKey(key), enh},
+                         IsMinorKey(key) ? TSignKeyType_Minor : TSignKeyType_Major);
+    signKey.SetRootNoteEnhWithLeastSigns();
+    return signKey;
+}
+
+// Counting signs builds scales, which for all 24 keys takes longer than reading a few chords.
+CSignKeyLite KeyWithLeastSigns(int key, TEnh enh) {
+    using TKeys = std::array<CSignKeyLite, kKeyCount>;
+    constexpr std::size_t spellings = TEnh_Undef - TEnh_bbb + 1;
+    static const auto counted = [] {
+        std::array<TKeys, spellings> all{};
+        for (std::size_t ix = 0; ix < spellings * kKeyCount; ++ix) {
+            const int number = static_cast<int>(ix % kKeyCount);
+            const auto ofIndex = static_cast<TEnh>(static_cast<int>(ix / kKeyCount) + TEnh_bbb);
+            all[ix / kKeyCount][ix % kKeyCount] = CountedKeyWithLeastSigns(number, ofIndex);
+        }
+        return all;
+    }();
+    const int row = enh - TEnh_bbb;
+    if (row < 0 || row >= static_cast<int>(spellings)) return CountedKeyWithLeastSigns(key, enh);
+    return counted[static_cast<std::size_t>(row)][static_cast<std::size_t>(key)];
+}
+
 }  // namespace
 
 CSongKeys FindSongKeys(std::span<const CKeyChord> chords, const CKeyOptions& options,
@@ -82,11 +107,8 @@ CKeySpeller::CKeySpeller(const CHarmAnlsChords& chords, const CSignKeyLite& stat
         --missing;
     }
     for (int key = 0; key < kKeyCount; ++key) {
-        const int tonic = TonicOfKey(key);
-        CSignKeyLite& signKey = mSignKeys[static_cast<std::size_t>(key)];
-        signKey = CSignKeyLite({tonic, enhs[static_cast<std::size_t>(tonic)]},
-                               IsMinorKey(key) ? TSignKeyType_Minor : TSignKeyType_Major);
-        signKey.SetRootNoteEnhWithLeastSigns();
+        const TEnh enh = enhs[static_cast<std::size_t>(TonicOfKey(key))];
+        mSignKeys[static_cast<std::size_t>(key)] = KeyWithLeastSigns(key, enh);
     }
     const int stated = NumberOfKey(statedKey);
     if (stated >= 0) mSignKeys[static_cast<std::size_t>(stated)] = statedKey;
