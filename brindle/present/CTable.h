@@ -22,7 +22,6 @@ public:
 
     /// The line of the names, without an end of line.
     [[nodiscard]] std::string Head() const;
-    [[nodiscard]] std::size_t RowCount() const { return mRows.size(); }  ///< without the head
     /// The line of a row from 0, without an end of line.
     [[nodiscard]] std::string Row(std::size_t row) const;
     /// All lines behind a margin, the head faint.

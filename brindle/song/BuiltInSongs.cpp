@@ -6,7 +6,6 @@
 #include "brindle/song/internal/BuiltInSongs_Table.h"
 #include "brindle/theory/ReadKeyText.h"
 
-#include <set>
 
 namespace brindle {
 namespace {
@@ -32,12 +31,6 @@ std::vector<CSong> BuiltInSongs() {
     std::vector<CSong> songs;
     for (const CBuiltInSongRow& row : BuiltInSongRows()) songs.push_back(BuiltInSong(row));
     return songs;
-}
-
-std::vector<std::string> BuiltInStyles() {
-    std::set<std::string> styles;
-    for (const CBuiltInSongRow& row : BuiltInSongRows()) styles.insert(row.mStyle);
-    return {styles.begin(), styles.end()};
 }
 
 std::string_view BuiltInMakersOf(std::string_view title, std::string_view style) {

@@ -15,9 +15,6 @@ namespace brindle {
 /// and blues.
 [[nodiscard]] std::vector<CSong> BuiltInSongs();
 
-/// The styles of the built-in songs, in alphabetic order.
-[[nodiscard]] std::vector<std::string> BuiltInStyles();
-
 /// Who made a built-in song, with years, "Scott Joplin (1868-1917), 1901"; empty for a song that is
 /// not built in.
 [[nodiscard]] std::string_view BuiltInMakersOf(std::string_view title, std::string_view style);

@@ -318,9 +318,4 @@ const CLengthCounts& CSongModel::LengthsAt(int beatsPerBar, std::int32_t tickInB
     return found == mLengths.end() ? none : found->second;
 }
 
-bool CSongModel::KnowsMetre(int beatsPerBar) const {
-    const auto found = mLengths.lower_bound({beatsPerBar, 0, 0});
-    return found != mLengths.end() && found->first[0] == beatsPerBar;
-}
-
 }  // namespace brindle

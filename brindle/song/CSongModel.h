@@ -130,8 +130,6 @@ public:
     /// beats in a bar. `lengthBefore` 0 is any.
     [[nodiscard]] const CLengthCounts& LengthsAt(int beatsPerBar, std::int32_t tickInBar,
                                                  std::int32_t lengthBefore) const;
-    /// Whether a song has as many beats in a bar.
-    [[nodiscard]] bool KnowsMetre(int beatsPerBar) const;
 
     /// A place in the songs: a chord, or, with an `mId` below 0, what stands before a song.
     struct CPlace {

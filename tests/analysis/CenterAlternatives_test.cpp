@@ -163,3 +163,16 @@ TEST_CASE("Readings over one range are simultaneous, and a longer one around the
     CHECK_FALSE(list.HasLongerContainingAlternernative(list.begin()));
     CHECK_FALSE(list.HasLongerContainingAlternernative(list.begin() + 3));
 }
+
+TEST_CASE("A center that a longer one contains is seen") {
+    const CReadings place;
+    const CHarmAnlsCentersInChords centers{place.Center(0, 6), place.Center(1, 4),
+                                           place.Center(5, 8), place.Center(0, 6, 7)};
+    const auto hasLonger = [&](int ix) {
+        return centers.HasLongerContainingHarmCenter(centers.begin() + ix);
+    };
+    CHECK_FALSE(hasLonger(0));
+    CHECK(hasLonger(1));
+    CHECK_FALSE(hasLonger(2));
+    CHECK_FALSE(hasLonger(3));
+}

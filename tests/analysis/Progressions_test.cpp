@@ -166,3 +166,13 @@ TEST_CASE("Semitone patterns are set entry by entry") {
     pattern.Reset();
     CHECK(pattern == CSemitonesMatch());
 }
+
+TEST_CASE("The best rows of a table are those that are as good as the first, sorted or not") {
+    CHarmAnlsProgressions unsorted = CHarmAnlsProgressions::TonicProgressions();
+    CHarmAnlsProgressions sorted = unsorted;
+    sorted.SortBySizeAndPriority();
+    const auto best = unsorted.SortAndGetBestMatchingProgressions();
+    CHECK(best.size() == sorted.GetBestMatchingProgressions().size());
+    CHECK(best.front().size() == sorted.front().size());
+    CHECK(unsorted.front().size() == sorted.front().size());
+}

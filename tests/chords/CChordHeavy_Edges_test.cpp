@@ -330,3 +330,22 @@ TEST_CASE("Intervals are added above the root, and notes outside a key are count
     CHECK(chord.CountNotesNotInSignKey(CSignKeyHeavy(kC, TSignKeyTypeNoUndef_Major)) == 1);
     CHECK(chord.CountNotesNotInSignKey(CSignKeyHeavy(CKeyEnh_F, TSignKeyTypeNoUndef_Major)) == 0);
 }
+
+TEST_CASE(
+    "The root of a chord moves to the note of an interval, and is undefined behind the last") {
+    CChordHeavy chord(CNote(60, TEnh_n), {60, 64, 67, 70});
+    chord.SetRootNoteToIntvlIx(1);
+    CHECK(chord.RootKeyEnh() == CKeyEnh_E);
+    chord.SetRootNoteToIntvlIx(99);
+    CHECK(chord.RootKeyEnh().IsUndef());
+}
+
+TEST_CASE("The intervals of a chord are worked out anew when its notes have changed") {
+    CChordHeavy chord(CNote(60, TEnh_n), {60, 64, 67});
+    (void)chord.IntvlSet();
+    CHECK_FALSE(chord.IntvlSetAndBassNoteHasIntvlAloneNeedsUpdate());
+    chord.AddNote(CNote(70, TEnh_b));
+    CHECK(chord.IntvlSetAndBassNoteHasIntvlAloneNeedsUpdate());
+    (void)chord.IntvlSet();
+    CHECK_FALSE(chord.IntvlSetAndBassNoteHasIntvlAloneNeedsUpdate());
+}

@@ -2,6 +2,8 @@
 #include "tests/guitarchords/GridForms.h"
 #include "tests/support/Expected.h"
 
+#include "brindle/guitarchords/GChDisplayOptions.h"
+#include "brindle/guitarchords/GChFilterParameter.h"
 #include "brindle/guitarchords/GChLibrary.h"
 #include "brindle/guitarchords/GChTuning.h"
 #include "brindle/theory/Trace.h"
@@ -297,4 +299,39 @@ TEST_CASE("The single spots of a string are counted, and the highest of each kin
     REQUIRE(chord->realSpotAtMaxIndexForStringIndex(1) != nullptr);
     CHECK(chord->realSpotAtMaxIndexForStringIndex(2) == nullptr);
     CHECK(chord->optionalSpotAtMaxIndexForStringIndex(2) == nullptr);
+}
+
+TEST_CASE("What a host sets on a view, an element, a filter and a drawing is kept in its bytes") {
+    const auto basic = GuitarChord({{1, 0, 0, 5, 0}});
+    GChChord chord = ViewOf(basic);
+    chord.setRootEnhType(1);
+    chord.setBassEnhType(258);
+    chord.setTransposeIndex(7);
+    CHECK(chord.rootEnhType() == 1);
+    CHECK(chord.bassEnhType() == 2);
+    CHECK(chord.transposeIndex() == 0);
+
+    GChChordElem elem = basic->chordElems()[0];
+    elem.setCoveredMinStr(4, 2);
+    CHECK(elem.coveredMinStr() == 4);
+    CHECK(elem.coveredMaxStr() == 2);
+
+    GChFilterParameter filter;
+    filter.setRootNoteToFilter(3, 2);
+    filter.setBassNoteToFilter(4, 1);
+    CHECK(filter.rootEnhType() == 2);
+    CHECK(filter.bassEnhType() == 1);
+
+    GChDisplayOptions options;
+    CHECK(options.numberOfFrets() == -1);
+    options.setNumberOfFrets(5);
+    options.setBarreType(true);
+    CHECK(options.numberOfFrets() == 5);
+    CHECK(options.barreType() == 1);
+
+    GChShortTuning tuning{};
+    GChCopyShortTuning(kGChStandardGuitar, tuning);
+    CHECK(tuning == kGChStandardGuitar);
+    GChClearShortTuning(tuning);
+    CHECK(GChNumberOfStringsInShortTuning(tuning) == 0);
 }

@@ -3,6 +3,8 @@
 
 #include "tests/support/Expected.h"
 
+#include "brindle/markov/CIteratorIndexConverter.h"
+
 #include <doctest/doctest.h>
 
 using namespace brindle;
@@ -91,4 +93,56 @@ TEST_CASE("A model counts what follows each history and estimates its chance") {
                  return n;
              }},
         });
+}
+
+TEST_CASE("Counts of a chord add up, and are read back as they were written") {
+    VariableLengthMarkovModel model(2);
+    Learn(model, "(4,C);(2,F);(2,G);(4,C)");
+    const MarkovSequence chords = model.IteratorSequenceForObjects(SymbolsOf("(4,C);(2,F)"));
+    MarkovCounts counts;
+    VariableLengthMarkovModel::MapAddToOrInsert(counts, {chords[0], 2});
+    VariableLengthMarkovModel::MapAddToOrInsert(counts, {chords[1], 1});
+    VariableLengthMarkovModel::MapAddToOrInsert(counts, {chords[0], 3});
+    CHECK(counts.size() == 2);
+    CHECK(counts[chords[0]] == 5);
+    CHECK(counts[chords[1]] == 1);
+
+    CIteratorIndexConverter converter(model.mObjects);
+    const auto written = [&] {
+        std::ostringstream text;
+        model.TransitionMapAppendToJSON(text, converter);
+        return text.str();
+    };
+    const std::string text = written();
+    model.mTransitionMap = VariableLengthMarkovModel::JSONDeserialization_Helper::
+        MarkovTransitionMapFromJSONDictionary(
+            nlohmann::json{{"TransitionMap", nlohmann::json::parse(text)}}, converter);
+    CHECK(written() == text);
+}
+
+TEST_CASE("The next fixed chord of a template is told with its distance, the end behind the last") {
+    VariableLengthMarkovModel model(1);
+    Learn(model, "(4,C);(2,F)");
+    TMarkovGenerateOptions options;
+    options.mTemplate = model.IteratorSequenceForObjects(SymbolsOf("(2,U);(4,C);(2,U);(2,F)"));
+    REQUIRE(options.Validate(model));
+    const MarkovSequence chords = model.IteratorSequenceForObjects(SymbolsOf("(4,C);(2,F)"));
+    struct CRow {
+        double mBeats;
+        MarkovIterator mObject;
+        double mDistance;
+    };
+    const CRow rows[] = {{0.0, chords[0], 2.0},
+                         {2.0, chords[0], 0.0},
+                         {3.0, chords[1], 5.0},
+                         {8.0, chords[1], 0.0},
+                         {9.0, model.mObjects.insertObjectIfUnique(CMarkovObject_End), 1.0}};
+    for (const CRow& row : rows) {
+        CAPTURE(row.mBeats);
+        MarkovIterator object{};
+        double distance = -1.0;
+        model.NextGivenObjectAndDistance(object, distance, options, row.mBeats);
+        CHECK(object == row.mObject);
+        CHECK(distance == row.mDistance);
+    }
 }

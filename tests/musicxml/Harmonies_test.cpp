@@ -3,7 +3,10 @@
 #include "brindle/chords/CChordHeavy.h"
 #include "brindle/musicxml/CChordSetFromMusicXml.h"
 #include "brindle/musicxml/HarmonyKinds.h"
+#include "brindle/musicxml/MusicXmlParserHarmonyDelegate.h"
+#include "brindle/musicxml/TMusicXMLDoc.h"
 #include "brindle/musicxml/TMusicXMLHarmony.h"
+#include "brindle/platform/XmlStreamParser.h"
 #include "brindle/theory/CChordNamePrefs.h"
 #include "tests/support/Expected.h"
 #include "tests/support/Forms.h"
@@ -96,4 +99,30 @@ TEST_CASE("Lead-sheet chords become full chords with their degrees and bass") {
                                                                     CurrentChordNamePrefs);
                                               return ChordForm(updated, harmony.mBass.IsDefined());
                                           }}});
+}
+
+TEST_CASE("A chord has the kind of its tones, whatever its root") {
+    CHECK(ChordToXMLHarmonyKind(CHarmAnlsChord(CChordLite("C", {}))) == "major");
+    CHECK(ChordToXMLHarmonyKind(CHarmAnlsChord(CChordLite("F#m7b5", {}))) == "half-diminished");
+    CHECK(ChordToXMLHarmonyKind(CHarmAnlsChord(CChordLite("G7/F", {}))) == "dominant");
+    CHECK(ChordToXMLHarmonyKind(CHarmAnlsChord()) == "none");
+}
+
+TEST_CASE("A reading of harmonies hands out copies of what it has gathered") {
+    XmlStreamParser parser;
+    MusicXmlParserHarmonyDelegate delegate;
+    parser.setDelegate(&delegate);
+    const std::string bar =
+        "<harmony><root><root-step>C</root-step></root><kind>major</kind></harmony>";
+    const auto words = [](const std::string& text) {
+        return "<direction><direction-type>" + text + "</direction-type></direction>";
+    };
+    REQUIRE(parser.parse("<score-partwise><part><measure>" + words("<coda/>") + bar +
+                         "</measure><measure>" + words("<coda/>") +
+                         "</measure></part></score-partwise>"));
+    CHECK(delegate.getMeasures().size() == 2);
+    CHECK(delegate.getCodaPairs() == MusicXmlParserHarmonyDelegate::TMeasurePairs{{0, 1}});
+    CHECK(delegate.getSegnoPairs().empty());
+    CHECK(delegate.getDoc().Harmonies.size() == 1);
+    CHECK(delegate.takeDoc().Harmonies.size() == 1);
 }

@@ -7,6 +7,7 @@
 #include "brindle/musicxml/MuxmlEnums.h"
 #include "brindle/musicxml/MuxmlJson.h"
 #include "brindle/musicxml/TMusicXMLHarmony.h"
+#include "brindle/musicxml/XPathHelpers.h"
 #include "brindle/theory/CChordNamePrefs.h"
 #include "brindle/theory/CSignKeyHeavy.h"
 #include "brindle/theory/Trace.h"
@@ -245,4 +246,37 @@ TEST_CASE("The transposition of a part is that of most of its notes") {
     CHECK(counts.TransposeWithMostNotes().mChromatic == 0);
     counts.Add(clarinet, 6);
     CHECK(counts.TransposeWithMostNotes().mChromatic == -2);
+}
+
+TEST_CASE("The first node that a path finds is read as what is asked for, else the default") {
+    const auto tree = XmlDocument::FromBytes("<a><n> 12x</n><d>2.5</d><t>Forte <b>P</b></t></a>");
+    const XmlNode root = std::get<XmlDocument>(tree).rootElement();
+    CHECK(IntValueForXPath(root, "n", 7) == 12);
+    CHECK(IntValueForXPath(root, "t", 7) == 0);
+    CHECK(IntValueForXPath(root, "none", 7) == 7);
+    CHECK(DoubleValueForXPath(root, "d", 7.0) == 2.5);
+    CHECK(DoubleValueForXPath(root, "none", 7.0) == 7.0);
+    CHECK(StringValueForXPath(root, "t", "X") == "Forte P");
+    CHECK(StringValueForXPath(root, "none", "X") == "X");
+    CHECK(LowercaseStringValueForXPath(root, "t", "X") == "forte p");
+    CHECK(LowercaseStringValueForXPath(root, "none", "X") == "X");
+    CHECK(NSStringValueForXPath(root, "d", std::nullopt) == "2.5");
+    CHECK_FALSE(NSStringValueForXPath(root, "none", std::nullopt).has_value());
+    CHECK(XPathExists(root, "t/b"));
+    CHECK_FALSE(XPathExists(root, "b"));
+    CHECK(XMLElementForXPath(root, "t/b").stringValue() == "P");
+    CHECK_FALSE(static_cast<bool>(XMLElementForXPath(root, "none")));
+}
+
+TEST_CASE("Instruments of a part are found by identifier, by name and by short name") {
+    CMuxmlScoreInstruments instruments(2);
+    instruments[0].mID = "P1-I1";
+    instruments[0].mInstrumentName = "Piano";
+    instruments[1].mID = "P1-I2";
+    instruments[1].mInstrumentAbbreviation = "Cl.";
+    CHECK(instruments.FindForID("P1-I2") == instruments.begin() + 1);
+    CHECK(instruments.FindForID("P1") == instruments.end());
+    CHECK(instruments.FindByInstNameOrAbbrevation("Piano") == instruments.begin());
+    CHECK(instruments.FindByInstNameOrAbbrevation("Cl.") == instruments.begin() + 1);
+    CHECK(instruments.FindByInstNameOrAbbrevation("piano") == instruments.end());
 }

@@ -3,6 +3,9 @@
 
 #include "tests/neural/PrintedText.h"
 
+#include "brindle/neural/ChordAnalysisNeuronalNet.h"
+#include "brindle/theory/Trace.h"
+
 #include <doctest/doctest.h>
 
 #include <cmath>
@@ -222,4 +225,15 @@ TEST_CASE("Weights are read behind their heading, a short file leaves the others
         CHECK(LoadedWeights(test.mText) == test.mWeights);
     }
     CHECK(std::isinf(LoadedWeights("weight definitions\n1e999\n")[0]));
+}
+
+TEST_CASE("A net keeps what its training was told, and traces itself") {
+    NeuronalNet net(ChordAnalysisNeuronalNet);
+    net.set_momentum_amount(0.25);
+    net.set_cycle_limit(12);
+    CHECK(net.get_momentum_amount() == 0.25);
+    CHECK(net.get_cycle_limit() == 12);
+    const PrintedText printed;
+    net.trace();
+    CHECK(printed.Text() == TraceString(net));
 }

@@ -227,3 +227,10 @@ TEST_CASE("A scale spells a black key as it is told, by its step or by a note of
     scale.SetEnhForChromStep(11, TEnh_s);  // F sharp is eleven semitones above G
     CHECK(scale.EnhForKeyNr(6) == TEnh_s);
 }
+
+TEST_CASE("A scale answers with the steps of any type") {
+    const CScaleHeavy scale(CKeyEnh_D, st_min);
+    CHECK(&scale.ScaleDataFromType(st_min) == &scale.ScaleRow());
+    const CScaleHeavy major(CKeyEnh_C, st_maj);
+    CHECK(&scale.ScaleDataFromType(st_maj) == &major.ScaleRow());
+}

@@ -161,3 +161,11 @@ TEST_CASE("A mask above 4096 leaves the vector of bits alone") {
     CSemitones(4096).ToVectorBool(bits);
     CHECK(bits == std::vector<bool>(12, false));
 }
+
+TEST_CASE("The bits of a chord are packed from the root up") {
+    CHECK(CSemitones::VectorBoolToInt({}) == 0);
+    CHECK(CSemitones::VectorBoolToInt({true, false, false, false, true, false, false, true}) ==
+          0b1001'0001);
+    std::vector<bool> bits(70, true);
+    CHECK(CSemitones::VectorBoolToInt(bits) == ~std::uint64_t{0});
+}

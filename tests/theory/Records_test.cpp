@@ -111,3 +111,19 @@ TEST_CASE("The JSON text of a record does not depend on how the stream writes ot
     CHECK(isPlain(CSignKeyNoEnh(11, TSignKeyType_Major)));
     CHECK(isPlain(CChordLite(CKeyEnh_B, CKeyEnh_Undef, CSemitones{0, 4, 7})));
 }
+
+TEST_CASE("A record prints as one text under all names, a brief one where it has one") {
+    const CKeyEnh key = CKeyEnh_Fis;
+    CHECK(TraceStr(key) == TraceString(key));
+    CHECK(TraceBriefString(key) == TraceString(key));
+    struct CBoth {
+        void TraceBriefTo(std::ostream& stream) const { stream << "F#"; }
+    };
+    CHECK(TraceBriefString(CBoth()) == "F#");
+}
+
+TEST_CASE("A key keeps its root when its type changes") {
+    CSignKeyHeavy key(CKeyEnh_Fis, TSignKeyTypeNoUndef_Major);
+    key.SetSignKeyType(TSignKeyTypeNoUndef_Minor);
+    CHECK(key.ToSignKeyLite() == CSignKeyLite("F# minor"));
+}

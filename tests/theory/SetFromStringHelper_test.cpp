@@ -3,6 +3,8 @@
 
 #include <doctest/doctest.h>
 
+#include <array>
+
 using namespace brindle;
 using namespace brindle::SetFromStringHelper;
 
@@ -63,4 +65,13 @@ TEST_CASE("A keyword list has a longer keyword before the shorter one it begins 
     CHECK_FALSE(AreNotEmptyAndSortedBySizeAndLowerCase(TList{"sus", "sus4"}));
     CHECK_FALSE(AreNotEmptyAndSortedBySizeAndLowerCase(TList{"sus", ""}));
     CHECK_FALSE(AreNotEmptyAndSortedBySizeAndLowerCase(TList{"Sus"}));
+}
+
+TEST_CASE("A word is found at the begin of a text in letters of any size") {
+    constexpr std::array<const char*, 2> keywords{"minor", "min"};
+    _AssertStringsAreNotEmptyAndSortedBySizeAndLowerCase(keywords);
+    CHECK(CompareStrs(TSpaces_AnyRemainder, keywords, "MINOR scale"));
+    CHECK_FALSE(CompareStrs(TSpaces_WholeRemainder, keywords, "minor scale"));
+    CHECK(CompareStrs(TSpaces_WholeRemainder, keywords, "Min"));
+    CHECK_FALSE(CompareStrs(TSpaces_AnyRemainder, keywords, "a minor"));
 }
