@@ -68,7 +68,9 @@ struct CCompletions {
 
 void CheckCommand(const std::string& path, const CCompletions& shells, int& optionCount) {
     INFO("brindle " << path);
-    const CHelpWords help = ReadHelp(Shown("brindle " + path + " --help"));
+    const std::string shown = Shown("brindle " + path + " --help");
+    CHECK(Shown("brindle help " + path) == shown);
+    const CHelpWords help = ReadHelp(shown);
     const std::string man = WithoutBackslashes(Shown("brindle manual " + path));
     std::string function = "_brindle" + (path.empty() ? "" : '_' + path);
     std::replace(function.begin(), function.end(), ' ', '_');
