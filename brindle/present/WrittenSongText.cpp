@@ -66,6 +66,8 @@ std::string WrittenSongText(const CSong& song) {
     for (std::size_t ix = 0; ix < song.mSections.size(); ++ix) {
         text += fmt::format("{}[{}]\n", ix == 0 ? "" : "\n", song.mSections[ix].mName);
         text += PassageText(song, song.mSections[ix].mPosition, SectionEnd(song, ix));
+        // Without a bar line the next part would go on in this bar.
+        if (ix + 1 < song.mSections.size()) text.insert(text.size() - 1, " |");
     }
     return text;
 }

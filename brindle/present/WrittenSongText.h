@@ -9,7 +9,8 @@
 
 namespace brindle {
 
-/// A song as a chord text, four bars a line, each part under its letter in brackets.
+/// A song as a chord text, four bars a line, each part under its letter in brackets. Read with as
+/// many beats in a bar it is the same song again.
 [[nodiscard]] std::string WrittenSongText(const CSong& song);
 
 /// "the longest quote: 2.5 bars from bar 5 on are bars 1 to 3 of Amazing Grace"; empty for none.

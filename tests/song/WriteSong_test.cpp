@@ -358,6 +358,13 @@ TEST_CASE("A quote is found in whatever key it is read, and what was wished for 
         REQUIRE(song.mFault == "");
         CHECK(song.mLongestQuote.mBars == LongestQuoteByHand(BuiltIn(), song.mSong));
     }
+    CWriteSongOptions options = OptionsOf("", 8, 1);
+    options.mMostQuotedBars = 2.0;
+    options.mEndsOnTonic = false;
+    WishSheet(options, "F | Bb | C7 | F | F | F | C7 | F");
+    const CWrittenSong wished = WriteSong(model, options);
+    CHECK(wished.mFault == "");
+    CHECK(wished.mLongestQuote.mBars == 6.0);
 }
 
 TEST_CASE("A song ends at rest on a strong beat, and the first of two parts leads on") {

@@ -1,0 +1,55 @@
+// SPDX-License-Identifier: MIT
+#include "brindle/present/WrittenSongText.h"
+
+#include "brindle/song/BuiltInSongs.h"
+#include "brindle/song/ReadSong.h"
+#include "brindle/song/SongRequest.h"
+
+#include <doctest/doctest.h>
+
+#include <string>
+#include <utility>
+#include <vector>
+
+namespace {
+
+using namespace brindle;
+
+/// Where each chord begins, and its symbol; a chord that is written twice in a row is one.
+std::vector<std::pair<double, std::string>> ChordsOf(const CSong& song) {
+    std::vector<std::pair<double, std::string>> chords;
+    for (std::size_t ix = 0; ix + 1 < song.mChords.size(); ++ix) {
+        if (!chords.empty() && chords.back().second == song.mSymbols[ix]) continue;
+        chords.emplace_back(song.mChords[ix].mPosition, song.mSymbols[ix]);
+    }
+    return chords;
+}
+
+}  // namespace
+
+TEST_CASE("A written song reads back from its text, with its parts") {
+    const CSongModel model = BuiltInSongModel();
+    for (const char* const form : {"AABA", "ABAC", "blues", ""}) {
+        for (const int beats : {2, 3, 4, 6}) {
+            CSongRequest request;
+            request.mForm = form;
+            request.mBeatsPerBar = beats;
+            CSongRequestReading read = ReadSongRequest(request);
+            read.mOptions.mSeed = static_cast<std::uint64_t>(beats);
+            const CWrittenSong written = WriteSong(model, read.mOptions);
+            REQUIRE(written.mFault == "");
+            CSongOptions options;
+            options.mBeatsPerBar = beats;
+            const std::string text = WrittenSongText(written.mSong);
+            const CSong again = ReadSong(text, options);
+            INFO(text);
+            REQUIRE_FALSE(again.HasFault());
+            CHECK(ChordsOf(again) == ChordsOf(written.mSong));
+            CHECK(again.mChords.back().mPosition == written.mSong.mChords.back().mPosition);
+            REQUIRE(again.mSections.size() == written.mSong.mSections.size());
+            for (std::size_t ix = 0; ix < again.mSections.size(); ++ix) {
+                CHECK(again.mSections[ix].mPosition == written.mSong.mSections[ix].mPosition);
+            }
+        }
+    }
+}
