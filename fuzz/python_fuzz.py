@@ -176,7 +176,9 @@ def call_read(dice: Dice) -> None:
     song = read_song(dice)
     look_at(song)
     pickle.loads(pickle.dumps(song))
-    list(song), len(song)
+    list(song), len(song), song[:2]
+    moved = song.transpose(dice.integer(-100, 100))
+    pickle.loads(pickle.dumps(moved)).chord_pro(), moved.midi(dice.word(None, 60, 0.5, 1e9))
 
 
 def call_analyse(dice: Dice) -> None:
@@ -211,7 +213,8 @@ def call_fingerings(dice: Dice) -> None:
         limit=dice.integer(-1, 12),
     )
     look_at(found)
-    brindle.fingerings_json(found), brindle.fingerings_svg(found, dice.text("key"))
+    brindle.fingerings_json(found), brindle.fingerings_svg(found, title=dice.text("key"))
+    brindle.fingerings_svg([*found, dice.word(None, 1, *found)])
 
 
 def call_fretted(dice: Dice) -> None:

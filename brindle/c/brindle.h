@@ -366,7 +366,8 @@ BRINDLE_API brindle_status brindle_song_transpose(const brindle_song* song, int 
 /** The same song with the symbols of its chords written in a style; `style` may be NULL. */
 BRINDLE_API brindle_status brindle_song_rename(const brindle_song* song, const brindle_style* style,
                                                brindle_song** renamed);
-/** The song in ChordPro, its chords as a grid, as they are played; "" for a song without chords. */
+/** The song in ChordPro, its chords as a grid, as they are played; "" for a song without chords or
+ * with more than a million steps of that grid. */
 BRINDLE_API brindle_status brindle_song_chord_pro(const brindle_song* song, char** text);
 /** The chords and their bass as a Standard MIDI File of `midi_size` bytes; `tempo` is beats a
  * minute, 1 to 1000, 0 for that of the song or 120. */

@@ -47,6 +47,19 @@ std::string WordOf(const CSong& song, std::size_t index) {
     return WriteChordSymbol(chord);
 }
 
+/// Whether its steps are more than anybody reads; of hostile lengths, too, which may be no numbers.
+bool IsTooLongForGrid(const CSong& song) {
+    constexpr double kMostSteps = 1e6;
+    const int perBeat = StepsPerBeat(song);
+    double steps = song.mBeatsPerBar * perBeat;
+    for (const CSongBar& bar : song.mBars) steps += std::max(1.0, bar.mLength * perBeat);
+    if (song.mBars.empty() && !song.mChords.empty() && song.mBeatsPerBar > 0.0) {
+        const double end = song.mChords.back().mPosition;
+        steps += std::max(end * perBeat, end / song.mBeatsPerBar);
+    }
+    return !(steps <= kMostSteps);
+}
+
 /// Of a song without bar lines all bars are as long as its first.
 std::vector<CSongBar> BarsIn(const CSong& song) {
     if (!song.mBars.empty() || song.mChords.empty() || !(song.mBeatsPerBar > 0.0)) {
@@ -169,6 +182,7 @@ private:
 }  // namespace
 
 std::string ChordProText(const CSong& song) {
+    if (IsTooLongForGrid(song)) return {};
     return CChordProWriter(song).Text();
 }
 

@@ -118,5 +118,14 @@ TEST_CASE("A host sets symbols and numerals as the sheet does") {
     CHECK(text == nullptr);
 }
 
+TEST_CASE("A chord of a thousand million beats is no grid in ChordPro") {
+    for (const char* const text : {"(1e9,C);(4,G)", "(1e300,C);(4,G)", "(4,C);(1000001,G)"}) {
+        INFO(text);
+        const TSong song = ReadSongOf(text);
+        CHECK(TextOf(brindle_song_chord_pro, song.get()).empty());
+    }
+    CHECK(TextOf(brindle_song_chord_pro, ReadSongOf("(4,C);(100000,G)").get()).size() > 100000);
+}
+
 }  // namespace
 }  // namespace brindle::test
