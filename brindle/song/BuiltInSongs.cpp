@@ -6,7 +6,6 @@
 #include "brindle/song/internal/BuiltInSongs_Table.h"
 #include "brindle/theory/ReadKeyText.h"
 
-
 namespace brindle {
 namespace {
 

@@ -17,8 +17,8 @@ struct CReadingLines {
 };
 
 /// The bars of a song, four a line, two or one where that is too wide: the chords, the numerals
-/// below, and above the names of the keys where they begin. A part of the song begins a new line, an
-/// upbeat has one for itself. A chord that is told several times in a row stands once in a bar.
+/// below, and above the names of the keys where they begin. A part of the song begins a new line,
+/// an upbeat has one for itself. A chord that is told several times in a row stands once in a bar.
 [[nodiscard]] std::string ReadingLines(const CSong& song, const CSongReading& reading,
                                        const CReadingLines& lines, const CPaint& paint);
 
