@@ -379,7 +379,7 @@ TEST_CASE("A song ends at rest on a strong beat, and the first of two parts lead
             options.mMostQuotedBars = 0.0;
             const CSong song = WriteSong(BuiltIn(), options).mSong;
             REQUIRE(!song.mSymbols.empty());
-            const std::string& tonic = BeatsOf(song).back();
+            const std::string tonic = BeatsOf(song).back();
             CHECK(tonic.substr(0, 2) != "C7");
             const CHarmAnlsChordWithPos& last = *(song.mChords.end() - 2);
             late += last.mPosition > 124.0 ? 1 : 0;
