@@ -73,7 +73,7 @@ build_js() {
     export NODE_PATH=/usr/share/nodejs${NODE_PATH:+:$NODE_PATH}
     need_libxml2 || return 1
     build wasm brindle_wasm -DBRINDLE_TESTS=OFF -DBRINDLE_WEB_LIBRARIES="$wasm_folder/libraries" \
-        -DCMAKE_TOOLCHAIN_FILE="$(dirname "$(readlink -f "$(command -v em++)")")/cmake/Modules/Platform/Emscripten.cmake"
+        -DCMAKE_TOOLCHAIN_FILE="$(dirname "$(readlink -f "$(command -v em++)")")/cmake/Modules/Platform/Emscripten.cmake" || return 1
     need_node_modules "$root/js" || return 1
     in_wasm_log package node "$root/js/scripts/build.mjs" "$wasm_folder/js"
 }
@@ -81,7 +81,7 @@ build_js() {
 # test_js [ARGUMENT...]: builds and tests the package; arguments go to Node's test runner.
 test_js() {
     build_js || return
-    build_program
+    build_program || return
     (cd "$root/js" && node scripts/schemas.mjs --check && node scripts/sizes.mjs --check &&
         node --test --expose-gc "$@" test/)
 }

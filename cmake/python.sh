@@ -98,7 +98,7 @@ test_python() {
     prepare_python || return $?
     local options=(-DBRINDLE_TESTS=OFF -DBRINDLE_BENCH=OFF -DBRINDLE_FUZZ=OFF)
     if is_configured release; then options=(); fi
-    build release brindle_c "${options[@]}"
+    build release brindle_c "${options[@]}" || return 1
     say "building the wheel"
     build_wheel || return 1
     make_environment test "$python_folder"/dist/*.whl || return 1

@@ -179,7 +179,7 @@ std::span<const std::uint32_t> CSongModel::PlacesOfPair(const CSoundingChord& be
                              [&](std::uint32_t place) { return PairAt(place) < number; });
     const auto last = std::partition_point(
         first, mByPair.end(), [&](std::uint32_t place) { return PairAt(place) == number; });
-    return {first, last};
+    return {mByPair.data() + (first - mByPair.begin()), static_cast<std::size_t>(last - first)};
 }
 
 void CSongModel::CountPlaces() {

@@ -208,6 +208,10 @@ export interface KeyRegion {
 export interface Reading {
   SignKey: null | Tonality;
   Confidence: number | null;
+  /**
+   * Where keys contradict, in words.
+   */
+  Notes: string[];
   Regions: {
     SignKey: null | Tonality;
     /**
