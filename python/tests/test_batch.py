@@ -131,6 +131,15 @@ def test_half_a_character_is_a_fault_of_its_song_alone():
     assert len(batch.column("faults")[1]) == 1
 
 
+@pytest.fixture
+def interruptible():
+    """What runs in the background has Ctrl-C ignored."""
+    before = signal.signal(signal.SIGINT, signal.default_int_handler)
+    yield
+    signal.signal(signal.SIGINT, before)
+
+
+@pytest.mark.usefixtures("interruptible")
 def test_a_batch_ends_when_it_is_interrupted():
     songs = ["Dm7 G7 | C A7 | " * 100] * 100
     begin = time.monotonic()
