@@ -6,11 +6,11 @@
 #include "brindle/present/ShownText.h"
 #include "brindle/present/TonalityName.h"
 #include "brindle/song/BuiltInSongs.h"
-#include "brindle/song/SongStyles.h"
 
 #include <fmt/format.h>
 
-#include <algorithm>
+#include <cstddef>
+#include <map>
 #include <nlohmann/json.hpp>
 #include <vector>
 
@@ -22,15 +22,15 @@ std::string MakersOf(const CTaughtSong& song) {
 }
 
 std::string StyleCounts(const CSongModel& model) {
-    std::vector<std::string> counts;
-    for (const std::string& style : StylesOf(model)) {
-        const auto isOfStyle = [&](const CTaughtSong& song) {
-            return IsSameStyle(song.mStyle, style);
-        };
-        const auto count = std::count_if(model.Songs().begin(), model.Songs().end(), isOfStyle);
-        counts.push_back(fmt::format("{} {}", count, Printable(style)));
+    std::map<std::string, std::size_t> counts;
+    for (const CTaughtSong& song : model.Songs()) {
+        if (!song.mStyle.empty()) ++counts[song.mStyle];
     }
-    return counts.empty() ? std::string() : fmt::format(": {}", fmt::join(counts, ", "));
+    std::vector<std::string> told;
+    for (const auto& [style, count] : counts) {
+        told.push_back(fmt::format("{} {}", count, Printable(style)));
+    }
+    return told.empty() ? std::string() : fmt::format(": {}", fmt::join(told, ", "));
 }
 
 }  // namespace
