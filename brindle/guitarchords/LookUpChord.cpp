@@ -14,7 +14,7 @@ namespace {
 
 constexpr int kHighestSoundingPitch = 127;
 
-std::vector<int> PitchesOf(const GChChord& chord, int capo) {
+std::vector<int> SoundingPitches(const GChChord& chord, int capo) {
     std::vector<int> pitches;
     for (int i = 0; i < chord.numberOfStrings(); ++i) {
         pitches.push_back(chord.pitchForStringIndex(i, capo));
@@ -73,7 +73,7 @@ std::vector<CFoundGrid> LookUpChord(const GChDatabase& database, const CChordLit
             const GChChord grid = *GChChord::make(basicChord, 0);
             if (grid.rootNote(capo) != chord.mRootKeyEnh.mKeyNr) continue;
             if (!HasBassOf(grid, chord, capo)) continue;
-            const auto omitted = TonesLeftOut(PitchesOf(grid, capo), chord);
+            const auto omitted = TonesLeftOut(SoundingPitches(grid, capo), chord);
             if (omitted) {
                 found.push_back({basicChord, *omitted, CostForPlayer(grid, chord, capo)});
             }
