@@ -33,8 +33,6 @@ CSong ReadOneSong(std::string_view bytes, TSongFormat format, const CSongOptions
         case TSongFormat_MusicXml:
         case TSongFormat_CompressedMusicXml:
             return SongReaders::ReadScoreSong(bytes, format);
-        case TSongFormat_ChordStrings:
-            return SongReaders::ReadChordStrings(bytes, prefs);
         case TSongFormat_RomanText:
             return SongReaders::ReadRomanSong(bytes, prefs);
         case TSongFormat_ChordText:
@@ -42,6 +40,7 @@ CSong ReadOneSong(std::string_view bytes, TSongFormat format, const CSongOptions
         case TSongFormat_ChordsAboveLyrics:
         case TSongFormat_ChordPro:
         case TSongFormat_Chart:
+        case TSongFormat_ChordStrings:
         case TSongFormat_ChartLink:
         case TSongFormat_ChartPage:
         case TSongFormat_Auto:
@@ -80,7 +79,12 @@ std::vector<CSong> ReadSongs(std::string_view bytes, const CSongOptions& prefs) 
     if (SongReaders::HoldsCharts(bytes, format)) {
         return SongReaders::ReadChartLinks(bytes, format, prefs);
     }
-    return OneSong(ReadOneSong(bytes, format, prefs));
+    if (format != TSongFormat_ChordPro) return OneSong(ReadOneSong(bytes, format, prefs));
+    std::vector<CSong> songs;
+    for (const SongReaders::CPartOfText& part : SongReaders::SongsOfChordPro(bytes)) {
+        songs.push_back(SongReaders::ReadChordProSong(part, prefs));
+    }
+    return songs;
 }
 
 CSong ReadSong(std::string_view bytes, const CSongOptions& prefs) {

@@ -36,7 +36,8 @@ struct CSongOptions {
 /// n in what is read and played.
 [[nodiscard]] CSong ReadSong(std::string_view bytes, const CSongOptions& prefs = {});
 
-/// All songs of a source: those of a link or of a page; of any other form there is one.
+/// All songs of a source: those of a link, of a page, or of a ChordPro text with `{new_song}`; of
+/// any other form there is one.
 [[nodiscard]] std::vector<CSong> ReadSongs(std::string_view bytes, const CSongOptions& prefs = {});
 
 /// The same for a file; that it is missing, unreadable or larger than 256 MiB is a fault. A song

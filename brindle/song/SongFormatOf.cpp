@@ -19,8 +19,9 @@ namespace {
 
 // Directives that songs with lyrics begin with.
 constexpr auto kDirectives = std::to_array<std::string_view>(
-    {"{title", "{t:", "{subtitle", "{st:", "{artist", "{composer", "{key", "{time", "{tempo",
-     "{capo", "{comment", "{c:", "{meta", "{start_of", "{soc", "{sov", "{sob", "{sot", "{sog"});
+    {"{title", "{t:",    "{subtitle", "{st:",     "{artist", "{composer", "{key",
+     "{time",  "{tempo", "{capo",     "{comment", "{c:",     "{meta",     "{start_of",
+     "{soc",   "{sov",   "{sob",      "{sot",     "{sog",    "{new_song", "{ns}"});
 
 bool HasDirective(std::string_view text) {
     while (!text.empty()) {

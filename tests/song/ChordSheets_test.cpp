@@ -180,11 +180,12 @@ TEST_CASE("Hostile songs end in time and in bounds") {
         return std::chrono::duration<double>(std::chrono::steady_clock::now() - start).count();
     };
     const char* const pieces[] = {
-        "C ", "C :| ", "[1 C :| ", "{",      "% | ", "C: ", "[C]a", "[",    "W/C",
-        "<",  "Zz ",   "C7 b9 ",   "|:[63 ", "r|",   "C[ ", "*A",   "(b9) "};
+        "C ", "C :| ", "[1 C :| ", "{",      "% | ", "C: ", "[C]a", "[",     "W/C",
+        "<",  "Zz ",   "C7 b9 ",   "|:[63 ", "r|",   "C[ ", "*A",   "(b9) ", "(x,F);"};
     constexpr std::size_t kLength = 1 << 11;
     for (const char* piece : pieces) {
-        for (const auto form : {TSongFormat_ChordText, TSongFormat_ChordPro, TSongFormat_Chart}) {
+        for (const auto form : {TSongFormat_ChordText, TSongFormat_ChordPro, TSongFormat_Chart,
+                                TSongFormat_ChordStrings}) {
             CAPTURE(piece);
             CAPTURE(form);
             CHECK(seconds(piece, 16 * kLength, form) < 1.0 + 64 * seconds(piece, kLength, form));

@@ -128,12 +128,29 @@ TEST_CASE("Directives of lyrics with chords are kept") {
     CHECK(song.mStatedKeys[1].mSignKey == CSignKeyLite("A minor"));
     CHECK(song.mStatedKeys[1].mPosition == 2.0);
     CHECK(Shown(song) == "G@0 C@1 Am@2 G@3 C@4 G@5 C@6 Am@7 G@8 C@9 end@10");
+    const CSong labelled = ReadSong(
+        "{start_of_verse: label=\"Verse 1\"}\n[C]x\n{start_of_solo: label='Lead'}\n[F]x\n"
+        "{start_of_abc}\nX:1 [G]a\n{end_of_abc}\n{sob}\n[Am]x");
+    CHECK(ShownSections(labelled) == "Verse 1@0, Lead@1, Bridge@2");
+    CHECK(Shown(labelled) == "C@0 F@1 Am@2 end@3");
     const CSong notes = ReadSong("{title: x}\n{time: often}\n{tempo: slow}\n{chorus}\n[C]x");
     CHECK(Faults(notes) ==
           "2:8: a time is written as in 3/4; 3:9: a tempo is a number of beats a minute; "
           "4:8: there is no chorus before this one");
     CHECK_FALSE(notes.HasFault());
     CHECK(Shown(notes) == "C@0 end@1");
+}
+
+TEST_CASE("A ChordPro text may hold many songs") {
+    const std::string text =
+        "{new_song}\n{title: One}\n[C]x [F]y\n{ns}\n{title: Two}\n[G]x\n[Gzz]\n{New_Song}\n";
+    const std::vector<CSong> songs = ReadSongs(text, {.mLenient = true});
+    REQUIRE(songs.size() == 2);
+    CHECK(songs[0].mTitle == "One");
+    CHECK(Shown(songs[0]) == "C@0 F@1 end@2");
+    CHECK(songs[1].mTitle == "Two");
+    CHECK(Faults(songs[1]) == "7:3: Gzz: \"zz\" at 2 is not understood");
+    CHECK(Faults(ReadSong(text)) == "0:0: one more song of this source is left out");
 }
 
 TEST_CASE("Typed songs are played as scores are") {
@@ -221,11 +238,27 @@ TEST_CASE("Blocks of fifty characters are scrambled, and scrambling twice change
 }
 
 TEST_CASE("Chord strings are put one behind the other, and their faults are told") {
-    const CSong song = ReadSong("(4,C);(2,U);(2,F\u266F7/C#)\n(1.5, G7)");
-    CHECK(Shown(song) == "C@0 U@4 F#7/C#@6 G7@8 end@9.5");
+    const CSong song = ReadSong("(4,C);(2,U);(2,F\u266F7/C#)\n(1.5, Gm(maj7))\n");
+    CHECK(Shown(song) == "C@0 U@4 F\u266F7/C#@6 Gm(maj7)@8 end@9.5");
+    CHECK(song.mChords[1].IsUndef());
+    CHECK(song.mChords[3].mSemitones == CSemitones{0, 3, 7, 11});
     CHECK(ShownSections(song) == "@8");
-    CHECK(Shown(ReadSong("(4,C)\n(2,G);(x,F)")) ==
-          "2:7: \"(x,F)\" is no length and chord, as in (4,C)");
+    struct CRow {
+        const char* mText;
+        const char* mFault;
+    };
+    const CRow rows[] = {
+        {"(4,C)\n(2,G);(x,F)", "2:7: \"(x,F)\" is no length and chord, as in (4,C)"},
+        {"(4,C);(0,G)", "1:7: \"(0,G)\" is no length and chord, as in (4,C)"},
+        {"(4,C);(4,)", "1:7: \"(4,)\" is no length and chord, as in (4,C)"},
+        {"(4,C);(4,Cm7x9)", "1:13: Cm7x9: \"x\" at 4 is not understood"},
+        {"(4,C);(4,%)", "1:10: a chord is wanted with its length, and no repeat"},
+        {"(1e308,C);(1e308,F)", "1:1: the song is too long"},
+    };
+    for (const CRow& row : rows) {
+        CAPTURE(row.mText);
+        CHECK(Shown(ReadSong(row.mText)) == row.mFault);
+    }
 }
 
 TEST_CASE("An analysis in Roman numerals is a song in the keys that it states") {

@@ -23,6 +23,7 @@ TEST_CASE("A split source gives the songs that reading all of it gives") {
         {page, TSongFormat_Auto, 3},
         {page, TSongFormat_ChartPage, 3},
         {"irealbook://One=Me=Swing=C=n=T44C |G7 |C Z", TSongFormat_Auto, 1},
+        {"{t: One}\n[C]x\n{NS}\n{t: Two}\n[F]x\n[Q]", TSongFormat_Auto, 2},
         {"<html>none", TSongFormat_Auto, 1},
         {"Dm7 G7 | C", TSongFormat_Auto, 1},
         {"<score", TSongFormat_Auto, 1},

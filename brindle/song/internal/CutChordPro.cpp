@@ -82,16 +82,36 @@ constexpr auto kDirectiveRows = std::to_array<CDirectiveRow>({
     {"eov", TDirective::Nothing},
     {"end_of_bridge", TDirective::Nothing},
     {"eob", TDirective::Nothing},
-    // Tablature is no text of chords.
+    // Tablature is no text of chords, nor is what other programs draw.
     {"start_of_tab", TDirective::BeginSkip},
     {"sot", TDirective::BeginSkip},
     {"end_of_tab", TDirective::EndSkip},
     {"eot", TDirective::EndSkip},
+    {"start_of_abc", TDirective::BeginSkip},
+    {"end_of_abc", TDirective::EndSkip},
+    {"start_of_ly", TDirective::BeginSkip},
+    {"end_of_ly", TDirective::EndSkip},
+    {"start_of_musicxml", TDirective::BeginSkip},
+    {"end_of_musicxml", TDirective::EndSkip},
+    {"start_of_svg", TDirective::BeginSkip},
+    {"end_of_svg", TDirective::EndSkip},
+    {"start_of_textblock", TDirective::BeginSkip},
+    {"end_of_textblock", TDirective::EndSkip},
     {"start_of_grid", TDirective::BeginGrid},
     {"sog", TDirective::BeginGrid},
     {"end_of_grid", TDirective::EndGrid},
     {"eog", TDirective::EndGrid},
 });
+
+/// `Verse 1` and `label="Verse 1"` name a section alike.
+std::string_view LabelIn(std::string_view value) {
+    std::string_view rest = value;
+    if (!Ascii::TakePrefix(rest, "label=") || rest.empty()) return value;
+    const char quote = rest.front();
+    if (quote != '"' && quote != '\'') return rest.substr(0, rest.find_first_of(" \t"));
+    rest.remove_prefix(1);
+    return rest.substr(0, rest.find(quote));
+}
 
 /// A number from -24 to 24, 0 for what is none.
 int SmallNumber(std::string_view text) {
@@ -128,8 +148,7 @@ private:
         if (row != kDirectiveRows.end()) {
             Obey(*row, value);
         } else if (name.starts_with("start_of_")) {
-            mList.Add(TTokenKind::Section,
-                      value.empty() ? directive.substr(9, name.size() - 9) : value);
+            AddSection(LabelIn(value), directive.substr(9, name.size() - 9));
         }
     }
 
@@ -175,8 +194,7 @@ private:
                 mIsInChorus = true;
                 [[fallthrough]];
             case TDirective::Section:
-                mList.Add(TTokenKind::Section, value.empty() ? row.mSection : value);
-                return;
+                return AddSection(LabelIn(value), row.mSection);
             case TDirective::EndChorus:
                 if (mIsInChorus) mChorusEnd = mList.mTokens.size();
                 mIsInChorus = false;
@@ -194,6 +212,10 @@ private:
             default:
                 return;
         }
+    }
+
+    void AddSection(std::string_view name, std::string_view usual) {
+        mList.Add(TTokenKind::Section, name.empty() ? usual : name);
     }
 
     static std::string_view NameOfRemark(const CDirectiveRow& row) {
@@ -240,7 +262,7 @@ private:
         if (mChorusEnd <= mChorusBegin) {
             return mList.AddNote(value, "there is no chorus before this one");
         }
-        mList.Add(TTokenKind::Section, value.empty() ? name : value);
+        AddSection(LabelIn(value), name);
         // The first token of a chorus is its name.
         if (!mList.AddAgain(mChorusBegin + 1, mChorusEnd)) {
             mList.AddFault(value, "the choruses make the song too long");

@@ -81,7 +81,8 @@ private:
             const int count = StepsOf(token);
             steps += count;
             // Shared bars are divided and not added up, so that thirds of a bar end where it ends.
-            mPosition = chords > 0 ? begin + step * steps : mPosition + step * count;
+            mPosition =
+                chords > 0 ? begin + step * steps : mPosition + LengthOf(token, step * count);
         }
         if (chords > 0) {
             mPosition = begin + BeatsOf(bar);
@@ -89,6 +90,10 @@ private:
             CloseBar(bar, begin);
         }
         return mPosition < kPosEnd || GiveUp("the song is too long");
+    }
+
+    static double LengthOf(const CToken& token, double lengthOfSteps) {
+        return token.mLength > 0.0 ? token.mLength : lengthOfSteps;
     }
 
     static int StepsOf(const CToken& token) {

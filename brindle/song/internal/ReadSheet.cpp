@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <utility>
 
 namespace brindle::SongReaders {
 
@@ -50,6 +51,8 @@ void Cut(TSongFormat format, CTokenList& list) {
             return CutChordsAboveLyrics(list);
         case TSongFormat_Chart:
             return CutChart(list);
+        case TSongFormat_ChordStrings:
+            return CutChordStrings(list);
         default:
             list.mIsEven = format == TSongFormat_EvenText;
             return CutChordText(list);
@@ -71,6 +74,18 @@ void TakeFaults(const CTokenList& list, CSong& song) {
 }
 
 }  // namespace
+
+void GiveUpWhatIsAtFault(CSong& song, bool isLenient) {
+    if (isLenient || !song.HasFault()) return;
+    CSong left;
+    left.mTitle = std::move(song.mTitle);
+    left.mMakers = std::move(song.mMakers);
+    left.mStyle = std::move(song.mStyle);
+    left.mBeatsPerBar = song.mBeatsPerBar;
+    left.mFormat = song.mFormat;
+    left.mFaults = std::move(song.mFaults);
+    song = std::move(left);
+}
 
 CSong ReadSheet(std::string_view text, TSongFormat format, const CSongOptions& prefs) {
     constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";

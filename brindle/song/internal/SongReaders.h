@@ -10,8 +10,18 @@
 /// The readers of single forms. Each gives a song with its format and its faults, by their places.
 namespace brindle::SongReaders {
 
-/// Chord text, plain or even, chords above lyrics, ChordPro, and packed charts.
+/// Chord text, plain or even, chords above lyrics, ChordPro, packed charts, and chord strings.
 [[nodiscard]] CSong ReadSheet(std::string_view text, TSongFormat format, const CSongOptions& prefs);
+
+/// One song of a text that holds several.
+struct CPartOfText {
+    std::string_view mText;
+    std::size_t mLinesBefore = 0;
+};
+
+/// The songs of a ChordPro text, which `{new_song}` parts from each other; one at least.
+[[nodiscard]] std::vector<CPartOfText> SongsOfChordPro(std::string_view text);
+[[nodiscard]] CSong ReadChordProSong(const CPartOfText& part, const CSongOptions& prefs);
 
 /// Whether bytes of this form are links, or a page with links; asked at once, without a look at all
 /// of them.
@@ -22,8 +32,6 @@ namespace brindle::SongReaders {
                                                        const CSongOptions& prefs);
 [[nodiscard]] std::vector<CSong> ReadChartLinks(std::string_view text, TSongFormat format,
                                                 const CSongOptions& prefs);
-
-[[nodiscard]] CSong ReadChordStrings(std::string_view text, const CSongOptions& prefs);
 
 /// An analysis in Roman numerals. Repeats are not played: what is written stands once.
 [[nodiscard]] CSong ReadRomanSong(std::string_view text, const CSongOptions& prefs);

@@ -15,7 +15,7 @@ namespace {
 constexpr std::size_t kMostFaults = 1000;
 /// What the words "chorus" and "x3" may add.
 constexpr std::size_t kMostAddedAgain = 100'000;
-/// Characters of a chord that a fault repeats.
+/// Characters of a text that a fault repeats.
 constexpr int kLongestShown = 40;
 
 struct CRepeatRow {
@@ -124,9 +124,8 @@ void CTokenList::AddFaultOrNote(std::string_view where, std::string text, bool i
 }
 
 void CTokenList::AddFault(std::string_view chord, const CChordTextReading& reading) {
-    const std::string_view shown = chord.substr(0, ByteOfCharacter(chord, kLongestShown + 1));
     AddFault(chord.substr(ByteOfCharacter(chord, reading.mFaultPos)),
-             std::string(shown) + ": " + reading.mFault);
+             std::string(ShownOf(chord)) + ": " + reading.mFault);
 }
 
 void CTokenList::MakeGerman() {
@@ -137,6 +136,10 @@ void CTokenList::MakeGerman() {
         const CChordTextReading reading = ReadChordText(token.mText, prefs);
         if (reading.mKind == TChordText_Chord) token.mChord = reading.mChord;
     }
+}
+
+std::string_view ShownOf(std::string_view text) {
+    return text.substr(0, ByteOfCharacter(text, kLongestShown + 1));
 }
 
 CSongTime ReadTime(std::string_view text) {

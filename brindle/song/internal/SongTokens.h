@@ -36,6 +36,8 @@ struct CToken {
     TSeventhSpelling mSeventh = TSeventhSpelling_Undef;
     /// Holds: steps. RepeatBars: bars.
     int mCount = 1;
+    /// Of a chord whose text tells it, in beats; 0 for a step of the song.
+    double mLength = 0.0;
     /// Of a bar line.
     bool mEndsRepeat = false;
     bool mStartsRepeat = false;
@@ -103,6 +105,9 @@ private:
     std::size_t mAddedAgain = 0;
 };
 
+/// What a fault shows of a text that may be long.
+[[nodiscard]] std::string_view ShownOf(std::string_view text);
+
 /// "3/4" and "3"; undefined for what is none.
 [[nodiscard]] CSongTime ReadTime(std::string_view text);
 
@@ -113,6 +118,7 @@ void CutChordText(CTokenList& list);
 void CutChordsAboveLyrics(CTokenList& list);
 void CutChordPro(CTokenList& list);
 void CutChart(CTokenList& list);
+void CutChordStrings(CTokenList& list);
 
 /// Puts the tokens in time: chords, symbols, bars, sections, keys and repeats of the song.
 void PlaySheet(CTokenList& list);
