@@ -14,7 +14,7 @@ std::unique_ptr<GChDatabase> ReadGrids(const std::string& packagePath) {
     auto database = std::make_unique<GChDatabase>();
     const std::string path =
         packagePath.empty() ? (ResourceFolder() / kGChFactoryPackagePath).string() : packagePath;
-    if (!database->readFromDbPackageAtPath(path)) {
+    if (!GChIsDbPackageAtPath(path) || !database->readFromDbPackageAtPath(path)) {
         Fail(TStatus::BadInput, fmt::format("{} is no package of chord grids", Printable(path)));
         return nullptr;
     }

@@ -42,7 +42,8 @@ brindle_status brindle_grid_package_read(const char* path, brindle_grid_package*
                 ? path
                 : (brindle::ResourceFolder() / brindle::kGChFactoryPackagePath).string();
         auto result = std::make_unique<brindle_grid_package>();
-        if (!result->mDatabase.readFromDbPackageAtPath(used)) {
+        const bool isPackage = path == nullptr || brindle::GChIsDbPackageAtPath(used);
+        if (!isPackage || !result->mDatabase.readFromDbPackageAtPath(used)) {
             return Fail(BRINDLE_ERROR_FILE, brindle::Printable(used) + " is no package of grids");
         }
         *package = result.release();

@@ -199,4 +199,8 @@ private:
 /// it could not be written. A "~" is expanded.
 [[nodiscard]] bool GChCreateDbPackageAtPath(std::string_view path);
 
+/// Whether a path leads to a package: a folder with the file that each package has, or with a
+/// library. readFromDbPackageAtPath takes any folder. A "~" is expanded.
+[[nodiscard]] bool GChIsDbPackageAtPath(std::string_view path);
+
 }  // namespace brindle

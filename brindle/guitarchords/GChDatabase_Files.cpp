@@ -7,6 +7,8 @@
 
 #include <nlohmann/json.hpp>
 
+#include <fstream>
+
 namespace brindle {
 
 namespace fs = std::filesystem;
@@ -51,6 +53,16 @@ FileNode PackageOf(const std::vector<std::shared_ptr<GChLibrary>>& libraries) {
 bool IsLibrary(const FileNode& file) {
     using LibraryFile::kMagic;
     return !file.mIsFolder && file.mContents.compare(0, kMagic.size(), kMagic) == 0;
+}
+
+bool IsLibraryFile(const fs::directory_entry& entry) {
+    using LibraryFile::kMagic;
+    std::error_code error;
+    if (!entry.is_regular_file(error)) return false;
+    std::string begin(kMagic.size(), '\0');
+    std::ifstream file(entry.path(), std::ios::binary);
+    file.read(begin.data(), static_cast<std::streamsize>(begin.size()));
+    return file && begin == kMagic;
 }
 
 std::size_t CountEntries(const fs::path& folder) {
@@ -176,6 +188,17 @@ bool GChCreateDbPackageAtPath(std::string_view path) {
     std::error_code ignored;
     fs::create_directories(packagePath.parent_path(), ignored);
     return WriteFolderAtomically(packagePath, package);
+}
+
+bool GChIsDbPackageAtPath(std::string_view path) {
+    const fs::path package = ExpandTilde(path);
+    std::error_code error;
+    if (fs::is_regular_file(package / kInfoName, error)) return true;
+    for (fs::directory_iterator entries(package, error); entries != fs::directory_iterator();
+         entries.increment(error)) {
+        if (IsLibraryFile(*entries)) return true;
+    }
+    return false;
 }
 
 }  // namespace brindle

@@ -51,6 +51,7 @@ ERRORS = [
     (lambda: brindle.fretted("x320"),                      brindle.FingeringError),
     (lambda: brindle.fretted("hello"),                     brindle.FingeringError),
     (lambda: brindle.GridPackage("no such package"),       brindle.FingeringError),
+    (lambda: brindle.GridPackage("/"),                     brindle.FingeringError),
     (lambda: brindle.fingerings_svg([1]),                  TypeError),
     (lambda: brindle.fingerings_svg([None]),               TypeError),
     (lambda: brindle.fingerings_json([brindle.fretted("x32010"), None]), TypeError),

@@ -184,6 +184,7 @@ TEST_CASE("Faults of fingerings are told") {
     CHECK(brindle_grids_of_frets("x02010", nullptr, 25, &found) == BRINDLE_ERROR_ARGUMENT);
     brindle_grid_package* package = nullptr;
     CHECK(brindle_grid_package_read("/nothing/here", &package) == BRINDLE_ERROR_FILE);
+    CHECK(brindle_grid_package_read("/", &package) == BRINDLE_ERROR_FILE);
     CHECK(package == nullptr);
 }
 

@@ -129,7 +129,7 @@ public:
     explicit CPackage(const std::string& path) {
         const std::string used =
             path.empty() ? (ResourceFolder() / kGChFactoryPackagePath).string() : path;
-        if (mDatabase.readFromDbPackageAtPath(used)) return;
+        if (GChIsDbPackageAtPath(used) && mDatabase.readFromDbPackageAtPath(used)) return;
         throw CFault("FingeringError", Printable(used) + " is no package of fingerings", used);
     }
 
