@@ -2,6 +2,7 @@
 #include "brindle/song/ReadSong.h"
 
 #include "brindle/platform/AtomicFile.h"
+#include "brindle/platform/Utf16.h"
 #include "brindle/song/internal/SongReaders.h"
 
 #include <algorithm>
@@ -49,6 +50,24 @@ CSong ReadOneSong(std::string_view bytes, TSongFormat format, const CSongOptions
     return FailedSong(format, "this is no form of a song");
 }
 
+/// The byte-order mark that UTF-16 has or, by where its first letters have zeros, should have.
+std::string_view MarkOfUtf16(std::string_view bytes) {
+    constexpr std::string_view bigEndian = "\xFE\xFF";
+    constexpr std::string_view littleEndian = "\xFF\xFE";
+    if (bytes.size() < 4) return {};
+    const auto isZero = [&](std::size_t index) { return bytes[index] == '\0'; };
+    if (bytes.starts_with(bigEndian) || (isZero(0) && !isZero(1) && isZero(2) && !isZero(3))) {
+        return bigEndian;
+    }
+    const bool isLittle = !isZero(0) && isZero(1) && !isZero(2) && isZero(3);
+    return bytes.starts_with(littleEndian) || isLittle ? littleEndian : std::string_view();
+}
+
+bool IsControl(char c) {
+    constexpr std::string_view ofTexts = "\t\n\v\f\r\x1A\x1B";
+    return static_cast<unsigned char>(c) < ' ' && ofTexts.find(c) == ofTexts.npos;
+}
+
 std::optional<std::string> BytesOf(const std::string& path, std::string& reason) {
     std::error_code error;
     if (!std::filesystem::exists(path, error)) {
@@ -73,11 +92,34 @@ bool CSong::HasFault() const {
                        [](const CSongFault& fault) { return !fault.mIsNote; });
 }
 
+bool HasNoText(std::string_view bytes) {
+    constexpr std::size_t looked = 4096;
+    constexpr std::size_t fewest = 64;
+    bytes = bytes.substr(0, looked);
+    // Letters of old encodings are text, and a few controls get into some.
+    const auto controls =
+        static_cast<std::size_t>(std::count_if(bytes.begin(), bytes.end(), IsControl));
+    return bytes.size() >= fewest && controls > bytes.size() / 20;
+}
+
+std::optional<std::string> SongTextFromUtf16(std::string_view bytes) {
+    const std::string_view mark = MarkOfUtf16(bytes);
+    if (mark.empty()) return std::nullopt;
+    auto text = Utf8FromUtf16(bytes.starts_with(mark) ? std::string(bytes)
+                                                      : std::string(mark).append(bytes));
+    if (text && SongFormatOf(*text) == TSongFormat_MusicXml) return std::nullopt;
+    return text;
+}
+
 std::vector<CSong> ReadSongs(std::string_view bytes, const CSongOptions& prefs) {
+    if (const auto text = SongTextFromUtf16(bytes)) return ReadSongs(*text, prefs);
     const TSongFormat format =
         prefs.mFormat == TSongFormat_Auto ? SongFormatOf(bytes) : prefs.mFormat;
     if (SongReaders::HoldsCharts(bytes, format)) {
         return SongReaders::ReadChartLinks(bytes, format, prefs);
+    }
+    if (!IsScore(format) && HasNoText(bytes)) {
+        return OneSong(FailedSong(format, "this is neither a text nor a score in MusicXML"));
     }
     if (format != TSongFormat_ChordPro) return OneSong(ReadOneSong(bytes, format, prefs));
     std::vector<CSong> songs;

@@ -4,6 +4,7 @@
 #include "brindle/chords/ReadChordText.h"
 #include "brindle/song/CSong.h"
 
+#include <optional>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -30,10 +31,10 @@ struct CSongOptions {
 
 /// Reads a song in any form.
 ///
-/// Nothing is printed or thrown for bad music or bad bytes: faults are in the song. Of a source
-/// with many songs this is the first. Repeats and jumps may play 64 times what is written, 10,000
-/// bars and chords in any case and 100,000 at most; a song that goes on is at fault. Time is n log
-/// n in what is read and played.
+/// Nothing is printed or thrown for bad music or bad bytes: faults are in the song. A text is
+/// UTF-8, or UTF-16 that SongTextFromUtf16 knows. Of a source with many songs this is the first.
+/// Repeats and jumps may play 64 times what is written, 10,000 bars and chords in any case and
+/// 100,000 at most; a song that goes on is at fault. Time is n log n in what is read and played.
 [[nodiscard]] CSong ReadSong(std::string_view bytes, const CSongOptions& prefs = {});
 
 /// All songs of a source: those of a link, of a page, or of a ChordPro text with `{new_song}`; of
@@ -46,6 +47,15 @@ struct CSongOptions {
 /// All songs of a file.
 [[nodiscard]] std::vector<CSong> ReadSongsFile(const std::string& path,
                                                const CSongOptions& prefs = {});
+
+/// A text in UTF-16 as UTF-8, in which the lines and columns of its faults are counted. UTF-16 is
+/// told by its byte-order mark, or by the zeros beside its first letters. Nothing for other bytes
+/// and for scores, whose XML tells its encoding itself.
+[[nodiscard]] std::optional<std::string> SongTextFromUtf16(std::string_view bytes);
+
+/// Whether bytes, of which the first are looked at, are no text but a picture, a recording or the
+/// like; so is a compressed score.
+[[nodiscard]] bool HasNoText(std::string_view bytes);
 
 /// What a source looks like: any form but TSongFormat_Auto and TSongFormat_EvenText.
 [[nodiscard]] TSongFormat SongFormatOf(std::string_view bytes);

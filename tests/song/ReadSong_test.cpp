@@ -388,6 +388,26 @@ TEST_CASE("What cannot be read is a fault and no song") {
     CHECK(Faults(ReadSong(archive)) == "0:0: the container cannot be unpacked");
 }
 
+TEST_CASE("A text in UTF-16 is read, and what is no text is told from letters of old encodings") {
+    const std::string_view littleEndian(
+        "\xFF\xFE"
+        "C\0 \0G\0b\0",
+        10);
+    const std::string_view withoutMark("\0C\0 \0G\0b", 8);
+    for (const std::string_view bytes : {littleEndian, littleEndian.substr(2), withoutMark}) {
+        const CSong song = ReadSong(bytes);
+        CHECK(song.mFaults.empty());
+        CHECK(song.mSymbols == std::vector<std::string>{"C", "Gb"});
+    }
+    const std::string_view score("\xFF\xFE<\0?\0x\0m\0l\0", 12);
+    CHECK_FALSE(SongTextFromUtf16(score));
+    CHECK_FALSE(SongTextFromUtf16("C Gb"));
+    const std::string noText = "0:0: this is neither a text nor a score in MusicXML";
+    CHECK(Faults(ReadSong("C G " + std::string(100, '\x05'))) == noText);
+    CHECK(Faults(ReadSong("MThd" + std::string(100, '\0'))) == noText);
+    CHECK(ReadSong("C    G\n" + std::string(100, '\xE9') + "\n").mFaults.empty());
+}
+
 TEST_CASE("Lead sheets become songs with the bars that are printed") {
     const CSong song = ReadSongFile(kLeadSheets + "/what_child_is_this.musicxml");
     CHECK(song.mFaults.empty());
