@@ -6,6 +6,14 @@
 #include <string_view>
 
 namespace brindle::cli {
+namespace {
+
+std::string BehindBlank(const std::string& name) {
+    const std::size_t blank = name.find(' ');
+    return blank == name.npos ? "" : name.substr(blank + 1);
+}
+
+}  // namespace
 
 bool COptionPage::TakesFile() const {
     constexpr auto names =
@@ -14,13 +22,25 @@ bool COptionPage::TakesFile() const {
     return mChoices.empty() && std::find(names.begin(), names.end(), name) != names.end();
 }
 
+bool COptionPage::TakesCommand() const {
+    return mIsArgument && mNames.front() == "COMMAND";
+}
+
 std::string CCommandPage::LastName() const {
     return mName.substr(mName.rfind(' ') + 1);
 }
 
 std::string CCommandPage::WordsBelow() const {
-    const std::size_t blank = mName.find(' ');
-    return blank == mName.npos ? "" : mName.substr(blank + 1);
+    return BehindBlank(mName);
+}
+
+std::string CCommandPage::OtherWordsBelow() const {
+    return BehindBlank(mOtherName);
+}
+
+bool CCommandPage::TakesCommand() const {
+    return std::any_of(mOptions.begin(), mOptions.end(),
+                       [](const COptionPage& option) { return option.TakesCommand(); });
 }
 
 std::vector<const CCommandPage*> AllPages(const CCommandPage& page) {

@@ -24,6 +24,8 @@ struct COptionPage {
 
     /// Whether the value may be the name of a file, by the word that stands for it.
     [[nodiscard]] bool TakesFile() const;
+    /// Whether the value is the words of a command of the program.
+    [[nodiscard]] bool TakesCommand() const;
 };
 
 /// A command as it was declared, from which its man page and the completions of shells are made, so
@@ -44,6 +46,10 @@ struct CCommandPage {
     [[nodiscard]] std::string LastName() const;
     /// The words behind the program's, "markov learn"; empty for the program.
     [[nodiscard]] std::string WordsBelow() const;
+    /// The same of its other name; empty for none.
+    [[nodiscard]] std::string OtherWordsBelow() const;
+    /// Whether an argument takes the words of a command.
+    [[nodiscard]] bool TakesCommand() const;
 };
 
 /// A command and all that are below it, each before those that are below it.

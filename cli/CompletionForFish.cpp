@@ -45,35 +45,62 @@ std::string FishLinesOf(const CCommandPage& page) {
         }
     }
     for (const CCommandPage& command : page.mCommands) {
-        text += fmt::format("{} -a {} -d {}\n", start, command.LastName(),
-                            FishQuoted(command.mPurpose));
+        const std::string shown =
+            fmt::format(" -a {} -d {}\n", command.LastName(), FishQuoted(command.mPurpose));
+        text += start + shown;
+        text +=
+            fmt::format("complete -c brindle -n \"__brindle_describes '{}'\"", page.WordsBelow()) +
+            shown;
     }
     return text;
 }
 
-std::string CommandCases(const CCommandPage& program) {
+// The steps from command to command, also by other names.
+std::string FishPathCases(const CCommandPage& program) {
+    std::string names;
     std::string text;
     for (const CCommandPage* const page : AllPages(program)) {
-        if (page != &program) text += ' ' + FishQuoted(page->WordsBelow());
+        if (page == &program) continue;
+        names += ' ' + FishQuoted(page->WordsBelow());
+        if (page->mOtherName.empty()) continue;
+        text += fmt::format("            case {}\n                set path {}\n",
+                            FishQuoted(page->OtherWordsBelow()), FishQuoted(page->WordsBelow()));
     }
-    return text;
+    return text + "            case" + names + "\n                set path $next\n";
+}
+
+// The commands whose arguments are the words of another.
+std::string DescribingCommands(const CCommandPage& program) {
+    std::string names;
+    for (const CCommandPage& page : program.mCommands) {
+        if (page.TakesCommand()) names += ' ' + page.LastName();
+    }
+    return names;
 }
 
 }  // namespace
 
 std::string FishCompletion(const CCommandPage& program) {
     std::string text = R"(# fish completion for brindle
-function __brindle_is
+function __brindle_path
     set -l path
-    for word in (commandline -opc)[2..-1]
+    for word in $argv
         set -l next (string join ' ' -- $path $word)
         switch "$next"
-            case)" + CommandCases(program) +
-                       R"(
-                set path $next
-        end
+)" + FishPathCases(program) +
+                       R"(        end
     end
-    test "$path" = "$argv[1]"
+    echo "$path"
+end
+function __brindle_is
+    set -l words (commandline -opc)
+    test (__brindle_path $words[2..]) = "$argv[1]"
+end
+function __brindle_describes
+    set -l words (commandline -opc)
+    contains -- "$words[2]")" +
+                       DescribingCommands(program) + R"(
+    and test (__brindle_path $words[3..]) = "$argv[1]"
 end
 complete -c brindle -f
 )";

@@ -9,11 +9,15 @@
 namespace brindle::cli {
 namespace {
 
-/// "_brindle_markov_learn"
-std::string FunctionOf(const CCommandPage& page) {
-    std::string name = '_' + page.mName;
+std::string FunctionNamed(const std::string& command) {
+    std::string name = '_' + command;
     std::replace(name.begin(), name.end(), ' ', '_');
     return name;
+}
+
+/// "_brindle_markov_learn"
+std::string FunctionOf(const CCommandPage& page) {
+    return FunctionNamed(page.mName);
 }
 
 /// A text within single quotes, with `special` characters behind a backslash.
@@ -29,6 +33,7 @@ std::string ZshQuoted(std::string_view text, std::string_view special) {
 /// What completes a value: "(text json)", "_files", or nothing.
 std::string ActionOf(const COptionPage& option) {
     if (!option.mChoices.empty()) return fmt::format("({})", fmt::join(option.mChoices, " "));
+    if (option.TakesCommand()) return "_brindle_pages";
     return option.TakesFile() ? "_files" : " ";
 }
 
@@ -60,8 +65,8 @@ std::string Arguments(const CCommandPage& page) {
 std::string CommandList(const CCommandPage& page) {
     std::string text;
     for (const CCommandPage& command : page.mCommands) {
-        text += fmt::format("                '{}:{}'\n", command.LastName(),
-                            ZshQuoted(command.mPurpose, ":"));
+        text +=
+            fmt::format("        '{}:{}'\n", command.LastName(), ZshQuoted(command.mPurpose, ":"));
     }
     return text;
 }
@@ -75,22 +80,38 @@ std::string FunctionText(const CCommandPage& page) {
     _arguments -C{1} \
         '1: :->command' '*:: :->rest'
     case $state in
-        command)
-            local -a commands=(
-{2}            )
-            _describe command commands ;;
+        command) {0}_commands ;;
         rest) (( $+functions[{0}_$line[1]] )) && {0}_$line[1] ;;
     esac
 }}
+{0}_commands() {{
+    local -a commands=(
+{2}    )
+    _describe command commands
+}}
 )",
                        FunctionOf(page), Arguments(page), CommandList(page));
+}
+
+// The function for the other name of a command.
+std::string OtherFunctionText(const CCommandPage& page) {
+    if (page.mOtherName.empty()) return {};
+    return fmt::format("{}() {{ {}; }}\n", FunctionNamed(page.mOtherName), FunctionOf(page));
 }
 
 }  // namespace
 
 std::string ZshCompletion(const CCommandPage& program) {
     std::string text = "#compdef brindle\n";
-    for (const CCommandPage* const page : AllPages(program)) text += FunctionText(*page);
+    for (const CCommandPage* const page : AllPages(program)) {
+        text += FunctionText(*page) + OtherFunctionText(*page);
+    }
+    text += R"(_brindle_help() { _arguments '*:COMMAND:_brindle_pages'; }
+_brindle_pages() {
+    local -a above=(brindle ${words[2,CURRENT-1]:#-*})
+    (( $+functions[_${(j:_:)above}_commands] )) && _${(j:_:)above}_commands
+}
+)";
     // As a file of the function path it is called at once, else it is told what it completes.
     return text +
            "if [ \"$funcstack[1]\" = _brindle ]; then\n    _brindle \"$@\"\nelse\n"

@@ -76,6 +76,7 @@ void CheckCommand(const std::string& path, const CCompletions& shells, int& opti
     std::replace(function.begin(), function.end(), ' ', '_');
     const std::string bash = Between(shells.mBash, "\n        '" + path + "') options=", ";;");
     const std::string zsh = Between(shells.mZsh, "\n" + function + "() {", "\n}");
+    const std::string zshCommands = Between(shells.mZsh, "\n" + function + "_commands() {", "\n}");
     const std::string fishStart = "complete -c brindle -n \"__brindle_is '" + path + "'\"";
     CHECK_FALSE(help.mOptions.empty());
     for (const std::string& option : help.mOptions) {
@@ -96,7 +97,7 @@ void CheckCommand(const std::string& path, const CCompletions& shells, int& opti
     for (const std::string& command : help.mCommands) {
         INFO(command);
         CHECK(bash.find(command + ' ') != bash.npos);
-        CHECK(zsh.find('\'' + command + ':') != zsh.npos);
+        CHECK(zshCommands.find('\'' + command + ':') != zshCommands.npos);
         CHECK(shells.mFish.find(fishStart + " -a " + command + " -d") != shells.mFish.npos);
         CheckCommand(path.empty() ? command : path + ' ' + command, shells, optionCount);
     }
@@ -123,6 +124,12 @@ TEST_CASE("The completion of bash completes commands, options, choices and files
         {"brindle analyse --route ''", "tonic cadence weights none\n"},
         {"brindle analyse --format = js", "json\n"},
         {"brindle completion z", "zsh\n"},
+        {"brindle analyze --ro", "--route\n"},
+        {"brindle manual cor", "corpus\n"},
+        {"brindle manual markov ge", "generate\n"},
+        {"brindle manual --fo", "--folder\n"},
+        {"brindle help markov ge", "generate\n"},
+        {"brindle manual completion ''", "\n"},
         {"brindle analyse so", "song.txt\n"},
         {"brindle markov learn -o so", "song.txt\n"},
     };
