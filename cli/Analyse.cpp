@@ -260,6 +260,9 @@ TStatus AnalyseScore(const CTypedSong& typed, const CSignKeyLite& key,
                         "them",
                         Printable(typed.mName)));
     }
+    if (options.mTiming == "played" && analysed.mSong.mChords.size() < 2) {
+        return FailWithoutChords(typed);
+    }
     StateKey(key, analysed.mSong);
     if (!key.IsUndef()) sheet.HarmSignKeys = analysed.mSong.mStatedKeys;
     CHarmonicAnalyse& analyse = analysed.mAnalyse;

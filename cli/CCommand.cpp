@@ -3,6 +3,10 @@
 
 #include "cli/DidYouMean.h"
 
+#include "brindle/chords/ReadChordText.h"
+#include "brindle/platform/Ascii.h"
+#include "brindle/platform/FileNames.h"
+
 #include <fmt/format.h>
 
 #include <CLI/CLI.hpp>
@@ -47,6 +51,13 @@ std::vector<std::string> CommandNames(const CLI::App& app) {
     return names;
 }
 
+const CLI::App* CommandOf(const CLI::App& app, const std::string& name) {
+    for (const CLI::App* const command : app.get_subcommands({})) {
+        if (command->check_name(name)) return command;
+    }
+    return nullptr;
+}
+
 std::vector<std::string> OptionNames(const CLI::App& app) {
     std::vector<std::string> names;
     for (const CLI::Option* const option : app.get_options()) {
@@ -76,33 +87,54 @@ TStatus FailWithHelp(const CLI::App& app, std::string_view message) {
 /// The words of the command line behind the program's name.
 using TTypedWords = std::vector<std::string>;
 
-// The first option that the command does not have. What stands behind "=" is its value.
+// The first option that the command does not have. What stands behind "=" is its value, and behind
+// the letter of a short one.
 std::string UnknownOption(const CLI::App& app, const TTypedWords& words) {
-    const auto names = OptionNames(app);
     for (const std::string& word : words) {
-        if (!word.starts_with("--") || word == "--") continue;
-        const std::string name = word.substr(0, word.find('='));
-        if (std::find(names.begin(), names.end(), name) == names.end()) return name;
+        const bool isLong = word.starts_with("--");
+        const bool isShort = word.size() > 1 && word[0] == '-' && Ascii::IsLetter(word[1]);
+        if (!(isLong ? word != "--" : isShort)) continue;
+        const std::string name = word.substr(0, isLong ? word.find('=') : 2);
+        if (app.get_option_no_throw(name) == nullptr) return name;
     }
     return {};
+}
+
+// A letter is short for the only option that begins with it.
+std::string MeantOption(const CLI::App& app, const std::string& name) {
+    std::vector<std::string> names = OptionNames(app);
+    if (name.starts_with("--")) return DidYouMean(name, names);
+    std::erase_if(names, [&](const std::string& n) { return n[2] != Ascii::ToLower(name[1]); });
+    return names.size() == 1 ? DidYouMean(names.front(), names) : std::string();
 }
 
 TStatus FailForUnknown(const CLI::App& app, const TTypedWords& words, const std::string& message) {
     const std::string name = UnknownOption(app, words);
     if (name.empty()) return FailWithHelp(app, message);
-    const std::string meant = DidYouMean(name, OptionNames(app));
-    return FailWithHelp(app, fmt::format("{} is no option of {}{}", name, CallOf(app), meant));
+    return FailWithHelp(
+        app, fmt::format("{} is no option of {}{}", name, CallOf(app), MeantOption(app, name)));
 }
 
-// A song in the place of a command is what somebody types who has not read the help.
+// How a song in the place of a command is read, which is what somebody types who has not read the
+// help; nothing for what is no song.
+std::string HowToRead(const std::string& typed) {
+    std::error_code error;
+    const std::string shown = Printable(typed);
+    if (std::filesystem::is_regular_file(typed, error)) {
+        return fmt::format("{} is a file and no subcommand; brindle analyse {} reads it as a song",
+                           shown, shown);
+    }
+    if (LooksLikeFileName(typed)) return shown + " is no subcommand, and there is no such file";
+    const std::string first = typed.substr(0, typed.find_first_of(Ascii::kWhiteSpace));
+    if (ReadChordText(first).mKind != TChordText_Chord) return {};
+    return fmt::format("{} is no subcommand; brindle analyse \"{}\" reads it as a song", shown,
+                       shown);
+}
+
 TStatus FailForCommand(const CLI::App& app, const std::string& typed) {
     const auto names = CommandNames(app);
-    std::error_code error;
-    if (std::filesystem::is_regular_file(typed, error)) {
-        return Fail(TStatus::BadUsage, fmt::format("{} is a file and no subcommand; brindle "
-                                                   "analyse {} reads it as a song",
-                                                   Printable(typed), Printable(typed)));
-    }
+    const std::string how = app.get_parent() == nullptr ? HowToRead(typed) : std::string();
+    if (!how.empty()) return Fail(TStatus::BadUsage, how);
     const std::string nearest = NearestWord(typed, names);
     if (!nearest.empty()) {
         return FailWithHelp(app,
@@ -110,6 +142,36 @@ TStatus FailForCommand(const CLI::App& app, const std::string& typed) {
     }
     return Fail(TStatus::BadUsage, fmt::format("{} is no subcommand, there are: {}",
                                                Printable(typed), fmt::join(names, ", ")));
+}
+
+// The words of a command line, with those of `help COMMAND` in the order of `COMMAND --help`, which
+// other programs have taught people.
+struct CHelpWords {
+    TTypedWords mWords;
+    const CLI::App* mApp;   // the command that they lead to
+    std::string mNextWord;  // which is none of its commands
+    bool mIsHelp = false;
+};
+
+CHelpWords WithHelpBehind(const CLI::App& program, TTypedWords words) {
+    CHelpWords help{std::move(words), &program, {}};
+    for (std::size_t i = 0; i < help.mWords.size() && !CommandNames(*help.mApp).empty();) {
+        const std::string word = help.mWords[i];
+        if (word == "help" && !help.mIsHelp) {
+            help.mIsHelp = true;
+            help.mWords.erase(help.mWords.begin() + static_cast<std::ptrdiff_t>(i));
+            continue;
+        }
+        const CLI::App* const command = CommandOf(*help.mApp, word);
+        if (command == nullptr) {
+            help.mNextWord = word;
+            break;
+        }
+        help.mApp = command;
+        ++i;
+    }
+    if (help.mIsHelp) help.mWords.emplace_back("--help");
+    return help;
 }
 
 // The first word behind those that lead to the command, if it is none of its options.
@@ -340,10 +402,15 @@ CCommandPage CCommand::Page() const {
 }
 
 TStatus CCommand::Run(int argc, const char* const* argv) {
+    const auto help = WithHelpBehind(*mApp, TTypedWords(argv + std::min(argc, 1), argv + argc));
+    const bool isOption = help.mNextWord.starts_with("-");
+    if (help.mIsHelp && !help.mNextWord.empty() && !isOption) {
+        return FailForCommand(*help.mApp, help.mNextWord);
+    }
     try {
-        mApp->parse(argc, argv);
+        mApp->parse(TTypedWords(help.mWords.rbegin(), help.mWords.rend()));
     } catch (const CLI::ParseError& error) {
-        return Report(*mApp, error, TTypedWords(argv + std::min(argc, 1), argv + argc));
+        return Report(*mApp, error, help.mWords);
     }
     return *mStatus;
 }

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "cli/DidYouMean.h"
 
+#include "brindle/platform/Ascii.h"
+
 #include <algorithm>
 #include <array>
 #include <numeric>
@@ -13,8 +15,8 @@ constexpr std::size_t kMostLetters = 40;
 
 using TDistances = std::array<std::size_t, kMostLetters + 1>;
 
-/// How many letters are to be changed, added, left out or exchanged with the next (optimal string
-/// alignment).
+/// How many letters, large or small, are to be changed, added, left out or exchanged with the next
+/// (optimal string alignment).
 std::size_t EditDistance(std::string_view a, std::string_view b) {
     std::array<TDistances, 3> rows{};  // of the last two letters of a and of this one
     std::iota(rows[0].begin(), rows[0].end(), std::size_t{0});
@@ -24,7 +26,8 @@ std::size_t EditDistance(std::string_view a, std::string_view b) {
         TDistances& row = rows[i % 3];
         row[0] = i;
         for (std::size_t k = 1; k <= b.size(); ++k) {
-            const std::size_t changed = back[k - 1] + (a[i - 1] == b[k - 1] ? 0 : 1);
+            const bool isSame = Ascii::ToLower(a[i - 1]) == Ascii::ToLower(b[k - 1]);
+            const std::size_t changed = back[k - 1] + (isSame ? 0 : 1);
             row[k] = std::min({changed, back[k] + 1, row[k - 1] + 1});
             const bool isExchanged = i > 1 && k > 1 && a[i - 1] == b[k - 2] && a[i - 2] == b[k - 1];
             if (isExchanged) row[k] = std::min(row[k], twoBack[k - 2] + 1);

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "cli/CommandLine.h"
-#include "cli/Input.h"
 #include "cli/KeyText.h"
 #include "cli/TypedChords.h"
+#include "cli/TypedSymbols.h"
 
 #include "brindle/chords/CChordLite.h"
 #include "brindle/present/FunctionsText.h"

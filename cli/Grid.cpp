@@ -2,9 +2,9 @@
 #include "cli/CommandLine.h"
 #include "cli/GridDatabase.h"
 #include "cli/GridOptions.h"
-#include "cli/Input.h"
 #include "cli/NamingOptions.h"
 #include "cli/TypedChords.h"
+#include "cli/TypedSymbols.h"
 
 #include "brindle/chords/NameNotes.h"
 #include "brindle/platform/Ascii.h"

@@ -16,8 +16,7 @@ std::optional<CScoreNotes> ReadNotes(const CTypedSong& song) {
     CScoreNotes notes;
     Error error;
     if (ReadScoreNotes(song.mText, notes, &error)) return notes;
-    Fail(TStatus::BadInput,
-         fmt::format("{}: {}", Printable(song.mName), Printable(error.description)));
+    TellScoreFault(song.mText, song.mName, error.description);
     return std::nullopt;
 }
 

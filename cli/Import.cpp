@@ -2,6 +2,7 @@
 #include "cli/CommandLine.h"
 #include "cli/Input.h"
 #include "cli/Json.h"
+#include "cli/LeadSheet.h"
 #include "cli/Progress.h"
 #include "cli/TypedSongs.h"
 
@@ -67,27 +68,14 @@ private:
     int mCount = 0;
 };
 
-// False with an error; nothing when standard input cannot be read.
-std::optional<bool> ImportFrom(const std::string& file, const MusicXmlParserDelegate& host,
-                               Error& error) {
-    const bool isNamedFile = file != "-";
-    const auto bytes = isNamedFile ? ReadWholeFile(file, kMuxmlMaxFileSize) : ReadInput(file);
-    if (bytes) {
-        const bool isContainer = IsScoreContainer(*bytes) || file.ends_with(".mxl");
-        return ImportScore(*bytes, isContainer, kImportTicksPerQuarter, host, error);
-    }
-    if (!isNamedFile) return std::nullopt;
-    // The library tells why it cannot read a file.
-    return MusicXmlParser().parseURL(file, std::make_shared<MusicXmlParserDelegate>(host), &error);
-}
-
-/// The same, and a terminal shows how many bars of all parts have been read.
-std::optional<bool> ImportWithProgress(const std::string& file, const MusicXmlParserDelegate& host,
-                                       Error& error) {
+/// False with an error. A terminal shows how many bars of all parts have been read.
+bool ImportWithProgress(std::string_view bytes, const std::string& file,
+                        const MusicXmlParserDelegate& host, Error& error) {
     CCountProgress progress(InputName(file), "bars");
     MusicXmlParserDelegate counter;
     counter.didEncounterMeasureStart = [&progress](std::int32_t) { progress.CountOne(); };
-    return ImportFrom(file, TellBoth(host, counter), error);
+    const bool isContainer = IsScoreContainer(bytes) || file.ends_with(".mxl");
+    return ImportScore(bytes, isContainer, kImportTicksPerQuarter, TellBoth(host, counter), error);
 }
 
 std::string HeadOf(const std::string& name, bool isFirst, const CImportOptions& options) {
@@ -109,8 +97,19 @@ struct CImported {
     std::optional<std::string> mOutput;
 };
 
+/// Of a file that cannot be read lines of JSON have the error that hosts get of the library.
+CImported Unread(const std::string& file, const CImportOptions& options) {
+    if (!options.IsNdjson() || file == "-") return {};
+    Error error;
+    const bool isOk =
+        MusicXmlParser().parseURL(file, std::make_shared<MusicXmlParserDelegate>(), &error);
+    return {TStatus::BadInput, MuxmlResultLine(isOk, error) + '\n'};
+}
+
 CImported ImportFile(const std::string& file, const CImportOptions& options) {
     const std::string name = InputName(file);
+    const auto bytes = ReadInput(file, file == "-" ? kMostInputBytes : kMuxmlMaxFileSize);
+    if (!bytes) return Unread(file, options);
     const CAlertsAsErrors alerts(name);
     CImportedScore score;
     std::string output;
@@ -121,15 +120,14 @@ CImported ImportFile(const std::string& file, const CImportOptions& options) {
         methods = options.mMidiFile ? TellBoth(lines, methods) : lines;
     }
     Error error;
-    const auto isOk = ImportWithProgress(file, methods, error);
-    if (!isOk) return {};
-    if (!*isOk) Fail(TStatus::BadInput, fmt::format("{}: {}", name, Printable(error.description)));
-    if (*isOk && options.mMidiFile && WriteMidi(score, *options.mMidiFile) != TStatus::Success) {
+    const bool isOk = ImportWithProgress(*bytes, file, methods, error);
+    if (!isOk) TellScoreFault(*bytes, name, error.description);
+    if (isOk && options.mMidiFile && WriteMidi(score, *options.mMidiFile) != TStatus::Success) {
         return {};
     }
-    const TStatus status = *isOk && alerts.Count() == 0 ? TStatus::Success : TStatus::BadInput;
-    if (options.IsNdjson()) return {status, output + MuxmlResultLine(*isOk, error) + '\n'};
-    if (!*isOk) return {};
+    const TStatus status = isOk && alerts.Count() == 0 ? TStatus::Success : TStatus::BadInput;
+    if (options.IsNdjson()) return {status, output + MuxmlResultLine(isOk, error) + '\n'};
+    if (!isOk) return {};
     return {status, ImportText(score, PaintOfOutput())};
 }
 

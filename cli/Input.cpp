@@ -1,8 +1,11 @@
 // SPDX-License-Identifier: MIT
 #include "cli/Input.h"
 
+#include "brindle/analysis/ReadNumerals.h"
 #include "brindle/chords/ReadChordText.h"
+#include "brindle/platform/Ascii.h"
 #include "brindle/platform/FileNames.h"
+#include "brindle/song/ReadSong.h"
 #include "brindle/theory/KeyNames.h"
 
 #include <fmt/format.h>
@@ -19,26 +22,27 @@
 namespace brindle::cli {
 namespace {
 
-// A song has a few kilobytes; what is larger than this is no chord text but a mistake.
-constexpr std::size_t kMaxInputBytes = std::size_t{64} << 20;
-
 constexpr std::string_view kWhiteSpace = " \t\n\v\f\r";
+constexpr CSignKeyLite kCMajor(CKeyEnh{0, TEnh_n}, TSignKeyType_Major);
 
 struct CCloser {
     void operator()(std::FILE* file) const { std::fclose(file); }
 };
 
 std::optional<std::string> Unreadable(const std::string& name, std::string_view reason) {
-    Fail(TStatus::BadInput, fmt::format("{} cannot be read: {}", Printable(name), reason));
+    Fail(TStatus::BadInput, fmt::format("{} cannot be read: {}", InputName(name), reason));
     return std::nullopt;
 }
 
-std::optional<std::string> ReadAll(std::FILE* file, const std::string& name) {
+std::optional<std::string> ReadAll(std::FILE* file, const std::string& name,
+                                   std::size_t mostBytes) {
     std::string content;
     std::array<char, 1 << 16> buffer;
     while (const std::size_t count = std::fread(buffer.data(), 1, buffer.size(), file)) {
         content.append(buffer.data(), count);
-        if (content.size() > kMaxInputBytes) return Unreadable(name, "it is larger than 64 MiB");
+        if (content.size() > mostBytes) {
+            return Unreadable(name, fmt::format("it is larger than {} MiB", mostBytes >> 20));
+        }
     }
     if (std::ferror(file) != 0) return Unreadable(name, std::strerror(errno));
     return content;
@@ -65,21 +69,44 @@ std::vector<std::string> TrimmedLines(std::string_view text) {
     return lines;
 }
 
-// Of a command that takes no songs: a file there may have the name of a chord.
-bool IsNoChordButAFile(const std::string& word) {
-    return LooksLikeFileName(word) && !ReadChordText(word).mFault.empty();
+bool IsFolder(const std::string& path) {
+    std::error_code error;
+    return std::filesystem::is_directory(path, error);
 }
 
-// What a song has between its symbols, and what is no symbol itself.
-bool IsBarLineOrHold(const std::string& word) {
-    return !word.empty() && (word == "." || word.find_first_not_of("|:") == word.npos);
+bool IsRegularFile(const std::string& path) {
+    std::error_code error;
+    return std::filesystem::is_regular_file(path, error);
+}
+
+// songs/one, which a chord over a bass (C/one) or a numeral (V7/one) may look like.
+bool IsPathWithoutEnding(const std::string& word) {
+    const std::size_t slash = word.rfind('/');
+    if (slash == word.npos || word.find("://") != word.npos) return false;
+    if (IsFolder(word.substr(0, slash))) return true;
+    const std::string first = word.substr(0, word.find('/'));
+    const bool isOneWord = word.find_first_of(kWhiteSpace) == word.npos;
+    return isOneWord && !first.empty() && Ascii::IsLetter(first.front()) &&
+           ReadChordText(first).mFaultPos == 1 && !BeginsWithNumeral(first, kCMajor);
+}
+
+// Of a command that takes no songs: a file there may have the name of a chord.
+bool IsNoChordButAFile(const std::string& word) {
+    const bool isFile = LooksLikeFileName(word) || IsRegularFile(word) || IsFolder(word) ||
+                        IsPathWithoutEnding(word);
+    return isFile && !ReadChordText(word).mFault.empty();
 }
 
 std::optional<std::string> ReadInputs(const std::vector<std::string>& names) {
     std::string all;
     for (const std::string& name : names) {
-        const auto text = ReadInput(name);
+        const auto text = ReadTextInput(name);
         if (!text) return std::nullopt;
+        if (IsScore(SongFormatOf(*text))) {
+            Fail(TStatus::BadInput,
+                 InputName(name) + " is a score; brindle harmonies lists its chords");
+            return std::nullopt;
+        }
         all += *text + '\n';
     }
     return all;
@@ -88,9 +115,7 @@ std::optional<std::string> ReadInputs(const std::vector<std::string>& names) {
 }  // namespace
 
 bool IsFileName(const std::string& word) {
-    std::error_code error;
-    if (std::filesystem::is_regular_file(word, error)) return true;
-    return IsNoChordButAFile(word);
+    return IsRegularFile(word) || IsNoChordButAFile(word);
 }
 
 bool AreInputs(const std::vector<std::string>& words) {
@@ -99,19 +124,30 @@ bool AreInputs(const std::vector<std::string>& words) {
 }
 
 std::string InputName(const std::string& path) {
+    if (path.empty()) return "\"\"";
     return path == "-" ? "standard input" : Printable(path);
 }
 
-std::optional<std::string> ReadInput(const std::string& path) {
-    if (path == "-") return ReadAll(stdin, InputName(path));
+std::optional<std::string> ReadInput(const std::string& path, std::size_t mostBytes) {
+    if (path == "-") return ReadAll(stdin, path, mostBytes);
+    if (IsFolder(path)) {
+        const std::string name = Printable(path);
+        Fail(TStatus::BadInput,
+             fmt::format("{} is a folder; brindle corpus {} reads the songs in it", name, name));
+        return std::nullopt;
+    }
     const std::unique_ptr<std::FILE, CCloser> file(std::fopen(path.c_str(), "rb"));
     if (file == nullptr) return Unreadable(path, std::strerror(errno));
-    return ReadAll(file.get(), path);
+    return ReadAll(file.get(), path, mostBytes);
 }
 
-std::optional<std::string> TextFromWords(const std::vector<std::string>& words) {
-    if (AreInputs(words)) return ReadInputs(words);
-    return fmt::format("{}", fmt::join(words, " "));
+std::optional<std::string> ReadTextInput(const std::string& path) {
+    auto text = ReadInput(path);
+    if (!text) return std::nullopt;
+    if (auto decoded = SongTextFromUtf16(*text)) return decoded;
+    if (IsScore(SongFormatOf(*text)) || !HasNoText(*text)) return text;
+    Fail(TStatus::BadInput, InputName(path) + " is neither a text nor a score in MusicXML");
+    return std::nullopt;
 }
 
 std::string FoldAccidentals(std::string_view text) {
@@ -121,36 +157,17 @@ std::string FoldAccidentals(std::string_view text) {
 }
 
 std::optional<std::vector<std::string>> TypedLines(const std::vector<std::string>& words) {
-    const auto text = TextFromWords(words);
+    if (!AreInputs(words)) return std::vector{fmt::format("{}", fmt::join(words, " "))};
+    const auto text = ReadInputs(words);
     if (!text) return std::nullopt;
-    return AreInputs(words) ? TrimmedLines(*text) : std::vector<std::string>{*text};
-}
-
-std::optional<std::vector<std::string>> TypedSongLines(const std::vector<std::string>& words) {
-    if (words.size() != 1 || !IsFileName(words.front())) return TypedLines(words);
-    const auto text = ReadInput(words.front());
-    if (!text) return std::nullopt;
-    return TrimmedLines(*text);
+    auto lines = TrimmedLines(*text);
+    if (!lines.empty()) return lines;
+    Fail(TStatus::BadInput, fmt::format("{} is empty", InputName(words.front())));
+    return std::nullopt;
 }
 
 std::vector<std::string> WordsOf(std::string_view text) {
     return Split(text, kWhiteSpace);
-}
-
-std::optional<std::vector<std::string>> TypedSymbols(const std::vector<std::string>& words) {
-    std::vector<std::string> symbols = words;
-    if (AreInputs(words)) {
-        const auto text = ReadInputs(words);
-        if (!text) return std::nullopt;
-        symbols = WordsOf(*text);
-    }
-    std::erase_if(symbols, IsBarLineOrHold);
-    if (!symbols.empty()) return symbols;
-    const bool isOneFile = words.size() == 1 && AreInputs(words);
-    Fail(TStatus::BadInput,
-         fmt::format("{} no chord symbols",
-                     isOneFile ? InputName(words.front()) + " has" : std::string("there are")));
-    return std::nullopt;
 }
 
 }  // namespace brindle::cli

@@ -64,7 +64,6 @@ std::optional<std::string> Contradiction(const CKeysOptions& options) {
 // Nothing when it cannot be read; then the error has been printed.
 std::optional<CSong> SongOf(const CTypedSong& typed, const CSignKeyLite& key,
                             const CKeysOptions& options) {
-    if (typed.mIsScore) return ReadScore(typed);
     TChordStringParse parse;
     parse.mBeatsPerBar = options.mKeys.mBeatsPerBar;
     parse.mBeatsPerChord = options.mBeatsPerChord;

@@ -33,7 +33,7 @@ bool HasScoreName(std::string_view name) {
 }
 
 std::optional<TMusicXMLDoc> Unreadable(const CTypedSong& song, std::string_view reason) {
-    Fail(TStatus::BadInput, fmt::format("{}: {}", Printable(song.mName), Printable(reason)));
+    TellScoreFault(song.mText, song.mName, reason);
     return std::nullopt;
 }
 
@@ -55,6 +55,20 @@ std::string FaultOf(std::string_view bytes) {
 
 bool HasScoreBytes(std::string_view bytes) {
     return IsScore(SongFormatOf(bytes));
+}
+
+void TellScoreFault(std::string_view bytes, const std::string& name, std::string_view reason) {
+    const char* const head = HasScoreBytes(bytes) ? "" : " is no score in MusicXML";
+    Fail(TStatus::BadInput, fmt::format("{}{}: {}", Printable(name), head, Printable(reason)));
+}
+
+TStatus FailWithoutChords(const CTypedSong& song) {
+    const std::string name = song.mName.empty() ? "the song" : Printable(song.mName);
+    if (!song.mIsScore) return Fail(TStatus::BadInput, name + " has no chords");
+    return Fail(TStatus::BadInput,
+                fmt::format("{} has no chord symbols; brindle harmonies --from-notes names chords "
+                            "from its notes",
+                            name));
 }
 
 std::vector<CSongSource> SongSources(const std::vector<std::string>& words) {
@@ -81,7 +95,7 @@ std::vector<CSongSource> SongSources(const std::vector<std::string>& words) {
 std::optional<CTypedSong> ReadTypedSong(const CSongSource& source) {
     CTypedSong song;
     song.mName = source.mFile == "-" ? "standard input" : source.mFile;
-    auto text = source.mFile.empty() ? source.mText : ReadInput(source.mFile);
+    auto text = source.mFile.empty() ? source.mText : ReadTextInput(source.mFile);
     if (!text) return std::nullopt;
     song.mText = std::move(*text);
     song.mIsScore =
@@ -119,8 +133,7 @@ std::optional<CSheetSong> ReadPlayedSheet(const CTypedSong& song) {
     const CSongFault& fault = sheet.mSong.mFaults.front();
     const std::string place =
         fault.mLine > 0 ? fmt::format("{}:{}: ", fault.mLine, fault.mColumn) : "";
-    Fail(TStatus::BadInput,
-         fmt::format("{}: {}{}", Printable(song.mName), place, Printable(fault.mText)));
+    TellScoreFault(song.mText, song.mName, place + fault.mText);
     return std::nullopt;
 }
 

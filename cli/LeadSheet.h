@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "cli/Output.h"
+
 #include "brindle/song/ReadSheetSong.h"
 
 #include <optional>
@@ -40,6 +42,12 @@ struct CSongSource {
 
 /// Whether a file that begins so is a score and no chord text.
 [[nodiscard]] bool HasScoreBytes(std::string_view bytes);
+
+/// Prints why a score cannot be read, and whether it looks like one at all.
+void TellScoreFault(std::string_view bytes, const std::string& name, std::string_view reason);
+
+/// Prints that a song has no chords, and what finds them in the notes of a score.
+TStatus FailWithoutChords(const CTypedSong& song);
 
 /// The chords of a score, plain or compressed. Nothing when it cannot be read; then the error has
 /// been printed.

@@ -3,6 +3,7 @@
 #include "cli/KeyText.h"
 #include "cli/MarkovSongs.h"
 #include "cli/TypedChords.h"
+#include "cli/TypedSymbols.h"
 
 #include "brindle/present/NextChordsText.h"
 
@@ -32,11 +33,15 @@ struct CNextOptions {
 
 /// Chords between white space; bar lines do not count.
 std::optional<std::vector<CChordLite>> TypedRow(const CNextOptions& options) {
-    const auto text = TextFromWords(options.mWords);
-    if (!text) return std::nullopt;
-    std::vector<std::string> words = WordsOf(FoldAccidentals(*text));
-    std::erase_if(words, [](const std::string& word) { return word == "|" || word == "."; });
-    return options.mReading.ReadSymbols(words);
+    std::vector<std::string> words;
+    for (const std::string& word : options.mWords) {
+        const auto symbols =
+            AreInputs({word}) ? std::vector{word} : SymbolsOf(FoldAccidentals(word));
+        words.insert(words.end(), symbols.begin(), symbols.end());
+    }
+    if (words.empty()) return std::vector<CChordLite>();
+    const auto symbols = TypedSymbols(words);
+    return symbols ? options.mReading.ReadSymbols(*symbols) : std::nullopt;
 }
 
 TStatus MarkovNext(const CNextOptions& options) {

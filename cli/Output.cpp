@@ -42,6 +42,7 @@ TStatus Fail(TStatus status, std::string_view message) {
 
 TStatus FailAt(TStatus status, std::string_view message, std::string_view input,
                std::size_t column) {
+    if (input.find_first_not_of(" \t\r\n") == input.npos) return Fail(status, message);
     const std::string before = Printable(input.substr(0, column));
     fmt::print(stderr, "brindle: {}\n  {}\n  {}^\n", PrintableLines(message), Printable(input),
                std::string(CountCharacters(before), ' '));

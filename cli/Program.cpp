@@ -7,9 +7,6 @@
 
 #include "brindle/Version.h"
 
-#include <string_view>
-#include <vector>
-
 namespace brindle::cli {
 namespace {
 
@@ -31,14 +28,6 @@ constexpr CCommandHelp kProgramHelp{
     "  brindle grid x32010\n"
     "  brindle markov learn -o model.json songs\n",
 };
-
-// Other programs have taught people `help COMMAND`, which is `COMMAND --help`.
-std::vector<const char*> WithHelpBehind(std::vector<const char*> words) {
-    if (words.size() < 2 || std::string_view(words[1]) != "help") return words;
-    words.erase(words.begin() + 1);
-    words.push_back("--help");
-    return words;
-}
 
 }  // namespace
 
@@ -66,8 +55,7 @@ TStatus RunProgram(int argc, char** argv) {
     AddMarkov(program);
     AddCompletion(program);
     AddManual(program);
-    const auto words = WithHelpBehind({argv, argv + argc});
-    return program.Run(static_cast<int>(words.size()), words.data());
+    return program.Run(argc, argv);
 }
 
 }  // namespace brindle::cli

@@ -11,6 +11,7 @@
 
 #include <fmt/format.h>
 
+#include <algorithm>
 #include <filesystem>
 #include <memory>
 
@@ -63,8 +64,12 @@ TStatus Manual(const CCommandPage& program, const CManualOptions& options) {
         }
         names.push_back(page->WordsBelow());
     }
-    return Fail(TStatus::BadUsage,
-                fmt::format("there is no command {}{}", Printable(name), DidYouMean(words, names)));
+    std::string meant = DidYouMean(words, names);
+    const auto below = std::find_if(names.begin(), names.end(), [&](const std::string& command) {
+        return !words.empty() && command.ends_with(' ' + words);
+    });
+    if (meant.empty() && below != names.end()) meant = DidYouMean(*below, names);
+    return Fail(TStatus::BadUsage, fmt::format("there is no command {}{}", Printable(name), meant));
 }
 
 }  // namespace

@@ -167,8 +167,7 @@ std::optional<CSong> CTypedChords::ReadSongOrFail(const CTypedSong& typed,
                                                   const TChordStringParse& parse) const {
     auto song = typed.mIsScore ? ReadScore(typed) : ReadText(typed, parse);
     if (!song || song->mChords.size() > 1) return song;
-    Fail(TStatus::BadInput, fmt::format("{} has no chords",
-                                        typed.mName.empty() ? "the song" : Printable(typed.mName)));
+    FailWithoutChords(typed);
     return std::nullopt;
 }
 

@@ -2,6 +2,7 @@
 #include "cli/CommandLine.h"
 #include "cli/Input.h"
 #include "cli/TypedChords.h"
+#include "cli/TypedSymbols.h"
 
 #include "brindle/analysis/CHarmAnlsChordForMetro.h"
 #include "brindle/analysis/ChordVectorText.h"
@@ -61,20 +62,27 @@ std::vector<std::string> WithVectorsJoined(const std::vector<std::string>& words
 }
 
 // A line of standard input is a vector, or chord symbols between white space.
-std::optional<std::vector<std::string>> TypedThings(const std::vector<std::string>& words) {
-    if (!AreInputs(words)) return WithVectorsJoined(words);
-    const auto lines = TypedLines(words);
-    if (!lines) return std::nullopt;
+std::vector<std::string> ThingsIn(const std::vector<std::string>& lines) {
     std::vector<std::string> things;
-    for (const std::string& line : *lines) {
+    for (const std::string& line : lines) {
         if (IsVectorText(line)) {
             things.push_back(line);
         } else {
-            const std::vector<std::string> symbols = WordsOf(line);
+            const std::vector<std::string> symbols = SymbolsOf(line);
             things.insert(things.end(), symbols.begin(), symbols.end());
         }
     }
     return things;
+}
+
+std::optional<std::vector<std::string>> TypedThings(const std::vector<std::string>& words) {
+    if (!AreInputs(words)) {
+        const auto things = TypedSymbols(words);
+        return things ? std::optional(WithVectorsJoined(*things)) : std::nullopt;
+    }
+    const auto lines = TypedLines(words);
+    if (!lines) return std::nullopt;
+    return ThingsIn(*lines);
 }
 
 TStatus Vector(const CVectorOptions& options) {
