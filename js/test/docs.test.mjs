@@ -1,4 +1,5 @@
 import assert from "node:assert/strict";
+import { execFileSync } from "node:child_process";
 import { readFileSync } from "node:fs";
 import { test } from "node:test";
 import { brindle, root } from "./support.mjs";
@@ -11,7 +12,7 @@ function checked(line) {
   return found ? `check(${found[1]}, ${JSON.stringify(found[2])});` : line;
 }
 
-for (const page of ["docs/javascript.md", "js/README.md"]) {
+for (const page of ["README.md", "docs/javascript.md", "js/README.md"]) {
   test(`the examples of ${page} are true`, async () => {
     const blocks = [...readFileSync(root + page, "utf8").matchAll(/```js\n([^]*?)```/g)].map((m) => m[1]);
     const code = blocks.join("\n").split("\n").filter((line) => !/^import |await load\(/.test(line));
@@ -22,6 +23,11 @@ for (const page of ["docs/javascript.md", "js/README.md"]) {
     await new AsyncFunction("brindle", "check", code.map(checked).join("\n"))(brindle, check);
   });
 }
+
+test("the program of the README runs", () => {
+  const shown = execFileSync(process.execPath, [`${root}examples/js/song.mjs`, "Dm7 G7 | C"], { encoding: "utf8" });
+  assert.match(shown, /^C Major\nDm7 +ii7 .*\nG7 +V7 .*\nC +I /);
+});
 
 test("the functions that are exported are those that the header has", () => {
   const header = readFileSync(`${root}brindle/c/brindle.h`, "utf8");

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
-// What the documents show is true: blocks marked `console` are run and compared, blocks of code
-// stand in a file of examples/ that is built by a test, and pictures are what the program draws.
+// What the documents show is true: blocks marked `console` are run and compared, commands in blocks
+// marked `sh` run without an error, blocks of code stand in a file of examples/ that is built by a
+// test, and pictures are what the program draws.
 
 #include "tests/support/Transcript.h"
 
@@ -10,6 +11,7 @@
 #include <cstdlib>
 #include <filesystem>
 #include <fstream>
+#include <regex>
 #include <sstream>
 
 namespace brindle::test {
@@ -69,11 +71,32 @@ std::string Examples() {
     return all;
 }
 
+// Documents show what stands on a terminal, where errors have no mark.
+std::string WithoutMarks(const std::string& shown) {
+    static const std::regex marks("\\[(stderr|status [0-9]+)\\]\n");
+    return std::regex_replace(shown, marks, "");
+}
+
 std::string RunAgain(const std::string& console) {
     CTranscript transcript = ReadTranscript(console);
     CHECK(transcript.mPreamble.empty());
-    for (CConsoleRun& run : transcript.mRuns) run = RunCommand(run.mCommand);
+    for (CConsoleRun& run : transcript.mRuns) {
+        run = {run.mCommand, WithoutMarks(RunCommand(run.mCommand).mShown)};
+    }
     return WriteTranscript(transcript);
+}
+
+// The commands of a block that ask for the program, in one folder. What builds and installs is run
+// by the tests of what is built, and `./run.sh page` by those of the page.
+void RunBlock(const std::string& block) {
+    static const std::regex ofProgram("\\./run\\.sh (?!page|--version).*");
+    std::istringstream lines(block);
+    std::string script = "true";
+    for (std::string line; std::getline(lines, line);) {
+        if (std::regex_match(line, ofProgram)) script += " && " + line.substr(0, line.find("  #"));
+    }
+    const std::string shown = RunCommand(script).mShown;
+    CHECK(shown.find("[st") == shown.npos);
 }
 
 bool IsRenewing() {
@@ -96,12 +119,19 @@ TEST_CASE("The documents show what the program does and code that is built") {
         const std::string document = ReadFile(path);
         std::vector<CPiece> pieces = Cut(document);
         for (CPiece& piece : pieces) {
-            if (!piece.mIsBlock || piece.mLanguage == "text") continue;
+            if (!piece.mIsBlock) continue;
+            if (piece.mLanguage == "text") {
+                CHECK_MESSAGE(piece.mText.find("$ ") == piece.mText.npos,
+                              "commands that are not run");
+                continue;
+            }
             // The tests of the packages for Python and JavaScript run these.
             if (piece.mLanguage == "pycon" || piece.mLanguage == "python") continue;
             if (piece.mLanguage == "js" || piece.mLanguage == "sql") continue;
             INFO(piece.mText);
-            if (piece.mLanguage == "console") {
+            if (piece.mLanguage == "sh") {
+                RunBlock(piece.mText);
+            } else if (piece.mLanguage == "console") {
                 piece.mText = RunAgain(piece.mText);
             } else {
                 const bool isCode = piece.mLanguage == "cpp" || piece.mLanguage == "c" ||

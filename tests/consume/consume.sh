@@ -43,4 +43,17 @@ case $way in
     *)
         exit 0 ;;
 esac
+# The lines of the README that build both, with the package where they put it.
+if [ "$way" = pkg_config ]; then
+    mkdir -p "$work/readme/build" && cd "$work/readme"
+    ln -sfn "$source_dir/examples" examples && ln -sfn "$prefix" build/installed
+    {
+        echo "set -eu"
+        grep -hE '^(export PKG_CONFIG_PATH|cc |c\+\+ |\(cd build|LD_LIBRARY_PATH)' "$source_dir/README.md"
+    } >lines.sh
+    [ "$(wc -l <lines.sh)" -eq 6 ]
+    bash lines.sh >shown.txt
+    grep -q "^A Minor$" shown.txt
+    cd "$work"
+fi
 "$work/host_in_c/host_in_c" | diff "$source_dir/examples/c/expected.txt" -
