@@ -158,6 +158,55 @@ onPage("A song is transposed up, down and back to what was typed", {}, async (op
   await page.waitForFunction((text) => document.querySelector("#song").value === text, typed);
 });
 
+for (const [form, typed, up] of [
+  ["ChordPro", "{title: Grace}\n{key: G}\n{sov}\nA[G]mazing [C]grace how [D7/F#]sweet\n{eov}", "{title: Grace}\n{key: Ab}\n{sov}\nA[Ab]mazing [Db]grace how [Eb7/G]sweet\n{eov}"],
+  ["chords above lyrics", "Grace\nby Me\n\n[A]\nA     D    E7  A\nA line of a song", "Grace\nby Me\n\n[A]\nBb    Eb   F7  Bb\nA line of a song"],
+  ["bars with signs", "|: Dm7 | % | G7 [1 C :| [2 C N.C. | // end", "|: Ebm7 | % | Ab7 [1 Db :| [2 Db N.C. | // end"],
+]) {
+  onPage(`A transposed song keeps its words and lay-out: ${form}`, {}, async (opened, page) => {
+    await page.fill("#song", typed);
+    await page.click("[aria-label='Up a semitone']:enabled");
+    await page.waitForFunction((text) => document.querySelector("#song").value === text, up);
+    assert.equal(await page.textContent(".transpose output"), "+1");
+  });
+}
+
+onPage("Quick clicks are as many steps, and each is taken back and done again", {}, async (opened, page) => {
+  await opened.type("C | F | G7 | C", 4);
+  await page.evaluate(() => [1, 2, 3].forEach(() => document.querySelector("[aria-label='Down a semitone']").click()));
+  const shows = (text, semitones) =>
+    page.waitForFunction(
+      (wanted) => document.querySelector("#song").value === wanted[0] && document.querySelector(".transpose output").textContent === wanted[1],
+      [text, semitones],
+    );
+  await shows("A | D | E7 | A", "\u22123");
+  await page.click(".undo");
+  await shows("Bb | Eb | F7 | Bb", "\u22122");
+  await page.click(".redo");
+  await shows("A | D | E7 | A", "\u22123");
+});
+
+onPage("A song is not lost when another one is opened", {}, async (opened, page) => {
+  const typed = "My own\nby Me\n\n[A]\nAm | E7";
+  const isBack = () => page.waitForFunction((text) => document.querySelector("#song")?.value === text, typed);
+  await opened.type(typed, 2);
+  await page.selectOption(".examples", { label: "Amazing Grace" });
+  await page.waitForFunction(() => document.querySelector(".title")?.textContent === "Amazing Grace");
+  await page.click(".undo");
+  await isBack();
+  await opened.drop("dream.musicxml", example("scores/beautiful-dreamer.musicxml"));
+  await page.waitForSelector(".score-note");
+  await page.click(".undo");
+  await isBack();
+});
+
+onPage("A broken link is told, and the song before it stays", {}, async (opened, page) => {
+  await opened.type("Am | E7", 2);
+  await page.evaluate(() => (location.hash = "#song=broken"));
+  await page.getByText("This link is broken").waitFor();
+  assert.equal(await page.inputValue("#song"), "Am | E7");
+});
+
 onPage("A dropped score is read and can be written as chords", {}, async (opened, page) => {
   await opened.drop("dream.musicxml", example("scores/beautiful-dreamer.musicxml"));
   await page.waitForFunction(() => document.querySelector(".title")?.textContent === "Beautiful Dreamer");

@@ -5,6 +5,7 @@ import wasm from "brindle/brindle.wasm?url";
 import { midiNotes } from "../player/midiNotes";
 import { insertChord } from "./insertChord";
 import { printedNames, sentenceAround } from "./sentence";
+import { transposeText, type Heard } from "./transposeText";
 import type { Answer, Call, Calls, ChordDetail, Export, Grid, Names, Sheet, Source } from "./Types";
 
 /** The key below the lowest note that a chord is shown with: the B below the C under middle C. */
@@ -59,6 +60,34 @@ function stacked(tones: { pitchClass: number; name: string }[]): ChordDetail["no
   });
 }
 
+/** What is asked of a song that nobody needs behind it. */
+function freed<Value>(song: Song, ask: (song: Song) => Value): Value {
+  try {
+    return ask(song);
+  } finally {
+    song.free();
+  }
+}
+
+function symbolsOf(song: Song): string[] {
+  return song.chords.map(({ symbol }) => symbol);
+}
+
+function heard(song: Song): Heard {
+  const chords = song.chords.map(({ symbol, position, chord: { root, bass, mask } }) => ({
+    symbol,
+    position,
+    tones: `${root?.pitchClass}/${bass?.pitchClass}/${mask}`,
+  }));
+  const words = [song.title, song.makers, ...song.sections.map(({ name }) => name)];
+  return { words, tonic: song.statedKey?.tonic.pitchClass ?? null, chords };
+}
+
+/** "Ebm" */
+function typedKey({ tonic, mode }: Key): string {
+  return tonic.name + (mode === "minor" ? "m" : "");
+}
+
 const calls: Calls = {
   async read(source, names) {
     try {
@@ -106,20 +135,21 @@ const calls: Calls = {
   },
 
   async transpose(source, semitones) {
-    const transposed = (await readSong(source)).song.transpose(semitones);
-    const text = transposed.chordPro();
+    const library = await brindle();
+    const { song } = await readSong(source);
+    const transposed = song.transpose(semitones);
+    const after = heard(transposed);
+    const key = transposed.statedKey && typedKey(transposed.statedKey);
+    const readHeard = (text: string) => freed(library.read(text, { lenient: true }), heard);
+    const text = source.kind === "text" ? transposeText(source.text, heard(song), after, key, readHeard) : null;
+    const told = text ?? transposed.chordPro();
     transposed.free();
-    return text;
+    return told;
   },
 
   async insert(source, chord, symbol) {
     const library = await brindle();
-    const readSymbols = (text: string) => {
-      const song = library.read(text, { lenient: true });
-      const symbols = song.chords.map((one) => one.symbol);
-      song.free();
-      return symbols;
-    };
+    const readSymbols = (text: string) => freed(library.read(text, { lenient: true }), symbolsOf);
     const text = insertChord(await calls.text(source), chord, symbol, readSymbols);
     if (text === null) throw new Error(`There is no place for ${symbol} behind this chord in the text.`);
     return text;

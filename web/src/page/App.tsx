@@ -83,6 +83,7 @@ export function App() {
             <ScoreNote name={song.source.name} faults={reading?.faults ?? []} onText={() => void attempt(async () => song.change(await song.engine.call("text", song.source)))} />
           )}
           {song.canUndo && <button type="button" class="undo" onClick={song.undo}>Undo the last change</button>}
+          {song.canRedo && <button type="button" class="undo redo" onClick={song.redo}>Redo it</button>}
           <p class="message" role="status">{message || song.error}</p>
         </section>
         <section class="reading" aria-label="Reading">

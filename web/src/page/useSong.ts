@@ -1,9 +1,10 @@
 import { useCallback, useEffect, useMemo, useRef, useState } from "preact/hooks";
 import { Engine } from "../engine/Engine";
 import type { Names, Reading, Source } from "../engine/Types";
-import { readLink } from "../song/link";
+import { isLink, readLink } from "../song/link";
 import { examples } from "../song/examples";
 import { recall, remember } from "./store";
+import { shown, useHistory } from "./useHistory";
 
 /** Milliseconds without a key stroke after which a song is read. */
 const pause = 140;
@@ -23,7 +24,8 @@ export interface SongState {
   /** The tempo that a link asks for. */
   linkedTempo: number | null;
   canUndo: boolean;
-  /** Replaces the song. */
+  canRedo: boolean;
+  /** Replaces the song by another one; "Undo" takes it back. */
   open(source: Source): void;
   /** Takes what was typed. */
   type(text: string): void;
@@ -31,36 +33,39 @@ export interface SongState {
   change(text: string): void;
   transpose(by: number): Promise<void>;
   undo(): void;
+  redo(): void;
   setNames(names: Names): void;
 }
+
+/** Why a link cannot be opened. */
+const brokenLink = "This link is broken or too long: it holds no song. The song below is the one from before.";
 
 /** The song of the page and its reading, which follows it. */
 export function useSong(): SongState {
   const engine = useMemo(() => new Engine(), []);
-  const [source, setSource] = useState<Source>({ kind: "text", text: recall("text") ?? "" });
-  const [origin, setOrigin] = useState<{ source: Source; semitones: number } | null>(null);
-  const [before, setBefore] = useState<Source[]>([]);
+  const { now, latest, canUndo, canRedo, edit, replace, undo, redo } = useHistory(() => shown({ kind: "text", text: recall("text") ?? "" }));
+  const { source } = now;
   const [names, setNames] = useState<Names>("typed");
-  const [linkedTempo, setLinkedTempo] = useState<number | null>(null);
+  const [linkError, setLinkError] = useState("");
   const [state, setState] = useState<{ reading: Reading | null; error: string }>({ reading: null, error: "" });
   const newest = useRef(0);
+  const transposing = useRef(Promise.resolve());
 
-  const open = useCallback((opened: Source) => {
-    setSource(opened);
-    setOrigin(null);
-    setBefore([]);
+  const open = useCallback((opened: Source, tempo: number | null = null) => {
+    setLinkError("");
+    replace(() => ({ ...shown(opened), tempo }));
   }, []);
 
   useEffect(() => {
     const openLinked = async () => {
       const linked = await readLink(location.hash);
       if (linked) {
-        open({ kind: "text", text: linked.text.slice(0, longestTyped) });
+        open({ kind: "text", text: linked.text.slice(0, longestTyped) }, linked.tempo);
         setNames(linked.names);
-        setLinkedTempo(linked.tempo);
-      } else if (!recall("text")) {
-        open(await examples[0]!.load());
+        return;
       }
+      if (isLink(location.hash)) setLinkError(brokenLink);
+      if (!recall("text")) open(await examples[0]!.load());
     };
     void openLinked();
     window.addEventListener("hashchange", openLinked);
@@ -85,42 +90,39 @@ export function useSong(): SongState {
     return () => clearTimeout(timer);
   }, [source, names]);
 
-  const replace = (by: Source) => {
-    setBefore([...before, source].slice(-50));
-    setSource(by);
-  };
-  const transpose = async (by: number) => {
-    const from = origin ?? { source, semitones: 0 };
-    const semitones = ((from.semitones + by + 23) % 12) - 11;
-    if (semitones === 0) replace(from.source);
-    else replace({ kind: "text", text: await engine.call("transpose", from.source, semitones) });
-    setOrigin({ source: from.source, semitones });
+  const transposeOnce = async (by: number) => {
+    const start = latest();
+    const from = start.origin ?? { source: start.source, semitones: 0 };
+    const semitones = (from.semitones + by) % 12;
+    const changed: Source = semitones === 0 ? from.source : { kind: "text", text: await engine.call("transpose", from.source, semitones) };
+    // What was typed meanwhile stays.
+    if (latest() !== start) return;
+    replace((last) => ({ ...last, source: changed, origin: { source: from.source, semitones } }));
   };
   return {
     engine,
     source,
     names,
-    ...state,
-    semitones: origin?.semitones ?? 0,
-    linkedTempo,
-    canUndo: before.length > 0,
+    reading: state.reading,
+    error: linkError || state.error,
+    semitones: now.origin?.semitones ?? 0,
+    linkedTempo: now.tempo,
+    canUndo,
+    canRedo,
     open,
     type: (text) => {
-      setSource({ kind: "text", text });
-      setOrigin(null);
+      setLinkError("");
+      edit((last) => ({ ...last, source: { kind: "text", text }, origin: null }));
     },
-    change: (text) => {
-      replace({ kind: "text", text });
-      setOrigin(null);
+    change: (text) => replace((last) => ({ ...last, source: { kind: "text", text }, origin: null })),
+    transpose: (by) => {
+      // One after the other, so that two quick clicks are two steps.
+      const done = transposing.current.then(() => transposeOnce(by));
+      transposing.current = done.catch(() => undefined);
+      return done;
     },
-    transpose,
-    undo: () => {
-      const last = before[before.length - 1];
-      if (!last) return;
-      setSource(last);
-      setOrigin(null);
-      setBefore(before.slice(0, -1));
-    },
+    undo,
+    redo,
     setNames,
   };
 }

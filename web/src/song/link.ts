@@ -27,9 +27,14 @@ export async function writeLink(song: SharedSong): Promise<string> {
   return prefix + btoa(text).replaceAll("+", "-").replaceAll("/", "_").replace(/=+$/, "");
 }
 
+/** Whether an address means to hold a song, readable or not. */
+export function isLink(hash: string): boolean {
+  return hash.startsWith(prefix);
+}
+
 /** The song of a link; null for what is none, is broken or unfolds to too much. */
 export async function readLink(hash: string): Promise<SharedSong | null> {
-  if (!hash.startsWith(prefix) || hash.length > longestLink) return null;
+  if (!isLink(hash) || hash.length > longestLink) return null;
   try {
     const text = atob(hash.slice(prefix.length).replaceAll("-", "+").replaceAll("_", "/"));
     return songOf(JSON.parse(await unfold(Uint8Array.from(text, (c) => c.charCodeAt(0)))));
