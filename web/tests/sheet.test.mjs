@@ -159,3 +159,26 @@ test("A library that cannot be fetched is told, and fetched again when the netwo
   assert.equal(await page.textContent(".message"), "");
   await opened.close();
 });
+
+for (const width of [390, 1400]) {
+  test(`On paper all bars are there, dark on white, with arrows where the chords are: from ${width} pixels`, async () => {
+    const opened = await Page.open(browser, { colorScheme: "dark", viewport: { width, height: 900 } });
+    const { page } = opened;
+    await opened.type("Tune\n\n[A]\n" + "Dm7 | G7 | C | A7 |\n".repeat(110), 400);
+    await page.evaluate(() => window.dispatchEvent(new Event("beforeprint")));
+    // Paper is no wider than this, whatever the screen was.
+    await page.setViewportSize({ width: 680, height: 1000 });
+    await page.emulateMedia({ media: "print", colorScheme: "dark" });
+    assert.equal(await page.locator(".bar").count(), 440);
+    assert.equal(await page.evaluate(() => document.querySelectorAll(".line")[0].children.length), 4);
+    const ink = await page.locator("[data-chord='0']").evaluate((chord) => getComputedStyle(chord).color);
+    assert.equal(ink, "rgb(25, 24, 23)");
+    assert.ok((await page.evaluate(() => document.documentElement.scrollWidth)) <= 680);
+    const [{ right: head }] = await page.evaluate(arrows);
+    const target = await page.locator("[data-chord='2'] .symbol").evaluate((symbol) => symbol.getBoundingClientRect().toJSON());
+    assert.ok(head > target.left && head < target.right, `the arrow ends at ${head}`);
+    await page.evaluate(() => window.dispatchEvent(new Event("afterprint")));
+    await opened.shows(400);
+    await opened.close();
+  });
+}

@@ -1,5 +1,5 @@
 import { useLayoutEffect, useState } from "preact/hooks";
-import type { RefObject } from "preact";
+import type { RefObject, VNode } from "preact";
 import type { Sheet } from "../engine/Types";
 import type { Line } from "./lines";
 import { arrowPaths, bracketPaths, type LinePlace, type LinkPath, type Place } from "./linkPaths";
@@ -55,10 +55,39 @@ function lift(root: HTMLElement, arrows: LinkPath[]): boolean {
   return isMoved;
 }
 
-/** The arrows and brackets of a sheet, drawn over its lines once these are laid out. */
-export function Links({ sheet, lines, root }: { sheet: Sheet; lines: Line[]; root: RefObject<HTMLElement | null> }) {
-  const [arrows, setArrows] = useState<LinkPath[]>([]);
-  const [brackets, setBrackets] = useState<LinkPath[]>([]);
+interface LinksProps {
+  sheet: Sheet;
+  lines: Line[];
+  root: RefObject<HTMLElement | null>;
+  /** The lines as they are drawn. */
+  children: VNode[];
+}
+
+/** What was drawn by the last measure. */
+interface Drawn {
+  paths: LinkPath[][];
+  /** Of each line, from the top of the music. */
+  tops: number[];
+}
+
+/** Paths by their lines. */
+function byLine(paths: LinkPath[]): LinkPath[][] {
+  const lines: LinkPath[][] = [];
+  for (const path of paths) (lines[path.line] ??= []).push(path);
+  return lines;
+}
+
+function topsOf(root: HTMLElement): number[] {
+  const origin = root.getBoundingClientRect().top;
+  return Array.from(root.querySelectorAll(".line"), (line) => line.getBoundingClientRect().top - origin);
+}
+
+/**
+ * The lines of a sheet with its arrows and brackets over them, which are drawn once the lines are laid
+ * out. Each line has its own, so that they stay with it where paper is broken into pages.
+ */
+export function Links({ sheet, lines, root, children }: LinksProps) {
+  const [{ paths, tops }, setDrawn] = useState<Drawn>({ paths: [], tops: [] });
   useLayoutEffect(() => {
     const draw = () => {
       if (!root.current) return;
@@ -67,8 +96,8 @@ export function Links({ sheet, lines, root }: { sheet: Sheet; lines: Line[]; roo
       if (lift(root.current, arrowPaths(sheet.Arrows, places, linePlaces))) {
         [places, linePlaces] = measure(root.current, sheet);
       }
-      setArrows(arrowPaths(sheet.Arrows, places, linePlaces));
-      setBrackets(bracketPaths(sheet.Brackets, places, linePlaces));
+      const all = [...arrowPaths(sheet.Arrows, places, linePlaces), ...bracketPaths(sheet.Brackets, places, linePlaces)];
+      setDrawn({ paths: byLine(all), tops: topsOf(root.current) });
     };
     draw();
     // Fonts that come late move what was measured.
@@ -81,15 +110,28 @@ export function Links({ sheet, lines, root }: { sheet: Sheet; lines: Line[]; roo
     };
   }, [sheet, lines]);
   return (
-    <svg class="links" aria-hidden="true">
-      <defs>
-        <marker id="head" viewBox="0 0 8 8" refX="6.5" refY="4" markerWidth="7" markerHeight="7" orient="auto-start-reverse" markerUnits="userSpaceOnUse">
-          <path class="head" d="M0 1 8 4 0 7z" />
-        </marker>
-      </defs>
-      {[...arrows, ...brackets].map((path, i) => (
-        <path key={i} class={path.isDotted ? "link dotted" : "link"} d={path.d} marker-end={path.hasHead ? "url(#head)" : undefined} />
+    <>
+      <svg class="links" aria-hidden="true">
+        <defs>
+          <marker id="head" viewBox="0 0 8 8" refX="6.5" refY="4" markerWidth="7" markerHeight="7" orient="auto-start-reverse" markerUnits="userSpaceOnUse">
+            <path class="head" d="M0 1 8 4 0 7z" />
+          </marker>
+        </defs>
+      </svg>
+      {children.map((line, number) => (
+        <div key={line.key} class="line-box">
+          {line}
+          {paths[number] && (
+            <svg class="links" aria-hidden="true">
+              <g transform={`translate(0 ${-(tops[number] ?? 0)})`}>
+                {paths[number].map((path, i) => (
+                  <path key={i} class={path.isDotted ? "link dotted" : "link"} d={path.d} marker-end={path.hasHead ? "url(#head)" : undefined} />
+                ))}
+              </g>
+            </svg>
+          )}
+        </div>
       ))}
-    </svg>
+    </>
   );
 }

@@ -6,6 +6,9 @@ import { breakLines, type Line } from "./lines";
 import { Links } from "./Links";
 import { Signs } from "./Runs";
 
+/** Of a sheet on paper in pixels; style/sheet.css has it, too. A4 and Letter have room for it. */
+const paperWidth = 656;
+
 /** More bars are drawn only when they are asked for. */
 const firstBars = 400;
 
@@ -27,6 +30,22 @@ function useWidth(): [(element: HTMLElement | null) => void, number] {
     return () => observer.disconnect();
   }, [element]);
   return [setElement, width];
+}
+
+/** Whether the page is being printed. Paper has another width than the screen, and shows all bars. */
+function usePrinting(): boolean {
+  const [isPrinting, setIsPrinting] = useState(false);
+  useEffect(() => {
+    const begin = () => setIsPrinting(true);
+    const end = () => setIsPrinting(false);
+    window.addEventListener("beforeprint", begin);
+    window.addEventListener("afterprint", end);
+    return () => {
+      window.removeEventListener("beforeprint", begin);
+      window.removeEventListener("afterprint", end);
+    };
+  }, []);
+  return isPrinting;
 }
 
 function Head({ sheet }: { sheet: Sheet }) {
@@ -64,11 +83,13 @@ function moveFocus(event: KeyboardEvent): void {
 /** The song as a lead sheet with the marks of a teacher. */
 export function SheetView(props: SheetProps) {
   const { sheet } = props;
-  const [setFrame, width] = useWidth();
+  const [setFrame, screenWidth] = useWidth();
+  const isPrinting = usePrinting();
+  const width = isPrinting ? paperWidth : screenWidth;
   const [isWhole, setIsWhole] = useState(false);
   const music = useRef<HTMLDivElement>(null);
   const isNarrow = width < 560;
-  const bars = isWhole ? sheet.Bars : sheet.Bars.slice(0, firstBars);
+  const bars = isWhole || isPrinting ? sheet.Bars : sheet.Bars.slice(0, firstBars);
   const lines = useMemo(
     () => breakLines(sheet, bars, { width, symbol: isNarrow ? 23 : 27, numeral: 15 }),
     [sheet, bars.length, width],
@@ -80,17 +101,18 @@ export function SheetView(props: SheetProps) {
   }, [props.soundingBar]);
   const state: SheetState = { ...props, entry: props.selected ?? bars[0]?.Begin ?? 0 };
   return (
-    <article class="sheet" aria-label="Lead sheet" ref={setFrame}>
+    <article class={isPrinting ? "sheet on-paper" : "sheet"} aria-label="Lead sheet" ref={setFrame}>
       <Head sheet={sheet} />
       <div class="music" ref={music} onKeyDown={(event) => (event.key === "Escape" ? props.onLeave() : moveFocus(event))}>
-        {lines.map((line) => (
-          <ol key={line.bars[0]!.index} class={line.isTooFull ? "line too-full" : "line"} style={{ gridTemplateColumns: columnsOf(line) }} start={line.bars[0]!.index + 1}>
-            {line.bars.map(({ index }, i) => (
-              <Bar key={index} state={state} index={index} isFirstOfLine={i === 0} />
-            ))}
-          </ol>
-        ))}
-        <Links sheet={sheet} lines={lines} root={music} />
+        <Links sheet={sheet} lines={lines} root={music}>
+          {lines.map((line) => (
+            <ol key={line.bars[0]!.index} class={line.isTooFull ? "line too-full" : "line"} style={{ gridTemplateColumns: columnsOf(line) }} start={line.bars[0]!.index + 1}>
+              {line.bars.map(({ index }, i) => (
+                <Bar key={index} state={state} index={index} isFirstOfLine={i === 0} />
+              ))}
+            </ol>
+          ))}
+        </Links>
       </div>
       {bars.length < sheet.Bars.length && (
         <button type="button" class="more" onClick={() => setIsWhole(true)}>
