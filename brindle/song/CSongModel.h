@@ -163,6 +163,9 @@ private:
     void CountPlaces();
     void ShareTriples();
     void CountSuccessors();
+    template <typename TIsCounted>
+    [[nodiscard]] std::vector<CSongShares> SharesOfChords(const TIsCounted& isCounted) const;
+    void ShareChords();
     void CountLengths();
     void CountKinds();
     [[nodiscard]] double KindProbability(const CRelativeChord& chord) const;

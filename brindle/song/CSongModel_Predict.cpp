@@ -106,20 +106,6 @@ double CSongModel::KindProbability(const CRelativeChord& chord) const {
     return step * inKey;
 }
 
-/// The places among `range` with a chord `back` places before them.
-CSongModel::CRange CSongModel::Narrowed(CRange range, std::int32_t id, std::size_t back) const {
-    const auto begin = mByHistory.begin() + static_cast<std::ptrdiff_t>(range.mBegin);
-    const auto end = mByHistory.begin() + static_cast<std::ptrdiff_t>(range.mEnd);
-    const auto first = std::lower_bound(begin, end, id, [&](std::uint32_t place, std::int32_t key) {
-        return IdAhead(place, back) < key;
-    });
-    const auto last = std::upper_bound(first, end, id, [&](std::int32_t key, std::uint32_t place) {
-        return key < IdAhead(place, back);
-    });
-    return {static_cast<std::size_t>(first - mByHistory.begin()),
-            static_cast<std::size_t>(last - mByHistory.begin())};
-}
-
 bool CSongModel::HasBothModes() const {
     const auto hasAny = [](const std::vector<CSongShares>& shares) {
         return std::any_of(shares.begin(), shares.end(),

@@ -12,6 +12,10 @@ namespace brindle {
 
 /// A bar of any metre has so many ticks: halves, thirds, quarters and eighths of it are whole.
 inline constexpr std::int32_t kTicksPerBar = 24;
+/// Where in its bar a tick lies, 0 to kTicksPerBar - 1; an upbeat has ticks below 0.
+[[nodiscard]] constexpr std::int32_t TickInBar(std::int32_t tick) {
+    return (tick % kTicksPerBar + kTicksPerBar) % kTicksPerBar;
+}
 
 /// A chord of a song with its place in the bars.
 struct CTaughtChord {
