@@ -11,183 +11,22 @@
 
 #include "brindle/analysis/internal/LocalKeys.h"
 
-#include "brindle/analysis/internal/KeyTables.h"
+#include "brindle/analysis/internal/KeyChanges.h"
+#include "brindle/analysis/internal/KeyCircle.h"
 
 #include <algorithm>
 #include <array>
 #include <bit>
 #include <cmath>
-#include <limits>
-#include <utility>
 
 namespace brindle {
 namespace {
 
-constexpr std::size_t kFifths = 12;
 constexpr std::size_t kChordsPerBlock = 32;
 constexpr double kShortestInBars = 1.0 / 16;
 constexpr double kLongestInBars = 4.0;
 // What the seventh chords on I and IV gain at home in a blues, where they are at rest.
 constexpr double kBluesPoints = 2.7;
-// What a change costs more to the parallel key, or for each fifth between the signatures. Beyond
-// three fifths the signatures are far enough.
-constexpr double kParallelCost = 1.0;
-constexpr double kFifthCost = 0.5;
-constexpr std::size_t kMostFifths = 3;
-
-using TFifths = std::array<double, kFifths>;
-using TTwiceFifths = std::array<double, 2 * kFifths>;
-
-/// Where a pitch class stands on the circle of fifths, counted from C.
-constexpr std::size_t PlaceOnCircle(int keyNr) {
-    return static_cast<std::size_t>(FoldIntoOctave(7 * keyNr));
-}
-
-/// The place of the signature of a key on the circle: C major and A minor are 0.
-constexpr std::size_t SignatureOf(int key) {
-    return PlaceOnCircle(TonicOfKey(key) + 3 * ModeOfKey(key));
-}
-
-/// The key whose points stand there: the major keys by their signatures, then the minor ones.
-constexpr int KeyAtPlace(int place) {
-    const int signature = FoldIntoOctave(7 * place);
-    return place < static_cast<int>(kFifths) ? signature
-                                             : FoldIntoOctave(signature - 3) + kKeyCount / 2;
-}
-
-/// Points of the keys, by the places of their signatures on the circle.
-struct CPointsOfKeys {
-    TFifths mMajor;
-    TFifths mMinor;
-
-    [[nodiscard]] double& Of(int key) {
-        return (IsMinorKey(key) ? mMinor : mMajor)[SignatureOf(key)];
-    }
-    [[nodiscard]] double Of(int key) const {
-        return (IsMinorKey(key) ? mMinor : mMajor)[SignatureOf(key)];
-    }
-};
-
-constexpr double LargerPoints(double a, double b) {
-    return a > b ? a : b;
-}
-
-/// The points of a chord for each key, to be weighed. In a row a key stands as far behind 12 as its
-/// signature behind the root on the circle.
-class CGainTable {
-public:
-    CGainTable() {
-        for (std::size_t kind = 0; kind < kKeyChordKindCount; ++kind) {
-            for (int i = 0; i < 2 * static_cast<int>(kFifths); ++i) {
-                const auto at = static_cast<std::size_t>(i);
-                mRows[0][kind][at] = kKeyLocalTable[0][kind][PlaceOnCircle(-i)];
-                mRows[1][kind][at] = kKeyLocalTable[1][kind][PlaceOnCircle(-i - 3)];
-            }
-        }
-    }
-
-    [[nodiscard]] const double* RowOf(int mode, TKeyChordKind kind, int root) const {
-        return mRows[static_cast<std::size_t>(mode)][kind].data() + kFifths - PlaceOnCircle(root);
-    }
-
-private:
-    std::array<std::array<TTwiceFifths, kKeyChordKindCount>, 2> mRows;
-};
-
-/// The costs of a change, by the steps between the signatures, and to the parallel key.
-class CChangeCosts {
-public:
-    explicit CChangeCosts(double base) : mParallel(base + kParallelCost) {
-        for (std::size_t steps = 0; steps <= kMostFifths; ++steps) {
-            mBySteps[steps] = base + kFifthCost * static_cast<double>(steps);
-        }
-        for (std::size_t i = 0; i < 2 * kFifths; ++i) {
-            const std::size_t up = i % kFifths;
-            mSameMode[i] = up == 0 ? kNoChange : mBySteps[StepsOf(up)];
-            mToMajor[i] = up == kMinorOfParallel ? mParallel : mBySteps[StepsOf(up)];
-            mToMinor[i] = up == kFifths - kMinorOfParallel ? mParallel : mBySteps[StepsOf(up)];
-        }
-    }
-
-    /// The costs of a change into a key from the major and from the minor keys, each in the order
-    /// of the circle.
-    [[nodiscard]] std::pair<const double*, const double*> Into(int key) const {
-        const std::size_t begin = kFifths - SignatureOf(key);
-        const double* same = mSameMode.data() + begin;
-        return IsMinorKey(key) ? std::pair(mToMinor.data() + begin, same)
-                               : std::pair(same, mToMajor.data() + begin);
-    }
-
-    std::array<double, kMostFifths + 1> mBySteps;
-    double mParallel;
-
-private:
-    // The signature of the parallel minor key has three signs less.
-    static constexpr std::size_t kMinorOfParallel = kFifths - 3;
-    static constexpr double kNoChange = std::numeric_limits<double>::infinity();
-
-    static std::size_t StepsOf(std::size_t up) { return std::min({up, kFifths - up, kMostFifths}); }
-
-    // By how far the signature that is left lies up from the one that is entered.
-    TTwiceFifths mSameMode;
-    TTwiceFifths mToMajor;
-    TTwiceFifths mToMinor;
-};
-
-double LargestPoints(const TFifths& points) {
-    double largest = points[0];
-    for (const double one : points) largest = LargerPoints(largest, one);
-    return largest;
-}
-
-/// The best that can be had by a change into a key with each signature from another signature. A
-/// signature counts as far away from itself, too: to stay is never worse than that.
-TFifths BestFromElsewhere(const CPointsOfKeys& best, const CChangeCosts& costs) {
-    TFifths better;
-    for (std::size_t i = 0; i < kFifths; ++i)
-        better[i] = LargerPoints(best.mMajor[i], best.mMinor[i]);
-    const double far = LargestPoints(better) - costs.mBySteps[3];
-    // Where the circle closes, it goes on: two more on both sides.
-    std::array<double, kFifths + 4> around;
-    for (std::size_t i = 0; i < kFifths; ++i) around[i + 2] = better[i];
-    for (std::size_t i = 0; i < 2; ++i) {
-        around[i] = better[i + kFifths - 2];
-        around[i + kFifths + 2] = better[i];
-    }
-    TFifths found;
-    for (std::size_t i = 0; i < kFifths; ++i) {
-        const double near = LargerPoints(around[i + 1], around[i + 3]) - costs.mBySteps[1];
-        const double apart = LargerPoints(around[i], around[i + 4]) - costs.mBySteps[2];
-        found[i] = LargerPoints(LargerPoints(near, apart), far);
-    }
-    return found;
-}
-
-/// The circle turned: what stands so many steps up comes to the begin.
-TFifths Turned(const TFifths& points, std::size_t steps) {
-    TFifths moved;
-    for (std::size_t i = 0; i + steps < kFifths; ++i) moved[i] = points[i + steps];
-    for (std::size_t i = 0; i < steps; ++i) moved[kFifths - steps + i] = points[i];
-    return moved;
-}
-
-/// The best that can be had by a change into each key.
-void ChangeKeys(const CPointsOfKeys& best, const CChangeCosts& costs, CPointsOfKeys& changed) {
-    const TFifths elsewhere = BestFromElsewhere(best, costs);
-    // The parallel minor key has three signs less, which is nine steps up.
-    const TFifths parallelMinor = Turned(best.mMinor, kFifths - 3);
-    const TFifths parallelMajor = Turned(best.mMajor, 3);
-    for (std::size_t i = 0; i < kFifths; ++i) {
-        const double change =
-            LargerPoints(best.mMinor[i] - costs.mBySteps[0], parallelMinor[i] - costs.mParallel);
-        changed.mMajor[i] = LargerPoints(elsewhere[i], change);
-    }
-    for (std::size_t i = 0; i < kFifths; ++i) {
-        const double change =
-            LargerPoints(best.mMajor[i] - costs.mBySteps[0], parallelMajor[i] - costs.mParallel);
-        changed.mMinor[i] = LargerPoints(elsewhere[i], change);
-    }
-}
 
 /// The points of the next chord: the better of staying in a key and of a change into it.
 void StepOn(const CPointsOfKeys& changed, const CPointsOfKeys& gains, CPointsOfKeys& best) {

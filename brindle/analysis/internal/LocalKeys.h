@@ -18,7 +18,8 @@ namespace brindle {
                                                   const CSongTraits& traits,
                                                   const CKeyOptions& options);
 
-/// The number of passages that are in one key each.
+/// The number of passages that are in one key each; a modulation leads
+/// from one to the next.
 [[nodiscard]] std::size_t CountRuns(std::span<const std::uint8_t> keys);
 
 /// Gives short passages and the ends of passages to the key around them, where their chords are at
