@@ -6,8 +6,8 @@
 
 #include "brindle/chords/WriteChordSymbol.h"
 
-#include "brindle/chords/internal/ChordKinds.h"
 #include "brindle/chords/internal/SignsOfRoot.h"
+#include "brindle/chords/internal/ToneMasks.h"
 #include "brindle/platform/Ascii.h"
 #include "brindle/theory/KeyIntervals.h"
 #include "brindle/theory/KeyNames.h"
@@ -21,26 +21,8 @@
 namespace brindle {
 namespace {
 
-using TTones = std::uint32_t;  // bit n is the tone n semitones above the root
-
-template <class... T>
-constexpr TTones Tones(T... tones) {
-    return (TTones{0} | ... | (TTones{1} << tones));
-}
-
-consteval TTones TonesOfKind(std::string_view suffix) {
-    return static_cast<TTones>(TonesOfChordKind(suffix).Mask());
-}
-
-constexpr bool Has(TTones tones, TTones wanted) {
-    return (tones & wanted) == wanted;
-}
-constexpr bool HasAny(TTones tones, TTones wanted) {
-    return (tones & wanted) != 0;
-}
-
 struct CSuffixRow {
-    TTones mTones;
+    TToneMask mTones;
     std::string_view mText;
 };
 
@@ -57,14 +39,8 @@ constexpr auto kWholeChordRows = std::to_array<CSuffixRow>({
     {TonesOfKind("13b9#11"), "13b9#11"},
 });
 
-struct CNumberRow {
-    TTones mTones;
-    std::string_view mText;
-    bool mIsForSus4Alone = false;
-};
-
 // The first that is contained. With a third, 13 has the eleventh below it.
-constexpr auto kNumberRows = std::to_array<CNumberRow>({
+constexpr auto kNumberRows = std::to_array<CNumberOfTones>({
     {Tones(2, 9, 10), "13", true},
     {Tones(2, 5, 9, 10), "13"},
     {Tones(2, 5, 10), "11"},
@@ -81,7 +57,7 @@ constexpr auto kNumberRows = std::to_array<CNumberRow>({
 
 class CSuffixWriter {
 public:
-    explicit CSuffixWriter(TTones tones) : mTones(tones), mRest(tones & ~Tones(0)) {}
+    explicit CSuffixWriter(TToneMask tones) : mTones(tones), mRest(tones & ~Tones(0)) {}
 
     std::string Write() && {
         TakeThird();
@@ -89,16 +65,12 @@ public:
         TakeFifth();
         TakeAlterations();
         TakeAddedTones();
-        if (!Has(mTones, Tones(0))) mTail += "no1";
+        if (!HasAll(mTones, Tones(0))) mTail += "no1";
         return mThird + mNumber + Alterations() + mAdded + mTail;
     }
 
 private:
-    bool Take(int tone) {
-        if (!Has(mRest, Tones(tone))) return false;
-        mRest &= ~Tones(tone);
-        return true;
-    }
+    bool Take(int tone) { return TakeTone(mRest, tone); }
 
     void TakeThird() {
         if (Take(4)) return;
@@ -117,24 +89,23 @@ private:
     void TakeNumber() {
         const auto* const row =
             std::find_if(kNumberRows.begin(), kNumberRows.end(),
-                         [&](const CNumberRow& number) { return IsNumber(number); });
+                         [&](const CNumberOfTones& number) { return IsNumber(number); });
         if (row == kNumberRows.end()) return;
         mRest &= ~row->mTones;
         const bool isMajor = row->mText.front() == 'm';
         mNumber = isMajor && !mThird.empty() ? "(" + std::string(row->mText) + ")" : row->mText;
-        if (Has(row->mTones, Tones(10)) && Take(11)) mNumber += "(maj7)";
+        if (HasAll(row->mTones, Tones(10)) && Take(11)) mNumber += "(maj7)";
     }
 
     /// A number that brings several tones brings none that is altered as well, and only one
     /// seventh.
-    [[nodiscard]] bool IsNumber(const CNumberRow& row) const {
-        if (!Has(mRest, row.mTones) || (row.mIsForSus4Alone && !mIsSus4)) return false;
-        const bool isSingle = (row.mTones & (row.mTones - 1)) == 0;
-        if (isSingle) return true;
-        const bool hasFifth = Has(mTones, Tones(7));
-        if (HasAny(mRest, Tones(1, 3)) || Has(mRest, Tones(10, 11))) return false;
-        if (Has(row.mTones, Tones(5)) && Has(mRest, Tones(6)) && hasFifth) return false;
-        return !(Has(row.mTones, Tones(9)) && Has(mRest, Tones(8)) && hasFifth);
+    [[nodiscard]] bool IsNumber(const CNumberOfTones& row) const {
+        if (!HasAll(mRest, row.mTones) || (row.mIsForSus4Alone && !mIsSus4)) return false;
+        if (row.IsSingleTone()) return true;
+        const bool hasFifth = HasAll(mTones, Tones(7));
+        if (HasAny(mRest, Tones(1, 3)) || HasAll(mRest, Tones(10, 11))) return false;
+        if (HasAll(row.mTones, Tones(5)) && HasAll(mRest, Tones(6)) && hasFifth) return false;
+        return !(HasAll(row.mTones, Tones(9)) && HasAll(mRest, Tones(8)) && hasFifth);
     }
 
     void TakeFifth() {
@@ -167,8 +138,8 @@ private:
         return text.empty() || isBehindNumber ? text : "(" + text + ")";
     }
 
-    TTones mTones;
-    TTones mRest;
+    TToneMask mTones;
+    TToneMask mRest;
     bool mIsSus4 = false;
     std::string mThird;
     std::string mNumber;
@@ -181,7 +152,7 @@ private:
 CKeyEnh WithTwoSignsAtMost(CKeyEnh note) {
     const int signs = EnhToSemitone(note.mEnh);
     if (note.mEnh != TEnh_Undef && signs >= -2 && signs <= 2) return note;
-    const bool isBlack = HasAny(TTones{1} << FoldIntoOctave(note.mKeyNr), Tones(1, 3, 6, 8, 10));
+    const bool isBlack = HasAny(TToneMask{1} << FoldIntoOctave(note.mKeyNr), Tones(1, 3, 6, 8, 10));
     note.mEnh = !isBlack ? TEnh_n : signs < 0 ? TEnh_b : TEnh_s;
     return note;
 }
@@ -219,7 +190,7 @@ bool TakesSignOf(const CKeyEnh& root, std::string_view suffix) {
 }
 
 std::string ChordSymbolSuffix(CSemitones semitones) {
-    const auto tones = static_cast<TTones>(semitones.Mask());
+    const auto tones = static_cast<TToneMask>(semitones.Mask());
     const auto* const whole =
         std::find_if(kWholeChordRows.begin(), kWholeChordRows.end(),
                      [&](const CSuffixRow& row) { return row.mTones == tones; });

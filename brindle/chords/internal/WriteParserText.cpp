@@ -2,46 +2,27 @@
 #include "brindle/chords/internal/WriteParserText.h"
 
 #include "brindle/chords/internal/CTextScan.h"
-#include "brindle/chords/internal/ChordKinds.h"
+#include "brindle/chords/internal/ToneMasks.h"
 #include "brindle/theory/CChordNamePrefs.h"
 #include "brindle/theory/KeyIntervals.h"
 
 #include <algorithm>
 #include <array>
-#include <cstdint>
 
 namespace brindle::ChordText {
 namespace {
 
-using TTones = std::uint32_t;  // bit n is the tone n semitones above the root
-
-template <class... T>
-constexpr TTones Tones(T... tones) {
-    return (TTones{0} | ... | (TTones{1} << tones));
-}
-
-consteval TTones TonesOfKind(std::string_view suffix) {
-    return static_cast<TTones>(TonesOfChordKind(suffix).Mask());
-}
-
-constexpr bool Has(TTones tones, TTones wanted) {
-    return (tones & wanted) == wanted;
-}
-constexpr bool HasAny(TTones tones, TTones wanted) {
-    return (tones & wanted) != 0;
-}
-
-constexpr bool CanBeSaid(TTones tones) {
-    return Has(tones, Tones(0)) && HasAny(tones, Tones(6, 7, 8)) &&
-           (Has(tones, Tones(10)) || !Has(tones, Tones(1)));
+constexpr bool CanBeSaid(TToneMask tones) {
+    return HasAll(tones, Tones(0)) && HasAny(tones, Tones(6, 7, 8)) &&
+           (HasAll(tones, Tones(10)) || !HasAll(tones, Tones(1)));
 }
 
 /// No text leaves the root or the fifth out, and a flat nine always brings a minor seventh.
-constexpr TTones NearestThatCanBeSaid(TTones tones) {
+constexpr TToneMask NearestThatCanBeSaid(TToneMask tones) {
     tones |= Tones(0);
     if (!HasAny(tones, Tones(6, 7, 8))) tones |= Tones(7);
-    if (Has(tones, Tones(1)) && !Has(tones, Tones(10))) {
-        if (Has(tones, Tones(11))) {
+    if (HasAll(tones, Tones(1)) && !HasAll(tones, Tones(10))) {
+        if (HasAll(tones, Tones(11))) {
             tones &= ~Tones(1);
         } else {
             tones |= Tones(10);
@@ -51,7 +32,7 @@ constexpr TTones NearestThatCanBeSaid(TTones tones) {
 }
 
 struct CWholeChordRow {
-    TTones mTones;
+    TToneMask mTones;
     std::string_view mText;
 };
 
@@ -62,14 +43,8 @@ constexpr auto kWholeChordRows = std::to_array<CWholeChordRow>({
     {TonesOfKind("5"), "5"},
 });
 
-struct CFirstNumberRow {
-    TTones mTones;
-    std::string_view mText;
-    bool mIsForSus4Alone = false;
-};
-
 // The first that is contained.
-constexpr auto kFirstNumberRows = std::to_array<CFirstNumberRow>({
+constexpr auto kFirstNumberRows = std::to_array<CNumberOfTones>({
     {Tones(2, 9, 10), "13", true},
     {Tones(2, 5, 9, 10), "13"},
     {Tones(2, 5, 10), "11"},
@@ -110,7 +85,7 @@ bool CanBeFlat(std::string_view number) {
 
 class CParserTextWriter {
 public:
-    CParserTextWriter(std::string root, TTones tones)
+    CParserTextWriter(std::string root, TToneMask tones)
         : mText(std::move(root)), mRootLength(mText.size()), mTones(tones) {}
 
     std::string Write() && {
@@ -131,11 +106,7 @@ public:
     }
 
 private:
-    bool Drop(int tone) {
-        if (!Has(mRest, Tones(tone))) return false;
-        mRest &= ~Tones(tone);
-        return true;
-    }
+    bool Drop(int tone) { return TakeTone(mRest, tone); }
 
     void WriteThird() {
         if (Drop(4)) return;
@@ -153,7 +124,7 @@ private:
     void WriteFirstNumber() {
         const auto* const row =
             std::find_if(kFirstNumberRows.begin(), kFirstNumberRows.end(),
-                         [&](const CFirstNumberRow& number) { return IsFirstNumber(number); });
+                         [&](const CNumberOfTones& number) { return IsFirstNumber(number); });
         if (row == kFirstNumberRows.end()) return;
         Append(row->mText);
         mRest &= ~row->mTones;
@@ -161,16 +132,15 @@ private:
     }
 
     /// A number that brings several tones brings none that is altered as well.
-    [[nodiscard]] bool IsFirstNumber(const CFirstNumberRow& row) const {
-        if (!Has(mRest, row.mTones)) return false;
+    [[nodiscard]] bool IsFirstNumber(const CNumberOfTones& row) const {
+        if (!HasAll(mRest, row.mTones)) return false;
         if (row.mIsForSus4Alone && mTail != "sus4") return false;
-        const bool isSingle = (row.mTones & (row.mTones - 1)) == 0;
-        if (isSingle) return true;
-        const bool hasFifth = Has(mTones, Tones(7));
-        if (Has(row.mTones, Tones(2)) && HasAny(mRest, Tones(1, 3))) return false;
-        if (Has(row.mTones, Tones(10)) && Has(mRest, Tones(11))) return false;
-        if (Has(row.mTones, Tones(5)) && Has(mRest, Tones(6)) && hasFifth) return false;
-        return !(Has(row.mTones, Tones(9)) && Has(mRest, Tones(8)) && hasFifth);
+        if (row.IsSingleTone()) return true;
+        const bool hasFifth = HasAll(mTones, Tones(7));
+        if (HasAll(row.mTones, Tones(2)) && HasAny(mRest, Tones(1, 3))) return false;
+        if (HasAll(row.mTones, Tones(10)) && HasAll(mRest, Tones(11))) return false;
+        if (HasAll(row.mTones, Tones(5)) && HasAll(mRest, Tones(6)) && hasFifth) return false;
+        return !(HasAll(row.mTones, Tones(9)) && HasAll(mRest, Tones(8)) && hasFifth);
     }
 
     void TakeFifth() {
@@ -199,8 +169,8 @@ private:
 
     std::string mText;
     std::size_t mRootLength;
-    TTones mTones;
-    TTones mRest = 0;
+    TToneMask mTones;
+    TToneMask mRest = 0;
     std::string_view mTail;
     bool mHasNumber = false;
 };
@@ -221,11 +191,11 @@ std::string NoteText(CKeyEnh key, const CChordNamePrefs& prefs) {
 }  // namespace
 
 bool IsExpressible(CSemitones semitones) {
-    return CanBeSaid(static_cast<TTones>(semitones.Mask()));
+    return CanBeSaid(static_cast<TToneMask>(semitones.Mask()));
 }
 
 CParserText WriteParserText(const CChordLite& chord, const CChordNamePrefs& prefs) {
-    const auto tones = static_cast<TTones>(chord.mSemitones.Mask());
+    const auto tones = static_cast<TToneMask>(chord.mSemitones.Mask());
     CParserText written;
     written.mIsExact = CanBeSaid(tones);
     CParserTextWriter writer(NoteText(chord.mRootKeyEnh, prefs), NearestThatCanBeSaid(tones));
