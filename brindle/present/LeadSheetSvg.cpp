@@ -5,6 +5,7 @@
 #include "brindle/present/ShownText.h"
 #include "brindle/present/internal/ReadingNotes.h"
 #include "brindle/present/internal/SheetDrawing.h"
+#include "brindle/present/internal/SheetLegend.h"
 #include "brindle/present/internal/SheetStyle.h"
 
 #include <fmt/format.h>

@@ -2,12 +2,12 @@
 #include "brindle/present/internal/SheetDrawing.h"
 
 #include "brindle/present/CSvg.h"
+#include "brindle/present/internal/SheetShapes.h"
 #include "brindle/present/internal/SheetStyle.h"
 
 #include <fmt/format.h>
 
 #include <algorithm>
-#include <cmath>
 
 namespace brindle::LeadSheet {
 namespace {
@@ -29,10 +29,6 @@ constexpr double kSectionSize = 12.0;
 constexpr double kKeyNameSize = 11.5;
 constexpr double kRemarkSize = 11.0;
 constexpr double kNumberSize = 9.5;
-constexpr double kLegendSize = 11.0;
-constexpr double kSmallestLegendSize = 6.0;
-constexpr double kLegendTextGap = 5.0;
-constexpr double kLegendGap = 16.0;
 constexpr double kHeadGap = 8.0;
 
 bool HasHeads(const CSheetBar& bar) {
@@ -43,11 +39,6 @@ bool HasHeads(const CSheetBar& bar) {
 // Behind "To Coda" the music goes on.
 bool EndsPart(const CSheetBar& bar) {
     return bar.mWords.find("D.") != std::string::npos || bar.mWords == "Fine";
-}
-
-// In em. The italics of the legend are narrower than the letters that are measured.
-double LegendWidthOf(std::string_view text) {
-    return 0.85 * WidthOf(text);
 }
 
 /// The heights of the parts of a line.
@@ -100,7 +91,7 @@ public:
         DrawNumber();
         for (const CPlacedBar& bar : mLine.mBars) DrawBar(bar);
         DrawHeads();
-        for (const CLinkMark& arrow : mMarks.mArrows) DrawArrow(arrow);
+        for (const CLinkMark& arrow : mMarks.mArrows) DrawLink(arrow);
         for (const CLinkMark& bracket : mMarks.mBrackets) DrawBracket(bracket);
     }
 
@@ -212,12 +203,12 @@ private:
         if (!sounds) {
             mPen.Rect(x - 5, Middle() - 2.5, 10, 5, "quiet");
         } else if (IsSimple(placed.mBar)) {
-            DrawSlash(x);
+            DrawSlash(mPen, x, Middle());
             mPen.Dot(x - 7, Middle() - 4.5, 1.7, "quiet");
             mPen.Dot(x + 7, Middle() + 4.5, 1.7, "quiet");
         } else {
             for (const double part : {0.125, 0.375, 0.625, 0.875}) {
-                DrawSlash(left + part * (right - left));
+                DrawSlash(mPen, left + part * (right - left), Middle());
             }
         }
     }
@@ -228,11 +219,6 @@ private:
         const CSheetBar& before = mScore.mSheet.mBars[index - 1];
         const std::size_t held = before.mHeld == kNone ? 0 : 1;
         return held + before.mEnd - before.mBegin <= 1 && before.mBarCount == 1;
-    }
-
-    void DrawSlash(double x) {
-        mPen.Path(fmt::format("M{} {}l8 -14h4l-8 14z", SvgNumber(x - 6), SvgNumber(Middle() + 7)),
-                  "quiet");
     }
 
     void DrawLongRest(double left, double right, std::size_t count) {
@@ -287,33 +273,14 @@ private:
         DrawHead(placed.End() - width, kSectionSize, text, style, free);
     }
 
-    // Drawn by hand, as few fonts have these signs.
     void DrawSign(const CPlacedBar& placed, double& free) {
         const double x = std::max(placed.mX + 1, free);
         if (BarOf(placed).mSign == TSongSign_Coda) {
-            DrawCodaSign(mX + x + 7, HeadLine() - 4.5);
+            DrawCodaSign(mPen, mX + x + 7, HeadLine() - 4.5);
         } else {
-            DrawSegnoSign(mX + x + 7, HeadLine() - 4.5);
+            DrawSegnoSign(mPen, mX + x + 7, HeadLine() - 4.5);
         }
         free = x + 14 + kHeadGap;
-    }
-
-    void DrawCodaSign(double x, double y) {
-        mPen.Path(fmt::format("M{0} {1}a3.6 4.6 0 1 0 7.2 0a3.6 4.6 0 1 0 -7.2 0",
-                              SvgNumber(x - 3.6), SvgNumber(y)),
-                  "bar");
-        mPen.Line(x - 6.2, y, x + 6.2, y, "bar");
-        mPen.Line(x, y - 7.2, x, y + 7.2, "bar");
-    }
-
-    void DrawSegnoSign(double x, double y) {
-        mPen.Path(fmt::format("M{} {}c-2 -3 -7 -1.5 -4.5 1.8c1.6 2 7.4 1.6 9 3.6c2.5 3.3 -2.5 4.8 "
-                              "-4.5 1.8",
-                              SvgNumber(x), SvgNumber(y - 3.6)),
-                  "bar");
-        mPen.Line(x - 4.6, y + 6.6, x + 4.6, y - 6.6, "bar");
-        mPen.Dot(x - 4.6, y + 1.2, 1.1, "ink");
-        mPen.Dot(x + 4.6, y - 1.2, 1.1, "ink");
     }
 
     // A short line may have names that are longer.
@@ -335,46 +302,10 @@ private:
                  free);
     }
 
-    void DrawArrow(const CLinkMark& arrow) {
+    void DrawLink(const CLinkMark& arrow) {
         const double base = mTop - 2;
         const double rise = 13.0 + kLevelHeight * 4 / 3 * static_cast<double>(arrow.mLevel);
-        DrawArrowShape(mPen, mX + arrow.mBegin, mX + arrow.mEnd, base, rise, arrow);
-    }
-
-public:
-    static void DrawArrowShape(CSheetPen& pen, double begin, double end, double base, double rise,
-                               const CLinkMark& arrow) {
-        const double top = base - 0.75 * rise;
-        const double bend = std::min(22.0, 0.36 * (end - begin));
-        const std::string_view style = arrow.mIsDotted ? "dot" : "arc";
-        const bool fades = arrow.mGoesOn || arrow.mGoesBack;
-        const double beginY = arrow.mIsFromBefore ? top : base;
-        const double endY = fades ? top : base;
-        const double beginTop = arrow.mIsFromBefore ? top : base - rise;
-        const double endTop = fades ? top : base - rise;
-        pen.Path(fmt::format("M{} {}C{} {} {} {} {} {}", SvgNumber(begin), SvgNumber(beginY),
-                             SvgNumber(begin + bend), SvgNumber(beginTop), SvgNumber(end - bend),
-                             SvgNumber(endTop), SvgNumber(end), SvgNumber(endY)),
-                 style);
-        if (arrow.mGoesOn) return;
-        DrawArrowHead(pen, end, endY, bend, endY - endTop);
-    }
-
-private:
-    // The way of the arrow at its end is (across, down).
-    static void DrawArrowHead(CSheetPen& pen, double x, double y, double across, double down) {
-        constexpr double kLength = 6.5;
-        constexpr double kHalfWidth = 2.3;
-        const double length = std::max(1e-3, std::hypot(across, down));
-        const double dx = across / length;
-        const double dy = down / length;
-        const double baseX = x - kLength * dx;
-        const double baseY = y - kLength * dy;
-        pen.Path(
-            fmt::format("M{} {}L{} {}L{} {}z", SvgNumber(x + dx), SvgNumber(y + dy),
-                        SvgNumber(baseX - kHalfWidth * dy), SvgNumber(baseY + kHalfWidth * dx),
-                        SvgNumber(baseX + kHalfWidth * dy), SvgNumber(baseY - kHalfWidth * dx)),
-            "head");
+        DrawArrow(mPen, mX + arrow.mBegin, mX + arrow.mEnd, base, rise, arrow);
     }
 
     void DrawBracket(const CLinkMark& bracket) {
@@ -398,102 +329,6 @@ private:
     double mBottom;
 };
 
-/// What the marks of a score are.
-struct CMarkKinds {
-    bool mHasArrow = false;
-    bool mHasDottedArrow = false;
-    bool mHasBracket = false;
-    bool mHasDottedBracket = false;
-
-    explicit CMarkKinds(const CSheetScore& score) {
-        for (const CLineMarks& marks : score.mMarks) {
-            for (const CLinkMark& arrow : marks.mArrows) {
-                (arrow.mIsDotted ? mHasDottedArrow : mHasArrow) = true;
-            }
-            for (const CLinkMark& bracket : marks.mBrackets) {
-                (bracket.mIsDotted ? mHasDottedBracket : mHasBracket) = true;
-            }
-        }
-    }
-};
-
-/// The first key that a score has a color for; undefined for none.
-CSignKeyLite FirstKeyOf(const CSheetScore& score) {
-    for (const CLineMarks& marks : score.mMarks) {
-        for (const CKeyMark& key : marks.mKeys) {
-            if (!key.mKey.mRootKeyEnh.IsUndef()) return key.mKey;
-        }
-    }
-    return CSignKeyLite_Undef;
-}
-
-enum class TSample { Arrow, Bracket, Color };
-
-/// A sample of a mark and what it means, somewhere in the legend.
-struct CLegendEntry {
-    TSample mSample = TSample::Arrow;
-    bool mIsDotted = false;
-    std::string_view mText;
-    double mX = 0.0;
-    std::size_t mLine = 0;
-    double mSize = kLegendSize;
-
-    [[nodiscard]] double SampleWidth() const {
-        return mSample == TSample::Arrow ? 26.0 : mSample == TSample::Bracket ? 24.0 : 14.0;
-    }
-    [[nodiscard]] double TextLeft() const { return SampleWidth() + kLegendTextGap; }
-    [[nodiscard]] double Width() const { return TextLeft() + mSize * LegendWidthOf(mText); }
-};
-
-std::vector<CLegendEntry> LegendEntries(const CSheetScore& score) {
-    const CMarkKinds kinds(score);
-    std::vector<CLegendEntry> entries;
-    const auto add = [&](bool isUsed, TSample sample, bool isDotted, std::string_view text) {
-        if (isUsed) entries.push_back({sample, isDotted, text});
-    };
-    add(kinds.mHasArrow, TSample::Arrow, false, "a dominant resolves");
-    add(kinds.mHasDottedArrow, TSample::Arrow, true, "a substitute resolves");
-    add(kinds.mHasBracket, TSample::Bracket, false, "ii and V");
-    add(kinds.mHasDottedBracket, TSample::Bracket, true, "ii and a substitute for V");
-    const bool hasKey = !FirstKeyOf(score).mRootKeyEnh.IsUndef();
-    add(hasKey, TSample::Color, false, "color of the key");
-    return entries;
-}
-
-/// Sets the entries beside each other on as many lines as they need; one that is wider than a line
-/// is set smaller.
-std::vector<CLegendEntry> PlacedLegend(const CSheetScore& score, double width) {
-    std::vector<CLegendEntry> entries = LegendEntries(score);
-    double x = 0.0;
-    std::size_t line = 0;
-    for (CLegendEntry& entry : entries) {
-        const double most = (width - entry.TextLeft()) / LegendWidthOf(entry.mText);
-        entry.mSize = std::clamp(most, kSmallestLegendSize, kLegendSize);
-        if (x > 0.0 && x + entry.Width() > width) {
-            x = 0.0;
-            ++line;
-        }
-        entry.mX = x;
-        entry.mLine = line;
-        x += entry.Width() + kLegendGap;
-    }
-    return entries;
-}
-
-void DrawSample(CSheetPen& pen, const CSheetScore& score, const CLegendEntry& entry, double x,
-                double y) {
-    if (entry.mSample == TSample::Arrow) {
-        CLinkMark mark;
-        mark.mIsDotted = entry.mIsDotted;
-        CLineDrawing::DrawArrowShape(pen, x, x + 24, y, 12, mark);
-    } else if (entry.mSample == TSample::Bracket) {
-        pen.Path(fmt::format("M{} {}v5h24v-5", SvgNumber(x), SvgNumber(y - 6)),
-                 entry.mIsDotted ? "dot" : "arc");
-    } else {
-        pen.Rect(x, y - 8, 14, 9, BandStyle(FirstKeyOf(score)));
-    }
-}
-
 }  // namespace
 
 double HeightOf(const CSheetScore& score, std::size_t line) {
@@ -503,20 +338,6 @@ double HeightOf(const CSheetScore& score, std::size_t line) {
 
 void DrawLine(CSheetPen& pen, const CSheetScore& score, std::size_t line, double x, double y) {
     CLineDrawing(pen, score, line, x, y).Draw();
-}
-
-std::size_t LegendLines(const CSheetScore& score, double width) {
-    const std::vector<CLegendEntry> entries = PlacedLegend(score, width);
-    return entries.empty() ? 0 : entries.back().mLine + 1;
-}
-
-void DrawLegend(CSheetPen& pen, const CSheetScore& score, double x, double y, double width) {
-    for (const CLegendEntry& entry : PlacedLegend(score, width)) {
-        const double left = x + entry.mX;
-        const double bottom = y + static_cast<double>(entry.mLine) * kLegendLineHeight;
-        DrawSample(pen, score, entry, left, bottom);
-        pen.Text(left + entry.TextLeft(), bottom, entry.mSize, entry.mText, "ita quiet");
-    }
 }
 
 }  // namespace brindle::LeadSheet
