@@ -3,6 +3,7 @@
 #include "brindle/analysis/internal/AugmentedSixths.h"
 #include "brindle/analysis/internal/CFoldedNumeral.h"
 #include "brindle/analysis/internal/NumeralDegree.h"
+#include "brindle/analysis/internal/NumeralPieces.h"
 #include "brindle/analysis/internal/NumeralTables.h"
 #include "brindle/analysis/internal/NumeralTones.h"
 #include "brindle/platform/Ascii.h"
@@ -21,77 +22,9 @@ namespace {
 constexpr std::string_view kNoDegree = "this is no degree";
 constexpr std::string_view kNoSign = "this sign behind the degree is not understood";
 constexpr std::string_view kNoGroup = "what stands in brackets is not understood";
-constexpr std::string_view kNoTarget = "a degree or a bass is expected behind the slash";
 constexpr std::string_view kNoTones = "nothing is left of the chord";
 constexpr std::string_view kTooLong = "this is too long for a numeral";
 constexpr std::string_view kNoKey = "there is no key";
-
-/// What the slashes cut. The views are pieces of the folded text.
-struct CNumeralPieces {
-    static constexpr std::size_t kMostTargets = 8;
-
-    std::string_view mChord;
-    std::array<std::string_view, kMostTargets> mTargets;
-    std::size_t mTargetCount = 0;
-    std::string_view mBass;
-    /// Behind `/^`: the degree counts as it is written.
-    bool mIsExactBass = false;
-    /// The half-diminished sign of RomanText, vii/o7: then mChord is only the degree.
-    std::string_view mSlashedTail;
-    std::string_view mFault;
-    std::string_view mFaultPiece;
-
-    void Fail(std::string_view fault, std::string_view piece) {
-        mFault = fault;
-        mFaultPiece = piece;
-    }
-};
-
-bool IsDigits(std::string_view text) {
-    return !text.empty() &&
-           std::all_of(text.begin(), text.end(), [](char c) { return c >= '0' && c <= '9'; });
-}
-
-// Whether the digits on both sides of a slash are one figure, 6/5. A Nashville number has no such
-// figures: there 46/5 is a chord with a sixth over the fifth degree.
-bool IsSlashedFigure(std::string_view before, std::string_view behind) {
-    if (!IsDigits(behind) || behind.size() > 2 || ReadDegree(before).mIsDigit) return false;
-    const std::size_t last = before.find_last_not_of("0123456789/");
-    if (last == before.npos) return false;
-    std::array<char, 4> digits;
-    std::size_t count = 0;
-    for (const std::string_view text : {before.substr(last + 1), behind}) {
-        for (const char c : text) {
-            if (c == '/') continue;
-            if (count == digits.size()) return false;
-            digits[count++] = c;
-        }
-    }
-    const std::string_view figure(digits.data(), count);
-    return std::find(kSlashedFigures.begin(), kSlashedFigures.end(), figure) !=
-           kSlashedFigures.end();
-}
-
-// 7/5 is not a figure, but 7/5/3 is one.
-std::string_view TakeFigureWithSlashes(std::string_view& text) {
-    std::size_t end = std::min(text.find('/'), text.size());
-    for (int more = 0; more < 2; ++more) {
-        std::size_t next = end;
-        for (std::size_t probe = end, count = 0; probe < text.size() && count < 2; ++count) {
-            const std::size_t behind = std::min(text.find('/', probe + 1), text.size());
-            const std::string_view digits = text.substr(probe + 1, behind - probe - 1);
-            const bool isFigure = IsSlashedFigure(text.substr(0, probe), digits);
-            if (isFigure) next = behind;
-            if (!IsDigits(digits)) break;
-            probe = behind;
-        }
-        if (next == end) break;
-        end = next;
-    }
-    const std::string_view figure = text.substr(0, end);
-    text.remove_prefix(end);
-    return figure;
-}
 
 const CAugmentedSixth* TakeAugmentedSixth(std::string_view& text) {
     const CAugmentedSixth* const chord = AugmentedSixthOf(text);
@@ -101,47 +34,6 @@ const CAugmentedSixth* TakeAugmentedSixth(std::string_view& text) {
 
 bool IsSubstitute(std::string_view text) {
     return text.starts_with("sub");
-}
-
-bool IsWordOfNeapolitan(std::string_view text) {
-    return text.starts_with('N');
-}
-
-bool BeginsTarget(std::string_view piece) {
-    const CReadDegree degree = ReadDegree(piece);
-    return (degree.IsRead() && !degree.mIsDigit) || IsWordOfNeapolitan(piece);
-}
-
-void CutPiece(std::string_view piece, CNumeralPieces& pieces) {
-    const bool isLast = !pieces.mBass.empty();
-    if (piece.empty() || isLast) return pieces.Fail(kNoTarget, piece);
-    if (BeginsTarget(piece)) {
-        if (pieces.mTargetCount == CNumeralPieces::kMostTargets)
-            return pieces.Fail(kNoTarget, piece);
-        pieces.mTargets[pieces.mTargetCount++] = piece;
-        return;
-    }
-    pieces.mIsExactBass = piece.front() == '^';
-    if (pieces.mIsExactBass) piece.remove_prefix(1);
-    if (piece.empty()) return pieces.Fail(kNoTarget, piece);
-    pieces.mBass = piece;
-}
-
-CNumeralPieces PiecesOf(std::string_view text) {
-    CNumeralPieces pieces;
-    pieces.mChord = TakeFigureWithSlashes(text);
-    while (!text.empty() && pieces.mFault.empty()) {
-        text.remove_prefix(1);
-        const std::string_view piece = text.substr(0, text.find('/'));
-        text.remove_prefix(piece.size());
-        const bool isFirst = pieces.mTargetCount == 0 && pieces.mBass.empty();
-        if (isFirst && piece.starts_with('o') && pieces.mSlashedTail.empty()) {
-            pieces.mSlashedTail = piece;
-        } else {
-            CutPiece(piece, pieces);
-        }
-    }
-    return pieces;
 }
 
 /// A chord before its root and bass are spelled.
@@ -308,7 +200,7 @@ CKeyEnh ReadBass(const CNumeralPieces& pieces, const CSignKeyLite& key) {
     const CReadDegree degree = ReadDegree(pieces.mBass);
     if (degree.IsRead()) {
         if (!degree.mIsDigit || !degree.mRest.empty()) return CKeyEnh_Undef;
-        return KeyOfDegree(
+        return NoteOfDegree(
             pieces.mIsExactBass ? degree.mDegree : FoldMinorFlat(degree.mDegree, key.mSignKeyType),
             key);
     }
@@ -330,7 +222,7 @@ std::optional<CSignKeyLite> KeyOfTarget(std::string_view target, const CSignKeyL
     const CNumeralRoot root{degree, key.mSignKeyType, head.mDegree.mIsSmall};
     if (TonesOfTail(head.mTail, root, options).mSemitones.IsEmpty()) return std::nullopt;
     const bool isMinor = head.mDegree.mIsSmall || head.mTail.starts_with('m');
-    return CSignKeyLite(KeyOfDegree(degree, key),
+    return CSignKeyLite(NoteOfDegree(degree, key),
                         isMinor ? TSignKeyType_Minor : TSignKeyType_Major);
 }
 
@@ -341,12 +233,12 @@ CNumeralReading Fault(std::string_view fault, std::string_view piece, const CFol
 CNumeralReading Finished(const CChordOfNumeral& chord, const CSignKeyLite& keyOfTarget,
                          const CNumeralPieces& pieces, const CSignKeyLite& key,
                          const CFoldedNumeral& text) {
-    const CKeyEnh root = KeyOfDegree(chord.mDegree, keyOfTarget);
+    const CKeyEnh root = NoteOfDegree(chord.mDegree, keyOfTarget);
     CKeyEnh bass = CKeyEnh_Undef;
     if (chord.mBass != 0) bass = SpelledAbove(root, chord.mBassStep - 1, chord.mBass);
     if (!pieces.mBass.empty()) {
         bass = ReadBass(pieces, key);
-        if (bass.IsUndef()) return Fault(kNoTarget, pieces.mBass, text);
+        if (bass.IsUndef()) return Fault(kNoNumeralTarget, pieces.mBass, text);
     }
     return {CChordLite(root, bass, chord.mSemitones), {}, 0};
 }
@@ -361,7 +253,7 @@ CNumeralReading ReadNumeral(std::string_view typed, const CSignKeyLite& key,
     if (typed.size() > CFoldedNumeral::kLongest) return {CChordLite_Undef, kTooLong, 0};
     const CFoldedNumeral text(typed);
     if (!text.IsWhole()) return {CChordLite_Undef, kNoGroup, text.OffsetOfWrongBracket()};
-    const CNumeralPieces pieces = PiecesOf(text.Text());
+    const CNumeralPieces pieces = NumeralPiecesOf(text.Text());
     if (!pieces.mFault.empty()) return Fault(pieces.mFault, pieces.mFaultPiece, text);
     CSignKeyLite keyOfTarget = key;
     for (std::size_t i = pieces.mTargetCount; i-- > 0;) {

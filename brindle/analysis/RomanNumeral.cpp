@@ -238,7 +238,7 @@ CWrittenDegree DegreeOfNumeral(std::string_view numeral, const CChordLite& chord
         written.mTarget =
             "/" + DegreeText(HeldInMinor(of.mDegree, triad, key, options), of.mIsSmall, false);
         written.mNumber = (target.mNumber + own.mDegree.mNumber - 2) % 7 + 1;
-        key = CSignKeyLite(KeyOfDegree(target, key),
+        key = CSignKeyLite(NoteOfDegree(target, key),
                            of.mIsSmall ? TSignKeyType_Minor : TSignKeyType_Major);
         written.mRoot.mKeyType = key.mSignKeyType;
     }

@@ -26,8 +26,8 @@ bool IsRaised(const CRelativeChord& chord) {
 
 CKeyEnh RootInKey(const CRelativeChord& chord, const CSignKeyLite& key) {
     const int number = NumberOfKey(key);
-    if (!IsRaised(chord)) return KeyOfDegree(NumeralDegreeOf(chord.mRoot, number), key);
-    const CKeyEnh below = KeyOfDegree(NumeralDegreeOf(chord.mRoot - 1, number), key);
+    if (!IsRaised(chord)) return NoteOfDegree(NumeralDegreeOf(chord.mRoot, number), key);
+    const CKeyEnh below = NoteOfDegree(NumeralDegreeOf(chord.mRoot - 1, number), key);
     return SpelledAbove(below, 0, 1);
 }
 
@@ -74,7 +74,7 @@ CChordLite ChordInKey(const CRelativeChord& chord, const CSignKeyLite& key) {
 
 CSignKeyLite KeyAbove(const CSignKeyLite& home, int semitones, bool isMinor) {
     const int degree = FoldIntoOctave(semitones);
-    CSignKeyLite key(KeyOfDegree(NumeralDegreeOf(degree, NumberOfKey(home)), home),
+    CSignKeyLite key(NoteOfDegree(NumeralDegreeOf(degree, NumberOfKey(home)), home),
                      isMinor ? TSignKeyType_Minor : TSignKeyType_Major);
     if (degree != 0 && key.SignsCountAbs() > 6) key.SetRootNoteEnhWithLeastSigns();
     return key;

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/analysis/internal/NumeralDegree.h"
 
+#include "brindle/platform/Ascii.h"
 #include "brindle/theory/KeyIntervals.h"
 #include "brindle/theory/MakeSensefulEnh.h"
 
@@ -34,7 +35,7 @@ CReadDegree ReadRomanNumber(std::string_view text) {
         const bool isSmall = text.front() >= 'a';
         const bool isHere =
             std::equal(number.begin(), number.end(), text.begin(), [&](char large, char typed) {
-                return typed == (isSmall ? static_cast<char>(large - 'A' + 'a') : large);
+                return typed == (isSmall ? Ascii::ToLower(large) : large);
             });
         if (!isHere) continue;
         longest = number.size();
@@ -99,7 +100,7 @@ int LettersBetween(const CKeyEnh& from, const CKeyEnh& to) {
     return (LetterWrittenFor(to) - LetterWrittenFor(from) + 7) % 7;
 }
 
-CKeyEnh KeyOfDegree(CNumeralDegree degree, const CSignKeyLite& key) {
+CKeyEnh NoteOfDegree(CNumeralDegree degree, const CSignKeyLite& key) {
     return SpelledAbove(key.mRootKeyEnh, degree.mNumber - 1,
                         SemitonesOfDegree(degree, key.mSignKeyType));
 }

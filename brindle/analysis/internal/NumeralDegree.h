@@ -28,13 +28,13 @@ struct CReadDegree {
 /// Semitones from the tonic to a degree, not folded: -1 for bI.
 [[nodiscard]] int SemitonesOfDegree(CNumeralDegree degree, TSignKeyType type);
 
-/// The spelled key of a degree: the third degree of E flat is a G.
-[[nodiscard]] CKeyEnh KeyOfDegree(CNumeralDegree degree, const CSignKeyLite& key);
+/// The note of a degree in a key, spelled: the third degree of E flat is a G.
+[[nodiscard]] CKeyEnh NoteOfDegree(CNumeralDegree degree, const CSignKeyLite& key);
 
-/// The key so many letters and semitones above another; -1 letters is one below.
+/// The note so many letters and semitones above another; -1 letters is one below.
 [[nodiscard]] CKeyEnh SpelledAbove(const CKeyEnh& from, int letters, int semitones);
 
-/// The letters from one spelled key up to another, 0 to 6.
+/// The letters from one spelled note up to another, 0 to 6.
 [[nodiscard]] int LettersBetween(const CKeyEnh& from, const CKeyEnh& to);
 
 }  // namespace brindle

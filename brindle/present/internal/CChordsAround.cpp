@@ -81,7 +81,7 @@ CSignKeyLite ServedKey(const CChordReading& reading) {
     const CServedDegree& served = reading.mServes;
     if (served.mSemitones < 0 || reading.mKey.IsUndef()) return {};
     if (served.IsTonic()) return reading.mKey;
-    const CKeyEnh root = KeyOfDegree({served.mNumber, served.mAccidental}, reading.mKey);
+    const CKeyEnh root = NoteOfDegree({served.mNumber, served.mAccidental}, reading.mKey);
     return {root, served.mIsMinor ? TSignKeyType_Minor : TSignKeyType_Major};
 }
 
