@@ -32,6 +32,19 @@ private:
     std::uint64_t mLength = kEndless;
 };
 
+/// Whether a symbol may be drawn from what fits behind a history. `entropyRatio` is its entropy by
+/// the largest one that it could have.
+bool IsAccepted(const MarkovProbabilities& fitting, double entropyRatio, double remaining,
+                bool isShortest, const TMarkovGenerateOptions& options) {
+    if (fitting.empty()) return false;
+    // An entropy that is not a number passes.
+    if (!(entropyRatio < options.mMinNormalizedEntropy)) return true;
+    if (isShortest) return options.mAcceptAtMinHistory;
+    return options.mAcceptExactFill &&
+           static_cast<double>(VariableLengthMarkovModel::GetMaxLengthFromProbabilities(fitting)) ==
+               remaining;
+}
+
 }  // namespace
 
 bool VariableLengthMarkovModel::AppendNextFittingSymbol(
@@ -50,17 +63,9 @@ bool VariableLengthMarkovModel::AppendNextFittingSymbol(
         const double maxEntropy = std::log(static_cast<double>(candidates));
         RemoveItemsFromProbabilities(table, excluded);
         RemoveNonFittingSymbolsFromProbabilities(table, remaining);
-        // An entropy that is not a number passes.
-        const bool isVaried = !(entropy / (maxEntropy + kNotZero) < options.mMinNormalizedEntropy);
         const bool isShortest = history.size() <= options.mMinHistoryLength || history.empty();
-        const auto fillsExactly = [&] {
-            return options.mAcceptExactFill &&
-                   static_cast<double>(GetMaxLengthFromProbabilities(table)) == remaining;
-        };
-        const bool isAccepted =
-            !table.empty() &&
-            (isVaried || (isShortest ? options.mAcceptAtMinHistory : fillsExactly()));
-        if (isAccepted) {
+        const double ratio = entropy / (maxEntropy + kNotZero);
+        if (IsAccepted(table, ratio, remaining, isShortest, options)) {
             const MarkovIterator chosen = ChooseFromProbabilities(table);
             sequence.Append(
                 {table.at(chosen), entropy / maxEntropy, maxEntropy, history.size(), chosen});

@@ -7,6 +7,14 @@ namespace brindle {
 
 std::vector<std::uint64_t> CPassageStarts::StartsOf(std::span<const CPassageForm> forms) {
     mStarts.clear();
+    BeginWalks(forms);
+    while (!mWalks.empty()) GoOn();
+    for (const TPlace start : mStarts) mTaken.Erase(start);
+    std::sort(mStarts.begin(), mStarts.end());
+    return {mStarts.begin(), mStarts.end()};
+}
+
+void CPassageStarts::BeginWalks(std::span<const CPassageForm> forms) {
     mWalks.clear();
     for (const CPassageForm& form : forms) {
         CFormWalk walk{COccurrences(mSuffixes, form.mRanks, form.mLength)};
@@ -14,22 +22,20 @@ std::vector<std::uint64_t> CPassageStarts::StartsOf(std::span<const CPassageForm
         if (walk.mNext != kNoPlace) mWalks.push_back(walk);
     }
     std::make_heap(mWalks.begin(), mWalks.end(), ComesLater);
-    while (!mWalks.empty()) {
-        std::pop_heap(mWalks.begin(), mWalks.end(), ComesLater);
-        CFormWalk& walk = mWalks.back();
-        const TPlace place = walk.mNext;
-        // Another walk may have taken what this one was to take.
-        if (walk.mStage != Stage_First && mWalks.size() > 1) FindNext(walk, place);
-        if (walk.mNext == place) Visit(walk);
-        if (walk.mNext == kNoPlace) {
-            mWalks.pop_back();
-        } else {
-            std::push_heap(mWalks.begin(), mWalks.end(), ComesLater);
-        }
+}
+
+void CPassageStarts::GoOn() {
+    std::pop_heap(mWalks.begin(), mWalks.end(), ComesLater);
+    CFormWalk& walk = mWalks.back();
+    const TPlace place = walk.mNext;
+    // Another walk may have taken what this one was to take.
+    if (walk.mStage != Stage_First && mWalks.size() > 1) FindNext(walk, place);
+    if (walk.mNext == place) Visit(walk);
+    if (walk.mNext == kNoPlace) {
+        mWalks.pop_back();
+    } else {
+        std::push_heap(mWalks.begin(), mWalks.end(), ComesLater);
     }
-    for (const TPlace start : mStarts) mTaken.Erase(start);
-    std::sort(mStarts.begin(), mStarts.end());
-    return {mStarts.begin(), mStarts.end()};
 }
 
 void CPassageStarts::Visit(CFormWalk& walk) {

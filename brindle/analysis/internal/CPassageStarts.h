@@ -52,6 +52,9 @@ private:
 
     static bool ComesLater(const CFormWalk& a, const CFormWalk& b) { return a.mNext > b.mNext; }
 
+    void BeginWalks(std::span<const CPassageForm> forms);
+    /// A step of the walk whose next occurrence stands before those of all others.
+    void GoOn();
     void Visit(CFormWalk& walk);
     void FindNext(CFormWalk& walk, TPlace place) const;
     [[nodiscard]] TPlace NextToTakeItself(COccurrences& occurrences, TPlace place) const;

@@ -11,8 +11,6 @@ namespace brindle {
 
 using namespace LibraryFile;
 
-// String field
-
 namespace {
 
 /// The text as it stands in a file; empty if there is none, or none that can be written.
@@ -66,22 +64,14 @@ void CWriter::Bytes(std::string_view bytes) {
     mWritten += bytes.size();
 }
 
-THeadFault LibraryFile::ReadHead(std::string_view bytes, CLibraryHead& head) {
-    if (bytes.size() < kHeaderSize || bytes.substr(0, kMagic.size()) != kMagic) {
-        return THeadFault::NoLibrary;
-    }
-    head.mIsReadOnly = (ByteAt(bytes, kReadOnlyAt) & 1) != 0;
-    bytes.remove_prefix(kHeaderSize);
-    if (bytes.size() < kChunkSizeSize) return THeadFault::NoTuningChunk;
-    const std::size_t chunkSize = Number32At(bytes, kChunkSizeAt);
-    if (chunkSize <= kStringCountAt || chunkSize > bytes.size()) return THeadFault::NoTuningChunk;
-    head.mChordChunks = bytes.substr(chunkSize);
-    const std::string_view chunk = bytes.substr(0, chunkSize);
+namespace {
 
+/// Reads the strings and the names of a whole tuning chunk.
+THeadFault ReadTuningChunk(std::string_view chunk, CLibraryHead& head) {
     // The body must hold what it says itself and what the count of strings asks for.
     const std::size_t bodySize = ByteAt(chunk, kBodySizeAt);
     const std::size_t strings = (ByteAt(chunk, kStringCountAt) & 15) + 1;
-    if (std::max(bodySize, strings + kTuningBodySize) > chunkSize - kChunkSizeSize) {
+    if (std::max(bodySize, strings + kTuningBodySize) > chunk.size() - kChunkSizeSize) {
         return THeadFault::NoTuningChunk;
     }
     if (bodySize == 0) return THeadFault::Damaged;
@@ -94,6 +84,21 @@ THeadFault LibraryFile::ReadHead(std::string_view bytes, CLibraryHead& head) {
     head.mTuningName = std::move(*tuningName);
     head.mLibraryName = TakeStringField(names);
     return THeadFault::None;
+}
+
+}  // namespace
+
+THeadFault LibraryFile::ReadHead(std::string_view bytes, CLibraryHead& head) {
+    if (bytes.size() < kHeaderSize || bytes.substr(0, kMagic.size()) != kMagic) {
+        return THeadFault::NoLibrary;
+    }
+    head.mIsReadOnly = (ByteAt(bytes, kReadOnlyAt) & 1) != 0;
+    bytes.remove_prefix(kHeaderSize);
+    if (bytes.size() < kChunkSizeSize) return THeadFault::NoTuningChunk;
+    const std::size_t chunkSize = Number32At(bytes, kChunkSizeAt);
+    if (chunkSize <= kStringCountAt || chunkSize > bytes.size()) return THeadFault::NoTuningChunk;
+    head.mChordChunks = bytes.substr(chunkSize);
+    return ReadTuningChunk(bytes.substr(0, chunkSize), head);
 }
 
 }  // namespace brindle
