@@ -3,8 +3,11 @@
 
 /// Music theory and harmony analysis. What holds wherever nothing else is said:
 ///
-/// - A key is a pitch class, 0 (C) to 11 (B), and 15 is none. A note is a MIDI number: 60 is
-///   middle C, -1 is none. CKeyEnh and CNote add the spelling: C sharp and D flat are one key.
+/// - A key number (`KeyNr`) is a pitch class, 0 (C) to 11 (B), and 15 is none. A note is a MIDI
+///   number: 60 is middle C, -1 is none. CKeyEnh and CNote add the spelling: C sharp and D flat are
+///   enharmonic, one key number with two names.
+/// - The key that a song is in is a tonality, a tonic with a mode: CSignKeyLite. Where it is a
+///   number, major keys are 0 to 11 by their tonics, and minor ones 12 to 23.
 /// - Intervals are semitones, negative for down; `kIntvlUndef` is none. Degrees count from 0.
 /// - Positions and lengths in time are beats; `kPosUndef` is none.
 /// - An undefined value is no error: what is asked of it is undefined, too.

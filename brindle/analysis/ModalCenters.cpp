@@ -17,8 +17,8 @@ constexpr TCenters kAll = (TCenters{1} << kCount) - 1;
 
 /// The twelve lowest bits moved up by 0 to 11 places, round the octave.
 constexpr TPitchClasses RotatedUp(std::uint64_t mask, int places) {
-    const auto keys = static_cast<std::uint32_t>(mask & kAllPitchClasses);
-    return (keys << places | keys >> (12 - places)) & kAllPitchClasses;
+    const auto pitchClasses = static_cast<TPitchClasses>(mask & kAllPitchClasses);
+    return (pitchClasses << places | pitchClasses >> (12 - places)) & kAllPitchClasses;
 }
 
 /// For each pitch class the centers whose scale holds it.
@@ -27,10 +27,10 @@ constexpr auto kCentersHoldingPitchClass = [] {
     for (int center = 0; center < 12; ++center) {
         const TPitchClasses major = RotatedUp(kSemitonesMajor.Mask(), center);
         const TPitchClasses minor = RotatedUp(kSemitonesNaturalMinor.Mask(), center);
-        for (std::size_t key = 0; key < 12; ++key) {
+        for (std::size_t pitchClass = 0; pitchClass < 12; ++pitchClass) {
             const TCenters bit = TCenters{1} << center;
-            if (major >> key & 1) holding[key] |= bit;
-            if (minor >> key & 1) holding[key] |= bit << kMinorOffset;
+            if (major >> pitchClass & 1) holding[pitchClass] |= bit;
+            if (minor >> pitchClass & 1) holding[pitchClass] |= bit << kMinorOffset;
         }
     }
     return holding;
@@ -80,16 +80,16 @@ TPitchClasses PitchClassesOf(const CChordLite& chord) {
 }
 
 int PlaceOf(const CHarmCenterLite& center) {
-    const int key = FoldIntoOctave(center.mRootKeyEnh.mKeyNr);
-    if (center.mSemitones == kSemitonesMajor) return key;
-    if (center.mSemitones == kSemitonesNaturalMinor) return key + kMinorOffset;
+    const int tonic = FoldIntoOctave(center.mRootKeyEnh.mKeyNr);
+    if (center.mSemitones == kSemitonesMajor) return tonic;
+    if (center.mSemitones == kSemitonesNaturalMinor) return tonic + kMinorOffset;
     return kNoScale;
 }
 
-TCenters CentersHolding(TPitchClasses keys) {
+TCenters CentersHolding(TPitchClasses pitchClasses) {
     TCenters centers = kAll;
-    for (; keys != 0; keys &= keys - 1) {
-        centers &= kCentersHoldingPitchClass[static_cast<std::size_t>(std::countr_zero(keys))];
+    for (TPitchClasses left = pitchClasses; left != 0; left &= left - 1) {
+        centers &= kCentersHoldingPitchClass[static_cast<std::size_t>(std::countr_zero(left))];
     }
     return centers;
 }

@@ -29,7 +29,7 @@ inline constexpr int kNoScale = 24;
 /// How many places there are.
 inline constexpr int kCount = 25;
 
-/// The set of the intervals above a root as pitch classes; key numbers outside 0 to 11 are reduced.
+/// The set of the intervals above a root as pitch classes; a root outside 0 to 11 is reduced.
 [[nodiscard]] TPitchClasses PitchClassesAbove(int rootKeyNr, CSemitones semitones);
 /// The pitch classes that sound: the tones, and the bass, or else the root. None for an undefined
 /// chord.
@@ -39,7 +39,7 @@ inline constexpr int kCount = 25;
 [[nodiscard]] int PlaceOf(const CHarmCenterLite& center);
 
 /// The centers whose scale holds all the pitch classes.
-[[nodiscard]] TCenters CentersHolding(TPitchClasses keys);
+[[nodiscard]] TCenters CentersHolding(TPitchClasses pitchClasses);
 /// The centers that tolerate the chord, as ScaleLite::ChordIsCompatibleWithScale tells.
 [[nodiscard]] TCenters CentersTolerating(const CChordLite& chord);
 /// The centers that the chord belongs to as to a key, as CChordHeavy::IsInSignKeyRegardlessOfEnh

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/chords/NameNotes.h"
 #include "brindle/chords/WriteChordSymbol.h"
+#include "brindle/platform/Ascii.h"
 #include "brindle/theory/CChordNamePrefs.h"
 #include "brindle/theory/KeyNames.h"
 
@@ -41,12 +42,9 @@ bool IsMinor(std::string_view suffix) {
 }
 
 std::string RootInStyle(const CNamedChord& chord, const CChordNamePrefs& prefs) {
-    constexpr int capitalToSmall = 'a' - 'A';
     std::string root = KeyNrAndEnhToName(chord.mRoot.mKeyNr, chord.mRoot.mEnh, prefs);
     const bool isSmall = prefs.mLowerCaseMinorRoot && IsMinor(chord.mSuffix);
-    if (isSmall && !root.empty() && root[0] >= 'A' && root[0] <= 'Z') {
-        root[0] = static_cast<char>(root[0] + capitalToSmall);
-    }
+    if (isSmall && !root.empty()) root[0] = Ascii::ToLower(root[0]);
     return root;
 }
 

@@ -5,6 +5,7 @@
 #include "brindle/analysis/ReadRomanText.h"
 #include "brindle/chords/WriteChordSymbol.h"
 #include "brindle/platform/Ascii.h"
+#include "brindle/platform/Utf8.h"
 #include "brindle/present/JsonValues.h"
 #include "brindle/present/ShownNames.h"
 #include "brindle/present/ShownText.h"
@@ -66,8 +67,7 @@ public:
 private:
     void Step() {
         const bool isBreak = mText[mOffset++] == '\n';
-        while (mOffset < mText.size() &&
-               (static_cast<unsigned char>(mText[mOffset]) & 0xC0U) == 0x80U) {
+        while (mOffset < mText.size() && !BeginsUtf8Character(mText[mOffset])) {
             ++mOffset;
         }
         mLine += isBreak ? 1 : 0;

@@ -6,6 +6,7 @@
 #include "brindle/song/internal/LineKinds.h"
 #include "brindle/song/internal/SongReaders.h"
 #include "brindle/song/internal/SongWords.h"
+#include "brindle/theory/KeyIntervals.h"
 
 #include <algorithm>
 #include <array>
@@ -70,8 +71,7 @@ bool IsKeyMark(std::string_view word) {
     word.remove_suffix(1);
     constexpr auto lastWords = std::to_array<std::string_view>({"flat", "sharp", "major", "minor"});
     if (std::find(lastWords.begin(), lastWords.end(), word) != lastWords.end()) return true;
-    const char letter = word[0];
-    const bool isNote = (letter >= 'A' && letter <= 'G') || (letter >= 'a' && letter <= 'g');
+    const bool isNote = KeyNrOfLetter(word[0]) != kKeyNrUndef;
     return isNote && word.substr(1).find_first_not_of("#b-") == word.npos;
 }
 

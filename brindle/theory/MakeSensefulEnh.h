@@ -11,8 +11,8 @@
 
 namespace brindle {
 
-// Which spellings of a key can be written down, and how one that cannot is repaired. A key number
-// is first reduced into 0 to 11, unless it is 15, the undefined key.
+// Which spellings of a key can be written down, and which enharmonic name stands for one that
+// cannot. A key number is first reduced into 0 to 11, unless it is 15, the undefined key.
 
 /// The rule by which MakeSensefulEnhForKeyNr repairs; each selects the function of its name.
 enum TMakeSensefulEnh : std::int32_t {

@@ -36,8 +36,8 @@ void WriteOwnNumeral(const CChordInSong& chord, CChordReading& reading);
 /// Writes a prefix and the sign of the chord, and behind a slash what it serves.
 void WriteServingNumeral(const CChordInSong& chord, std::string_view prefix,
                          CChordReading& reading);
-/// Makes the chord one that is applied to the degree `target`, such as V7/ii, and leads it to the
-/// chord `goal` on it, if there is one.
+/// Makes the chord one that is applied to the degree `target`, as the secondary dominant V7/ii is,
+/// and leads it to the chord `goal` on it, if there is one.
 void Apply(const CChordInSong& chord, std::string_view prefix, int target, std::ptrdiff_t goal,
            CChordName& name);
 

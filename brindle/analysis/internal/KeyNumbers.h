@@ -7,7 +7,8 @@
 
 namespace brindle {
 
-// A key is a number here: the tonic for major, the tonic + 12 for minor.
+// A key is a tonality as a number here: the pitch class of its tonic for major, and 12 more for
+// minor. Pitch classes are called root, bass or tonic.
 inline constexpr int kKeyCount = 24;
 
 [[nodiscard]] constexpr int ModeOfKey(int key) {

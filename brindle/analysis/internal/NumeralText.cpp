@@ -2,6 +2,7 @@
 #include "brindle/analysis/internal/NumeralText.h"
 
 #include "brindle/analysis/internal/KeyNumbers.h"
+#include "brindle/platform/Ascii.h"
 
 namespace brindle {
 namespace {
@@ -58,7 +59,7 @@ void AppendAccidentals(std::string& text, int accidental) {
 void AppendDegree(std::string& text, const CNumeralDegree& degree, bool isSmall) {
     AppendAccidentals(text, degree.mAccidental);
     for (const char c : kRomanNumbers[static_cast<std::size_t>(degree.mNumber - 1)]) {
-        text += isSmall ? static_cast<char>(c - 'A' + 'a') : c;
+        text += isSmall ? Ascii::ToLower(c) : c;
     }
 }
 

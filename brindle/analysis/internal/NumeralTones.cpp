@@ -33,7 +33,7 @@ int TakeAccidentals(std::string_view& text) {
 // 1 to 19, 0 for no number.
 int TakeNumber(std::string_view& text) {
     const auto digitAt = [&](std::size_t ix) {
-        return ix < text.size() && text[ix] >= '0' && text[ix] <= '9' ? text[ix] - '0' : -1;
+        return ix < text.size() && Ascii::IsDigit(text[ix]) ? text[ix] - '0' : -1;
     };
     const int first = digitAt(0);
     if (first < 1) return 0;
@@ -98,7 +98,7 @@ const CNumeralFigure* FigureOf(std::string_view text) {
     std::size_t count = 0;
     for (const char c : text) {
         if (c == '/') continue;
-        const bool isOfFigure = (c >= '0' && c <= '9') || c == '-';
+        const bool isOfFigure = Ascii::IsDigit(c) || c == '-';
         if (!isOfFigure || count == longest) return nullptr;
         digits[count++] = c;
     }

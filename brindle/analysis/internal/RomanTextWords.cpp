@@ -117,7 +117,7 @@ std::optional<CMeasureRange> TakeMeasures(std::string_view& text) {
     if (Ascii::TakePrefix(rest, "var")) {
         range.mIsVariant = true;
         while (!rest.empty() && Ascii::IsDigit(rest.front())) rest.remove_prefix(1);
-    } else if (!rest.empty() && rest.front() >= 'a' && rest.front() <= 'z') {
+    } else if (!rest.empty() && Ascii::IsSmallLetter(rest.front())) {
         range.mHasLetter = true;
         rest.remove_prefix(1);
     }

@@ -13,7 +13,7 @@
 
 namespace brindle {
 
-/// The keys of a song as numbers.
+/// The keys of a song, as the numbers of KeyNumbers.h.
 struct CSongKeys {
     std::array<double, kKeyCount> mScores{};
     /// By the scores alone.

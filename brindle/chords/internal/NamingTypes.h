@@ -3,6 +3,7 @@
 
 #include "brindle/chords/ChordDegree.h"
 #include "brindle/chords/internal/NamingTables.h"
+#include "brindle/platform/Ascii.h"
 
 #include <array>
 #include <bit>
@@ -52,7 +53,7 @@ struct CNamingType {
         if (letter == '(') isOptional = true;
         if (letter == 'b') --degree.mSigns;
         if (letter == '#') ++degree.mSigns;
-        if (letter >= '0' && letter <= '9') degree.mNumber = degree.mNumber * 10 + letter - '0';
+        if (Ascii::IsDigit(letter)) degree.mNumber = degree.mNumber * 10 + letter - '0';
         if (letter == ')') {
             take();
             isOptional = false;

@@ -5,6 +5,7 @@
 #include "brindle/musicxml/HarmonyKinds.h"
 #include "brindle/musicxml/TMusicXMLHarmony.h"
 #include "brindle/musicxml/internal/KindRows.h"
+#include "brindle/platform/Ascii.h"
 #include "brindle/theory/CChordNamePrefs.h"
 
 #include <algorithm>
@@ -160,7 +161,7 @@ std::string FoldedKindWord(std::string_view word) {
     std::string folded(word);
     std::transform(folded.begin(), folded.end(), folded.begin(), [](char c) {
         if (c == ' ' || c == '_') return '-';
-        return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
+        return Ascii::ToLower(c);
     });
     return folded;
 }

@@ -1,4 +1,5 @@
 // SPDX-License-Identifier: MIT
+#include "brindle/platform/Ascii.h"
 #include "brindle/song/internal/PlayWords.h"
 #include "brindle/song/internal/SongTokens.h"
 #include "brindle/song/internal/SongWords.h"
@@ -12,10 +13,6 @@ namespace {
 constexpr int kLastEnding = 63;
 /// A chord of several words is not longer than this.
 constexpr std::size_t kLongestJoined = 80;
-
-bool IsCapital(char c) {
-    return c >= 'A' && c <= 'Z';
-}
 
 /// Cuts one line into sections, bar lines, endings and chords.
 class CChordLine {
@@ -62,7 +59,7 @@ private:
         const std::string_view second = TakeWordOf(rest);
         if (second.empty()) return !first.empty();
         // `A section:`
-        if (first.size() == 1 && IsCapital(first[0]) && rest.empty()) return true;
+        if (first.size() == 1 && Ascii::IsCapital(first[0]) && rest.empty()) return true;
         rest = name;
         for (std::string_view word = TakeWordOf(rest); !rest.empty(); word = TakeWordOf(rest)) {
             if (ReadChordText(word).mKind == TChordText_NotUnderstood) return true;
@@ -195,8 +192,8 @@ private:
 
     /// `(b9)` and `b9` could be chords on B; behind a chord on a capital they belong to it.
     [[nodiscard]] bool LooksLikeAnOption(std::string_view word) const {
-        if (mChordBefore.empty() || !IsCapital(mChordBefore[0])) return false;
-        if (word[0] == '(') return word.size() > 1 && !IsCapital(word[1]);
+        if (mChordBefore.empty() || !Ascii::IsCapital(mChordBefore[0])) return false;
+        if (word[0] == '(') return word.size() > 1 && !Ascii::IsCapital(word[1]);
         return word.size() > 1 && word[0] == 'b' && IsDigit(word[1]) && word[1] != '7';
     }
 

@@ -2,6 +2,7 @@
 #include "brindle/song/internal/LineKinds.h"
 
 #include "brindle/chords/ReadChordText.h"
+#include "brindle/chords/internal/CTextScan.h"
 #include "brindle/platform/Ascii.h"
 #include "brindle/song/internal/PlayWords.h"
 #include "brindle/song/internal/SongWords.h"
@@ -47,7 +48,7 @@ bool IsChordWord(std::string_view word) {
     if (word.size() > 2 && word.front() == '(' && word.back() == ')') {
         word = word.substr(1, word.size() - 2);
     }
-    const bool begins = (word[0] >= 'A' && word[0] <= 'H') || word[0] == 'N' || word[0] == '(';
+    const bool begins = ChordText::IsCapitalNote(word[0]) || word[0] == 'N' || word[0] == '(';
     return begins && ReadChordText(word).mKind != TChordText_NotUnderstood;
 }
 
@@ -56,7 +57,7 @@ bool IsLyricWord(std::string_view word) {
     const bool hasLettersAlone = std::all_of(word.begin(), word.end(), [](char c) {
         return IsLetter(c) || std::string_view("'’,.!?-\";").find(c) != std::string_view::npos;
     });
-    return hasLettersAlone && (word.size() > 2 || !(word[0] >= 'A' && word[0] <= 'H'));
+    return hasLettersAlone && (word.size() > 2 || !ChordText::IsCapitalNote(word[0]));
 }
 
 bool IsTablature(std::string_view line) {
@@ -159,8 +160,9 @@ bool HasChordInBrackets(std::string_view text) {
             const std::string_view inside = line.substr(begin + 1, end - begin - 1);
             const bool isWholeLine = inside.size() + 2 == line.size();
             const bool isName = isWholeLine && inside.size() == 1;
-            if (line[end] == ']' && !inside.empty() && !isName && inside[0] >= 'A' &&
-                inside[0] <= 'H' && ReadChordText(inside).mKind == TChordText_Chord) {
+            if (line[end] == ']' && !inside.empty() && !isName &&
+                ChordText::IsCapitalNote(inside[0]) &&
+                ReadChordText(inside).mKind == TChordText_Chord) {
                 return true;
             }
             begin = line[end] == '[' ? end : line.find('[', end);

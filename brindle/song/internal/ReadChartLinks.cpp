@@ -1,4 +1,5 @@
 // SPDX-License-Identifier: MIT
+#include "brindle/platform/Utf8.h"
 #include "brindle/song/internal/ChartLinks.h"
 #include "brindle/song/internal/SongReaders.h"
 #include "brindle/song/internal/StatedKey.h"
@@ -20,7 +21,7 @@ public:
             if (mText[mOffset] == '\n') {
                 ++mLine;
                 mColumn = 1;
-            } else if ((static_cast<unsigned char>(mText[mOffset]) & 0xC0) != 0x80) {
+            } else if (BeginsUtf8Character(mText[mOffset])) {
                 ++mColumn;
             }
         }
