@@ -219,6 +219,16 @@ std::string MissingWord(const std::string& message) {
     return Message("{option} is required", {{"option", option}});
 }
 
+// The message of CLI11 for a value that it cannot read, which is always a number.
+std::string NoNumber(const std::string& message) {
+    constexpr std::string_view head = "Could not convert: ";
+    const std::size_t equals = message.find(" = ");
+    if (!message.starts_with(head) || equals == message.npos) return message;
+    return Message("{option}: {word} is no number",
+                   {{"option", message.substr(head.size(), equals - head.size())},
+                    {"word", message.substr(equals + 3)}});
+}
+
 // CLI11 asks for help and version by exceptions, too; these end well.
 TStatus Report(const CLI::App& program, const CLI::ParseError& error, const TTypedWords& words) {
     if (error.get_exit_code() == static_cast<int>(CLI::ExitCodes::Success)) {
@@ -236,6 +246,9 @@ TStatus Report(const CLI::App& program, const CLI::ParseError& error, const TTyp
         return error.get_exit_code() == static_cast<int>(code);
     };
     if (isOfKind(CLI::ExitCodes::ExtrasError)) return FailForUnknown(app, words, error.what());
+    if (isOfKind(CLI::ExitCodes::ConversionError)) {
+        return FailWithHelp(app, NoNumber(error.what()));
+    }
     if (isOfKind(CLI::ExitCodes::RequiredError)) {
         return FailWithHelp(app, MissingWord(error.what()));
     }
