@@ -2,6 +2,7 @@
 #include "cli/CCommand.h"
 
 #include "cli/DidYouMean.h"
+#include "cli/Message.h"
 
 #include "brindle/chords/ReadChordText.h"
 #include "brindle/platform/Ascii.h"
@@ -79,9 +80,12 @@ std::string CallOf(const CLI::App& app) {
 }
 
 TStatus FailWithHelp(const CLI::App& app, std::string_view message) {
-    const char* const see = message.ends_with('?') ? " See" : "; see";
+    const std::string problem = Printable(message);
+    const std::string call = CallOf(app) + " --help";
     return Fail(TStatus::BadUsage,
-                fmt::format("{}{} {} --help", Printable(message), see, CallOf(app)));
+                message.ends_with('?')
+                    ? Message("{problem} See {call}", {{"problem", problem}, {"call", call}})
+                    : Message("{problem}; see {call}", {{"problem", problem}, {"call", call}}));
 }
 
 /// The words of the command line behind the program's name.
@@ -103,16 +107,17 @@ std::string UnknownOption(const CLI::App& app, const TTypedWords& words) {
 // A letter is short for the only option that begins with it.
 std::string MeantOption(const CLI::App& app, const std::string& name) {
     std::vector<std::string> names = OptionNames(app);
-    if (name.starts_with("--")) return DidYouMean(name, names);
+    if (name.starts_with("--")) return NearestWord(name, names);
     std::erase_if(names, [&](const std::string& n) { return n[2] != Ascii::ToLower(name[1]); });
-    return names.size() == 1 ? DidYouMean(names.front(), names) : std::string();
+    return names.size() == 1 ? names.front() : std::string();
 }
 
 TStatus FailForUnknown(const CLI::App& app, const TTypedWords& words, const std::string& message) {
     const std::string name = UnknownOption(app, words);
     if (name.empty()) return FailWithHelp(app, message);
-    return FailWithHelp(
-        app, fmt::format("{} is no option of {}{}", name, CallOf(app), MeantOption(app, name)));
+    const std::string problem =
+        Message("{option} is no option of {command}", {{"option", name}, {"command", CallOf(app)}});
+    return FailWithHelp(app, WithMeant(problem, MeantOption(app, name)));
 }
 
 // How a song in the place of a command is read, which is what somebody types who has not read the
@@ -121,27 +126,31 @@ std::string HowToRead(const std::string& typed) {
     std::error_code error;
     const std::string shown = Printable(typed);
     if (std::filesystem::is_regular_file(typed, error)) {
-        return fmt::format("{} is a file and no subcommand; brindle analyse {} reads it as a song",
-                           shown, shown);
+        return Message("{file} is a file and no subcommand; {call} reads it as a song",
+                       {{"file", shown}, {"call", "brindle analyse " + shown}});
     }
-    if (LooksLikeFileName(typed)) return shown + " is no subcommand, and there is no such file";
+    if (LooksLikeFileName(typed)) {
+        return Message("{word} is no subcommand, and there is no such file", {{"word", shown}});
+    }
     const std::string first = typed.substr(0, typed.find_first_of(Ascii::kWhiteSpace));
     if (ReadChordText(first).mKind != TChordText_Chord) return {};
-    return fmt::format("{} is no subcommand; brindle analyse \"{}\" reads it as a song", shown,
-                       shown);
+    return Message("{chords} is no subcommand; {call} reads it as a song",
+                   {{"chords", shown}, {"call", "brindle analyse \"" + shown + '"'}});
 }
 
 TStatus FailForCommand(const CLI::App& app, const std::string& typed) {
     const auto names = CommandNames(app);
     const std::string how = app.get_parent() == nullptr ? HowToRead(typed) : std::string();
     if (!how.empty()) return Fail(TStatus::BadUsage, how);
+    const std::string shown = Printable(typed);
     const std::string nearest = NearestWord(typed, names);
     if (!nearest.empty()) {
-        return FailWithHelp(app,
-                            fmt::format("{} is no subcommand, did you mean {}?", typed, nearest));
+        const std::string problem = Message("{word} is no subcommand", {{"word", shown}});
+        return FailWithHelp(app, WithMeant(problem, nearest));
     }
-    return Fail(TStatus::BadUsage, fmt::format("{} is no subcommand, there are: {}",
-                                               Printable(typed), fmt::join(names, ", ")));
+    const std::string all = fmt::format("{}", fmt::join(names, ", "));
+    return Fail(TStatus::BadUsage, Message("{word} is no subcommand, there are: {commands}",
+                                           {{"word", shown}, {"commands", all}}));
 }
 
 // The words of a command line, with those of `help COMMAND` in the order of `COMMAND --help`, which
@@ -198,7 +207,26 @@ std::string MissingValue(const CLI::App& app, const std::string& message) {
     }
     const CLI::Option* const option = app.get_option_no_throw(name);
     if (option == nullptr) return message;
-    return fmt::format("{} needs a value behind it: {} {}", name, name, ValueNameOf(*option));
+    return Message("{option} needs a value behind it: {call}",
+                   {{"option", name}, {"call", name + ' ' + ValueNameOf(*option)}});
+}
+
+// The message of CLI11 for an argument or an option that was not told.
+std::string MissingWord(const std::string& message) {
+    constexpr std::string_view end = " is required";
+    if (!message.ends_with(end)) return message;
+    const std::string option = message.substr(0, message.size() - end.size());
+    return Message("{option} is required", {{"option", option}});
+}
+
+// The message of CLI11 for a value that it cannot read, which is always a number.
+std::string NoNumber(const std::string& message) {
+    constexpr std::string_view head = "Could not convert: ";
+    const std::size_t equals = message.find(" = ");
+    if (!message.starts_with(head) || equals == message.npos) return message;
+    return Message("{option}: {word} is no number",
+                   {{"option", message.substr(head.size(), equals - head.size())},
+                    {"word", message.substr(equals + 3)}});
 }
 
 // CLI11 asks for help and version by exceptions, too; these end well.
@@ -212,12 +240,18 @@ TStatus Report(const CLI::App& program, const CLI::ParseError& error, const TTyp
     if (!CommandNames(app).empty()) {
         const std::string typed = WordBehind(app, words);
         if (!typed.empty()) return FailForCommand(app, typed);
-        return FailForUnknown(app, words, error.what());
+        return FailForUnknown(app, words, Message("A subcommand is required"));
     }
     const auto isOfKind = [&](CLI::ExitCodes code) {
         return error.get_exit_code() == static_cast<int>(code);
     };
     if (isOfKind(CLI::ExitCodes::ExtrasError)) return FailForUnknown(app, words, error.what());
+    if (isOfKind(CLI::ExitCodes::ConversionError)) {
+        return FailWithHelp(app, NoNumber(error.what()));
+    }
+    if (isOfKind(CLI::ExitCodes::RequiredError)) {
+        return FailWithHelp(app, MissingWord(error.what()));
+    }
     if (isOfKind(CLI::ExitCodes::ArgumentMismatch)) {
         return FailWithHelp(app, MissingValue(app, error.what()));
     }
@@ -231,8 +265,10 @@ CLI::Validator OneOf(const std::vector<std::string>& choices) {
         if (std::find(choices.begin(), choices.end(), typed) != choices.end()) {
             return std::string();
         }
-        return fmt::format("{} is none of {}{}", typed, fmt::join(choices, ", "),
-                           DidYouMean(typed, choices));
+        const std::string all = fmt::format("{}", fmt::join(choices, ", "));
+        return WithMeant(
+            Message("{word} is none of {choices}", {{"word", typed}, {"choices", all}}),
+            NearestWord(typed, choices));
     });
 }
 

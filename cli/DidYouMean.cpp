@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "cli/DidYouMean.h"
 
+#include "cli/Message.h"
+
 #include "brindle/platform/Ascii.h"
 
 #include <algorithm>
@@ -54,9 +56,9 @@ std::string NearestWord(std::string_view typed, const std::vector<std::string>& 
     return nearest;
 }
 
-std::string DidYouMean(std::string_view typed, const std::vector<std::string>& words) {
-    const std::string nearest = NearestWord(typed, words);
-    return nearest.empty() ? "" : ", did you mean " + nearest + "?";
+std::string WithMeant(const std::string& problem, const std::string& meant) {
+    if (meant.empty()) return problem;
+    return Message("{problem}, did you mean {meant}?", {{"problem", problem}, {"meant", meant}});
 }
 
 }  // namespace brindle::cli

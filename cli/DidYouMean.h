@@ -13,7 +13,7 @@ namespace brindle::cli {
 [[nodiscard]] std::string NearestWord(std::string_view typed,
                                       const std::vector<std::string>& words);
 
-/// ", did you mean WORD?", or nothing if no word is near.
-[[nodiscard]] std::string DidYouMean(std::string_view typed, const std::vector<std::string>& words);
+/// A problem with the question whether a word was meant; the problem alone without one.
+[[nodiscard]] std::string WithMeant(const std::string& problem, const std::string& meant);
 
 }  // namespace brindle::cli

@@ -4,6 +4,7 @@
 #include "cli/CommandLine.h"
 #include "cli/DidYouMean.h"
 #include "cli/Input.h"
+#include "cli/Message.h"
 
 #include "brindle/guitarchords/Tunings.h"
 #include "brindle/present/ChordGrid.h"
@@ -60,12 +61,14 @@ std::optional<GChShortTuning> ReadTuningOption(const std::string& text) {
     if (tuning) return tuning;
     std::vector<std::string> names;
     for (const CNamedTuning& named : NamedTunings()) names.emplace_back(named.mName);
-    const std::string meant = DidYouMean(text, names);
+    const std::string meant = NearestWord(text, names);
+    const std::string typed = Printable(text);
     Fail(TStatus::BadUsage,
-         fmt::format("{} is no tuning{}", Printable(text),
-                     !meant.empty() ? meant
-                                    : ": a name, as drop-d or ukulele, letters from the lowest "
-                                      "string, as in DADGAD, or pitches, as in E2A2D3G3B3E4"));
+         meant.empty()
+             ? Message("{word} is no tuning: a name, as drop-d or ukulele, letters from the lowest "
+                       "string, as in DADGAD, or pitches, as in E2A2D3G3B3E4",
+                       {{"word", typed}})
+             : WithMeant(Message("{word} is no tuning", {{"word", typed}}), meant));
     return std::nullopt;
 }
 

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "cli/Input.h"
 
+#include "cli/Message.h"
+
 #include "brindle/analysis/ReadNumerals.h"
 #include "brindle/chords/ReadChordText.h"
 #include "brindle/platform/Ascii.h"
@@ -30,7 +32,8 @@ struct CCloser {
 };
 
 std::optional<std::string> Unreadable(const std::string& name, std::string_view reason) {
-    Fail(TStatus::BadInput, fmt::format("{} cannot be read: {}", InputName(name), reason));
+    Fail(TStatus::BadInput, Message("{name} cannot be read: {reason}",
+                                    {{"name", InputName(name)}, {"reason", reason}}));
     return std::nullopt;
 }
 
@@ -104,7 +107,8 @@ std::optional<std::string> ReadInputs(const std::vector<std::string>& names) {
         if (!text) return std::nullopt;
         if (IsScore(SongFormatOf(*text))) {
             Fail(TStatus::BadInput,
-                 InputName(name) + " is a score; brindle harmonies lists its chords");
+                 Message("{name} is a score; {call} lists its chords",
+                         {{"name", InputName(name)}, {"call", "brindle harmonies"}}));
             return std::nullopt;
         }
         all += *text + '\n';
@@ -132,8 +136,8 @@ std::optional<std::string> ReadInput(const std::string& path, std::size_t mostBy
     if (path == "-") return ReadAll(stdin, path, mostBytes);
     if (IsFolder(path)) {
         const std::string name = Printable(path);
-        Fail(TStatus::BadInput,
-             fmt::format("{} is a folder; brindle corpus {} reads the songs in it", name, name));
+        Fail(TStatus::BadInput, Message("{name} is a folder; {call} reads the songs in it",
+                                        {{"name", name}, {"call", "brindle corpus " + name}}));
         return std::nullopt;
     }
     const std::unique_ptr<std::FILE, CCloser> file(std::fopen(path.c_str(), "rb"));
@@ -146,7 +150,8 @@ std::optional<std::string> ReadTextInput(const std::string& path) {
     if (!text) return std::nullopt;
     if (auto decoded = SongTextFromUtf16(*text)) return decoded;
     if (IsScore(SongFormatOf(*text)) || !HasNoText(*text)) return text;
-    Fail(TStatus::BadInput, InputName(path) + " is neither a text nor a score in MusicXML");
+    Fail(TStatus::BadInput,
+         Message("{name} is neither a text nor a score in MusicXML", {{"name", InputName(path)}}));
     return std::nullopt;
 }
 
@@ -162,7 +167,7 @@ std::optional<std::vector<std::string>> TypedLines(const std::vector<std::string
     if (!text) return std::nullopt;
     auto lines = TrimmedLines(*text);
     if (!lines.empty()) return lines;
-    Fail(TStatus::BadInput, fmt::format("{} is empty", InputName(words.front())));
+    Fail(TStatus::BadInput, Message("{name} is empty", {{"name", InputName(words.front())}}));
     return std::nullopt;
 }
 

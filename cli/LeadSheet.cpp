@@ -2,6 +2,7 @@
 #include "cli/LeadSheet.h"
 
 #include "cli/Input.h"
+#include "cli/Message.h"
 #include "cli/Output.h"
 
 #include "brindle/musicxml/ScoreContainer.h"
@@ -58,17 +59,23 @@ bool HasScoreBytes(std::string_view bytes) {
 }
 
 void TellScoreFault(std::string_view bytes, const std::string& name, std::string_view reason) {
-    const char* const head = HasScoreBytes(bytes) ? "" : " is no score in MusicXML";
-    Fail(TStatus::BadInput, fmt::format("{}{}: {}", Printable(name), head, Printable(reason)));
+    const std::string shown = Printable(name);
+    const std::string fault = Printable(reason);
+    Fail(TStatus::BadInput, HasScoreBytes(bytes)
+                                ? fmt::format("{}: {}", shown, fault)
+                                : Message("{name} is no score in MusicXML: {reason}",
+                                          {{"name", shown}, {"reason", fault}}));
 }
 
 TStatus FailWithoutChords(const CTypedSong& song) {
-    const std::string name = song.mName.empty() ? "the song" : Printable(song.mName);
-    if (!song.mIsScore) return Fail(TStatus::BadInput, name + " has no chords");
+    const std::string name = Printable(song.mName);
+    if (name.empty()) return Fail(TStatus::BadInput, Message("the song has no chords"));
+    if (!song.mIsScore) {
+        return Fail(TStatus::BadInput, Message("{name} has no chords", {{"name", name}}));
+    }
     return Fail(TStatus::BadInput,
-                fmt::format("{} has no chord symbols; brindle harmonies --from-notes names chords "
-                            "from its notes",
-                            name));
+                Message("{name} has no chord symbols; {call} names chords from its notes",
+                        {{"name", name}, {"call", "brindle harmonies --from-notes"}}));
 }
 
 std::vector<CSongSource> SongSources(const std::vector<std::string>& words) {
@@ -102,7 +109,8 @@ std::optional<CTypedSong> ReadTypedSong(const CSongSource& source) {
         HasScoreName(source.mFile) || (!source.mFile.empty() && HasScoreBytes(song.mText));
     if (IsBlank(song.mText)) {
         Fail(TStatus::BadInput,
-             fmt::format("{} is empty", song.mName.empty() ? "the song" : Printable(song.mName)));
+             song.mName.empty() ? Message("the song is empty")
+                                : Message("{name} is empty", {{"name", Printable(song.mName)}}));
         return std::nullopt;
     }
     return song;

@@ -43,7 +43,7 @@ std::optional<VariableLengthMarkovModel> ReadModel(const std::string& path) {
     VariableLengthMarkovModel model;
     Helper::VariableLengthMarkovModelFromJSONString(*text, model);
     if (model.mMaxHistoryLength == 0) {
-        return fail("is no model file; brindle markov learn --plain makes one");
+        return fail("is no model file; brindle markov learn makes one");
     }
     if (model.mMaxHistoryLength > kLongestOrder) return fail("has histories that are too long");
     if (model.mTransitionMap.empty()) return fail("is a model that has learned nothing");

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "cli/Output.h"
 
+#include "cli/Message.h"
+
 #include <fmt/format.h>
 #include <sys/ioctl.h>
 #include <unistd.h>
@@ -63,14 +65,15 @@ TStatus FailAtCharacter(TStatus status, std::string_view message, std::string_vi
 TStatus Print(std::string_view text) {
     const bool written = std::fwrite(text.data(), 1, text.size(), stdout) == text.size();
     if (written && std::fflush(stdout) == 0) return TStatus::Success;
-    return Fail(TStatus::BadInput,
-                fmt::format("the output cannot be written: {}", std::strerror(errno)));
+    return Fail(TStatus::BadInput, Message("the output cannot be written: {reason}",
+                                           {{"reason", std::strerror(errno)}}));
 }
 
 TStatus FailToWrite(const std::string& path) {
     const int reason = errno;
     return Fail(TStatus::BadInput,
-                fmt::format("{} cannot be written: {}", Printable(path), std::strerror(reason)));
+                Message("{name} cannot be written: {reason}",
+                        {{"name", Printable(path)}, {"reason", std::strerror(reason)}}));
 }
 
 CPaint PaintOfOutput() {

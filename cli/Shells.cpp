@@ -5,6 +5,7 @@
 #include "cli/Completions.h"
 #include "cli/DidYouMean.h"
 #include "cli/ManPage.h"
+#include "cli/Message.h"
 
 #include "brindle/Version.h"
 #include "brindle/platform/AtomicFile.h"
@@ -64,12 +65,14 @@ TStatus Manual(const CCommandPage& program, const CManualOptions& options) {
         }
         names.push_back(page->WordsBelow());
     }
-    std::string meant = DidYouMean(words, names);
+    std::string meant = NearestWord(words, names);
     const auto below = std::find_if(names.begin(), names.end(), [&](const std::string& command) {
         return !words.empty() && command.ends_with(' ' + words);
     });
-    if (meant.empty() && below != names.end()) meant = DidYouMean(*below, names);
-    return Fail(TStatus::BadUsage, fmt::format("there is no command {}{}", Printable(name), meant));
+    if (meant.empty() && below != names.end()) meant = *below;
+    const std::string problem =
+        Message("there is no command {command}", {{"command", Printable(name)}});
+    return Fail(TStatus::BadUsage, WithMeant(problem, meant));
 }
 
 }  // namespace

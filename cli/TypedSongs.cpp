@@ -3,6 +3,7 @@
 
 #include "cli/CCommand.h"
 #include "cli/Input.h"
+#include "cli/Message.h"
 #include "cli/Progress.h"
 
 #include "brindle/platform/JsonString.h"
@@ -57,7 +58,7 @@ std::vector<CSongSource> CTypedSongs::Sources() const {
 
 std::optional<std::string> CTypedSongs::Contradiction(TFormat format) const {
     if (mWords.empty() && mFiles.empty()) {
-        return "a song is needed: a TEXT, a file, or - for standard input";
+        return Message("a song is needed: a TEXT, a file, or - for standard input");
     }
     const bool isOfOne = format == TFormat::Svg || format == TFormat::Native;
     const std::size_t count = isOfOne ? Sources().size() : 1;

@@ -2,12 +2,11 @@
 #include "cli/TypedSymbols.h"
 
 #include "cli/Input.h"
+#include "cli/Message.h"
 #include "cli/TypedChords.h"
 
 #include "brindle/platform/Ascii.h"
 #include "brindle/song/ReadSong.h"
-
-#include <fmt/format.h>
 
 #include <algorithm>
 
@@ -44,7 +43,7 @@ std::optional<std::vector<std::string>> ReadSymbolsFrom(const std::string& input
     auto symbols =
         IsNoList(SongFormatOf(*text)) ? SymbolsOfSong(*text, InputName(input)) : SymbolsOf(*text);
     if (!symbols || !symbols->empty()) return symbols;
-    Fail(TStatus::BadInput, fmt::format("{} has no chord symbols", InputName(input)));
+    Fail(TStatus::BadInput, Message("{name} has no chord symbols", {{"name", InputName(input)}}));
     return std::nullopt;
 }
 
@@ -74,7 +73,7 @@ std::optional<std::vector<std::string>> TypedSymbols(const std::vector<std::stri
         return !Ascii::Trimmed(symbol).empty();
     });
     if (hasAny) return symbols;
-    Fail(TStatus::BadInput, "there are no chord symbols");
+    Fail(TStatus::BadInput, Message("there are no chord symbols"));
     return std::nullopt;
 }
 
