@@ -103,6 +103,32 @@ onPage("A chord is explained, on a piano and as fingerings", {}, async (opened, 
   await page.waitForSelector(".grid[aria-label='Frets x 0 2 0 1 0']");
 });
 
+onPage("Fingerings are those of the instrument, its tuning and a capo, and there are more", {}, async (opened, page) => {
+  await opened.type("C | F | C | C", 4);
+  await page.click("[data-chord='0']");
+  const shows = (frets) => page.waitForFunction((label) => document.querySelector(".grid")?.ariaLabel === label, `Frets ${frets}`);
+  await shows("x 3 2 0 1 0");
+  await page.getByRole("button", { name: "more" }).click();
+  const frets = await page.locator(".grid").evaluateAll((grids) => grids.map((grid) => grid.ariaLabel));
+  assert.ok(frets.length > 8 && new Set(frets).size === frets.length, frets.join("\n"));
+  assert.ok(frets.includes("Frets x 3 5 5 5 3"));
+  await page.getByLabel("Capo").selectOption("5");
+  await shows("3 2 0 0 0 3");
+  await page.getByLabel("Capo").selectOption("0");
+  await page.getByLabel("Instrument").selectOption("ukulele");
+  await shows("0 0 0 3");
+  await page.getByLabel("Instrument").selectOption("other");
+  await page.fill(".hand input", "DGBX");
+  await page.press(".hand input", "Tab");
+  await page.locator(".chord-panel").getByRole("alert").waitFor();
+  await page.fill(".hand input", "DGBE");
+  await page.press(".hand input", "Tab");
+  await shows("2 0 1 0");
+  // What one plays on stays chosen.
+  await page.click("[data-chord='1']");
+  await shows("3 2 1 1");
+});
+
 onPage("What could come next is ranked, and one is inserted behind its chord", {}, async (opened, page) => {
   await opened.type("Dm7 . G7 . | C . . . | F | C", 5);
   await page.click("[data-chord='1']");

@@ -6,11 +6,11 @@ import { midiNotes } from "../player/midiNotes";
 import { insertChord } from "./insertChord";
 import { printedNames, sentenceAround } from "./sentence";
 import { transposeText, type Heard } from "./transposeText";
-import type { Answer, Call, Calls, ChordDetail, Export, Grid, Names, Sheet, Source } from "./Types";
+import type { Answer, Call, Calls, Export, Grid, Hand, Names, PianoNote, Sheet, Source } from "./Types";
 
 /** The key below the lowest note that a chord is shown with: the B below the C under middle C. */
 const belowPiano = 47;
-const mostGrids = 4;
+const mostGrids = 16;
 const mostNext = 8;
 
 let library: Promise<Brindle> | null = null;
@@ -51,8 +51,22 @@ function namingOf(names: Names): { naming?: ChordNaming } {
   return names === "typed" ? {} : { naming: names };
 }
 
+/** The fingerings that people wrote down, then others that a hand can play. */
+function fingeringsOf(library: Brindle, symbol: string, { tuning, capo }: Hand): Grid[] {
+  const options = { capo, ...(tuning ? { tuning } : {}) };
+  const found = new Map<string, Grid>();
+  for (const fingerings of [library.fingerings(symbol, options), library.searchFingerings(symbol, { ...options, limit: mostGrids })]) {
+    for (const grid of fingerings.json().Grids.slice(0, mostGrids) as unknown as Grid[]) {
+      const frets = grid.Frets.join();
+      if (!found.has(frets)) found.set(frets, grid);
+    }
+    fingerings.free();
+  }
+  return [...found.values()].slice(0, mostGrids);
+}
+
 /** Tones one above the other, the bass lowest, as a hand could play them. */
-function stacked(tones: { pitchClass: number; name: string }[]): ChordDetail["notes"] {
+function stacked(tones: { pitchClass: number; name: string }[]): PianoNote[] {
   let last = belowPiano;
   return tones.map(({ pitchClass, name }) => {
     last += ((pitchClass - last - 1 + 144) % 12) + 1;
@@ -101,16 +115,16 @@ const calls: Calls = {
     }
   },
 
-  async detail(source, chord) {
-    const { song } = await readSong(source);
-    const found = song.chords[chord]?.chord;
-    if (!found?.root) return { notes: [], grids: [] };
+  async tones(source, chord) {
+    const found = (await readSong(source)).song.chords[chord]?.chord;
+    if (!found?.root) return [];
     const { bass, tones } = found;
-    const low = bass ? [bass, ...tones.filter(({ pitchClass }) => pitchClass !== bass.pitchClass)] : tones;
-    const fingerings = (await brindle()).fingerings(found.symbol);
-    const grids = fingerings.json().Grids.slice(0, mostGrids) as unknown as Grid[];
-    fingerings.free();
-    return { notes: stacked(low), grids };
+    return stacked(bass ? [bass, ...tones.filter(({ pitchClass }) => pitchClass !== bass.pitchClass)] : tones);
+  },
+
+  async grids(source, chord, hand) {
+    const found = (await readSong(source)).song.chords[chord]?.chord;
+    return found?.root ? fingeringsOf(await brindle(), found.symbol, hand) : [];
   },
 
   async next(source, chord) {
