@@ -107,6 +107,7 @@ const calls: Calls = {
     try {
       const { song, analysis } = await readSong(source);
       const sheet = analysis.sheet(namingOf(names)) as unknown as Sheet;
+      sheet.Notes = sheet.Notes.map(printedNames);
       const sentences = analysis.chords.map(({ explanation, numeral }) => sentenceAround(explanation, numeral));
       return { sheet, faults: song.faults, sentences };
     } catch (error) {

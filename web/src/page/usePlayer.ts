@@ -72,7 +72,7 @@ export function usePlayer(song: SongState, onError: (message: string) => void): 
     if (!sheet) return;
     setIsLoading(true);
     try {
-      const notes = await song.engine.call("notes", song.source);
+      const notes = song.engine.call("notes", song.source);
       const countIn = countsIn ? Math.max(1, Math.round(sheet.BeatsPerBar)) : 0;
       await player.play(notes, { tempo, countIn, from, end: endOf(sheet) });
     } catch (error) {
