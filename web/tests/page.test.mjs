@@ -66,6 +66,19 @@ for (const [form, text, symbols] of [
   });
 }
 
+for (const [form, text, bars, parts] of [
+  ["lyrics", "{time: 6/8}\n[Em]Oh [D]when [C]down\n{soc}\n[G]Sing [D]sing\n{eoc}", ["Em", "D", "C", "G", "D"], { 3: "Chorus" }],
+  ["chords alone", "Dm7 G7 C", ["Dm7", "G7", "C"], {}],
+  ["beats", "Dm7 . G7 . C . . .", ["Dm7G7", "C"], {}],
+  ["bars", "Dm7 G7 | C", ["Dm7G7", "C"], {}],
+]) {
+  onPage(`Where nothing tells the time a chord has a bar: ${form}`, {}, async (opened, page) => {
+    await opened.type(text, bars.join("").match(/[A-G]/g).length);
+    const shown = await page.locator(".bar").evaluateAll((all) => all.map((bar) => [[...bar.querySelectorAll(".symbol")].map(({ textContent }) => textContent).join(""), bar.querySelector(".part")?.textContent]));
+    assert.deepEqual(shown, bars.map((symbols, i) => [symbols, parts[i]]));
+  });
+}
+
 /** A chart as such links hold it: of each block of fifty characters the ends are swapped. */
 function scrambled(chart) {
   const text = [...chart];

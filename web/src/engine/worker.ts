@@ -30,11 +30,23 @@ async function brindle(): Promise<Brindle> {
   return library;
 }
 
+/**
+ * A typed song. Where neither bars nor beats are told, as in most lyrics with chords, each chord has a
+ * bar, which is nearer to the song than a beat; so its parts begin bars, too.
+ */
+function readText(library: Brindle, text: string): Song {
+  const song = library.read(text, { lenient: true });
+  const { chords, beatsPerBar } = song;
+  if (chords.length === 0 || song.bars.length > 0 || chords.some(({ position }, i) => position !== i)) return song;
+  song.free();
+  return library.read(text, { lenient: true, beatsPerChord: beatsPerBar });
+}
+
 /** The song of a source with its analysis; the last one is kept, as most calls ask for it again. */
 async function readSong(source: Source): Promise<{ song: Song; analysis: Analysis }> {
   if (kept && isSame(kept.source, source)) return kept;
   const library = await brindle();
-  const song = source.kind === "text" ? library.read(source.text, { lenient: true }) : library.readScore(source.bytes);
+  const song = source.kind === "text" ? readText(library, source.text) : library.readScore(source.bytes);
   const analysis = song.analyse({ explain: true });
   kept?.analysis.free();
   kept?.song.free();
@@ -155,7 +167,7 @@ const calls: Calls = {
     const transposed = song.transpose(semitones);
     const after = heard(transposed);
     const key = transposed.statedKey && typedKey(transposed.statedKey);
-    const readHeard = (text: string) => freed(library.read(text, { lenient: true }), heard);
+    const readHeard = (text: string) => freed(readText(library, text), heard);
     const text = source.kind === "text" ? transposeText(source.text, heard(song), after, key, readHeard) : null;
     const told = text ?? transposed.chordPro();
     transposed.free();
