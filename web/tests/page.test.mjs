@@ -66,6 +66,19 @@ for (const [form, text, symbols] of [
   });
 }
 
+for (const [form, text, bars, parts] of [
+  ["lyrics", "{time: 6/8}\n[Em]Oh [D]when [C]down\n{soc}\n[G]Sing [D]sing\n{eoc}", ["Em", "D", "C", "G", "D"], { 3: "Chorus" }],
+  ["chords alone", "Dm7 G7 C", ["Dm7", "G7", "C"], {}],
+  ["beats", "Dm7 . G7 . C . . .", ["Dm7G7", "C"], {}],
+  ["bars", "Dm7 G7 | C", ["Dm7G7", "C"], {}],
+]) {
+  onPage(`Where nothing tells the time a chord has a bar: ${form}`, {}, async (opened, page) => {
+    await opened.type(text, bars.join("").match(/[A-G]/g).length);
+    const shown = await page.locator(".bar").evaluateAll((all) => all.map((bar) => [[...bar.querySelectorAll(".symbol")].map(({ textContent }) => textContent).join(""), bar.querySelector(".part")?.textContent]));
+    assert.deepEqual(shown, bars.map((symbols, i) => [symbols, parts[i]]));
+  });
+}
+
 /** A chart as such links hold it: of each block of fifty characters the ends are swapped. */
 function scrambled(chart) {
   const text = [...chart];
@@ -98,9 +111,35 @@ onPage("A chord is explained, on a piano and as fingerings", {}, async (opened, 
   assert.equal(await page.textContent(".sentence"), "E7 is the dominant of A minor, which follows: V7");
   assert.equal(await page.locator(".piano").getAttribute("aria-label"), "Piano: E, G\u266F, B, D");
   assert.equal(await page.locator(".piano .down").count(), 4);
-  assert.ok((await page.locator(".grid").count()) >= 2);
+  await page.locator(".grid").nth(1).waitFor();
   await page.click("[data-chord='3']");
   await page.waitForSelector(".grid[aria-label='Frets x 0 2 0 1 0']");
+});
+
+onPage("Fingerings are those of the instrument, its tuning and a capo, and there are more", {}, async (opened, page) => {
+  await opened.type("C | F | C | C", 4);
+  await page.click("[data-chord='0']");
+  const shows = (frets) => page.waitForFunction((label) => document.querySelector(".grid")?.ariaLabel === label, `Frets ${frets}`);
+  await shows("x 3 2 0 1 0");
+  await page.getByRole("button", { name: "more" }).click();
+  const frets = await page.locator(".grid").evaluateAll((grids) => grids.map((grid) => grid.ariaLabel));
+  assert.ok(frets.length > 8 && new Set(frets).size === frets.length, frets.join("\n"));
+  assert.ok(frets.includes("Frets x 3 5 5 5 3"));
+  await page.getByLabel("Capo").selectOption("5");
+  await shows("3 2 0 0 0 3");
+  await page.getByLabel("Capo").selectOption("0");
+  await page.getByLabel("Instrument").selectOption("ukulele");
+  await shows("0 0 0 3");
+  await page.getByLabel("Instrument").selectOption("other");
+  await page.fill(".hand input", "DGBX");
+  await page.press(".hand input", "Tab");
+  await page.locator(".chord-panel").getByRole("alert").waitFor();
+  await page.fill(".hand input", "DGBE");
+  await page.press(".hand input", "Tab");
+  await shows("2 0 1 0");
+  // What one plays on stays chosen.
+  await page.click("[data-chord='1']");
+  await shows("3 2 1 1");
 });
 
 onPage("What could come next is ranked, and one is inserted behind its chord", {}, async (opened, page) => {
@@ -238,6 +277,19 @@ onPage("A song plays: notes are sent, the clock moves and the bar is lit", {}, a
   const sent = await page.evaluate(() => window.sent);
   await page.waitForTimeout(500);
   assert.equal(await page.evaluate(() => window.sent), sent);
+});
+
+onPage("What waits for its sound does not play once another song is there", {}, async (opened, page) => {
+  await opened.type("C . . . | F . . .", 2);
+  let release;
+  const held = new Promise((resolve) => (release = resolve));
+  await opened.context.route("**/*.mp3", async (route) => (await held, route.continue()));
+  await page.getByRole("button", { name: "Play", exact: true }).click();
+  await page.getByRole("button", { name: "Loading" }).waitFor();
+  await opened.type("Am | E7 | Am", 3);
+  release();
+  await page.getByRole("button", { name: "Play", exact: true }).waitFor();
+  assert.equal(await page.evaluate(() => window.sent), 0);
 });
 
 onPage("A song is taken away as SVG, MIDI, JSON and ChordPro", {}, async (opened) => {

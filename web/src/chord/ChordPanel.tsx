@@ -1,15 +1,16 @@
-import { useEffect, useState } from "preact/hooks";
-import type { ChordDetail, NextChords as Next, Sentence, SheetChord } from "../engine/Types";
+import type { Grid, Hand, NextChords as Next, PianoNote, Sentence, SheetChord } from "../engine/Types";
 import { Runs, Signs } from "../sheet/Runs";
-import { GridView } from "./GridView";
+import { Fingerings } from "./Fingerings";
 import { NextChords } from "./NextChords";
 import { Piano } from "./Piano";
+import { useLoaded } from "./useLoaded";
 
 interface ChordPanelProps {
   chord: SheetChord;
   index: number;
   sentence: Sentence | undefined;
-  loadDetail(chord: number): Promise<ChordDetail>;
+  loadNotes(chord: number): Promise<PianoNote[]>;
+  loadGrids(chord: number, hand: Hand): Promise<Grid[]>;
   loadNext(chord: number): Promise<Next>;
   onHear(notes: number[]): void;
   onPlayFrom(position: number): void;
@@ -17,25 +18,10 @@ interface ChordPanelProps {
   onClose(): void;
 }
 
-/** What a promise gives, once it does, or why it does not; nothing while another one is awaited. */
-function useLoaded<Value>(load: () => Promise<Value>, inputs: unknown[]): { value: Value | null; error: string } {
-  const [state, setState] = useState<{ value: Value | null; error: string }>({ value: null, error: "" });
-  useEffect(() => {
-    let isWanted = true;
-    const tell = (value: Value | null, error = "") => isWanted && setState({ value, error });
-    tell(null);
-    load().then((value) => tell(value), (error: Error) => tell(null, error.message));
-    return () => {
-      isWanted = false;
-    };
-  }, inputs);
-  return state;
-}
-
 /** What a chord is: a sentence, its notes on a piano, its fingerings, and what could follow. */
 export function ChordPanel(props: ChordPanelProps) {
   const { chord, index, sentence } = props;
-  const { value: detail, error } = useLoaded(() => props.loadDetail(index), [chord, index]);
+  const { value: notes, error } = useLoaded(() => props.loadNotes(index), [chord, index]);
   const { value: next, error: nextError } = useLoaded(() => props.loadNext(index), [chord, index]);
   return (
     <aside class="chord-panel" aria-label={`Chord ${chord.Symbol}`}>
@@ -47,20 +33,15 @@ export function ChordPanel(props: ChordPanelProps) {
         {sentence && <Signs text={sentence.after} />}
       </p>
       {(error || nextError) && <p class="message" role="alert">{error || nextError}</p>}
-      {detail && detail.notes.length > 0 && (
+      {notes && notes.length > 0 && (
         <>
-          <Piano notes={detail.notes} />
+          <Piano notes={notes} />
           <p class="quiet-buttons">
-            <button type="button" onClick={() => props.onHear(detail.notes.map(({ NoteNr }) => NoteNr))}>Hear it</button>
+            <button type="button" onClick={() => props.onHear(notes.map(({ NoteNr }) => NoteNr))}>Hear it</button>
             <button type="button" onClick={() => props.onPlayFrom(chord.Position)}>Play from here</button>
           </p>
+          <Fingerings of={chord} load={(hand) => props.loadGrids(index, hand)} />
         </>
-      )}
-      {detail && detail.grids.length > 0 && (
-        <section aria-label="Fingerings for guitar">
-          <h3>On the guitar</h3>
-          <div class="grids">{detail.grids.map((grid, i) => <GridView key={i} grid={grid} />)}</div>
-        </section>
       )}
       {next && next.chords.length > 0 && <NextChords next={next} onInsert={props.onInsert} />}
     </aside>

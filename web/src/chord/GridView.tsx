@@ -18,6 +18,11 @@ export function spokenFrets(grid: Grid): string {
   return grid.Frets.map((fret) => (fret === null ? "x" : fret)).join(" ");
 }
 
+/** What is not played of a chord: ", without 5 and 9", as degrees. */
+function spokenOmitted({ Omitted }: Grid): string {
+  return Omitted.length === 0 ? "" : `, without ${Omitted.join(" and ")}`;
+}
+
 /** A fingering as a diagram; strings from left to right, the nut on top. */
 export function GridView({ grid }: { grid: Grid }) {
   const { first, count } = windowOf(grid.Frets);
@@ -27,7 +32,8 @@ export function GridView({ grid }: { grid: Grid }) {
   const x = (string: number) => left + string * step;
   const y = (fret: number) => top + (fret - first + 0.5) * fretHeight;
   return (
-    <svg class="grid" viewBox={`0 0 ${right + 12} ${bottom + 6}`} role="img" aria-label={`Frets ${spokenFrets(grid)}`}>
+    <svg class="grid" viewBox={`0 0 ${right + 12} ${bottom + 6}`} role="img" aria-label={`Frets ${spokenFrets(grid)}${spokenOmitted(grid)}`}>
+      {grid.Omitted.length > 0 && <title>{spokenOmitted(grid).slice(2)}</title>}
       {grid.Frets.map((_, string) => (
         <line key={string} x1={x(string)} x2={x(string)} y1={top} y2={bottom} />
       ))}

@@ -1,3 +1,5 @@
+import type { PianoNote } from "../engine/Types";
+
 /** White keys of an octave as their distance from C in semitones; the order of the picture. */
 const whites = [0, 2, 4, 5, 7, 9, 11];
 const blacks: [semitone: number, place: number][] = [[1, 1], [3, 2], [6, 4], [8, 5], [10, 6]];
@@ -8,7 +10,7 @@ const blackHeight = 56;
 const nameHeight = 17;
 
 interface PianoProps {
-  notes: { Name: string; NoteNr: number }[];
+  notes: PianoNote[];
 }
 
 /** The notes of a chord on as many octaves of a piano as they need. */

@@ -116,9 +116,17 @@ export interface Grid {
   Omitted: string[];
 }
 
-export interface ChordDetail {
-  notes: { Name: string; NoteNr: number }[];
-  grids: Grid[];
+/** What fingerings are for. */
+export interface Hand {
+  /** A name or the notes of the strings; "" for a guitar in its usual one. */
+  tuning: string;
+  /** A fret; 0 without one. */
+  capo: number;
+}
+
+export interface PianoNote {
+  Name: string;
+  NoteNr: number;
 }
 
 export interface NextChord {
@@ -142,7 +150,10 @@ export type Export = "svg" | "midi" | "json" | "chordpro";
 /** What the worker can do. All of it is the library's work. */
 export interface Calls {
   read(source: Source, names: Names): Promise<Reading>;
-  detail(source: Source, chord: number): Promise<ChordDetail>;
+  /** The tones of a chord on a piano, the bass lowest. */
+  tones(source: Source, chord: number): Promise<PianoNote[]>;
+  /** Its fingerings, the best first. */
+  grids(source: Source, chord: number, hand: Hand): Promise<Grid[]>;
   next(source: Source, chord: number): Promise<NextChords>;
   notes(source: Source): Promise<Note[]>;
   transpose(source: Source, semitones: number): Promise<string>;

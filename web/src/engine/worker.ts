@@ -6,11 +6,11 @@ import { midiNotes } from "../player/midiNotes";
 import { insertChord } from "./insertChord";
 import { printedNames, sentenceAround } from "./sentence";
 import { transposeText, type Heard } from "./transposeText";
-import type { Answer, Call, Calls, ChordDetail, Export, Grid, Names, Sheet, Source } from "./Types";
+import type { Answer, Call, Calls, Export, Grid, Hand, Names, PianoNote, Sheet, Source } from "./Types";
 
 /** The key below the lowest note that a chord is shown with: the B below the C under middle C. */
 const belowPiano = 47;
-const mostGrids = 4;
+const mostGrids = 16;
 const mostNext = 8;
 
 let library: Promise<Brindle> | null = null;
@@ -30,11 +30,23 @@ async function brindle(): Promise<Brindle> {
   return library;
 }
 
+/**
+ * A typed song. Where neither bars nor beats are told, as in most lyrics with chords, each chord has a
+ * bar, which is nearer to the song than a beat; so its parts begin bars, too.
+ */
+function readText(library: Brindle, text: string): Song {
+  const song = library.read(text, { lenient: true });
+  const { chords, beatsPerBar } = song;
+  if (chords.length === 0 || song.bars.length > 0 || chords.some(({ position }, i) => position !== i)) return song;
+  song.free();
+  return library.read(text, { lenient: true, beatsPerChord: beatsPerBar });
+}
+
 /** The song of a source with its analysis; the last one is kept, as most calls ask for it again. */
 async function readSong(source: Source): Promise<{ song: Song; analysis: Analysis }> {
   if (kept && isSame(kept.source, source)) return kept;
   const library = await brindle();
-  const song = source.kind === "text" ? library.read(source.text, { lenient: true }) : library.readScore(source.bytes);
+  const song = source.kind === "text" ? readText(library, source.text) : library.readScore(source.bytes);
   const analysis = song.analyse({ explain: true });
   kept?.analysis.free();
   kept?.song.free();
@@ -51,8 +63,22 @@ function namingOf(names: Names): { naming?: ChordNaming } {
   return names === "typed" ? {} : { naming: names };
 }
 
+/** The fingerings that people wrote down, then others that a hand can play. */
+function fingeringsOf(library: Brindle, symbol: string, { tuning, capo }: Hand): Grid[] {
+  const options = { capo, ...(tuning ? { tuning } : {}) };
+  const found = new Map<string, Grid>();
+  for (const fingerings of [library.fingerings(symbol, options), library.searchFingerings(symbol, { ...options, limit: mostGrids })]) {
+    for (const grid of fingerings.json().Grids.slice(0, mostGrids) as unknown as Grid[]) {
+      const frets = grid.Frets.join();
+      if (!found.has(frets)) found.set(frets, grid);
+    }
+    fingerings.free();
+  }
+  return [...found.values()].slice(0, mostGrids);
+}
+
 /** Tones one above the other, the bass lowest, as a hand could play them. */
-function stacked(tones: { pitchClass: number; name: string }[]): ChordDetail["notes"] {
+function stacked(tones: { pitchClass: number; name: string }[]): PianoNote[] {
   let last = belowPiano;
   return tones.map(({ pitchClass, name }) => {
     last += ((pitchClass - last - 1 + 144) % 12) + 1;
@@ -93,6 +119,7 @@ const calls: Calls = {
     try {
       const { song, analysis } = await readSong(source);
       const sheet = analysis.sheet(namingOf(names)) as unknown as Sheet;
+      sheet.Notes = sheet.Notes.map(printedNames);
       const sentences = analysis.chords.map(({ explanation, numeral }) => sentenceAround(explanation, numeral));
       return { sheet, faults: song.faults, sentences };
     } catch (error) {
@@ -101,16 +128,16 @@ const calls: Calls = {
     }
   },
 
-  async detail(source, chord) {
-    const { song } = await readSong(source);
-    const found = song.chords[chord]?.chord;
-    if (!found?.root) return { notes: [], grids: [] };
+  async tones(source, chord) {
+    const found = (await readSong(source)).song.chords[chord]?.chord;
+    if (!found?.root) return [];
     const { bass, tones } = found;
-    const low = bass ? [bass, ...tones.filter(({ pitchClass }) => pitchClass !== bass.pitchClass)] : tones;
-    const fingerings = (await brindle()).fingerings(found.symbol);
-    const grids = fingerings.json().Grids.slice(0, mostGrids) as unknown as Grid[];
-    fingerings.free();
-    return { notes: stacked(low), grids };
+    return stacked(bass ? [bass, ...tones.filter(({ pitchClass }) => pitchClass !== bass.pitchClass)] : tones);
+  },
+
+  async grids(source, chord, hand) {
+    const found = (await readSong(source)).song.chords[chord]?.chord;
+    return found?.root ? fingeringsOf(await brindle(), found.symbol, hand) : [];
   },
 
   async next(source, chord) {
@@ -140,7 +167,7 @@ const calls: Calls = {
     const transposed = song.transpose(semitones);
     const after = heard(transposed);
     const key = transposed.statedKey && typedKey(transposed.statedKey);
-    const readHeard = (text: string) => freed(library.read(text, { lenient: true }), heard);
+    const readHeard = (text: string) => freed(readText(library, text), heard);
     const text = source.kind === "text" ? transposeText(source.text, heard(song), after, key, readHeard) : null;
     const told = text ?? transposed.chordPro();
     transposed.free();

@@ -120,7 +120,8 @@ export function App() {
             chord={chord}
             index={selected}
             sentence={reading?.sentences[selected]}
-            loadDetail={(index) => song.engine.call("detail", song.source, index)}
+            loadNotes={(index) => song.engine.call("tones", song.source, index)}
+            loadGrids={(index, hand) => song.engine.call("grids", song.source, index, hand)}
             loadNext={(index) => song.engine.call("next", song.source, index)}
             onHear={(notes) => void player.hear(notes)}
             onPlayFrom={(position) => void player.play(position)}

@@ -1,6 +1,6 @@
 // What a visitor finds again: kept in this browser alone.
 
-const keys = { text: "brindle.text", theme: "brindle.theme" } as const;
+const keys = { text: "brindle.text", theme: "brindle.theme", tuning: "brindle.tuning" } as const;
 
 /** Storage may be switched off or full; the page works without. */
 export function recall(key: keyof typeof keys): string | null {

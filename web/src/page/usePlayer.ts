@@ -1,4 +1,4 @@
-import { useEffect, useMemo, useRef, useState } from "preact/hooks";
+import { useEffect, useLayoutEffect, useMemo, useRef, useState } from "preact/hooks";
 import type { Sheet } from "../engine/Types";
 import type { SongState } from "./useSong";
 import { Player } from "../player/Player";
@@ -63,7 +63,8 @@ export function usePlayer(song: SongState, onError: (message: string) => void): 
     player.setTempo(limited);
   };
   useEffect(() => player.stop(), [song.source]);
-  useEffect(() => {
+  // Before it is drawn, so that no other tempo is seen or taken into a link.
+  useLayoutEffect(() => {
     const told = song.linkedTempo ?? sheet?.Tempo;
     if (told) changeTempo(Math.round(told));
   }, [sheet?.Title, sheet?.Tempo, song.linkedTempo]);
@@ -72,7 +73,7 @@ export function usePlayer(song: SongState, onError: (message: string) => void): 
     if (!sheet) return;
     setIsLoading(true);
     try {
-      const notes = await song.engine.call("notes", song.source);
+      const notes = song.engine.call("notes", song.source);
       const countIn = countsIn ? Math.max(1, Math.round(sheet.BeatsPerBar)) : 0;
       await player.play(notes, { tempo, countIn, from, end: endOf(sheet) });
     } catch (error) {

@@ -18,12 +18,15 @@ const interval = 60;
 
 /** Plays notes by the clock of the sound, so that no other work makes it stumble. */
 export class Player {
+  private context: AudioContext | null = null;
   private sampler: Promise<Sampler> | null = null;
   private piano: Sampler | null = null;
   private timer = 0;
   private frame = 0;
   private notes: Note[] = [];
   private next = 0;
+  /** Counts what was asked for: what waits for the sound is not played once something else is wanted. */
+  private wish = 0;
   private options: PlayOptions = { tempo: 120, countIn: 0, from: 0, end: 0 };
   /** The time of the audio clock at which the beat `beatThen` sounds. */
   private timeThen = 0;
@@ -37,11 +40,14 @@ export class Player {
   }
 
   /** Loads the sound if need be and starts; refuses if there is no sound. */
-  async play(notes: Note[], options: PlayOptions): Promise<void> {
-    const piano = await this.ready();
+  async play(notes: Promise<Note[]>, options: PlayOptions): Promise<void> {
+    const wish = ++this.wish;
+    // The sound is woken by the click itself; phones allow it at no later time.
+    const [piano, found] = await Promise.all([this.ready(), notes]);
+    if (wish !== this.wish) return;
     this.halt();
     piano.sound();
-    this.notes = [...notes].sort((a, b) => a.Position - b.Position);
+    this.notes = [...found].sort((a, b) => a.Position - b.Position);
     this.options = options;
     this.next = this.notes.findIndex((note) => note.Position >= options.from - 1e-6);
     if (this.next < 0) this.next = this.notes.length;
@@ -71,12 +77,15 @@ export class Player {
   }
 
   stop(): void {
+    ++this.wish;
     this.halt();
     this.onBeat(null);
   }
 
   private async ready(): Promise<Sampler> {
-    this.sampler ??= Sampler.load(new AudioContext());
+    this.context ??= new AudioContext();
+    const woken = this.context.resume();
+    this.sampler ??= Sampler.load(this.context);
     try {
       this.piano = await this.sampler;
     } catch (error) {
@@ -84,7 +93,7 @@ export class Player {
       this.sampler = null;
       throw error;
     }
-    await this.piano.context.resume();
+    await woken;
     return this.piano;
   }
 

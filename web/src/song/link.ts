@@ -17,14 +17,16 @@ export const longestText = 1_000_000;
 
 const namesOfLinks: readonly string[] = ["typed", "letters", "german", "solfege", "nashville", "roman"];
 
-/** The link to a song, as the part of an address from "#" on. */
+/** The link to a song, as the part of an address from "#" on; an error for one that no link can hold. */
 export async function writeLink(song: SharedSong): Promise<string> {
   const bytes = new TextEncoder().encode(JSON.stringify(song));
   const packed = new Blob([bytes]).stream().pipeThrough(new CompressionStream("deflate-raw"));
   const text = Array.from(new Uint8Array(await new Response(packed).arrayBuffer()), (byte) =>
     String.fromCharCode(byte),
   ).join("");
-  return prefix + btoa(text).replaceAll("+", "-").replaceAll("/", "_").replace(/=+$/, "");
+  const link = prefix + btoa(text).replaceAll("+", "-").replaceAll("/", "_").replace(/=+$/, "");
+  if (link.length > longestLink || bytes.length > longestText) throw new Error("This song is too long for a link.");
+  return link;
 }
 
 /** Whether an address means to hold a song, readable or not. */
