@@ -335,6 +335,7 @@ TEST_CASE("What may be left out is what players leave out") {
     CHECK(omittable("C11") == CSemitones{2, 4, 7});
     CHECK(omittable("Cm11") == CSemitones{2, 7});
     CHECK(omittable("C13") == CSemitones{2, 5, 7});
+    CHECK(OmittableTones(CSemitones{0, 2, 9, 10}) == CSemitones());
     CFingeringOptions whole;
     whole.mMayOmitTones = false;
     for (const CFingering& c7 : FindFingerings(ChordOf("C7"), kGChStandardGuitar, whole)) {

@@ -204,8 +204,8 @@ TEST_CASE("Times and keys stand where they begin to hold") {
         "<note><duration>8</duration></note></measure>"
         "<measure><attributes><divisions>4</divisions><key><fifths>-3</fifths></key><time><beats>2"
         "</beats><beat-type>4</beat-type></time></attributes></measure><measure><attributes><key>"
-        "<fifths>1</fifths><mode>minor</mode></key></attributes></measure></part>"
-        "</score-partwise>");
+        "<fifths>1</fifths><mode>aeolian</mode></key><key number=\"2\"><fifths>3</fifths></key>"
+        "</attributes></measure></part></score-partwise>");
     CHECK(doc.Title == "Song");
     CHECK(Shown(doc) == "A 0+6");
     CHECK(doc.TimeSignatures == std::vector<TMusicXMLTimeSignature>{{2.0, 2, 4}});

@@ -27,6 +27,16 @@ std::vector<std::pair<double, std::string>> ChordsOf(const CSong& song) {
 
 }  // namespace
 
+TEST_CASE("Chords that share a bar by seven begin at the nearest ticks, without gaps") {
+    const CSong song = ReadSong("C D E F G Am Bb | C", {.mEven = true});
+    std::string ticks;
+    const CMidiPiece piece = MidiPieceOfSong(song, 120.0);
+    for (const CMidiNote& note : piece.mTracks[1].mNotes) {
+        ticks += std::to_string(note.mTick) + "+" + std::to_string(note.mDuration) + " ";
+    }
+    CHECK(ticks == "0+274 274+275 549+274 823+274 1097+274 1371+275 1646+274 1920+1920 ");
+}
+
 TEST_CASE("A written song reads back from its text, with its parts") {
     const CSongModel model = BuiltInSongModel();
     for (const char* const form : {"AABA", "ABAC", "blues", ""}) {

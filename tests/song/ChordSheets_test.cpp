@@ -88,6 +88,7 @@ TEST_CASE("Parts of a song have names") {
     CHECK(Sections("Intro: C |\nVerse 2: F |\nA section: G | C Outro: F") ==
           "Intro@0, Verse 2@4, A section@8, Outro@13");
     CHECK(Sections("|: {A} C :|") == "A@0, A@4");
+    CHECK(Sections("{A} C | % | F") == "A@0");
     CHECK(Shown("A: C:maj7 | G:min") == "C:maj7@0 G:min@4 end@8");
 }
 
@@ -161,6 +162,7 @@ TEST_CASE("Packed charts are read") {
     CHECK(reading.mStatedKey == CSignKeyLite("Eb major"));
     const CChordLite sameWithBass = ReadSong("C^7W/G", chart).mChords[1];
     CHECK(sameWithBass == CChordLite(CKeyEnh_C, CKeyEnh_G, CSemitones{0, 4, 7, 11}));
+    CHECK_FALSE(ReadSong("C^7/EW/C", chart).mChords[1].HasBassNote());
     const CSongOptions german{.mFormat = TSongFormat_Chart, .mChordTextPrefs{.mBIsBFlat = true}};
     CHECK(ReadSong("C^7W/B", german).mChords[1].mBassKeyEnh == CKeyEnh{10, TEnh_b});
     CHECK(Shown("C^7 |?", chart) == R"(1:6: "?" is not understood)");

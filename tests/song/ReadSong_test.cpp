@@ -6,6 +6,7 @@
 #include "brindle/song/AnalyseSong.h"
 #include "brindle/song/ParseSong.h"
 #include "brindle/song/ReadSongHarmony.h"
+#include "brindle/song/TransposeSong.h"
 #include "brindle/song/internal/ChartLinks.h"
 
 #include <doctest/doctest.h>
@@ -108,12 +109,16 @@ TEST_CASE("Chords above lyrics are read with what the sheet tells") {
     // The last A has chords above it and no lyrics below: it is sung.
     CHECK(Shown(song) == "G@0 D@1 G@2 D@3 G@4 D@5 A@6 Em@7 C@8 (N.C.)@9 G/B@10 end@11");
     CHECK(ShownSections(song) == "Intro@0, Verse 1@4, Chorus@8");
+    CHECK(ShownSections(ReadSong("[Verse 1]\nG C D\n[A]\nEm C")) == "Verse 1@0, A@3");
+    // A verse in front of the chords is no title.
+    CHECK(ReadSong("La la\nDown low\nOh why\nHey ho\n\nC G\nla la la").mTitle.empty());
     CHECK(Shown(ReadSong("C Hmaj9x G\nla la la")) == R"(1:8: Hmaj9x: "x" at 6 is not understood)");
 }
 
 TEST_CASE("Directives of lyrics with chords are kept") {
     const CSong song = ReadSong(
-        "{title: One}\n{subtitle: Two}\n{artist: Some Body}\n{composer: Any One}\n{key: G}\n"
+        "{title: One}\n{title: Other}\n{subtitle: Two}\n{artist: Some Body}\n{composer: Any "
+        "One}\n{key: G}\n"
         "{tempo: 120}\n{time: 3/4}\n{capo: 3}\n{transpose: -2}\n{album: Three}\n"
         "{meta: lyricist No One}\n{soc}\n[G]La [C]la\n{eoc}\n{sov: Verse 1}\n{key: Am}\n[Am]Oh\n"
         "{chorus}\n{comment: D.C.}\n");
@@ -133,6 +138,9 @@ TEST_CASE("Directives of lyrics with chords are kept") {
         "{start_of_abc}\nX:1 [G]a\n{end_of_abc}\n{sob}\n[Am]x");
     CHECK(ShownSections(labelled) == "Verse 1@0, Lead@1, Bridge@2");
     CHECK(Shown(labelled) == "C@0 F@1 Am@2 end@3");
+    CHECK(Shown(ReadSong("{soc}\n[C]a\n{eoc}\n[F]b\n{eoc}\n{chorus}")) == "C@0 F@1 C@2 end@3");
+    CHECK(Shown(ReadSong("{time: 3/4}\n| [C] | [G] . . |\n{time: 4/4}\n| [F] | [C] |")) ==
+          "C@0 G@3 F@6 C@10 end@14");
     const CSong notes = ReadSong("{title: x}\n{time: often}\n{tempo: slow}\n{chorus}\n[C]x");
     CHECK(Faults(notes) ==
           "2:8: a time is written as in 3/4; 3:9: a tempo is a number of beats a minute; "
@@ -167,6 +175,9 @@ TEST_CASE("Typed songs are played as scores are") {
         {"C | \U0001D10B F | To Coda | G | D.S. al Coda | Coda Am |", "C F G F Am"},
         {"C | F \U0001D10C | G | D.C. al Coda | \U0001D10C Am |", "C F G C F Am"},
         {"C | F | \U0001D10C G | D.C. | \U0001D10C Am |", "C F G C F Am"},
+        // Where words tell the one, all signs are the other.
+        {"C | F To Coda | G | D.C. al Coda | \U0001D10C Am | D | \U0001D10C Em |",
+         "C F G C F Am D Em"},
         {"|: C | F :| (3x) G", "C F C F C F G"},
         {"|: C [2. F :| [2. G", "C F C G"},
         {"|: C [1 F :| [1 G | Am", "C F C G Am"},
@@ -420,6 +431,31 @@ TEST_CASE("Lead sheets become songs with the bars that are printed") {
     CHECK(song.mChords.back().mPosition == 102.5);
     CHECK(song.mRepeats.size() == 1);
     CHECK(song.mBars[19].mNumber == song.mBars[3].mNumber);
+}
+
+TEST_CASE("A score of odd times is a song with usual bars, and lasts as long as its last chord") {
+    const auto song = [](const char* time, const char* offset) {
+        return ReadSong(fmt::format(
+            "<score-partwise><part-list><score-part id=\"P\"/></part-list><part id=\"P\"><measure>"
+            "<attributes><divisions>1</divisions><time>{}</time></attributes><harmony><root>"
+            "<root-step>C</root-step></root><kind>major</kind></harmony><harmony><root><root-step>G"
+            "</root-step></root><kind>major</kind><offset>{}</offset></harmony><note><rest/>"
+            "<duration>4</duration></note></measure></part></score-partwise>",
+            time, offset));
+    };
+    CHECK(Shown(song("<beats>4</beats><beat-type>4</beat-type>", "6")) == "C@0 G@6 end@6");
+    CHECK(song("<beats>6</beats><beat-type>8</beat-type>", "1").mBeatsPerBar == 3.0);
+    CHECK(song("<beats>1</beats><beat-type>512</beat-type>", "1").mBeatsPerBar == 4.0);
+    CHECK(song("<beats>5000</beats><beat-type>4</beat-type>", "1").mBeatsPerBar == 4.0);
+}
+
+TEST_CASE("A song moves into the key that has its kind of signs") {
+    const auto moved = [](const char* text, int semitones) {
+        return Played(TransposeSong(ReadSong(text), semitones));
+    };
+    CHECK(moved("{key: Db}\n[Db] [Gbm] [Ab7]", 5) == "Gb Cbm Db7");
+    CHECK(moved("{key: E}\n[E] [Am] [B7]", 2) == "F# Bm C#7");
+    CHECK(moved("{key: C}\n[C] [Fm/Ab]", 12) == "C Fm/Ab");
 }
 
 TEST_CASE("A song of a score is analysed as the score itself is") {

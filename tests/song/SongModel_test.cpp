@@ -42,6 +42,14 @@ TEST_CASE("The same song in two keys is learned as one") {
     CHECK(inC.mChords.back().mEndsSection);
 }
 
+TEST_CASE("The upbeat of a song that is learned ends at the first bar line") {
+    const CTaughtSong song =
+        TeachSong(ReadSong("Time Signature: 3/4\nm0 b3 C: V\nm1 I\nm2 V\nm3 I"));
+    REQUIRE(song.mChords.size() == 4);
+    CHECK(song.mChords[0].mBegin == -kTicksPerBar / 3);
+    CHECK(song.mChords[1].mBegin == 0);
+}
+
 TEST_CASE("A taught song is written again as it was, with its changes of key") {
     const std::string text = "C | Am | Dm7 G7 | C | Fm7 | Bb7 | Ebmaj7 | Abmaj7 | Dm7b5 G7 | C";
     CSongOptions options;
