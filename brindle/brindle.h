@@ -250,7 +250,7 @@
 #include "brindle/song/LearnSong.h"
 #include "brindle/song/NextChords.h"
 #include "brindle/song/ParseSong.h"
-#include "brindle/song/ReadSheetSong.h"
+#include "brindle/song/ReadLeadSheet.h"
 #include "brindle/song/ReadSong.h"
 #include "brindle/song/ReadSongHarmony.h"
 #include "brindle/song/ScoreSongs.h"

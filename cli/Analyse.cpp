@@ -7,16 +7,14 @@
 #include "cli/TypedChords.h"
 #include "cli/TypedSongs.h"
 
-#include "brindle/analysis/CAnalyseHarmCenterAlternatives.h"
 #include "brindle/analysis/TChordStringParse.h"
 #include "brindle/present/AnalysisJson.h"
 #include "brindle/present/AnalysisSvg.h"
-#include "brindle/present/CChordSymbols.h"
 #include "brindle/present/CentersText.h"
 #include "brindle/present/Explain.h"
-#include "brindle/present/MakeSongCopies.h"
 #include "brindle/present/MakeSongKeys.h"
 #include "brindle/present/ReadingText.h"
+#include "brindle/present/ShowSong.h"
 #include "brindle/present/ShownNames.h"
 #include "brindle/present/SongGrids.h"
 #include "brindle/song/AnalyseSong.h"
@@ -114,54 +112,39 @@ std::optional<std::string> Contradiction(const CAnalyseOptions& options) {
     return options.mSheetPicture.Contradiction(isPicture, !IsSheetWanted(options));
 }
 
-/// A song that has been analysed, and what its presentations need beside that.
+/// A song that has been read, and what its presentations need beside that.
 struct CAnalysedSong {
     /// As it is played.
     CSong mSong;
     CSongReading mReading;
-    CHarmonicAnalyse mAnalyse;
-    CChordSymbols mSymbols;
-    CHarmAnlsCenters mReadings;
-    /// Of a score, in the timing that is asked for.
-    std::optional<TMusicXMLDoc> mSheet;
     /// Empty if they were not asked for.
     std::vector<std::string> mExplanations;
+    /// A score in the timing for hosts, if that was asked for; its centers are found in it.
+    std::optional<TMusicXMLDoc> mSheet;
 };
 
-CShownSong SongOf(const CAnalysedSong& analysed, const CAnalyseOptions& options) {
-    const CHarmAnlsCenters* readings = options.mReadings ? &analysed.mReadings : nullptr;
-    if (analysed.mSheet) {
-        return MakeSong(analysed.mAnalyse, readings, analysed.mSymbols, *analysed.mSheet);
-    }
-    return MakeSong(analysed.mAnalyse, readings, analysed.mSymbols, analysed.mSong.mBeatsPerBar);
+CSongAnalysis FindAll(const CAnalysedSong& analysed, const CAnalyseOptions& options) {
+    const CAnalyseSongOptions asked{RouteOf(options.mRoute), options.mReadings,
+                                    options.mFormat.Format() == TFormat::Svg, options.mNumerals};
+    return analysed.mSheet ? AnalyseSheet(*analysed.mSheet, asked)
+                           : AnalyseSong(analysed.mSong, asked);
 }
 
-CShownKeys KeysOf(const CAnalysedSong& analysed, const CNumeralOptions& numerals) {
-    const double beatsPerBar =
-        analysed.mSheet ? BeatsPerBarOf(*analysed.mSheet) : analysed.mSong.mBeatsPerBar;
-    return MakeSongKeys(analysed.mAnalyse.mChords, analysed.mSymbols, {.mBeatsPerBar = beatsPerBar},
-                        numerals);
+CShownSong Show(const CAnalysedSong& analysed, const CSongAnalysis& found) {
+    return analysed.mSheet ? ShowSong(*analysed.mSheet, found) : ShowSong(analysed.mSong, found);
 }
 
-/// The fingerings of a guitar that are near each other, for each symbol.
-TChordGrids GridsOf(const CAnalysedSong& analysed, int capo) {
-    std::vector<CChordLite> chords;
-    std::vector<std::string> symbols;
-    for (const CHarmAnlsChordWithPos& chord : analysed.mAnalyse.mChords) {
-        chords.push_back(chord);
-        symbols.push_back(analysed.mSymbols.SymbolOf(chord));
+std::string Picture(const CAnalysedSong& analysed, const CAnalyseOptions& options) {
+    CShownSong shown = Show(analysed, FindAll(analysed, options));
+    if (!analysed.mSong.mChords.empty()) {
+        shown.mKeys = MakeSongKeys(analysed.mSong, analysed.mReading);
     }
+    if (!options.mGrids) return AnalysisSvg(shown);
     CSongFingeringOptions choice;
-    choice.mFingering.mCapo = capo;
-    const CSongFingerings fingerings[] = {ChooseFingerings(chords, kGChStandardGuitar, choice)};
-    return GridsBySymbol(MakeSongGrids(chords, symbols, fingerings));
-}
-
-std::string Picture(const CAnalysedSong& analysed, const CShownSong& song,
-                    const CAnalyseOptions& options) {
-    if (!options.mGrids) return AnalysisSvg(song);
-    const TChordGrids grids = GridsOf(analysed, options.mCapo);
-    return AnalysisSvg(song, &grids, {.mLeftHanded = options.mIsLeftHanded});
+    choice.mFingering.mCapo = options.mCapo;
+    const TChordGrids grids =
+        GridsBySymbol(MakeSongGrids(analysed.mSong, kGChStandardGuitar, choice, TSongCapo::Told));
+    return AnalysisSvg(shown, &grids, {.mLeftHanded = options.mIsLeftHanded});
 }
 
 bool IsLeadSheet(const CAnalyseOptions& options) {
@@ -178,39 +161,30 @@ std::string Text(const CAnalysedSong& analysed, const CAnalyseOptions& options) 
     std::string text = ReadingText(analysed.mSong, analysed.mReading,
                                    {.mWidth = WidthOfOutput(), .mIsLong = options.mLong}, paint);
     text += ExplanationsText(analysed.mSong, analysed.mExplanations, paint);
-    if (WantsCenters(options)) text += '\n' + CentersText(SongOf(analysed, options), paint);
-    return text;
+    if (!WantsCenters(options)) return text;
+    return text + '\n' + CentersText(Show(analysed, FindAll(analysed, options)), paint);
 }
 
-std::string AnalysedJson(const CAnalysedSong& analysed, const CAnalyseOptions& options) {
-    const CReadSong read{analysed.mSong, analysed.mReading, analysed.mExplanations};
-    const bool isPlayed = options.mTiming == "played" || !analysed.mSheet;
-    return AnalysisJson(
-        analysed.mAnalyse, options.mReadings ? &analysed.mReadings : nullptr,
-        [&](const CHarmAnlsChordWithPos& chord) -> const std::string& {
-            return analysed.mSymbols.SymbolOf(chord);
-        },
-        KeysOf(analysed, options.mNumerals), analysed.mSheet ? &*analysed.mSheet : nullptr,
-        isPlayed ? &read : nullptr);
+std::string Json(const CAnalysedSong& analysed, const CAnalyseOptions& options) {
+    const CSongAnalysis found = FindAll(analysed, options);
+    if (analysed.mSheet) return AnalysisJson(*analysed.mSheet, found);
+    return AnalysisJson(analysed.mSong, found, analysed.mReading, analysed.mExplanations);
+}
+
+std::string Native(const CAnalysedSong& analysed, const CAnalyseOptions& options) {
+    std::ostringstream native;
+    FindAll(analysed, options).mAnalyse.AppendJSONString(native);
+    return native.str();
 }
 
 std::string Present(const CAnalysedSong& analysed, const CAnalyseOptions& options) {
     switch (options.mFormat.Format()) {
         case TFormat::Json:
-            return AnalysedJson(analysed, options);
-        case TFormat::Native: {
-            std::ostringstream native;
-            analysed.mAnalyse.AppendJSONString(native);
-            return native.str();
-        }
-        case TFormat::Svg: {
-            CShownSong song = SongOf(analysed, options);
-            song.mCopies = MakeSongCopies(analysed.mAnalyse, analysed.mSymbols);
-            if (!analysed.mSong.mChords.empty()) {
-                song.mKeys = MakeSongKeys(analysed.mSong, analysed.mReading);
-            }
-            return Picture(analysed, song, options);
-        }
+            return Json(analysed, options);
+        case TFormat::Native:
+            return Native(analysed, options);
+        case TFormat::Svg:
+            return Picture(analysed, options);
         case TFormat::Text:
         case TFormat::Chords:
             break;
@@ -218,8 +192,8 @@ std::string Present(const CAnalysedSong& analysed, const CAnalyseOptions& option
     return Text(analysed, options);
 }
 
-TStatus AnalyseText(const CTypedSong& typed, const CSignKeyLite& key,
-                    const CAnalyseOptions& options, CAnalysedSong& analysed) {
+std::optional<CSong> ReadText(const CTypedSong& typed, const CSignKeyLite& key,
+                              const CAnalyseOptions& options) {
     TChordStringParse parse;
     parse.mBeatsPerBar = options.mBeatsPerBar;
     parse.mBeatsPerChord = options.mBeatsPerChord;
@@ -227,49 +201,47 @@ TStatus AnalyseText(const CTypedSong& typed, const CSignKeyLite& key,
     CTypedChords reading = options.mReading;
     if (options.mFormat.Format() == TFormat::Native) reading.UseNative();
     reading.UseKey(key);
-    auto song = reading.ReadSongOrFail(typed, parse);
-    if (!song) return TStatus::BadInput;
-    StateKey(key, *song);
-    analysed.mSong = std::move(*song);
-    analysed.mAnalyse = FindCenters(analysed.mSong, RouteOf(options.mRoute));
-    analysed.mSymbols = CChordSymbols(analysed.mSong.mSymbols, analysed.mSong.mChords);
-    return TStatus::Success;
+    return reading.ReadSongOrFail(typed, parse);
 }
 
-/// Reads a score in the timing that is asked for. Without one the error has been printed.
-void ReadScore(const CTypedSong& typed, const CAnalyseOptions& options, CAnalysedSong& analysed) {
+/// JSON and the native form show chords without a place in time, too.
+bool HasTimesFor(TFormat format, const CAnalysedSong& analysed) {
+    if (format == TFormat::Json || format == TFormat::Native) return true;
+    return analysed.mSheet ? HasTimes(*analysed.mSheet) : HasTimes(analysed.mSong);
+}
+
+/// Reads a score in the timing that is asked for. Nothing after an error, which has been printed.
+std::optional<CAnalysedSong> ReadScoreInTiming(const CTypedSong& typed,
+                                               const CAnalyseOptions& options) {
+    CAnalysedSong analysed;
     if (options.mTiming == "native") {
-        analysed.mSheet = ReadLeadSheet(typed, TTiming::Native);
+        analysed.mSheet = ReadHarmonies(typed, TLeadSheetTiming::Native);
+        if (!analysed.mSheet) return std::nullopt;
         analysed.mSong = options.mReading.ReadSource(typed.mText, {});
-    } else if (auto read = ReadPlayedSheet(typed)) {
-        analysed.mSheet = std::move(read->mSheet);
-        analysed.mSong = std::move(read->mSong);
+    } else {
+        auto song = ReadScore(typed);
+        if (!song) return std::nullopt;
+        analysed.mSong = std::move(*song);
     }
+    if (!HasTimesFor(options.mFormat.Format(), analysed)) {
+        Fail(TStatus::BadInput,
+             fmt::format("{}: in this timing some chords have no length; --format json shows them",
+                         Printable(typed.mName)));
+        return std::nullopt;
+    }
+    if (analysed.mSheet || analysed.mSong.mChords.size() >= 2) return analysed;
+    FailWithoutChords(typed);
+    return std::nullopt;
 }
 
-TStatus AnalyseScore(const CTypedSong& typed, const CSignKeyLite& key,
-                     const CAnalyseOptions& options, CAnalysedSong& analysed) {
-    ReadScore(typed, options, analysed);
-    if (!analysed.mSheet) return TStatus::BadInput;
-    TMusicXMLDoc& sheet = *analysed.mSheet;
-    const TFormat format = options.mFormat.Format();
-    if ((format == TFormat::Text || format == TFormat::Svg) && !HasTimes(sheet)) {
-        return Fail(
-            TStatus::BadInput,
-            fmt::format("{}: in this timing some chords have no length; --format json shows "
-                        "them",
-                        Printable(typed.mName)));
-    }
-    if (options.mTiming == "played" && analysed.mSong.mChords.size() < 2) {
-        return FailWithoutChords(typed);
-    }
-    StateKey(key, analysed.mSong);
-    if (!key.IsUndef()) sheet.HarmSignKeys = analysed.mSong.mStatedKeys;
-    CHarmonicAnalyse& analyse = analysed.mAnalyse;
-    analyse.AnalyseFromMusicXMLDoc(sheet, RouteOf(options.mRoute));
-    analyse.mChords = WithRests(analyse.mChords, sheet);
-    analysed.mSymbols = CChordSymbols(sheet, analyse.mChords);
-    return TStatus::Success;
+std::optional<CAnalysedSong> ReadAnySong(const CTypedSong& typed, const CSignKeyLite& key,
+                                         const CAnalyseOptions& options) {
+    if (typed.mIsScore) return ReadScoreInTiming(typed, options);
+    auto song = ReadText(typed, key, options);
+    if (!song) return std::nullopt;
+    CAnalysedSong analysed;
+    analysed.mSong = std::move(*song);
+    return analysed;
 }
 
 void ReadHarmonyOf(CAnalysedSong& analysed, const CSignKeyLite& key,
@@ -284,19 +256,15 @@ void ReadHarmonyOf(CAnalysedSong& analysed, const CSignKeyLite& key,
 
 TSongOutput AnalysisOf(const CTypedSong& typed, const CSignKeyLite& key,
                        const CAnalyseOptions& options) {
-    CAnalysedSong analysed;
-    const TStatus status = typed.mIsScore ? AnalyseScore(typed, key, options, analysed)
-                                          : AnalyseText(typed, key, options, analysed);
-    if (status != TStatus::Success) return status;
-    ReadHarmonyOf(analysed, key, options);
+    auto analysed = ReadAnySong(typed, key, options);
+    if (!analysed) return TStatus::BadInput;
+    StateKey(key, analysed->mSong);
+    if (analysed->mSheet) StateKey(key, *analysed->mSheet);
+    ReadHarmonyOf(*analysed, key, options);
     if (IsLeadSheet(options)) {
-        return options.mSheetPicture.Draw(analysed.mSong, analysed.mReading);
+        return options.mSheetPicture.Draw(analysed->mSong, analysed->mReading);
     }
-    if (options.mReadings) {
-        analysed.mReadings =
-            CAnalyseHarmCenterAlternatives(analysed.mAnalyse.mChords).BestResults();
-    }
-    return Present(analysed, options);
+    return Present(*analysed, options);
 }
 
 TStatus Analyse(const CAnalyseOptions& options) {

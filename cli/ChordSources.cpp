@@ -3,14 +3,12 @@
 
 #include "cli/Input.h"
 
-#include "brindle/analysis/CHarmAnlsChords.h"
 #include "brindle/platform/AtomicFile.h"
 #include "brindle/song/LearnSong.h"
 
 #include <fmt/format.h>
 
 #include <algorithm>
-#include <cmath>
 #include <filesystem>
 #include <utility>
 
@@ -23,14 +21,6 @@ constexpr std::size_t kMaxFileBytes = std::size_t{64} << 20;
 
 CChordSource Failed(std::string error) {
     return {{}, std::move(error)};
-}
-
-bool HasEndlessChord(const CSong& song) {
-    for (std::size_t ix = 0; ix + 1 < song.mChords.size(); ++ix) {
-        const double length = song.mChords[ix + 1].mPosition - song.mChords[ix].mPosition;
-        if (!song.mChords[ix].IsUndef() && !std::isfinite(length)) return true;
-    }
-    return false;
 }
 
 CChordSource FromSong(const CSong& song) {

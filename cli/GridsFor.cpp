@@ -40,15 +40,14 @@ struct CGridsForOptions {
     CFormatOptions mFormat;
 };
 
-std::vector<CSongFingerings> SongsOf(std::span<const CChordLite> chords,
-                                     const GChShortTuning& tuning,
-                                     const CGridsForOptions& options) {
-    CSongFingeringOptions song;
-    song.mFingering = options.mFingering.Options();
-    song.mHighestCapo = options.mHighestCapo;
-    if (options.mCapo == kEasiestCapo) return CompareCapos(chords, tuning, song);
-    song.mFingering.mCapo = options.mCapo;
-    return {ChooseFingerings(chords, tuning, song)};
+CShownSongGrids ChosenGrids(const CSong& song, const GChShortTuning& tuning,
+                            const CGridsForOptions& options) {
+    CSongFingeringOptions choice;
+    choice.mFingering = options.mFingering.Options();
+    choice.mHighestCapo = options.mHighestCapo;
+    const bool isTold = options.mCapo != kEasiestCapo;
+    if (isTold) choice.mFingering.mCapo = options.mCapo;
+    return MakeSongGrids(song, tuning, choice, isTold ? TSongCapo::Told : TSongCapo::Easiest);
 }
 
 TSongOutput GridsOf(const CTypedSong& typed, const GChShortTuning& tuning,
@@ -58,13 +57,7 @@ TSongOutput GridsOf(const CTypedSong& typed, const GChShortTuning& tuning,
     parse.mBeatsPerChord = options.mBeatsPerChord;
     const auto song = options.mReading.ReadSongOrFail(typed, parse);
     if (!song) return TStatus::BadInput;
-    std::vector<CChordLite> chords;
-    std::vector<std::string> symbols;
-    for (std::size_t i = 0; i + 1 < song->mChords.size(); ++i) {
-        chords.push_back(song->mChords[i]);
-        symbols.push_back(i < song->mSymbols.size() ? Printable(song->mSymbols[i]) : "");
-    }
-    const CShownSongGrids shown = MakeSongGrids(chords, symbols, SongsOf(chords, tuning, options));
+    const CShownSongGrids shown = ChosenGrids(*song, tuning, options);
     const CGridStyle style = options.mFingering.Style();
     switch (options.mFormat.Format()) {
         case TFormat::Json:

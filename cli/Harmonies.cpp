@@ -64,8 +64,9 @@ TChordEvery EveryOf(const std::string& word) {
 }
 
 TSongOutput HarmoniesOf(const CTypedSong& score, const CHarmoniesOptions& options) {
-    const TTiming timing = options.mTiming == "native" ? TTiming::Native : TTiming::Played;
-    const auto sheet = ReadLeadSheet(score, timing);
+    const bool isNative = options.mTiming == "native";
+    const auto sheet =
+        ReadHarmonies(score, isNative ? TLeadSheetTiming::Native : TLeadSheetTiming::Played);
     if (!sheet) return TStatus::BadInput;
     if (options.mFormat.Format() == TFormat::Chords) return ChordText(*sheet, score.mName);
     const bool isJson = options.mFormat.Format() == TFormat::Json;

@@ -5,10 +5,7 @@
 #include "cli/Message.h"
 #include "cli/Output.h"
 
-#include "brindle/musicxml/ScoreContainer.h"
 #include "brindle/platform/Ascii.h"
-#include "brindle/platform/Error.h"
-#include "brindle/platform/XmlStreamParser.h"
 #include "brindle/song/ReadSong.h"
 
 #include <fmt/format.h>
@@ -33,23 +30,9 @@ bool HasScoreName(std::string_view name) {
     return ending == ".musicxml" || ending == ".xml" || ending == ".mxl";
 }
 
-std::optional<TMusicXMLDoc> Unreadable(const CTypedSong& song, std::string_view reason) {
-    TellScoreFault(song.mText, song.mName, reason);
+std::nullopt_t FailForScore(const CTypedSong& typed, const CTextFault& fault) {
+    TellScoreFault(typed.mText, typed.mName, FaultWithPlace(fault));
     return std::nullopt;
-}
-
-// The library tells only that it cannot read a plain score; what reads its XML, or reads it in the
-// other way, tells why. The other way is more lenient: it reads on behind blanks and wrong
-// encodings.
-std::string FaultOf(std::string_view bytes) {
-    XmlStreamParser parser;
-    if (!IsScoreContainer(bytes) && !parser.parse(bytes)) {
-        const XmlError& fault = *parser.parserError();
-        return fmt::format("{}:{}: {}", fault.mLine, fault.mColumn, fault.mDescription);
-    }
-    Error error;
-    if (TMusicXMLDoc().LoadAsPlayedFromBytes(bytes, &error)) return "the score cannot be laid out";
-    return error.description;
 }
 
 }  // namespace
@@ -116,33 +99,19 @@ std::optional<CTypedSong> ReadTypedSong(const CSongSource& source) {
     return song;
 }
 
-std::optional<TMusicXMLDoc> ReadLeadSheet(const CTypedSong& song, TTiming timing) {
-    TMusicXMLDoc sheet;
-    if (timing == TTiming::Played) {
-        Error error;
-        if (!sheet.LoadAsPlayedFromBytes(song.mText, &error)) {
-            return Unreadable(song, error.description);
-        }
-        return sheet;
-    }
-    std::optional<std::string> unpacked;
-    if (IsScoreContainer(song.mText)) {
-        unpacked = ScoreInContainer(song.mText);
-        if (!unpacked) return Unreadable(song, FaultOf(song.mText));
-    }
-    const std::string& bytes = unpacked ? *unpacked : song.mText;
-    if (!sheet.LoadFromMusicXML(bytes)) return Unreadable(song, FaultOf(bytes));
-    return sheet;
+std::optional<CSong> ReadScore(const CTypedSong& typed) {
+    // What is called a score is read as one, whatever it looks like.
+    const bool isSeen = HasScoreBytes(typed.mText);
+    CSong song =
+        ReadSong(typed.mText, {.mFormat = isSeen ? TSongFormat_Auto : TSongFormat_MusicXml});
+    if (song.HasFault()) return FailForScore(typed, song.mFaults.front());
+    return song;
 }
 
-std::optional<CSheetSong> ReadPlayedSheet(const CTypedSong& song) {
-    CSheetSong sheet = ReadSheetSong(song.mText);
-    if (!sheet.mSong.HasFault()) return sheet;
-    const CSongFault& fault = sheet.mSong.mFaults.front();
-    const std::string place =
-        fault.mLine > 0 ? fmt::format("{}:{}: ", fault.mLine, fault.mColumn) : "";
-    TellScoreFault(song.mText, song.mName, place + fault.mText);
-    return std::nullopt;
+std::optional<TMusicXMLDoc> ReadHarmonies(const CTypedSong& typed, TLeadSheetTiming timing) {
+    CLeadSheetReading read = ReadLeadSheet(typed.mText, timing);
+    if (read.mFault) return FailForScore(typed, *read.mFault);
+    return std::move(read.mSheet);
 }
 
 }  // namespace brindle::cli

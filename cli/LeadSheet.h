@@ -3,7 +3,8 @@
 
 #include "cli/Output.h"
 
-#include "brindle/song/ReadSheetSong.h"
+#include "brindle/song/CSong.h"
+#include "brindle/song/ReadLeadSheet.h"
 
 #include <optional>
 #include <string>
@@ -11,12 +12,6 @@
 #include <vector>
 
 namespace brindle::cli {
-
-/// How the chords of a score are laid out in time.
-enum class TTiming {
-    Played,  ///< as a musician plays the score
-    Native,  ///< as TMusicXMLDoc::LoadFromMusicXMLFile does
-};
 
 /// What the user names or types as a song, not yet understood.
 struct CTypedSong {
@@ -49,12 +44,12 @@ void TellScoreFault(std::string_view bytes, const std::string& name, std::string
 /// Prints that a song has no chords, and what finds them in the notes of a score.
 TStatus FailWithoutChords(const CTypedSong& song);
 
-/// The chords of a score, plain or compressed. Nothing when it cannot be read; then the error has
-/// been printed.
-[[nodiscard]] std::optional<TMusicXMLDoc> ReadLeadSheet(const CTypedSong& song, TTiming timing);
+/// The song of a score, as it is played. Nothing when it cannot be read; then the error has been
+/// printed.
+[[nodiscard]] std::optional<CSong> ReadScore(const CTypedSong& typed);
 
-/// The score as it is played and as a song, read once. Nothing when it cannot be read; then the
-/// error has been printed.
-[[nodiscard]] std::optional<CSheetSong> ReadPlayedSheet(const CTypedSong& song);
+/// The harmonies of a score. Nothing when it cannot be read; then the error has been printed.
+[[nodiscard]] std::optional<TMusicXMLDoc> ReadHarmonies(const CTypedSong& typed,
+                                                        TLeadSheetTiming timing);
 
 }  // namespace brindle::cli

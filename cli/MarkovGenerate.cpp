@@ -66,19 +66,20 @@ std::optional<std::string> Contradiction(const CGenerateOptions& options) {
     return std::nullopt;
 }
 
-std::optional<TMarkovGenerateOptions> OptionsFor(VariableLengthMarkovModel& model,
-                                                 const CGenerateOptions& options) {
-    TMarkovGenerateOptions generate;
-    std::vector<CMarkovObject> wanted;
-    if (options.mTemplate.empty()) {
-        wanted = {CMarkovObject_Gap};
-        wanted.front().mChord.mLength = options.mBeats;
-    } else {
-        const auto symbols = ReadSymbols("--template", options.mTemplate);
-        if (!symbols) return std::nullopt;
-        wanted = *symbols;
-    }
-    generate.mTemplate = model.IteratorSequenceForObjects(wanted);
+/// Nothing if the template cannot be read; then the error has been printed.
+std::optional<TMarkovGenerateOptions> UsualWay(VariableLengthMarkovModel& model,
+                                               const CGenerateOptions& options) {
+    if (options.mTemplate.empty()) return UsualGenerateOptions(model, options.mBeats);
+    const auto wanted = ReadSymbols("--template", options.mTemplate);
+    if (!wanted) return std::nullopt;
+    return UsualGenerateOptions(model, *wanted);
+}
+
+std::optional<TMarkovGenerateOptions> ToldWay(VariableLengthMarkovModel& model,
+                                              const CGenerateOptions& options) {
+    auto usual = UsualWay(model, options);
+    if (!usual) return std::nullopt;
+    TMarkovGenerateOptions& generate = *usual;
     generate.mMaxHistoryLength = options.mOrder;
     generate.mMinHistoryLength = options.mMinOrder;
     generate.mEvidenceHistoryLength = options.mEvidence;
@@ -88,7 +89,7 @@ std::optional<TMarkovGenerateOptions> OptionsFor(VariableLengthMarkovModel& mode
     generate.mAllEqualFactor = options.mAllEqualFactor;
     generate.mSampleCount = options.mSamples;
     generate.Validate(model);
-    return generate;
+    return usual;
 }
 
 /// Whether the file is a plain model: what makes sequences and writes no songs.
@@ -133,7 +134,7 @@ TStatus MarkovGenerate(const CGenerateOptions& options) {
     }
     SetSeed(*model, options.mSeed);
     model->SetSearchLimits({options.mAttempts, kMostSteps});
-    const auto generateOptions = OptionsFor(*model, options);
+    const auto generateOptions = ToldWay(*model, options);
     if (!generateOptions) return TStatus::BadUsage;
     const CMarkovDraws draws = DrawMarkovSequences(*model, *generateOptions);
     if (draws.mSequences.empty()) {

@@ -13,7 +13,6 @@
 
 #include <fmt/format.h>
 
-#include <algorithm>
 #include <memory>
 #include <optional>
 #include <string>
@@ -142,12 +141,9 @@ TNamesOfSets NamesOf(const std::vector<CNotesText>& sets, const CNameOptions& op
 }
 
 /// The name over the root of --root first. Without one there are no names, and that is told.
-void PutRootFirst(std::vector<CNamedChord>& names, const CNameOptions& options) {
-    const auto isOfRoot = [&](const CNamedChord& name) {
-        return name.mRoot.mKeyNr == options.mRootKey.mKeyNr;
-    };
-    std::stable_partition(names.begin(), names.end(), isOfRoot);
-    if (options.mRootKey.IsUndef() || names.empty() || isOfRoot(names.front())) return;
+void TakeRoot(std::vector<CNamedChord>& names, const CNameOptions& options) {
+    if (options.mRootKey.IsUndef() || names.empty()) return;
+    if (PutRootFirst(names, options.mRootKey.mKeyNr)) return;
     static_cast<void>(
         Fail(TStatus::BadInput,
              fmt::format("these notes have no name over {}; --method net names them over any root",
@@ -158,7 +154,7 @@ void PutRootFirst(std::vector<CNamedChord>& names, const CNameOptions& options) 
 /// By how common chords are.
 std::string NameAsPlayed(const std::vector<CNotesText>& sets, const CNameOptions& options) {
     TNamesOfSets names = NamesOf(sets, options);
-    for (auto& ofSet : names) PutRootFirst(ofSet, options);
+    for (auto& ofSet : names) TakeRoot(ofSet, options);
     const CNamedChordStyle style{options.mNaming.PlayersPrefs(), options.mIsExact};
     if (options.mFormat.Format() == TFormat::Json) return NamedChordsJson(names, style);
     return NamedChordsText(names, static_cast<std::size_t>(options.mCandidates), style,

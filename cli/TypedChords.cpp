@@ -70,11 +70,6 @@ void PrintFault(std::string_view text, const CSongFault& fault, bool isWarning,
 
 }  // namespace
 
-std::optional<CSong> ReadScore(const CTypedSong& typed) {
-    auto read = ReadPlayedSheet(typed);
-    return read ? std::optional(std::move(read->mSong)) : std::nullopt;
-}
-
 void PrintFaults(std::string_view text, std::span<const CTextFault> faults, bool areWarnings,
                  std::string_view name) {
     const std::size_t count = std::min(faults.size(), kMostWarnings);

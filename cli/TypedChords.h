@@ -18,10 +18,6 @@ namespace brindle::cli {
 class CCommand;
 struct CTypedSong;
 
-/// The song of a score, as it is played. Nothing when it cannot be read; then the error has been
-/// printed.
-[[nodiscard]] std::optional<CSong> ReadScore(const CTypedSong& typed);
-
 /// Prints faults with their lines and carets under the places, a score of them at most. `name` is
 /// that of the file, empty for what was typed.
 void PrintFaults(std::string_view text, std::span<const CTextFault> faults, bool areWarnings,

@@ -4,7 +4,6 @@
 #include "cli/TypedChords.h"
 #include "cli/TypedSymbols.h"
 
-#include "brindle/analysis/CHarmAnlsChordForMetro.h"
 #include "brindle/analysis/ChordVectorText.h"
 #include "brindle/present/VectorsText.h"
 
@@ -33,39 +32,11 @@ struct CVectorOptions {
     CFormatOptions mFormat;
 };
 
-bool IsVectorText(std::string_view typed) {
-    return !typed.empty() && std::string_view("01[{").find(typed.front()) != typed.npos;
-}
-
-bool IsDigits(std::string_view word) {
-    return word.find_first_not_of("01 ") == word.npos;
-}
-
-std::size_t CountDigits(std::string_view word) {
-    return word.size() - static_cast<std::size_t>(std::count(word.begin(), word.end(), ' '));
-}
-
-// The groups of a vector may come as words of their own, and so do the entries of a list in
-// brackets, which the command line takes apart.
-std::vector<std::string> WithVectorsJoined(const std::vector<std::string>& words) {
-    std::vector<std::string> things;
-    for (const std::string& word : words) {
-        const bool isRest = !things.empty() && IsDigits(word) && IsDigits(things.back()) &&
-                            CountDigits(things.back()) < CHarmAnlsChordForMetro::VectorSize;
-        if (isRest) {
-            things.back() += ' ' + word;
-        } else {
-            things.push_back(word);
-        }
-    }
-    return things;
-}
-
 // A line of standard input is a vector, or chord symbols between white space.
 std::vector<std::string> ThingsIn(const std::vector<std::string>& lines) {
     std::vector<std::string> things;
     for (const std::string& line : lines) {
-        if (IsVectorText(line)) {
+        if (BeginsAsChordVector(line)) {
             things.push_back(line);
         } else {
             const std::vector<std::string> symbols = SymbolsOf(line);
@@ -78,7 +49,7 @@ std::vector<std::string> ThingsIn(const std::vector<std::string>& lines) {
 std::optional<std::vector<std::string>> TypedThings(const std::vector<std::string>& words) {
     if (!AreInputs(words)) {
         const auto things = TypedSymbols(words);
-        return things ? std::optional(WithVectorsJoined(*things)) : std::nullopt;
+        return things ? std::optional(JoinChordVectors(*things)) : std::nullopt;
     }
     const auto lines = TypedLines(words);
     if (!lines) return std::nullopt;
@@ -89,13 +60,14 @@ TStatus Vector(const CVectorOptions& options) {
     const auto things = TypedThings(options.mWords);
     if (!things) return TStatus::BadInput;
     std::vector<std::string> symbols;
-    std::remove_copy_if(things->begin(), things->end(), std::back_inserter(symbols), IsVectorText);
+    std::remove_copy_if(things->begin(), things->end(), std::back_inserter(symbols),
+                        BeginsAsChordVector);
     const auto chords = options.mReading.ReadSymbols(symbols);
     if (!chords) return TStatus::BadInput;
     std::vector<CShownVector> vectors;
     auto chord = chords->begin();
     for (const std::string& typed : *things) {
-        if (!IsVectorText(typed)) {
+        if (!BeginsAsChordVector(typed)) {
             vectors.push_back(ShowVectorOfChord(Printable(typed), *chord++));
             continue;
         }

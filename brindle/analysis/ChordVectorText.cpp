@@ -49,7 +49,33 @@ CChordVectorText ReadJson(std::string_view text) {
     return CheckedCount(std::move(vector));
 }
 
+bool AreDigits(std::string_view word) {
+    return word.find_first_not_of("01 ") == word.npos;
+}
+
+std::size_t CountDigits(std::string_view word) {
+    return word.size() - static_cast<std::size_t>(std::count(word.begin(), word.end(), ' '));
+}
+
 }  // namespace
+
+bool BeginsAsChordVector(std::string_view text) {
+    return !text.empty() && std::string_view("01[{").find(text.front()) != text.npos;
+}
+
+std::vector<std::string> JoinChordVectors(std::span<const std::string> words) {
+    std::vector<std::string> joined;
+    for (const std::string& word : words) {
+        const bool isRest = !joined.empty() && AreDigits(word) && AreDigits(joined.back()) &&
+                            CountDigits(joined.back()) < CHarmAnlsChordForMetro::VectorSize;
+        if (isRest) {
+            joined.back() += ' ' + word;
+        } else {
+            joined.push_back(word);
+        }
+    }
+    return joined;
+}
 
 CChordVectorText ReadChordVector(std::string_view text) {
     const std::size_t first = text.find_first_not_of(kBetween);

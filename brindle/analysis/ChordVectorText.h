@@ -23,6 +23,13 @@ struct CChordVectorText {
 /// or the JSON object that CHarmAnlsChordForMetro writes.
 [[nodiscard]] CChordVectorText ReadChordVector(std::string_view text);
 
+/// Whether somebody who typed this meant a vector and no chord symbol.
+[[nodiscard]] bool BeginsAsChordVector(std::string_view text);
+
+/// The words of a row of vectors and chord symbols with the groups of each vector joined, which may
+/// come as words of their own, as may the entries of a list in brackets.
+[[nodiscard]] std::vector<std::string> JoinChordVectors(std::span<const std::string> words);
+
 /// The digits in groups: special chords, root, basic chord, semitones, bass.
 [[nodiscard]] std::string WriteChordVector(std::span<const float> vector);
 

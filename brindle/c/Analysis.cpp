@@ -3,6 +3,7 @@
 #include "brindle/c/internal/Handles.h"
 #include "brindle/c/internal/Values.h"
 
+#include "brindle/present/AnalysisJson.h"
 #include "brindle/present/AnalysisSvg.h"
 #include "brindle/present/CPaint.h"
 #include "brindle/present/Explain.h"

@@ -68,15 +68,8 @@ const char* FaultOf(const brindle_markov_options& options) {
 
 brindle::TMarkovGenerateOptions OptionsFor(brindle::VariableLengthMarkovModel& model,
                                            const brindle_markov_options& options) {
-    brindle::CMarkovObject gap = brindle::CMarkovObject_Gap;
-    gap.mChord.mLength = options.beats;
-    brindle::TMarkovGenerateOptions generate;
-    generate.mTemplate = model.IteratorSequenceForObjects({gap});
-    generate.mMaxHistoryLength = options.max_order == 0 ? kLongestOrder : options.max_order;
-    generate.mMinHistoryLength = 1;
-    generate.mEvidenceHistoryLength = 1;
-    generate.mAcceptAtMinHistory = true;
-    generate.mAcceptExactFill = true;
+    brindle::TMarkovGenerateOptions generate = UsualGenerateOptions(model, options.beats);
+    if (options.max_order != 0) generate.mMaxHistoryLength = options.max_order;
     generate.mSampleCount = options.samples;
     generate.Validate(model);
     return generate;

@@ -89,6 +89,10 @@ struct CNamedChord {
 [[nodiscard]] std::vector<std::vector<CNamedChord>> NameProgression(
     std::span<const std::vector<CNote>> sets, const CNamingOptions& options = {});
 
+/// Moves the name over a root, a key number, to the front; the others stay in their order. False if
+/// there is none.
+bool PutRootFirst(std::vector<CNamedChord>& names, int root);
+
 /// The symbol of a named chord in a style: letters or syllables, German names, signs, the way of
 /// writing a major seventh, small roots of minor chords, and the text of the slash. `isExact` also
 /// tells what is left out.

@@ -23,4 +23,22 @@ bool TMarkovGenerateOptions::IsValid(const VariableLengthMarkovModel& model) con
            TMarkovSequenceLengthInBeats(mTemplate) > 0.0;
 }
 
+TMarkovGenerateOptions UsualGenerateOptions(VariableLengthMarkovModel& model,
+                                            std::span<const CMarkovObject> wanted) {
+    TMarkovGenerateOptions options;
+    options.mTemplate = model.IteratorSequenceForObjects({wanted.begin(), wanted.end()});
+    options.mMaxHistoryLength = model.mMaxHistoryLength;
+    options.mMinHistoryLength = 1;
+    options.mEvidenceHistoryLength = 1;
+    options.mAcceptAtMinHistory = true;
+    options.mAcceptExactFill = true;
+    return options;
+}
+
+TMarkovGenerateOptions UsualGenerateOptions(VariableLengthMarkovModel& model, double beats) {
+    CMarkovObject gap = CMarkovObject_Gap;
+    gap.mChord.mLength = beats;
+    return UsualGenerateOptions(model, std::span(&gap, 1));
+}
+
 }  // namespace brindle

@@ -4,6 +4,7 @@
 #include "brindle/markov/CMarkovObjects.h"
 
 #include <cstdint>
+#include <span>
 
 namespace brindle {
 
@@ -38,5 +39,12 @@ struct TMarkovGenerateOptions {
     /// Whether the longest and the shortest history and the template can be used as they are.
     [[nodiscard]] bool IsValid(const VariableLengthMarkovModel& model) const;
 };
+
+/// The usual way to a wanted sequence of chords and gaps: all histories that the model has.
+[[nodiscard]] TMarkovGenerateOptions UsualGenerateOptions(VariableLengthMarkovModel& model,
+                                                          std::span<const CMarkovObject> wanted);
+/// The same for any sequence that lasts so many beats.
+[[nodiscard]] TMarkovGenerateOptions UsualGenerateOptions(VariableLengthMarkovModel& model,
+                                                          double beats);
 
 }  // namespace brindle

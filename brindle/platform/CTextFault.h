@@ -2,6 +2,7 @@
 #pragma once
 
 #include <cstddef>
+#include <iosfwd>
 #include <string>
 
 namespace brindle {
@@ -20,5 +21,12 @@ struct CTextFault {
 
     friend bool operator==(const CTextFault&, const CTextFault&) = default;
 };
+
+/// "3:12: no chord symbol", line and column in front; without them where the fault is that of the
+/// whole text.
+[[nodiscard]] std::string FaultWithPlace(const CTextFault& fault);
+
+/// The same.
+std::ostream& operator<<(std::ostream& stream, const CTextFault& fault);
 
 }  // namespace brindle

@@ -2,10 +2,15 @@
 #include "brindle/present/AnalysisJson.h"
 
 #include "brindle/musicxml/TMusicXMLDoc.h"
+#include "brindle/present/CChordSymbols.h"
 #include "brindle/present/JsonValues.h"
 #include "brindle/present/KeysJson.h"
+#include "brindle/present/MakeSongKeys.h"
+#include "brindle/present/ReadingJson.h"
 #include "brindle/present/ShownNames.h"
 #include "brindle/present/ShownText.h"
+#include "brindle/song/AnalyseSong.h"
+#include "brindle/song/SheetTimes.h"
 
 #include <utility>
 
@@ -14,8 +19,8 @@ namespace {
 
 class CAnalysisWriter {
 public:
-    CAnalysisWriter(CJsonWriter& json, const TSymbolOfChord& symbolOf)
-        : mJson(json), mSymbolOf(symbolOf) {}
+    CAnalysisWriter(CJsonWriter& json, const CChordSymbols& symbols)
+        : mJson(json), mSymbols(symbols) {}
 
     template <class TList>
     void WriteList(const TList& list) {
@@ -54,7 +59,7 @@ private:
 
     void Write(const CHarmAnlsChordWithPos& chord, const CHarmCenterLite& center) {
         mJson.BeginObject().Key("Position").Number(chord.mPosition);
-        mJson.Key("Symbol").StringOrNull(mSymbolOf(chord));
+        mJson.Key("Symbol").StringOrNull(mSymbols.SymbolOf(chord));
         WriteKeyEnh(mJson.Key("RootKeyEnh"), chord.mRootKeyEnh);
         WriteKeyEnh(mJson.Key("BassKeyEnh"), chord.mBassKeyEnh);
         WriteSemitones(chord.mSemitones);
@@ -76,7 +81,7 @@ private:
     }
 
     CJsonWriter& mJson;
-    const TSymbolOfChord& mSymbolOf;
+    const CChordSymbols& mSymbols;
 };
 
 void WriteTimes(CJsonWriter& json, const TMusicXMLDoc& sheet) {
@@ -118,25 +123,48 @@ void WriteScore(CJsonWriter& json, const TMusicXMLDoc& sheet) {
     json.EndArray().EndObject();
 }
 
-}  // namespace
-
-std::string AnalysisJson(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings,
-                         const TSymbolOfChord& symbolOf, const CShownKeys& keys,
-                         const TMusicXMLDoc* sheet, const CReadSong* song) {
+/// `sheet` and `read` may be null.
+std::string AnalysisText(const CSongAnalysis& found, const CChordSymbols& symbols,
+                         const TMusicXMLDoc* sheet, const CReadSong* read) {
     CJsonWriter json;
-    CAnalysisWriter writer(json, symbolOf);
+    CAnalysisWriter writer(json, symbols);
     json.BeginObject();
     if (sheet != nullptr) WriteScore(json.Key("Score"), *sheet);
     json.Key("HarmSignKeys");
-    writer.WriteList(analyse.mSignKeys);
-    if (readings != nullptr) {
+    writer.WriteList(found.mAnalyse.mSignKeys);
+    if (found.mHasReadings) {
         json.Key("Readings");
-        writer.WriteList(*readings);
+        writer.WriteList(found.mReadings);
     }
-    WriteKeys(json, keys);
-    if (song != nullptr) WriteReading(json, *song);
+    WriteKeys(json, MakeSongKeys(found, symbols));
+    if (read != nullptr) WriteReading(json, *read);
     json.EndObject();
     return std::move(json).Text();
+}
+
+std::string WithScoreOf(const CSong& song, const CSongAnalysis& found, const CChordSymbols& symbols,
+                        const CReadSong* read) {
+    if (!IsScore(song.mFormat)) return AnalysisText(found, symbols, nullptr, read);
+    const TMusicXMLDoc sheet = SheetWithoutChords(song);
+    return AnalysisText(found, symbols, &sheet, read);
+}
+
+}  // namespace
+
+std::string AnalysisJson(const CSong& song, const CSongAnalysis& found) {
+    const CChordSymbols symbols(song.mSymbols, song.mChords);
+    return WithScoreOf(song, found, symbols, nullptr);
+}
+
+std::string AnalysisJson(const CSong& song, const CSongAnalysis& found, const CSongReading& reading,
+                         std::span<const std::string> explanations) {
+    const CChordSymbols symbols(song.mSymbols, song.mChords);
+    const CReadSong read{song, reading, explanations};
+    return WithScoreOf(song, found, symbols, &read);
+}
+
+std::string AnalysisJson(const TMusicXMLDoc& sheet, const CSongAnalysis& found) {
+    return AnalysisText(found, CChordSymbols(sheet, found.mAnalyse.mChords), &sheet, nullptr);
 }
 
 }  // namespace brindle

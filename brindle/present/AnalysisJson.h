@@ -1,26 +1,26 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "brindle/analysis/CHarmonicAnalyse.h"
-#include "brindle/present/ReadingJson.h"
-#include "brindle/present/ShownSong.h"
-
-#include <functional>
+#include <span>
 #include <string>
 
 namespace brindle {
 
+struct CSong;
+struct CSongAnalysis;
+struct CSongReading;
 struct TMusicXMLDoc;
 
-/// The symbol that stands for a chord of an analysis; empty for none.
-using TSymbolOfChord = std::function<const std::string&(const CHarmAnlsChordWithPos&)>;
+// What AnalyseSong found in a song as strict JSON, see docs/json.md. A score has one more member in
+// front, `Score`.
 
-/// An analysis as strict JSON, see docs/json.md. `readings` and `sheet`, the score that the song
-/// comes from, and `song`, its reading, may be null.
-[[nodiscard]] std::string AnalysisJson(const CHarmonicAnalyse& analyse,
-                                       const CHarmAnlsCenters* readings,
-                                       const TSymbolOfChord& symbolOf, const CShownKeys& keys,
-                                       const TMusicXMLDoc* sheet = nullptr,
-                                       const CReadSong* song = nullptr);
+[[nodiscard]] std::string AnalysisJson(const CSong& song, const CSongAnalysis& found);
+/// The same with the reading of the song; `explanations` is a sentence for each chord, or empty.
+[[nodiscard]] std::string AnalysisJson(const CSong& song, const CSongAnalysis& found,
+                                       const CSongReading& reading,
+                                       std::span<const std::string> explanations = {});
+
+/// The same for what AnalyseSheet found in a score.
+[[nodiscard]] std::string AnalysisJson(const TMusicXMLDoc& sheet, const CSongAnalysis& found);
 
 }  // namespace brindle

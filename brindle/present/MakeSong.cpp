@@ -7,7 +7,6 @@
 #include "brindle/present/ShownNames.h"
 #include "brindle/present/ShownText.h"
 #include "brindle/song/HarmonySymbols.h"
-#include "brindle/song/SheetTimes.h"
 
 #include <fmt/format.h>
 
@@ -102,7 +101,9 @@ std::string TimeName(const TMusicXMLTimeSignature& time) {
     return fmt::format("{}/{}", time.mNumerator, time.mDenominator);
 }
 
-CShownScore ScoreOf(const TMusicXMLDoc& sheet) {
+}  // namespace
+
+CShownScore MakeScore(const TMusicXMLDoc& sheet) {
     CShownScore score;
     score.mTitle = Printable(sheet.Title);
     for (const auto& time : sheet.TimeSignatures) {
@@ -123,18 +124,6 @@ CShownScore ScoreOf(const TMusicXMLDoc& sheet) {
                                  static_cast<std::size_t>(copy.mLengthBars)});
     }
     return score;
-}
-
-}  // namespace
-
-CShownSong MakeSong(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings,
-                    const CChordSymbols& symbols, const TMusicXMLDoc& sheet) {
-    CShownSong song = MakeSong(analyse, readings, symbols, BeatsPerBarOf(sheet));
-    song.mScore = ScoreOf(sheet);
-    for (const CHarmBarline& barline : sheet.HarmBarlines) {
-        song.mBarStarts.push_back(barline.mPosition);
-    }
-    return song;
 }
 
 CShownSong MakeSong(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings,

@@ -15,8 +15,7 @@ struct TMusicXMLDoc;
 [[nodiscard]] CShownSong MakeSong(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings,
                                   const CChordSymbols& symbols, double beatsPerBar);
 
-/// The same for the chords of a score.
-[[nodiscard]] CShownSong MakeSong(const CHarmonicAnalyse& analyse, const CHarmAnlsCenters* readings,
-                                  const CChordSymbols& symbols, const TMusicXMLDoc& sheet);
+/// What a score tells beside its chords.
+[[nodiscard]] CShownScore MakeScore(const TMusicXMLDoc& sheet);
 
 }  // namespace brindle

@@ -4,8 +4,10 @@
 #include "brindle/present/CChordSymbols.h"
 #include "brindle/present/ShownNames.h"
 #include "brindle/present/internal/ReadingNotes.h"
+#include "brindle/song/AnalyseSong.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace brindle {
 namespace {
@@ -27,24 +29,8 @@ CShownKeyRegion ShownRegion(const CSong& song, const CSongReading& reading,
     return shown;
 }
 
-}  // namespace
-
-CShownKeys MakeSongKeys(const CSong& song, const CSongReading& reading) {
-    CShownKeys keys;
-    keys.mKey = reading.mKey;
-    if (!reading.mKey.IsUndef()) keys.mName = reading.mKey.NameLong(NamePrefs());
-    keys.mConfidence = reading.mConfidence;
-    for (const CKeyRegion& region : reading.mRegions) {
-        keys.mRegions.push_back(ShownRegion(song, reading, region));
-    }
-    keys.mNotes = KeyContradictions(song, reading);
-    return keys;
-}
-
-CShownKeys MakeSongKeys(const CHarmAnlsChords& chords, const CChordSymbols& symbols,
-                        const CKeyOptions& options, const CNumeralOptions& numeralOptions) {
-    const CKeyOfSong found = FindKeys(chords, options);
-    const std::vector<std::string> numerals = NumeralsOf(chords, found, numeralOptions);
+CShownKeys ShownKeys(const CHarmAnlsChords& chords, const CChordSymbols& symbols,
+                     const CKeyOfSong& found, const std::vector<std::string>& numerals) {
     CShownKeys keys;
     keys.mKey = found.mKey;
     if (!found.mKey.IsUndef()) keys.mName = found.mKey.NameLong(NamePrefs());
@@ -64,6 +50,30 @@ CShownKeys MakeSongKeys(const CHarmAnlsChords& chords, const CChordSymbols& symb
         keys.mRegions.push_back(std::move(shown));
     }
     return keys;
+}
+
+}  // namespace
+
+CShownKeys MakeSongKeys(const CSong& song, const CSongReading& reading) {
+    CShownKeys keys;
+    keys.mKey = reading.mKey;
+    if (!reading.mKey.IsUndef()) keys.mName = reading.mKey.NameLong(NamePrefs());
+    keys.mConfidence = reading.mConfidence;
+    for (const CKeyRegion& region : reading.mRegions) {
+        keys.mRegions.push_back(ShownRegion(song, reading, region));
+    }
+    keys.mNotes = KeyContradictions(song, reading);
+    return keys;
+}
+
+CShownKeys MakeSongKeys(const CHarmAnlsChords& chords, const CChordSymbols& symbols,
+                        const CKeyOptions& options, const CNumeralOptions& numeralOptions) {
+    const CKeyOfSong found = FindKeys(chords, options);
+    return ShownKeys(chords, symbols, found, NumeralsOf(chords, found, numeralOptions));
+}
+
+CShownKeys MakeSongKeys(const CSongAnalysis& found, const CChordSymbols& symbols) {
+    return ShownKeys(found.mAnalyse.mChords, symbols, found.mKeys, found.mNumerals);
 }
 
 }  // namespace brindle

@@ -4,6 +4,7 @@
 #include "brindle/chords/WriteChordSymbol.h"
 #include "brindle/present/GridsSvg.h"
 #include "brindle/present/GridsText.h"
+#include "brindle/present/ShownText.h"
 #include "brindle/present/internal/GridValues.h"
 
 #include <fmt/format.h>
@@ -101,7 +102,8 @@ CShownSongGrids MakeSongGrids(const CSong& song, const GChShortTuning& tuning,
     const std::size_t count = song.mChords.empty() ? 0 : song.mChords.size() - 1;
     const std::vector<CChordLite> chords(song.mChords.begin(),
                                          song.mChords.begin() + static_cast<std::ptrdiff_t>(count));
-    std::vector<std::string> symbols = song.mSymbols;
+    std::vector<std::string> symbols;
+    for (const std::string& symbol : song.mSymbols) symbols.push_back(Printable(symbol));
     symbols.resize(count);
     const auto found = capo == TSongCapo::Easiest
                            ? CompareCapos(chords, tuning, options)

@@ -2,11 +2,13 @@
 #include "brindle/song/AnalyseSong.h"
 
 #include "brindle/analysis/CAnalyseHarmCenterAlternatives.h"
-#include "brindle/analysis/RomanNumeral.h"
+#include "brindle/musicxml/TMusicXMLDoc.h"
 #include "brindle/musicxml/internal/PlaceChordsOfScore.h"
+#include "brindle/song/SheetTimes.h"
 #include "brindle/song/internal/StatedKey.h"
 
 #include <cstddef>
+#include <utility>
 
 namespace brindle {
 
@@ -25,12 +27,33 @@ void AnalyseScore(const CSong& song, TAnalyse route, CHarmonicAnalyse& analyse) 
     analyse.mChords = song.mChords;
 }
 
+/// What is found beside the centers.
+CSongAnalysis WithAllFound(CHarmonicAnalyse analyse, double beatsPerBar,
+                           const CAnalyseSongOptions& options) {
+    CSongAnalysis found;
+    found.mAnalyse = std::move(analyse);
+    const CHarmAnlsChords& chords = found.mAnalyse.mChords;
+    found.mHasReadings = options.mReadings;
+    if (options.mReadings) found.mReadings = CAnalyseHarmCenterAlternatives(chords).BestResults();
+    if (options.mCopies) found.mCopies = FindCopiedPassages(found.mAnalyse);
+    found.mKeys = FindKeys(chords, {.mBeatsPerBar = beatsPerBar});
+    found.mNumerals = NumeralsOf(chords, found.mKeys, options.mNumerals);
+    return found;
+}
+
 }  // namespace
 
 void StateKey(const CSignKeyLite& key, CSong& song) {
     if (key.IsUndef()) return;
     song.mStatedKeys.clear();
     AppendStatedKey(key, 0.0, song);
+}
+
+void StateKey(const CSignKeyLite& key, TMusicXMLDoc& sheet) {
+    if (key.IsUndef()) return;
+    CSong stated;
+    StateKey(key, stated);
+    sheet.HarmSignKeys = stated.mStatedKeys;
 }
 
 CHarmonicAnalyse FindCenters(const CSong& song, TAnalyse route) {
@@ -45,15 +68,14 @@ CHarmonicAnalyse FindCenters(const CSong& song, TAnalyse route) {
 }
 
 CSongAnalysis AnalyseSong(const CSong& song, const CAnalyseSongOptions& options) {
-    CSongAnalysis found;
-    found.mAnalyse = FindCenters(song, options.mRoute);
-    if (options.mReadings) {
-        found.mReadings = CAnalyseHarmCenterAlternatives(song.mChords).BestResults();
-    }
-    if (options.mCopies) found.mCopies = FindCopiedPassages(found.mAnalyse);
-    found.mKeys = FindKeys(song.mChords, {.mBeatsPerBar = song.mBeatsPerBar});
-    found.mNumerals = NumeralsOf(song.mChords, found.mKeys, {});
-    return found;
+    return WithAllFound(FindCenters(song, options.mRoute), song.mBeatsPerBar, options);
+}
+
+CSongAnalysis AnalyseSheet(const TMusicXMLDoc& sheet, const CAnalyseSongOptions& options) {
+    CHarmonicAnalyse analyse;
+    analyse.AnalyseFromMusicXMLDoc(sheet, options.mRoute);
+    analyse.mChords = WithRests(analyse.mChords, sheet);
+    return WithAllFound(std::move(analyse), BeatsPerBarOf(sheet), options);
 }
 
 }  // namespace brindle

@@ -45,6 +45,14 @@ std::vector<CHarmAnlsChordsWithLength> ChordSequencesOf(const CSong& song) {
     return sequences;
 }
 
+bool HasEndlessChord(const CSong& song) {
+    for (std::size_t ix = 0; ix + 1 < song.mChords.size(); ++ix) {
+        const double length = song.mChords[ix + 1].mPosition - song.mChords[ix].mPosition;
+        if (!song.mChords[ix].IsUndef() && !std::isfinite(length)) return true;
+    }
+    return false;
+}
+
 void LearnChords(VariableLengthMarkovModel& model, const CHarmAnlsChordsWithLength& chords) {
     std::vector<CMarkovObject> symbols;
     MarkovObjectsVectorForHarmChords(chords, symbols);

@@ -16,6 +16,10 @@ class VariableLengthMarkovModel;
 /// no number above 0 are left out.
 [[nodiscard]] std::vector<CHarmAnlsChordsWithLength> ChordSequencesOf(const CSong& song);
 
+/// Whether a chord has a length that is no number, as chord strings may tell; such a song is hardly
+/// one to learn from.
+[[nodiscard]] bool HasEndlessChord(const CSong& song);
+
 /// Learns one sequence.
 void LearnChords(VariableLengthMarkovModel& model, const CHarmAnlsChordsWithLength& chords);
 

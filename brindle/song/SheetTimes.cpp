@@ -2,9 +2,12 @@
 #include "brindle/song/SheetTimes.h"
 
 #include "brindle/musicxml/TMusicXMLDoc.h"
+#include "brindle/song/CSong.h"
 #include "brindle/song/HarmonySymbols.h"
 
 #include <algorithm>
+#include <cstddef>
+#include <cstdint>
 #include <map>
 
 namespace brindle {
@@ -12,6 +15,8 @@ namespace brindle {
 namespace {
 
 constexpr double kUsualBeatsPerBar = 4.0;
+// No song is as long.
+constexpr double kEndOfTime = 1e9;
 
 double BarLength(const TMusicXMLTimeSignature& time) {
     if (time.mNumerator < 1 || time.mDenominator < 1) return 0.0;
@@ -30,13 +35,53 @@ double CommonBarLength(const std::vector<CHarmBarline>& barlines) {
     return most == counts.end() ? 0.0 : most->first;
 }
 
+void AppendTimes(const CSong& song, TMusicXMLDoc& sheet) {
+    CSongTime time;
+    for (const CSongBar& bar : song.mBars) {
+        if (bar.mTime == CSongTime() || bar.mTime == time) continue;
+        time = bar.mTime;
+        sheet.TimeSignatures.push_back({bar.mPosition, time.mNumerator, time.mDenominator});
+    }
+}
+
+std::ptrdiff_t BarAt(const CSong& song, double position) {
+    const auto bar =
+        std::lower_bound(song.mBars.begin(), song.mBars.end(), position,
+                         [](const CSongBar& each, double place) { return each.mPosition < place; });
+    return bar - song.mBars.begin();
+}
+
 }  // namespace
 
 bool HasTimes(const TMusicXMLDoc& sheet) {
     return std::all_of(sheet.Harmonies.begin(), sheet.Harmonies.end(), [](const auto& harmony) {
         return harmony.mPosition >= 0.0 && harmony.mDuration >= 0.0 &&
-               harmony.mPosition + harmony.mDuration < 1e9;
+               harmony.mPosition + harmony.mDuration < kEndOfTime;
     });
+}
+
+bool HasTimes(const CSong& song) {
+    return std::all_of(song.mChords.begin(), song.mChords.end(), [](const auto& chord) {
+        return chord.mPosition >= 0.0 && chord.mPosition < kEndOfTime;
+    });
+}
+
+TMusicXMLDoc SheetWithoutChords(const CSong& song) {
+    TMusicXMLDoc sheet;
+    sheet.Title = song.mTitle;
+    AppendTimes(song, sheet);
+    for (const CSongSection& section : song.mSections) {
+        sheet.HarmSections.push_back(
+            {.mPosition = section.mPosition, .mIsFirst = sheet.HarmSections.empty()});
+    }
+    for (const CSongRepeat& repeat : song.mRepeats) {
+        const auto back = BarAt(song, repeat.mPosition) - BarAt(song, repeat.mSourcePosition);
+        sheet.HarmCopies.push_back({.mTargetPos = repeat.mPosition,
+                                    .mSourceOffsetBars = -static_cast<std::int32_t>(back),
+                                    .mLengthBars = repeat.mBarCount});
+    }
+    for (const CSongBar& bar : song.mBars) sheet.HarmBarlines.push_back({bar.mPosition});
+    return sheet;
 }
 
 double EndOf(const TMusicXMLDoc& sheet) {

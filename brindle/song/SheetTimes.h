@@ -5,12 +5,18 @@
 
 namespace brindle {
 
+struct CSong;
 struct TMusicXMLDoc;
 
 // The times of a score that was read as TMusicXMLDoc, in quarter notes.
 
 /// Whether every chord has a place in time; a score read by LoadFromMusicXMLFile may have others.
 [[nodiscard]] bool HasTimes(const TMusicXMLDoc& sheet);
+/// The same for a song; one that lasts longer than anybody plays has none.
+[[nodiscard]] bool HasTimes(const CSong& song);
+
+/// What a song tells beside its chords, as a score tells it: title, times, sections, copies, bars.
+[[nodiscard]] TMusicXMLDoc SheetWithoutChords(const CSong& song);
 
 /// Where the last chord ends.
 [[nodiscard]] double EndOf(const TMusicXMLDoc& sheet);

@@ -11,9 +11,7 @@
 int main(int argc, char** argv) {
     const brindle::CSong song =
         argc > 1 ? brindle::ReadSongFile(argv[1]) : brindle::ReadSong("Dm7 G7 | C");
-    for (const auto& fault : song.mFaults) {
-        std::cerr << fault.mLine << ':' << fault.mColumn << ": " << fault.mText << '\n';
-    }
+    for (const auto& fault : song.mFaults) std::cerr << fault << '\n';
     if (song.HasFault()) return 1;
 
     const brindle::CSongAnalysis found = brindle::AnalyseSong(song);

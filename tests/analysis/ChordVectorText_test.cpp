@@ -68,3 +68,17 @@ TEST_CASE("A chord that was read from a vector gives this vector again") {
         REQUIRE(read.GetChordVectorRepresentation() == chord.GetChordVectorRepresentation());
     }
 }
+
+TEST_CASE("The groups of a vector may be words of their own, between chords and other vectors") {
+    using TWords = std::vector<std::string>;
+    const std::vector<std::string> groups{"000", "100000000000", "1000000", "000000000000",
+                                          "000010000000"};
+    TWords typed{"C/E"};
+    for (int i = 0; i < 2; ++i) typed.insert(typed.end(), groups.begin(), groups.end());
+    typed.emplace_back("G7");
+    CHECK(JoinChordVectors(typed) == TWords{"C/E", kCOverE, kCOverE, "G7"});
+    CHECK(JoinChordVectors(TWords{}).empty());
+    CHECK(BeginsAsChordVector("[0,1]"));
+    CHECK_FALSE(BeginsAsChordVector("C/E"));
+    CHECK_FALSE(BeginsAsChordVector(""));
+}

@@ -3,10 +3,12 @@
 
 #include "brindle/musicxml/TMusicXMLDoc.h"
 #include "brindle/platform/XmlDocument.h"
+#include "brindle/present/AnalysisJson.h"
 #include "brindle/present/AnalysisSvg.h"
 #include "brindle/present/KeysSvg.h"
 #include "brindle/present/MakeSongKeys.h"
 #include "brindle/song/AnalyseSong.h"
+#include "brindle/song/ReadLeadSheet.h"
 #include "brindle/song/ReadSong.h"
 #include "brindle/song/SheetTimes.h"
 
@@ -102,6 +104,38 @@ TEST_CASE("Any song becomes a picture and JSON without a command line") {
     CHECK(even.mBarStarts.empty());
     CHECK_FALSE(even.mHasReadings);
     CHECK(ShownChords(Shown(CSong())).empty());
+}
+
+TEST_CASE("JSON of a score tells its bars, times and repeats, whichever form it was read in") {
+    const std::string score =
+        "<score-partwise><part-list><score-part id='P'/></part-list><part id='P'>"
+        "<measure number='1'><barline location='left'><repeat direction='forward'/></barline>"
+        "<attributes><divisions>1</divisions><time><beats>3</beats><beat-type>4</beat-type></time>"
+        "</attributes><direction><direction-type><rehearsal>A</rehearsal></direction-type>"
+        "</direction><harmony><root><root-step>C</root-step></root><kind>major</kind></harmony>"
+        "<note><rest/><duration>3</duration></note></measure>"
+        "<measure number='2'><harmony><root><root-step>G</root-step></root><kind>dominant</kind>"
+        "</harmony><note><rest/><duration>3</duration></note>"
+        "<barline location='right'><repeat direction='backward'/></barline></measure>"
+        "</part></score-partwise>";
+    const CSong song = ReadSong(score);
+    const auto json = nlohmann::json::parse(AnalysisJson(song, AnalyseSong(song)));
+    CHECK(json.at("Score") ==
+          nlohmann::json::parse(
+              R"({"Bars":[0,3,6,9],"Copies":[{"LengthBars":2,"Position":6,"SourceOffsetBars":-2}],)"
+              R"("Sections":[{"IsFirst":true,"Position":0},{"IsFirst":false,"Position":6}],)"
+              R"("TimeSignatures":[{"Denominator":4,"Numerator":3,"Position":0}],"Title":""})"));
+    const CLeadSheetReading sheet = ReadLeadSheet(score, TLeadSheetTiming::Played);
+    REQUIRE_FALSE(sheet.mFault);
+    CHECK(nlohmann::json::parse(AnalysisJson(sheet.mSheet, AnalyseSheet(sheet.mSheet))) == json);
+    const CSong typed = ReadSong("C | G");
+    CHECK(AnalysisJson(typed, AnalyseSong(typed)).find("\"Score\"") == std::string::npos);
+
+    for (const auto timing : {TLeadSheetTiming::Played, TLeadSheetTiming::Native}) {
+        const CLeadSheetReading broken = ReadLeadSheet("<score-partwise>\n</part>", timing);
+        REQUIRE(broken.mFault);
+        CHECK(FaultWithPlace(*broken.mFault).starts_with("2:"));
+    }
 }
 
 TEST_CASE("The pictures of a song tell a screen reader what they show") {

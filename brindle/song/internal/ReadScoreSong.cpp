@@ -1,8 +1,6 @@
 // SPDX-License-Identifier: MIT
-#include "brindle/musicxml/ScoreContainer.h"
 #include "brindle/musicxml/internal/PlayedScore.h"
 #include "brindle/song/HarmonySymbols.h"
-#include "brindle/song/ReadSheetSong.h"
 #include "brindle/song/internal/SongReaders.h"
 #include "brindle/song/internal/StatedKey.h"
 #include "brindle/song/internal/WrittenSigns.h"
@@ -107,13 +105,5 @@ CSong ReadScoreSong(std::string_view bytes, TSongFormat format) {
 }
 
 }  // namespace SongReaders
-
-CSheetSong ReadSheetSong(std::string_view bytes) {
-    CPlayedScore score = PlayScoreBytes(bytes);
-    const auto format =
-        IsScoreContainer(bytes) ? TSongFormat_CompressedMusicXml : TSongFormat_MusicXml;
-    CSong song = SongReaders::SongOf(score, format);
-    return {std::move(song), std::move(score.mDoc)};
-}
 
 }  // namespace brindle

@@ -3,6 +3,7 @@
 #include "Bind.h"
 #include "SourceSong.h"
 
+#include "brindle/present/AnalysisJson.h"
 #include "brindle/present/AnalysisSvg.h"
 #include "brindle/present/CPaint.h"
 #include "brindle/present/Explain.h"
