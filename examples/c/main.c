@@ -1,7 +1,7 @@
 /* SPDX-License-Identifier: MIT */
 /* A small host program in C: reads a song, from a file in any form or from a text, tells what each
- * chord does, names notes, makes a new sequence in the manner of the song, and writes a blues in the
- * manner of those that come with the library. */
+ * chord does, names notes, makes a new sequence in the manner of the song, and writes a blues in
+ * the manner of those that come with the library. */
 
 #include "brindle/c/brindle.h"
 

@@ -125,7 +125,7 @@ TEST_CASE("A song is written as it was asked for, and by the same seed again") {
     CHECK(WrittenBy(model, options) == text);
     const json told = json::parse(text);
     CHECK(told["Key"] == "Eb major");
-    CHECK(told["Seed"] == std::uint64_t{1} << 63);
+    CHECK(told["Seed"].dump() == "9223372036854775808");
     CHECK(told["Form"] == "ABAB");
     CHECK(told["Chords"].back()["Numeral"].get<std::string>().front() == 'I');
     CHECK(brindle_song_bar_count(song.get()) == 16);
