@@ -9,16 +9,11 @@
 #include "brindle/present/WrittenSongText.h"
 #include "brindle/song/ReadSongHarmony.h"
 #include "brindle/song/SongRequest.h"
-#include "brindle/song/SongStyles.h"
-
-#include <fmt/format.h>
 
 #include <algorithm>
 
 namespace brindle::cli {
 namespace {
-
-constexpr std::uint64_t kMostWrittenBars = 256;
 
 /// What was asked for. Nothing if it cannot be read; then the error has been printed.
 std::optional<CSongRequestReading> ReadRequest(const CWriteOptions& written,
@@ -34,26 +29,11 @@ std::optional<CSongRequestReading> ReadRequest(const CWriteOptions& written,
         Fail(TStatus::BadUsage, "--" + Printable(reading.mFault));
         return std::nullopt;
     }
+    if (!written.mStyle.empty()) reading.mStyle.clear();
     reading.mOptions.mMostQuotedBars = written.mMostQuoted;
     reading.mOptions.mOrder = std::min<std::uint64_t>(settings.mOrder, CSongModel::kLongestHistory);
     reading.mOptions.mSeed = settings.mSeed ? *settings.mSeed : RandomBits();
     return reading;
-}
-
-/// The model that was asked for, or the songs in it that suit the request.
-std::optional<CSongModel> ReadWriterModel(const CWriteOptions& written, const std::string& style) {
-    auto model = ReadSongModelFile(written.mModel, written.mStyle);
-    if (!model || !written.mStyle.empty() || style.empty()) return model;
-    auto ofStyle = ModelOfStyle(*model, style);
-    return ofStyle ? ofStyle : model;
-}
-
-std::string FaultText(const CWrittenSong& song) {
-    if (song.mContradiction.empty()) return song.mFault;
-    return fmt::format("{}: --{}",
-                       song.mContradiction.size() == 1 ? "this wish cannot be met"
-                                                       : "these wishes cannot be met together",
-                       Printable(fmt::format("{}", fmt::join(song.mContradiction, "; --"))));
 }
 
 std::string SongText(const CWrittenSong& song, const CWriteOptions& written,
@@ -93,7 +73,7 @@ void CWriteOptions::AddTo(CCommand& command) {
     command
         .AddOption("--bars", "N", mBars,
                    "Bars of the song (default: 32, those of --sheet, 12 of a blues)")
-        .InRange(std::uint64_t{1}, kMostWrittenBars)
+        .InRange(std::uint64_t{1}, std::uint64_t{kMostWrittenBars})
         .InGroup(group);
     command
         .AddOption("--sheet", "BARS", mSheet,
@@ -111,7 +91,7 @@ void CWriteOptions::AddTo(CCommand& command) {
     command
         .AddOption("--max-quote", "BARS", mMostQuoted,
                    "Longest passage that may stand just so in a song; 0 for any (default: 4)")
-        .InRange(0.0, 1000.0)
+        .InRange(0.0, kLongestQuoteLimit)
         .InGroup(group);
     command.AddFlag("--show-quotes", mShowQuotes, "Tell the longest passage that does, and where")
         .InGroup(group);
@@ -120,10 +100,10 @@ void CWriteOptions::AddTo(CCommand& command) {
 TStatus MarkovWrite(const CWriteOptions& written, const CWriteSettings& settings) {
     const auto request = ReadRequest(written, settings);
     if (!request) return TStatus::BadUsage;
-    const auto model = ReadWriterModel(written, request->mStyle);
+    const auto model = ReadSongModelFile(written.mModel, written.mStyle);
     if (!model) return TStatus::BadInput;
-    const CWrittenSong song = WriteSong(*model, request->mOptions);
-    if (!song.mFault.empty()) return Fail(TStatus::BadUsage, FaultText(song));
+    const CWrittenSong song = WriteRequestedSong(*model, *request);
+    if (!song.mFault.empty()) return Fail(TStatus::BadUsage, WrittenSongFault(song, "--"));
     if (settings.mMidi &&
         !WriteFileAtomically(*settings.mMidi,
                              MidiFileBytes(MidiPieceOfSong(song.mSong, settings.mTempo)))) {

@@ -20,9 +20,10 @@
  * 0 or "" for NULL. Nothing is thrown across this border.
  *
  * Threads. All functions may be called from several threads at once, each on handles of its own. A
- * handle that nobody changes may be read by several threads: songs, analyses, names and grids
- * never change, finding in a grid package or generating with a model counts as change. The three
- * functions that set up the library are to be called before other threads use it.
+ * handle that nobody changes may be read by several threads: songs, analyses, names, grids and
+ * models of songs never change, finding in a grid package or generating with a brindle_markov
+ * counts as change. The three functions that set up the library are to be called before other
+ * threads use it.
  *
  * Enumerators. Where a value goes in or out of a record it is an int, so that any number may come
  * in; one that is no enumerator is an error or counts as 0.
@@ -681,10 +682,55 @@ BRINDLE_API brindle_status brindle_markov_generate(brindle_markov* model,
                                                    const brindle_markov_options* options,
                                                    char** chords);
 
-/* What may come next */
+/* Models of songs: what may come next, and new songs */
 
-/** What songs have in common: which chord follows which in a key. */
+/** What songs have in common: which chord follows which in a key, where in the bar and how long. A
+ * model never changes and may be asked by several threads. */
 typedef struct brindle_song_model brindle_song_model;
+
+/** The model of the songs that come with the library, all or those of a style ("Hymn"); `style` may
+ * be NULL. BRINDLE_ERROR_NOT_FOUND for a style that none of them has. */
+BRINDLE_API brindle_status brindle_song_model_built_in(const char* style,
+                                                       brindle_song_model** model);
+/** The model of `count` songs. BRINDLE_ERROR_INPUT for none, and for one with a fault or without
+ * chords. */
+BRINDLE_API brindle_status brindle_song_model_learn(const brindle_song* const* songs, size_t count,
+                                                    brindle_song_model** model);
+/** The model of the songs of both: so one learns more, or is joined with what is built in. */
+BRINDLE_API brindle_status brindle_song_model_join(const brindle_song_model* model,
+                                                   const brindle_song_model* other,
+                                                   brindle_song_model** joined);
+/** The model of those of its songs that have a style, in small or capital letters.
+ * BRINDLE_ERROR_NOT_FOUND if none has. */
+BRINDLE_API brindle_status brindle_song_model_of_style(const brindle_song_model* model,
+                                                       const char* style,
+                                                       brindle_song_model** of_style);
+/** NULL is allowed. */
+BRINDLE_API void brindle_song_model_free(brindle_song_model* model);
+/** Its songs, each with chords. */
+BRINDLE_API size_t brindle_song_model_song_count(const brindle_song_model* model);
+/** The chords of all its songs together. */
+BRINDLE_API size_t brindle_song_model_chord_count(const brindle_song_model* model);
+/** Its songs with their makers, styles and keys, as strict JSON, the same as the program prints. */
+BRINDLE_API brindle_status brindle_song_model_songs_json(const brindle_song_model* model,
+                                                         char** text);
+/** How well it foretells songs, in bits a chord for histories of each length, as strict JSON, the
+ * same as the program prints. With a `count` of 0, where `songs` may be NULL, its own songs, each
+ * without what it told the model. */
+BRINDLE_API brindle_status brindle_song_model_score_json(const brindle_song_model* model,
+                                                         const brindle_song* const* songs,
+                                                         size_t count, char** text);
+/** The model of a text that brindle_song_model_write gave. BRINDLE_ERROR_INPUT for any other text,
+ * one of another version and a damaged one. */
+BRINDLE_API brindle_status brindle_song_model_read(const char* text, brindle_song_model** model);
+/** The same from a file. */
+BRINDLE_API brindle_status brindle_song_model_read_file(const char* path,
+                                                        brindle_song_model** model);
+/** The text of a model file, which the program reads, too. */
+BRINDLE_API brindle_status brindle_song_model_write(const brindle_song_model* model, char** text);
+/** Replaces the file as a whole. */
+BRINDLE_API brindle_status brindle_song_model_write_file(const brindle_song_model* model,
+                                                         const char* path);
 
 /** What is asked of the next chord. */
 typedef struct brindle_next_options {
@@ -692,24 +738,47 @@ typedef struct brindle_next_options {
     size_t limit;    /**< most chords that are wanted */
     int place;       /**< where it begins: 0 to 3 on the first beat of the first to fourth of four
                           bars, 4 in the middle of a bar, 5 elsewhere */
+    size_t order;    /**< most chords before that are looked at, 1 to 5 */
 } brindle_next_options;
 
-/** A key to be found, 10 chords, the first beat of a first bar. */
+/** A key to be found, 10 chords, the first beat of a first bar, 5 chords before. */
 BRINDLE_API brindle_next_options brindle_next_options_default(void);
-/** The model of the songs that come with the library, all or those of a style ("Hymn"); `style` may
- * be NULL. BRINDLE_ERROR_NOT_FOUND for a style that none of them has. */
-BRINDLE_API brindle_status brindle_song_model_built_in(const char* style,
-                                                       brindle_song_model** model);
-/** NULL is allowed. */
-BRINDLE_API void brindle_song_model_free(brindle_song_model* model);
 /** The chords that may come behind `count` chords, the likeliest first, with their probability,
  * numeral and function; behind none, what a song in the key begins with. As strict JSON, the same
- * as the program prints. `options` may be NULL for the default. A model may be asked by several
- * threads. */
+ * as the program prints. `options` may be NULL for the default. */
 BRINDLE_API brindle_status brindle_song_model_next_json(const brindle_song_model* model,
                                                         const brindle_chord* chords, size_t count,
                                                         const brindle_next_options* options,
                                                         char** text);
+
+/** What song is to be written. NULL in place of a text asks for nothing, and so does "". */
+typedef struct brindle_write_options {
+    brindle_key key;         /**< of the song; its parts may leave it */
+    const char* form;        /**< a letter for each part, "AABA", or "blues" */
+    size_t bars;             /**< 1 to 256; 0 for those of the sheet or the usual ones, 12 or 32 */
+    int beats_per_bar;       /**< 1 to 24 */
+    const char* sheet;       /**< chords that are fixed, and _ for gaps: "C . Am . | _ | G7" */
+    const char* begins;      /**< the first chord, or its numeral */
+    const char* ends;        /**< the last one; a chord on the tonic if it is not told */
+    const char* contains;    /**< rows of chords that stand somewhere, "ii-V-I of F", between ; */
+    const char* never;       /**< chords or numerals that do not occur */
+    double most_quoted_bars; /**< longest passage that may stand just so in a song of the model, 0
+                                  to 1000; 0 for any */
+    size_t order;            /**< longest history, 1 to 5 chords */
+    uint64_t seed;           /**< the same seed, model and wishes give the same song */
+} brindle_write_options;
+
+/** C major, 4 beats a bar, 4 bars of quotes, histories of 5 chords, seed 0, and no wishes. */
+BRINDLE_API brindle_write_options brindle_write_options_default(void);
+/** Writes a new song in the manner of a model; a blues after its songs of that style, if it has
+ * any. `json`, which may be NULL, receives the song as strict JSON, the same as the program prints,
+ * with its longest quote. `options` may be NULL for the default. BRINDLE_ERROR_ARGUMENT for a
+ * number out of range, BRINDLE_ERROR_INPUT for wishes that are not understood, and
+ * BRINDLE_ERROR_NOT_FOUND if there is no such song; the error names a smallest set of wishes that
+ * contradict each other. */
+BRINDLE_API brindle_status brindle_song_model_write_song(const brindle_song_model* model,
+                                                         const brindle_write_options* options,
+                                                         brindle_song** song, char** json);
 
 /* Scores in MusicXML, plain or compressed */
 

@@ -40,6 +40,10 @@ CJsonWriter& CJsonWriter::Integer(std::int64_t value) {
     return Scalar(fmt::format_int(value).c_str());
 }
 
+CJsonWriter& CJsonWriter::Count(std::uint64_t value) {
+    return Scalar(fmt::format("{}", value));
+}
+
 CJsonWriter& CJsonWriter::Number(double value) {
     if (value == kPosUndef || !std::isfinite(value)) return Null();
     const bool isWhole = std::abs(value) < kLargestPlainNumber && std::floor(value) == value;

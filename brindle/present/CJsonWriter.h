@@ -40,6 +40,7 @@ public:
     CJsonWriter& Bool(bool value) { return Scalar(value ? "true" : "false"); }
     /// All digits, which readers with floating numbers round beyond 2^53.
     CJsonWriter& Integer(std::int64_t value);
+    CJsonWriter& Count(std::uint64_t value);  ///< the same for what may be beyond 2^63
     /// The shortest form that reads back as the same number, "1.0" for a whole one. Null for an
     /// infinite number, for no number and for an undefined position.
     CJsonWriter& Number(double value);

@@ -31,6 +31,8 @@ void Write(CJsonWriter& writer, const Json& json) {
         writer.String(json.get_ref<const std::string&>());
     } else if (json.is_boolean()) {
         writer.Bool(json.get<bool>());
+    } else if (json.is_number_unsigned()) {
+        writer.Count(json.get<std::uint64_t>());
     } else if (json.is_number_integer()) {
         writer.Integer(json.get<std::int64_t>());
     } else if (json.is_number()) {

@@ -81,6 +81,16 @@ std::string QuoteText(const CWrittenQuote& quote) {
                        ShortNumber(std::floor(quote.mSourceBar)));
 }
 
+std::string WrittenSongFault(const CWrittenSong& written, std::string_view sign) {
+    const auto& wishes = written.mContradiction;
+    if (wishes.empty()) return written.mFault;
+    const std::string between = fmt::format("; {}", sign);
+    return fmt::format(
+        "{}: {}{}",
+        wishes.size() == 1 ? "this wish cannot be met" : "these wishes cannot be met together",
+        sign, Printable(fmt::format("{}", fmt::join(wishes, between))));
+}
+
 std::string WrittenSongJson(const CWrittenSong& written, const std::string& form,
                             std::uint64_t seed) {
     const CSong& song = written.mSong;

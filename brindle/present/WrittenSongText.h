@@ -6,6 +6,7 @@
 
 #include <cstdint>
 #include <string>
+#include <string_view>
 
 namespace brindle {
 
@@ -15,6 +16,10 @@ namespace brindle {
 
 /// "the longest quote: 2.5 bars from bar 5 on are bars 1 to 3 of Amazing Grace"; empty for none.
 [[nodiscard]] std::string QuoteText(const CWrittenQuote& quote);
+
+/// Why there is no song, with the wishes that cannot be met together; `sign` stands before each of
+/// them, as before an option. Empty if the song was written.
+[[nodiscard]] std::string WrittenSongFault(const CWrittenSong& written, std::string_view sign = {});
 
 /// The song with the reading of its chords as JSON; docs/json.md has the members.
 [[nodiscard]] std::string WrittenSongJson(const CWrittenSong& written, const std::string& form,

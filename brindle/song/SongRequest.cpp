@@ -2,6 +2,7 @@
 #include "brindle/song/SongRequest.h"
 
 #include "brindle/platform/Ascii.h"
+#include "brindle/song/SongStyles.h"
 
 #include <fmt/format.h>
 
@@ -42,8 +43,11 @@ public:
     [[nodiscard]] CSongRequestReading Read() {
         mReading.mOptions.mKey = mRequest.mKey;
         mReading.mOptions.mBeatsPerBar = mRequest.mBeatsPerBar;
-        // A sheet counts beats.
-        if (mRequest.mBeatsPerBar < 1) return mReading;
+        // Wishes are counted in beats and bars; WriteSong tells that these are none.
+        if (!AreWritable()) {
+            if (mRequest.mBars > 0) mReading.mOptions.mBars = mRequest.mBars;
+            return mReading;
+        }
         CSongWishReading sheet;
         if (!mRequest.mSheet.empty()) {
             sheet = ReadSheetWishes(mRequest.mSheet, mRequest.mBeatsPerBar);
@@ -62,6 +66,10 @@ public:
     }
 
 private:
+    [[nodiscard]] bool AreWritable() const {
+        return mRequest.mBeatsPerBar >= 1 && mRequest.mBeatsPerBar <= kMostWrittenBeatsPerBar &&
+               mRequest.mBars <= kMostWrittenBars;
+    }
     void ReadForm(std::size_t sheetBars) {
         std::size_t& bars = mReading.mOptions.mBars;
         bars = mRequest.mBars;
@@ -120,6 +128,17 @@ private:
 
 CSongRequestReading ReadSongRequest(const CSongRequest& request) {
     return CRequestReader(request).Read();
+}
+
+CWrittenSong WriteRequestedSong(const CSongModel& model, const CSongRequestReading& request) {
+    if (!request.mFault.empty()) {
+        CWrittenSong refused;
+        refused.mFault = request.mFault;
+        return refused;
+    }
+    if (request.mStyle.empty()) return WriteSong(model, request.mOptions);
+    const auto ofStyle = ModelOfStyle(model, request.mStyle);
+    return WriteSong(ofStyle ? *ofStyle : model, request.mOptions);
 }
 
 }  // namespace brindle

@@ -41,4 +41,9 @@ struct CSongRequestReading {
 /// form, tells WriteSong.
 [[nodiscard]] CSongRequestReading ReadSongRequest(const CSongRequest& request);
 
+/// Writes what was read, after the songs of its style where the model has any. What is wrong with
+/// the request is wrong with the song.
+[[nodiscard]] CWrittenSong WriteRequestedSong(const CSongModel& model,
+                                              const CSongRequestReading& request);
+
 }  // namespace brindle

@@ -15,8 +15,6 @@
 namespace brindle {
 namespace {
 
-constexpr std::size_t kLongestSong = 256;
-constexpr int kMostBeatsPerBar = 24;
 // Songs that quote too much are rarely left without a way.
 constexpr int kMostTries = 20;
 
@@ -156,12 +154,8 @@ CWrittenQuote QuoteOf(const CSongModel& model, std::span<const CQuotedChord> row
 std::string FaultOf(const CSongModel& model, const CWriteSongOptions& options) {
     if (model.IsEmpty()) return "the model has learned nothing";
     if (options.mKey.IsUndef()) return "the key is none";
-    if (options.mBars == 0 || options.mBars > kLongestSong) {
-        return fmt::format("a song has 1 to {} bars", kLongestSong);
-    }
-    if (options.mBeatsPerBar < 1 || options.mBeatsPerBar > kMostBeatsPerBar) {
-        return fmt::format("a bar has 1 to {} beats", kMostBeatsPerBar);
-    }
+    std::string range = RangeFaultOf(options);
+    if (!range.empty()) return range;
     if (PartsOfForm(options.mForm, options.mBars).empty()) {
         return fmt::format("a form is letters from A to Z that share {} bars evenly",
                            options.mBars);
@@ -176,6 +170,22 @@ CWrittenSong RefusedSong(std::string fault) {
 }
 
 }  // namespace
+
+std::string RangeFaultOf(const CWriteSongOptions& options) {
+    if (options.mBars == 0 || options.mBars > kMostWrittenBars) {
+        return fmt::format("a song has 1 to {} bars", kMostWrittenBars);
+    }
+    if (options.mBeatsPerBar < 1 || options.mBeatsPerBar > kMostWrittenBeatsPerBar) {
+        return fmt::format("a bar has 1 to {} beats", kMostWrittenBeatsPerBar);
+    }
+    if (!(options.mMostQuotedBars >= 0.0 && options.mMostQuotedBars <= kLongestQuoteLimit)) {
+        return fmt::format("the longest quote has 0 to {} bars", kLongestQuoteLimit);
+    }
+    if (options.mOrder < 1 || options.mOrder > CSongModel::kLongestHistory) {
+        return fmt::format("histories have 1 to {} chords", CSongModel::kLongestHistory);
+    }
+    return {};
+}
 
 CWrittenSong WriteSong(const CSongModel& model, const CWriteSongOptions& options) {
     CWrittenSong result = RefusedSong(FaultOf(model, options));

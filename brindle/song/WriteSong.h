@@ -12,6 +12,10 @@
 
 namespace brindle {
 
+inline constexpr std::size_t kMostWrittenBars = 256;  ///< of a song that is written
+inline constexpr int kMostWrittenBeatsPerBar = 24;    ///< of its bars
+inline constexpr double kLongestQuoteLimit = 1000.0;  ///< bars, beyond any song
+
 /// What song is to be written.
 struct CWriteSongOptions {
     CSignKeyLite mKey{{0, TEnh_n}, TSignKeyType_Major};  ///< of the song; its parts may leave it
@@ -32,6 +36,9 @@ struct CWriteSongOptions {
     /// The same seed writes the same song.
     std::uint64_t mSeed = 0;
 };
+
+/// Which of the numbers is out of its range, a line for people; empty if none is.
+[[nodiscard]] std::string RangeFaultOf(const CWriteSongOptions& options);
 
 /// A passage of a written song that stands just so, in whatever key, in a song of the model.
 struct CWrittenQuote {

@@ -1,6 +1,7 @@
 /* SPDX-License-Identifier: MIT */
 /* A small host program in C: reads a song, from a file in any form or from a text, tells what each
- * chord does, names notes, and makes a new sequence in the manner of the song. */
+ * chord does, names notes, makes a new sequence in the manner of the song, and writes a blues in
+ * the manner of those that come with the library. */
 
 #include "brindle/c/brindle.h"
 
@@ -74,13 +75,32 @@ static int print_new_sequence(const brindle_song* song) {
     return 0;
 }
 
+static int print_new_song(void) {
+    brindle_write_options wishes = brindle_write_options_default();
+    brindle_song_model* model = NULL;
+    brindle_song* song = NULL;
+    char* text = NULL;
+    wishes.form = "blues";
+    if (brindle_key_read("F", &wishes.key) != BRINDLE_OK) return fail("a key");
+    if (brindle_song_model_built_in(NULL, &model) != BRINDLE_OK) return fail("the model");
+    if (brindle_song_model_write_song(model, &wishes, &song, NULL) != BRINDLE_OK) {
+        brindle_song_model_free(model);
+        return fail("writing");
+    }
+    if (brindle_song_chord_pro(song, &text) == BRINDLE_OK) printf("%s", text);
+    brindle_free(text);
+    brindle_song_free(song);
+    brindle_song_model_free(model);
+    return 0;
+}
+
 int main(int argc, char** argv) {
     brindle_song* const song = read_song(argc, argv);
     int status = song == NULL;
     if (song != NULL) {
         print_faults(song);
         status = brindle_song_has_fault(song) || print_reading(song) || print_name_of_notes() ||
-                 print_new_sequence(song);
+                 print_new_sequence(song) || print_new_song();
     }
     brindle_song_free(song);
     return status;

@@ -6,7 +6,7 @@ import { compile } from "json-schema-to-typescript";
 const schemas = fileURLToPath(new URL("../../docs/schema/", import.meta.url));
 const target = new URL("../src/generated/schemas.ts", import.meta.url);
 // What the package gives as JSON, and the name of its type.
-const results = { analyse: "AnalyseJson", grid: "GridJson", "grids-for": "GridsForJson", "markov-next": "MarkovNextJson", "import-line": "ImportLineJson" };
+const results = { analyse: "AnalyseJson", grid: "GridJson", "grids-for": "GridsForJson", "markov-next": "MarkovNextJson", "markov-generate": "MarkovGenerateJson", "markov-songs": "MarkovSongsJson", "markov-score": "MarkovScoreJson", "import-line": "ImportLineJson" };
 
 async function typeOf([file, name]) {
   const schema = JSON.parse(await readFile(`${schemas}${file}.json`, "utf8"));

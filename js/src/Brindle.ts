@@ -13,6 +13,7 @@ import { markovOf, type Markov } from "./Markov.js";
 import { namesOfNotes, type NamedChord, type NamingOptions } from "./names.js";
 import type { Native } from "./Native.js";
 import { NextAsker, type NextChords, type NextOptions } from "./next.js";
+import { songModelOf, type SongModel } from "./SongModel.js";
 import { readSong, type ReadOptions, type Song } from "./Song.js";
 import { keyOf, rawKeyOfText, scaleOf, type Key, type Scale } from "./values.js";
 
@@ -79,6 +80,11 @@ export class Brindle {
   /** An empty model of chord sequences of an order, or the model of a text. */
   markov(from: string | number = usualOrder): Markov {
     return markovOf(this.#native, from);
+  }
+  /** A model that knows what may come next and writes songs: of the songs that come with the library,
+   * of the text of a model file, or of songs. */
+  songModel(from?: string | readonly Song[]): SongModel {
+    return songModelOf(this.#native, from);
   }
   /** What may come behind chords, by the songs that come with the library. */
   next(chords: readonly (Chord | string)[], options: NextOptions = {}): NextChords {

@@ -22,5 +22,6 @@ export type {
 export type { GenerateOptions, Markov } from "./Markov.js";
 export type { NamedChord, NamingOptions } from "./names.js";
 export type { NextChord, NextChords, NextOptions } from "./next.js";
+export type { ModelSong, Quote, SongModel, SongRequest, WrittenSong } from "./SongModel.js";
 export type { Key, Naming, Scale, Style, Tone } from "./values.js";
 export type * from "./generated/schemas.js";

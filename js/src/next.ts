@@ -12,6 +12,8 @@ export interface NextOptions {
   count?: number;
   /** Where it begins: in which of four bars, in the middle of one, or elsewhere. */
   place?: 1 | 2 | 3 | 4 | "middle" | "weak";
+  /** Most chords before that are looked at, 1 to 5; 5 if it is not said. */
+  order?: number;
   /** Of the songs that come with the library: "Hymn", "Blues". */
   style?: string;
 }
@@ -37,6 +39,44 @@ function placeCode(place: NextOptions["place"] = 1): number {
   return place === "weak" ? 5 : place - 1;
 }
 
+const optionsSize = 24;
+
+/** What may come behind chords by the model of a handle. */
+export function nextChords(
+  native: Native,
+  model: number,
+  chords: readonly (Chord | string)[],
+  options: NextOptions,
+): NextChords {
+  const key = rawKeyOfText(native, options.key);
+  const known = chords.map((c) => (typeof c === "string" ? chordOfSymbol(native, c, 0) : c));
+  const json = native.withRoom(optionsSize + chordSize * known.length, (place) => {
+    putKey(new Record(native, place), key)
+      .putInt(options.count ?? 10)
+      .putInt(placeCode(options.place))
+      .putInt(options.order ?? 5);
+    const at = place + optionsSize;
+    const list = new Record(native, at);
+    for (const chord of known) putChord(list, chord.raw);
+    const ask = native.module._brindle_song_model_next_json!;
+    return native.givenText((out) => ask(model, at, known.length, place, out));
+  });
+  return told(native, JSON.parse(json) as MarkovNextJson);
+}
+
+function told(native: Native, json: MarkovNextJson): NextChords {
+  return {
+    key: json.Key === "" ? null : keyOf(native, rawKeyOfText(native, json.Key)),
+    chords: json.Chords.map((next) => ({
+      symbol: next.Symbol,
+      chord: chordOfSymbol(native, next.Symbol, 0),
+      probability: next.Probability,
+      numeral: next.Numeral,
+      function: next.Function,
+    })),
+  };
+}
+
 /** Asks models of the built-in songs, each of which is made once. */
 export class NextAsker {
   readonly #models = new Map<string, number>();
@@ -44,35 +84,7 @@ export class NextAsker {
   constructor(private readonly native: Native) {}
 
   ask(chords: readonly (Chord | string)[], options: NextOptions): NextChords {
-    const { native } = this;
-    const model = this.#model(options.style ?? "");
-    const key = rawKeyOfText(native, options.key);
-    const known = chords.map((c) => (typeof c === "string" ? chordOfSymbol(native, c, 0) : c));
-    const json = native.withRoom(20 + chordSize * known.length, (place) => {
-      putKey(new Record(native, place), key)
-        .putInt(options.count ?? 10)
-        .putInt(placeCode(options.place));
-      const list = new Record(native, place + 20);
-      for (const chord of known) putChord(list, chord.raw);
-      return native.givenText((out) =>
-        native.module._brindle_song_model_next_json!(model, place + 20, known.length, place, out),
-      );
-    });
-    return this.#next(JSON.parse(json) as MarkovNextJson);
-  }
-
-  #next(json: MarkovNextJson): NextChords {
-    const { native } = this;
-    return {
-      key: json.Key === "" ? null : keyOf(native, rawKeyOfText(native, json.Key)),
-      chords: json.Chords.map((next) => ({
-        symbol: next.Symbol,
-        chord: chordOfSymbol(native, next.Symbol, 0),
-        probability: next.Probability,
-        numeral: next.Numeral,
-        function: next.Function,
-      })),
-    };
+    return nextChords(this.native, this.#model(options.style ?? ""), chords, options);
   }
 
   #model(style: string): number {

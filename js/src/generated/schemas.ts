@@ -575,6 +575,124 @@ export interface MarkovNextJson {
 }
 export type MarkovNextJson = MarkovNextJsonSchema.MarkovNextJson;
 
+export namespace MarkovGenerateJsonSchema {
+export type MarkovGenerateJson =
+  | {
+      ChordString: string;
+      Symbols: {
+        Symbol: string;
+        Length?: number;
+        /**
+         * A note with its spelling; null for none.
+         */
+        RootKeyEnh?: null | {
+          Name: string;
+          /**
+           * Semitones above C.
+           */
+          KeyNr: number;
+          Enh:
+            | "triple flat"
+            | "double flat"
+            | "flat"
+            | "neutral"
+            | "sharp"
+            | "double sharp"
+            | "triple sharp"
+            | "undef";
+        };
+        /**
+         * A note with its spelling; null for none.
+         */
+        BassKeyEnh?: null | {
+          Name: string;
+          /**
+           * Semitones above C.
+           */
+          KeyNr: number;
+          Enh:
+            | "triple flat"
+            | "double flat"
+            | "flat"
+            | "neutral"
+            | "sharp"
+            | "double sharp"
+            | "triple sharp"
+            | "undef";
+        };
+        /**
+         * Bit n is the tone n semitones above the root.
+         */
+        Semitones?: number;
+        Intervals?: Intervals;
+        Probability: number | null;
+        NormalizedEntropy: number | null;
+        HistoryLength: number;
+      }[];
+      Sequences: {
+        Share: number;
+        Count: number;
+        LogProbability: number | null;
+        ChordString: string;
+      }[];
+    }
+  | {
+      Key: string;
+      Form: string;
+      Bars: number;
+      BeatsPerBar: number;
+      Seed: number;
+      Text: string;
+      Chords: {
+        Symbol: string;
+        Position: number;
+        Length: number;
+        Section: string;
+        Numeral: string;
+        Function: string;
+      }[];
+      LongestQuote: null | {
+        Title: string;
+        SourceBar: number;
+        Bar: number;
+        Bars: number;
+      };
+    };
+/**
+ * The tones of the mask, ascending.
+ */
+export type Intervals = number[];
+}
+export type MarkovGenerateJson = MarkovGenerateJsonSchema.MarkovGenerateJson;
+
+export namespace MarkovSongsJsonSchema {
+export interface MarkovSongsJson {
+  Chords: number;
+  Songs: {
+    Title: string;
+    Makers: string;
+    Style: string;
+    Key: string;
+    Chords: number;
+  }[];
+}
+}
+export type MarkovSongsJson = MarkovSongsJsonSchema.MarkovSongsJson;
+
+export namespace MarkovScoreJsonSchema {
+export interface MarkovScoreJson {
+  Songs: number;
+  Chords: number;
+  Smoothing: "interpolation";
+  Orders: {
+    Order: number;
+    BitsPerChord: number;
+    BitsPerChordWithoutKeys: number;
+  }[];
+}
+}
+export type MarkovScoreJson = MarkovScoreJsonSchema.MarkovScoreJson;
+
 export namespace ImportLineJsonSchema {
 export interface ImportLineJson {
   /**

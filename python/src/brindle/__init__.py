@@ -48,11 +48,17 @@ from brindle._records import (
     Bar,
     ChordReading,
     Fault,
+    ModelSong,
     NamedChord,
+    NextChord,
+    OrderScore,
+    Quote,
     Region,
     Section,
     SongChord,
+    WrittenSong,
 )
+from brindle._song_models import SongModel
 from brindle._songs import read
 
 __all__ = [
@@ -70,9 +76,13 @@ __all__ = [
     "KeyNameError",
     "MarkovModel",
     "ModelError",
+    "ModelSong",
     "NamedChord",
+    "NextChord",
     "Note",
     "NoteError",
+    "OrderScore",
+    "Quote",
     "Region",
     "Scale",
     "ScaleError",
@@ -81,6 +91,8 @@ __all__ = [
     "Song",
     "SongChord",
     "SongError",
+    "SongModel",
+    "WrittenSong",
     "__version__",
     "analyse_batch",
     "batch_schema",

@@ -2,9 +2,9 @@
 
 from __future__ import annotations
 
-from dataclasses import dataclass
+from dataclasses import dataclass, field
 
-from brindle._native import Chord, Key
+from brindle._native import Chord, Key, Song
 
 
 @dataclass(frozen=True)
@@ -153,3 +153,103 @@ class ChordReading:
     """A dominant of the tonic that is followed by vi or VI instead."""
     explanation: str
     """A sentence, if explanations were asked for."""
+
+
+@dataclass(frozen=True)
+class ModelSong:
+    """A song that a model was made of.
+
+    >>> import brindle
+    >>> brindle.SongModel.learn(["C F | G7 C"]).songs[0].key
+    Key('C Major')
+    """
+
+    title: str
+    """May be empty."""
+    makers: str
+    """With years, of a song that comes with the library; otherwise empty."""
+    style: str
+    """As its source calls it; may be empty."""
+    key: Key
+    """That it was written in."""
+    chord_count: int
+    """How many chords it has, equal neighbours as one."""
+
+
+@dataclass(frozen=True)
+class NextChord:
+    """A chord that may come next.
+
+    >>> import brindle
+    >>> chord = brindle.SongModel.built_in().next_chords(["Dm7", "G7"], key="C")[0]
+    >>> chord.chord, chord.numeral, chord.function
+    (Chord('C'), 'I', 'tonic')
+    """
+
+    chord: Chord
+    """Spelled as in the key."""
+    probability: float
+    """Of all chords that may come, 0 to 1."""
+    numeral: str
+    """What it is behind the chords before."""
+    function: str
+    """What it does there: "tonic", "subdominant", "dominant", "none"."""
+    key: Key
+    """In which that is said: the one that was asked for, or that was found."""
+
+
+@dataclass(frozen=True)
+class Quote:
+    """A passage of a written song that stands just so, in whatever key, in a song of the model.
+
+    >>> import brindle
+    >>> quote = brindle.SongModel.learn(["C F | G7 C | Am Dm | G7 C"]).write_song(bars=4).quote
+    >>> quote is None or quote.bars <= 4
+    True
+    """
+
+    title: str
+    """Of the song it stands in; may be empty."""
+    source_bar: float
+    """Where it stands there, in bars from 1, also within a bar."""
+    bar: float
+    """Where it stands in the written song, likewise."""
+    bars: float
+    """How long it is, in bars."""
+
+
+@dataclass(frozen=True)
+class WrittenSong:
+    """A song that a model wrote.
+
+    >>> import brindle
+    >>> written = brindle.SongModel.built_in().write_song(form="blues", key="F")
+    >>> len(written.song.bars)
+    12
+    """
+
+    song: Song
+    """To be analysed, transposed, drawn."""
+    text: str
+    """As a chord text, four bars a line, each part under its letter in brackets."""
+    quote: Quote | None
+    """The longest of all that stand in it."""
+    json: str = field(repr=False)
+    """As the program prints it."""
+
+
+@dataclass(frozen=True)
+class OrderScore:
+    """How well songs are foretold by histories of one length; fewer bits are better.
+
+    >>> import brindle
+    >>> [score.order for score in brindle.SongModel.built_in("blues").scores()]
+    [1, 2, 3, 4, 5]
+    """
+
+    order: int
+    """Chords of history."""
+    bits: float
+    """Bits a chord, with chords told by their keys."""
+    bits_without_keys: float
+    """The same with all chords absolute."""

@@ -21,6 +21,10 @@ def transpose_again(song: Song, steps: tuple[int, ...]) -> Song:
     return song
 
 
+def written_again(source: bytes, repeats: list[tuple[float, float, int]]) -> Song:
+    return _native._written(source, repeats)
+
+
 def analyse_again(song: Song, *arguments: Any) -> Analysis:
     return song.analyse(*arguments)
 

@@ -13,6 +13,7 @@
 #include "brindle/song/AnalyseSong.h"
 #include "brindle/song/ReadSongHarmony.h"
 
+#include <nanobind/operators.h>
 #include <nanobind/stl/shared_ptr.h>
 #include <nanobind/stl/string.h>
 #include <nanobind/stl/string_view.h>
@@ -154,6 +155,13 @@ nb::tuple PickleOf(const CAnalysis& analysis) {
                        analysis.mOptions.mCopies, analysis.mIsExplained));
 }
 
+/// Of the same song, asked in the same way.
+bool IsSameAnalysis(const CAnalysis& a, const CAnalysis& b) {
+    return IsSameSong(*a.mSource, *b.mSource) && a.mKey == b.mKey &&
+           a.mOptions.mReadings == b.mOptions.mReadings &&
+           a.mOptions.mCopies == b.mOptions.mCopies && a.mIsExplained == b.mIsExplained;
+}
+
 constexpr const char* kAnalysis =
     R"(A song as a teacher reads it: its key, the passages in other keys, what each chord does.
 
@@ -278,6 +286,10 @@ True)");
         return "<Analysis in " + name + " of " + std::to_string(ChordCount(self.Song())) +
                " chords>";
     });
+    analysis.def("__eq__", IsSameAnalysis, nb::is_operator(),
+                 nb::sig("def __eq__(self, other: object, /) -> bool"));
+    analysis.def("__hash__",
+                 [](const CAnalysis& self) { return nb::hash(nb::cast(self.mSource)); });
     analysis.def("__reduce__", PickleOf,
                  nb::sig("def __reduce__(self) -> tuple[typing.Any, tuple[typing.Any, ...]]"));
 

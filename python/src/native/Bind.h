@@ -15,6 +15,7 @@ void BindSongs(nanobind::module_& module);
 void BindAnalyses(nanobind::module_& module);
 void BindFingerings(nanobind::module_& module);
 void BindMarkov(nanobind::module_& module);
+void BindSongModels(nanobind::module_& module);
 void BindScores(nanobind::module_& module);
 void BindBatch(nanobind::module_& module);
 

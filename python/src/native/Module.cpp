@@ -32,6 +32,7 @@ NB_MODULE(_native, module) {
     BindAnalyses(module);
     BindFingerings(module);
     BindMarkov(module);
+    BindSongModels(module);
     BindScores(module);
     BindBatch(module);
 }

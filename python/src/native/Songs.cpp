@@ -10,6 +10,7 @@
 #include "brindle/song/SongBeats.h"
 #include "brindle/song/TransposeSong.h"
 
+#include <nanobind/operators.h>
 #include <nanobind/stl/optional.h>
 #include <nanobind/stl/shared_ptr.h>
 #include <nanobind/stl/string.h>
@@ -134,6 +135,11 @@ nb::bytes MidiOf(const CSourceSong& source, std::optional<double> tempo) {
 
 nb::tuple PickleOf(const CSourceSong& song) {
     const nb::module_ module = nb::module_::import_("brindle._songs");
+    if (song.mIsWritten) {
+        return nb::make_tuple(module.attr("written_again"),
+                              nb::make_tuple(nb::bytes(song.mSource.data(), song.mSource.size()),
+                                             RepeatsOf(song.mSong)));
+    }
     if (song.mFrom) {
         return nb::make_tuple(module.attr("transpose_again"),
                               nb::make_tuple(song.mFrom, TupleOf(song.mSteps, [](int step) {
@@ -297,7 +303,31 @@ void BindChanges(nb::class_<CSourceSong>& song) {
 b'MThd')");
 }
 
+bool AreSameOptions(const CSongOptions& a, const CSongOptions& b) {
+    return a.mFormat == b.mFormat && a.mBeatsPerBar == b.mBeatsPerBar &&
+           a.mBeatsPerChord == b.mBeatsPerChord && a.mEven == b.mEven && a.mLenient == b.mLenient;
+}
+
+nb::int_ HashOf(const CSourceSong& song) {
+    return nb::int_(nb::hash(nb::make_tuple(nb::bytes(song.mSource.data(), song.mSource.size()),
+                                            ChordCount(song.mSong))));
+}
+
 }  // namespace
+
+bool IsSameSong(const CSourceSong& a, const CSourceSong& b) {
+    return a.mSource == b.mSource && AreSameOptions(a.mOptions, b.mOptions) &&
+           a.mSteps == b.mSteps && a.mIsWritten == b.mIsWritten &&
+           a.mSong.mRepeats == b.mSong.mRepeats;
+}
+
+nb::list RepeatsOf(const CSong& song) {
+    nb::list repeats;
+    for (const CSongRepeat& repeat : song.mRepeats) {
+        repeats.append(nb::make_tuple(repeat.mPosition, repeat.mSourcePosition, repeat.mBarCount));
+    }
+    return repeats;
+}
 
 void CheckUnderstood(const CSourceSong& source) {
     if (source.mOptions.mLenient || !source.mSong.HasFault()) return;
@@ -321,6 +351,9 @@ void BindSongs(nb::module_& module) {
     song.def("__len__", [](const CSourceSong& self) { return ChordCount(self.mSong); });
     BindSequence(song, "SongChord", ChordsOf);
     song.def("__repr__", ReprOf);
+    song.def("__eq__", IsSameSong, nb::is_operator(),
+             nb::sig("def __eq__(self, other: object, /) -> bool"));
+    song.def("__hash__", HashOf, nb::sig("def __hash__(self, /) -> int"));
     song.def("__reduce__", PickleOf,
              nb::sig("def __reduce__(self) -> tuple[typing.Any, tuple[typing.Any, ...]]"));
     module.def("_looks_like_file_name", LooksLikeFileName, nb::arg("word"),

@@ -36,8 +36,15 @@ struct CSourceSong {
     CSongOptions mOptions;
     CSourceSongPtr mFrom;     ///< the song that was read, of one that was transposed; else null
     std::vector<int> mSteps;  ///< semitones by which that was transposed, one call after the other
+    bool mIsWritten = false;  ///< by a model, which tells repeats that its source does not
     CLazyTuple mChords;
 };
+
+/// Whether they were read, transposed and stated alike, so that they tell the same.
+[[nodiscard]] bool IsSameSong(const CSourceSong& a, const CSourceSong& b);
+
+/// The repeats of a song as plain numbers.
+[[nodiscard]] nanobind::list RepeatsOf(const CSong& song);
 
 /// SongError with the place of the first fault for a song that was not understood; one that was
 /// read leniently is used as it is.
