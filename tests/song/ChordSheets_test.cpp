@@ -55,6 +55,12 @@ TEST_CASE("A song is put in time by its bar lines, holds and repeats") {
         {"C / F / | G ///", "C@0 F@2 G@4 end@8"},
         {"Am - F – C", "Am@0 F@1 C@2 end@3"},
         {"Dm7, G7;\nC", "Dm7@0 G7@1 C@2 end@3"},
+        // A bar ends with its line, unless the next line holds its last chord.
+        {"C | F\nAm | G", "C@0 F@4 Am@8 G@12 end@16"},
+        {"C | F |\n[B]\n| Am | G\nC", "C@0 F@4 Am@8 G@12 C@16 end@20"},
+        {"C | F\n. . | G", "C@0 F@4 G@8 end@12"},
+        {"C | F x2\nG | C", "C@0 F@4 C@8 F@12 G@16 C@20 end@24"},
+        {"C F\nG Am | F", "C@0 F@1 G@2 Am@3 F@4 end@8"},
         {"C | % | F G | % %", "C@0 C@4 F@8 G@9 end@16"},
         {"C G | F | .//. | Am", "C@0 G@1 F@4 C@8 G@9 F@12 Am@16 end@20"},
         {"C | % | % |", "C@0 C@4 C@8 end@12"},
@@ -89,6 +95,7 @@ TEST_CASE("Parts of a song have names") {
           "Intro@0, Verse 2@4, A section@8, Outro@13");
     CHECK(Sections("|: {A} C :|") == "A@0, A@4");
     CHECK(Sections("{A} C | % | F") == "A@0");
+    CHECK(Sections("[A]\nC | F\n[B]\nDm | G") == "A@0, B@8");
     CHECK(Shown("A: C:maj7 | G:min") == "C:maj7@0 G:min@4 end@8");
 }
 

@@ -14,6 +14,15 @@ constexpr int kLastEnding = 63;
 /// A chord of several words is not longer than this.
 constexpr std::size_t kLongestJoined = 80;
 
+bool IsBar(const CToken& token) {
+    return token.mKind == TTokenKind::Bar;
+}
+
+bool IsMusic(const CToken& token) {
+    return token.mKind == TTokenKind::Chord || token.mKind == TTokenKind::Hold ||
+           token.mKind == TTokenKind::RepeatBars;
+}
+
 /// Cuts one line into sections, bar lines, endings and chords.
 class CChordLine {
 public:
@@ -224,9 +233,24 @@ void CutChordLine(std::string_view line, CTokenList& list) {
     CChordLine(line, list).Cut();
 }
 
+std::size_t CutSheetLine(std::string_view line, CTokenList& list) {
+    const std::size_t begin = list.mTokens.size();
+    CutChordLine(line, list);
+    const auto at = [&](std::size_t index) {
+        return list.mTokens.begin() + static_cast<std::ptrdiff_t>(index);
+    };
+    const auto music = std::find_if(at(begin), list.mTokens.end(), IsMusic);
+    if (music == list.mTokens.end()) return begin;
+    const bool hasBars = std::any_of(at(begin), list.mTokens.end(), IsBar);
+    const bool endsBar = list.mEndOfBars > 0 && music->mKind != TTokenKind::Hold;
+    if (endsBar) list.mTokens.insert(at(list.mEndOfBars), CToken());
+    list.mEndOfBars = hasBars ? list.mTokens.size() : 0;
+    return endsBar ? begin + 1 : begin;
+}
+
 void CutChordText(CTokenList& list) {
     std::string_view rest = list.Text();
-    while (!rest.empty() && !list.IsGivenUp()) CutChordLine(TakeLine(rest), list);
+    while (!rest.empty() && !list.IsGivenUp()) CutSheetLine(TakeLine(rest), list);
 }
 
 }  // namespace brindle::SongText

@@ -106,14 +106,16 @@ private:
         }
         const std::string_view whole = line;
         const int times = TakeTimes(line);
-        const std::size_t begin = mList.mTokens.size();
-        CutChordLine(line, mList);
+        const std::size_t begin = CutSheetLine(line, mList);
+        const bool hasBars = mList.mEndOfBars > 0;
+        if (hasBars && times > 1) mList.AddBar(false, false);
         const std::size_t end = mList.mTokens.size();
         for (int i = 1; i < times; ++i) {
             if (!mList.AddAgain(begin, end)) {
                 return mList.AddFault(whole, "its repeated lines make the song too long");
             }
         }
+        if (hasBars) mList.mEndOfBars = mList.mTokens.size();
     }
 
     CTokenList& mList;

@@ -64,6 +64,8 @@ public:
     std::vector<CToken> mTokens;
     bool mIsEven = false;
     bool mHasH = false;
+    /// How many tokens there were behind the last line of chords, if it had bar lines; else 0.
+    std::size_t mEndOfBars = 0;
     /// Words that steer the playing stand in front of the chords of their bar.
     bool mWordsStandInFront = false;
 
@@ -113,6 +115,9 @@ private:
 
 /// Cuts one line of plain text, which must be part of the text of `list`.
 void CutChordLine(std::string_view line, CTokenList& list);
+/// The same for a line of a sheet, where a bar ends with its line: behind a line with bar lines
+/// only a line that begins with a hold goes on in the same bar. Returns where its tokens begin.
+std::size_t CutSheetLine(std::string_view line, CTokenList& list);
 /// Cut the whole text of `list`.
 void CutChordText(CTokenList& list);
 void CutChordsAboveLyrics(CTokenList& list);
