@@ -6,11 +6,9 @@
 
 #include <fstream>
 #include <iostream>
-#include <string>
 
 int main(int argc, char** argv) {
-    const brindle::CSong song =
-        argc > 1 ? brindle::ReadSongFile(argv[1]) : brindle::ReadSong("Dm7 G7 | C");
+    const auto song = argc > 1 ? brindle::ReadSongFile(argv[1]) : brindle::ReadSong("Dm7 G7 | C");
     for (const auto& fault : song.mFaults) std::cerr << fault << '\n';
     if (song.HasFault()) return 1;
 
@@ -18,9 +16,4 @@ int main(int argc, char** argv) {
     std::cout << found.mKeys.mKey.NameLong(brindle::CurrentChordNamePrefs) << '\n';
     std::ofstream("song.json") << brindle::AnalysisJson(song, found);
     std::ofstream("song.svg") << brindle::AnalysisSvg(brindle::ShowSong(song, found));
-
-    const brindle::CSongReading reading = brindle::ReadSongHarmony(song);
-    for (const std::string& sentence : brindle::Explain(song, reading)) {
-        if (!sentence.empty()) std::cout << sentence << '\n';
-    }
 }
