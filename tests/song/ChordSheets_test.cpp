@@ -96,6 +96,7 @@ TEST_CASE("Parts of a song have names") {
     CHECK(Sections("|: {A} C :|") == "A@0, A@4");
     CHECK(Sections("{A} C | % | F") == "A@0");
     CHECK(Sections("[A]\nC | F\n[B]\nDm | G") == "A@0, B@8");
+    CHECK(Sections("[A] C7 | F7\n[B] (x2)\nDm | G") == "A@0, B@8");
     CHECK(Shown("A: C:maj7 | G:min") == "C:maj7@0 G:min@4 end@8");
 }
 

@@ -150,6 +150,18 @@ std::vector<CTextLine> LinesOf(std::string_view text) {
     return lines;
 }
 
+namespace {
+
+/// `[A]` in front of nothing, of bare chords or of `(x2)`; in front of lyrics it is a chord.
+bool IsLetterOfPart(std::string_view inside, std::string_view behind) {
+    if (inside.size() != 1) return false;
+    if (behind.empty()) return true;
+    const bool isApart = IsBlank(behind[0]) && behind.find_first_of("[]") == behind.npos;
+    return isApart && KindOfWords(Trimmed(behind)) == TLineKind::Chords;
+}
+
+}  // namespace
+
 bool HasChordInBrackets(std::string_view text) {
     while (!text.empty()) {
         const std::string_view line = Trimmed(TakeLine(text));
@@ -158,8 +170,7 @@ bool HasChordInBrackets(std::string_view text) {
             const std::size_t end = line.find_first_of("[]", begin + 1);
             if (end == line.npos) break;
             const std::string_view inside = line.substr(begin + 1, end - begin - 1);
-            const bool isWholeLine = inside.size() + 2 == line.size();
-            const bool isName = isWholeLine && inside.size() == 1;
+            const bool isName = begin == 0 && IsLetterOfPart(inside, line.substr(end + 1));
             if (line[end] == ']' && !inside.empty() && !isName &&
                 ChordText::IsCapitalNote(inside[0]) &&
                 ReadChordText(inside).mKind == TChordText_Chord) {
