@@ -165,7 +165,7 @@ std::string Text(const CAnalysedSong& analysed, const CAnalyseOptions& options) 
     return text + '\n' + CentersText(Show(analysed, FindAll(analysed, options)), paint);
 }
 
-std::string Json(const CAnalysedSong& analysed, const CAnalyseOptions& options) {
+std::string JsonOf(const CAnalysedSong& analysed, const CAnalyseOptions& options) {
     const CSongAnalysis found = FindAll(analysed, options);
     if (analysed.mSheet) return AnalysisJson(*analysed.mSheet, found);
     return AnalysisJson(analysed.mSong, found, analysed.mReading, analysed.mExplanations);
@@ -180,7 +180,7 @@ std::string Native(const CAnalysedSong& analysed, const CAnalyseOptions& options
 std::string Present(const CAnalysedSong& analysed, const CAnalyseOptions& options) {
     switch (options.mFormat.Format()) {
         case TFormat::Json:
-            return Json(analysed, options);
+            return JsonOf(analysed, options);
         case TFormat::Native:
             return Native(analysed, options);
         case TFormat::Svg:

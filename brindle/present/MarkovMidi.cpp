@@ -2,6 +2,7 @@
 #include "brindle/present/MarkovMidi.h"
 
 #include "brindle/markov/MarkovChords.h"
+#include "brindle/present/internal/PianoAndBass.h"
 
 #include <algorithm>
 #include <cmath>
@@ -10,9 +11,6 @@ namespace brindle {
 namespace {
 
 constexpr int kMarkovTicksPerQuarter = 480;
-constexpr int kBassChannel = 1;
-constexpr int kPianoProgram = 0;
-constexpr int kBassProgram = 32;
 // Where the highest voice of the chords stays, the G above middle C.
 constexpr int kTopVoiceCenter = 67;
 
@@ -27,8 +25,7 @@ CMidiPiece MidiPieceOf(MarkovSequenceView sequence, double tempo, int beatsPerBa
     piece.mTicksPerQuarter = kMarkovTicksPerQuarter;
     piece.mTempos = {{0, tempo}};
     piece.mTimeSignatures = {{0, beatsPerBar, 4}};
-    piece.mTracks = {{"Chords", {{0, 0, kPianoProgram}}, {}},
-                     {"Bass", {{0, kBassChannel, kBassProgram}}, {}}};
+    piece.mTracks = PianoAndBass();
     double beats = 0.0;
     std::vector<unsigned char> notes;
     for (const MarkovIterator symbol : sequence) {
@@ -44,7 +41,7 @@ CMidiPiece MidiPieceOf(MarkovSequenceView sequence, double tempo, int beatsPerBa
         notes.pop_back();
         TransposeChordBasedOnPreviousChords(notes, kTopVoiceCenter);
         for (const unsigned char note : notes) {
-            piece.mTracks[0].mNotes.push_back({begin, length, 0, note, 75});
+            piece.mTracks[0].mNotes.push_back({begin, length, kPianoChannel, note, 75});
         }
     }
     return piece;

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/present/WrittenSongText.h"
 
+#include "brindle/present/internal/PianoAndBass.h"
 #include "brindle/theory/KeyIntervals.h"
 
 #include <algorithm>
@@ -11,9 +12,6 @@ namespace brindle {
 namespace {
 
 constexpr int kTicksPerQuarter = 480;
-constexpr int kBassChannel = 1;
-constexpr int kPianoProgram = 0;
-constexpr int kBassProgram = 32;
 // The middle of the chords, the E above middle C, and the lowest tone of the bass, a low E.
 constexpr double kMiddle = 64.0;
 constexpr int kLowestBass = 40;
@@ -89,8 +87,7 @@ CMidiPiece MidiPieceOfSong(const CSong& song, double tempo) {
         piece.mKeySignatures = {{0, std::clamp(song.mStatedKey->SignsCount(), -7, 7),
                                  song.mStatedKey->mSignKeyType == TSignKeyType_Minor}};
     }
-    piece.mTracks = {{"Chords", {{0, 0, kPianoProgram}}, {}},
-                     {"Bass", {{0, kBassChannel, kBassProgram}}, {}}};
+    piece.mTracks = PianoAndBass();
     std::vector<int> before;
     for (std::size_t ix = 0; ix + 1 < song.mChords.size(); ++ix) {
         const CHarmAnlsChordWithPos& chord = song.mChords[ix];
@@ -99,7 +96,7 @@ CMidiPiece MidiPieceOfSong(const CSong& song, double tempo) {
         if (chord.IsUndef() || chord.mSemitones.IsEmpty()) continue;
         before = Voiced(chord, before);
         for (const int note : before)
-            piece.mTracks[0].mNotes.push_back({begin, length, 0, note, 75});
+            piece.mTracks[0].mNotes.push_back({begin, length, kPianoChannel, note, 75});
         piece.mTracks[1].mNotes.push_back({begin, length, kBassChannel, BassOf(chord), 90});
     }
     return piece;

@@ -22,7 +22,7 @@ constexpr int kCostOfDifficulty = 50;  // a song is played at speed
 constexpr int kCostOfBarre = 80;       // it tires the hand
 constexpr int kCostOfCapo = 30;
 constexpr int kCostOfCapoFret = 6;
-constexpr std::size_t kMostCandidates = 32;
+constexpr std::size_t kMostFingerings = 32;
 constexpr int kMostCapo = 12;
 
 int MovementBetween(const CFingering& from, const CFingering& to) {
@@ -44,7 +44,7 @@ using TCandidates = std::vector<CFingering>;
 TCandidates CandidatesOf(const CChordLite& chord, const GChShortTuning& tuning,
                          const CSongFingeringOptions& options) {
     CFingeringOptions search = options.mFingering;
-    search.mLimit = std::clamp<std::size_t>(options.mCandidates, 1, kMostCandidates);
+    search.mLimit = std::clamp<std::size_t>(options.mCandidates, 1, kMostFingerings);
     TCandidates found = FindFingerings(chord, tuning, search);
     if (!found.empty()) return found;
     search.mSpan = search.mSpanUpTheNeck = std::max(search.mSpan, 5);

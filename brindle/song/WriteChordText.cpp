@@ -14,7 +14,7 @@ namespace brindle {
 namespace {
 
 // More steps than this are no song but a file of hundreds of megabytes.
-constexpr double kMostSteps = 1e7;
+constexpr double kMostTextSteps = 1e7;
 constexpr int kBarsPerLine = 4;
 constexpr std::string_view kHold = ".";
 constexpr std::string_view kBarLine = "|";
@@ -35,7 +35,7 @@ public:
 
     [[nodiscard]] std::optional<CChordText> Write() {
         mEnd = StepOf(EndOf(mSheet));
-        if (!(static_cast<double>(mEnd) < kMostSteps)) return std::nullopt;
+        if (!(static_cast<double>(mEnd) < kMostTextSteps)) return std::nullopt;
         for (std::size_t i = 0; i < mSheet.Harmonies.size(); ++i) {
             const std::int64_t step = StepOf(mSheet.Harmonies[i].mPosition);
             const bool isLast = i + 1 == mSheet.Harmonies.size();

@@ -55,7 +55,7 @@ constexpr int kCostOfMutedBass = 160;    // it is the bass
 
 constexpr int kMinorThird = 3;
 constexpr int kMajorThird = 4;
-constexpr int kEleventh = 5;
+constexpr int kPerfectFourth = 5;
 constexpr int kPerfectFifth = 7;
 
 CShapeCounts CountsOf(std::span<const std::int8_t> frets) {
@@ -143,7 +143,7 @@ int CostOfOmissions(const CFingering& fingering, const CFingeringTask& task) {
     const int cost = isRootOut ? kCostOfOmittedRoot : 0;
     if (task.mSemitones.size() < kTonesOfScale) return cost + kCostOfOmittedTone * others;
     const bool isRubbing =
-        task.mSemitones.HasIntvl(kMajorThird) && !fingering.mOmitted.HasIntvl(kEleventh);
+        task.mSemitones.HasIntvl(kMajorThird) && !fingering.mOmitted.HasIntvl(kPerfectFourth);
     return cost + kCostOfTonesOutOfScale * others + (isRubbing ? kCostOfRubbingEleventh : 0);
 }
 

@@ -10,7 +10,7 @@ namespace brindle {
 namespace {
 
 // More chords make a lattice slow, and a song does not need them.
-constexpr std::size_t kMostCandidates = 400;
+constexpr std::size_t kMostNextChords = 400;
 // The chance that a step no song has made is taken all the same, which wishes may need.
 constexpr double kNewStep = 1e-4;
 constexpr double kNewChord = 1e-3;
@@ -35,7 +35,7 @@ void CSongCandidates::AddCommon(const CSongModel& model) {
         return std::pair(model.CountOf(b), a) < std::pair(model.CountOf(a), b);
     };
     std::sort(ids.begin(), ids.end(), isMoreCommon);
-    ids.resize(std::min(ids.size(), kMostCandidates));
+    ids.resize(std::min(ids.size(), kMostNextChords));
     mIndexOfId.assign(model.VocabularySize(), -1);
     for (const std::int32_t id : ids) {
         mIndexOfId[static_cast<std::size_t>(id)] = static_cast<std::int32_t>(mCandidates.size());

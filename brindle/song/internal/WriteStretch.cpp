@@ -10,7 +10,7 @@
 namespace brindle {
 namespace {
 
-constexpr std::size_t kMostSteps = 5000;
+constexpr std::size_t kMostStretchSteps = 5000;
 // A step that no song has made: the probabilities of a model are generous to them.
 constexpr double kNewStepFactor = 1e-3;
 constexpr double kNewChordWeight = 1e-7;
@@ -75,7 +75,7 @@ private:
     /// Writes a chord that begins on a beat, and all behind it.
     bool WriteChord(std::size_t beat, std::size_t progress) {
         CChoices choices = ChordChoices(beat, progress);
-        while (mSteps < kMostSteps) {
+        while (mSteps < kMostStretchSteps) {
             const std::size_t choice = choices.Draw(mRandom);
             if (choice == choices.size()) return false;
             ++mSteps;
@@ -96,7 +96,7 @@ private:
     /// Chooses how long the last chord is, and writes all behind it.
     bool WriteLength(std::size_t beat, std::size_t slot, std::size_t progress) {
         CChoices choices = LengthChoices(beat, slot, progress);
-        while (mSteps < kMostSteps) {
+        while (mSteps < kMostStretchSteps) {
             const std::size_t choice = choices.Draw(mRandom);
             if (choice == choices.size()) return false;
             const std::size_t end = beat + choice + 1;
