@@ -1,8 +1,8 @@
 #!/usr/bin/env bash
 # make_packages.sh [--try]: makes the Debian packages in build/package and checks them with lintian.
-# With --try, as root, a bare Debian is set up in a folder below build/package, where the packages are
-# installed and used: the program, its man pages, its completions, and a host that is built with
-# libbrindle-dev.
+# With --try the library is built as part of a host, and, as root, a bare Debian is set up in a folder
+# below build/package, where the packages are installed and used: the program, its man pages, its
+# completions, and a host that is built with libbrindle-dev.
 set -euo pipefail
 source "$(dirname "$(readlink -f "${BASH_SOURCE[0]}")")/../cmake/setup.sh"
 cd "$root"
@@ -19,6 +19,9 @@ rm -f "$build"/*.deb
 lintian --fail-on error,warning --suppress-tags-from-file cmake/package/lintian-tags "$build"/*.deb
 ls -l "$build"/*.deb
 [ "${1:-}" = --try ] || exit 0
+
+say "building the library as part of a host, each source by itself (log: build/package.log)"
+BRINDLE_EACH_SOURCE=1 tests/consume/consume.sh "$root" "$build" add_subdirectory >>"$root/build/package.log"
 
 bare="$build/bare"
 codename=$(. /etc/os-release && echo "$VERSION_CODENAME")

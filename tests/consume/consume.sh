@@ -1,7 +1,8 @@
 #!/usr/bin/env bash
 # consume.sh SOURCE BUILD WAY: builds examples/host as a stranger would, outside of this build, and
 # compares what it prints. WAY is find_package or pkg_config, both with the package installed from
-# BUILD into a folder and then moved to another, or add_subdirectory.
+# BUILD into a folder and then moved to another, or add_subdirectory, which builds all of the library
+# again: several sources as one, or with BRINDLE_EACH_SOURCE each by itself, which takes minutes more.
 set -euo pipefail
 source_dir=$1 build_dir=$2 way=$3
 work="$build_dir/consume/$way"
@@ -22,6 +23,10 @@ case $way in
     pkg_config)
         PKG_CONFIG_PATH=$(dirname "$(find "$prefix" -name brindle.pc)")
         export PKG_CONFIG_PATH ;;
+    add_subdirectory)
+        options+=(-DCMAKE_CXX_FLAGS_DEBUG=-O0)
+        [ -n "${BRINDLE_EACH_SOURCE:-}" ] ||
+            options+=(-DCMAKE_UNITY_BUILD=ON -DCMAKE_UNITY_BUILD_BATCH_SIZE=12) ;;
 esac
 
 cmake --fresh -G Ninja -S "$project" -B "$work/host" "${options[@]}"
