@@ -58,7 +58,10 @@ bool HasChordsAboveLyrics(std::string_view text) {
         return std::any_of(lines.begin(), lines.end(),
                            [&](const CTextLine& line) { return line.mKind == kind; });
     };
-    return has(TLineKind::Chords) && (has(TLineKind::Lyrics) || has(TLineKind::Section));
+    const bool hasNames = std::any_of(lines.begin(), lines.end(), [](const CTextLine& line) {
+        return line.mKind == TLineKind::Section || BeginsWithSection(line.mText);
+    });
+    return has(TLineKind::Chords) && (has(TLineKind::Lyrics) || hasNames);
 }
 
 bool IsMeasureNumber(std::string_view word) {

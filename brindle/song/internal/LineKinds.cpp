@@ -162,6 +162,11 @@ bool IsLetterOfPart(std::string_view inside, std::string_view behind) {
 
 }  // namespace
 
+bool BeginsWithSection(std::string_view line) {
+    const std::size_t end = line.starts_with('[') ? line.find(']') : line.npos;
+    return end != line.npos && end + 1 < line.size() && IsSection(line.substr(0, end + 1));
+}
+
 bool HasChordInBrackets(std::string_view text) {
     while (!text.empty()) {
         const std::string_view line = Trimmed(TakeLine(text));

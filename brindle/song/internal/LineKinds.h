@@ -29,6 +29,9 @@ struct CTextLine {
 /// The lines of a text. Lines such as "A" and "Go" are told from their neighbours.
 [[nodiscard]] std::vector<CTextLine> LinesOf(std::string_view text);
 
+/// Whether the name of a part stands in brackets in front of other things: `[Intro] G C`.
+[[nodiscard]] bool BeginsWithSection(std::string_view line);
+
 /// `Verse 1` of `[Verse 1]` and of `Verse 1:`.
 [[nodiscard]] std::string_view NameOfSection(std::string_view line);
 
