@@ -107,7 +107,7 @@ private:
         const std::string_view whole = line;
         const int times = TakeTimes(line);
         const std::size_t begin = CutSheetLine(line, mList);
-        const bool hasBars = mList.mEndOfBars > 0;
+        const bool hasBars = mList.mEndOfBars > begin;
         if (hasBars && times > 1) mList.AddBar(false, false);
         const std::size_t end = mList.mTokens.size();
         for (int i = 1; i < times; ++i) {
