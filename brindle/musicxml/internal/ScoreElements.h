@@ -105,16 +105,23 @@ inline constexpr auto kScoreElementNames = std::to_array<CScoreElementName>({
     {"work-title", TScoreElement::WorkTitle},
 });
 
+/// By length first: most names that are looked up differ in it, and need no look at their letters.
 constexpr bool IsBefore(const CScoreElementName& a, const CScoreElementName& b) {
+    if (a.mName.size() != b.mName.size()) return a.mName.size() < b.mName.size();
     return a.mName < b.mName;
 }
-static_assert(std::is_sorted(kScoreElementNames.begin(), kScoreElementNames.end(), IsBefore));
+
+constexpr auto kScoreElementsByLength = [] {
+    auto sorted = kScoreElementNames;
+    std::sort(sorted.begin(), sorted.end(), IsBefore);
+    return sorted;
+}();
 
 [[nodiscard]] constexpr TScoreElement ScoreElementOf(std::string_view name) {
-    const auto it = std::lower_bound(kScoreElementNames.begin(), kScoreElementNames.end(),
+    const auto it = std::lower_bound(kScoreElementsByLength.begin(), kScoreElementsByLength.end(),
                                      CScoreElementName{name, TScoreElement::Other}, IsBefore);
-    return it != kScoreElementNames.end() && it->mName == name ? it->mElement
-                                                               : TScoreElement::Other;
+    return it != kScoreElementsByLength.end() && it->mName == name ? it->mElement
+                                                                   : TScoreElement::Other;
 }
 
 }  // namespace brindle
