@@ -14,7 +14,14 @@ test("analyses are those of the program, for all examples and lead sheets", { sk
     try {
       printed = execFileSync(program, ["analyse", "--json", file], { stdio: ["ignore", "pipe", "ignore"] });
     } catch {
-      assert.throws(() => brindle.read(readFileSync(file)), { name: "SongError" }, file);
+      // The program refuses scores without chord symbols, too.
+      let chords = 0;
+      try {
+        chords = brindle.read(readFileSync(file)).chords.length;
+      } catch (error) {
+        assert.equal(error.name, "SongError", file);
+      }
+      assert.equal(chords, 0, file);
       continue;
     }
     const analysis = brindle.read(readFileSync(file)).analyse();
