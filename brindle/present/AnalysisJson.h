@@ -11,8 +11,8 @@ struct CSongAnalysis;
 struct CSongReading;
 struct TMusicXMLDoc;
 
-/// What AnalyseSong found in a song as strict JSON, see docs/json.md. A score has one more member in
-/// front, `Score`.
+/// What AnalyseSong found in a song as strict JSON, see docs/json.md. A score has one more member
+/// in front, `Score`.
 [[nodiscard]] std::string AnalysisJson(const CSong& song, const CSongAnalysis& found);
 /// The same with the reading of the song; `explanations` is a sentence for each chord, or empty.
 [[nodiscard]] std::string AnalysisJson(const CSong& song, const CSongAnalysis& found,
