@@ -71,7 +71,7 @@ std::uint64_t KeyOfSource(std::string_view path, std::string_view member) {
 nlohmann::json HeadOfLine(std::string_view line) {
     const std::size_t end = line.find(",\"Title\":");
     if (end == line.npos || !line.ends_with('}')) return nullptr;
-    return nlohmann::json::parse(std::string(line.substr(0, end)) + '}', nullptr, false);
+    return ParseJson(std::string(line.substr(0, end)) + '}');
 }
 
 /// A whole number from 1; 0 where there is none.

@@ -5,6 +5,7 @@
 #include "cli/Input.h"
 #include "cli/Json.h"
 
+#include "brindle/platform/JsonString.h"
 #include "brindle/present/GridLibrariesText.h"
 #include "brindle/present/GridPackageJson.h"
 #include "brindle/present/GridsJson.h"
@@ -63,7 +64,7 @@ TStatus Import(const CPackageOptions& options) {
     if (!text) return TStatus::BadInput;
     const std::string from =
         options.mFile == "-" ? std::string("standard input") : Printable(options.mFile);
-    const Json json = Json::parse(*text, nullptr, false);
+    const Json json = ParseJson(*text);
     if (json.is_discarded()) return Fail(TStatus::BadInput, from + " is no JSON");
     GChDatabase database;
     std::string fault = ReadDatabase(json, database);

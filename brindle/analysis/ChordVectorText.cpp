@@ -2,6 +2,7 @@
 #include "brindle/analysis/ChordVectorText.h"
 
 #include "brindle/analysis/CHarmAnlsChordForMetro.h"
+#include "brindle/platform/JsonString.h"
 
 #include <algorithm>
 #include <array>
@@ -37,7 +38,7 @@ CChordVectorText ReadDigits(std::string_view text) {
 }
 
 CChordVectorText ReadJson(std::string_view text) {
-    const auto json = nlohmann::json::parse(text.begin(), text.end(), nullptr, false);
+    const auto json = ParseJson(text);
     const bool isObject = json.is_object() && json.contains("VectorRep");
     const nlohmann::json& list = isObject ? json.at("VectorRep") : json;
     if (!list.is_array()) return Fault("this is no JSON list of the places of a vector", 0);

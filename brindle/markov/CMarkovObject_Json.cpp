@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/markov/CMarkovObjects.h"
 #include "brindle/platform/DictionaryValues.h"
+#include "brindle/platform/JsonString.h"
 #include "brindle/platform/PlainText.h"
 
 #include <nlohmann/json.hpp>
@@ -59,7 +60,7 @@ CMarkovObject CMarkovObject::JSONDeserialization_Helper::CMarkovObjectFromJSONDi
 
 CMarkovObject CMarkovObject::JSONDeserialization_Helper::CMarkovObjectFromJSONString(
     const std::string& text) {
-    return CMarkovObjectFromJSONDictionary(json::parse(text, nullptr, false));
+    return CMarkovObjectFromJSONDictionary(ParseJson(text));
 }
 
 void CMarkovObjects::AppendJSONString(std::ostream& stream) const {

@@ -93,8 +93,7 @@ CChordHeavy CChordSetFromMusicXml(const TMusicXMLHarmony& harmony, int wrapIntvl
     std::set<int> intvls(ofKind.begin(), ofKind.end());
     for (const TMusicXMLDegree& degree : harmony.mDegrees) Apply(degree, intvls);
     const CKeyEnh bass = harmony.mBass.ToKeyEnh(CurrentChordNamePrefs);
-    CIntvlSet all;
-    all.insert(boost::container::ordered_unique_range, intvls.begin(), intvls.end());
+    const CIntvlSet all(CMySet<int>(intvls.begin(), intvls.end()));
     return CChordHeavy(root, all, bass, wrapIntvl);
 }
 

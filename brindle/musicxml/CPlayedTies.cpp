@@ -3,6 +3,7 @@
 
 #include "brindle/musicxml/MuxmlLimits.h"
 #include "brindle/musicxml/internal/ReadMuxml.h"
+#include "brindle/platform/SortByNumber.h"
 
 #include <algorithm>
 
@@ -40,9 +41,7 @@ std::optional<CMuxmlNote> CPlayedTies::Take(const CMuxmlNote& note) {
 std::vector<CMuxmlNote> CPlayedTies::NotesLeftOpen() const {
     std::vector<CMuxmlNote> notes;
     for (const auto& [where, note] : mOpen) notes.push_back(note);
-    std::stable_sort(notes.begin(), notes.end(), [](const CMuxmlNote& a, const CMuxmlNote& b) {
-        return a.mPositionAsMidiTicks < b.mPositionAsMidiTicks;
-    });
+    SortByNumber(notes, [](const CMuxmlNote& note) { return note.mPositionAsMidiTicks; });
     return notes;
 }
 

@@ -65,11 +65,10 @@ static_assert(kTonesOfKinds.size() + 3 == kKindRows.size());
 }  // namespace
 
 CIntvlSet XMLHarmonyKindToIntvlSetExceptRoot(std::string_view kind) {
-    CIntvlSet intvls;
-    if (const CKindRow* row = KindRowOf(kind)) {
-        intvls.insert(row->mIntvls.data(), row->mIntvls.data() + row->mCount);
-    }
-    return intvls;
+    const CKindRow* row = KindRowOf(kind);
+    if (row == nullptr) return {};
+    const int* const intvls = row->mIntvls.data();
+    return CIntvlSet(CMySet<int>(intvls, intvls + row->mCount));
 }
 
 CSemitones XMLHarmonyKindToSemitones(std::string_view kind) {

@@ -6,13 +6,14 @@
 #include <fmt/format.h>
 
 #include <cmath>
-#include <iterator>
 
 namespace brindle {
 
 void CMuxmlJson::AppendName(std::string& text, std::string_view name) {
     if (!text.ends_with('{')) text += ',';
-    fmt::format_to(std::back_inserter(text), "\"{}\":", name);
+    text += '"';
+    text += name;
+    text += "\":";
 }
 
 void CMuxmlJson::Append(std::string& text, bool value) {
@@ -20,16 +21,16 @@ void CMuxmlJson::Append(std::string& text, bool value) {
 }
 
 void CMuxmlJson::Append(std::string& text, std::int64_t value) {
-    fmt::format_to(std::back_inserter(text), "{}", value);
+    text += fmt::format_int(value).c_str();
 }
 
 void CMuxmlJson::Append(std::string& text, std::uint64_t value) {
-    fmt::format_to(std::back_inserter(text), "{}", value);
+    text += fmt::format_int(value).c_str();
 }
 
 void CMuxmlJson::Append(std::string& text, double value) {
     if (std::isfinite(value)) {
-        fmt::format_to(std::back_inserter(text), "{}", value);
+        text += fmt::format("{}", value);
     } else {
         text += "null";
     }

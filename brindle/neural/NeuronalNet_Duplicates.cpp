@@ -10,7 +10,6 @@
 #include <algorithm>
 #include <cmath>
 #include <iostream>
-#include <iterator>
 #include <utility>
 
 namespace brindle {
@@ -66,11 +65,10 @@ std::vector<TIndexPair> Conflicts(const std::vector<training_pattern>& patterns)
 }
 
 void AppendPattern(std::string& text, std::size_t index, const training_pattern& pattern) {
-    const auto out = std::back_inserter(text);
-    fmt::format_to(out, "{} {}: \nInput: ", index, pattern.mTellingName);
-    for (const double input : pattern.mInputs) fmt::format_to(out, "{:f} ", input);
+    text += fmt::format("{} {}: \nInput: ", index, pattern.mTellingName);
+    for (const double input : pattern.mInputs) text += fmt::format("{:f} ", input);
     text += "\nOutput: ";
-    for (const double output : pattern.mOutputs) fmt::format_to(out, "{:f} ", output);
+    for (const double output : pattern.mOutputs) text += fmt::format("{:f} ", output);
 }
 
 }  // namespace

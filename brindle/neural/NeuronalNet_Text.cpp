@@ -5,7 +5,6 @@
 #include <fmt/core.h>
 
 #include <iostream>
-#include <iterator>
 #include <utility>
 
 namespace brindle {
@@ -22,7 +21,7 @@ class CNetText {
 public:
     template <class... Args>
     void Add(fmt::format_string<const Args&...> format, const Args&... args) {
-        fmt::format_to(std::back_inserter(mText), format, args...);
+        mText += fmt::format(format, args...);
     }
     /// Numbers as a stream writes them by default, a blank behind each.
     void AddNumbers(const std::vector<double>& numbers) {

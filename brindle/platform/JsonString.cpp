@@ -6,7 +6,6 @@
 #include <fmt/format.h>
 
 #include <algorithm>
-#include <iterator>
 #include <nlohmann/json.hpp>
 
 namespace brindle {
@@ -26,7 +25,7 @@ std::string WithEscapes(std::string json) {
     for (std::string_view rest = json; !rest.empty();) {
         const std::string_view character = rest.substr(0, Utf8Length(rest));
         if (IsUnprintable(character)) {
-            fmt::format_to(std::back_inserter(escaped), "\\u{:04x}", CodePointOf(character));
+            escaped += fmt::format("\\u{:04x}", CodePointOf(character));
         } else {
             escaped += character;
         }
@@ -53,6 +52,10 @@ std::string DumpJson(const nlohmann::json& value) {
 
 std::string DumpJson(const nlohmann::ordered_json& value) {
     return OnOneLine(value);
+}
+
+nlohmann::json ParseJson(std::string_view text) {
+    return nlohmann::json::parse(text, nullptr, false);
 }
 
 }  // namespace brindle

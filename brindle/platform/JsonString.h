@@ -19,4 +19,7 @@ namespace brindle {
 /// The same of one whose members keep their order.
 [[nodiscard]] std::string DumpJson(const nlohmann::ordered_json& value);
 
+/// The value that a text tells; `is_discarded()` of it where the text is no JSON.
+[[nodiscard]] nlohmann::json ParseJson(std::string_view text);
+
 }  // namespace brindle

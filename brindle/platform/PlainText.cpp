@@ -4,7 +4,6 @@
 #include <fmt/format.h>
 
 #include <cmath>
-#include <iterator>
 #include <limits>
 #include <ostream>
 #include <string>
@@ -13,14 +12,7 @@ namespace brindle::PlainText {
 
 namespace {
 
-// Room for the longest number: 309 digits of the largest double, sign, point, two decimals.
-using TBuffer = fmt::basic_memory_buffer<char, 320>;
-
 constexpr std::string_view kPlainFixed = "{:>6.2f}";
-
-void Write(std::ostream& stream, const TBuffer& buffer) {
-    PlainText::Write(stream, std::string_view(buffer.data(), buffer.size()));
-}
 
 }  // namespace
 
@@ -30,15 +22,11 @@ void Write(std::ostream& stream, std::string_view text) {
 }
 
 void WriteInteger(std::ostream& stream, std::int64_t value, int width) {
-    TBuffer buffer;
-    fmt::format_to(std::back_inserter(buffer), "{:{}}", value, width);
-    Write(stream, buffer);
+    Write(stream, fmt::format("{:{}}", value, width));
 }
 
 void WriteUnsigned(std::ostream& stream, std::uint64_t value) {
-    TBuffer buffer;
-    fmt::format_to(std::back_inserter(buffer), "{}", value);
-    Write(stream, buffer);
+    Write(stream, fmt::format_int(value).c_str());
 }
 
 // Undefined positions are the lowest number there is, and each analysis has some. Its 309 digits
@@ -49,9 +37,7 @@ void WriteFixed(std::ostream& stream, double value) {
     if (value == std::numeric_limits<double>::lowest()) return Write(stream, lowest);
     // What is no number has no sign that means anything.
     if (std::isnan(value)) value = std::numeric_limits<double>::quiet_NaN();
-    TBuffer buffer;
-    fmt::format_to(std::back_inserter(buffer), kPlainFixed, value);
-    Write(stream, buffer);
+    Write(stream, fmt::format(kPlainFixed, value));
 }
 
 void EndLine(std::ostream& stream) {

@@ -49,7 +49,7 @@ CJsonWriter& CJsonWriter::Number(double value) {
     const bool isWhole = std::abs(value) < kLargestPlainNumber && std::floor(value) == value;
     if (isWhole && !std::signbit(value))
         return Scalar(fmt::format("{}.0", static_cast<std::int64_t>(value)));
-    return Scalar(nlohmann::json(value).dump());
+    return Scalar(DumpJson(nlohmann::json(value)));
 }
 
 CJsonWriter& CJsonWriter::String(std::string_view text) {

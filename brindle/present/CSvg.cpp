@@ -7,7 +7,6 @@
 
 #include <algorithm>
 #include <cmath>
-#include <iterator>
 
 namespace brindle {
 namespace {
@@ -76,22 +75,20 @@ void CSvg::Rect(double x, double y, double width, double height, std::string_vie
 }
 
 void CSvg::Line(double x1, double y1, double x2, double y2, std::string_view color) {
-    fmt::format_to(std::back_inserter(mBody),
-                   R"(<line x1="{}" y1="{}" x2="{}" y2="{}" stroke="{}"/>)"
-                   "\n",
-                   SvgNumber(x1), SvgNumber(y1), SvgNumber(x2), SvgNumber(y2), color);
+    mBody += fmt::format(R"(<line x1="{}" y1="{}" x2="{}" y2="{}" stroke="{}"/>)"
+                         "\n",
+                         SvgNumber(x1), SvgNumber(y1), SvgNumber(x2), SvgNumber(y2), color);
 }
 
 void CSvg::Circle(double x, double y, double radius, std::string_view fill, std::string_view line) {
-    fmt::format_to(std::back_inserter(mBody),
-                   R"(<circle cx="{}" cy="{}" r="{}" fill="{}" stroke="{}"/>)"
-                   "\n",
-                   SvgNumber(x), SvgNumber(y), SvgNumber(radius), fill, line);
+    mBody += fmt::format(R"(<circle cx="{}" cy="{}" r="{}" fill="{}" stroke="{}"/>)"
+                         "\n",
+                         SvgNumber(x), SvgNumber(y), SvgNumber(radius), fill, line);
 }
 
 void CSvg::Text(double x, double y, std::string_view text, const CSvgFont& font) {
-    fmt::format_to(std::back_inserter(mBody), R"(<text x="{}" y="{}" font-size="{}" fill="{}")",
-                   SvgNumber(x), SvgNumber(y), SvgNumber(font.mSize), font.mColor);
+    mBody += fmt::format(R"(<text x="{}" y="{}" font-size="{}" fill="{}")", SvgNumber(x),
+                         SvgNumber(y), SvgNumber(font.mSize), font.mColor);
     if (font.mBold) mBody += R"( font-weight="bold")";
     if (!font.mAnchor.empty()) mBody += fmt::format(R"( text-anchor="{}")", font.mAnchor);
     mBody += ">" + XmlEscaped(text) + "</text>\n";

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/present/ImportText.h"
 
+#include "brindle/platform/SortByNumber.h"
 #include "brindle/present/CTable.h"
 #include "brindle/present/ShownText.h"
 
@@ -44,14 +45,9 @@ void AddRow(CTable& table, const CImportedPart& part, const CImportedEvent& even
 
 std::string PartText(CImportedPart part, const CPaint& paint) {
     // A tied note is told where its tie ends; here it stands where it begins.
-    std::stable_sort(
-        part.mEvents.begin(), part.mEvents.end(),
-        [](const CImportedEvent& a, const CImportedEvent& b) { return a.mPosition < b.mPosition; });
+    SortByNumber(part.mEvents, [](const CImportedEvent& event) { return event.mPosition; });
     // Broken time signatures lead bars back; they are looked up by their position.
-    std::stable_sort(part.mMeasures.begin(), part.mMeasures.end(),
-                     [](const CImportedMeasure& a, const CImportedMeasure& b) {
-                         return a.mPosition < b.mPosition;
-                     });
+    SortByNumber(part.mMeasures, [](const CImportedMeasure& measure) { return measure.mPosition; });
     CTable table({" bar", " position", " length", "event", " note", " velocity", " voice", " staff",
                   "marks"});
     for (const CImportedEvent& event : part.mEvents) AddRow(table, part, event);

@@ -48,7 +48,7 @@ constexpr auto kMarks = std::to_array<CMark>({
 std::string MarksOf(const CMuxmlNote& note) {
     std::string marks;
     for (const CMark& mark : kMarks) {
-        if (mark.mHas(note)) fmt::format_to(std::back_inserter(marks), " {}", mark.mWord);
+        if (mark.mHas(note)) marks += fmt::format(" {}", mark.mWord);
     }
     return marks.empty() ? marks : marks.substr(1);
 }

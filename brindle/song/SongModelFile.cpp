@@ -165,7 +165,7 @@ bool LooksLikeSongModel(std::string_view text) {
 }
 
 CSongModelReading ReadSongModel(std::string_view text) {
-    const Json json = Json::parse(text, nullptr, false);
+    const Json json = ParseJson(text);
     if (!json.is_object() || !json.contains(kMark)) return RefusedModel("is no song model");
     const Json& version = json[std::string(kMark)];
     if (!version.is_number_unsigned()) return RefusedModel("is no song model");

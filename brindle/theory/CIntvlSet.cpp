@@ -79,9 +79,7 @@ CIntvlSet CIntvlSet::Inversion(int n) const {
 
     boost::container::small_vector<int, 24> turned;
     for (const int member : *this) turned.push_back(Remainder(member + span - newRoot, span));
-    CIntvlSet inversion;
-    inversion.insert(turned.begin(), turned.end());
-    return inversion;
+    return CIntvlSet(CMySet<int>(turned.begin(), turned.end()));
 }
 
 CSemitones CIntvlSet::ToSemitones() const {
@@ -93,8 +91,7 @@ CSemitones CIntvlSet::ToSemitones() const {
 void CIntvlSet::SetIntvls(std::span<const int> intvls) {
     // No need to count to 128 members: there are only that many values.
     const auto listed = UpToEnd(intvls);
-    clear();
-    insert(listed.begin(), listed.end());
+    CMySet<int>::operator=(CMySet<int>(listed.begin(), listed.end()));
 }
 
 void CIntvlSet::SetFromSemitones(CSemitones semitones) {
@@ -109,7 +106,7 @@ void CIntvlSet::SetWrapIntvl(int wrapIntvl) {
     if (wrapIntvl < 1 || empty() || (*begin() >= 0 && *rbegin() < wrapIntvl)) return;
     auto members = extract_sequence();
     for (int& member : members) member = Remainder(member, wrapIntvl);
-    insert(members.begin(), members.end());
+    CMySet<int>::operator=(CMySet<int>(members.begin(), members.end()));
 }
 
 void CIntvlSet::EraseIntvlInAnyOct(int intvl) {

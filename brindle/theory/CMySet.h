@@ -5,9 +5,11 @@
 #include <boost/container/flat_set.hpp>
 #include <boost/container/small_vector.hpp>
 #include <functional>
+#include <initializer_list>
 #include <iterator>
 #include <ostream>
 #include <type_traits>
+#include <utility>
 
 namespace brindle {
 
@@ -18,11 +20,21 @@ namespace brindle {
 template <class T>
 class CMySet
     : public boost::container::flat_set<T, std::less<T>, boost::container::small_vector<T, 12>> {
-    using Base = boost::container::flat_set<T, std::less<T>, boost::container::small_vector<T, 12>>;
+    using TMembers = boost::container::small_vector<T, 12>;
+    using Base = boost::container::flat_set<T, std::less<T>, TMembers>;
 
 public:
-    using Base::Base;
     CMySet() = default;
+    CMySet(std::initializer_list<T> members) : CMySet(members.begin(), members.end()) {}
+    /// Of members in any order; what occurs twice is in it once.
+    template <std::input_iterator Iterator>
+    CMySet(Iterator first, Iterator last) {
+        // The set's own merge of ranges is compiled five times as long as this.
+        TMembers members(first, last);
+        std::sort(members.begin(), members.end());
+        members.erase(std::unique(members.begin(), members.end()), members.end());
+        this->adopt_sequence(boost::container::ordered_unique_range, std::move(members));
+    }
 
     /// The members of both sets.
     [[nodiscard]] friend CMySet operator+(const CMySet& a, const CMySet& b) {

@@ -2,6 +2,7 @@
 #include "brindle/musicxml/internal/PlayedScore.h"
 
 #include "brindle/musicxml/PlayedMeasures.h"
+#include "brindle/platform/SortByNumber.h"
 #include "brindle/theory/CSignKeyHeavy.h"
 
 #include <algorithm>
@@ -116,12 +117,7 @@ private:
     // An offset may move a harmony across a bar line, past harmonies of other measures.
     void SetDurations() {
         auto& harmonies = mDoc.Harmonies;
-        const auto isEarlier = [](const TMusicXMLHarmony& a, const TMusicXMLHarmony& b) {
-            return a.mPosition < b.mPosition;
-        };
-        if (!std::is_sorted(harmonies.begin(), harmonies.end(), isEarlier)) {
-            std::stable_sort(harmonies.begin(), harmonies.end(), isEarlier);
-        }
+        SortByNumber(harmonies, [](const TMusicXMLHarmony& harmony) { return harmony.mPosition; });
         mEnd = QuartersOf(mPosition);
         double next = mEnd;
         for (std::size_t i = harmonies.size(); i-- > 0;) {

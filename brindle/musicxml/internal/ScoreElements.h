@@ -3,6 +3,7 @@
 
 #include <algorithm>
 #include <array>
+#include <cstddef>
 #include <cstdint>
 #include <string_view>
 
@@ -105,23 +106,64 @@ inline constexpr auto kScoreElementNames = std::to_array<CScoreElementName>({
     {"work-title", TScoreElement::WorkTitle},
 });
 
-/// By length first: most names that are looked up differ in it, and need no look at their letters.
-constexpr bool IsBefore(const CScoreElementName& a, const CScoreElementName& b) {
-    if (a.mName.size() != b.mName.size()) return a.mName.size() < b.mName.size();
-    return a.mName < b.mName;
-}
+inline constexpr std::size_t kLongestScoreElementName = 15;
 
-constexpr auto kScoreElementsByLength = [] {
-    auto sorted = kScoreElementNames;
-    std::sort(sorted.begin(), sorted.end(), IsBefore);
-    return sorted;
-}();
+/// The names in ascending order of length, and where those of each length begin: eight at most.
+struct CScoreElementsByLength {
+    std::array<CScoreElementName, kScoreElementNames.size()> mNames = kScoreElementNames;
+    std::array<std::uint8_t, kLongestScoreElementName + 2> mBegin{};
+
+    constexpr CScoreElementsByLength() {
+        std::sort(mNames.begin(), mNames.end(),
+                  [](const auto& a, const auto& b) { return a.mName.size() < b.mName.size(); });
+        for (const CScoreElementName& row : mNames) {
+            for (std::size_t i = row.mName.size() + 1; i < mBegin.size(); ++i) ++mBegin[i];
+        }
+    }
+};
+
+inline constexpr CScoreElementsByLength kScoreElementsByLength;
+static_assert(kScoreElementsByLength.mBegin.back() == kScoreElementNames.size());
 
 [[nodiscard]] constexpr TScoreElement ScoreElementOf(std::string_view name) {
-    const auto it = std::lower_bound(kScoreElementsByLength.begin(), kScoreElementsByLength.end(),
-                                     CScoreElementName{name, TScoreElement::Other}, IsBefore);
-    return it != kScoreElementsByLength.end() && it->mName == name ? it->mElement
-                                                                   : TScoreElement::Other;
+    if (name.size() > kLongestScoreElementName) return TScoreElement::Other;
+    const std::size_t end = kScoreElementsByLength.mBegin[name.size() + 1];
+    for (std::size_t i = kScoreElementsByLength.mBegin[name.size()]; i < end; ++i) {
+        const CScoreElementName& row = kScoreElementsByLength.mNames[i];
+        if (row.mName == name) return row.mElement;
+    }
+    return TScoreElement::Other;
+}
+
+/// Whether the text of an element is read, and not only its attributes or what is inside.
+[[nodiscard]] constexpr bool IsTextRead(TScoreElement element) {
+    switch (element) {
+        using enum TScoreElement;
+        case BassAlter:
+        case BassStep:
+        case BeatType:
+        case Beats:
+        case Creator:
+        case DegreeAlter:
+        case DegreeType:
+        case DegreeValue:
+        case Divisions:
+        case Duration:
+        case Ending:
+        case Fifths:
+        case Kind:
+        case Mode:
+        case MovementTitle:
+        case Offset:
+        case Rehearsal:
+        case RootAlter:
+        case RootStep:
+        case Words:
+        case WorkTitle:
+            return true;
+        default:
+            return false;
+    }
 }
 
 }  // namespace brindle

@@ -25,10 +25,11 @@ using enum TScoreElement;
 /// measures. A score lists the measures of each part, or the parts of each measure.
 class CScoreReader : public XmlStreamDelegate {
 public:
-    void didStartElement(XmlStreamParser&, std::string_view name,
+    void didStartElement(XmlStreamParser& parser, std::string_view name,
                          const XmlAttributes& attributes) override {
         const TScoreElement element = ScoreElementOf(name);
         const TScoreElement parent = Parent();
+        parser.setTextWanted(IsTextRead(element));
         mOpen.push_back(element);
         mText.clear();
         if (mOpen.size() == 1) {
@@ -55,10 +56,11 @@ public:
         }
     }
 
-    void didEndElement(XmlStreamParser&, std::string_view) override {
+    void didEndElement(XmlStreamParser& parser, std::string_view) override {
         const TScoreElement element = mOpen.back();
         mOpen.pop_back();
         const TScoreElement parent = Parent();
+        parser.setTextWanted(IsTextRead(parent));
         const std::string_view text = Ascii::Trimmed(mText);
         if (element == MovementTitle) {
             mMovementTitle = text;
@@ -76,7 +78,6 @@ public:
     }
 
     void foundCharacters(XmlStreamParser&, std::string_view text) override {
-        if (mOpen.empty() || mOpen.back() == Other) return;
         if (mText.size() + text.size() <= kXmlMaxTextLength) mText += text;
     }
 
