@@ -130,7 +130,8 @@ static_assert(kScoreElementsByLength.mBegin.back() == kScoreElementNames.size())
     const std::size_t end = kScoreElementsByLength.mBegin[name.size() + 1];
     for (std::size_t i = kScoreElementsByLength.mBegin[name.size()]; i < end; ++i) {
         const CScoreElementName& row = kScoreElementsByLength.mNames[i];
-        if (row.mName == name) return row.mElement;
+        // Most others differ in the first letter.
+        if (row.mName.front() == name.front() && row.mName == name) return row.mElement;
     }
     return TScoreElement::Other;
 }
