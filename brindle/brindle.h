@@ -163,6 +163,7 @@
 #include "brindle/platform/ReadNumber.h"
 #include "brindle/platform/Resources.h"
 #include "brindle/platform/SeededRandom.h"
+#include "brindle/platform/SortByNumber.h"
 #include "brindle/platform/Utf16.h"
 #include "brindle/platform/Utf8.h"
 #include "brindle/platform/WorkInParallel.h"
