@@ -14,7 +14,7 @@ TEST_CASE("records that begin together stay in the order in which they were writ
         std::string mName;
     };
     std::vector<CRecord> records{{4, "a"}, {0, "b"}, {4, "c"}, {-1, "d"}, {0, "e"}};
-    SortByNumber(records, [](const CRecord& record) { return record.record.mBegin; });
+    SortByNumber(records, [](const CRecord& record) { return record.mBegin; });
     std::string names;
     for (const CRecord& record : records) names += record.mName;
     CHECK(names == "dbeac");
