@@ -16,10 +16,10 @@ std::string BehindBlank(const std::string& name) {
 }  // namespace
 
 bool COptionPage::TakesFile() const {
-    constexpr auto names =
-        std::to_array<std::string_view>({"FILE", "FILES", "FOLDER", "MODEL", "PATH", "TEXT"});
-    const std::string& name = mIsArgument ? mNames.front() : mValueName;
-    return mChoices.empty() && std::find(names.begin(), names.end(), name) != names.end();
+    // What a command reads may stand in a file, whatever it is.
+    if (mIsArgument) return mChoices.empty() && !TakesCommand();
+    constexpr auto names = std::to_array<std::string_view>({"FILE", "FOLDER", "MODEL", "PATH"});
+    return std::find(names.begin(), names.end(), mValueName) != names.end();
 }
 
 bool COptionPage::TakesCommand() const {

@@ -10,7 +10,7 @@ namespace brindle::cli {
 struct COptionPage {
     /// "-o" and "--output"; of an argument its name alone, as in TEXT.
     std::vector<std::string> mNames;
-    /// What stands for the value, as in PATH; empty for flags.
+    /// What stands for the value, as in PATH; empty for flags and arguments.
     std::string mValueName;
     std::string mPurpose;
     /// The words that it takes, empty if it takes others.
@@ -22,7 +22,7 @@ struct COptionPage {
     /// Whether it can be told more than once.
     bool mIsMany = false;
 
-    /// Whether the value may be the name of a file, by the word that stands for it.
+    /// Whether the value may be the name of a file: of an option by the word that stands for it.
     [[nodiscard]] bool TakesFile() const;
     /// Whether the value is the words of a command of the program.
     [[nodiscard]] bool TakesCommand() const;

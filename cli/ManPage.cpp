@@ -66,14 +66,14 @@ std::string Paragraph(const std::string& head, std::string_view text) {
 }
 
 std::string OptionText(const COptionPage& option) {
-    if (option.mIsArgument) {
-        return Paragraph("\\fI" + Plain(option.mNames.front()) + "\\fR", option.mPurpose);
-    }
+    const char font = option.mIsArgument ? 'I' : 'B';
     std::string head;
     for (const std::string& name : option.mNames) {
-        head += fmt::format("{}\\fB{}\\fR", head.empty() ? "" : ", ", Plain(name));
+        head += fmt::format("{}\\f{}{}\\fR", head.empty() ? "" : ", ", font, Plain(name));
     }
-    if (!option.mValueName.empty()) head += " \\fI" + Plain(option.mValueName) + "\\fR";
+    const std::string value =
+        option.mIsArgument ? fmt::format("{}", fmt::join(option.mChoices, "|")) : option.mValueName;
+    if (!value.empty()) head += " \\fI" + Plain(value) + "\\fR";
     return Paragraph(head, option.mPurpose);
 }
 

@@ -6,8 +6,9 @@
 #include <doctest/doctest.h>
 
 #include <algorithm>
+#include <cstddef>
+#include <map>
 #include <regex>
-#include <set>
 #include <sstream>
 #include <string>
 #include <vector>
@@ -23,13 +24,14 @@ std::string Shown(const std::string& command) {
 struct CHelpWords {
     std::vector<std::string> mOptions;
     std::vector<std::string> mCommands;
-    std::set<std::string> mChoices;
+    /// Of "--format" or an argument as "SHELL" the words that it takes: "text|json".
+    std::map<std::string, std::string> mChoices;
 };
 
 CHelpWords ReadHelp(const std::string& help) {
     static const std::regex option("^  (-[a-z],)?(--[a-z0-9-]+).*");
     static const std::regex choices(
-        "^  (?:-[a-z],)?(?:--[a-z-]+|[A-Z]+) ([a-z0-9]+(?:\\|[a-z0-9]+)+).*");
+        "^  (?:-[a-z],)?(--[a-z-]+|[A-Z]+) ([a-z0-9-]+(?:\\|[a-z0-9-]+)+).*");
     static const std::regex command("^  ([a-z]+)\\b.*");
     CHelpWords words;
     bool isOfCommands = false;
@@ -41,9 +43,7 @@ CHelpWords ReadHelp(const std::string& help) {
         if (isOfCommands && std::regex_match(line, match, command)) {
             words.mCommands.push_back(match[1]);
         }
-        if (!std::regex_match(line, match, choices)) continue;
-        std::istringstream list(match[1]);
-        for (std::string choice; std::getline(list, choice, '|');) words.mChoices.insert(choice);
+        if (std::regex_match(line, match, choices)) words.mChoices[match[1]] = match[2];
     }
     return words;
 }
@@ -60,53 +60,99 @@ std::string Between(const std::string& text, const std::string& start, const std
     return text.substr(begin, text.find(end, begin + start.size()) - begin);
 }
 
+bool Has(const std::string& text, const std::string& part) {
+    return text.find(part) != text.npos;
+}
+
 struct CCompletions {
     std::string mBash = Shown("brindle completion bash");
     std::string mZsh = Shown("brindle completion zsh");
     std::string mFish = Shown("brindle completion fish");
 };
 
-void CheckCommand(const std::string& path, const CCompletions& shells, int& optionCount) {
+/// What has been compared.
+struct CCounts {
+    std::size_t mOptions = 0;
+    std::size_t mChoices = 0;
+};
+
+/// What the man page and the shells have of one command.
+struct CPages {
+    std::string mPath;
+    std::string mMan;
+    std::string mBash;
+    std::string mBashValues;  // of all commands
+    std::string mZsh;
+    std::string mZshCommands;
+    std::string mFish;
+    std::string mFishStart;
+};
+
+CPages PagesOf(const std::string& path, const CCompletions& shells) {
+    std::string function = "_brindle" + (path.empty() ? "" : '_' + path);
+    std::replace(function.begin(), function.end(), ' ', '_');
+    return {path,
+            WithoutBackslashes(Shown("brindle manual " + path)),
+            Between(shells.mBash, "\n        '" + path + "') options=", ";;"),
+            shells.mBash,
+            Between(shells.mZsh, "\n" + function + "() {", "\n}"),
+            Between(shells.mZsh, "\n" + function + "_commands() {", "\n}"),
+            shells.mFish,
+            "\ncomplete -c brindle -n \"__brindle_is '" + path + "'\""};
+}
+
+void CheckOption(const CPages& pages, const std::string& option) {
+    INFO(option);
+    CHECK(Has(pages.mMan, "fB" + option + "fR"));
+    CHECK(Has(pages.mBash, option + ' '));
+    CHECK((Has(pages.mZsh, option + '[') || Has(pages.mZsh, option + "=[")));
+    const std::regex fish(std::regex_replace(pages.mFishStart, std::regex("[\"]"), "\\$&") +
+                          "[^\n]* -l " + option.substr(2) + " ");
+    CHECK(std::regex_search(pages.mFish, fish));
+}
+
+void CheckChoices(const CPages& pages, const std::string& name, const std::string& choices) {
+    INFO(name);
+    const std::string words = std::regex_replace(choices, std::regex("\\|"), " ");
+    CHECK(Has(pages.mMan, name + "fR fI" + choices + "fR"));
+    if (name.front() != '-') {
+        CHECK(Has(pages.mBash, " words='" + words + " '"));
+        CHECK(Has(pages.mZsh, "':" + name + ":(" + words + ")'"));
+        CHECK(Has(pages.mFish, pages.mFishStart + " -a '" + words + "' -d "));
+        return;
+    }
+    CHECK(Has(pages.mBashValues,
+              " '" + pages.mPath + ' ' + name + "') _brindle_words '" + words + "';"));
+    CHECK(Has(Between(pages.mZsh, name + "=[", "\n"), "]:choice:(" + words + ")'"));
+    const std::string option = " -l " + name.substr(2);
+    CHECK(Has(pages.mFish, pages.mFishStart + option + " -x -a '" + words + "' -d "));
+}
+
+void CheckCommand(const std::string& path, const CCompletions& shells, CCounts& counts) {
     INFO("brindle " << path);
     const std::string shown = Shown("brindle " + path + " --help");
     CHECK(Shown("brindle help " + path) == shown);
     const CHelpWords help = ReadHelp(shown);
-    const std::string man = WithoutBackslashes(Shown("brindle manual " + path));
-    std::string function = "_brindle" + (path.empty() ? "" : '_' + path);
-    std::replace(function.begin(), function.end(), ' ', '_');
-    const std::string bash = Between(shells.mBash, "\n        '" + path + "') options=", ";;");
-    const std::string zsh = Between(shells.mZsh, "\n" + function + "() {", "\n}");
-    const std::string zshCommands = Between(shells.mZsh, "\n" + function + "_commands() {", "\n}");
-    const std::string fishStart = "complete -c brindle -n \"__brindle_is '" + path + "'\"";
+    const CPages pages = PagesOf(path, shells);
     CHECK_FALSE(help.mOptions.empty());
-    for (const std::string& option : help.mOptions) {
-        INFO(option);
-        ++optionCount;
-        CHECK(man.find("fB" + option + "fR") != man.npos);
-        CHECK(bash.find(option + ' ') != bash.npos);
-        CHECK((zsh.find(option + '[') != zsh.npos || zsh.find(option + "=[") != zsh.npos));
-        const std::regex fish("\n" + std::regex_replace(fishStart, std::regex("[\"]"), "\\$&") +
-                              "[^\n]* -l " + option.substr(2) + " ");
-        CHECK(std::regex_search(shells.mFish, fish));
-    }
-    for (const std::string& choice : help.mChoices) {
-        INFO(choice);
-        CHECK(man.find(choice) != man.npos);
-        CHECK(zsh.find(choice) != zsh.npos);
-    }
+    for (const std::string& option : help.mOptions) CheckOption(pages, option);
+    for (const auto& choice : help.mChoices) CheckChoices(pages, choice.first, choice.second);
+    counts.mOptions += help.mOptions.size();
+    counts.mChoices += help.mChoices.size();
     for (const std::string& command : help.mCommands) {
         INFO(command);
-        CHECK(bash.find(command + ' ') != bash.npos);
-        CHECK(zshCommands.find('\'' + command + ':') != zshCommands.npos);
-        CHECK(shells.mFish.find(fishStart + " -a " + command + " -d") != shells.mFish.npos);
-        CheckCommand(path.empty() ? command : path + ' ' + command, shells, optionCount);
+        CHECK(Has(pages.mBash, command + ' '));
+        CHECK(Has(pages.mZshCommands, '\'' + command + ':'));
+        CHECK(Has(pages.mFish, pages.mFishStart + " -a " + command + " -d"));
+        CheckCommand(path.empty() ? command : path + ' ' + command, shells, counts);
     }
 }
 
 TEST_CASE("Man pages and completions have every command, option and choice of the help") {
-    int optionCount = 0;
-    CheckCommand("", CCompletions(), optionCount);
-    CHECK(optionCount > 100);
+    CCounts counts;
+    CheckCommand("", CCompletions(), counts);
+    CHECK(counts.mOptions > 100);
+    CHECK(counts.mChoices > 30);
 }
 
 TEST_CASE("The completion of bash completes commands, options, choices and files") {
@@ -132,6 +178,8 @@ TEST_CASE("The completion of bash completes commands, options, choices and files
         {"brindle manual completion ''", "\n"},
         {"brindle analyse so", "song.txt\n"},
         {"brindle markov learn -o so", "song.txt\n"},
+        {"brindle markov score built-in so", "song.txt\n"},
+        {"brindle chord so", "song.txt\n"},
     };
     for (const auto& row : rows) {
         INFO(row.mTyped);
