@@ -5,7 +5,6 @@
 #include "cli/CorpusSongs.h"
 
 #include <fmt/format.h>
-#include <unistd.h>
 
 #include <memory>
 #include <optional>
@@ -50,12 +49,10 @@ CCorpusSongs SongsOf(const CCorpusOptions& options, std::optional<CDoneSongs> do
 TStatus WriteLines(CCorpusSongs& songs, const CCorpusOptions& options, const CInterrupt& interrupt,
                    CCorpusProgress& progress) {
     TStatus written = TStatus::Success;
-    const bool isTerminal = isatty(STDOUT_FILENO) == 1;
     CSongLineSteps steps;
     steps.mNext = [&] { return songs.Next(); };
     steps.mTake = [&](CSongLine&& line) {
         progress.CountSong(line.mHasFault);
-        if (isTerminal) progress.Hide();
         written = Print(line.mText);
         return written == TStatus::Success;
     };
@@ -92,7 +89,7 @@ TStatus Corpus(const CCorpusOptions& options) {
     CCorpusSongs songs = SongsOf(options, std::move(done), interrupt);
     CCorpusProgress progress;
     const TStatus written = WriteLines(songs, options, interrupt, progress);
-    progress.Hide();
+    HideProgress();
     interrupt.EndIfAsked();
     return written == TStatus::Success ? ToldEnd(songs, progress) : written;
 }

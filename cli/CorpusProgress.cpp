@@ -5,7 +5,6 @@
 #include <unistd.h>
 
 #include <algorithm>
-#include <cstdio>
 
 namespace brindle::cli {
 
@@ -21,14 +20,7 @@ void CCorpusProgress::Show() {
     const auto now = TClock::now();
     if (!mIsTerminal || now - mLastShown < pause) return;
     mLastShown = now;
-    mIsShown = true;
-    fmt::print(stderr, "\r\x1B[K{}", Summary());
-    std::fflush(stderr);
-}
-
-void CCorpusProgress::Hide() {
-    if (mIsShown) fmt::print(stderr, "\r\x1B[K");
-    mIsShown = false;
+    ShowProgress(Summary());
 }
 
 std::string CCorpusProgress::Summary() const {

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "cli/Output.h"
+
 #include <chrono>
 #include <cstddef>
 #include <string>
@@ -14,13 +16,11 @@ public:
     CCorpusProgress();
     CCorpusProgress(const CCorpusProgress&) = delete;
     CCorpusProgress& operator=(const CCorpusProgress&) = delete;
-    ~CCorpusProgress() { Hide(); }
+    ~CCorpusProgress() { HideProgress(); }
 
     void CountSong(bool hasFault);
     /// Shows where the work is, at most ten times a second.
     void Show();
-    /// Before something else is printed.
-    void Hide();
 
     [[nodiscard]] std::size_t Songs() const { return mSongs; }
     [[nodiscard]] std::size_t Faults() const { return mFaults; }
@@ -34,7 +34,6 @@ private:
     std::size_t mSongs = 0;
     std::size_t mFaults = 0;
     bool mIsTerminal;
-    bool mIsShown = false;
     TClock::time_point mBegin = TClock::now();
     TClock::time_point mLastShown = mBegin;
 };

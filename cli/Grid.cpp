@@ -3,6 +3,7 @@
 #include "cli/GridDatabase.h"
 #include "cli/GridOptions.h"
 #include "cli/NamingOptions.h"
+#include "cli/Progress.h"
 #include "cli/TypedChords.h"
 #include "cli/TypedSymbols.h"
 
@@ -130,9 +131,11 @@ TStatus Grid(const CGridOptions& options) {
     const auto words = TypedSymbols(options.mWords);
     if (!words) return TStatus::BadInput;
     CLookUp lookUp(options, *tuning);
+    CProgress progress(words->size());
     std::vector<CChordGrid> grids;
     auto status = TStatus::Success;
     for (const std::string& word : *words) {
+        progress.Step(word);
         const auto frets = ReadFrets(word);
         TGrids found = frets ? GridsOfFrets(word, *frets, *tuning, options) : lookUp.GridsOf(word);
         if (found.index() == 0) {

@@ -145,7 +145,6 @@ TStatus Import(const CImportOptions& options) {
         const CImported imported = ImportFile(file, options);
         status = std::max(status, imported.mStatus);
         if (!imported.mOutput) continue;
-        progress.Hide();
         const TStatus printed =
             Print(HeadOf(InputName(file), isFirst, options) + *imported.mOutput);
         if (printed != TStatus::Success) return printed;

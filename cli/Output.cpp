@@ -15,6 +15,8 @@
 namespace brindle::cli {
 namespace {
 
+constinit bool isProgressShown = false;
+
 // A message may repeat what was typed, and have several lines.
 std::string PrintableLines(std::string_view message) {
     std::string printable;
@@ -37,7 +39,19 @@ bool WantsColor() {
 
 }  // namespace
 
+void ShowProgress(std::string_view line) {
+    fmt::print(stderr, "\r\x1B[K{}", line);
+    std::fflush(stderr);
+    isProgressShown = true;
+}
+
+void HideProgress() {
+    if (isProgressShown) fmt::print(stderr, "\r\x1B[K");
+    isProgressShown = false;
+}
+
 TStatus Fail(TStatus status, std::string_view message) {
+    HideProgress();
     fmt::print(stderr, "brindle: {}\n", PrintableLines(message));
     return status;
 }
@@ -45,6 +59,7 @@ TStatus Fail(TStatus status, std::string_view message) {
 TStatus FailAt(TStatus status, std::string_view message, std::string_view input,
                std::size_t column) {
     if (input.find_first_not_of(" \t\r\n") == input.npos) return Fail(status, message);
+    HideProgress();
     const std::string before = Printable(input.substr(0, column));
     fmt::print(stderr, "brindle: {}\n  {}\n  {}^\n", PrintableLines(message), Printable(input),
                std::string(CountCharacters(before), ' '));
@@ -63,6 +78,7 @@ TStatus FailAtCharacter(TStatus status, std::string_view message, std::string_vi
 }
 
 TStatus Print(std::string_view text) {
+    if (isatty(STDOUT_FILENO) == 1) HideProgress();
     const bool written = std::fwrite(text.data(), 1, text.size(), stdout) == text.size();
     if (written && std::fflush(stdout) == 0) return TStatus::Success;
     return Fail(TStatus::BadInput, Message("the output cannot be written: {reason}",

@@ -34,6 +34,11 @@ TStatus FailAt(TStatus status, std::string_view message, std::string_view input,
 TStatus FailAtCharacter(TStatus status, std::string_view message, std::string_view input,
                         std::size_t column);
 
+/// Shows how far a work is, on standard error in place of what was shown before. It is gone when
+/// something else is printed.
+void ShowProgress(std::string_view line);
+void HideProgress();
+
 /// Writes a whole result to standard output; a full disk is an error.
 TStatus Print(std::string_view text);
 

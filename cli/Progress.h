@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
+#include "cli/Output.h"
+
 #include <chrono>
 #include <cstddef>
 #include <string>
@@ -15,19 +17,16 @@ public:
     explicit CProgress(std::size_t steps);
     CProgress(const CProgress&) = delete;
     CProgress& operator=(const CProgress&) = delete;
-    ~CProgress();
+    ~CProgress() { HideProgress(); }
 
     /// The next step begins; `name` is what it works on.
     void Step(std::string_view name);
-    /// Until the next step, as before something is printed.
-    void Hide();
 
 private:
     std::size_t mSteps;
     std::size_t mBegun = 0;
     bool mIsTerminal;
-    bool mIsShown = false;
-    std::chrono::steady_clock::time_point mBegin = std::chrono::steady_clock::now();
+    std::chrono::steady_clock::time_point mNextShow;
 };
 
 /// The same for a work whose length nobody knows: a line that tells how much has been done.
@@ -37,19 +36,16 @@ public:
     CCountProgress(std::string_view name, std::string unit);
     CCountProgress(const CCountProgress&) = delete;
     CCountProgress& operator=(const CCountProgress&) = delete;
-    ~CCountProgress();
+    ~CCountProgress() { HideProgress(); }
 
     void CountOne();
 
 private:
-    using TClock = std::chrono::steady_clock;
-
     std::string mName;
     std::string mUnit;
     std::size_t mCount = 0;
     bool mIsTerminal;
-    bool mIsShown = false;
-    TClock::time_point mNextShow;
+    std::chrono::steady_clock::time_point mNextShow;
 };
 
 }  // namespace brindle::cli

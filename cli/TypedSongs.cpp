@@ -82,7 +82,6 @@ TStatus CTypedSongs::Print(TFormat format,
             continue;
         }
         const std::string& text = std::get<1>(output);
-        progress.Hide();
         const TStatus printed =
             cli::Print(sources.size() == 1 ? text : OneOfSeveral(*song, format, text, isFirst));
         if (printed != TStatus::Success) return printed;
