@@ -14,6 +14,7 @@
 #include <algorithm>
 #include <cmath>
 #include <filesystem>
+#include <functional>
 #include <optional>
 #include <sstream>
 #include <string_view>
@@ -272,6 +273,26 @@ CLI::Validator OneOf(const std::vector<std::string>& choices) {
     });
 }
 
+// A number in a range; what is wrong with it otherwise.
+std::function<std::string(const std::string&)> Within(double least, double most, bool isWhole) {
+    return [least, most, isWhole](const std::string& typed) {
+        double value = 0.0;
+        if (!CLI::detail::lexical_cast(typed, value) || std::isnan(value)) {
+            return Message("{word} is no number", {{"word", typed}});
+        }
+        if (value < least || value > most) {
+            return Message("{word} is not from {least} to {most}",
+                           {{"word", typed},
+                            {"least", fmt::format("{}", least)},
+                            {"most", fmt::format("{}", most)}});
+        }
+        if (isWhole && value != std::floor(value)) {
+            return Message("{word} is no whole number", {{"word", typed}});
+        }
+        return std::string();
+    };
+}
+
 std::vector<std::string> NamesOf(const CLI::Option& option) {
     if (!option.nonpositional()) return {option.get_name(true)};
     std::vector<std::string> names;
@@ -300,23 +321,17 @@ COption& COption::Required() {
 }
 
 COption& COption::InRange(int least, int most) {
-    mOption->check(CLI::Range(least, most));
+    mOption->check(Within(least, most, true));
     return *this;
 }
 
 COption& COption::InRange(std::uint64_t least, std::uint64_t most) {
-    mOption->check(CLI::Range(least, most));
+    mOption->check(Within(static_cast<double>(least), static_cast<double>(most), true));
     return *this;
 }
 
 COption& COption::InRange(double least, double most) {
-    mOption->check(CLI::Range(least, most));
-    // What is no number is neither below nor above.
-    mOption->check([](const std::string& text) {
-        double value = 0.0;
-        const bool isNumber = !CLI::detail::lexical_cast(text, value) || !std::isnan(value);
-        return isNumber ? std::string() : text + " is no number";
-    });
+    mOption->check(Within(least, most, false));
     return *this;
 }
 

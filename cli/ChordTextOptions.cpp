@@ -3,6 +3,7 @@
 
 #include "brindle/song/SongBeats.h"
 #include "cli/CCommand.h"
+#include "cli/Message.h"
 
 namespace brindle::cli {
 
@@ -16,7 +17,7 @@ void AddBeats(CCommand& command, double& beatsPerBar, double& beatsPerChord) {
 std::optional<std::string> BeatsContradiction(double beatsPerBar, double beatsPerChord) {
     for (const double beats : {beatsPerBar, beatsPerChord}) {
         if (AreSongBeats(beats)) continue;
-        return "--beats-per-bar and --beats-per-chord take 1/1024 to 1024 beats";
+        return Message("--beats-per-bar and --beats-per-chord take 1/1024 to 1024 beats");
     }
     return std::nullopt;
 }

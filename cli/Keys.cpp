@@ -2,6 +2,7 @@
 #include "cli/ChordTextOptions.h"
 #include "cli/CommandLine.h"
 #include "cli/KeyText.h"
+#include "cli/Message.h"
 #include "cli/TypedChords.h"
 #include "cli/TypedSongs.h"
 
@@ -56,7 +57,7 @@ std::optional<std::string> Contradiction(const CKeysOptions& options) {
     }
     for (const double points : {options.mKeys.mHomeBonus, options.mKeys.mChangeCost}) {
         if (points >= 0.0 && points <= kMostPoints) continue;
-        return "--home-bonus and --change-cost take 0 to 1000 points";
+        return Message("--home-bonus and --change-cost take 0 to 1000 points");
     }
     return std::nullopt;
 }

@@ -2,6 +2,7 @@
 #pragma once
 
 #include "cli/CommandLine.h"
+#include "cli/FaultMessage.h"
 #include "cli/Input.h"
 
 #include <string>
@@ -30,7 +31,7 @@ std::variant<TStatus, std::vector<Value>> ReadLines(const std::vector<std::strin
     for (const std::string& typed : *lines) {
         const Reading reading = read(typed);
         if (!reading.mError.empty()) {
-            return FailAt(TStatus::BadInput, reading.mError, typed, reading.mColumn);
+            return FailAt(TStatus::BadInput, FaultMessage(reading.mError), typed, reading.mColumn);
         }
         values.push_back(reading.*value);
     }

@@ -1,16 +1,16 @@
 // SPDX-License-Identifier: MIT
 #include "cli/ChordSources.h"
+#include "cli/FaultMessage.h"
 #include "cli/Input.h"
 #include "cli/Markov.h"
 #include "cli/MarkovSongs.h"
+#include "cli/Message.h"
 #include "cli/Progress.h"
 
 #include "brindle/present/LearnedText.h"
 #include "brindle/present/ShownNames.h"
 #include "brindle/song/FindSongFiles.h"
 #include "brindle/song/LearnSong.h"
-
-#include <fmt/format.h>
 
 #include <filesystem>
 #include <memory>
@@ -85,7 +85,8 @@ CLearned LearnFiles(VariableLengthMarkovModel& model, const CLearnOptions& optio
 void ReportUnread(const CLearnReport& report) {
     for (const auto& [name, error] : report.mUnread) {
         Fail(TStatus::BadInput,
-             fmt::format("{} was left out: {}", InputName(name), Printable(error)));
+             Message("{name} was left out: {reason}",
+                     {{"name", InputName(name)}, {"reason", Printable(FaultMessage(error))}}));
     }
 }
 
@@ -104,7 +105,8 @@ TStatus MarkovLearn(const CLearnOptions& options) {
     VariableLengthMarkovModel model(options.mOrder);
     const CLearned learned = LearnFiles(model, options);
     ReportUnread(learned.mReport);
-    if (learned.mReport.mFiles == 0) return Fail(TStatus::BadInput, "there was nothing to learn");
+    if (learned.mReport.mFiles == 0)
+        return Fail(TStatus::BadInput, Message("there was nothing to learn"));
     if (!model.SaveToFile(options.mModel)) {
         return FailToWrite(options.mModel);
     }

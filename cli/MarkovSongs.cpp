@@ -1,7 +1,9 @@
 // SPDX-License-Identifier: MIT
 #include "cli/MarkovSongs.h"
 
+#include "cli/FaultMessage.h"
 #include "cli/Input.h"
+#include "cli/Message.h"
 #include "cli/Progress.h"
 
 #include "brindle/platform/AtomicFile.h"
@@ -77,8 +79,9 @@ CTaughtFiles TeachFiles(const std::vector<std::string>& paths, double beatsPerBa
         }
         taught.mFiles += learned > 0 ? 1 : 0;
         if (learned > 0) continue;
-        Fail(TStatus::BadInput,
-             fmt::format("{} was left out: {}", InputName(file.mPath), Printable(fault)));
+        Fail(TStatus::BadInput, Message("{name} was left out: {reason}",
+                                        {{"name", InputName(file.mPath)},
+                                         {"reason", Printable(FaultMessage(fault))}}));
         taught.mIsNamedFileUnread = taught.mIsNamedFileUnread || file.mIsNamed;
     }
     return taught;
@@ -86,7 +89,8 @@ CTaughtFiles TeachFiles(const std::vector<std::string>& paths, double beatsPerBa
 
 TStatus MarkovLearnSongs(const CLearnSongsOptions& options) {
     CTaughtFiles taught = TeachFiles(options.mFiles, options.mBeatsPerBar);
-    if (taught.mSongs.empty()) return Fail(TStatus::BadInput, "there was nothing to learn");
+    if (taught.mSongs.empty())
+        return Fail(TStatus::BadInput, Message("there was nothing to learn"));
     if (options.mWithBuiltIn) {
         for (const CSong& song : BuiltInSongs()) taught.mSongs.push_back(TeachSong(song));
     }

@@ -1,4 +1,5 @@
 // SPDX-License-Identifier: MIT
+#include "cli/FaultMessage.h"
 #include "cli/Input.h"
 #include "cli/KeyText.h"
 #include "cli/MarkovSongs.h"
@@ -26,7 +27,7 @@ std::optional<CSongRequestReading> ReadRequest(const CWriteOptions& written,
          FoldAccidentals(written.mContains), FoldAccidentals(written.mNever)});
     if (!reading.mFault.empty()) {
         // Its parts are called as the options are.
-        Fail(TStatus::BadUsage, "--" + Printable(reading.mFault));
+        Fail(TStatus::BadUsage, "--" + Printable(FaultMessage(reading.mFault)));
         return std::nullopt;
     }
     if (!written.mStyle.empty()) reading.mStyle.clear();
@@ -103,7 +104,9 @@ TStatus MarkovWrite(const CWriteOptions& written, const CWriteSettings& settings
     const auto model = ReadSongModelFile(written.mModel, written.mStyle);
     if (!model) return TStatus::BadInput;
     const CWrittenSong song = WriteRequestedSong(*model, *request);
-    if (!song.mFault.empty()) return Fail(TStatus::BadUsage, WrittenSongFault(song, "--"));
+    if (!song.mFault.empty()) {
+        return Fail(TStatus::BadUsage, FaultMessage(WrittenSongFault(song, "--")));
+    }
     if (settings.mMidi &&
         !WriteFileAtomically(*settings.mMidi,
                              MidiFileBytes(MidiPieceOfSong(song.mSong, settings.mTempo)))) {

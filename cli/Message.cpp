@@ -8,6 +8,10 @@
 namespace brindle::cli {
 
 std::string Message(const char* english, std::initializer_list<CFilledPlace> places) {
+    return Message(english, std::span(places.begin(), places.size()));
+}
+
+std::string Message(const char* english, std::span<const CFilledPlace> places) {
     const std::string pattern = LocalizedString(english);
     std::string_view rest = pattern;
     std::string text;
@@ -16,7 +20,7 @@ std::string Message(const char* english, std::initializer_list<CFilledPlace> pla
         const std::size_t close = rest.find('}', open);
         if (close == rest.npos) return text.append(rest);
         const std::string_view name = rest.substr(open + 1, close - open - 1);
-        const auto* const place =
+        const auto place =
             std::find_if(places.begin(), places.end(),
                          [&](const CFilledPlace& candidate) { return candidate.mName == name; });
         text += rest.substr(0, open);

@@ -2,6 +2,7 @@
 #pragma once
 
 #include <initializer_list>
+#include <span>
 #include <string>
 #include <string_view>
 
@@ -17,5 +18,6 @@ struct CFilledPlace {
 /// data/locale have each English text that stands in a call.
 [[nodiscard]] std::string Message(const char* english,
                                   std::initializer_list<CFilledPlace> places = {});
+[[nodiscard]] std::string Message(const char* english, std::span<const CFilledPlace> places);
 
 }  // namespace brindle::cli

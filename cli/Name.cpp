@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "cli/CommandLine.h"
+#include "cli/FaultMessage.h"
 #include "cli/Input.h"
 #include "cli/KeyText.h"
 #include "cli/NamingOptions.h"
@@ -84,8 +85,8 @@ std::optional<int> ReadNeighbour(const std::string& option, const std::string& t
     const CChordTextReading read =
         ReadChordText(typed, {.mBIsBFlat = options.mNaming.Prefs().mBForBFlat});
     if (read.mKind == TChordText_Chord) return read.mChord.mRootKeyEnh.mKeyNr;
-    const std::string fault = read.mFault.empty() ? "this is no chord symbol" : read.mFault;
-    static_cast<void>(FailAtCharacter(TStatus::BadUsage, option + ": " + fault, typed,
+    const std::string fault = read.mFault.empty() ? "this is no chord" : read.mFault;
+    static_cast<void>(FailAtCharacter(TStatus::BadUsage, option + ": " + FaultMessage(fault), typed,
                                       static_cast<std::size_t>(read.mFaultPos)));
     return std::nullopt;
 }
@@ -191,7 +192,7 @@ TStatus Name(CNameOptions options) {
         if (notes.mError.empty()) {
             sets.push_back(std::move(notes));
         } else {
-            status = FailAt(TStatus::BadInput, notes.mError, typed, notes.mColumn);
+            status = FailAt(TStatus::BadInput, FaultMessage(notes.mError), typed, notes.mColumn);
         }
     }
     if (sets.empty()) return status;

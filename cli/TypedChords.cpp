@@ -2,15 +2,15 @@
 #include "cli/TypedChords.h"
 
 #include "cli/CommandLine.h"
+#include "cli/FaultMessage.h"
 #include "cli/Input.h"
 #include "cli/LeadSheet.h"
+#include "cli/Message.h"
 #include "cli/Output.h"
 
 #include "brindle/analysis/TChordStringParse.h"
 #include "brindle/present/ShownNames.h"
 #include "brindle/song/ParseSong.h"
-
-#include <fmt/format.h>
 
 #include <algorithm>
 #include <array>
@@ -58,14 +58,16 @@ std::string_view Line(std::string_view text, std::size_t number) {
 void PrintFault(std::string_view text, const CSongFault& fault, bool isWarning,
                 std::string_view name = {}) {
     std::string message = name.empty() ? "" : Printable(name) + ": ";
-    if (isWarning || fault.mIsNote) message += "warning: ";
+    if (isWarning || fault.mIsNote) message += Message("warning: ");
+    const std::string told = Printable(FaultMessage(fault.mText));
     if (fault.mLine == 0) {
-        Fail(TStatus::BadInput, message + Printable(fault.mText));
+        Fail(TStatus::BadInput, message + told);
         return;
     }
-    if (text.find('\n') != text.npos) message += fmt::format("line {}: ", fault.mLine);
-    FailAtCharacter(TStatus::BadInput, message + Printable(fault.mText), Line(text, fault.mLine),
-                    fault.mColumn);
+    if (text.find('\n') != text.npos) {
+        message += Message("line {number}: ", {{"number", std::to_string(fault.mLine)}});
+    }
+    FailAtCharacter(TStatus::BadInput, message + told, Line(text, fault.mLine), fault.mColumn);
 }
 
 }  // namespace
@@ -77,8 +79,8 @@ void PrintFaults(std::string_view text, std::span<const CTextFault> faults, bool
         PrintFault(text, fault, areWarnings, name);
     }
     if (faults.size() > count) {
-        Fail(TStatus::BadInput,
-             fmt::format("warning: and {} more like these", faults.size() - count));
+        Fail(TStatus::BadInput, Message("warning: and {count} more like these",
+                                        {{"count", std::to_string(faults.size() - count)}}));
     }
 }
 
