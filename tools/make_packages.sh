@@ -42,7 +42,7 @@ apt-get update -q
 apt-get install -qy --no-install-recommends ./brindle_*.deb man-db bash-completion
 [ "$(brindle numerals 'ii7 V7' --key C)" = "Dm7 G7" ]
 brindle grid Am | grep -q x02210
-LANGUAGE=de LC_ALL=C.UTF-8 brindle analyse "Dm7 G7 C" | grep -q "C Major"
+LANGUAGE=de LC_ALL=C.UTF-8 brindle analyse "Dm7 G7 C" | grep -q "C major"
 man brindle | grep -q COMMANDS
 man brindle-markov-learn | grep -q "model"
 bash -c 'compopt() { :; }

@@ -127,7 +127,7 @@ std::string ChordsFromNotesText(const CScoreNotes& score, const CChordsFromNotes
         barBefore = bar;
     }
     if (chords.mKey.IsUndef()) return table.Text(paint);
-    return paint.Strong(chords.mKey.NameLong(NamePrefs())) + "\n\n" + table.Text(paint);
+    return paint.Strong(KeyInWords(chords.mKey)) + "\n\n" + table.Text(paint);
 }
 
 }  // namespace brindle

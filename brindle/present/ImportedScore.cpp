@@ -6,6 +6,7 @@
 #include "brindle/present/ShownNames.h"
 #include "brindle/present/ShownText.h"
 #include "brindle/theory/CSignKeyHeavy.h"
+#include "brindle/theory/CSignKeyLite.h"
 
 #include <fmt/format.h>
 
@@ -146,7 +147,7 @@ public:
 
     void SignKey(const CMuxmlSignKey& key) const {
         const CSignKeyHeavy written = key.ConvertToCSignKeyTransposedPitch();
-        Add(key.mPositionAsMidiTicks, "key " + written.NameLong(NamePrefs()));
+        Add(key.mPositionAsMidiTicks, "key " + KeyInWords(written.ToSignKeyLite()));
         if (!IsOfFirstPart()) return;
         const CSignKeyHeavy sounding = key.ConvertToCSignKeySoundingPitch();
         mScore->mKeySignatures.push_back({key.mPositionAsMidiTicks, sounding.SignsCount(),

@@ -26,7 +26,7 @@ public:
     [[nodiscard]] CShownCenter Show(const CHarmAnlsCenter& center) const {
         CShownCenter shown;
         shown.mHarmCenter = center.mHarmCenter;
-        shown.mName = center.IsUndef() ? "unknown" : center.mHarmCenter.NameLong(NamePrefs());
+        shown.mName = center.IsUndef() ? "unknown" : KeyInWords(center.mHarmCenter);
         shown.mProbability = center.mProbability;
         for (const CHarmAnlsChordWithPos& chord : center.mChords) {
             // A center that was put together from several readings holds a chord once for each.
@@ -51,7 +51,7 @@ public:
     [[nodiscard]] CShownSignKey Show(const CHarmAnlsSignKey& signKey) const {
         CShownSignKey shown;
         shown.mSignKey = signKey.mSignKey;
-        shown.mName = signKey.IsUndef() ? "unknown" : signKey.mSignKey.NameLong(NamePrefs());
+        shown.mName = signKey.IsUndef() ? "unknown" : KeyInWords(signKey.mSignKey);
         shown.mBegin = std::max(0.0, signKey.mPosition);
         for (const CHarmAnlsCenter& center : signKey.mHarmCenters) {
             shown.mCenters.push_back(Show(center));

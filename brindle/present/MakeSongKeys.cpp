@@ -14,10 +14,8 @@ namespace {
 
 CShownKeyRegion ShownRegion(const CSong& song, const CSongReading& reading,
                             const CKeyRegion& region) {
-    CShownKeyRegion shown{region.mKey,
-                          region.mKey.NameLong(NamePrefs()),
-                          {region.mPosition, region.mEndPosition},
-                          {}};
+    CShownKeyRegion shown{
+        region.mKey, KeyInWords(region.mKey), {region.mPosition, region.mEndPosition}, {}};
     const std::size_t end = std::min(region.mEnd, song.mSymbols.size());
     for (std::size_t i = region.mBegin; i < end; ++i) {
         const bool isLast = i + 1 == song.mChords.size();
@@ -33,14 +31,12 @@ CShownKeys ShownKeys(const CHarmAnlsChords& chords, const CChordSymbols& symbols
                      const CKeyOfSong& found, const std::vector<std::string>& numerals) {
     CShownKeys keys;
     keys.mKey = found.mKey;
-    if (!found.mKey.IsUndef()) keys.mName = found.mKey.NameLong(NamePrefs());
+    if (!found.mKey.IsUndef()) keys.mName = KeyInWords(found.mKey);
     keys.mConfidence = found.mConfidence;
     keys.mScores = found.mScores;
     for (const CKeyRegion& region : found.mRegions) {
-        CShownKeyRegion shown{region.mKey,
-                              region.mKey.NameLong(NamePrefs()),
-                              {region.mPosition, region.mEndPosition},
-                              {}};
+        CShownKeyRegion shown{
+            region.mKey, KeyInWords(region.mKey), {region.mPosition, region.mEndPosition}, {}};
         for (std::size_t i = region.mBegin; i < region.mEnd; ++i) {
             const bool isLast = i + 1 == chords.size();
             const double end = isLast ? region.mEndPosition : chords[i + 1].mPosition;
@@ -57,7 +53,7 @@ CShownKeys ShownKeys(const CHarmAnlsChords& chords, const CChordSymbols& symbols
 CShownKeys MakeSongKeys(const CSong& song, const CSongReading& reading) {
     CShownKeys keys;
     keys.mKey = reading.mKey;
-    if (!reading.mKey.IsUndef()) keys.mName = reading.mKey.NameLong(NamePrefs());
+    if (!reading.mKey.IsUndef()) keys.mName = KeyInWords(reading.mKey);
     keys.mConfidence = reading.mConfidence;
     for (const CKeyRegion& region : reading.mRegions) {
         keys.mRegions.push_back(ShownRegion(song, reading, region));

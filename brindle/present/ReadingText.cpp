@@ -58,7 +58,7 @@ std::string Head(const CSong& song, const CSongReading& reading, const CPaint& p
     if (!bars.empty()) text += paint.Faint(bars) + '\n';
     if (!text.empty()) text += '\n';
     if (reading.mKey.IsUndef()) return text + paint.Strong("No key: no chords") + '\n';
-    text += paint.Strong("Key of the song " + reading.mKey.NameLong(NamePrefs())) +
+    text += paint.Strong("Key of the song " + KeyInWords(reading.mKey)) +
             paint.Faint(KeyDetails(song, reading)) + '\n';
     for (const std::string& line : KeyContradictions(song, reading)) text += line + '\n';
     return text;
@@ -123,9 +123,8 @@ struct CRegionRow {
 std::vector<CRegionRow> RegionRows(const CSongReading& reading, const CBars& bars) {
     std::vector<CRegionRow> rows;
     for (const CKeyRegion& region : reading.mRegions) {
-        CRegionRow row{region.mKey.NameLong(NamePrefs()),
-                       BarsOf({region.mPosition, region.mEndPosition}, bars),
-                       {}};
+        CRegionRow row{
+            KeyInWords(region.mKey), BarsOf({region.mPosition, region.mEndPosition}, bars), {}};
         for (std::size_t ix = region.mBegin; ix < region.mEnd; ++ix) {
             const std::string& numeral = reading.mChords[ix].mNumeral;
             if (!numeral.empty()) row.mNumerals.push_back(numeral);

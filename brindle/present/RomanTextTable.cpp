@@ -30,7 +30,7 @@ std::string RomanTextText(const CRomanTextReading& reading, const CPaint& paint)
         if (!chord.mNumeralBefore.empty()) numeral += " = " + Printable(chord.mNumeralBefore);
         table.AddRow({std::to_string(BarAt(reading, chord.mPosition).mNumber),
                       ShortNumber(chord.mPosition), ShortNumber(chord.mLength),
-                      chord.mKey.NameLong(NamePrefs()), numeral, WriteChordSymbol(chord.mChord)});
+                      KeyInWords(chord.mKey), numeral, WriteChordSymbol(chord.mChord)});
     }
     return table.Text(paint);
 }

@@ -3,8 +3,10 @@
 
 #include "brindle/chords/CChordLite.h"
 #include "brindle/chords/HarmFuncNames.h"
+#include "brindle/platform/Ascii.h"
 #include "brindle/theory/CHarmCenterLite.h"
 #include "brindle/theory/CScaleHeavy.h"
+#include "brindle/theory/CSignKeyLite.h"
 #include "brindle/theory/KeyNames.h"
 
 #include <fmt/format.h>
@@ -13,6 +15,16 @@
 #include <cstdlib>
 
 namespace brindle {
+namespace {
+
+/// Within a sentence a mode is no proper name.
+std::string WithSmallMode(std::string longName) {
+    const std::size_t blank = longName.find(' ');
+    if (blank != longName.npos) longName[blank + 1] = Ascii::ToLower(longName[blank + 1]);
+    return longName;
+}
+
+}  // namespace
 
 const CChordNamePrefs& NamePrefs() {
     return ChordNamePrefsNonUTF8;
@@ -20,6 +32,14 @@ const CChordNamePrefs& NamePrefs() {
 
 std::string KeyName(const CKeyEnh& keyEnh) {
     return KeyNrAndEnhToName(keyEnh.mKeyNr, keyEnh.mEnh, NamePrefs());
+}
+
+std::string KeyInWords(const CSignKeyLite& key) {
+    return WithSmallMode(key.NameLong(NamePrefs()));
+}
+
+std::string KeyInWords(const CHarmCenterLite& center) {
+    return WithSmallMode(center.NameLong(NamePrefs()));
 }
 
 std::string_view DegreeName(int distance) {

@@ -14,6 +14,7 @@ namespace brindle {
 class CChordLite;
 struct CHarmCenterLite;
 class CScaleHeavy;
+struct CSignKeyLite;
 }  // namespace brindle
 
 namespace brindle {
@@ -23,6 +24,10 @@ namespace brindle {
 
 /// "F#", "Bb"; "Undef" for no key.
 [[nodiscard]] std::string KeyName(const CKeyEnh& keyEnh);
+
+/// A key or a center as texts and pictures name it: "F# minor", "D dorian"; "Undef" for none.
+[[nodiscard]] std::string KeyInWords(const CSignKeyLite& key);
+[[nodiscard]] std::string KeyInWords(const CHarmCenterLite& center);
 
 /// The scale degree that lies `distance` semitones above a tonic, in Roman numerals: "V" for 7,
 /// "bIII" for 3. Empty for -1.

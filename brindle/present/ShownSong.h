@@ -46,7 +46,7 @@ struct CShownCopy {
 /// where the center does.
 struct CShownCenter {
     CHarmCenterLite mHarmCenter;       ///< undefined for chords without a center
-    std::string mName;                 ///< "C Major"; "unknown" if undefined
+    std::string mName;                 ///< "C major"; "unknown" if undefined
     double mProbability = kPosUndef;   ///< as the analysis weighs it; kPosUndef where it does not
     CTimeRange mRange;                 ///< in beats
     std::vector<CShownChord> mChords;  ///< by time, each once
@@ -54,7 +54,7 @@ struct CShownCenter {
 
 /// A key signature from its place on, with the centers that are heard under it.
 struct CShownSignKey {
-    std::string mName;                   ///< "C Major"; "unknown" if undefined
+    std::string mName;                   ///< "C major"; "unknown" if undefined
     CSignKeyLite mSignKey;               ///< undefined where none is known
     double mBegin = 0.0;                 ///< in beats
     std::vector<CShownCenter> mCenters;  ///< as the analysis has them
@@ -90,7 +90,7 @@ struct CShownNumeral {
 /// A stretch of a song in one key, with its chords.
 struct CShownKeyRegion {
     CSignKeyLite mKey;                   ///< of the stretch
-    std::string mName;                   ///< "C Major"
+    std::string mName;                   ///< "C major"
     CTimeRange mRange;                   ///< without a gap to the next one
     std::vector<CShownNumeral> mChords;  ///< by time
 };
@@ -98,7 +98,7 @@ struct CShownKeyRegion {
 /// The key of a song and its local keys as they are shown.
 struct CShownKeys {
     CSignKeyLite mKey;                      ///< undefined for a song without chords
-    std::string mName = "none";             ///< "C Major", or "none"
+    std::string mName = "none";             ///< "C major", or "none"
     double mConfidence = kPosUndef;         ///< 0 to 1, see CKeyOfSong; kPosUndef without a key
     std::array<double, 24> mScores{};       ///< the points of C to B major, then C to B minor
     std::vector<CShownKeyRegion> mRegions;  ///< by time

@@ -46,9 +46,8 @@ std::string TonalityText(const CSignKeyLite& key, const CPaint& paint) {
         "  notes     {}\n"
         "  relative  {}\n"
         "  code      {}\n",
-        paint.Strong(key.NameLong(NamePrefs())), SignsText(key.SignsCount()),
-        NotesText(NotesOfTonality(key)), key.ParallelSignKey().NameLong(NamePrefs()),
-        HasSignKeyCode(code) ? fmt::format("{}", code) : "none");
+        paint.Strong(KeyInWords(key)), SignsText(key.SignsCount()), NotesText(NotesOfTonality(key)),
+        KeyInWords(key.ParallelSignKey()), HasSignKeyCode(code) ? fmt::format("{}", code) : "none");
 }
 
 }  // namespace

@@ -500,7 +500,7 @@ TEST_CASE("Keys that contradict are told under the title and in the description"
     song.mStatedKey = CSignKeyLite("A minor");
     CReadingOptions options;
     options.mStatedKey = *song.mStatedKey;
-    const std::string note = "A Minor is the stated key; the chords alone would show C Major.";
+    const std::string note = "A minor is the stated key; the chords alone would show C major.";
     const std::string svg = LeadSheetSvg(song, ReadSongHarmony(song, options));
     CHECK(svg.find(note + "</text>") != std::string::npos);
     CHECK(svg.find(note + " Chords: C F G C</desc>") != std::string::npos);

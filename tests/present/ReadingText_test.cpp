@@ -41,20 +41,20 @@ TEST_CASE("A song stands four bars a line, chords over numerals, keys where they
     CHECK(Shown("Dm7 G7 | Cmaj7 | Fm7 Bb7 | Ebmaj7 | Am7b5 D7 | Gm |") ==
           "6 bars\n"
           "\n"
-          "Key of the song C Major, doubtful (confidence 0.54)\n"
+          "Key of the song C major, doubtful (confidence 0.54)\n"
           "\n"
-          "    C Major               Eb Major\n"
+          "    C major               Eb major\n"
           "1 | Dm7      G7 | Cmaj7 | Fm7       Bb7 | Ebmaj7 |\n"
           "  | ii7      V7 | I^7   | ii7       V7  | I^7    |\n"
           "\n"
-          "    G Minor\n"
+          "    G minor\n"
           "5 | Am7b5    D7 | Gm    |\n"
           "  | iih7     V7 | i     |\n"
           "\n"
           "Notes\n"
-          "  bars 1 to 2: ii V I of C Major\n"
-          "  bars 3 to 4: ii V I of Eb Major\n"
-          "  bars 5 to 6: ii V i of G Minor\n");
+          "  bars 1 to 2: ii V I of C major\n"
+          "  bars 3 to 4: ii V I of Eb major\n"
+          "  bars 5 to 6: ii V i of G minor\n");
 }
 
 TEST_CASE("A line has as many bars as its width holds, and no line is wider") {
@@ -116,26 +116,26 @@ TEST_CASE("Bars that hold a chord show it, and a long row of them its number") {
 
 TEST_CASE("Notes tell ii V I with all its places") {
     const std::string shown = Shown("C | Dm7 G7 | C | F | Dm7 G7 | C |");
-    CHECK(Has(shown, "  bars 2 to 3, bars 5 to 6: ii V I of C Major\n"));
+    CHECK(Has(shown, "  bars 2 to 3, bars 5 to 6: ii V I of C major\n"));
 }
 
 TEST_CASE("A tonic that comes behind other chords is not noted with its ii V") {
     const std::string shown = Shown("C6 A7 | Dm7 G7 | Em7 A7 | Dm7 G7 | C6 |");
-    CHECK(Has(shown, "  bar 2: ii V of C Major\n"));
-    CHECK(Has(shown, "  bars 4 to 5: ii V I of C Major\n"));
-    CHECK(Has(Shown("C | Dm7 G7sus4 | G7 | C |"), "  bars 2 to 4: ii V I of C Major\n"));
+    CHECK(Has(shown, "  bar 2: ii V of C major\n"));
+    CHECK(Has(shown, "  bars 4 to 5: ii V I of C major\n"));
+    CHECK(Has(Shown("C | Dm7 G7sus4 | G7 | C |"), "  bars 2 to 4: ii V I of C major\n"));
 }
 
 TEST_CASE("A tonic with the other third is noted by its name") {
-    CHECK(Has(Shown("C | Dm7 G7 | Cm | F | G7 | C |"), "  bars 2 to 3: ii V of C Major, to Cm\n"));
+    CHECK(Has(Shown("C | Dm7 G7 | Cm | F | G7 | C |"), "  bars 2 to 3: ii V of C major, to Cm\n"));
     CHECK(Has(Shown("Am | Bm7b5 E7 | Am | Bm7b5 E7 | A |"),
-              "  bars 4 to 5: ii V of A Minor, to A\n"));
+              "  bars 4 to 5: ii V of A minor, to A\n"));
 }
 
 TEST_CASE("Of seconds and dominants that lead to one tonic the last ones are noted") {
     const std::string shown = Shown("Gm7 C7 | Gm7 C7 | Gm7 C7 | F | Dm7 | Db7 C7 Db7 C7 | F |");
-    CHECK(Has(shown, "  bars 3 to 4: ii V I of F Major\n"));
-    CHECK(Has(shown, "  bar 6: Db7 is a substitute dominant, subV7/V of F Major\n"));
+    CHECK(Has(shown, "  bars 3 to 4: ii V I of F major\n"));
+    CHECK(Has(shown, "  bar 6: Db7 is a substitute dominant, subV7/V of F major\n"));
 }
 
 TEST_CASE("Chains of dominants are noted without other forms of one of them") {
@@ -159,11 +159,11 @@ TEST_CASE("Chords with a name of their own are noted by it, in numbers, too") {
          {CNumeralOptions{}, CNumeralOptions{.mNashville = true}}) {
         const CSongReading reading = WithNumerals(plain, song.mChords, options);
         const std::string shown = ReadingText(song, reading, {}, CPaint(false));
-        CHECK(Has(shown, "D7b5/Ab is the French sixth of C Major\n"));
-        CHECK(Has(shown, "Ab7no5 is the Italian sixth of C Major\n"));
-        CHECK(Has(shown, "Ab7 is the German sixth of C Major\n"));
-        CHECK(Has(shown, "Db/F is the Neapolitan sixth of C Major\n"));
-        CHECK(Has(shown, "Db is the Neapolitan chord of C Major\n"));
+        CHECK(Has(shown, "D7b5/Ab is the French sixth of C major\n"));
+        CHECK(Has(shown, "Ab7no5 is the Italian sixth of C major\n"));
+        CHECK(Has(shown, "Ab7 is the German sixth of C major\n"));
+        CHECK(Has(shown, "Db/F is the Neapolitan sixth of C major\n"));
+        CHECK(Has(shown, "Db is the Neapolitan chord of C major\n"));
         CHECK(Explain(song, reading)[1] ==
               "D7b5/Ab is the French sixth of C major and opens to G.");
     }
@@ -174,7 +174,7 @@ TEST_CASE("Regions show all their numerals, on as many lines as these take") {
     const std::string shown =
         RegionsText(song, ReadSongHarmony(song), {.mWidth = 52}, CPaint(false));
     CHECK(Has(shown,
-              "  C Major  bars 1 to 11  I vi ii V7 I vi ii V7 I IV\n"
+              "  C major  bars 1 to 11  I vi ii V7 I vi ii V7 I IV\n"
               "                         I\n"));
 }
 
@@ -182,25 +182,25 @@ TEST_CASE("Keys that contradict are told") {
     CSong song = ReadSong("C | F | G7 | C | F | G7 | C |");
     CHECK(!Has(Shown(song), "stated"));
     song.mStatedKey = CSignKeyLite({9, TEnh_n}, TSignKeyType_Minor);
-    CHECK(Has(Shown(song), "A Minor is the stated key; the chords alone would show C Major.\n"));
+    CHECK(Has(Shown(song), "A minor is the stated key; the chords alone would show C major.\n"));
     song.mFormat = TSongFormat_MusicXml;
-    CHECK(Has(Shown(song), "The stated key is A Minor, but the chords show C Major.\n"));
+    CHECK(Has(Shown(song), "The stated key is A minor, but the chords show C major.\n"));
 }
 
 TEST_CASE("A key in which no passage is heard is told to be one") {
     const std::string_view word =
-        "No passage is heard in C Major itself, only in keys around it.\n";
+        "No passage is heard in C major itself, only in keys around it.\n";
     CHECK(Has(Shown("C D"), word));
     CHECK(!Has(Shown("C F G7 C"), word));
 }
 
 TEST_CASE("Well-known forms have one key, the one that musicians name") {
-    CHECK(Has(Shown("Am | F | C | G | Am | F | C | G |"), "Key of the song C Major"));
+    CHECK(Has(Shown("Am | F | C | G | Am | F | C | G |"), "Key of the song C major"));
     CHECK(Has(Shown("C7 | F7 | C7 | C7 | F7 | F7 | C7 | C7 | G7 | F7 | C7 | G7 |"),
-              "Key of the song C Major"));
+              "Key of the song C major"));
     CHECK(Has(Shown("Bb6 G7 | Cm7 F7 | Bb6 G7 | Cm7 F7 | Bb7 | Eb7 | Bb6 F7 | Bb6 | D7 | . | G7 | "
                     ". | C7 | . | F7 | . |"),
-              "Key of the song Bb Major"));
+              "Key of the song Bb major"));
 }
 
 TEST_CASE("A song without chords, or with chords in no time, is shown as such") {

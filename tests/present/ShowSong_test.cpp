@@ -143,16 +143,16 @@ TEST_CASE("The pictures of a song tell a screen reader what they show") {
     for (const std::string& svg : {AnalysisSvg(song), KeysSvg(song)}) {
         CHECK(svg.find("<svg xmlns=\"http://www.w3.org/2000/svg\" role=\"img\" ") != svg.npos);
         CHECK(svg.find("</title>\n<desc>") != svg.npos);
-        CHECK(svg.find(" in time. C Major: Dm7 G7 C C</desc>") != svg.npos);
+        CHECK(svg.find(" in time. C major: Dm7 G7 C C</desc>") != svg.npos);
     }
     CSong stated = ReadSong("Dm7 G7 | C C");
     stated.mStatedKey = CSignKeyLite({4, TEnh_n}, TSignKeyType_Minor);
     CShownSong contradicting = Shown(stated);
     contradicting.mKeys =
         MakeSongKeys(stated, ReadHarmony(stated.mChords, {.mStatedKey = *stated.mStatedKey}));
-    CHECK(contradicting.mKeys.mName == "E Minor");
+    CHECK(contradicting.mKeys.mName == "E minor");
     for (const std::string& svg : {AnalysisSvg(contradicting), KeysSvg(contradicting)}) {
-        const std::string_view word = "E Minor is the stated key; the chords alone would show";
+        const std::string_view word = "E minor is the stated key; the chords alone would show";
         CHECK(svg.find(word, svg.find("</desc>")) != svg.npos);
         CHECK(svg.find(word) < svg.find("</desc>"));
     }

@@ -77,7 +77,7 @@ private:
         if (regions.size() == 1 && regions.front().mKey == mReading.mKey) return;
         for (const CKeyRegion& region : regions) {
             if (region.mBegin < mKeys.size()) {
-                mKeys[region.mBegin] = region.mKey.NameLong(NamePrefs());
+                mKeys[region.mBegin] = KeyInWords(region.mKey);
             }
         }
     }

@@ -103,7 +103,7 @@ private:
         if (arrives && !hasOtherThird) {
             text += key.mSignKeyType == TSignKeyType_Minor ? " i" : " I";
         }
-        text += " of " + key.NameLong(NamePrefs());
+        text += " of " + KeyInWords(key);
         if (hasOtherThird) text += ", to " + mAround.Symbol(goal);
         Note(std::move(text), ix, static_cast<std::size_t>(last));
     }
@@ -181,7 +181,7 @@ private:
 
     [[nodiscard]] std::string ColorOf(std::size_t ix) const {
         const CChordReading& chord = mReading.mChords[ix];
-        const std::string key = chord.mKey.NameLong(NamePrefs());
+        const std::string key = KeyInWords(chord.mKey);
         switch (chord.mRelation) {
             case TChordRelation_Borrowed:
                 return "is borrowed from " + ParallelName(chord.mKey);
@@ -196,8 +196,7 @@ private:
                                                       : "is the Neapolitan chord of ") +
                        key;
             case TChordRelation_AugmentedSixth:
-                return SixthName(mAround.SixthChord(ix)) + " of " +
-                       ServedKey(chord).NameLong(NamePrefs());
+                return SixthName(mAround.SixthChord(ix)) + " of " + KeyInWords(ServedKey(chord));
             case TChordRelation_Blues:
                 return "has the seventh of the blues";
             default:
@@ -220,7 +219,7 @@ private:
     [[nodiscard]] static std::string ParallelName(CSignKeyLite key) {
         const bool isMinor = key.mSignKeyType == TSignKeyType_Minor;
         key.mSignKeyType = isMinor ? TSignKeyType_Major : TSignKeyType_Minor;
-        return key.NameLong(NamePrefs());
+        return KeyInWords(key);
     }
 
     const CSong& mSong;
@@ -250,8 +249,8 @@ std::vector<std::string> KeyContradictions(const CSong& song, const CSongReading
     std::vector<std::string> lines;
     if (reading.mKey.IsUndef()) return lines;
     const CSignKeyLite found = FindKeys(song.mChords, {.mBeatsPerBar = song.mBeatsPerBar}).mKey;
-    const std::string read = reading.mKey.NameLong(NamePrefs());
-    const std::string shown = found.NameLong(NamePrefs());
+    const std::string read = KeyInWords(reading.mKey);
+    const std::string shown = KeyInWords(found);
     const bool isFound = SoundsAlike(found, reading.mKey);
     const bool isHeard = std::any_of(
         reading.mRegions.begin(), reading.mRegions.end(),
@@ -263,7 +262,7 @@ std::vector<std::string> KeyContradictions(const CSong& song, const CSongReading
     const bool isStated = song.mStatedKey && !song.mStatedKey->IsUndef();
     if (isStated && !SoundsAlike(*song.mStatedKey, reading.mKey)) {
         lines.push_back(fmt::format("The stated key is {}, but the chords show {}.",
-                                    song.mStatedKey->NameLong(NamePrefs()), read));
+                                    KeyInWords(*song.mStatedKey), read));
     }
     if (isFound) return lines;
     if (isStated && SoundsAlike(*song.mStatedKey, reading.mKey)) {

@@ -10,7 +10,7 @@
 
 namespace brindle {
 
-/// What is worth a word in a song: "bars 9 to 12: ii V I of Eb Major". In the order in which they
+/// What is worth a word in a song: "bars 9 to 12: ii V I of Eb major". In the order in which they
 /// first happen; what happens several times is told once, with all places.
 [[nodiscard]] std::vector<std::string> ReadingNotes(const CSong& song, const CSongReading& reading,
                                                     const CBars& bars);

@@ -262,7 +262,7 @@ void BindAnalyses(nb::module_& module) {
 
 >>> import brindle
 >>> print(brindle.read("C F G C").analyse().to_text())
-Key of the song C Major, clear (confidence 0.99)
+Key of the song C major, clear (confidence 0.99)
 <BLANKLINE>
 1 | C  F   G  C |
   | I  IV  V  I |
