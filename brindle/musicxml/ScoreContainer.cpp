@@ -84,7 +84,10 @@ std::optional<std::string> ScoreInContainer(std::string_view bytes) {
     return file->mContents;
 }
 
-const char* ContainerFault(std::string_view bytes) {
+std::string ContainerFault(std::string_view bytes) {
+    // A library without readers of scores says so of any text.
+    XmlStreamParser parser;
+    if (!parser.parse("<score/>")) return parser.parserError()->mDescription;
     return UnpackZip(bytes) ? "no score in the container" : "the container cannot be unpacked";
 }
 

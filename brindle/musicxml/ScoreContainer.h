@@ -16,6 +16,6 @@ namespace brindle {
 [[nodiscard]] std::optional<std::string> ScoreInContainer(std::string_view bytes);
 
 /// What is wrong with a container in which `ScoreInContainer` finds nothing.
-[[nodiscard]] const char* ContainerFault(std::string_view bytes);
+[[nodiscard]] std::string ContainerFault(std::string_view bytes);
 
 }  // namespace brindle
