@@ -34,6 +34,7 @@ struct CCorpusOptions {
     bool mIsUnordered = false;
     bool mIsLenient = false;
     bool mTakesAll = false;
+    bool mIsJson = true;
     std::string mDoneFile;
 };
 
@@ -113,6 +114,7 @@ void AddCorpus(CCommand& program) {
                     "Read files of folders and archives whatever their endings");
     command.AddFlag("--lenient", options->mIsLenient,
                     "Go on with no chord where a symbol is not understood");
+    command.AddFlag("--json", options->mIsJson, "As without: the output is JSON in any case");
     command.OnCall([options] { return Corpus(*options); });
 }
 

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "cli/CommandLine.h"
 #include "cli/KeyText.h"
+#include "cli/Message.h"
 #include "cli/TypedChords.h"
 #include "cli/TypedSongs.h"
 
@@ -10,6 +11,7 @@
 #include "brindle/present/NumeralsJson.h"
 #include "brindle/present/NumeralsText.h"
 #include "brindle/present/RomanTextTable.h"
+#include "brindle/song/ReadSong.h"
 
 #include <memory>
 #include <optional>
@@ -53,12 +55,24 @@ bool AcceptsFaults(const CTypedSong& text, const std::vector<CTextFault>& faults
     return options.mIsLenient;
 }
 
+// Whether a file is a song in a form that has more than chords, bar lines and holds.
+bool IsWholeSong(const CTypedSong& typed) {
+    const TSongFormat format = SongFormatOf(typed.mText);
+    return !typed.mName.empty() && format != TSongFormat_ChordText &&
+           format != TSongFormat_ChordStrings && format != TSongFormat_RomanText;
+}
+
 TSongOutput WordsShown(const CTypedSong& typed, const CSignKeyLite& key,
                        const CNumeralsOptions& options) {
     const std::string& text = typed.mText;
     const bool areNumerals = AreNumerals(text, key, options);
     const CNumeralsReading reading =
         areNumerals ? ReadNumerals(text, key, options.mNumerals) : ReadChordWords(text);
+    if (!reading.mFaults.empty() && !options.mIsLenient && IsWholeSong(typed)) {
+        return Fail(TStatus::BadInput,
+                    Message("{name} is a whole song; {call} tells its numerals",
+                            {{"name", Printable(typed.mName)}, {"call", "brindle analyse"}}));
+    }
     if (!AcceptsFaults(typed, reading.mFaults, options)) return TStatus::BadInput;
     if (options.mFormat.Format() == TFormat::Json) {
         return NumeralsJson(reading, text, key, areNumerals, options.mNumerals);
