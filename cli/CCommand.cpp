@@ -230,6 +230,23 @@ std::string NoNumber(const std::string& message) {
                     {"word", message.substr(equals + 3)}});
 }
 
+// The message of CLI11 for words that nothing takes.
+std::string UnexpectedWords(const std::string& message) {
+    const std::size_t colon = message.find(": ");
+    if (colon == message.npos) return message;
+    return Message("{words} is not expected here", {{"words", message.substr(colon + 2)}});
+}
+
+// The message of CLI11 for options that exclude each other.
+std::string ExcludedOption(const std::string& message) {
+    constexpr std::string_view verb = " excludes ";
+    const std::size_t place = message.find(verb);
+    if (place == message.npos) return message;
+    return Message(
+        "{option} and {other} exclude each other",
+        {{"option", message.substr(0, place)}, {"other", message.substr(place + verb.size())}});
+}
+
 // CLI11 asks for help and version by exceptions, too; these end well.
 TStatus Report(const CLI::App& program, const CLI::ParseError& error, const TTypedWords& words) {
     if (error.get_exit_code() == static_cast<int>(CLI::ExitCodes::Success)) {
@@ -243,20 +260,21 @@ TStatus Report(const CLI::App& program, const CLI::ParseError& error, const TTyp
         if (!typed.empty()) return FailForCommand(app, typed);
         return FailForUnknown(app, words, Message("A subcommand is required"));
     }
-    const auto isOfKind = [&](CLI::ExitCodes code) {
-        return error.get_exit_code() == static_cast<int>(code);
-    };
-    if (isOfKind(CLI::ExitCodes::ExtrasError)) return FailForUnknown(app, words, error.what());
-    if (isOfKind(CLI::ExitCodes::ConversionError)) {
-        return FailWithHelp(app, NoNumber(error.what()));
+    const std::string what = error.what();
+    switch (static_cast<CLI::ExitCodes>(error.get_exit_code())) {
+        case CLI::ExitCodes::ExtrasError:
+            return FailForUnknown(app, words, UnexpectedWords(what));
+        case CLI::ExitCodes::ConversionError:
+            return FailWithHelp(app, NoNumber(what));
+        case CLI::ExitCodes::RequiredError:
+            return FailWithHelp(app, MissingWord(what));
+        case CLI::ExitCodes::ExcludesError:
+            return FailWithHelp(app, ExcludedOption(what));
+        case CLI::ExitCodes::ArgumentMismatch:
+            return FailWithHelp(app, MissingValue(app, what));
+        default:
+            return FailWithHelp(app, what);
     }
-    if (isOfKind(CLI::ExitCodes::RequiredError)) {
-        return FailWithHelp(app, MissingWord(error.what()));
-    }
-    if (isOfKind(CLI::ExitCodes::ArgumentMismatch)) {
-        return FailWithHelp(app, MissingValue(app, error.what()));
-    }
-    return FailWithHelp(app, error.what());
 }
 
 // One of some words, or the nearest of them in the message.

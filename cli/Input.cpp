@@ -93,10 +93,14 @@ bool IsPathWithoutEnding(const std::string& word) {
            ReadChordText(first).mFaultPos == 1 && !BeginsWithNumeral(first, kCMajor);
 }
 
+bool IsWebLink(const std::string& word) {
+    return word.starts_with("http://") || word.starts_with("https://");
+}
+
 // Of a command that takes no songs: a file there may have the name of a chord.
 bool IsNoChordButAFile(const std::string& word) {
     const bool isFile = LooksLikeFileName(word) || IsRegularFile(word) || IsFolder(word) ||
-                        IsPathWithoutEnding(word);
+                        IsPathWithoutEnding(word) || IsWebLink(word);
     return isFile && !ReadChordText(word).mFault.empty();
 }
 
@@ -138,6 +142,12 @@ std::optional<std::string> ReadInput(const std::string& path, std::size_t mostBy
         const std::string name = Printable(path);
         Fail(TStatus::BadInput, Message("{name} is a folder; {call} reads the songs in it",
                                         {{"name", name}, {"call", "brindle corpus " + name}}));
+        return std::nullopt;
+    }
+    if (IsWebLink(path)) {
+        Fail(TStatus::BadInput,
+             Message("{name} is on the web, where nothing is read; a saved page is",
+                     {{"name", Printable(path)}}));
         return std::nullopt;
     }
     const std::unique_ptr<std::FILE, CCloser> file(std::fopen(path.c_str(), "rb"));

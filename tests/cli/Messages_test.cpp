@@ -125,6 +125,9 @@ TEST_CASE("Faults and ranges are told in the language of the user") {
          "--beats-per-bar und --beats-per-chord nehmen 1/1024 bis 1024 Schläge"},
         {"grid C --capo 99", "--capo: 99 liegt nicht zwischen 0 und 24; siehe brindle grid --help"},
         {"grid C --capo 1.5", "--capo: 1.5 ist keine ganze Zahl; siehe brindle grid --help"},
+        {"types maj7", "maj7 steht hier zu viel; siehe brindle types --help"},
+        {"key C --json --format text",
+         "--format und --json schließen sich aus; siehe brindle key --help"},
         {"markov generate --form AQ7 --bars 8",
          "eine Form sind Buchstaben von A bis Z, die sich 8 Takte gleichmäßig teilen"},
     };
