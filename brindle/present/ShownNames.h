@@ -25,8 +25,9 @@ namespace brindle {
 /// "F#", "Bb"; "Undef" for no key.
 [[nodiscard]] std::string KeyName(const CKeyEnh& keyEnh);
 
-/// A key or a center as texts and pictures name it: "F# minor", "D dorian"; "Undef" for none.
+/// A key as texts and pictures name it: "F# minor"; "Undef" for none.
 [[nodiscard]] std::string KeyInWords(const CSignKeyLite& key);
+/// The same of a center: "D dorian"; a mask that is no mode has its root alone.
 [[nodiscard]] std::string KeyInWords(const CHarmCenterLite& center);
 
 /// The scale degree that lies `distance` semitones above a tonic, in Roman numerals: "V" for 7,
