@@ -25,6 +25,7 @@ class CMySet
 
 public:
     CMySet() = default;
+    /// Of members as they are written down.
     CMySet(std::initializer_list<T> members) : CMySet(members.begin(), members.end()) {}
     /// Of members in any order; what occurs twice is in it once.
     template <std::input_iterator Iterator>
