@@ -7,6 +7,7 @@
 #include "brindle/chords/ReadChordText.h"
 #include "brindle/platform/Ascii.h"
 #include "brindle/platform/FileNames.h"
+#include "brindle/present/ShownText.h"
 
 #include <fmt/format.h>
 
@@ -299,10 +300,9 @@ std::function<std::string(const std::string&)> Within(double least, double most,
             return Message("{word} is no number", {{"word", typed}});
         }
         if (value < least || value > most) {
-            return Message("{word} is not from {least} to {most}",
-                           {{"word", typed},
-                            {"least", fmt::format("{}", least)},
-                            {"most", fmt::format("{}", most)}});
+            return Message(
+                "{word} is not from {least} to {most}",
+                {{"word", typed}, {"least", ShortNumber(least)}, {"most", ShortNumber(most)}});
         }
         if (isWhole && value != std::floor(value)) {
             return Message("{word} is no whole number", {{"word", typed}});
