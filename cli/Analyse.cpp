@@ -1,13 +1,11 @@
 // SPDX-License-Identifier: MIT
-#include "cli/ChordTextOptions.h"
 #include "cli/CommandLine.h"
 #include "cli/KeyText.h"
-#include "cli/LeadSheet.h"
 #include "cli/SheetPicture.h"
 #include "cli/TypedChords.h"
+#include "cli/TypedSong.h"
 #include "cli/TypedSongs.h"
 
-#include "brindle/analysis/TChordStringParse.h"
 #include "brindle/present/AnalysisJson.h"
 #include "brindle/present/AnalysisSvg.h"
 #include "brindle/present/CentersText.h"
@@ -15,7 +13,6 @@
 #include "brindle/present/MakeSongKeys.h"
 #include "brindle/present/ReadingText.h"
 #include "brindle/present/ShowSong.h"
-#include "brindle/present/ShownNames.h"
 #include "brindle/present/SongGrids.h"
 #include "brindle/song/AnalyseSong.h"
 #include "brindle/song/ReadSongHarmony.h"
@@ -56,8 +53,6 @@ struct CAnalyseOptions {
     std::string mRoute = "tonic";
     std::string mKey;
     std::string mTiming = "played";
-    double mBeatsPerBar = 4.0;
-    double mBeatsPerChord = 1.0;
     CTypedChords mReading;
     bool mReadings = false;
     bool mCenters = false;
@@ -85,7 +80,7 @@ bool IsSheetWanted(const CAnalyseOptions& options) {
 // What is wrong with options that are fine one by one.
 std::optional<std::string> Contradiction(const CAnalyseOptions& options) {
     if (auto songs = options.mSongs.Contradiction(options.mFormat.Format())) return songs;
-    if (auto beats = BeatsContradiction(options.mBeatsPerBar, options.mBeatsPerChord)) return beats;
+    if (auto beats = options.mReading.BeatsContradiction()) return beats;
     const bool isText = options.mFormat.Format() == TFormat::Text;
     if ((options.mLong || options.mCenters) && !isText) {
         return "--long and --centers are for text, --format text";
@@ -194,14 +189,10 @@ std::string Present(const CAnalysedSong& analysed, const CAnalyseOptions& option
 
 std::optional<CSong> ReadText(const CTypedSong& typed, const CSignKeyLite& key,
                               const CAnalyseOptions& options) {
-    TChordStringParse parse;
-    parse.mBeatsPerBar = options.mBeatsPerBar;
-    parse.mBeatsPerChord = options.mBeatsPerChord;
-    parse.mChordNamePrefs = NamePrefs();
     CTypedChords reading = options.mReading;
     if (options.mFormat.Format() == TFormat::Native) reading.UseNative();
     reading.UseKey(key);
-    return reading.ReadSongOrFail(typed, parse);
+    return reading.ReadSongOrFail(typed);
 }
 
 /// JSON and the native form show chords without a place in time, too.
@@ -217,7 +208,7 @@ std::optional<CAnalysedSong> ReadScoreInTiming(const CTypedSong& typed,
     if (options.mTiming == "native") {
         analysed.mSheet = ReadHarmonies(typed, TLeadSheetTiming::Native);
         if (!analysed.mSheet) return std::nullopt;
-        analysed.mSong = options.mReading.ReadSource(typed.mText, {});
+        analysed.mSong = options.mReading.ReadSource(typed.mText);
     } else {
         auto song = ReadScore(typed);
         if (!song) return std::nullopt;
@@ -271,14 +262,10 @@ TStatus Analyse(const CAnalyseOptions& options) {
     if (const auto contradiction = Contradiction(options)) {
         return Fail(TStatus::BadUsage, *contradiction);
     }
-    CSignKeyLite key;
-    if (!options.mKey.empty()) {
-        const auto typed = ReadKeyOption(options.mKey);
-        if (!typed) return TStatus::BadUsage;
-        key = *typed;
-    }
+    const auto key = ReadKeyIfTold(options.mKey);
+    if (!key) return TStatus::BadUsage;
     return options.mSongs.Print(options.mFormat.Format(), [&](const CTypedSong& song) {
-        return AnalysisOf(song, key, options);
+        return AnalysisOf(song, *key, options);
     });
 }
 
@@ -292,7 +279,7 @@ void AddAnalyse(CCommand& program) {
     command.AddChoice("--route", options->mRoute, {"tonic", "cadence", "weights", "none"},
                       "How centers are searched");
     command.AddOption("--key", "KEY", options->mKey, "The stated key, as in \"A minor\" or Bb");
-    AddBeats(command, options->mBeatsPerBar, options->mBeatsPerChord);
+    options->mReading.AddBeatsTo(command);
     command.AddChoice("--timing", options->mTiming, {"played", "native"},
                       "How the chords of a score follow each other");
     command.AddFlag("--long", options->mLong,

@@ -37,14 +37,13 @@ std::string FaultText(const CSongFault& fault) {
 
 }  // namespace
 
-CChordSource ReadChordSource(const std::string& path, const TChordStringParse& parse,
-                             const CTypedChords& reading) {
+CChordSource ReadChordSource(const std::string& path, const CTypedChords& reading) {
     std::error_code error;
     const bool isInput = path == "-";
     if (!isInput && !fs::exists(path, error)) return Failed("no such file");
     const auto bytes = isInput ? ReadInput(path) : ReadWholeFile(path, kMaxFileBytes);
     if (!bytes) return Failed("it cannot be read, or is larger than 64 MiB");
-    const CSong song = reading.ReadSource(*bytes, parse);
+    const CSong song = reading.ReadSource(*bytes);
     const auto fault = std::find_if(song.mFaults.begin(), song.mFaults.end(),
                                     [](const CSongFault& f) { return !f.mIsNote; });
     const bool isGivenUp = fault != song.mFaults.end() && !reading.IsLenient();

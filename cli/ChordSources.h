@@ -3,7 +3,6 @@
 
 #include "cli/TypedChords.h"
 
-#include "brindle/analysis/TChordStringParse.h"
 #include "brindle/markov/MarkovChords.h"
 
 #include <string>
@@ -21,7 +20,6 @@ struct CChordSource {
 
 /// Reads a lead sheet in MusicXML, chord strings such as (4,C);(2,G7), one a line, or a chord text.
 /// The content tells which of them it is. "-" is standard input.
-[[nodiscard]] CChordSource ReadChordSource(const std::string& path, const TChordStringParse& parse,
-                                           const CTypedChords& reading);
+[[nodiscard]] CChordSource ReadChordSource(const std::string& path, const CTypedChords& reading);
 
 }  // namespace brindle::cli

@@ -1,15 +1,12 @@
 // SPDX-License-Identifier: MIT
-#include "cli/ChordTextOptions.h"
 #include "cli/CommandLine.h"
 #include "cli/TypedChords.h"
 #include "cli/TypedSongs.h"
 
-#include "brindle/analysis/TChordStringParse.h"
 #include "brindle/present/AnalysisSvg.h"
 #include "brindle/present/CChordSymbols.h"
 #include "brindle/present/CopiesText.h"
 #include "brindle/present/MakeSongCopies.h"
-#include "brindle/present/ShownNames.h"
 
 #include <memory>
 
@@ -32,18 +29,12 @@ constexpr CCommandHelp kCopiesHelp{
 
 struct CCopiesOptions {
     CTypedSongs mSongs;
-    double mBeatsPerBar = 4.0;
-    double mBeatsPerChord = 1.0;
     CTypedChords mReading;
     CFormatOptions mFormat;
 };
 
 TSongOutput CopiesOf(const CTypedSong& typed, const CCopiesOptions& options) {
-    TChordStringParse parse;
-    parse.mBeatsPerBar = options.mBeatsPerBar;
-    parse.mBeatsPerChord = options.mBeatsPerChord;
-    parse.mChordNamePrefs = NamePrefs();
-    const auto song = options.mReading.ReadSongOrFail(typed, parse);
+    const auto song = options.mReading.ReadSongOrFail(typed);
     if (!song) return TStatus::BadInput;
     const TFormat format = options.mFormat.Format();
     if (format == TFormat::Text) return RepeatsText(*song, PaintOfOutput());
@@ -59,9 +50,7 @@ TSongOutput CopiesOf(const CTypedSong& typed, const CCopiesOptions& options) {
 
 TStatus Copies(const CCopiesOptions& options) {
     auto contradiction = options.mSongs.Contradiction(options.mFormat.Format());
-    if (!contradiction) {
-        contradiction = BeatsContradiction(options.mBeatsPerBar, options.mBeatsPerChord);
-    }
+    if (!contradiction) contradiction = options.mReading.BeatsContradiction();
     if (contradiction) return Fail(TStatus::BadUsage, *contradiction);
     return options.mSongs.Print(options.mFormat.Format(),
                                 [&](const CTypedSong& song) { return CopiesOf(song, options); });
@@ -73,7 +62,7 @@ void AddCopies(CCommand& program) {
     CCommand& command = program.AddCommand(kCopiesHelp);
     const auto options = std::make_shared<CCopiesOptions>();
     options->mSongs.AddTo(command);
-    AddBeats(command, options->mBeatsPerBar, options->mBeatsPerChord);
+    options->mReading.AddBeatsTo(command);
     options->mReading.AddTo(command, "In what form the chord text is written");
     options->mFormat.AddTo(command, {"text", "json", "svg"});
     command.OnCall([options] { return Copies(*options); });

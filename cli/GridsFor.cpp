@@ -1,13 +1,11 @@
 // SPDX-License-Identifier: MIT
 #include "cli/GridsFor.h"
 
-#include "cli/ChordTextOptions.h"
 #include "cli/CommandLine.h"
 #include "cli/GridOptions.h"
 #include "cli/TypedChords.h"
 #include "cli/TypedSongs.h"
 
-#include "brindle/analysis/TChordStringParse.h"
 #include "brindle/present/SongGrids.h"
 
 #include <memory>
@@ -30,8 +28,6 @@ constexpr int kLastCapo = 12;
 
 struct CGridsForOptions {
     CTypedSongs mSongs;
-    double mBeatsPerBar = 4.0;
-    double mBeatsPerChord = 1.0;
     CTypedChords mReading;
     std::string mTuning = "EADGBE";
     int mCapo = kEasiestCapo;
@@ -52,10 +48,7 @@ CShownSongGrids ChosenGrids(const CSong& song, const GChShortTuning& tuning,
 
 TSongOutput GridsOf(const CTypedSong& typed, const GChShortTuning& tuning,
                     const CGridsForOptions& options) {
-    TChordStringParse parse;
-    parse.mBeatsPerBar = options.mBeatsPerBar;
-    parse.mBeatsPerChord = options.mBeatsPerChord;
-    const auto song = options.mReading.ReadSongOrFail(typed, parse);
+    const auto song = options.mReading.ReadSongOrFail(typed);
     if (!song) return TStatus::BadInput;
     const CShownSongGrids shown = ChosenGrids(*song, tuning, options);
     const CGridStyle style = options.mFingering.Style();
@@ -71,9 +64,7 @@ TSongOutput GridsOf(const CTypedSong& typed, const GChShortTuning& tuning,
 
 TStatus GridsFor(const CGridsForOptions& options) {
     auto contradiction = options.mSongs.Contradiction(options.mFormat.Format());
-    if (!contradiction) {
-        contradiction = BeatsContradiction(options.mBeatsPerBar, options.mBeatsPerChord);
-    }
+    if (!contradiction) contradiction = options.mReading.BeatsContradiction();
     if (contradiction) return Fail(TStatus::BadUsage, *contradiction);
     const auto tuning = ReadTuningOption(options.mTuning);
     if (!tuning) return TStatus::BadUsage;
@@ -91,7 +82,7 @@ void AddGridsFor(CCommand& grids) {
     CCommand& command = grids.AddCommand(kGridsForHelp);
     const auto options = std::make_shared<CGridsForOptions>();
     options->mSongs.AddTo(command);
-    AddBeats(command, options->mBeatsPerBar, options->mBeatsPerChord);
+    options->mReading.AddBeatsTo(command);
     options->mReading.AddTo(command, "In what form the song is written");
     command.AddOption("--tuning", "TUNING", options->mTuning,
                       "Name or open strings (default: EADGBE)");

@@ -2,7 +2,7 @@
 #include "cli/CommandLine.h"
 #include "cli/HarmoniesFromNotes.h"
 #include "cli/KeyText.h"
-#include "cli/LeadSheet.h"
+#include "cli/TypedSong.h"
 #include "cli/TypedSongs.h"
 
 #include "brindle/present/HarmoniesText.h"
@@ -89,11 +89,9 @@ TStatus Harmonies(const CHarmoniesOptions& options) {
     }
     CChordsFromNotesOptions how;
     how.mEvery = EveryOf(options.mEvery);
-    if (!options.mKey.empty()) {
-        const auto key = ReadKeyOption(options.mKey);
-        if (!key) return TStatus::BadUsage;
-        how.mKey = *key;
-    }
+    const auto key = ReadKeyIfTold(options.mKey);
+    if (!key) return TStatus::BadUsage;
+    how.mKey = *key;
     const TFormat format = options.mFormat.Format();
     return options.mScores.Print(format, [&](const CTypedSong& score) {
         return options.mIsFromNotes ? ShowChordsFromNotes(score, how, format == TFormat::Json)

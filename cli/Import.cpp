@@ -2,8 +2,8 @@
 #include "cli/CommandLine.h"
 #include "cli/Input.h"
 #include "cli/Json.h"
-#include "cli/LeadSheet.h"
 #include "cli/Progress.h"
+#include "cli/TypedSong.h"
 #include "cli/TypedSongs.h"
 
 #include "brindle/musicxml/ImportScore.h"

@@ -14,4 +14,8 @@ std::optional<CSignKeyLite> ReadKeyOption(std::string_view typed) {
     return std::nullopt;
 }
 
+std::optional<CSignKeyLite> ReadKeyIfTold(std::string_view typed) {
+    return typed.empty() ? CSignKeyLite() : ReadKeyOption(typed);
+}
+
 }  // namespace brindle::cli

@@ -1,19 +1,16 @@
 // SPDX-License-Identifier: MIT
-#include "cli/ChordTextOptions.h"
 #include "cli/CommandLine.h"
 #include "cli/KeyText.h"
 #include "cli/Message.h"
 #include "cli/TypedChords.h"
 #include "cli/TypedSongs.h"
 
-#include "brindle/analysis/TChordStringParse.h"
 #include "brindle/present/CChordSymbols.h"
 #include "brindle/present/KeysJson.h"
 #include "brindle/present/KeysSvg.h"
 #include "brindle/present/MakeSongKeys.h"
 #include "brindle/present/ReadingText.h"
 #include "brindle/present/ShowSong.h"
-#include "brindle/present/ShownNames.h"
 #include "brindle/song/AnalyseSong.h"
 #include "brindle/song/ReadSongHarmony.h"
 
@@ -42,7 +39,6 @@ constexpr double kMostPoints = 1000.0;
 struct CKeysOptions {
     CTypedSongs mSongs;
     std::string mKey;
-    double mBeatsPerChord = 1.0;
     CKeyOptions mKeys;
     CNumeralOptions mNumerals;
     CTypedChords mReading;
@@ -52,9 +48,7 @@ struct CKeysOptions {
 // What is wrong with options that are fine one by one.
 std::optional<std::string> Contradiction(const CKeysOptions& options) {
     if (auto songs = options.mSongs.Contradiction(options.mFormat.Format())) return songs;
-    if (auto beats = BeatsContradiction(options.mKeys.mBeatsPerBar, options.mBeatsPerChord)) {
-        return beats;
-    }
+    if (auto beats = options.mReading.BeatsContradiction()) return beats;
     for (const double points : {options.mKeys.mHomeBonus, options.mKeys.mChangeCost}) {
         if (points >= 0.0 && points <= kMostPoints) continue;
         return Message("--home-bonus and --change-cost take 0 to 1000 points");
@@ -65,13 +59,9 @@ std::optional<std::string> Contradiction(const CKeysOptions& options) {
 // Nothing when it cannot be read; then the error has been printed.
 std::optional<CSong> SongOf(const CTypedSong& typed, const CSignKeyLite& key,
                             const CKeysOptions& options) {
-    TChordStringParse parse;
-    parse.mBeatsPerBar = options.mKeys.mBeatsPerBar;
-    parse.mBeatsPerChord = options.mBeatsPerChord;
-    parse.mChordNamePrefs = NamePrefs();
     CTypedChords reading = options.mReading;
     reading.UseKey(key);
-    return reading.ReadSongOrFail(typed, parse);
+    return reading.ReadSongOrFail(typed);
 }
 
 std::string AsJson(const CSong& song, const CSongReading& reading, const CKeysOptions& options) {
@@ -105,11 +95,10 @@ TStatus Keys(const CKeysOptions& options) {
     }
     CReadingOptions readingOptions;
     readingOptions.mKeys = options.mKeys;
-    if (!options.mKey.empty()) {
-        const auto key = ReadKeyOption(options.mKey);
-        if (!key) return TStatus::BadUsage;
-        readingOptions.mStatedKey = *key;
-    }
+    readingOptions.mKeys.mBeatsPerBar = options.mReading.BeatsPerBar();
+    const auto key = ReadKeyIfTold(options.mKey);
+    if (!key) return TStatus::BadUsage;
+    readingOptions.mStatedKey = *key;
     return options.mSongs.Print(options.mFormat.Format(), [&](const CTypedSong& song) {
         return KeysOf(song, readingOptions, options);
     });
@@ -122,7 +111,7 @@ void AddKeys(CCommand& program) {
     const auto options = std::make_shared<CKeysOptions>();
     options->mSongs.AddTo(command);
     command.AddOption("--key", "KEY", options->mKey, "The stated key, as in \"A minor\" or Bb");
-    AddBeats(command, options->mKeys.mBeatsPerBar, options->mBeatsPerChord);
+    options->mReading.AddBeatsTo(command);
     command.AddOption("--home-bonus", "POINTS", options->mKeys.mHomeBonus,
                       "What a chord gains in the key of the song (default: 0.4)");
     command.AddOption("--change-cost", "POINTS", options->mKeys.mChangeCost,

@@ -8,7 +8,6 @@
 #include "cli/Progress.h"
 
 #include "brindle/present/LearnedText.h"
-#include "brindle/present/ShownNames.h"
 #include "brindle/song/FindSongFiles.h"
 #include "brindle/song/LearnSong.h"
 
@@ -58,15 +57,14 @@ void SimplifyChords(CHarmAnlsChordsWithLength& chords) {
 }
 
 CLearned LearnFiles(VariableLengthMarkovModel& model, const CLearnOptions& options) {
-    TChordStringParse parse;
-    parse.mBeatsPerBar = options.mBeatsPerBar;
-    parse.mChordNamePrefs = NamePrefs();
+    CTypedChords reading = options.mReading;
+    reading.UseBeatsPerBar(options.mBeatsPerBar);
     const std::vector<CFoundFile> files = FindSongFiles(options.mFiles);
     CLearned learned;
     CProgress progress(files.size());
     for (const CFoundFile& file : files) {
         progress.Step(file.mPath);
-        const CChordSource source = ReadChordSource(file.mPath, parse, options.mReading);
+        const CChordSource source = ReadChordSource(file.mPath, reading);
         if (!source.mError.empty()) {
             learned.mReport.mUnread.emplace_back(file.mPath, source.mError);
             learned.mIsNamedFileUnread = learned.mIsNamedFileUnread || file.mIsNamed;

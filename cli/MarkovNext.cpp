@@ -47,12 +47,10 @@ std::optional<std::vector<CChordLite>> TypedRow(const CNextOptions& options) {
 TStatus MarkovNext(const CNextOptions& options) {
     const auto chords = TypedRow(options);
     if (!chords) return TStatus::BadInput;
+    const auto key = ReadKeyIfTold(options.mKey);
+    if (!key) return TStatus::BadUsage;
     CNextChordOptions asked;
-    if (!options.mKey.empty()) {
-        const auto key = ReadKeyOption(options.mKey);
-        if (!key) return TStatus::BadUsage;
-        asked.mKey = *key;
-    }
+    asked.mKey = *key;
     asked.mCount = options.mCount;
     asked.mOrder = options.mOrder;
     const auto model = ReadSongModelFile(options.mModel, options.mStyle);

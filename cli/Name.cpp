@@ -103,11 +103,9 @@ bool HasContext(const CNameOptions& options) {
 
 /// Reads what was told about the notes besides themselves. False after an error.
 bool ReadContext(CNameOptions& options) {
-    if (!options.mKey.empty()) {
-        const auto key = ReadKeyOption(options.mKey);
-        if (!key) return false;
-        options.mContext.mKey = *key;
-    }
+    const auto key = ReadKeyIfTold(options.mKey);
+    if (!key) return false;
+    options.mContext.mKey = *key;
     const auto before = ReadNeighbour("--before", options.mBefore, options);
     const auto after = ReadNeighbour("--after", options.mAfter, options);
     if (!before || !after) return false;

@@ -111,15 +111,11 @@ TStatus Numerals(const CNumeralsOptions& options) {
     if (const auto contradiction = Contradiction(options)) {
         return Fail(TStatus::BadUsage, *contradiction);
     }
-    CSignKeyLite key;
-    if (!options.mKey.empty()) {
-        const auto typed = ReadKeyOption(options.mKey);
-        if (!typed) return TStatus::BadUsage;
-        key = *typed;
-    }
+    const auto key = ReadKeyIfTold(options.mKey);
+    if (!key) return TStatus::BadUsage;
     return options.mTexts.Print(options.mFormat.Format(), [&](const CTypedSong& text) {
-        return options.mFrom == "romantext" ? AnalysisShown(text, key, options)
-                                            : WordsShown(text, key, options);
+        return options.mFrom == "romantext" ? AnalysisShown(text, *key, options)
+                                            : WordsShown(text, *key, options);
     });
 }
 

@@ -4,13 +4,14 @@
 #include "cli/CommandLine.h"
 #include "cli/FaultMessage.h"
 #include "cli/Input.h"
-#include "cli/LeadSheet.h"
 #include "cli/Message.h"
 #include "cli/Output.h"
+#include "cli/TypedSong.h"
 
 #include "brindle/analysis/TChordStringParse.h"
 #include "brindle/present/ShownNames.h"
 #include "brindle/song/ParseSong.h"
+#include "brindle/song/SongBeats.h"
 
 #include <algorithm>
 #include <array>
@@ -99,6 +100,18 @@ void CTypedChords::AddTo(CCommand& command, const std::string& fromPurpose) {
     command.AddFlag("--even", mIsEven, "The chords of a bar without holds share it evenly");
 }
 
+void CTypedChords::AddBeatsTo(CCommand& command) {
+    command.AddOption("--beats-per-bar", "BEATS", mBeatsPerBar,
+                      "Length of a bar in beats (default: 4)");
+    command.AddOption("--beats-per-chord", "BEATS", mBeatsPerChord,
+                      "Length of a chord in beats (default: 1)");
+}
+
+std::optional<std::string> CTypedChords::BeatsContradiction() const {
+    if (AreSongBeats(mBeatsPerBar) && AreSongBeats(mBeatsPerChord)) return std::nullopt;
+    return Message("--beats-per-bar and --beats-per-chord take 1/1024 to 1024 beats");
+}
+
 std::optional<std::vector<CChordLite>> CTypedChords::ReadSymbols(
     const std::vector<std::string>& symbols) const {
     std::vector<CChordLite> chords;
@@ -140,29 +153,35 @@ std::optional<CChordLite> CTypedChords::ReadSymbol(const std::string& symbol) co
     return chords->front();
 }
 
-CSong CTypedChords::ReadSource(std::string_view bytes, const TChordStringParse& parse) const {
-    if (IsNative() && !HasScoreBytes(bytes)) return ParseSong(bytes, parse);
+CSong CTypedChords::ReadNative(std::string_view text) const {
+    TChordStringParse parse;
+    parse.mBeatsPerBar = mBeatsPerBar;
+    parse.mBeatsPerChord = mBeatsPerChord;
+    parse.mChordNamePrefs = NamePrefs();
+    return ParseSong(text, parse);
+}
+
+CSong CTypedChords::ReadSource(std::string_view bytes) const {
+    if (IsNative() && !HasScoreBytes(bytes)) return ReadNative(bytes);
     CSongOptions prefs;
     prefs.mFormat = HasScoreBytes(bytes) ? TSongFormat_Auto : FormatOf(mForm, bytes);
-    prefs.mBeatsPerBar = parse.mBeatsPerBar;
-    prefs.mBeatsPerChord = parse.mBeatsPerChord;
+    prefs.mBeatsPerBar = mBeatsPerBar;
+    prefs.mBeatsPerChord = mBeatsPerChord;
     prefs.mEven = mIsEven;
     prefs.mLenient = mIsLenient;
     prefs.mKey = mKey;
     return brindle::ReadSong(bytes, prefs);
 }
 
-std::optional<CSong> CTypedChords::ReadText(const CTypedSong& typed,
-                                            const TChordStringParse& parse) const {
-    CSong song = ReadSource(typed.mText, parse);
+std::optional<CSong> CTypedChords::ReadText(const CTypedSong& typed) const {
+    CSong song = ReadSource(typed.mText);
     PrintFaults(typed.mText, song.mFaults, mIsLenient, typed.mName);
     if (song.HasFault() && !mIsLenient) return std::nullopt;
     return song;
 }
 
-std::optional<CSong> CTypedChords::ReadSongOrFail(const CTypedSong& typed,
-                                                  const TChordStringParse& parse) const {
-    auto song = typed.mIsScore ? ReadScore(typed) : ReadText(typed, parse);
+std::optional<CSong> CTypedChords::ReadSongOrFail(const CTypedSong& typed) const {
+    auto song = typed.mIsScore ? ReadScore(typed) : ReadText(typed);
     if (!song || song->mChords.size() > 1) return song;
     FailWithoutChords(typed);
     return std::nullopt;

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 #pragma once
 
-#include "cli/LeadSheet.h"
 #include "cli/Output.h"
+#include "cli/TypedSong.h"
 
 #include <functional>
 #include <optional>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "cli/LeadSheet.h"
+#include "cli/TypedSong.h"
 
 #include "cli/Input.h"
 #include "cli/Message.h"
