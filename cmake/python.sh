@@ -81,6 +81,8 @@ prepare_python() {
         say "left out: Python's part, as $python has no headers or cannot make environments"
         return 77
     }
+    # For the translations of a wheel, which is whole without them.
+    (need_packages gettext) || true
     fetch_packages "$python"
 }
 

@@ -3,11 +3,12 @@
 
 root=$(cd "$(dirname "$(readlink -f "${BASH_SOURCE[0]}")")/.." && pwd)
 
-# Debian's names of what the library and the program are built with; gettext makes the catalogues.
+# Debian's names of what the library and the program are built with.
 program_packages=(g++ cmake ninja-build pkg-config libboost-dev libfmt-dev nlohmann-json3-dev
-                  libcli11-dev libxml2-dev libzip-dev libplist-dev libarchive-dev gettext)
-# The same for the tests and the benches.
-test_packages=(doctest-dev libbenchmark-dev python3-jsonschema)
+                  libcli11-dev libxml2-dev libzip-dev libplist-dev libarchive-dev)
+# The same for the tests and the benches; gettext makes the catalogues, without which the program
+# speaks English.
+test_packages=(doctest-dev libbenchmark-dev python3-jsonschema gettext)
 # The same for the tests under sanitizers and the fuzzers, which share one build by clang.
 sanitizer_packages=(clang libclang-rt-14-dev)
 

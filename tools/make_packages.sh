@@ -7,7 +7,7 @@ set -euo pipefail
 source "$(dirname "$(readlink -f "${BASH_SOURCE[0]}")")/../cmake/setup.sh"
 cd "$root"
 build="$root/build/package"
-need_packages "${program_packages[@]}" lintian dpkg-dev ${1:+debootstrap}
+need_packages "${program_packages[@]}" gettext lintian dpkg-dev ${1:+debootstrap}
 
 say "building (log: build/package.log)"
 cmake --preset release -B "$build" -DCMAKE_INSTALL_PREFIX=/usr \
