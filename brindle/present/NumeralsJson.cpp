@@ -5,7 +5,7 @@
 #include "brindle/analysis/ReadRomanText.h"
 #include "brindle/chords/WriteChordSymbol.h"
 #include "brindle/platform/Ascii.h"
-#include "brindle/platform/Utf8.h"
+#include "brindle/platform/internal/CTextPlaces.h"
 #include "brindle/present/JsonValues.h"
 #include "brindle/present/ShownNames.h"
 #include "brindle/present/ShownText.h"
@@ -46,46 +46,21 @@ Json ChordOfAnalysis(const CRomanTextChord& chord) {
     return json;
 }
 
-/// Walks through a text to places by line and character; in ascending order that is linear.
-class CTextWalk {
-public:
-    explicit CTextWalk(std::string_view text) : mText(text) {}
-
-    /// The word there, empty where none is.
-    [[nodiscard]] std::string_view WordAt(std::size_t line, std::size_t column) {
-        if (line < mLine || (line == mLine && column < mColumn)) *this = CTextWalk(mText);
-        while (mOffset < mText.size() && (mLine < line || (mLine == line && mColumn < column))) {
-            if (mText[mOffset] == '\n' && mLine == line) break;
-            Step();
-        }
-        std::size_t begin = mOffset;
-        while (begin > 0 && !Ascii::IsWhiteSpace(mText[begin - 1])) --begin;
-        const std::string_view rest = mText.substr(begin);
-        return rest.substr(0, rest.find_first_of(Ascii::kWhiteSpace));
-    }
-
-private:
-    void Step() {
-        const bool isBreak = mText[mOffset++] == '\n';
-        while (mOffset < mText.size() && !BeginsUtf8Character(mText[mOffset])) {
-            ++mOffset;
-        }
-        mLine += isBreak ? 1 : 0;
-        mColumn = isBreak ? 1 : mColumn + 1;
-    }
-
-    std::string_view mText;
-    std::size_t mOffset = 0;
-    std::size_t mLine = 1;
-    std::size_t mColumn = 1;
-};
+/// The word around a place, empty where none is.
+std::string_view WordAround(std::size_t offset, std::string_view text) {
+    std::size_t begin = offset;
+    while (begin > 0 && !Ascii::IsWhiteSpace(text[begin - 1])) --begin;
+    const std::string_view rest = text.substr(begin);
+    return rest.substr(0, rest.find_first_of(Ascii::kWhiteSpace));
+}
 
 Json FaultsToJson(std::string_view text, std::span<const CTextFault> faults) {
     constexpr std::size_t longestWord = 60;
-    CTextWalk walk(text);
+    CTextPlaces places(text);
     Json list = Json::array();
     for (const CTextFault& fault : faults) {
-        const std::string word = Printable(walk.WordAt(fault.mLine, fault.mColumn));
+        places.GoToColumn(fault.mLine, fault.mColumn);
+        const std::string word = Printable(WordAround(places.Offset(), text));
         list.push_back({{"Line", fault.mLine},
                         {"Column", fault.mColumn},
                         {"Word", FirstCharacters(word, longestWord)},

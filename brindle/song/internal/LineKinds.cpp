@@ -100,15 +100,20 @@ TLineKind KindOfWords(std::string_view line) {
                                                              : TLineKind::Chords;
 }
 
+/// The bytes of the name in front of other things, `Intro: G C`, `[Intro] G C`; 0 without one.
+std::size_t LengthOfSectionInFront(std::string_view line) {
+    const std::size_t end = line.starts_with('[') ? line.find(']') : line.find(": ");
+    const bool isName =
+        end != line.npos && end + 1 < line.size() && IsSection(line.substr(0, end + 1));
+    return isName ? end + 1 : 0;
+}
+
 TLineKind KindOf(std::string_view line) {
     if (line.empty()) return TLineKind::Blank;
     if (IsTablature(line)) return TLineKind::Tablature;
     if (IsField(line)) return TLineKind::Field;
     if (IsSection(line)) return TLineKind::Section;
-    // `Intro: G C`, `[Intro] G C`
-    const std::size_t name = line.front() == '[' ? line.find(']') : line.find(": ");
-    if (name != line.npos && IsSection(line.substr(0, name + 1))) line.remove_prefix(name + 1);
-    return KindOfWords(line);
+    return KindOfWords(line.substr(LengthOfSectionInFront(line)));
 }
 
 bool CouldBeLyrics(std::string_view line) {
@@ -163,8 +168,7 @@ bool IsLetterOfPart(std::string_view inside, std::string_view behind) {
 }  // namespace
 
 bool BeginsWithSection(std::string_view line) {
-    const std::size_t end = line.starts_with('[') ? line.find(']') : line.npos;
-    return end != line.npos && end + 1 < line.size() && IsSection(line.substr(0, end + 1));
+    return line.starts_with('[') && LengthOfSectionInFront(line) > 0;
 }
 
 bool HasChordInBrackets(std::string_view text) {

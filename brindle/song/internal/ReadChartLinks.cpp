@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "brindle/platform/Utf8.h"
+#include "brindle/platform/internal/CTextPlaces.h"
 #include "brindle/song/internal/ChartLinks.h"
 #include "brindle/song/internal/SongReaders.h"
 #include "brindle/song/internal/StatedKey.h"
@@ -10,31 +10,6 @@
 namespace brindle::SongReaders {
 
 namespace {
-
-/// Lines and columns of ascending places.
-class CPlaces {
-public:
-    explicit CPlaces(std::string_view text) : mText(text) {}
-
-    void GoTo(std::size_t offset) {
-        for (; mOffset < offset; ++mOffset) {
-            if (mText[mOffset] == '\n') {
-                ++mLine;
-                mColumn = 1;
-            } else if (BeginsUtf8Character(mText[mOffset])) {
-                ++mColumn;
-            }
-        }
-    }
-    [[nodiscard]] std::size_t Line() const { return mLine; }
-    [[nodiscard]] std::size_t Column() const { return mColumn; }
-
-private:
-    std::string_view mText;
-    std::size_t mOffset = 0;
-    std::size_t mLine = 1;
-    std::size_t mColumn = 1;
-};
 
 CSong ReadChart(const ChartLinks::CPackedChart& chart, TSongFormat format,
                 const CSongOptions& prefs) {
@@ -76,9 +51,9 @@ std::size_t BytesOf(const ChartLinks::CPackedChart& chart) {
 std::vector<CUnreadSong> SplitChartLinks(std::string_view text, TSongFormat format,
                                          const CSongOptions& prefs) {
     std::vector<CUnreadSong> songs;
-    CPlaces places(text);
+    CTextPlaces places(text);
     for (ChartLinks::CPackedChart& chart : ChartLinks::FindCharts(text)) {
-        places.GoTo(chart.mOffset);
+        places.GoToByte(chart.mOffset);
         const std::size_t bytes = BytesOf(chart);
         const auto read = [chart = std::move(chart), line = places.Line(), column = places.Column(),
                            format, prefs] {

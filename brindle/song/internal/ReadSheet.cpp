@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "brindle/platform/Utf8.h"
+#include "brindle/platform/internal/CTextPlaces.h"
 #include "brindle/song/internal/SongReaders.h"
 #include "brindle/song/internal/SongTokens.h"
 
@@ -12,32 +12,6 @@ namespace brindle::SongReaders {
 using namespace SongText;
 
 namespace {
-
-/// Turns bytes into lines and columns, counted on from one place to the next.
-class CLineCount {
-public:
-    explicit CLineCount(std::string_view text) : mText(text) {}
-
-    /// Offsets must ascend.
-    CSongFault Place(const CTokenFault& fault) {
-        for (; mOffset < fault.mOffset && mOffset < mText.size(); ++mOffset) {
-            const char c = mText[mOffset];
-            if (c == '\n') {
-                ++mLine;
-                mColumn = 1;
-            } else if (BeginsUtf8Character(c)) {
-                ++mColumn;
-            }
-        }
-        return {mLine, mColumn, fault.mText, fault.mIsNote};
-    }
-
-private:
-    std::string_view mText;
-    std::size_t mOffset = 0;
-    std::size_t mLine = 1;
-    std::size_t mColumn = 1;
-};
 
 bool IsLength(double beats) {
     return std::isfinite(beats) && beats > 0.0;
@@ -59,15 +33,32 @@ void Cut(TSongFormat format, CTokenList& list) {
     }
 }
 
+/// The names of C and F in Romance languages are chords, too.
+void TellNamesOfNotes(CTokenList& list) {
+    const CToken* first = nullptr;
+    bool hasDo = false;
+    bool hasFa = false;
+    for (const CToken& token : list.mTokens) {
+        if (token.mKind != TTokenKind::Chord || token.mText == "N.C.") continue;
+        hasDo |= token.mText == "Do";
+        hasFa |= token.mText == "Fa";
+        if (token.mText != "Do" && token.mText != "Fa") return;
+        if (first == nullptr) first = &token;
+    }
+    if (!hasDo || !hasFa) return;
+    list.AddNote(first->mText, "Do and Fa are D diminished and F augmented, not C and F");
+}
+
 /// By their places; without a lenient reading the first one that is no note is the last.
 void TakeFaults(const CTokenList& list, CSong& song) {
     std::vector<CTokenFault> faults = list.Faults();
     std::stable_sort(faults.begin(), faults.end(), [](const CTokenFault& a, const CTokenFault& b) {
         return a.mOffset < b.mOffset;
     });
-    CLineCount lines(list.Text());
+    CTextPlaces places(list.Text());
     for (const CTokenFault& fault : faults) {
-        song.mFaults.push_back(lines.Place(fault));
+        places.GoToByte(fault.mOffset);
+        song.mFaults.push_back({places.Line(), places.Column(), fault.mText, fault.mIsNote});
         if (!fault.mIsNote && !list.Prefs().mLenient) break;
     }
     GiveUpWhatIsAtFault(song, list.Prefs().mLenient);
@@ -106,6 +97,7 @@ CSong ReadSheet(std::string_view text, TSongFormat format, const CSongOptions& p
         std::find_if(list.mTokens.begin(), list.mTokens.end(),
                      [](const CToken& token) { return token.mKind == TTokenKind::Time; });
     if (time != list.mTokens.end()) song.mBeatsPerBar = time->mTime.mNumerator;
+    if (format != TSongFormat_Chart) TellNamesOfNotes(list);
     if (!list.IsGivenUp()) PlaySheet(list);
     TakeFaults(list, song);
     return song;
