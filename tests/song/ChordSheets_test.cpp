@@ -60,6 +60,8 @@ TEST_CASE("A song is put in time by its bar lines, holds and repeats") {
         {"C | F |\n[B]\n| Am | G\nC", "C@0 F@4 Am@8 G@12 C@16 end@20"},
         {"C | F\n. . | G", "C@0 F@4 G@8 end@12"},
         {"C | F x2\nHere is a line\nG | C", "C@0 F@4 C@8 F@12 G@16 C@20 end@24"},
+        {"C | F x2\nG | C", "C@0 F@4 C@8 F@12 G@16 C@20 end@24"},
+        {"C F [2x]\nG", "C@0 F@1 C@2 F@3 G@4 end@5"},
         {"C F\nG Am | F", "C@0 F@1 G@2 Am@3 F@4 end@8"},
         {"C | % | F G | % %", "C@0 C@4 F@8 G@9 end@16"},
         {"C G | F | .//. | Am", "C@0 G@1 F@4 C@8 G@9 F@12 Am@16 end@20"},
@@ -97,6 +99,7 @@ TEST_CASE("Parts of a song have names") {
     CHECK(Sections("{A} C | % | F") == "A@0");
     CHECK(Sections("[A]\nC | F\n[B]\nDm | G") == "A@0, B@8");
     CHECK(Sections("[A] C7 | F7\n[B] (x2)\nDm | G") == "A@0, B@8");
+    CHECK(Sections("Verse: C F x2\nChorus: G") == "Verse@0, Chorus@4");
     CHECK(Sections("[Intro] G C\n[Verse 1] Am F") == "Intro@0, Verse 1@2");
     CHECK(Shown("A: C:maj7 | G:min") == "C:maj7@0 G:min@4 end@8");
 }

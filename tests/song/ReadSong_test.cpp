@@ -179,6 +179,9 @@ TEST_CASE("Typed songs are played as scores are") {
         {"C | F To Coda | G | D.C. al Coda | \U0001D10C Am | D | \U0001D10C Em |",
          "C F G C F Am D Em"},
         {"|: C | F :| (3x) G", "C F C F C F G"},
+        {"|: C | F :| [3x]\nG", "C F C F C F G"},
+        {"[Verse]\n|: C | F :| x3\nHere is a line of words", "C F C F C F"},
+        {"C $ F G @ D.S. al Coda @ Am", "C F G F G Am"},
         {"|: C [2. F :| [2. G", "C F C G"},
         {"|: C [1 F :| [1 G | Am", "C F C G Am"},
         {"|: C :| [1 F | G", "C C F G"},
@@ -195,6 +198,41 @@ TEST_CASE("Typed songs are played as scores are") {
     CHECK(repeated.mRepeats == std::vector<CSongRepeat>{{16, 8, 2}});
     CHECK(ShownBars(repeated) == "1@0+4 2@4+4 3@8+4 4@12+4 3@16+4 4@20+4");
     CHECK(ShownBars(ReadSong("C F G")) == "");
+}
+
+TEST_CASE("Words that lead nowhere are told with their place, and the song is played") {
+    struct CRow {
+        const char* mText;
+        const char* mPlayed;
+        const char* mFaults;
+    };
+    const CRow rows[] = {
+        {"C | F |\nG | D.S.", "C F G C F G",
+         "2:5: D.S.: there is no segno to go back to, so the song begins again"},
+        {"C | F | To Coda | D.C.", "C F C F", "1:9: To Coda: there is no coda to go to"},
+        {"C | To Coda F | Coda G", "C F G",
+         "1:5: To Coda: no D.C. or D.S. plays this again, so nothing goes to the coda from here"},
+        {"C | F | D.C. al Coda | Coda G", "C F C F G",
+         "1:9: D.C. al Coda: nothing tells where to leave for a coda, or there is none"},
+        {"C | F | D.C. al Fine", "C F C F", "1:9: D.C. al Fine: there is no Fine to stop at"},
+        {"C | F x3 | G", "C F G", "1:7: x3: this stands behind no repeat and no line of chords"},
+        {"C | F\nChorus: x2", "C F", "2:1: there are no chords on this line to play again"},
+        {"Do | Fa", "Do Fa", "1:1: Do and Fa are D diminished and F augmented, not C and F"},
+        {"Do | Fa | G", "Do Fa G", ""},
+        {"*A[T44C |F <D.S. al Fine>Z", "C F C F",
+         "1:13: D.S. al Fine: there is no segno to go back to, so the song begins again; "
+         "1:13: D.S. al Fine: there is no Fine to stop at"},
+    };
+    for (const CRow& row : rows) {
+        CAPTURE(row.mText);
+        const CSong song = ReadSong(row.mText);
+        CHECK(Played(song) == row.mPlayed);
+        CHECK(Faults(song) == row.mFaults);
+        CHECK_FALSE(song.HasFault());
+    }
+    // What is there is not told, and nothing twice.
+    CHECK(Faults(ReadSong("|: C x3 | F :| $ G | To Coda | D.S. al Coda | Coda Am")) == "");
+    CHECK(ReadSong("C | D.S. | F | D.S.").mFaults.size() == 1);
 }
 
 TEST_CASE("Links and pages with charts are read") {

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/platform/Ascii.h"
+#include "brindle/platform/ReadNumber.h"
 #include "brindle/song/internal/PlayWords.h"
 #include "brindle/song/internal/SongTokens.h"
 #include "brindle/song/internal/SongWords.h"
@@ -33,7 +34,7 @@ public:
         while (!mList.IsGivenUp()) {
             mRest = TrimmedInFront(mRest);
             if (mRest.empty()) return;
-            if (TakeBar() || TakeSectionInBraces() || TakeEnding() || TakePlayWords()) continue;
+            if (TakeBar() || TakeSectionInBraces() || TakePlayWords() || TakeEnding()) continue;
             TakeWord();
         }
     }
@@ -233,19 +234,61 @@ void CutChordLine(std::string_view line, CTokenList& list) {
     CChordLine(line, list).Cut();
 }
 
-std::size_t CutSheetLine(std::string_view line, CTokenList& list) {
-    const std::size_t begin = list.mTokens.size();
+namespace {
+
+/// More than anybody means by "x3" behind a line.
+constexpr int kMostTimes = 16;
+
+/// How often a line is played that ends in "x3"; the words are taken off. Behind `:|` they belong
+/// to the repeat.
+int TakeTimes(std::string_view& line) {
+    const std::size_t blank = line.find_last_of(Ascii::kWhiteSpace);
+    if (blank == line.npos) return 1;
+    const std::string_view word = line.substr(blank + 1);
+    const std::size_t digits = word.find_first_of("0123456789");
+    const bool isTimes = digits != word.npos && word.find_first_of("xX") != word.npos &&
+                         LengthOfPlayWords(word) == word.size();
+    const std::string_view before = Trimmed(line.substr(0, blank));
+    const std::size_t signs = before.find_last_not_of("|:]") + 1;
+    if (!isTimes || before.substr(signs).find(":|") != before.npos) return 1;
+    line = before;
+    return std::clamp(ReadInteger(word.substr(digits)), 1, kMostTimes);
+}
+
+/// Plays what stands from `begin` on so many times in all, without the names of parts in front.
+void RepeatLine(std::size_t begin, int times, std::string_view line, CTokenList& list) {
+    const std::size_t end = list.mTokens.size();
+    while (list.mTokens[begin].mKind == TTokenKind::Section) ++begin;
+    for (int i = 1; i < times; ++i) {
+        if (!list.AddAgain(begin, end)) {
+            return list.AddFault(line, "its repeated lines make the song too long");
+        }
+    }
+}
+
+}  // namespace
+
+void CutSheetLine(std::string_view line, CTokenList& list) {
+    const std::string_view whole = line = Trimmed(line);
+    const int times = TakeTimes(line);
+    std::size_t begin = list.mTokens.size();
     CutChordLine(line, list);
     const auto at = [&](std::size_t index) {
         return list.mTokens.begin() + static_cast<std::ptrdiff_t>(index);
     };
     const auto music = std::find_if(at(begin), list.mTokens.end(), IsMusic);
-    if (music == list.mTokens.end()) return begin;
+    if (music == list.mTokens.end()) {
+        if (times > 1) list.AddNote(whole, "there are no chords on this line to play again");
+        return;
+    }
     const bool hasBars = std::any_of(at(begin), list.mTokens.end(), IsBar);
-    const bool endsBar = list.mEndOfBars > 0 && music->mKind != TTokenKind::Hold;
-    if (endsBar) list.mTokens.insert(at(list.mEndOfBars), CToken());
+    if (list.mEndOfBars > 0 && music->mKind != TTokenKind::Hold) {
+        list.mTokens.insert(at(list.mEndOfBars), CToken());
+        ++begin;
+    }
+    if (hasBars && times > 1) list.AddBar(false, false);
+    RepeatLine(begin, times, whole, list);
     list.mEndOfBars = hasBars ? list.mTokens.size() : 0;
-    return endsBar ? begin + 1 : begin;
 }
 
 void CutChordText(CTokenList& list) {

@@ -13,22 +13,6 @@ namespace brindle::SongText {
 
 namespace {
 
-/// More than anybody means by "x3" behind a line.
-constexpr int kMostTimes = 16;
-
-/// How often a line is played that ends in "x3"; the words are taken off.
-int TakeTimes(std::string_view& line) {
-    const std::size_t blank = line.find_last_of(Ascii::kWhiteSpace);
-    if (blank == line.npos) return 1;
-    const std::string_view word = line.substr(blank + 1);
-    const std::size_t digits = word.find_first_of("0123456789");
-    const bool isTimes = digits != word.npos && word.find_first_of("xX") != word.npos &&
-                         LengthOfPlayWords(word) == word.size();
-    if (!isTimes) return 1;
-    line = Trimmed(line.substr(0, blank));
-    return std::clamp(ReadInteger(word.substr(digits)), 1, kMostTimes);
-}
-
 class CSheet {
 public:
     explicit CSheet(CTokenList& list) : mList(list), mLines(LinesOf(list.Text())) {}
@@ -100,22 +84,11 @@ private:
 
     void TakeChords(std::string_view line) {
         const std::size_t bracket = line.front() == '[' ? line.find(']') : line.npos;
-        if (bracket != line.npos && !IsDigit(line[1])) {
+        if (bracket != line.npos && !IsDigit(line[1]) && LengthOfPlayWords(line) == 0) {
             mList.Add(TTokenKind::Section, Trimmed(line.substr(1, bracket - 1)));
             line = Trimmed(line.substr(bracket + 1));
         }
-        const std::string_view whole = line;
-        const int times = TakeTimes(line);
-        const std::size_t begin = CutSheetLine(line, mList);
-        const bool hasBars = mList.mEndOfBars > begin;
-        if (hasBars && times > 1) mList.AddBar(false, false);
-        const std::size_t end = mList.mTokens.size();
-        for (int i = 1; i < times; ++i) {
-            if (!mList.AddAgain(begin, end)) {
-                return mList.AddFault(whole, "its repeated lines make the song too long");
-            }
-        }
-        if (hasBars) mList.mEndOfBars = mList.mTokens.size();
+        CutSheetLine(line, mList);
     }
 
     CTokenList& mList;

@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/song/internal/PlayWords.h"
 
-#include "brindle/musicxml/internal/PlayMarks.h"
 #include "brindle/musicxml/internal/ScoreWords.h"
 #include "brindle/platform/Ascii.h"
 #include "brindle/song/internal/SongWords.h"
@@ -16,6 +15,9 @@ namespace {
 
 constexpr std::string_view kSegnoSign = "\U0001D10B";
 constexpr std::string_view kCodaSign = "\U0001D10C";
+// What people type for these signs.
+constexpr std::string_view kTypedSegno = "$";
+constexpr std::string_view kTypedCoda = "@";
 constexpr int kMostWords = 4;
 
 // Without blanks and points, in lower case.
@@ -69,10 +71,20 @@ std::string_view WordAt(std::string_view text, std::size_t pos) {
     return text.substr(pos, end - pos);
 }
 
+/// The bytes of `[3x]`, 0 for what is none.
+std::size_t LengthOfTimesInBrackets(std::string_view text) {
+    if (!text.starts_with('[')) return 0;
+    const std::string_view inside = WordAt(text, 1);
+    const bool isWhole = text.substr(1 + inside.size()).starts_with(']');
+    return isWhole && inside.size() <= 4 && IsTimes(FoldedPlayWord(inside)) ? inside.size() + 2 : 0;
+}
+
 }  // namespace
 
 std::size_t LengthOfPlayWords(std::string_view text) {
     if (text.starts_with(kSegnoSign)) return kSegnoSign.size();
+    if (WordAt(text, 0) == kTypedSegno) return kTypedSegno.size();
+    if (const std::size_t times = LengthOfTimesInBrackets(text); times > 0) return times;
     std::string joined;
     bool hasBareLetter = false;
     std::size_t found = 0;
@@ -95,12 +107,92 @@ std::size_t LengthOfPlayWords(std::string_view text) {
 }
 
 std::size_t LengthOfCodaSign(std::string_view text) {
+    if (WordAt(text, 0) == kTypedCoda) return kTypedCoda.size();
     return text.starts_with(kCodaSign) ? kCodaSign.size() : 0;
 }
 
 void ReadPlayWordsOfText(std::string_view words, CPlayMarks& marks) {
-    if (words == kSegnoSign || words == "S") return marks.mSegno.Set();
+    if (words == kSegnoSign || words == kTypedSegno || words == "S") return marks.mSegno.Set();
     ReadPlayWords(words, false, marks);
+}
+
+namespace {
+
+/// What a song has of all that words may ask for.
+struct CWaysOfSong {
+    explicit CWaysOfSong(const std::vector<CPlayMarks>& bars) : mBars(bars) {
+        for (const CPlayMarks& marks : bars) {
+            mHasSegno |= marks.mSegno.mIsSet;
+            mHasFine |= marks.mFine;
+            mHasToCoda |= marks.mToCoda.mIsSet;
+            mHasEndings |= marks.mEndingStarts;
+            mJumps |= marks.Jumps();
+            mCodaCount += marks.mCoda.mIsSet ? 1 : 0;
+        }
+    }
+    /// Where nothing says "To Coda", the first of two signs does.
+    [[nodiscard]] bool LeadsToCoda() const { return mCodaCount > (mHasToCoda ? 0 : 1); }
+    /// Repeats with endings are told from the signs of other bars, too.
+    [[nodiscard]] bool HasRepeatAt(std::size_t bar) const {
+        const bool hasSign =
+            bar < mBars.size() && (mBars[bar].mRepeatBackward || mBars[bar].mRepeatForward);
+        return hasSign || mHasEndings;
+    }
+
+    const std::vector<CPlayMarks>& mBars;
+    bool mHasSegno = false;
+    bool mHasFine = false;
+    bool mHasToCoda = false;
+    bool mHasEndings = false;
+    bool mJumps = false;
+    int mCodaCount = 0;
+};
+
+struct CLossRow {
+    bool (*mIsLost)(const CPlacedWords&, const CWaysOfSong&);
+    const char* mText;
+};
+
+constexpr auto kLossRows = std::to_array<CLossRow>({
+    {[](const CPlacedWords& words, const CWaysOfSong& song) {
+         return words.mMarks.mDalSegno.mIsSet && !song.mHasSegno;
+     },
+     "there is no segno to go back to, so the song begins again"},
+    {[](const CPlacedWords& words, const CWaysOfSong& song) {
+         return words.mMarks.mToCoda.mIsSet && song.mCodaCount == 0;
+     },
+     "there is no coda to go to"},
+    {[](const CPlacedWords& words, const CWaysOfSong& song) {
+         return words.mMarks.mToCoda.mIsSet && song.mCodaCount > 0 && !song.mJumps;
+     },
+     "no D.C. or D.S. plays this again, so nothing goes to the coda from here"},
+    {[](const CPlacedWords& words, const CWaysOfSong& song) {
+         return words.mMarks.Jumps() && words.mMarks.mAlCoda && !song.LeadsToCoda();
+     },
+     "nothing tells where to leave for a coda, or there is none"},
+    {[](const CPlacedWords& words, const CWaysOfSong& song) {
+         return words.mMarks.mAlFine && !song.mHasFine;
+     },
+     "there is no Fine to stop at"},
+    {[](const CPlacedWords& words, const CWaysOfSong& song) {
+         return words.mMarks.mRepeatTimes > 0 && !song.HasRepeatAt(words.mBar);
+     },
+     "this stands behind no repeat and no line of chords"},
+});
+
+}  // namespace
+
+void TellLostWords(const std::vector<CPlacedWords>& words, const std::vector<CPlayMarks>& bars,
+                   CTokenList& list) {
+    const CWaysOfSong song(bars);
+    for (const CLossRow& row : kLossRows) {
+        const auto lost = std::find_if(words.begin(), words.end(), [&](const CPlacedWords& placed) {
+            return row.mIsLost(placed, song);
+        });
+        if (lost != words.end()) {
+            list.AddNote(lost->mText, std::string(lost->mText) + ": " + row.mText);
+        }
+    }
 }
 
 }  // namespace brindle::SongText

@@ -22,6 +22,7 @@ public:
         for (CPlayMarks& marks : mMade.mMarks) {
             if (marks.mToCoda.mIsSet) marks.mCoda = {};
         }
+        TellLostWords(mWords, mMade.mMarks, mList);
         return std::move(mMade);
     }
 
@@ -89,6 +90,7 @@ private:
         const bool isForNext =
             isPlace || mStepCount > 0 || mList.mWordsStandInFront || mMade.mMarks.empty();
         (isForNext ? mNextMarks : mMade.mMarks.back()).Add(marks);
+        mWords.push_back({words, marks, mMade.mMarks.size() - (isForNext ? 0 : 1)});
     }
 
     /// Without bar lines, marks stand between passages.
@@ -156,6 +158,7 @@ private:
     CWrittenBar mNext;
     CPlayMarks mNextMarks;
     std::vector<CCodaSign> mCodaSigns;
+    std::vector<CPlacedWords> mWords;
     std::size_t mStepCount = 0;
     std::size_t mLastStep = 0;
 };

@@ -28,7 +28,8 @@ struct CSheetBars {
     std::vector<CPlayMarks> mMarks;
 };
 
-/// Collects the tokens between bar lines. A repeat of bars that are not there is a fault of `list`.
+/// Collects the tokens between bar lines. A repeat of bars that are not there is a fault of `list`,
+/// and words that lead nowhere are a note of it.
 [[nodiscard]] CSheetBars MakeSheetBars(CTokenList& list);
 
 }  // namespace brindle::SongText

@@ -116,8 +116,8 @@ private:
 /// Cuts one line of plain text, which must be part of the text of `list`.
 void CutChordLine(std::string_view line, CTokenList& list);
 /// The same for a line of a sheet, where a bar ends with its line: behind a line with bar lines
-/// only a line that begins with a hold goes on in the same bar. Returns where its tokens begin.
-std::size_t CutSheetLine(std::string_view line, CTokenList& list);
+/// only a line that begins with a hold goes on in the same bar. `x3` at its end plays it again.
+void CutSheetLine(std::string_view line, CTokenList& list);
 /// Cut the whole text of `list`.
 void CutChordText(CTokenList& list);
 void CutChordsAboveLyrics(CTokenList& list);
