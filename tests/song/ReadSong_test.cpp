@@ -6,12 +6,14 @@
 #include "brindle/song/AnalyseSong.h"
 #include "brindle/song/ParseSong.h"
 #include "brindle/song/ReadSongHarmony.h"
+#include "brindle/song/SheetTimes.h"
 #include "brindle/song/TransposeSong.h"
 #include "brindle/song/internal/ChartLinks.h"
 
 #include <doctest/doctest.h>
 #include <fmt/format.h>
 
+#include <cmath>
 #include <filesystem>
 #include <sstream>
 #include <string>
@@ -403,6 +405,9 @@ TEST_CASE("Bars tell what is written about jumps, each time that they are played
     };
     CHECK(signs(ReadSong("C | Segno F | To Coda | G | D.S. al Coda | Coda Am")) ==
           "0 1$(To Coda) 2(D.S. al Coda) 1$(To Coda) 3@ ");
+    // Where a coda is left it does not begin.
+    CHECK(signs(ReadSong("C | Coda F To Coda | D.C. al Coda | Coda Am")) ==
+          "0 1(To Coda, D.C. al Coda) 0 1(To Coda, D.C. al Coda) 2@ ");
     const CSong score = ReadSongFile(kLeadSheets + "/beautiful_dreamer.musicxml");
     REQUIRE(score.mBars.size() > 40);
     std::string words;
@@ -485,6 +490,19 @@ TEST_CASE("A score of odd times is a song with usual bars, and lasts as long as 
     CHECK(song("<beats>6</beats><beat-type>8</beat-type>", "1").mBeatsPerBar == 3.0);
     CHECK(song("<beats>1</beats><beat-type>512</beat-type>", "1").mBeatsPerBar == 4.0);
     CHECK(song("<beats>5000</beats><beat-type>4</beat-type>", "1").mBeatsPerBar == 4.0);
+}
+
+TEST_CASE("A song that lasts longer than anybody plays has no times") {
+    for (const double position : {0.0, 999'999'999.0}) {
+        CSong song = ReadSong("C");
+        song.mChords.back().mPosition = position;
+        CHECK(HasTimes(song));
+    }
+    for (const double position : {-1.0, 1e9, std::nan("")}) {
+        CSong song = ReadSong("C");
+        song.mChords.back().mPosition = position;
+        CHECK_FALSE(HasTimes(song));
+    }
 }
 
 TEST_CASE("A song moves into the key that has its kind of signs") {

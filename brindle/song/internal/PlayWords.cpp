@@ -148,34 +148,35 @@ struct CWaysOfSong {
     int mCodaCount = 0;
 };
 
+/// Whether what words say is lost in the bar of a song that they steer, and what is told then.
 struct CLossRow {
-    bool (*mIsLost)(const CPlacedWords&, const CWaysOfSong&);
+    bool (*mIsLost)(const CPlayMarks& words, std::size_t bar, const CWaysOfSong& song);
     const char* mText;
 };
 
 constexpr auto kLossRows = std::to_array<CLossRow>({
-    {[](const CPlacedWords& words, const CWaysOfSong& song) {
-         return words.mMarks.mDalSegno.mIsSet && !song.mHasSegno;
+    {[](const CPlayMarks& words, std::size_t, const CWaysOfSong& song) {
+         return words.mDalSegno.mIsSet && !song.mHasSegno;
      },
      "there is no segno to go back to, so the song begins again"},
-    {[](const CPlacedWords& words, const CWaysOfSong& song) {
-         return words.mMarks.mToCoda.mIsSet && song.mCodaCount == 0;
+    {[](const CPlayMarks& words, std::size_t, const CWaysOfSong& song) {
+         return words.mToCoda.mIsSet && song.mCodaCount == 0;
      },
      "there is no coda to go to"},
-    {[](const CPlacedWords& words, const CWaysOfSong& song) {
-         return words.mMarks.mToCoda.mIsSet && song.mCodaCount > 0 && !song.mJumps;
+    {[](const CPlayMarks& words, std::size_t, const CWaysOfSong& song) {
+         return words.mToCoda.mIsSet && song.mCodaCount > 0 && !song.mJumps;
      },
      "no D.C. or D.S. plays this again, so nothing goes to the coda from here"},
-    {[](const CPlacedWords& words, const CWaysOfSong& song) {
-         return words.mMarks.Jumps() && words.mMarks.mAlCoda && !song.LeadsToCoda();
+    {[](const CPlayMarks& words, std::size_t, const CWaysOfSong& song) {
+         return words.mAlCoda && !song.LeadsToCoda();
      },
      "nothing tells where to leave for a coda, or there is none"},
-    {[](const CPlacedWords& words, const CWaysOfSong& song) {
-         return words.mMarks.mAlFine && !song.mHasFine;
+    {[](const CPlayMarks& words, std::size_t, const CWaysOfSong& song) {
+         return words.mAlFine && !song.mHasFine;
      },
      "there is no Fine to stop at"},
-    {[](const CPlacedWords& words, const CWaysOfSong& song) {
-         return words.mMarks.mRepeatTimes > 0 && !song.HasRepeatAt(words.mBar);
+    {[](const CPlayMarks& words, std::size_t bar, const CWaysOfSong& song) {
+         return words.mRepeatTimes > 0 && !song.HasRepeatAt(bar);
      },
      "this stands behind no repeat and no line of chords"},
 });
@@ -185,12 +186,14 @@ constexpr auto kLossRows = std::to_array<CLossRow>({
 void TellLostWords(const std::vector<CPlacedWords>& words, const std::vector<CPlayMarks>& bars,
                    CTokenList& list) {
     const CWaysOfSong song(bars);
-    for (const CLossRow& row : kLossRows) {
-        const auto lost = std::find_if(words.begin(), words.end(), [&](const CPlacedWords& placed) {
-            return row.mIsLost(placed, song);
-        });
-        if (lost != words.end()) {
-            list.AddNote(lost->mText, std::string(lost->mText) + ": " + row.mText);
+    std::array<bool, kLossRows.size()> isTold{};
+    for (const CPlacedWords& placed : words) {
+        CPlayMarks marks;
+        ReadPlayWordsOfText(placed.mText, marks);
+        for (std::size_t i = 0; i < kLossRows.size(); ++i) {
+            if (isTold[i] || !kLossRows[i].mIsLost(marks, placed.mBar, song)) continue;
+            list.AddNote(placed.mText, std::string(placed.mText) + ": " + kLossRows[i].mText);
+            isTold[i] = true;
         }
     }
 }

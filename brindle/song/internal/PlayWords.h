@@ -21,10 +21,9 @@ namespace brindle::SongText {
 /// What such words say; `S` is the sign of the segno in charts.
 void ReadPlayWordsOfText(std::string_view words, CPlayMarks& marks);
 
-/// Words of a text, what they say, and the bar that they steer.
+/// Words of a text and the bar that they steer.
 struct CPlacedWords {
     std::string_view mText;
-    CPlayMarks mMarks;
     std::size_t mBar = 0;
 };
 

@@ -90,7 +90,7 @@ private:
         const bool isForNext =
             isPlace || mStepCount > 0 || mList.mWordsStandInFront || mMade.mMarks.empty();
         (isForNext ? mNextMarks : mMade.mMarks.back()).Add(marks);
-        mWords.push_back({words, marks, mMade.mMarks.size() - (isForNext ? 0 : 1)});
+        mWords.push_back({words, mMade.mMarks.size() - (isForNext ? 0 : 1)});
     }
 
     /// Without bar lines, marks stand between passages.
