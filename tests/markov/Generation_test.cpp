@@ -6,6 +6,7 @@
 #include "brindle/markov/TMarkovSamplingInformation.h"
 
 #include <doctest/doctest.h>
+#include <fmt/format.h>
 
 #include <algorithm>
 #include <cmath>
@@ -186,4 +187,24 @@ TEST_CASE("A free sequence whose last chord is shorter than a beat has missed it
         return sequence.mLogProbability;
     };
     CHECK(weightFor("(4,U);(0.5,U)") < -700.0);
+}
+
+TEST_CASE("The usual options lead to as many beats, or to the wanted chords, with all histories") {
+    VariableLengthMarkovModel model(2);
+    Learn(model, "(4,C);(4,F);(4,G);(4,C);(4,F);(4,G)");
+    const auto symbols = [&](const TMarkovGenerateOptions& options) {
+        CHECK(options.IsValid(model));
+        CHECK(options.mMaxHistoryLength == 2);
+        TMarkovSampledSequence sequence;
+        TMarkovSamplingInformation info;
+        REQUIRE(model.RecursiveGenerateSequence(sequence, options, info));
+        std::string shown;
+        for (const MarkovIterator symbol : sequence.mSymbols) {
+            shown += fmt::format("{} ", symbol->mChord.mRootKeyEnh.mKeyNr);
+        }
+        return shown;
+    };
+    CHECK(symbols(UsualGenerateOptions(model, 12.0)) == "0 5 7 ");
+    CHECK(symbols(UsualGenerateOptions(model, SymbolsOf("(4,C);(16,U);(4,G)"))) == "0 5 7 0 5 7 ");
+    CHECK_FALSE(UsualGenerateOptions(model, 0.0).IsValid(model));
 }
