@@ -40,7 +40,7 @@ struct CChordGrid {
     std::optional<CChordNamePrefs> mStyle;
     /// The chord that spells its notes: Eb of Cm9, not D#. Undefined if it has no name.
     CChordLite mChord;
-    /// The key that the name stands on, 0 to 11.
+    /// The pitch class that the name stands on, 0 (C) to 11; -1 without a name.
     int mRoot = -1;
     /// Where it comes from; empty for typed frets and for what was searched.
     std::string mLibrary;

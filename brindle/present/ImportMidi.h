@@ -7,8 +7,8 @@
 namespace brindle {
 
 /// An imported score as a piece with one track for each part. Notes of unknown length are left out.
-/// A note without a pitch has the key of its instrument, else the number of its place on the staff,
-/// else that of a snare drum.
+/// A note without a pitch has the note number that MIDI gives its instrument, else that of its
+/// place on the staff, else that of a snare drum.
 [[nodiscard]] CMidiPiece MidiPieceOf(const CImportedScore& score);
 
 }  // namespace brindle

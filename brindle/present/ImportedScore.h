@@ -16,7 +16,8 @@ namespace brindle {
 /// Ticks to the quarter of an import by the program.
 inline constexpr std::int32_t kImportTicksPerQuarter = 960;
 
-/// The snare drum of General MIDI, for a note that neither instrument nor staff place gives a key.
+/// The note number of the snare drum in General MIDI, for a note to which neither instrument nor
+/// staff place gives one.
 inline constexpr int kUsualDrumKey = 38;
 
 /// One line of the table of a part: a note, or something that stands between notes.
@@ -39,7 +40,7 @@ struct CPlayedNote {
     std::int64_t mNoteNr = -1;            ///< 0 to 127; -1 where it has no pitch
     int mVelocity = 0;                    ///< 1 to 127
     bool mIsUnpitched = false;            ///< a note of drums and their like
-    /// Of a note without pitch, the key that plays it, from 0, where the score tells it.
+    /// Of a note without pitch, the note number that plays it, from 0, where the score tells it.
     std::optional<int> mMidiKey;
     /// The channel of its instrument, from 0, where the score tells it.
     std::optional<int> mMidiChannel;

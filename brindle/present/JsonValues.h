@@ -18,14 +18,14 @@ using Json = nlohmann::ordered_json;
 // The values that all JSON of the program shares, see docs/json.md: written straight, or as a value
 // of a dictionary.
 
-/// Key number, spelling and name; null for the undefined key.
+/// Pitch class, spelling and name; null for the undefined one.
 void WriteKeyEnh(CJsonWriter& json, const CKeyEnh& keyEnh);
 /// The same as a value.
 [[nodiscard]] Json KeyEnhToJson(const CKeyEnh& keyEnh);
 /// A list of such values.
 [[nodiscard]] Json KeyEnhsToJson(const std::vector<CKeyEnh>& keys);
 
-/// Name, root and type; null for the undefined key.
+/// Name, root and type of a tonality; null for the undefined one.
 void WriteSignKey(CJsonWriter& json, const CSignKeyLite& key);
 
 /// The semitones of a mask in ascending order.

@@ -22,7 +22,7 @@ public:
 
     /// Undefined for a sequence without chords.
     [[nodiscard]] const CSignKeyLite& Key() const { return mKey; }
-    /// The same keys with the spelling of this one.
+    /// The same tones with the spelling of this key.
     [[nodiscard]] CChordLite Spelled(const CChordLite& chord) const {
         return mNames.Spelled(chord);
     }

@@ -22,10 +22,10 @@ namespace brindle {
 /// How the program reads and writes names: letters with "#" and "b", as people type them.
 [[nodiscard]] const CChordNamePrefs& NamePrefs();
 
-/// "F#", "Bb"; "Undef" for no key.
+/// A pitch class as it is spelled: "F#", "Bb"; "Undef" for none.
 [[nodiscard]] std::string KeyName(const CKeyEnh& keyEnh);
 
-/// A key as texts and pictures name it: "F# minor"; "Undef" for none.
+/// A tonality as texts and pictures name it: "F# minor"; "Undef" for none.
 [[nodiscard]] std::string KeyInWords(const CSignKeyLite& key);
 /// The same of a center: "D dorian"; a mask that is no mode has its root alone.
 [[nodiscard]] std::string KeyInWords(const CHarmCenterLite& center);
@@ -40,8 +40,8 @@ namespace brindle {
 /// The semitones of a mask: "0 4 7".
 [[nodiscard]] std::string SemitonesText(CSemitones semitones);
 
-/// The keys of a scale from its root up, as the scale spells them; a key that it does not spell is
-/// spelled from the root.
+/// The pitch classes of a scale from its root up, as the scale spells them; one that it does not
+/// spell is spelled from the root.
 [[nodiscard]] std::vector<CKeyEnh> KeysOf(const CScaleHeavy& scale);
 /// "D E F".
 [[nodiscard]] std::string NotesText(const std::vector<CKeyEnh>& keys);

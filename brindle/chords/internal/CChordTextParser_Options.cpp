@@ -8,6 +8,7 @@
 #include <array>
 
 namespace brindle::ChordText {
+
 bool CChordTextParser::ReadOptions() {
     if (mPrefs.mOwnName) {
         // The comma behind a printed root parts it from the rest and means nothing else.
