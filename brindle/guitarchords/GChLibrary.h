@@ -32,8 +32,6 @@ public:
     void setLibraryName(std::string_view name) { mLibraryName = name; }
     /// Of its file; empty for a library that was never saved.
     [[nodiscard]] const std::filesystem::path& libraryPath() const { return mLibraryPath; }
-    /// Moves nothing. A save goes there only if a file is there already.
-    void setLibraryPath(std::filesystem::path path) { mLibraryPath = std::move(path); }
     /// Kept in the file and left to the host.
     [[nodiscard]] bool isReadOnlyLibrary() const { return mIsReadOnlyLibrary; }
     /// Nothing here keeps to it but GChDatabase::allUserLibrariesForAnyTuning.
