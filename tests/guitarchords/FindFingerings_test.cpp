@@ -292,6 +292,8 @@ TEST_CASE("What a player minds lies behind what he does not") {
              {"Cm13", "x33345", "111213", "a thirteenth stands on its root"},
              {"C11", "x33333", "132333", "the eleventh rubs on the third"},
              {"C7", "x32310", "012010", "a fifth is missed less than the root below"},
+             {"Cdim7", "xx1212", "x3424x", "each tone of it may be the bass"},
+             {"C", "x35553", "x35050", "open strings lie far below the hand"},
          }) {
         CFingeringOptions options;
         options.mLimit = 1000;

@@ -79,3 +79,13 @@ TEST_CASE("Lead sheets are played through as their signs and words say") {
         CHECK(last.mPosition + last.mDuration == doctest::Approx(row.mQuarters));
     }
 }
+
+TEST_CASE("A bar that sends to the coda is not the coda, though it has its sign") {
+    std::vector<CPlayMarks> bars(6);
+    bars[1].mToCoda.Set();
+    bars[2].mToCoda.Set();
+    bars[2].mCoda.Set();
+    bars[3].mDaCapo = bars[3].mAlCoda = true;
+    bars[4].mCoda.Set();
+    CHECK(Shown(PlayInOrder(bars)) == "1-4 1-2 5-6");
+}

@@ -244,6 +244,21 @@ TEST_CASE("A song tells above its diagrams where the capo lies, and what its sha
     CHECK(SongGridsText(plain, CPaint(false), {}).find("sounds") == std::string::npos);
 }
 
+TEST_CASE("A chord has a diagram for each of its fingerings, and shares none with another chord") {
+    const std::vector<std::string> symbols{"C", "C", "Cmaj", "C"};
+    const CChordLite c = ReadChordText("C").mChord;
+    CSongFingerings played;
+    for (const std::vector<int>& frets : {std::vector{-1, 3, 2, 0, 1, 0},
+                                          {-1, 3, 5, 5, 5, 3},
+                                          {-1, 3, 2, 0, 1, 0},
+                                          {-1, 3, 2, 0, 1, 0}}) {
+        played.mFingerings.push_back(FingeringForChord(frets, c, kGChStandardGuitar).value());
+    }
+    const auto shown = MakeSongGrids(std::vector(4, c), symbols, std::vector{played});
+    CHECK(shown.mGridOfChord == std::vector<std::optional<std::size_t>>{0, 1, 2, 0});
+    CHECK(FretsText(GridsBySymbol(shown).at("C")) == "x32010");
+}
+
 TEST_CASE("For the left hand the lowest string stands on the right") {
     CGridStyle left;
     left.mLeftHanded = true;

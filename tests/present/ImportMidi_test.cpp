@@ -198,6 +198,25 @@ TEST_CASE("A tie that does not end is told with how long it is played") {
     CHECK(ImportText(whole, CPaint(false)).find("does not end") == std::string::npos);
 }
 
+TEST_CASE("Pitched notes keep their pitch where the instrument has a drum key") {
+    const CMidiPiece piece = MidiPieceOf(Import(Instrument("I36", 36), Written("C4") + Drum("")));
+    REQUIRE(piece.mTracks[0].mNotes.size() == 2);
+    CHECK(piece.mTracks[0].mNotes[0].mNoteNr == 60);
+    CHECK(piece.mTracks[0].mNotes[1].mNoteNr == 36);
+}
+
+TEST_CASE("The key of a clarinet in B flat is that which sounds") {
+    const CMidiPiece piece =
+        MidiPieceOf(Import("",
+                           "<attributes><key><fifths>3</fifths></key><transpose>"
+                           "<diatonic>-1</diatonic><chromatic>-2</chromatic></transpose>"
+                           "</attributes>" +
+                               Written("A4")));
+    REQUIRE(piece.mKeySignatures.size() == 1);
+    CHECK(piece.mKeySignatures[0].mSharps == 1);
+    CHECK(piece.mTracks[0].mNotes.at(0).mNoteNr == 67);
+}
+
 TEST_CASE("Parts without a channel go around that of drums") {
     CImportedScore score;
     score.mParts.resize(17);

@@ -17,13 +17,14 @@ std::string Bytes(const char (&text)[size]) {
     return std::string(text, size - 1);
 }
 
-TEST_CASE("A piece of one note is written byte by byte as the format asks") {
+TEST_CASE("A note that is struck again, however softly, ends before it begins, byte by byte") {
     CMidiPiece piece;
     piece.mTicksPerQuarter = 96;
-    piece.mTracks = {{"", {}, {{0, 200, 9, 60, 100}}}};
+    piece.mTracks = {{"", {}, {{200, 100, 9, 60, 0}, {0, 200, 9, 60, 100}}}};
     CHECK(MidiFileBytes(piece) == Bytes("MThd\0\0\0\6\0\1\0\2\0\x60"
                                         "MTrk\0\0\0\4\0\xFF\x2F\0"
-                                        "MTrk\0\0\0\x0D\0\x99\x3C\x64\x81\x48\x89\x3C\x40"
+                                        "MTrk\0\0\0\x15\0\x99\x3C\x64\x81\x48\x89\x3C\x40"
+                                        "\0\x99\x3C\1\x64\x89\x3C\x40"
                                         "\0\xFF\x2F\0"));
 }
 

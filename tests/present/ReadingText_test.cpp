@@ -102,6 +102,8 @@ TEST_CASE("Bars that have other numbers in their source are said to be counted a
     CHECK(!Has(Shown("C | F | G7 | C |"), word));
     CHECK(Has(Shown("|: C | F :| G7 | C |"), "6 bars, counted from 1 as they are played\n"));
     CHECK(Has(Shown("m0 b4 C: V\nm1 I\n"), "2 bars of 4/4, counted from 1 as they are played\n"));
+    // A time is told where all bars have it.
+    CHECK(Has(Shown("Time Signature: 4/4\nm1 C: I\nTime Signature: 3/4\nm2 V\n"), "2 bars\n"));
 }
 
 TEST_CASE("Bars that hold a chord show it, and a long row of them its number") {

@@ -138,6 +138,16 @@ TEST_CASE("JSON of a score tells its bars, times and repeats, whichever form it 
     }
 }
 
+TEST_CASE("A copy ends where its last chord ends, as does its source") {
+    const CSong song = ReadSong("C | F | G7 | C | Am | C | F | G7 | C | Dm");
+    const CShownSong shown = ShowSong(song, AnalyseSong(song, {.mCopies = true}));
+    REQUIRE(shown.mCopies.size() == 1);
+    CHECK(shown.mCopies[0].mSource.mBegin == 0.0);
+    CHECK(shown.mCopies[0].mSource.mEnd == 16.0);
+    CHECK(shown.mCopies[0].mTarget.mBegin == 20.0);
+    CHECK(shown.mCopies[0].mTarget.mEnd == 36.0);
+}
+
 TEST_CASE("The pictures of a song tell a screen reader what they show") {
     const CShownSong song = Shown(ReadSong("Dm7 G7 | C C"));
     for (const std::string& svg : {AnalysisSvg(song), KeysSvg(song)}) {

@@ -1,12 +1,14 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/present/WrittenSongText.h"
 
+#include "brindle/present/ChordProText.h"
 #include "brindle/song/BuiltInSongs.h"
 #include "brindle/song/ReadSong.h"
 #include "brindle/song/SongRequest.h"
 
 #include <doctest/doctest.h>
 
+#include <set>
 #include <string>
 #include <utility>
 #include <vector>
@@ -35,6 +37,20 @@ TEST_CASE("Chords that share a bar by seven begin at the nearest ticks, without 
         ticks += std::to_string(note.mTick) + "+" + std::to_string(note.mDuration) + " ";
     }
     CHECK(ticks == "0+274 274+275 549+274 823+274 1097+274 1371+275 1646+274 1920+1920 ");
+}
+
+TEST_CASE("Of five tones the right hand leaves the root to the bass") {
+    const CMidiPiece piece = MidiPieceOfSong(ReadSong("C9"), 120.0);
+    std::set<int> tones;
+    for (const CMidiNote& note : piece.mTracks[0].mNotes) tones.insert(note.mNoteNr % 12);
+    CHECK(tones == std::set<int>{2, 4, 7, 10});
+    CHECK(piece.mTracks[1].mNotes.at(0).mNoteNr == 48);
+}
+
+TEST_CASE("An upbeat fills its bar from behind in ChordPro") {
+    CHECK(ChordProText(ReadSong("Time Signature: 3/4\nm0 b3 C: V\nm1 I\nm2 V7 b3 I\n")) ==
+          "{key: C major}\n{time: 3/4}\n{start_of_grid}\n"
+          "| N.C. . G | C . . | G7 . C |\n{end_of_grid}\n");
 }
 
 TEST_CASE("A written song reads back from its text, with its parts") {
