@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/chords/NameNotes.h"
+#include "brindle/chords/CProgressionSpelling.h"
 #include "brindle/chords/ReadChordText.h"
+#include "brindle/chords/WriteChordSymbol.h"
 #include "brindle/theory/CChordNamePrefs.h"
 
 #include <doctest/doctest.h>
@@ -133,6 +135,35 @@ TEST_CASE("A progression names an ambiguous chord by where it goes") {
     // Silence between two chords does not part them.
     CHECK(symbols({{43, 53, 59, 62}, {}, ambiguous, {}, {43, 53, 59, 62}}) == "G7  C6/E  G7 ");
     CHECK(symbols({}).empty());
+}
+
+TEST_CASE("Roots are spelled by the key, basses by their chord where the key agrees") {
+    struct CRow {
+        CSignKeyLite mKey;
+        std::vector<const char*> mChords;
+        const char* mSpelled;
+    };
+    const CSignKeyLite c(CKeyEnh_C, TSignKeyType_Major);
+    const CSignKeyLite e(CKeyEnh_E, TSignKeyType_Major);
+    const CRow rows[] = {
+        {c, {"C", "Dbdim7", "Dm7"}, "C C#dim7 Dm7 "},
+        {c, {"D7/Gb", "Ab7/Gb"}, "D7/F# Ab7/F# "},  // a third and a seventh on one key
+        {c, {"G#7/Gb"}, "Ab7/Gb "},
+        {e, {"Bb7"}, "A#7 "},
+        {e, {"C/A#"}, "C/Bb "},  // a seventh below, though the chord has none
+        {e, {"Eb7/G"}, "D#7/G "},
+        {{CKeyEnh_A, TSignKeyType_Minor}, {"D#7", "Ab7"}, "Eb7 G#7 "},
+    };
+    for (const CRow& row : rows) {
+        std::vector<CChordLite> chords;
+        for (const char* symbol : row.mChords) chords.push_back(ReadChordText(symbol).mChord);
+        const CProgressionSpelling spelling(row.mKey, chords);
+        std::string spelled;
+        for (const CChordLite& chord : chords) {
+            spelled += WriteChordSymbol(spelling.Spelled(chord)) + " ";
+        }
+        CHECK(spelled == row.mSpelled);
+    }
 }
 
 TEST_CASE("A symbol is written in the style that is asked for") {

@@ -81,6 +81,17 @@ TEST_CASE("What many parts play in unison counts once, and a high note in front 
     CHECK(Text(ChordsFromNotes(FourFour(1, notes))) == "0+4 C  ");
 }
 
+TEST_CASE(
+    "The bass of a bar is the lowest note of its first beat, and may be foreign to its chord") {
+    std::vector<CTimedNote> notes = Chord(0.0, 4.0, {60, 64, 67});
+    notes.push_back({2.0, 2.0, CNote(43, TEnh_n)});
+    const auto chordOf = [](const std::vector<CTimedNote>& of) {
+        return Text(ChordsFromNotes(FourFour(1, of), {.mEvery = TChordEvery::Bar, .mKey = {}}));
+    };
+    CHECK(chordOf(notes) == "0+4 C  ");
+    CHECK(chordOf(Chord(0.0, 4.0, {42, 55, 60, 64, 67, 72})) == "0+4 C/F#  ");
+}
+
 TEST_CASE("A stated key is kept and spells the chords") {
     const CScoreNotes score = FourFour(1, Chord(0.0, 4.0, {54, 58, 61}));
     const CSignKeyLite fSharp(CKeyEnh_Fis, TSignKeyType_Major);

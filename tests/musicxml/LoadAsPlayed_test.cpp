@@ -114,6 +114,8 @@ TEST_CASE("Repeats, endings and jumps are played as musicians play them") {
         {"A |: =play 3 times=; B :|; C", "ABABABC"},
         {"A |:; B :| =3 repeats=; C", "ABABABABC"},
         {"A |: {tempo='120'}; B :|1; C", "ABC"},
+        {"A |: =play 3 times= :|; B :|; C", "AAABBC"},
+        {"A; B {forward-repeat='yes'}; C :|", "ABCBC"},
         // Endings.
         {"A |:; B [1 ] :|; C [2 ]; D", "ABACD"},
         {"A |:; B [1,2 ] :|; C [3 ]; D", "ABABACD"},
@@ -126,6 +128,7 @@ TEST_CASE("Repeats, endings and jumps are played as musicians play them") {
         {"A |:; B [1 ] :|; C [3 ]; D", "ABACD"},
         {"A |:; B [1 ]; C [2 ]; D", "ABACD"},
         {"A |:; B [1 ] :|; C [2 ]; D |:; E [1 ] :|; F [2 ]", "ABACDEDF"},
+        {"A |:; B [1 ] :|; C [2 ]; D |:; E [2 ] :|; F [2 ]; G", "ABACDEDFG"},
         // Jumps come after the last pass; repeats are then left out, and the last endings taken.
         {"A; B =Fine=; C; D =D.C. al Fine=", "ABCDAB"},
         {"A; B $; C =Fine=; D =D.S. al Fine=; E", "ABCDBC"},
@@ -142,7 +145,9 @@ TEST_CASE("Repeats, endings and jumps are played as musicians play them") {
         {"A; B; C =D.C. al Coda=; D @; E", "ABCABCDE"},
         {"A {segno='s'}; B {tocoda='c'}; C {dalsegno='s'}; D {coda='c'}; E", "ABCABDE"},
         {"A {segno='s'}; B {segno='t'}; C {dalsegno='s'}; D", "ABCABCD"},
+        {"A {tocoda='b'}; B {dacapo='yes'}; C {coda='a'}; D {coda='b'}; E", "ABADE"},
         {"A; B =D.S.=; C", "ABABC"},
+        {"A {fine='no'}; B {dacapo='yes'}; C", "ABABC"},
         {"A =Fine=; B =D.C. al Fine=; C", "ABA"},
         {"A =Fine=; B =D.C. al Coda=; C", "ABABC"},
         {"A =Fine=; B =D.C.=; C", "ABA"},
