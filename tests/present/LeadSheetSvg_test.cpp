@@ -223,13 +223,16 @@ TEST_CASE("A jump without words is labelled wherever it leads to") {
     CHECK(Shown(song) == "| C | F | G | Am | Dm | {= bars 2–4} F | G | Am ");
 }
 
+/// "C | D | ": bars with the chords of `letters`.
+std::string BarsOf(std::string_view letters) {
+    std::string text;
+    for (const char letter : letters) text += std::string(1, letter) + " | ";
+    return text;
+}
+
 // A song of bars with a chord each, with repeats as pairs of bars and a count.
 CSong SongOfBars(std::string_view chords, const std::vector<std::array<std::size_t, 3>>& repeats) {
-    CSong song = EvenSong([&] {
-        std::string text;
-        for (const char chord : chords) text += std::string(1, chord) + " | ";
-        return text;
-    }());
+    CSong song = EvenSong(BarsOf(chords));
     for (const auto& [source, again, count] : repeats) {
         song.mRepeats.push_back({song.mBars[again].mPosition, song.mBars[source].mPosition, count});
     }
@@ -264,13 +267,6 @@ TEST_CASE("Endings, several times, jumps and nonsense") {
     CSong odd = SongOfBars("CFCF", {});
     odd.mRepeats = {{std::nan(""), 0.0, 2}, {1e300, 0.0, 2}, {8.0, -5.0, 2}};
     CHECK(Shown(odd) == "| C | F | C | F ");
-}
-
-/// "C | D | ": bars with the chords of `letters`.
-std::string BarsOf(std::string_view letters) {
-    std::string text;
-    for (const char letter : letters) text += std::string(1, letter) + " | ";
-    return text;
 }
 
 TEST_CASE("Written endings stand as they are, however long they are") {
