@@ -2,6 +2,7 @@
 #include "tests/analysis/RandomChordTexts.h"
 
 #include "brindle/analysis/CHarmAnlsProgressions.h"
+#include "brindle/theory/KeyIntervals.h"
 
 #include <array>
 #include <string_view>
@@ -93,6 +94,19 @@ std::vector<std::string> RandomSymbols(CChance& chance) {
     return symbols;
 }
 
+constexpr auto kKindsOfChords = std::to_array<std::uint64_t>({
+    0x091,  // major
+    0x089,  // minor
+    0x491,  // dominant seventh
+    0x891,  // major seventh
+    0x489,  // minor seventh
+    0x449,  // half-diminished
+    0x249,  // diminished seventh
+    0x049,  // diminished
+    0x111,  // augmented
+    0x0A1,  // sus4
+});
+
 }  // namespace
 
 std::string RandomChordText(CChance& chance) {
@@ -148,6 +162,37 @@ CHarmAnlsSignKeys RandomFilledSignKeys(CChance& chance, const CHarmAnlsChords& c
         if (isOdd && chance.OneIn(8)) center.mChords.back().mPosition += 2.0;
     }
     return signKeys;
+}
+
+CHarmAnlsChords RandomChords(CChance& chance, std::size_t count) {
+    CHarmAnlsChords song;
+    double position = 0.0;
+    for (std::size_t i = 0; i < count; ++i) {
+        CChordLite chord;
+        if (!chance.OneIn(12)) {
+            chord.mRootKeyEnh = {static_cast<int>(chance.Below(12)), TEnh_Undef};
+            chord.mSemitones = CSemitones(chance.Of<std::uint64_t>(kKindsOfChords));
+            if (chance.OneIn(5)) {
+                chord.mBassKeyEnh = {static_cast<int>(chance.Below(12)), TEnh_Undef};
+            }
+        }
+        song.emplace_back(chord, position);
+        position += 0.5 + static_cast<double>(chance.Below(100000)) / 12347.0;
+    }
+    song.emplace_back(CChordLite_Undef, position);
+    return song;
+}
+
+CKeyEnh Transposed(const CKeyEnh& keyEnh, int up) {
+    return keyEnh.IsUndef() ? keyEnh : CKeyEnh{FoldIntoOctave(keyEnh.mKeyNr + up), keyEnh.mEnh};
+}
+
+CHarmAnlsChords Transposed(CHarmAnlsChords chords, int up) {
+    for (CHarmAnlsChordWithPos& chord : chords) {
+        chord.mRootKeyEnh = Transposed(chord.mRootKeyEnh, up);
+        chord.mBassKeyEnh = Transposed(chord.mBassKeyEnh, up);
+    }
+    return chords;
 }
 
 }  // namespace brindle::test

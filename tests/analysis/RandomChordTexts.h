@@ -33,6 +33,12 @@ private:
 /// A chord text of up to 60 chords: diatonic in keys that change, or quite random, or of very few
 /// chords, or a string of known progressions; some with bars, holds and tokens that are no chord.
 [[nodiscard]] std::string RandomChordText(CChance& chance);
+/// `count` chords of all kinds, some with a bass, and places without one. Their lengths are of
+/// their own, so that no two keys have equal points by chance.
+[[nodiscard]] CHarmAnlsChords RandomChords(CChance& chance, std::size_t count);
+/// The same a number of semitones higher.
+[[nodiscard]] CKeyEnh Transposed(const CKeyEnh& keyEnh, int up);
+[[nodiscard]] CHarmAnlsChords Transposed(CHarmAnlsChords chords, int up);
 /// Usual beats, or those that are hard to add up, or none at all.
 [[nodiscard]] TChordStringParse RandomBeats(CChance& chance);
 /// None, one or several sign keys, defined or not.

@@ -14,43 +14,6 @@
 namespace brindle::test {
 namespace {
 
-constexpr auto kKinds = std::to_array<std::uint64_t>({
-    0x091,  // major
-    0x089,  // minor
-    0x491,  // dominant seventh
-    0x891,  // major seventh
-    0x489,  // minor seventh
-    0x449,  // half-diminished
-    0x249,  // diminished seventh
-    0x049,  // diminished
-    0x111,  // augmented
-    0x0A1,  // sus4
-});
-
-// Lengths of their own, so that no two keys have equal points by chance.
-CHarmAnlsChords RandomSong(CChance& chance, std::size_t count) {
-    CHarmAnlsChords song;
-    double position = 0.0;
-    for (std::size_t i = 0; i < count; ++i) {
-        CChordLite chord;
-        if (!chance.OneIn(12)) {
-            chord.mRootKeyEnh = {static_cast<int>(chance.Below(12)), TEnh_Undef};
-            chord.mSemitones = CSemitones(chance.Of<std::uint64_t>(kKinds));
-            if (chance.OneIn(5)) {
-                chord.mBassKeyEnh = {static_cast<int>(chance.Below(12)), TEnh_Undef};
-            }
-        }
-        song.emplace_back(chord, position);
-        position += 0.5 + static_cast<double>(chance.Below(100000)) / 12347.0;
-    }
-    song.emplace_back(CChordLite_Undef, position);
-    return song;
-}
-
-CKeyEnh Moved(const CKeyEnh& keyEnh, int up) {
-    return keyEnh.IsUndef() ? keyEnh : CKeyEnh{FoldIntoOctave(keyEnh.mKeyNr + up), keyEnh.mEnh};
-}
-
 CChordReading Moved(CChordReading reading, int up) {
     if (!reading.mKey.IsUndef()) {
         reading.mKey.mRootKeyEnh = {FoldIntoOctave(reading.mKey.mRootKeyEnh.mKeyNr + up),
@@ -103,16 +66,12 @@ TEST_CASE("Each relation is told from its neighbours") {
 TEST_CASE("A song in another key is read the same there") {
     for (std::uint32_t seed = 1; seed <= 60; ++seed) {
         CChance chance(seed);
-        const CHarmAnlsChords song = RandomSong(chance, 1 + chance.Below(60));
+        const CHarmAnlsChords song = RandomChords(chance, 1 + chance.Below(60));
         const CSongReading reading = ReadHarmony(song);
         for (int up = 1; up < 12; ++up) {
             CAPTURE(seed);
             CAPTURE(up);
-            CHarmAnlsChords other = song;
-            for (CHarmAnlsChordWithPos& chord : other) {
-                chord.mRootKeyEnh = Moved(chord.mRootKeyEnh, up);
-                chord.mBassKeyEnh = Moved(chord.mBassKeyEnh, up);
-            }
+            const CHarmAnlsChords other = Transposed(song, up);
             const CSongReading otherReading = ReadHarmony(other);
             REQUIRE(otherReading.mChords.size() == song.size());
             for (std::size_t i = 0; i < song.size(); ++i) {
@@ -126,7 +85,7 @@ TEST_CASE("Each chord points to a later one that exists, no two arcs cross, and 
     for (std::uint32_t seed = 1; seed <= 200; ++seed) {
         CAPTURE(seed);
         CChance chance(seed);
-        const CHarmAnlsChords song = RandomSong(chance, chance.Below(80));
+        const CHarmAnlsChords song = RandomChords(chance, chance.Below(80));
         const CSongReading reading = ReadHarmony(song);
         REQUIRE(reading.mChords.size() == song.size());
         std::vector<std::ptrdiff_t> arcs;
@@ -320,7 +279,7 @@ TEST_CASE("Other signs for numerals do not change what was read") {
 TEST_CASE("A numeral in another style sounds as its chord, applied to the same degree") {
     CChance chance(15);
     for (int round = 0; round < 40; ++round) {
-        const CHarmAnlsChords song = RandomSong(chance, 60);
+        const CHarmAnlsChords song = RandomChords(chance, 60);
         const CSongReading reading = ReadHarmony(song);
         for (const CNumeralOptions& options : kStyles) {
             const CSongReading styled = WithNumerals(reading, song, options);
@@ -359,7 +318,7 @@ TEST_CASE("No chords, one chord and very many are read") {
     CHECK(ReadHarmony(BarsOf("NC | NC")).mConfidence == kPosUndef);
     CHECK(ReadingText(ReadHarmony(BarsOf("Ebm"))) == "eb: i~tonic");
     CChance chance(1);
-    const CHarmAnlsChords song = RandomSong(chance, 100000);
+    const CHarmAnlsChords song = RandomChords(chance, 100000);
     const CSongReading reading = ReadHarmony(song);
     CHECK(reading.mChords.size() == song.size());
     CHECK(reading.mRegions.back().mEnd + 1 == song.size());

@@ -151,58 +151,18 @@ TEST_CASE("Well-known songs pass through the keys that musicians hear in them") 
                       chords) == "29 of 30 songs, 438 of 481 chords");
 }
 
-// Chords of all kinds in lengths of their own, so that no two keys have equal points by chance.
-CHarmAnlsChords RandomSong(CChance& chance) {
-    constexpr auto kinds = std::to_array<std::uint64_t>({
-        0x091,  // major
-        0x089,  // minor
-        0x491,  // dominant seventh
-        0x891,  // major seventh
-        0x489,  // minor seventh
-        0x449,  // half-diminished
-        0x249,  // diminished seventh
-        0x111,  // augmented
-        0x0A1,  // sus4
-    });
-    CHarmAnlsChords song;
-    double position = 0.0;
-    const std::size_t count = 1 + chance.Below(40);
-    for (std::size_t i = 0; i < count; ++i) {
-        CChordLite chord;
-        if (!chance.OneIn(12)) {
-            chord.mRootKeyEnh = {static_cast<int>(chance.Below(12)), TEnh_Undef};
-            chord.mSemitones = CSemitones(chance.Of<std::uint64_t>(kinds));
-            if (chance.OneIn(5)) {
-                chord.mBassKeyEnh = {static_cast<int>(chance.Below(12)), TEnh_Undef};
-            }
-        }
-        song.emplace_back(chord, position);
-        position += 0.5 + static_cast<double>(chance.Below(100000)) / 12347.0;
-    }
-    song.emplace_back(CChordLite_Undef, position);
-    return song;
-}
-
-CKeyEnh Moved(const CKeyEnh& keyEnh, int up) {
-    return keyEnh.IsUndef() ? keyEnh : CKeyEnh{FoldIntoOctave(keyEnh.mKeyNr + up), keyEnh.mEnh};
-}
-
 TEST_CASE("A song in another key has its keys there, and all else the same") {
     for (std::uint32_t seed = 1; seed <= 100; ++seed) {
         CChance chance(seed);
-        const CHarmAnlsChords song = RandomSong(chance);
+        const CHarmAnlsChords song = RandomChords(chance, 1 + chance.Below(40));
         const CKeyOfSong keys = FindKeys(song);
         for (int up = 1; up < 12; ++up) {
             CAPTURE(seed);
             CAPTURE(up);
-            CHarmAnlsChords other = song;
-            for (CHarmAnlsChordWithPos& chord : other) {
-                chord.mRootKeyEnh = Moved(chord.mRootKeyEnh, up);
-                chord.mBassKeyEnh = Moved(chord.mBassKeyEnh, up);
-            }
+            const CHarmAnlsChords other = Transposed(song, up);
             const CKeyOfSong otherKeys = FindKeys(other);
             const auto isMoved = [&](const CSignKeyLite& key, const CSignKeyLite& otherKey) {
-                return otherKey.mRootKeyEnh.mKeyNr == Moved(key.mRootKeyEnh, up).mKeyNr &&
+                return otherKey.mRootKeyEnh.mKeyNr == Transposed(key.mRootKeyEnh, up).mKeyNr &&
                        otherKey.mSignKeyType == key.mSignKeyType;
             };
             CHECK(isMoved(keys.mKey, otherKeys.mKey));
@@ -220,7 +180,7 @@ TEST_CASE("A song in another key has its keys there, and all else the same") {
 TEST_CASE("Lengths count against each other, not by themselves") {
     for (std::uint32_t seed = 1; seed <= 100; ++seed) {
         CChance chance(seed);
-        CHarmAnlsChords song = RandomSong(chance);
+        CHarmAnlsChords song = RandomChords(chance, 1 + chance.Below(40));
         const CKeyOfSong keys = FindKeys(song);
         for (const double factor : {3.0, 0.001, 1e6}) {
             CAPTURE(seed);
@@ -303,7 +263,7 @@ TEST_CASE(
     "lower") {
     for (std::uint32_t seed = 1; seed <= 300; ++seed) {
         CChance chance(seed);
-        CHarmAnlsChords song = RandomSong(chance);
+        CHarmAnlsChords song = RandomChords(chance, 1 + chance.Below(40));
         // Beats of one length have equal ways.
         if (chance.OneIn(2)) {
             for (std::size_t i = 0; i < song.size(); ++i)

@@ -1,11 +1,11 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/musicxml/ChordsFromNotes.h"
 #include "brindle/platform/Alerts.h"
+#include "brindle/platform/AtomicFile.h"
 #include "brindle/platform/Error.h"
 
 #include <doctest/doctest.h>
 
-#include <fstream>
 #include <sstream>
 #include <string>
 #include <vector>
@@ -14,12 +14,10 @@ namespace brindle::test {
 namespace {
 
 CScoreNotes ScoreOf(const std::string& file) {
-    std::ifstream stream(BRINDLE_SOURCE_DIR "/examples/scores/" + file, std::ios::binary);
-    std::ostringstream bytes;
-    bytes << stream.rdbuf();
+    const auto bytes = ReadWholeFile(BRINDLE_SOURCE_DIR "/examples/scores/" + file);
     CScoreNotes score;
     Error error;
-    CHECK_MESSAGE(ReadScoreNotes(bytes.str(), score, &error), error.description);
+    CHECK_MESSAGE(ReadScoreNotes(bytes.value(), score, &error), error.description);
     return score;
 }
 
