@@ -95,6 +95,20 @@ TEST_CASE("There is no name without notes, and there are no more names than are 
     CHECK(NameNotes(Midi({60, 64, 67}), options).size() == 2);
 }
 
+TEST_CASE("The name over a wanted root comes first, and the others keep their order") {
+    std::vector<CNamedChord> names = NameNotes(Midi({48, 52, 55, 57}));
+    const auto symbols = [&names] {
+        std::string text;
+        for (const CNamedChord& name : names) text += name.mSymbol + ' ';
+        return text;
+    };
+    const std::string asFound = symbols();
+    CHECK_FALSE(PutRootFirst(names, 1));
+    CHECK(symbols() == asFound);
+    CHECK(PutRootFirst(names, 9));
+    CHECK(symbols().starts_with("Am7/C C6 Fmaj9/C "));
+}
+
 TEST_CASE("Names do not depend on the order of notes, and move with them") {
     std::mt19937 random(7);
     for (int round = 0; round < 300; ++round) {
