@@ -27,7 +27,7 @@ struct CNumeralWord {
 
 /// What ReadNumerals makes of a text.
 struct CNumeralsReading {
-    std::vector<CNumeralWord> mWords;  ///< all of them, with marks and what is not understood
+    std::vector<CNumeralWord> mWords;  ///< with marks and what is not understood
     /// Empty if all is understood.
     std::vector<CTextFault> mFaults;
 };
@@ -42,6 +42,8 @@ struct CNumeralsReading {
 
 /// Reads a text of Roman numerals or Nashville numbers with bar lines and holds: `ii7 V7 | I^7`.
 ///
+/// Hyphens, arrows and commas between numerals mean nothing, also without white space: `ii-V-I`
+/// is three words. A hyphen that makes sense in a numeral is part of it: `2-7` is a minor seventh.
 /// A word that is not understood is a fault and has no chord; the others are read all the same.
 /// "N.C." and its like have no chord either and are no faults.
 /// Time is linear in the length of the text.

@@ -1,10 +1,13 @@
 // SPDX-License-Identifier: MIT
 // What people write as numerals, and what is read of it.
+#include "brindle/analysis/ReadNumerals.h"
 #include "brindle/analysis/RomanNumeral.h"
 #include "brindle/chords/ReadChordText.h"
+#include "brindle/chords/WriteChordSymbol.h"
 #include "brindle/theory/CChordNamePrefs.h"
 
 #include <doctest/doctest.h>
+#include <fmt/format.h>
 
 #include <array>
 #include <chrono>
@@ -337,6 +340,36 @@ TEST_CASE("A fault tells what is wrong and where") {
         CHECK(reading.mChord.IsUndef());
         CHECK(reading.mFault == row.mFault);
         CHECK(reading.mFaultOffset == row.mOffset);
+    }
+}
+
+/// "Dm@1 G@4 |@6": the chords or marks of a text with their columns, then the faults.
+std::string Words(const CNumeralsReading& reading) {
+    std::string shown;
+    for (const CNumeralWord& word : reading.mWords) {
+        const std::string name = word.mChord.IsUndef() ? word.mText : WriteChordSymbol(word.mChord);
+        shown += fmt::format("{}{}@{}", shown.empty() ? "" : " ", name, word.mColumn);
+    }
+    for (const CTextFault& fault : reading.mFaults) {
+        shown += fmt::format(" {}: {}", fault.mColumn, fault.mText);
+    }
+    return shown;
+}
+
+TEST_CASE("Numerals of one word between hyphens, arrows and commas are told apart") {
+    const auto read = [](std::string_view text) { return Words(ReadNumerals(text, Key("C"))); };
+    CHECK(read("I-V | vi→IV") == "C@1 G@3 |@5 Am@7 F@10");
+    CHECK(read("ii7 – V7, I") == "Dm7@1 G7@7 C@11");
+    CHECK(read("1-5-6-4 2-7 2-5") == "C@1 G@3 A@5 F@7 Dm7@9 D@13 G@15");
+    CHECK(read("V4-3 I") == "Gsus4@1 C@6");
+    CHECK(read("I-x-V I-") == "I-x-V@1 Cm@7 2: this sign behind the degree is not understood");
+    CHECK(Words(ReadChordWords("C-G Am->F C-7 C-G-")) ==
+          "C@1 G@3 Am@5 F@9 Cm7@11 C-G-@15 15: this is no chord");
+    for (const char* text : {"I-V", "- I", "1-5-6-4", "I,"}) {
+        CHECK(BeginsWithNumeral(text, Key("C")));
+    }
+    for (const char* text : {"C-G", "- C", "", "-", ","}) {
+        CHECK_FALSE(BeginsWithNumeral(text, Key("C")));
     }
 }
 

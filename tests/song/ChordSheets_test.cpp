@@ -53,7 +53,11 @@ TEST_CASE("A song is put in time by its bar lines, holds and repeats") {
         {"C F | G7 . . . | C", "C@0 F@1 G7@4 C@8 end@12"},
         {"|C F||G7|C|", "C@0 F@1 G7@4 C@8 end@12"},
         {"C / F / | G ///", "C@0 F@2 G@4 end@8"},
-        {"Am - F – C", "Am@0 F@1 C@2 end@3"},
+        {"Am - F – C → G", "Am@0 F@1 C@2 G@3 end@4"},
+        {"C-G-Am-F | C-7 F-7", "C@0 G@1 Am@2 F@3 C-7@4 F-7@5 end@8"},
+        {"Dm7–G7→C^, | Am->F,C", "Dm7@0 G7@1 C^@2 Am@4 F@5 C@6 end@8"},
+        {"C | C-x-F", "1:7: C-x-F: \"x\" at 3 is not understood"},
+        {"C-G-", "1:3: C-G-: \"G\" at 3 is not understood"},
         {"Dm7, G7;\nC", "Dm7@0 G7@1 C@2 end@3"},
         // A bar ends with its line, unless the next line holds its last chord.
         {"C | F\nAm | G", "C@0 F@4 Am@8 G@12 end@16"},
@@ -142,6 +146,17 @@ TEST_CASE("The first fault of a song is told with its line and column") {
     CHECK(lenient.mFaults[2].mLine == 2);
     CHECK(Shown("C", {.mBeatsPerBar = std::numeric_limits<double>::quiet_NaN()}) ==
           "1:1: bars and chords have a length above 0");
+}
+
+TEST_CASE("A song with directives may have its chords on lines of their own") {
+    const char* song =
+        "{title: Down the Line}\n{time: 3/4}\n# G\n{soc}\nG      D7/F#\nHello my dear\n"
+        "{eoc}\n[Verse 1] Em-C\nA line, a line\n{sot}\nE|--3--|\nG\n{eot}\nD | G |\n{chorus}\n";
+    const CSong reading = ReadSong(song);
+    CHECK(reading.mTitle == "Down the Line");
+    CHECK(Shown(song) == "G@0 D7/F#@1 Em@2 C@3 D@4 G@6 G@9 D7/F#@10 end@12");
+    CHECK(Sections(song) == "Chorus@0, Verse 1@2, Chorus@9");
+    CHECK(Shown("{title: x}\nC\nOh my\n{sog}\n| F . | G |\n{eog}") == "C@0 F@4 G@8 end@12");
 }
 
 TEST_CASE("Lyrics with chords in brackets are read") {

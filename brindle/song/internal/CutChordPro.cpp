@@ -122,18 +122,30 @@ class CChordProText {
 public:
     explicit CChordProText(CTokenList& list) : mList(list) {}
 
+    /// Of a song with its chords in brackets.
     void CutLine(std::string_view line) {
         line = Trimmed(line);
-        if (line.empty() || line.front() == '#') return;
-        if (line.front() == '{' && line.back() == '}') {
-            return CutDirective(line.substr(1, line.size() - 2));
-        }
-        if (mIsSkipping) return;
+        if (IsNoText(line)) return;
         if (mIsGrid || HasChordsAlone(line)) return CutChordsAlone(line);
         CutLyrics(line);
     }
 
+    /// Of a song without brackets, whose chords stand on lines of their own.
+    void CutLine(const CTextLine& line) {
+        if (IsNoText(line.mText)) return;
+        if (mIsGrid) return CutChordsAlone(line.mText);
+        CutLineOfSheet(line, mList);
+    }
+
 private:
+    /// A line without chords or lyrics; directives are obeyed.
+    bool IsNoText(std::string_view line) {
+        if (line.empty() || line.front() == '#') return true;
+        const bool isDirective = line.front() == '{' && line.back() == '}';
+        if (isDirective) CutDirective(line.substr(1, line.size() - 2));
+        return isDirective || mIsSkipping;
+    }
+
     void CutDirective(std::string_view directive) {
         directive = TrimmedInFront(directive);
         const std::string name = Lower(directive.substr(0, directive.find_first_of(": \t")));
@@ -321,8 +333,15 @@ private:
 
 void CutChordPro(CTokenList& list) {
     CChordProText chordPro(list);
-    std::string_view rest = list.Text();
-    while (!rest.empty() && !list.IsGivenUp()) chordPro.CutLine(TakeLine(rest));
+    if (HasChordInBrackets(list.Text())) {
+        std::string_view rest = list.Text();
+        while (!rest.empty() && !list.IsGivenUp()) chordPro.CutLine(TakeLine(rest));
+        return;
+    }
+    for (const CTextLine& line : LinesOf(list.Text())) {
+        if (list.IsGivenUp()) return;
+        chordPro.CutLine(line);
+    }
 }
 
 }  // namespace brindle::SongText

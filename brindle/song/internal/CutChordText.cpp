@@ -1,4 +1,5 @@
 // SPDX-License-Identifier: MIT
+#include "brindle/chords/internal/ChordRows.h"
 #include "brindle/platform/Ascii.h"
 #include "brindle/platform/ReadNumber.h"
 #include "brindle/song/internal/PlayWords.h"
@@ -6,7 +7,7 @@
 #include "brindle/song/internal/SongWords.h"
 
 #include <algorithm>
-#include <array>
+#include <vector>
 
 namespace brindle::SongText {
 namespace {
@@ -163,8 +164,8 @@ private:
         std::size_t length = 0;
         while (length < mRest.size() && !EndsWord(length) && !BeginsSign(length)) ++length;
         std::string_view word = Take(std::max<std::size_t>(length, 1));
-        const std::string_view withoutComma = WithoutCommaBehind(word);
-        if (IsSeparator(withoutComma)) {
+        const std::string_view withoutComma = ChordText::WithoutCommasBehind(word);
+        if (ChordText::IsSeparator(withoutComma)) {
             mChordBefore = {};
             return;
         }
@@ -176,7 +177,9 @@ private:
         }
         if (LooksLikeAnOption(word) && JoinWithChordBefore(word)) return;
         const CChordTextReading reading = ReadChordText(word, mList.Prefs().mChordTextPrefs);
-        if (reading.mKind == TChordText_NotUnderstood && JoinWithChordBefore(word)) return;
+        if (reading.mKind == TChordText_NotUnderstood) {
+            if (JoinWithChordBefore(word) || TakeRow(word)) return;
+        }
         mList.AddReading(word, reading);
         const bool goesOn = reading.mKind == TChordText_Chord && !endsPhrase;
         mChordBefore = goesOn ? word : std::string_view();
@@ -189,22 +192,23 @@ private:
         return c == '|' || c == '{' || (c == ':' && next == '|') || (c == '[' && IsDigit(next));
     }
 
-    [[nodiscard]] static std::string_view WithoutCommaBehind(std::string_view word) {
-        while (word.size() > 1 && (word.back() == ',' || word.back() == ';')) word.remove_suffix(1);
-        return word;
-    }
-
-    /// Hyphens and commas between chords mean nothing.
-    [[nodiscard]] static bool IsSeparator(std::string_view word) {
-        constexpr auto kSeparators = std::to_array<std::string_view>({"-", "–", "—", ",", ";"});
-        return std::find(kSeparators.begin(), kSeparators.end(), word) != kSeparators.end();
-    }
-
     /// `(b9)` and `b9` could be chords on B; behind a chord on a capital they belong to it.
     [[nodiscard]] bool LooksLikeAnOption(std::string_view word) const {
         if (mChordBefore.empty() || !Ascii::IsCapital(mChordBefore[0])) return false;
         if (word[0] == '(') return word.size() > 1 && !Ascii::IsCapital(word[1]);
         return word.size() > 1 && word[0] == 'b' && IsDigit(word[1]) && word[1] != '7';
+    }
+
+    /// `C-G-Am`
+    bool TakeRow(std::string_view word) {
+        const std::vector<std::string_view> pieces = ChordText::PiecesOfRow(word);
+        const auto isChord = [&](std::string_view piece) {
+            return ReadChordText(piece, mList.Prefs().mChordTextPrefs).mKind == TChordText_Chord;
+        };
+        if (!std::all_of(pieces.begin(), pieces.end(), isChord)) return false;
+        for (const std::string_view piece : pieces) mList.AddChordText(piece);
+        mChordBefore = {};
+        return true;
     }
 
     /// `C maj7` is one chord in two words.

@@ -13,6 +13,16 @@ namespace brindle::SongText {
 
 namespace {
 
+/// The chords of a line, behind the name of a part: `[Intro] G C`.
+void CutChordsOfSheet(std::string_view line, CTokenList& list) {
+    const std::size_t bracket = line.front() == '[' ? line.find(']') : line.npos;
+    if (bracket != line.npos && !IsDigit(line[1]) && LengthOfPlayWords(line) == 0) {
+        list.Add(TTokenKind::Section, Trimmed(line.substr(1, bracket - 1)));
+        line = Trimmed(line.substr(bracket + 1));
+    }
+    CutSheetLine(line, list);
+}
+
 class CSheet {
 public:
     explicit CSheet(CTokenList& list) : mList(list), mLines(LinesOf(list.Text())) {}
@@ -22,10 +32,7 @@ public:
         for (const CTextLine& line : mLines) {
             if (mList.IsGivenUp()) return;
             if (line.mKind == TLineKind::Field) TakeField(line.mText);
-            if (line.mKind == TLineKind::Section) {
-                mList.Add(TTokenKind::Section, NameOfSection(line.mText));
-            }
-            if (line.mKind == TLineKind::Chords) TakeChords(line.mText);
+            CutLineOfSheet(line, mList);
         }
     }
 
@@ -82,20 +89,19 @@ private:
         if (!time.IsUndef()) mList.Add(TTokenKind::Time).mTime = time;
     }
 
-    void TakeChords(std::string_view line) {
-        const std::size_t bracket = line.front() == '[' ? line.find(']') : line.npos;
-        if (bracket != line.npos && !IsDigit(line[1]) && LengthOfPlayWords(line) == 0) {
-            mList.Add(TTokenKind::Section, Trimmed(line.substr(1, bracket - 1)));
-            line = Trimmed(line.substr(bracket + 1));
-        }
-        CutSheetLine(line, mList);
-    }
-
     CTokenList& mList;
     std::vector<CTextLine> mLines;
 };
 
 }  // namespace
+
+void CutLineOfSheet(const CTextLine& line, CTokenList& list) {
+    if (line.mKind == TLineKind::Section) {
+        list.Add(TTokenKind::Section, NameOfSection(line.mText));
+    } else if (line.mKind == TLineKind::Chords) {
+        CutChordsOfSheet(line.mText, list);
+    }
+}
 
 void CutChordsAboveLyrics(CTokenList& list) {
     CSheet(list).Cut();

@@ -3,6 +3,7 @@
 
 #include "brindle/chords/ReadChordText.h"
 #include "brindle/chords/internal/CTextScan.h"
+#include "brindle/chords/internal/ChordRows.h"
 #include "brindle/platform/Ascii.h"
 #include "brindle/song/internal/PlayWords.h"
 #include "brindle/song/internal/SongWords.h"
@@ -42,14 +43,32 @@ bool IsBarSign(std::string_view word) {
     return word.find_first_not_of("|:.-/%") == word.npos;
 }
 
-/// A chord, a sign between chords or words that steer the playing.
+/// Of words that could be lyrics, `Go, Johnny`, a comma makes lyrics.
+std::string_view WithoutCommasOfChords(std::string_view word) {
+    const std::string_view chord = ChordText::WithoutCommasBehind(word);
+    return IsAnyOf(chord, kWordsOrChords) ? word : chord;
+}
+
+/// `C-G-Am`
+bool IsRowOfChords(std::string_view word) {
+    const std::vector<std::string_view> pieces = ChordText::PiecesOfRow(word);
+    return std::all_of(pieces.begin(), pieces.end(), [](std::string_view piece) {
+        return !piece.empty() && ChordText::IsCapitalNote(piece[0]) &&
+               ReadChordText(piece).mKind == TChordText_Chord;
+    });
+}
+
+/// A chord or several, a sign between chords or words that steer the playing.
 bool IsChordWord(std::string_view word) {
-    if (IsBarSign(word) || LengthOfPlayWords(word) == word.size()) return true;
+    if (IsBarSign(word) || ChordText::IsSeparator(word)) return true;
+    if (LengthOfPlayWords(word) == word.size()) return true;
+    word = WithoutCommasOfChords(word);
     if (word.size() > 2 && word.front() == '(' && word.back() == ')') {
         word = word.substr(1, word.size() - 2);
     }
     const bool begins = ChordText::IsCapitalNote(word[0]) || word[0] == 'N' || word[0] == '(';
-    return begins && ReadChordText(word).mKind != TChordText_NotUnderstood;
+    if (!begins) return false;
+    return ReadChordText(word).mKind != TChordText_NotUnderstood || IsRowOfChords(word);
 }
 
 /// No slip of a chord, but a word: "Down", "I", "don't".

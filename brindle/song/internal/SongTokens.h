@@ -2,6 +2,7 @@
 #pragma once
 
 #include "brindle/song/ReadSong.h"
+#include "brindle/song/internal/LineKinds.h"
 
 #include <cstddef>
 #include <cstdint>
@@ -118,6 +119,8 @@ void CutChordLine(std::string_view line, CTokenList& list);
 /// The same for a line of a sheet, where a bar ends with its line: behind a line with bar lines
 /// only a line that begins with a hold goes on in the same bar. `x3` at its end plays it again.
 void CutSheetLine(std::string_view line, CTokenList& list);
+/// The same for the lines with chords and the names of parts of a sheet with chords above lyrics.
+void CutLineOfSheet(const CTextLine& line, CTokenList& list);
 /// Cut the whole text of `list`.
 void CutChordText(CTokenList& list);
 void CutChordsAboveLyrics(CTokenList& list);
