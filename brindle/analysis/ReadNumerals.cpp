@@ -36,11 +36,13 @@ bool IsRowOfDegrees(std::string_view word) {
 /// `ii-V-I`: adds the pieces as words of their own, or nothing if one of them is not understood.
 template <class TRead>
 bool AddRow(const CNumeralWord& row, TRead read, std::vector<CNumeralWord>& words) {
-    const std::string_view text = row.mText;
     const std::size_t count = words.size();
-    for (const std::string_view piece : ChordText::PiecesOfRow(text)) {
-        const auto before = text.substr(0, static_cast<std::size_t>(piece.data() - text.data()));
-        words.push_back({std::string(piece), row.mLine, ColumnBehind(row, before), {}});
+    std::size_t column = row.mColumn;
+    const char* counted = row.mText.data();
+    for (const std::string_view piece : ChordText::PiecesOfRow(row.mText)) {
+        column += CountUtf8Characters({counted, static_cast<std::size_t>(piece.data() - counted)});
+        counted = piece.data();
+        words.push_back({std::string(piece), row.mLine, column, {}});
         if (!read(words.back())) continue;
         words.resize(count);
         return false;

@@ -208,6 +208,7 @@ TEST_CASE("A part begins with its chord anew") {
     CSong sections = ReadSong("C . . . | . . . . | . . . . | G . . .");
     sections.mSections = {{"A", 8.0}, {"B", 12.0}};
     CHECK(Shown(sections) == "| C | | <A> (C) | <B> G ");
+    CHECK(Shown(ReadSong("Verse: A D E Chorus: D | G")) == "| <Verse, Chorus> A D E D | G ");
     // A chord that comes later in the bar has its own place behind.
     const CSong song = ReadSong("C . . . |: . . G . :|");
     const CSheetScore score = ScoreOf(song);

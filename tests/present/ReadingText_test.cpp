@@ -57,6 +57,10 @@ TEST_CASE("A song stands four bars a line, chords over numerals, keys where they
           "  bars 5 to 6: ii V i of G minor\n");
 }
 
+TEST_CASE("Parts that begin in one bar are all named") {
+    CHECK(Has(Shown("Verse: A D E\nChorus: D A E A"), "\nVerse, Chorus\n1 | A "));
+}
+
 TEST_CASE("A line has as many bars as its width holds, and no line is wider") {
     std::string text;
     for (int i = 0; i < 12; ++i) text += "Ebmaj7 Cm7b5 F7b9 Bbmaj7 | ";

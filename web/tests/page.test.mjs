@@ -200,6 +200,7 @@ onPage("A song is transposed up, down and back to what was typed", {}, async (op
 for (const [form, typed, up] of [
   ["ChordPro", "{title: Grace}\n{key: G}\n{sov}\nA[G]mazing [C]grace how [D7/F#]sweet\n{eov}", "{title: Grace}\n{key: Ab}\n{sov}\nA[Ab]mazing [Db]grace how [Eb7/G]sweet\n{eov}"],
   ["chords above lyrics", "Grace\nby Me\n\n[A]\nA     D    E7  A\nA line of a song", "Grace\nby Me\n\n[A]\nBb    Eb   F7  Bb\nA line of a song"],
+  ["chords in one word", "C-G | Am→F,\n[A] C - E7", "Db-Ab | Bbm→Gb,\n[A] Db - F7"],
   ["bars with signs", "|: Dm7 | % | G7 [1 C :| [2 C N.C. | // end", "|: Ebm7 | % | Ab7 [1 Db :| [2 Db N.C. | // end"],
 ]) {
   onPage(`A transposed song keeps its words and lay-out: ${form}`, {}, async (opened, page) => {

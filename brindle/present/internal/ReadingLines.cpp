@@ -107,7 +107,7 @@ private:
         return isNamedAlike && mKeys[ix].empty() && chords[ix].mNumeral == chords[ix - 1].mNumeral;
     }
 
-    // A part begins at the bar in which its place is.
+    // A part begins at the bar in which its place is; several short ones share a bar.
     [[nodiscard]] bool BeginsPart(const CReadingBar& bar, std::size_t& section,
                                   std::string& name) const {
         bool begins = false;
@@ -115,7 +115,8 @@ private:
             const CSongSection& next = mSong.mSections[section];
             if (mBars.BarOf(next.mPosition) >= bar.mNumber + bar.mCount) break;
             begins = true;
-            name = Printable(next.mName);
+            if (!name.empty() && !next.mName.empty()) name += ", ";
+            name += Printable(next.mName);
         }
         return begins;
     }

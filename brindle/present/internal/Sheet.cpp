@@ -112,7 +112,8 @@ void PlaceSections(const CSong& song, std::vector<CSheetBar>& bars) {
         if (behind == bars.begin()) continue;
         CSheetBar& bar = *std::prev(behind);
         bar.mBeginsSection = true;
-        if (bar.mSection.empty()) bar.mSection = section.mName;
+        if (!bar.mSection.empty() && !section.mName.empty()) bar.mSection += ", ";
+        bar.mSection += section.mName;
     }
 }
 

@@ -22,13 +22,23 @@ export interface HeardChord {
 const wordWithBlanks = /([^\s|]+)([ \t]*)/g;
 const bracketed = /\[([^\s\][]+)\]/g;
 
+/** What may part chords within a word, as in `C-G-Am`. */
+const separators = /(->|[-–—→>,;])/;
+
 type Names = Map<string, string>;
+
+/** The name of a word in the other key, or of each chord between its separators; undefined for other words. */
+function renamed(word: string, names: Names): string | undefined {
+  const isChord = (piece: string, i: number) => i % 2 === 1 || piece === "" || names.has(piece);
+  const pieces = names.has(word) ? [word] : word.split(separators);
+  return pieces.every(isChord) ? pieces.map((piece) => names.get(piece) ?? piece).join("") : undefined;
+}
 
 /** Chords of a line with those below words kept above them where there are blanks for it. */
 function renamedChords(line: string, names: Names): string {
   let late = 0;
   return line.replace(wordWithBlanks, (_, word: string, blanks: string) => {
-    const name = names.get(word) ?? word;
+    const name = renamed(word, names) ?? word;
     late += name.length - word.length;
     if (blanks.length < 2) return name + blanks;
     const kept = Math.max(1, blanks.length - late);
@@ -38,13 +48,16 @@ function renamedChords(line: string, names: Names): string {
 }
 
 function renamedInBrackets(line: string, names: Names): string {
-  return line.replace(bracketed, (whole, word: string) => (names.has(word) ? `[${names.get(word)}]` : whole));
+  return line.replace(bracketed, (whole, word: string) => {
+    const name = renamed(word, names);
+    return name === undefined ? whole : `[${name}]`;
+  });
 }
 
 /** How much of a line is chords, 0 to 1; signs between them do not count. */
 function shareOfChords(line: string, names: Names): number {
   const words = line.split(/[\s|]+/).filter((word) => /^\p{L}/u.test(word));
-  return words.length === 0 ? 0 : words.filter((word) => names.has(word)).length / words.length;
+  return words.length === 0 ? 0 : words.filter((word) => renamed(word, names) !== undefined).length / words.length;
 }
 
 interface Guess {
