@@ -44,6 +44,7 @@ struct CNumeralsReading {
 ///
 /// Hyphens, arrows and commas between numerals mean nothing, also without white space: `ii-V-I`
 /// is three words. A hyphen that makes sense in a numeral is part of it: `2-7` is a minor seventh.
+/// In a row of bare degrees, `1-5-6-4`, these are the triads of the key, of natural minor in minor.
 /// A word that is not understood is a fault and has no chord; the others are read all the same.
 /// "N.C." and its like have no chord either and are no faults.
 /// Time is linear in the length of the text.

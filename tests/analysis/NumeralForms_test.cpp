@@ -360,9 +360,12 @@ TEST_CASE("Numerals of one word between hyphens, arrows and commas are told apar
     const auto read = [](std::string_view text) { return Words(ReadNumerals(text, Key("C"))); };
     CHECK(read("I-V | vi→IV") == "C@1 G@3 |@5 Am@7 F@10");
     CHECK(read("ii7 – V7, I") == "Dm7@1 G7@7 C@11");
-    CHECK(read("1-5-6-4 2-7 2-5") == "C@1 G@3 A@5 F@7 Dm7@9 D@13 G@15");
-    CHECK(read("V4-3 I") == "Gsus4@1 C@6");
-    CHECK(read("I-x-V I-") == "I-x-V@1 Cm@7 2: this sign behind the degree is not understood");
+    CHECK(read("V4-3-I ii-7-V7–I") == "Gsus4@1 C@6 Dm7@8 G7@13 C@16");
+    CHECK(read("1-5-6-4 2-7 1-4 1-6") == "C@1 G@3 Am@5 F@7 Dm7@9 C@13 F@15 Cm6@17");
+    CHECK(read("1-5-b7 1-4-57 6-4") == "C@1 G@3 Bb@5 C@8 F@10 G7@12 Am@15 F@17");
+    CHECK(Words(ReadNumerals("1-4-5-2", Key("A minor"))) == "Am@1 Dm@3 Em@5 Bdim@7");
+    CHECK(read("I-V–vx-IV I-") ==
+          "C@1 G@3 vx@5 F@8 Cm@11 6: this sign behind the degree is not understood");
     CHECK(Words(ReadChordWords("C-G Am->F C-7 C-G-")) ==
           "C@1 G@3 Am@5 F@9 Cm7@11 C-G-@15 15: this is no chord");
     for (const char* text : {"I-V", "- I", "1-5-6-4", "I,"}) {

@@ -58,6 +58,9 @@ TEST_CASE("A song is put in time by its bar lines, holds and repeats") {
         {"Dm7–G7→C^, | Am->F,C", "Dm7@0 G7@1 C^@2 Am@4 F@5 C@6 end@8"},
         {"C | C-x-F", "1:7: C-x-F: \"x\" at 3 is not understood"},
         {"C-G-", "1:3: C-G-: \"G\" at 3 is not understood"},
+        {"C--G -F", "1:6: -F: a chord begins with a note A to H, \"-\" at 1 is none"},
+        {"C-G | Dm–Amx-F", "1:12: Amx: \"x\" at 3 is not understood"},
+        {"C-7-F7⇒Bb^ | Cm7-5‑F7", "C-7@0 F7@1 Bb^@2 Cm7-5@4 F7@5 end@8"},
         {"Dm7, G7;\nC", "Dm7@0 G7@1 C@2 end@3"},
         // A bar ends with its line, unless the next line holds its last chord.
         {"C | F\nAm | G", "C@0 F@4 Am@8 G@12 end@16"},
@@ -146,6 +149,24 @@ TEST_CASE("The first fault of a song is told with its line and column") {
     CHECK(lenient.mFaults[2].mLine == 2);
     CHECK(Shown("C", {.mBeatsPerBar = std::numeric_limits<double>::quiet_NaN()}) ==
           "1:1: bars and chords have a length above 0");
+}
+
+TEST_CASE("Names of parts and lines of chords stand between lyrics with chords in brackets") {
+    const char* song =
+        "{Title : Grace}\n[Verse 1: Me]\n[C]Hello [G]there\n[Chorus] [F]la\nC-G Am D\nGo Do\nA\n";
+    CHECK(ReadSong(song).mTitle == "Grace");
+    CHECK(Shown(song) == "C@0 G@1 F@2 C@3 G@4 Am@5 D@6 end@7");
+    CHECK(Sections(song) == "Verse 1: Me@0, Chorus@2");
+}
+
+TEST_CASE("Words between hyphens are chords where chords stand") {
+    CHECK(Shown("Verse\nC - G\nGo - go - go\nDo-Do-Do\nAm–F, C\nHal-le-lu-jah - ah\n") ==
+          "C@0 G@1 Am@2 F@3 C@4 end@5");
+}
+
+TEST_CASE("How chords are played is no song") {
+    CHECK(Shown("[Chords]\nC x32010\nG = 320003\nBb7: x13131\n\nVerse\nC G\nLa la\n") ==
+          "C@0 G@1 end@2");
 }
 
 TEST_CASE("A song with directives may have its chords on lines of their own") {

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: MIT
 #include "brindle/chords/internal/ChordRows.h"
 
+#include "brindle/platform/Ascii.h"
+
 #include <algorithm>
 #include <array>
 #include <cstddef>
@@ -9,9 +11,10 @@ namespace brindle::ChordText {
 
 namespace {
 
-// `->` stands before the hyphen that it begins with.
-constexpr auto kSeparators =
-    std::to_array<std::string_view>({"->", "-", "–", "—", "→", ">", ",", ";"});
+// Longer ones stand before what they begin with. Of hyphens there are the typed one, the two of
+// printers, the minus sign and two dashes.
+constexpr auto kSeparators = std::to_array<std::string_view>(
+    {"->", "=>", "-", "\u2010", "\u2011", "\u2212", "–", "—", "→", "⇒", "➜", ">", ",", ";"});
 
 /// The bytes of the separator that a text begins with; 0 without one.
 std::size_t LengthOfSeparator(std::string_view text) {
@@ -19,6 +22,14 @@ std::size_t LengthOfSeparator(std::string_view text) {
         std::find_if(kSeparators.begin(), kSeparators.end(),
                      [&](std::string_view separator) { return text.starts_with(separator); });
     return found == kSeparators.end() ? 0 : found->size();
+}
+
+/// Whether the hyphen at `pos` is part of the chord before it: `C-7`, `V4-3`, but not `1-5`.
+bool IsWithinChord(std::string_view chord, std::size_t pos) {
+    const std::size_t letter = std::min(chord.find_first_not_of("b#"), chord.size());
+    const bool hasLetter = letter < pos && Ascii::IsLetter(chord[letter]);
+    return hasLetter && chord[pos] == '-' && pos + 1 < chord.size() &&
+           Ascii::IsDigit(chord[pos + 1]);
 }
 
 }  // namespace
@@ -38,11 +49,13 @@ std::vector<std::string_view> PiecesOfRow(std::string_view word) {
     std::size_t begin = 0;
     for (std::size_t pos = 0; pos < word.size();) {
         const std::size_t length = LengthOfSeparator(word.substr(pos));
-        if (length > 0) {
-            pieces.push_back(word.substr(begin, pos - begin));
-            begin = pos + length;
+        if (length == 0 || IsWithinChord(word.substr(begin), pos - begin)) {
+            ++pos;
+            continue;
         }
-        pos += std::max<std::size_t>(length, 1);
+        // `C--G` is `C-G`.
+        if (pos > begin || pieces.empty()) pieces.push_back(word.substr(begin, pos - begin));
+        begin = pos += length;
     }
     pieces.push_back(word.substr(begin));
     return pieces;

@@ -12,8 +12,9 @@ namespace brindle::ChordText {
 
 [[nodiscard]] std::string_view WithoutCommasBehind(std::string_view word);
 
-/// What stands between the separators of a word, without commas behind it. Pieces may be empty.
-/// Only for words that make no sense as a whole: `C-7` is one chord.
+/// What stands between the separators of a word, without commas behind it; the first and the last
+/// piece may be empty. Digits behind a hyphen belong to the chord before: `C-7-F` is `C-7` and `F`.
+/// Only for words that make no sense as a whole.
 [[nodiscard]] std::vector<std::string_view> PiecesOfRow(std::string_view word);
 
 }  // namespace brindle::ChordText

@@ -126,7 +126,9 @@ public:
     void CutLine(std::string_view line) {
         line = Trimmed(line);
         if (IsNoText(line)) return;
+        line = BehindSection(line);
         if (mIsGrid || HasChordsAlone(line)) return CutChordsAlone(line);
+        if (IsLineOfChords(line)) return CutSheetLine(line, mList);
         CutLyrics(line);
     }
 
@@ -149,8 +151,9 @@ private:
     void CutDirective(std::string_view directive) {
         directive = TrimmedInFront(directive);
         const std::string name = Lower(directive.substr(0, directive.find_first_of(": \t")));
-        const std::size_t begin = std::min(name.size() + 1, directive.size());
-        Obey(name, TrimmedInFront(directive.substr(begin)), directive);
+        std::string_view value = TrimmedInFront(directive.substr(name.size()));
+        if (value.starts_with(':')) value = TrimmedInFront(value.substr(1));
+        Obey(name, value, directive);
     }
 
     void Obey(std::string_view name, std::string_view value, std::string_view directive) {
@@ -279,6 +282,14 @@ private:
         if (!mList.AddAgain(mChorusBegin + 1, mChorusEnd)) {
             mList.AddFault(value, "the choruses make the song too long");
         }
+    }
+
+    /// Takes the name of a part off, which is no chord: `[Verse 1]`.
+    std::string_view BehindSection(std::string_view line) {
+        const std::size_t length = LengthOfNameInBrackets(line);
+        if (length == 0) return line;
+        mList.Add(TTokenKind::Section, Trimmed(line.substr(1, length - 2)));
+        return Trimmed(line.substr(length));
     }
 
     /// Chords, bar lines and holds, and no lyrics between them.

@@ -199,14 +199,19 @@ private:
         return word.size() > 1 && word[0] == 'b' && IsDigit(word[1]) && word[1] != '7';
     }
 
-    /// `C-G-Am`
+    /// `C-G-Am`; a piece that is no chord is a fault of its own.
     bool TakeRow(std::string_view word) {
         const std::vector<std::string_view> pieces = ChordText::PiecesOfRow(word);
-        const auto isChord = [&](std::string_view piece) {
-            return ReadChordText(piece, mList.Prefs().mChordTextPrefs).mKind == TChordText_Chord;
-        };
-        if (!std::all_of(pieces.begin(), pieces.end(), isChord)) return false;
-        for (const std::string_view piece : pieces) mList.AddChordText(piece);
+        const auto kindOf = [](std::string_view piece) { return ReadChordText(piece).mKind; };
+        const bool hasRepeat =
+            std::any_of(pieces.begin(), pieces.end(),
+                        [&](std::string_view piece) { return kindOf(piece) == TChordText_Repeat; });
+        const bool isRow = pieces.size() > 1 && !pieces.back().empty() && !hasRepeat &&
+                           kindOf(pieces.front()) == TChordText_Chord;
+        if (!isRow) return false;
+        for (const std::string_view piece : pieces) {
+            if (!mList.IsGivenUp()) mList.AddChordText(piece);
+        }
         mChordBefore = {};
         return true;
     }

@@ -49,19 +49,21 @@ std::string_view WithoutCommasOfChords(std::string_view word) {
     return IsAnyOf(chord, kWordsOrChords) ? word : chord;
 }
 
-/// `C-G-Am`
+/// `C-G-Am`, but not `Do-Do-Do`.
 bool IsRowOfChords(std::string_view word) {
     const std::vector<std::string_view> pieces = ChordText::PiecesOfRow(word);
-    return std::all_of(pieces.begin(), pieces.end(), [](std::string_view piece) {
+    const auto isChord = [](std::string_view piece) {
         return !piece.empty() && ChordText::IsCapitalNote(piece[0]) &&
                ReadChordText(piece).mKind == TChordText_Chord;
-    });
+    };
+    const auto couldBeWord = [](std::string_view piece) { return IsAnyOf(piece, kWordsOrChords); };
+    return std::all_of(pieces.begin(), pieces.end(), isChord) &&
+           !std::all_of(pieces.begin(), pieces.end(), couldBeWord);
 }
 
 /// A chord or several, a sign between chords or words that steer the playing.
 bool IsChordWord(std::string_view word) {
-    if (IsBarSign(word) || ChordText::IsSeparator(word)) return true;
-    if (LengthOfPlayWords(word) == word.size()) return true;
+    if (IsBarSign(word) || LengthOfPlayWords(word) == word.size()) return true;
     word = WithoutCommasOfChords(word);
     if (word.size() > 2 && word.front() == '(' && word.back() == ')') {
         word = word.substr(1, word.size() - 2);
@@ -82,6 +84,17 @@ bool IsLyricWord(std::string_view word) {
 bool IsTablature(std::string_view line) {
     return line.find("--") != line.npos && line.find('|') != line.npos &&
            std::count(line.begin(), line.end(), '-') * 3 > static_cast<std::ptrdiff_t>(line.size());
+}
+
+/// `C x32010`, `G: 320003`: how a chord is played.
+bool IsFingering(std::string_view line) {
+    std::string_view frets = line;
+    std::string_view chord = TakeWordOf(frets);
+    if (chord.ends_with(':')) chord.remove_suffix(1);
+    if (frets.starts_with('=')) TakeWordOf(frets);
+    const bool areFrets = frets.size() >= 4 && frets.size() <= 8 &&
+                          frets.find_first_not_of("0123456789xX") == frets.npos;
+    return areFrets && !chord.empty() && IsChordWord(chord);
 }
 
 bool IsField(std::string_view line) {
@@ -109,6 +122,7 @@ TLineKind KindOfWords(std::string_view line) {
     std::size_t lyrics = 0;
     for (std::string_view rest = line; !rest.empty();) {
         const std::string_view word = TakeWordOf(rest);
+        if (ChordText::IsSeparator(word)) continue;
         const bool isChord = IsChordWord(word);
         chords += isChord;
         others += !isChord;
@@ -129,7 +143,7 @@ std::size_t LengthOfSectionInFront(std::string_view line) {
 
 TLineKind KindOf(std::string_view line) {
     if (line.empty()) return TLineKind::Blank;
-    if (IsTablature(line)) return TLineKind::Tablature;
+    if (IsTablature(line) || IsFingering(line)) return TLineKind::Tablature;
     if (IsField(line)) return TLineKind::Field;
     if (IsSection(line)) return TLineKind::Section;
     return KindOfWords(line.substr(LengthOfSectionInFront(line)));
@@ -188,6 +202,27 @@ bool IsLetterOfPart(std::string_view inside, std::string_view behind) {
 
 bool BeginsWithSection(std::string_view line) {
     return line.starts_with('[') && LengthOfSectionInFront(line) > 0;
+}
+
+std::size_t LengthOfNameInBrackets(std::string_view line) {
+    const std::size_t end = line.starts_with('[') ? line.find(']') : line.npos;
+    if (end == line.npos) return 0;
+    std::string_view name = line.substr(1, end - 1);
+    const std::string first = Lower(TakeWordOf(name));
+    return IsAnyOf(first, kSectionWords) ? end + 1 : 0;
+}
+
+bool IsLineOfChords(std::string_view line) {
+    std::size_t chords = 0;
+    bool isNoLyric = false;
+    for (std::string_view rest = line; !rest.empty();) {
+        const std::string_view word = TakeWordOf(rest);
+        if (IsBarSign(word) || ChordText::IsSeparator(word)) continue;
+        if (!IsChordWord(word)) return false;
+        isNoLyric |= !IsAnyOf(word, kWordsOrChords);
+        ++chords;
+    }
+    return chords > 1 && isNoLyric;
 }
 
 bool HasChordInBrackets(std::string_view text) {

@@ -15,7 +15,7 @@ enum class TLineKind : std::uint8_t {
     Section,
     /// A name and what it is: `Key: G`.
     Field,
-    /// Strings of an instrument with frets on them.
+    /// Strings of an instrument with frets on them, or a chord with its frets.
     Tablature,
     Lyrics,
 };
@@ -34,6 +34,14 @@ struct CTextLine {
 
 /// `Verse 1` of `[Verse 1]` and of `Verse 1:`.
 [[nodiscard]] std::string_view NameOfSection(std::string_view line);
+
+/// The bytes of a name of a part that a line with chords in brackets begins with, `[Verse 1]`;
+/// 0 for a line that begins otherwise.
+[[nodiscard]] std::size_t LengthOfNameInBrackets(std::string_view line);
+
+/// Whether a line without brackets has chords alone, two or more, and not only those that are
+/// words, too.
+[[nodiscard]] bool IsLineOfChords(std::string_view line);
 
 /// Whether `[G]` stands in a text as a chord.
 [[nodiscard]] bool HasChordInBrackets(std::string_view text);
