@@ -26,7 +26,8 @@ std::size_t LengthOfSeparator(std::string_view text) {
 
 /// Whether the hyphen at `pos` is part of the chord before it: `C-7`, `V4-3`, but not `1-5`.
 bool IsWithinChord(std::string_view chord, std::size_t pos) {
-    const std::size_t letter = std::min(chord.find_first_not_of("b#"), chord.size());
+    // No chord has more than two signs in front, and no longer row of them is searched each time.
+    const std::size_t letter = std::min(chord.substr(0, 3).find_first_not_of("b#"), chord.size());
     const bool hasLetter = letter < pos && Ascii::IsLetter(chord[letter]);
     return hasLetter && chord[pos] == '-' && pos + 1 < chord.size() &&
            Ascii::IsDigit(chord[pos + 1]);
